@@ -1,0 +1,360 @@
+#pragma once
+
+#include "basZandor.h"
+#include "clsDragColumn.h"
+#include "clsFreeList.h"
+#include "clsJoinLine.h"
+#include "control/ControlArray.h"
+#include "control/Events.h"
+#include "platform/KeyedCollection.h"
+#include "platform/TalvikZandorLib.h"
+#include "platform/Toolkit.h"
+
+namespace TalvikDBxZandor {
+
+class frmJoinDefinition;
+
+/// The query designer: tables on a canvas, joins between them, output columns in a grid.
+///
+/// No procedure throws. A failure is reported in a message box under the procedure's name; what
+/// was done before it stays done, and a getter returns its result as it stood. All coordinates are
+/// twips. The toolkit, the library and the event sink outlive the control.
+class Zandor {
+public:
+    static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.Zandor";
+
+    using String = platform::String;
+    template <class T>
+    using Ref = platform::Ref<T>;
+
+    Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, ZandorEvents& events);
+    Zandor(const Zandor&) = delete;
+    Zandor& operator=(const Zandor&) = delete;
+    ~Zandor();
+
+    // What a front end notifies; UserControl_Initialize and UserControl_Terminate run within
+    // construction and destruction.
+    void UserControl_Paint();
+    void UserControl_Resize();
+
+    // Texts and flags: plain values, read where they take effect.
+    String LNGJoinForm = u"Join Defintion";
+    String LNGJoinLeftTable = u"Left Table:";
+    String LNGJoinLeftColumn = u"Left Column:";
+    String LNGJoinRightTable = u"Right Table:";
+    String LNGJoinRightColumn = u"Right Column:";
+    String LNGJoinType = u"Join Type";
+    String LNGJoinTypeNormal = u"Normal";
+    String LNGJoinTypeLeftOuter = u"Left Outer";
+    String LNGJoinTypeRightOuter = u"Right Outer";
+    String LNGJoinTypeBothOuter = u"Both Outer";
+    String LNGJoinOk = u"&Ok";
+    String LNGJoinCancel = u"&Cancel";
+    String LNGMnuShowJoinDef = u"Show Join Definition";
+    String LNGMnuDelJoin = u"Delete Join";
+    String LNGMnuCopyCol = u"Copy Column";
+    String LNGMnuCreateJoin = u"Create Join";
+    String LNGMnuDelTable = u"Delete Table";
+    String LNGMnuPasteCol = u"Paste Column";
+    String LNGMnuDelCol = u"Delete Coumn"; // spelled so on purpose: hosts compare with it
+    String LNGSpreadField = u"Field:";
+    String LNGSpreadSynonym = u"Synonym:";
+    String LNGSpreadSort = u"Sort:";
+    String LNGSpreadVisible = u"Visible:";
+    String LNGSpreadCriteria = u"Criteria:";
+    String LNGSpreadOr = u"Or:";
+    bool LNGMnuShowJoinDefVis = true;
+    bool LNGMnuDelJoinVis = true;
+    bool LNGMnuCopyColVis = true;
+    bool LNGMnuCreateJoinVis = true;
+    bool LNGMnuDelTableVis = true;
+    bool LNGMnuPasteColVis = true;
+    bool LNGMnuDelColVis = true;
+    bool LNGMnuSep1Vis = true;
+    bool LNGMnuSep2Vis = true;
+    std::int16_t MXHorzFrameSize = 16000; ///< width of the canvas
+    std::int16_t MXVertFrameSize = 16000; ///< height of the canvas
+    String DeletedTable = u"  ";          ///< name of the table deleted last
+
+    // Property procedures, each beside the name it reports under. Two pairs of names share one
+    // flag each, and some of their report names are crossed; hosts' logs know them so.
+    // clang-format off
+    std::int16_t DebugSwitch() const { return Get(u"P_GET DebugSwitch", mDebugSwitch); }
+    void DebugSwitch(std::int16_t v) { Let(u"P_LET DebugSwitch", mDebugSwitch, v); }
+    std::int16_t JoinModifyDisabled() const { return Get(u"P_GET JoinModifyDisabled", mJoinModifyDisabled); }
+    void JoinModifyDisabled(std::int16_t v) { Let(u"P_LET JoinModifyDisabled", mJoinModifyDisabled, v); }
+    /// How far the canvas is scrolled to the left. A value past the end of the range goes to its
+    /// end; a negative one is error 380.
+    std::int16_t VisibleFrameLeft() const;
+    void VisibleFrameLeft(std::int16_t v);
+    /// The same for the top.
+    std::int16_t VisibleFrameTop() const;
+    void VisibleFrameTop(std::int16_t v);
+    /// The query model; never nothing. Setting nothing raises Error and keeps the model held.
+    Ref<TalvikZandorLib::Zandor> P_GET_Zandor();
+    void P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& model);
+    /// Scroll range; the next layout overwrites it. A negative value is error 380.
+    std::int16_t HorizMaxScrollPos() const;
+    void HorizMaxScrollPos(std::int16_t v);
+    std::int16_t VertMaxScrollPos() const;
+    void VertMaxScrollPos(std::int16_t v);
+    /// Scroll position; error 380 outside 0 to the range's end.
+    std::int16_t HorizontalScrollbarPos() const;
+    void HorizontalScrollbarPos(std::int16_t v);
+    std::int16_t VerticalScrollbarPos() const;
+    void VerticalScrollbarPos(std::int16_t v);
+    /// Whether the canvas takes the whole height. Setting false shows the grid with the row titles
+    /// of the moment.
+    bool OnlyJoin() const { return Get(u"P_GET OnlyJoin", mOnlyJoin); }
+    void OnlyJoin(bool v);
+    bool UseJoinTypeNormal() const { return Get(u"P_GET UseJoinTypeNormal", mUseJoinType[0]); }
+    void UseJoinTypeNormal(bool v) { Let(u"P_LET UseJoinTypeNormal", mUseJoinType[0], v); }
+    bool UseJoinTypeLeft() const { return Get(u"P_GET UseJoinTypeLeft", mUseJoinType[1]); }
+    void UseJoinTypeLeft(bool v) { Let(u"P_LET UseJoinTypeLeft", mUseJoinType[1], v); }
+    bool UseJoinTypeRight() const { return Get(u"P_GET UseJoinTypeRight", mUseJoinType[2]); }
+    void UseJoinTypeRight(bool v) { Let(u"P_LET UseJoinTypeRight", mUseJoinType[2], v); }
+    bool UseJoinTypeBoth() const { return Get(u"P_GET UseJoinTypeBoth", mUseJoinType[3]); }
+    void UseJoinTypeBoth(bool v) { Let(u"P_LET UseJoinTypeBoth", mUseJoinType[3], v); }
+    bool UseJoinCompareOperatorEquals() const { return Get(u"P_GET UseJoinCompareOperatorEquals", mUseOperator[0]); }
+    void UseJoinCompareOperatorEquals(bool v) { Let(u"P_LET UseJoinCompareOperatorEquals", mUseOperator[0], v); }
+    bool UseJoinCompareOperatorNotEquals() const { return Get(u"P_GET UseJoinCompareOperatorNotEquals", mUseOperator[1]); }
+    void UseJoinCompareOperatorNotEquals(bool v) { Let(u"P_LET UseJoinCompareOperatorNotEquals", mUseOperator[1], v); }
+    bool UseJoinCompareOperatorLess() const { return Get(u"P_GET UseJoinCompareOperatorLess", mUseOperator[2]); }
+    void UseJoinCompareOperatorLess(bool v) { Let(u"P_LET UseJoinCompareOperatorLess", mUseOperator[2], v); }
+    bool UseJoinCompareOperatorGreater() const { return Get(u"P_GET UseJoinCompareOperatorGreater", mUseOperator[3]); }
+    void UseJoinCompareOperatorGreater(bool v) { Let(u"P_LET UseJoinCompareOperatorGreater", mUseOperator[3], v); }
+    bool UseJoinCompareOperatorLessEquals() const { return Get(u"P_GET UseJoinCompareOperatorLessEquals", mUseOperator[4]); }
+    void UseJoinCompareOperatorLessEquals(bool v) { Let(u"P_LET UseJoinCompareOperatorLessEquals", mUseOperator[4], v); }
+    bool UseJoinCompareOperatorGreaterEquals() const { return Get(u"P_GET UseJoinCompareOperatorGreaterEquals", mUseOperator[5]); }
+    void UseJoinCompareOperatorGreaterEquals(bool v) { Let(u"P_LET UseJoinCompareOperatorGreaterEquals", mUseOperator[5], v); }
+    bool UseJoinCompareOperatorLE() const { return Get(u"P_GET UseJoinCompareOperatorLessEquals", mUseOperator[4]); }
+    void UseJoinCompareOperatorLE(bool v) { Let(u"P_LET UseJoinCompareOperatorLE", mUseOperator[4], v); }
+    bool UseJoinCompareOperatorGE() const { return Get(u"P_GET UseJoinCompareOperatorGE", mUseOperator[5]); }
+    void UseJoinCompareOperatorGE(bool v) { Let(u"P_LET UseJoinCompareOperatorGreaterEquals", mUseOperator[5], v); }
+    /// Always nothing: hosts learn the object concerned from the events' arguments.
+    Ref<TalvikZandorLib::ZDJoin> lastjoin() const { return Nothing<TalvikZandorLib::ZDJoin>(u"P_GET lastjoin"); }
+    Ref<TalvikZandorLib::ZDTable> activetable() const { return Nothing<TalvikZandorLib::ZDTable>(u"P_GET activetable"); }
+    Ref<TalvikZandorLib::ZDColumn> ActiveColumn() const { return Nothing<TalvikZandorLib::ZDColumn>(u"P_GET activecolumn"); }
+    // clang-format on
+
+    /// Drops every table and replaces the model by an empty one.
+    void Terminate();
+    /// Selects the columns of a name in every shown and model table of a name, and no others there.
+    void SelectColumnNames(const String& TabName, const String& ColName);
+    /// Makes the first shown table of a name the current one; an unknown name changes nothing.
+    void SetCurrentTable(const String& TabName);
+
+private:
+    friend struct ZandorBackstage; ///< tests reach the procedures below through it
+
+    using Tabulet = TalvikTabulet::Tabulet;
+    using ColumnItem = TalvikTabulet::ColumnItem;
+    using ZDTableRef = Ref<TalvikZandorLib::ZDTable>;
+    using ZDColumnRef = Ref<TalvikZandorLib::ZDColumn>;
+
+    static constexpr std::int16_t lastTableSlot = 16;
+    static constexpr std::int16_t lastJoinSlot = 64;
+
+
+    // Errors and traces
+    template <class Body>
+    void Guard(platform::StringView procedure, Body&& body) const noexcept {
+        basZandor::Guard(mToolkit, ModuleName, procedure, std::forward<Body>(body));
+    }
+    template <class T>
+    T Get(platform::StringView procedure, const T& member) const {
+        T result{};
+        Guard(procedure, [&] { result = member; });
+        return result;
+    }
+    template <class T>
+    void Let(platform::StringView procedure, T& member, const T& value) {
+        Guard(procedure, [&] { member = value; });
+    }
+    template <class T>
+    Ref<T> Nothing(platform::StringView procedure) const {
+        Guard(procedure, [] {});
+        return {};
+    }
+    void Trace(platform::StringView text, platform::StringView title = ModuleName) const;
+
+    // Lifecycle and layout
+    void UserControl_Initialize();
+    void UserControl_Terminate();
+    void ResizeControls();
+    float UpperPaneHeight() const;
+    void WriteRowTitles();
+    TalvikTabulet::TabuletEvents TableEvents();
+    void MakeMenu();
+
+    // Binding
+    TalvikZandorLib::Zandor& Model();
+    void SetZandor();
+    bool ShowTables();
+    void ShowJoins();
+    void ShowDefinitions();
+    void ShowDefinition(std::int32_t column, TalvikZandorLib::ZDColumnDefinition& definition);
+    void TieBoundColumns();
+    bool RemoveAllTables();
+    void ShowMenuEntries();
+    void MakeCurrent(Tabulet& table);
+
+    // Canvas: tables
+    void ShowTable(std::int16_t slot, TalvikZandorLib::ZDTable& table, std::int32_t& cascade);
+    void FillTable(Tabulet& element, TalvikZandorLib::ZDTable& table);
+    bool FindTable(const String& TableName, Ref<Tabulet>& Table);
+    bool FindColumn(const Ref<Tabulet>& Table, const String& ColumnName, Ref<ColumnItem>& Column);
+    bool SetSelectedTable(const String& TableName);
+    bool ShowSelectedTable();
+    bool RemoveTable(std::int16_t Index);
+    void RemoveColumnsOf(const String& tableName);
+    void TerminateTable(std::int16_t Index);
+    void SetFocusBack();
+    void lstTable_CloseClick(std::int16_t Index);
+    void lstTable_GotFocus(std::int16_t Index);
+
+    // Canvas: arranging
+    void OrganizeTables();
+    void lstTable_Moving(std::int16_t Index);
+    void lstTable_Moved(std::int16_t Index);
+    void lstTable_Resized(std::int16_t Index);
+    void lstTable_Scroll(std::int16_t Index);
+    void hsbTable_Change();
+    void vsbTable_Change();
+    void hsbTable_GotFocus();
+    void vsbTable_GotFocus();
+    void cmdHome_Click();
+    void cmdHome_GotFocus();
+    void fraTable_MouseDown(std::int16_t Button, std::int16_t Shift, float X, float Y);
+    void fraTable_MouseUp(std::int16_t Button, std::int16_t Shift, float X, float Y);
+
+    // Canvas: gestures
+    void lstTable_ColumnMouseDown(std::int16_t Index, const Ref<ColumnItem>& Column,
+                                  std::int16_t Button, std::int16_t Shift);
+    void lstTable_ColumnMouseMove(std::int16_t Index, const Ref<ColumnItem>& Column,
+                                  std::int16_t Button, std::int16_t Shift);
+    void lstTable_ColumnMouseUp(std::int16_t Index, const Ref<ColumnItem>& Column,
+                                std::int16_t Button, std::int16_t Shift);
+    void lstTable_DragOver(std::int16_t Index, platform::Control* Source, float X, float Y,
+                           std::int16_t State);
+    void lstTable_DragDrop(std::int16_t Index, platform::Control* Source, float X, float Y);
+    bool GetDragColumns(std::int16_t Index);
+    ZDTableRef TableOf(std::int16_t Index);
+    static bool IsAllColumns(const ColumnItem& entry);
+    static Ref<ColumnItem> FirstSelected(Tabulet& table);
+
+    // Joins
+    bool DrawJoin(clsJoinLine& JoinLine);
+    void PlaceJoin(const clsJoinLine& JoinLine);
+    void DrawJoins();
+    float DeltaJoinLine(float X, float Y, float X1, float Y1, float X2, float Y2);
+    bool JoinHitTest(Ref<clsJoinLine>& JoinLine, float X, float Y);
+    bool JoinAllreadyExists(const Ref<Tabulet>& leftTable, const Ref<ColumnItem>& leftColumn,
+                            const Ref<Tabulet>& rightTable, const Ref<ColumnItem>& rightColumn);
+    bool DrawNewJoin(Ref<clsJoinLine>& NewJoinLine, const Ref<Tabulet>& leftTable,
+                     const Ref<ColumnItem>& leftColumn, const Ref<Tabulet>& rightTable,
+                     const Ref<ColumnItem>& rightColumn, std::int16_t joinType,
+                     std::int16_t compareOperator);
+    void AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTable,
+                    const ZDColumnRef& leftColumn, const ZDTableRef& rightTable,
+                    const ZDColumnRef& rightColumn);
+    bool RemoveJoin(const Ref<clsJoinLine>& record);
+    void SetLanguageOfJoinDefinition(frmJoinDefinition& dialog);
+    void SetEnabledJoinTypes(frmJoinDefinition& dialog);
+    void SetEnabledJoinOperators(frmJoinDefinition& dialog);
+    void mnuJoinDelete_Click();
+    void mnuJoinShowDefinition_Click();
+    Ref<TalvikZandorLib::ZDJoin> ModelJoin(const clsJoinLine& record);
+
+    // Grid: cells and editors
+    void AddNewAndCriterium(const ZDColumnRef& sourceColumn, std::int32_t column);
+    void MakeGetValueFieldsInvisible();
+    void GetTextValue(const String& cellText);
+    void GetSortOrder(const String& cellText);
+    void GetVisibility(const String& cellText);
+    void OpenEditor(platform::Frame& frame, platform::CommandButton& set);
+    Ref<TalvikZandorLib::ZDColumnDefinition> DefinitionOf(std::int32_t column);
+    void sprColumn_MouseDown(std::int16_t Button, std::int16_t Shift, float X, float Y);
+    void sprColumn_MouseUp(std::int16_t Button, std::int16_t Shift, float X, float Y);
+    void sprColumn_Scroll();
+    void cmdSetSortOrder_Click();
+    void cmdSetVisibility_Click();
+    void cmdSetTextValue_Click();
+    void cobSortOrder_KeyDown(std::int16_t KeyCode, std::int16_t Shift);
+    void cobVisibility_KeyDown(std::int16_t KeyCode, std::int16_t Shift);
+    void txtValue_KeyDown(std::int16_t KeyCode, std::int16_t Shift);
+    void SetCell(const String& text, std::int16_t alignment);
+
+    // Grid: definitions
+    void sprColumn_DragDrop(platform::Control* Source, float X, float Y);
+    void mnuColumnDefinitionPaste_Click();
+    void mnuColumnDefinitionDelete_Click();
+    void mnuTableDefinitionCopy_Click();
+    void mnuTableDefinitionDelete_Click();
+    void mnuTableDefinitionPaste_Click();
+    void InsertDragColumns(float X, float Y);
+    bool InsertColumnDefinition(const String& fieldName, std::int32_t column);
+    bool RemoveColumn(std::int32_t column);
+    void FitColumn(std::int32_t column, const String& fieldName);
+
+    // Context menu
+    void PopupZandorMenu(std::int16_t source, float X, float Y);
+    void CheckMenus(std::int16_t source, float X, float Y);
+    void SwitchSpecialMenusOff();
+    void mnuZandor_Click();
+
+    platform::Toolkit& mToolkit;
+    TalvikZandorLib::Library& mLibrary;
+    ZandorEvents& mEvents;
+
+    std::int16_t mDebugSwitch = 1;
+    std::int16_t mJoinModifyDisabled = 0;
+    bool mOnlyJoin = true;
+    bool mUseJoinType[4] = {true, true, true, true};
+    bool mUseOperator[6] = {true, true, true, true, true, true};
+
+    Ref<TalvikZandorLib::Zandor> mModel;
+    Ref<clsFreeList> mTableFreeList;
+    Ref<clsFreeList> mJoinFreeList;
+    platform::KeyedCollection<clsJoinLine> mJoinLines; ///< keyed by the digits of the join's number
+    std::vector<Ref<clsDragColumn>> mDragColumns;
+    std::int16_t mDragTableIndex = 0;
+    std::int16_t mActiveTableIndex = 0;
+    std::int32_t mBoundColumns = 0; ///< grid columns filled by the last binding
+    Ref<clsJoinLine> mLastJoin;
+    float mPopupX = 0;
+    float mPopupY = 0;
+    bool mMenuPrepared = false;
+
+    // Constituent controls, in stacking order
+    const TalvikTabulet::TabuletEvents mTableEvents;
+    std::unique_ptr<platform::Frame> fraTable;
+    ControlArray<platform::Line> linJoin;
+    ControlArray<platform::Shape> shpJoin;
+    ControlArray<Tabulet> lstTable;
+    std::unique_ptr<MSFlexGridLib::MSFlexGrid> sprColumn;
+    std::unique_ptr<platform::ScrollBar> hsbTable;
+    std::unique_ptr<platform::ScrollBar> vsbTable;
+    std::unique_ptr<platform::CommandButton> cmdHome;
+    std::unique_ptr<platform::Frame> fraSortOrder, fraSortOrder2;
+    std::unique_ptr<platform::ComboBox> cobSortOrder;
+    std::unique_ptr<platform::CommandButton> cmdSetSortOrder;
+    std::unique_ptr<platform::Frame> fraVisibility, fraVisibility2;
+    std::unique_ptr<platform::ComboBox> cobVisibility;
+    std::unique_ptr<platform::CommandButton> cmdSetVisibility;
+    std::unique_ptr<platform::Frame> fraValue, fraValue2;
+    std::unique_ptr<platform::TextBox> txtValue;
+    std::unique_ptr<platform::CommandButton> cmdSetTextValue;
+    std::unique_ptr<platform::PopupMenu> mnuZandor;
+    std::unique_ptr<platform::MenuEntry> mnuJoinShowDefinition;
+    std::unique_ptr<platform::MenuEntry> mnuJoinDelete;
+    std::unique_ptr<platform::MenuEntry> mnuJoinSep;
+    std::unique_ptr<platform::MenuEntry> mnuTableDefinitionCopy;
+    std::unique_ptr<platform::MenuEntry> mnuTableDefinitionPaste;
+    std::unique_ptr<platform::MenuEntry> mnuTableDefinitionDelete;
+    std::unique_ptr<platform::MenuEntry> mnuTableDefinitionSep;
+    std::unique_ptr<platform::MenuEntry> mnuColumnDefinitionPaste;
+    std::unique_ptr<platform::MenuEntry> mnuColumnDefinitionDelete;
+};
+
+} // namespace TalvikDBxZandor

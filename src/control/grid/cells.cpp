@@ -1,0 +1,94 @@
+#include "control/Zandor.h"
+
+#include "control/KeyNumber.h"
+#include "platform/Numbers.h"
+
+namespace TalvikDBxZandor {
+
+using platform::single;
+
+/// The definition tied to a grid column. Error 5 when the model holds none under its key.
+platform::Ref<TalvikZandorLib::ZDColumnDefinition> Zandor::DefinitionOf(std::int32_t column) {
+    return Model().ColumnDefinitions().Item(keyOfNumber(sprColumn->ColData(column)));
+}
+
+void Zandor::SetCell(const String& text, std::int16_t alignment) {
+    sprColumn->Text(text);
+    sprColumn->CellAlignment(alignment);
+}
+
+void Zandor::FitColumn(std::int32_t column, const String& fieldName) {
+    sprColumn->ColWidth(column, single(mToolkit.TextWidth(fieldName) + 120));
+}
+
+void Zandor::AddNewAndCriterium(const ZDColumnRef& sourceColumn, std::int32_t column) {
+    Guard(u"AddNewAndCriterium", [&] {
+        const auto definition = mLibrary.NewZDColumnDefinition();
+        definition->Column(sourceColumn);
+        definition->Visible(true);
+        definition->SortOrder(0);
+        definition->Synonym({});
+        const auto stored = Model().AddColumnDefinition(definition);
+        sprColumn->ColData(column, numberOfKey(stored->Key()));
+    });
+}
+
+void Zandor::MakeGetValueFieldsInvisible() {
+    Guard(u"MakeGetValueFieldsInvisible", [&] {
+        fraValue->Visible(false);
+        fraSortOrder->Visible(false);
+        fraVisibility->Visible(false);
+        if (mLastJoin && mLastJoin->JoinLineIndex() != -1)
+            linJoin(mLastJoin->JoinLineIndex())->BorderWidth(1);
+    });
+}
+
+void Zandor::GetTextValue(const String& cellText) {
+    Guard(u"GetTextValue", [&] {
+        txtValue->Text(cellText);
+        OpenEditor(*fraValue, *cmdSetTextValue);
+        txtValue->SetFocus();
+    });
+}
+
+void Zandor::GetSortOrder(const String& cellText) {
+    Guard(u"GetSortOrder", [&] {
+        cobSortOrder->ListIndex(cellText == u"Ascending" ? 1 : cellText == u"Descending" ? 2 : 0);
+        OpenEditor(*fraSortOrder, *cmdSetSortOrder);
+        cobSortOrder->SetFocus();
+    });
+}
+
+void Zandor::GetVisibility(const String& cellText) {
+    Guard(u"GetVisibility", [&] {
+        cobVisibility->ListIndex(cellText == u"Not Visible" ? 1 : 0);
+        OpenEditor(*fraVisibility, *cmdSetVisibility);
+        cobVisibility->SetFocus();
+    });
+}
+
+/// Centres an editor over the current cell, inside the control but for its upper edge, and shows
+/// it. The grid's top is added, its left is not; nor is there a lower bound for the top.
+void Zandor::OpenEditor(platform::Frame& frame, platform::CommandButton& set) {
+    constexpr float margin = 30;
+    const float width = frame.Width();
+    const float height = frame.Height();
+
+    float left = single(sprColumn->CellLeft() + sprColumn->CellWidth() / 2 - width / 2);
+    if (single(left + width) <= mToolkit.ScaleWidth()) {
+        if (left < margin) left = margin;
+    } else {
+        left = single(mToolkit.ScaleWidth() - width - margin);
+    }
+    float top = single(sprColumn->Top() + sprColumn->CellTop() + sprColumn->CellHeight() / 2 -
+                       height / 2);
+    if (single(top + height) > mToolkit.ScaleHeight())
+        top = single(mToolkit.ScaleHeight() - height - margin);
+
+    frame.setBounds({left, top, width, height});
+    frame.Visible(true);
+    frame.ZOrder();
+    set.Default(true);
+}
+
+} // namespace TalvikDBxZandor

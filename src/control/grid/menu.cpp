@@ -1,0 +1,76 @@
+#include "control/Zandor.h"
+
+namespace TalvikDBxZandor {
+
+void Zandor::PopupZandorMenu(std::int16_t source, float X, float Y) {
+    Guard(u"PopupZandorMenu", [&] {
+        mEvents.Raise(Event::Activate, {});
+        CheckMenus(source, X, Y);
+        // Window frameworks that watch the control's window learn that a menu is open.
+        const std::uint32_t message = mToolkit.RegisterWindowMessage(u"TALVIKDISABLEVELT");
+        std::int32_t scratch = 0;
+        if (message > 0) mToolkit.SendMessage(message, 0, &scratch);
+        mnuZandor->PopupMenuAtMouse();
+        if (message > 0) mToolkit.SendMessage(message, 1, &scratch);
+    });
+}
+
+void Zandor::CheckMenus(std::int16_t source, float X, float Y) {
+    Guard(u"CheckMenus", [&] {
+        mPopupX = X;
+        mPopupY = Y;
+        mMenuPrepared = true;
+        MakeGetValueFieldsInvisible();
+        SwitchSpecialMenusOff();
+
+        if (source == 0) {
+            mnuTableDefinitionCopy->Enabled(true);
+            mnuTableDefinitionPaste->Enabled(false);
+            if (!mDragColumns.empty() &&
+                lstTable(mActiveTableIndex)->Tag() != mDragColumns.front()->Table()->Tag())
+                mnuTableDefinitionPaste->Enabled(true);
+            mnuTableDefinitionDelete->Enabled(true);
+        } else if (source == 1) {
+            Ref<clsJoinLine> hit;
+            if (JoinHitTest(hit, X, Y)) {
+                mnuJoinShowDefinition->Enabled(true);
+                mnuJoinDelete->Enabled(true);
+            }
+        } else if (source == 2) {
+            mnuColumnDefinitionPaste->Enabled(!mDragColumns.empty());
+            std::int32_t column = 0;
+            std::int32_t row = 0;
+            basZandor::SpreadHitTest(mToolkit, column, row, *sprColumn, mPopupX, mPopupY);
+            if (column >= 1 && !sprColumn->TextMatrix(0, column).empty())
+                mnuColumnDefinitionDelete->Enabled(true);
+        }
+    });
+}
+
+void Zandor::SwitchSpecialMenusOff() {
+    Guard(u"SwitchSpecialMenusOff", [&] {
+        mnuColumnDefinitionDelete->Enabled(false);
+        mnuColumnDefinitionPaste->Enabled(false);
+        mnuJoinDelete->Enabled(false);
+        mnuJoinShowDefinition->Enabled(false);
+        mnuTableDefinitionCopy->Enabled(false);
+        mnuTableDefinitionDelete->Enabled(false);
+        mnuTableDefinitionPaste->Enabled(false);
+    });
+}
+
+void Zandor::mnuZandor_Click() {
+    Guard(u"mnuZandor_Click", [&] {
+        if (!mMenuPrepared) SwitchSpecialMenusOff();
+        mMenuPrepared = false;
+        mnuJoinShowDefinition->Caption(LNGMnuShowJoinDef);
+        mnuJoinDelete->Caption(LNGMnuDelJoin);
+        mnuTableDefinitionCopy->Caption(LNGMnuCopyCol);
+        mnuTableDefinitionPaste->Caption(LNGMnuCreateJoin);
+        mnuTableDefinitionDelete->Caption(LNGMnuDelTable);
+        mnuColumnDefinitionPaste->Caption(LNGMnuPasteCol);
+        mnuColumnDefinitionDelete->Caption(LNGMnuDelCol);
+    });
+}
+
+} // namespace TalvikDBxZandor

@@ -1,0 +1,79 @@
+#include "control/Zandor.h"
+
+#include "frmJoinDefinition.h"
+#include "platform/Numbers.h"
+
+// How the control opens the join definition dialog.
+
+namespace TalvikDBxZandor {
+
+using platform::toInteger;
+
+void Zandor::SetLanguageOfJoinDefinition(frmJoinDefinition& dialog) {
+    Guard(u"SetLanguageOfJoinDefinition", [&] {
+        const auto dress = [this](auto& control, const String& caption) {
+            control.Font(mToolkit.ControlFont());
+            control.Caption(caption);
+        };
+        dress(*dialog.lblLeftTable, LNGJoinLeftTable);
+        dress(*dialog.lblLeftColumn, LNGJoinLeftColumn);
+        dress(*dialog.lblRightTable, LNGJoinRightTable);
+        dress(*dialog.lblRightColumn, LNGJoinRightColumn);
+        dress(*dialog.lblJoinType, LNGJoinType);
+        dress(*dialog.cmdOk, LNGJoinOk);
+        dress(*dialog.cmdCancel, LNGJoinCancel);
+    });
+}
+
+void Zandor::SetEnabledJoinTypes(frmJoinDefinition& dialog) {
+    Guard(u"SetEnabledJoinTypes", [&] {
+        const String* const texts[] = {&LNGJoinTypeNormal, &LNGJoinTypeLeftOuter,
+                                       &LNGJoinTypeRightOuter, &LNGJoinTypeBothOuter};
+        auto& list = *dialog.cboJoinType;
+        list.Font(mToolkit.ControlFont());
+        list.Clear();
+        for (std::size_t code = 0; code < std::size(texts); ++code)
+            if (mUseJoinType[code]) list.AddItem(*texts[code]);
+    });
+}
+
+void Zandor::SetEnabledJoinOperators(frmJoinDefinition& dialog) {
+    // Shares its report name with the list of types.
+    Guard(u"SetEnabledJoinTypes", [&] {
+        const platform::StringView symbols[] = {u"=", u"<>", u"<", u">", u"<=", u">="};
+        auto& list = *dialog.cboJoinCompareOperator;
+        list.Clear();
+        for (std::size_t code = 0; code < std::size(symbols); ++code)
+            if (mUseOperator[code]) list.AddItem(String(symbols[code]));
+    });
+}
+
+void Zandor::mnuJoinShowDefinition_Click() {
+    Guard(u"mnuJoinShowDefinition_Click", [&] {
+        Ref<clsJoinLine> record;
+        if (!JoinHitTest(record, mPopupX, mPopupY)) return;
+        frmJoinDefinition dialog(mToolkit, mDebugSwitch != 0);
+        dialog.form->Caption(LNGJoinForm);
+        const auto join = ModelJoin(*record);
+        join->CompareOperator(toInteger(record->CompareOperator()));
+        join->JoinType(toInteger(record->JoinType()));
+
+        SetLanguageOfJoinDefinition(dialog);
+        SetEnabledJoinTypes(dialog);
+        SetEnabledJoinOperators(dialog);
+        dialog.Join(join);
+        dialog.JoinLine(record);
+        dialog.JoinModifyDisabled(mJoinModifyDisabled);
+        dialog.form->ShowModal();
+        if (!dialog.JoinIsModified()) return;
+
+        // The record follows the model: the mark of an outer join changes at once, and the dialog
+        // opens on the new values the next time.
+        record->CompareOperator(join->CompareOperator());
+        record->JoinType(join->JoinType());
+        DrawJoin(*record);
+        mEvents.Raise(Event::JoinModified, {.Join = join});
+    });
+}
+
+} // namespace TalvikDBxZandor

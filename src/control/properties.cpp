@@ -1,0 +1,100 @@
+#include "control/Zandor.h"
+
+#include "platform/Numbers.h"
+
+namespace TalvikDBxZandor {
+
+using platform::single;
+using platform::toInteger;
+
+namespace {
+
+/// Scrolls so that `value` is the first visible twip of a canvas of `extent`, of which `visible`
+/// can be seen; past the end of the range, to its end.
+void scrollTo(platform::ScrollBar& bar, std::int16_t value, float visible, float extent) {
+    if (single(value + visible) < extent) {
+        bar.Value(value);
+        return;
+    }
+    const float end = single(extent - visible);
+    bar.Value(end >= 1 ? toInteger(end) : std::int16_t{0});
+}
+
+} // namespace
+
+std::int16_t Zandor::VisibleFrameLeft() const {
+    std::int16_t result = 0;
+    Guard(u"P_GET VisibleFrameLeft", [&] { result = toInteger(-fraTable->Left()); });
+    return result;
+}
+
+void Zandor::VisibleFrameLeft(std::int16_t v) {
+    Guard(u"P_LET VisibleFrameLeft",
+          [&] { scrollTo(*hsbTable, v, mToolkit.ScaleWidth(), fraTable->Width()); });
+}
+
+std::int16_t Zandor::VisibleFrameTop() const {
+    std::int16_t result = 0;
+    Guard(u"P_GET VisibleFrameTop", [&] { result = toInteger(-fraTable->Top()); });
+    return result;
+}
+
+void Zandor::VisibleFrameTop(std::int16_t v) {
+    Guard(u"P_LET VisibleFrameTop",
+          [&] { scrollTo(*vsbTable, v, UpperPaneHeight(), fraTable->Height()); });
+}
+
+std::int16_t Zandor::HorizMaxScrollPos() const {
+    std::int16_t result = 0;
+    Guard(u"P_GET HorizMaxScrollPos", [&] { result = hsbTable->Max(); });
+    return result;
+}
+
+void Zandor::HorizMaxScrollPos(std::int16_t v) {
+    Guard(u"P_LET HorizMaxScrollPos", [&] { hsbTable->Max(v); });
+}
+
+std::int16_t Zandor::VertMaxScrollPos() const {
+    std::int16_t result = 0;
+    Guard(u"P_GET VertMaxScrollPos", [&] { result = vsbTable->Max(); });
+    return result;
+}
+
+void Zandor::VertMaxScrollPos(std::int16_t v) {
+    Guard(u"P_LET VertMaxScrollPos", [&] { vsbTable->Max(v); });
+}
+
+std::int16_t Zandor::HorizontalScrollbarPos() const {
+    std::int16_t result = 0;
+    Guard(u"P_GET HorizontalScrollbarPos", [&] { result = hsbTable->Value(); });
+    return result;
+}
+
+void Zandor::HorizontalScrollbarPos(std::int16_t v) {
+    Guard(u"P_LET HorizontalScrollbarPos", [&] { hsbTable->Value(v); });
+}
+
+std::int16_t Zandor::VerticalScrollbarPos() const {
+    std::int16_t result = 0;
+    Guard(u"P_GET VerticalScrollbarPos", [&] { result = vsbTable->Value(); });
+    return result;
+}
+
+void Zandor::VerticalScrollbarPos(std::int16_t v) {
+    Guard(u"P_LET VerticalScrollbarPos", [&] { vsbTable->Value(v); });
+}
+
+void Zandor::OnlyJoin(bool v) {
+    Guard(u"P_LET OnlyJoin", [&] {
+        mOnlyJoin = v;
+        if (!mOnlyJoin) {
+            sprColumn->Visible(true);
+            WriteRowTitles();
+        } else {
+            sprColumn->Visible(false);
+        }
+        ResizeControls();
+    });
+}
+
+} // namespace TalvikDBxZandor

@@ -1,0 +1,36 @@
+#include "platform/Numbers.h"
+
+#include "platform/RuntimeError.h"
+
+#include <cmath>
+#include <limits>
+
+namespace platform {
+
+namespace {
+
+template <class Whole>
+Whole toWhole(double value) {
+    // Halves to even by hand: the result must not follow the thread's rounding mode.
+    double rounded = std::floor(value);
+    const double rest = value - rounded;
+    if (rest > 0.5 || (rest == 0.5 && std::fmod(rounded, 2.0) != 0.0)) rounded += 1.0;
+    if (!(rounded >= std::numeric_limits<Whole>::min() &&
+          rounded <= std::numeric_limits<Whole>::max()))
+        throw errors::overflow();
+    return static_cast<Whole>(rounded);
+}
+
+} // namespace
+
+std::int16_t toInteger(double value) { return toWhole<std::int16_t>(value); }
+
+std::int32_t toLong(double value) { return toWhole<std::int32_t>(value); }
+
+float single(double value) {
+    const auto rounded = static_cast<float>(value);
+    if (!std::isfinite(rounded)) throw errors::overflow();
+    return rounded;
+}
+
+} // namespace platform

@@ -1,0 +1,122 @@
+#pragma once
+
+#include "control/Zandor.h"
+
+#include <functional>
+#include <memory>
+#include <vector>
+
+/// One control on one toolkit, with a user in front of it. Each toolkit has a stage of its own, so
+/// that the same tests run on every toolkit. Everything is in twips.
+class Stage {
+public:
+    using String = platform::String;
+
+    struct Box {
+        String text;
+        String title;
+        std::int32_t style = 0;
+        friend bool operator==(const Box&, const Box&) = default;
+    };
+
+    struct Raised {
+        TalvikDBxZandor::Event event;
+        TalvikDBxZandor::EventArguments arguments;
+    };
+
+    struct WindowMessage {
+        String name;
+        std::uintptr_t wParam = 0;
+        bool menuOpen = false;
+    };
+
+    /// What a user sees of a constituent control; members that its kind lacks keep their zeros.
+    struct Seen {
+        platform::Bounds bounds;
+        bool visible = false;
+        bool enabled = false;
+        bool focused = false;
+        String text; ///< caption of a button or entry, title of a table, text of an input
+        String font;
+        std::int16_t listIndex = -1;
+        std::int16_t value = 0, max = 0, largeChange = 0; ///< scroll bars
+        float X1 = 0, Y1 = 0, X2 = 0, Y2 = 0;             ///< lines
+        std::int16_t borderWidth = 0;                     ///< lines
+        std::int16_t shape = 0;                           ///< marks
+        std::vector<String> items;                        ///< combo boxes, table lists
+        std::vector<String> selected;                     ///< table lists: texts of selected entries
+    };
+
+    /// A menu entry at the moment the menu stands open.
+    struct Entry {
+        String name;
+        String caption;
+        bool enabled = false;
+        bool visible = false;
+    };
+
+    virtual ~Stage() = default;
+
+    /// Opens a control of 12000 by 9000 twips on the toolkit that this program is linked with. The
+    /// library is the test's own; DebugSwitch is at its default of 1.
+    static std::unique_ptr<Stage> open(TalvikZandorLib::Library& library);
+
+    virtual TalvikDBxZandor::Zandor& control() = 0;
+    virtual platform::Toolkit& toolkit() = 0;
+    /// Destroys the control (its closing boxes are recorded).
+    virtual void closeControl() = 0;
+
+    /// Everything shown or told so far, in order. Tests may clear them.
+    std::vector<Box> boxes;
+    std::vector<Raised> raised;
+    std::vector<WindowMessage> messages;
+    /// The order of everything: "box:Text", "event:JoinCreated", "message:0", "menu", "dialog".
+    std::vector<std::string> transcript;
+
+    /// Called while a popup menu stands open, with its entries; returns the name of the entry that
+    /// the user chooses, or an empty text to dismiss the menu. Unset: dismissed.
+    std::function<String(const std::vector<Entry>&)> onMenu;
+    /// Called while the join dialog stands open. Unset: it is cancelled.
+    std::function<void()> onDialog;
+
+    /// By name: "hsbTable", "lstTable(3)", "linJoin(1)", "shpJoin(2)", "mnuJoinDelete"; while the
+    /// dialog is open also its controls. Fails the test when there is no such control.
+    virtual Seen look(const std::string& name) = 0;
+    virtual bool exists(const std::string& name) = 0;
+    /// Text of a grid cell as shown.
+    virtual String cell(std::int32_t row, std::int32_t col) = 0;
+
+    // The user's hands.
+    virtual void resizeControl(float width, float height) = 0;
+    virtual void repaint() = 0;
+    virtual void clickButton(const std::string& name) = 0;
+    virtual void focus(const std::string& name) = 0;
+    virtual void scrollBarTo(const std::string& name, std::int16_t value) = 0;
+    /// Presses, drags and releases the title bar so that the table ends at a place.
+    virtual void moveTable(std::int16_t index, float left, float top) = 0;
+    virtual void resizeTable(std::int16_t index, float width, float height) = 0;
+    virtual void closeTable(std::int16_t index) = 0;
+    /// Scrolls a table's list so that an entry (1-based) is its first visible row.
+    virtual void scrollList(std::int16_t index, std::int32_t firstEntry) = 0;
+    virtual void scrollGrid(std::int32_t topRow, std::int32_t leftCol) = 0;
+    /// Selects entries (1-based) as clicks with Ctrl do, without the button events.
+    virtual void selectEntries(std::int16_t index, const std::vector<std::int32_t>& entries) = 0;
+    virtual void pressEntry(std::int16_t index, std::int32_t entry, std::int16_t button) = 0;
+    virtual void releaseEntry(std::int16_t index, std::int32_t entry, std::int16_t button) = 0;
+    /// Button is the sum of the buttons held.
+    virtual void moveOverEntry(std::int16_t index, std::int32_t entry, std::int16_t button) = 0;
+    /// A whole drag of the selected entries from an entry to an entry of another or the same table
+    /// (0: an empty place of the list).
+    virtual void dragToEntry(std::int16_t from, std::int32_t entry, std::int16_t to,
+                             std::int32_t target) = 0;
+    /// A whole drag to the middle of a grid cell.
+    virtual void dragToCell(std::int16_t from, std::int32_t entry, std::int32_t row,
+                            std::int32_t col) = 0;
+    virtual void pressCanvas(std::int16_t button, float x, float y) = 0;
+    virtual void releaseCanvas(std::int16_t button, float x, float y) = 0;
+    virtual void pressCell(std::int16_t button, std::int32_t row, std::int32_t col) = 0;
+    virtual void releaseCell(std::int16_t button, std::int32_t row, std::int32_t col) = 0;
+    virtual void type(const std::string& name, const String& text) = 0;
+    virtual void choose(const std::string& name, std::int16_t listIndex) = 0;
+    virtual void key(const std::string& name, std::int16_t keyCode) = 0;
+};
