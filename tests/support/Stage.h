@@ -4,6 +4,7 @@
 
 #include <functional>
 #include <memory>
+#include <ostream>
 #include <vector>
 
 /// One control on one toolkit, with a user in front of it. Each toolkit has a stage of its own, so
@@ -120,3 +121,8 @@ public:
     virtual void choose(const std::string& name, std::int16_t listIndex) = 0;
     virtual void key(const std::string& name, std::int16_t keyCode) = 0;
 };
+
+/// A failed comparison of boxes reads as their texts.
+inline void PrintTo(const Stage::Box& box, std::ostream* out) {
+    *out << platform::toUtf8(box.title) << " [" << box.style << "] " << platform::toUtf8(box.text);
+}

@@ -1,0 +1,147 @@
+#include "platform/headless/User.h"
+
+#include <utility>
+
+namespace platform::headless {
+
+namespace {
+
+constexpr std::int16_t ctrl = 2;
+
+// The states of a drag over a target.
+constexpr std::int16_t enter = 0;
+constexpr std::int16_t leave = 1;
+constexpr std::int16_t over = 2;
+
+void selectOnly(const Tabulet& table, std::int32_t chosen) {
+    for (std::size_t i = 1; i <= table.entries().size(); ++i)
+        table.entry(static_cast<std::int32_t>(i)).select(static_cast<std::int32_t>(i) == chosen);
+}
+
+TalvikTabulet::Point placeOf(const Tabulet& table, std::int32_t entry) {
+    if (entry == 0) return table.emptyPlace();
+    return {table.placement().Width / 2, table.rowMiddle(entry)};
+}
+
+} // namespace
+
+Tabulet& User::reachEntry(const std::string& name, std::int32_t entry) const {
+    auto& table = reach<Tabulet>(name);
+    table.entry(entry);
+    if (!table.inView(entry))
+        throw std::logic_error("the entry of " + name + " is scrolled out of view");
+    return table;
+}
+
+void User::pressEntry(const std::string& name, std::int32_t entry, std::int16_t button,
+                      std::int16_t shift) {
+    if (auto& table = reachEntry(name, entry); table.usable()) table.takeFocus();
+    auto& table = reachEntry(name, entry);
+    ColumnItem& pressed = table.entry(entry);
+    mPressedSelected = pressed.selected();
+    mDragTarget.clear();
+    if (shift & ctrl)
+        pressed.select(!pressed.selected());
+    else if (!pressed.selected())
+        selectOnly(table, entry);
+    if (table.events.ColumnMouseDown)
+        table.events.ColumnMouseDown(table.index, table.entries()[std::size_t(entry) - 1], button,
+                                     shift);
+}
+
+void User::moveOverEntry(const std::string& name, std::int32_t entry, std::int16_t button,
+                         std::int16_t shift) {
+    auto& table = reachEntry(name, entry);
+    if (table.events.ColumnMouseMove)
+        table.events.ColumnMouseMove(table.index, table.entries()[std::size_t(entry) - 1], button,
+                                     shift);
+}
+
+void User::releaseEntry(const std::string& name, std::int32_t entry, std::int16_t button,
+                        std::int16_t shift) {
+    auto& table = reachEntry(name, entry);
+    if (mToolkit.dragged()) {
+        const TalvikTabulet::Point at = placeOf(table, entry);
+        dropOn(name, at.X, at.Y);
+        return;
+    }
+    if (button == leftButton && mPressedSelected && !(shift & ctrl)) selectOnly(table, entry);
+    if (table.events.ColumnMouseUp)
+        table.events.ColumnMouseUp(table.index, table.entries()[std::size_t(entry) - 1], button,
+                                   shift);
+}
+
+void User::leaveDragTarget() {
+    const std::string left = std::exchange(mDragTarget, {});
+    if (left.empty() || !mToolkit.exists(left)) return;
+    auto& table = mToolkit.find<Tabulet>(left);
+    if (table.events.DragOver)
+        table.events.DragOver(table.index, mToolkit.dragged(), mDragPoint.X, mDragPoint.Y, leave);
+}
+
+void User::dragOver(const std::string& name, float X, float Y) {
+    auto& table = reach<Tabulet>(name);
+    if (!mToolkit.dragged()) return;
+    const bool entering = mDragTarget != name;
+    if (entering) leaveDragTarget();
+    mDragTarget = name;
+    mDragPoint = {X, Y};
+    if (table.events.DragOver)
+        table.events.DragOver(table.index, mToolkit.dragged(), X, Y, entering ? enter : over);
+}
+
+void User::dropOn(const std::string& target, float X, float Y) {
+    auto& element = reach<Element>(target);
+    if (!mToolkit.dragged()) return;
+    auto* const table = dynamic_cast<Tabulet*>(&element);
+    if (table)
+        dragOver(target, X, Y);
+    else
+        leaveDragTarget();
+    mDragTarget.clear();
+    Tabulet* const source = mToolkit.dragged();
+    mToolkit.endDragOf(source);
+    if (table) {
+        if (table->events.DragDrop) table->events.DragDrop(table->index, source, X, Y);
+    } else if (auto* grid = dynamic_cast<Grid*>(&element); grid && grid->events.DragDrop) {
+        grid->events.DragDrop(source, X, Y);
+    }
+}
+
+void User::dropNowhere() {
+    if (!mToolkit.dragged()) return;
+    leaveDragTarget();
+    mToolkit.endDragOf(mToolkit.dragged());
+}
+
+bool User::beginDragFrom(const std::string& table, std::int32_t entry) {
+    pressEntry(table, entry, leftButton);
+    moveOverEntry(table, entry, leftButton);
+    if (!mToolkit.dragged()) {
+        releaseEntry(table, entry, leftButton);
+        return false;
+    }
+    const TalvikTabulet::Point start = placeOf(mToolkit.find<Tabulet>(table), entry);
+    dragOver(table, start.X, start.Y);
+    return true;
+}
+
+void User::dragToEntry(const std::string& from, std::int32_t entry, const std::string& to,
+                       std::int32_t target) {
+    const auto& table = target == 0 ? reach<Tabulet>(to) : reachEntry(to, target);
+    placeOf(table, target);
+    if (!beginDragFrom(from, entry)) return;
+    const TalvikTabulet::Point at = placeOf(mToolkit.find<Tabulet>(to), target);
+    dragOver(to, at.X, at.Y);
+    dropOn(to, at.X, at.Y);
+}
+
+void User::dragToCell(const std::string& from, std::int32_t entry, const std::string& grid,
+                      std::int32_t row, std::int32_t col) {
+    reachCell(grid, row, col);
+    if (!beginDragFrom(from, entry)) return;
+    const Bounds at = reachCell(grid, row, col);
+    dropOn(grid, at.Left + at.Width / 2, at.Top + at.Height / 2);
+}
+
+} // namespace platform::headless

@@ -1,0 +1,60 @@
+#pragma once
+
+#include <QApplication>
+#include <QDrag>
+#include <QDropEvent>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPointer>
+#include <QWidget>
+#include <QWindow>
+#include <QtTest/qtestspontaneevent.h>
+
+/// Real Qt input, as the window system would deliver it.
+namespace hands {
+
+/// One mouse event on a widget; gives the focus as a click of the user's does.
+inline void mouse(QWidget& widget, QEvent::Type type, QPointF at, Qt::MouseButton button,
+                  Qt::MouseButtons held = Qt::NoButton, Qt::KeyboardModifiers modifiers = {}) {
+    QMouseEvent event(type, at, widget.mapTo(widget.window(), at), widget.mapToGlobal(at), button,
+                      held, modifiers);
+    QSpontaneKeyEvent::setSpontaneous(&event);
+    qApp->notify(&widget, &event);
+}
+
+inline void click(QWidget& widget, QPointF at) {
+    const QPointer<QWidget> alive = &widget;
+    mouse(widget, QEvent::MouseButtonPress, at, Qt::LeftButton, Qt::LeftButton);
+    if (alive) mouse(widget, QEvent::MouseButtonRelease, at, Qt::LeftButton);
+}
+
+inline void key(QWidget& widget, int key, const QString& text = {}) {
+    const QPointer<QWidget> alive = &widget;
+    for (const auto type : {QEvent::ShortcutOverride, QEvent::KeyPress, QEvent::KeyRelease}) {
+        if (!alive) return;
+        QKeyEvent event(type, key, Qt::NoModifier, text);
+        QSpontaneKeyEvent::setSpontaneous(&event);
+        qApp->notify(&widget, &event);
+    }
+}
+
+/// Carries a drag to a place of a widget and drops it there, or leaves where nothing takes it.
+/// The events reach the widget through its window, which looks for whoever takes drops.
+inline void carry(QDrag& drag, QWidget& over, QPointF at) {
+    QWindow* const window = over.window()->windowHandle();
+    const QPoint place = over.mapTo(over.window(), at).toPoint();
+    const QMimeData* const data = drag.mimeData();
+    QDragEnterEvent enter(place, Qt::CopyAction, data, Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(window, &enter);
+    QDragMoveEvent move(place, Qt::CopyAction, data, Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(window, &move);
+    if (move.isAccepted()) {
+        QDropEvent drop(place, Qt::CopyAction, data, Qt::NoButton, Qt::NoModifier);
+        QCoreApplication::sendEvent(window, &drop);
+    } else {
+        QDragLeaveEvent leave;
+        QCoreApplication::sendEvent(window, &leave);
+    }
+}
+
+} // namespace hands

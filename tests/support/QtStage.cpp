@@ -1,0 +1,503 @@
+#include "platform/qt/Adapter.h"
+#include "platform/qt/CanvasItems.h"
+#include "platform/qt/ColumnListModel.h"
+#include "platform/qt/GridModel.h"
+#include "platform/qt/GridWidget.h"
+#include "platform/qt/MessageBox.h"
+#include "platform/qt/QtToolkit.h"
+#include "platform/qt/TabuletWidget.h"
+#include "platform/qt/Text.h"
+#include "platform/qt/ZandorWidget.h"
+#include "platform/qt/ZandorWindowMessage.h"
+#include "support/QtHands.h"
+#include "support/Stage.h"
+#include "support/StageEvents.h"
+
+#include <QApplication>
+#include <QComboBox>
+#include <QDialog>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMenu>
+#include <QMessageBox>
+#include <QPaintEvent>
+#include <QPushButton>
+#include <QScrollBar>
+#include <QTimer>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+using platform::qt::Canvas;
+using platform::qt::CanvasItem;
+using platform::qt::CanvasLine;
+using platform::qt::CanvasShape;
+using platform::qt::fromQt;
+using platform::qt::GridWidget;
+using platform::qt::TabuletWidget;
+using platform::qt::toQt;
+using platform::qt::twipsPerPixel;
+
+Qt::MouseButtons buttonsOf(std::int16_t state) {
+    Qt::MouseButtons buttons;
+    if (state & 1) buttons |= Qt::LeftButton;
+    if (state & 2) buttons |= Qt::RightButton;
+    if (state & 4) buttons |= Qt::MiddleButton;
+    return buttons;
+}
+
+Qt::MouseButton buttonOf(std::int16_t state) {
+    return static_cast<Qt::MouseButton>(buttonsOf(state).toInt());
+}
+
+QPointF pixels(float x, float y) {
+    return {static_cast<double>(x) / twipsPerPixel, static_cast<double>(y) / twipsPerPixel};
+}
+
+/// A place somewhere in a widget.
+struct Spot {
+    QWidget* widget = nullptr;
+    QPointF at;
+};
+
+class QtStage final : public QObject, public Stage {
+public:
+    explicit QtStage(TalvikZandorLib::Library& library)
+        : mEvents(*this), mWidget(std::make_unique<ZandorWidget>(library)) {
+        qApp->installEventFilter(this);
+        listen();
+        // The platform without a screen carries no drags.
+        mWidget->toolkit().drags().setCarrier([this](QDrag& drag) {
+            if (mDropAt.widget) hands::carry(drag, *mDropAt.widget, mDropAt.at);
+        });
+        mWidget->resize(800, 600);
+        mWidget->show();
+        settle();
+    }
+
+    ~QtStage() override { closeControl(); }
+
+    TalvikDBxZandor::Zandor& control() override { return mWidget->control(); }
+    platform::Toolkit& toolkit() override { return mWidget->toolkit(); }
+    void closeControl() override {
+        mWidget.reset();
+        qApp->processEvents();
+    }
+
+    bool exists(const std::string& name) override {
+        return findWidget(name) || findItem(name) || findAction(name);
+    }
+    Seen look(const std::string& name) override;
+    String cell(std::int32_t row, std::int32_t col) override {
+        return fromQt(grid().model().text(row, col));
+    }
+
+    void resizeControl(float width, float height) override {
+        mWidget->resize(pixels(width, 0).toPoint().x(), pixels(0, height).toPoint().y());
+        settle();
+    }
+    void repaint() override {
+        // The canvas covers the widget's own surface, so nothing that is shown would do.
+        QPaintEvent event(mWidget->rect());
+        QCoreApplication::sendEvent(mWidget.get(), &event);
+        settle();
+    }
+    void clickButton(const std::string& name) override {
+        QWidget& button = widget<QAbstractButton>(name);
+        hands::click(button, QRectF(button.rect()).center());
+        settle();
+    }
+    void focus(const std::string& name) override {
+        focusable(widget<QWidget>(name)).setFocus(Qt::TabFocusReason);
+        settle();
+    }
+    void scrollBarTo(const std::string& name, std::int16_t value) override {
+        auto& bar = widget<QScrollBar>(name);
+        bar.setFocus(Qt::MouseFocusReason);
+        if (bar.isEnabled()) bar.setSliderPosition(value);
+        settle();
+    }
+    void moveTable(std::int16_t index, float left, float top) override {
+        const platform::Bounds from = look(tableName(index)).bounds;
+        TabuletWidget& box = table(index);
+        gesture(box, QRectF(box.titleBar()).center(), pixels(left - from.Left, top - from.Top));
+    }
+    void resizeTable(std::int16_t index, float width, float height) override {
+        const platform::Bounds from = look(tableName(index)).bounds;
+        TabuletWidget& box = table(index);
+        gesture(box, QPointF(box.width() - 2, box.height() - 2),
+                pixels(width - from.Width, height - from.Height));
+    }
+    void closeTable(std::int16_t index) override {
+        QWidget& close = table(index).closeButton();
+        hands::click(close, QRectF(close.rect()).center());
+        settle();
+    }
+    void scrollList(std::int16_t index, std::int32_t firstEntry) override {
+        auto& list = table(index).list();
+        list.verticalScrollBar()->setValue((firstEntry - 1) * list.rowHeight());
+        settle();
+    }
+    void scrollGrid(std::int32_t topRow, std::int32_t leftCol) override {
+        grid().bringUpToDate();
+        grid().view().verticalScrollBar()->setValue(topRow - 1);
+        grid().view().horizontalScrollBar()->setValue(leftCol - 1);
+        settle();
+    }
+    void selectEntries(std::int16_t index, const std::vector<std::int32_t>& entries) override {
+        auto& list = table(index).list();
+        list.selectionModel()->clearSelection();
+        for (const std::int32_t entry : entries)
+            list.selectionModel()->select(list.model()->index(entry - 1, 0),
+                                          QItemSelectionModel::Select);
+    }
+    void pressEntry(std::int16_t index, std::int32_t entry, std::int16_t button) override {
+        send(entrySpot(index, entry), QEvent::MouseButtonPress, button, buttonsOf(button));
+    }
+    void releaseEntry(std::int16_t index, std::int32_t entry, std::int16_t button) override {
+        send(entrySpot(index, entry), QEvent::MouseButtonRelease, button, Qt::NoButton);
+    }
+    void moveOverEntry(std::int16_t index, std::int32_t entry, std::int16_t button) override {
+        send(entrySpot(index, entry), QEvent::MouseMove, 0, buttonsOf(button));
+    }
+    void dragToEntry(std::int16_t from, std::int32_t entry, std::int16_t to,
+                     std::int32_t target) override {
+        drag(from, entry, entrySpot(to, target));
+    }
+    void dragToCell(std::int16_t from, std::int32_t entry, std::int32_t row,
+                    std::int32_t col) override {
+        drag(from, entry, cellSpot(row, col));
+    }
+    void pressCanvas(std::int16_t button, float x, float y) override {
+        send({&widget<Canvas>("fraTable"), pixels(x, y)}, QEvent::MouseButtonPress, button,
+             buttonsOf(button));
+    }
+    void releaseCanvas(std::int16_t button, float x, float y) override {
+        send({&widget<Canvas>("fraTable"), pixels(x, y)}, QEvent::MouseButtonRelease, button,
+             Qt::NoButton);
+    }
+    void pressCell(std::int16_t button, std::int32_t row, std::int32_t col) override {
+            send(cellSpot(row, col), QEvent::MouseButtonPress, button, buttonsOf(button));
+    }
+    void releaseCell(std::int16_t button, std::int32_t row, std::int32_t col) override {
+        send(cellSpot(row, col), QEvent::MouseButtonRelease, button, Qt::NoButton);
+    }
+    void type(const std::string& name, const String& text) override {
+        auto& input = widget<QLineEdit>(name);
+        input.setFocus(Qt::MouseFocusReason);
+        input.selectAll();
+        if (text.empty()) hands::key(input, Qt::Key_Delete);
+        for (const QChar letter : toQt(text)) hands::key(input, 0, letter);
+        settle();
+    }
+    void choose(const std::string& name, std::int16_t listIndex) override {
+        auto& combo = widget<QComboBox>(name);
+        if (!combo.isEnabled()) return;
+        combo.setFocus(Qt::MouseFocusReason);
+        hands::key(combo, Qt::Key_Home);
+        for (std::int16_t i = 0; i < listIndex; ++i) hands::key(combo, Qt::Key_Down);
+        settle();
+    }
+    void key(const std::string& name, std::int16_t keyCode) override {
+        QWidget& input = focusable(widget<QWidget>(name));
+        input.setFocus(Qt::MouseFocusReason);
+        int key = keyCode;
+        if (keyCode == 27) key = Qt::Key_Escape;
+        if (keyCode == 13) key = Qt::Key_Return;
+        hands::key(input, key);
+        settle();
+    }
+
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    static std::string tableName(int index) { return "lstTable(" + std::to_string(index) + ")"; }
+    static QWidget& focusable(QWidget& given) {
+        return given.focusProxy() ? *given.focusProxy() : given;
+    }
+
+    void listen();
+
+    /// Lets queued work run, and the window be the active one again after a box.
+    void settle() {
+        if (mWidget && !QApplication::activeModalWidget() && !QApplication::activePopupWidget() &&
+            !mWidget->isActiveWindow())
+            mWidget->activateWindow();
+        qApp->processEvents();
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    }
+
+    QWidget* findWidget(const std::string& name) const;
+    CanvasItem* findItem(const std::string& name) const;
+    QAction* findAction(const std::string& name) const;
+    template <class W>
+    W& widget(const std::string& name) const {
+        if (auto* found = dynamic_cast<W*>(findWidget(name))) return *found;
+        throw std::logic_error("there is no " + name);
+    }
+    TabuletWidget& table(int index) const { return widget<TabuletWidget>(tableName(index)); }
+    GridWidget& grid() const { return widget<GridWidget>("sprColumn"); }
+
+    Spot entrySpot(int index, std::int32_t entry) const;
+    Spot cellSpot(std::int32_t row, std::int32_t col) const;
+    void send(const Spot& spot, QEvent::Type type, std::int16_t button, Qt::MouseButtons held);
+    void gesture(TabuletWidget& box, QPointF grip, QPointF way);
+    void drag(std::int16_t from, std::int32_t entry, const Spot& to);
+    void boxOpened(QMessageBox& box);
+    void menuOpened(QMenu& menu);
+    void dialogOpened(QDialog& dialog);
+    static void lookAtKind(QWidget& widget, Seen& seen);
+
+    StageEvents mEvents;
+    Spot mDropAt; ///< where a drag that begins now ends; no widget: it is given up at once
+    std::unique_ptr<ZandorWidget> mWidget;
+};
+
+void QtStage::listen() {
+    using TalvikDBxZandor::Event;
+    using Widget = ZandorWidget;
+    const auto plain = [this](auto signal, Event event) {
+        connect(mWidget.get(), signal, this, [this, event] { mEvents.Raise(event, {}); });
+    };
+    plain(&Widget::TableDeleted, Event::TableDeleted);
+    plain(&Widget::TableMoved, Event::TableMoved);
+    plain(&Widget::Activate, Event::Activate);
+    const auto column = [this](auto signal, Event event) {
+        connect(mWidget.get(), signal, this, [this, event](const auto& definition) {
+            mEvents.Raise(event, {.Definition = definition, .Join = {}, .Text = {}});
+        });
+    };
+    column(&Widget::ColumnCreated, Event::ColumnCreated);
+    column(&Widget::ColumnModified, Event::ColumnModified);
+    column(&Widget::ColumnRemoved, Event::ColumnRemoved);
+    const auto join = [this](auto signal, Event event) {
+        connect(mWidget.get(), signal, this, [this, event](const auto& changed) {
+            mEvents.Raise(event, {.Definition = {}, .Join = changed, .Text = {}});
+        });
+    };
+    join(&Widget::JoinCreated, Event::JoinCreated);
+    join(&Widget::JoinModified, Event::JoinModified);
+    join(&Widget::JoinRemoved, Event::JoinRemoved);
+    connect(mWidget.get(), &Widget::Error, this, [this](const QString& text, int number) {
+        mEvents.Raise(Event::Error,
+                      {.Definition = {}, .Join = {}, .Text = fromQt(text), .Number = number});
+    });
+}
+
+QWidget* QtStage::findWidget(const std::string& name) const {
+    const QString wanted = QString::fromStdString(name);
+    for (QWidget* window : QApplication::topLevelWidgets())
+        if (auto* dialog = qobject_cast<QDialog*>(window); dialog && dialog->isVisible()) {
+            if (dialog->objectName() == wanted) return dialog;
+            if (auto* found = dialog->findChild<QWidget*>(wanted)) return found;
+        }
+    return mWidget ? mWidget->findChild<QWidget*>(wanted) : nullptr;
+}
+
+CanvasItem* QtStage::findItem(const std::string& name) const {
+    const auto* canvas = mWidget ? mWidget->findChild<QWidget*>("fraTable") : nullptr;
+    if (!canvas) return nullptr;
+    for (CanvasItem* item : static_cast<const Canvas*>(canvas)->items())
+        if (item->name().toStdString() == name) return item;
+    return nullptr;
+}
+
+QAction* QtStage::findAction(const std::string& name) const {
+    for (QWidget* window : QApplication::topLevelWidgets())
+        if (window->objectName() == QLatin1String("mnuZandor"))
+            for (QAction* action : window->actions())
+                if (action->objectName().toStdString() == name) return action;
+    return nullptr;
+}
+
+Stage::Seen QtStage::look(const std::string& name) {
+    settle();
+    Seen seen;
+    if (const QAction* action = findAction(name)) {
+        seen.text = action->isSeparator() ? u"-" : fromQt(action->text());
+        seen.enabled = action->isEnabled();
+        seen.visible = action->isVisible();
+    } else if (const CanvasItem* item = findItem(name)) {
+        seen.visible = item->visible();
+        seen.enabled = true;
+        if (const auto* line = dynamic_cast<const CanvasLine*>(item)) {
+            seen.X1 = line->X1();
+            seen.Y1 = line->Y1();
+            seen.X2 = line->X2();
+            seen.Y2 = line->Y2();
+            seen.borderWidth = line->borderWidth();
+        } else if (const auto* shape = dynamic_cast<const CanvasShape*>(item)) {
+            seen.bounds = shape->bounds();
+            seen.shape = shape->shapeStyle();
+        }
+    } else if (QWidget* widget = findWidget(name)) {
+        const auto* control = static_cast<const platform::Control*>(
+            widget->property(platform::qt::controlProperty).value<void*>());
+        if (control) seen.bounds = control->bounds();
+        // What the control takes for its place is what stands on the screen.
+        const bool placed = control && !widget->isWindow() && !widget->parentWidget()->layout();
+        if (placed && widget->isVisible()) {
+            EXPECT_EQ(widget->geometry(), platform::qt::toPixels(seen.bounds)) << name;
+        }
+        seen.visible = widget->isVisible();
+        seen.enabled = widget->isEnabled();
+        seen.focused = widget->window()->focusWidget() == &focusable(*widget);
+        seen.font = fromQt(widget->font().family());
+        lookAtKind(*widget, seen);
+    } else {
+        ADD_FAILURE() << "there is no " << name;
+    }
+    return seen;
+}
+
+void QtStage::lookAtKind(QWidget& widget, Seen& seen) {
+    if (const auto* button = dynamic_cast<QAbstractButton*>(&widget)) {
+        seen.text = fromQt(button->text());
+    } else if (const auto* label = dynamic_cast<QLabel*>(&widget)) {
+        seen.text = fromQt(label->text());
+    } else if (const auto* input = dynamic_cast<QLineEdit*>(&widget)) {
+        seen.text = fromQt(input->text());
+    } else if (const auto* dialog = dynamic_cast<QDialog*>(&widget)) {
+        seen.text = fromQt(dialog->windowTitle());
+    } else if (const auto* combo = dynamic_cast<QComboBox*>(&widget)) {
+        seen.text = fromQt(combo->currentText());
+        seen.listIndex = static_cast<std::int16_t>(combo->currentIndex());
+        for (int i = 0; i < combo->count(); ++i) seen.items.push_back(fromQt(combo->itemText(i)));
+    } else if (const auto* bar = dynamic_cast<QScrollBar*>(&widget)) {
+        seen.value = static_cast<std::int16_t>(bar->value());
+        seen.max = static_cast<std::int16_t>(bar->maximum());
+        seen.largeChange = static_cast<std::int16_t>(bar->pageStep());
+    } else if (const auto* table = dynamic_cast<TabuletWidget*>(&widget)) {
+        seen.text = fromQt(table->title());
+        for (int row = 0; row < table->model().rowCount(); ++row) {
+            seen.items.push_back(fromQt(table->model().text(row)));
+            if (table->list().selectionModel()->isRowSelected(row))
+                seen.selected.push_back(seen.items.back());
+        }
+    }
+}
+
+Spot QtStage::entrySpot(int index, std::int32_t entry) const {
+    auto& list = table(index).list();
+    QWidget* const viewport = list.viewport();
+    if (entry == 0) return {viewport, QPointF(viewport->width() / 2.0, viewport->height() - 4)};
+    const QRect row = list.visualRect(list.model()->index(entry - 1, 0));
+    const QRect shown = row & viewport->rect();
+    if (shown.isEmpty()) throw std::logic_error("the entry is scrolled out of view");
+    return {viewport, QRectF(shown).center()};
+}
+
+Spot QtStage::cellSpot(std::int32_t row, std::int32_t col) const {
+    const QRect cell = grid().cellRect(row, col) & grid().rect();
+    QWidget* const part = grid().childAt(cell.center());
+    if (cell.isEmpty() || !part) throw std::logic_error("the cell is scrolled out of view");
+    return {part, part->mapFrom(&grid(), QRectF(cell).center())};
+}
+
+void QtStage::send(const Spot& spot, QEvent::Type type, std::int16_t button,
+                   Qt::MouseButtons held) {
+    // Cells are left out: an editor opened over one cell may cover its neighbours.
+    if (type == QEvent::MouseButtonPress && !grid().isAncestorOf(spot.widget)) {
+        const QPoint at = spot.widget->mapTo(mWidget.get(), spot.at.toPoint());
+        EXPECT_TRUE(!mWidget->rect().contains(at) || mWidget->childAt(at) == spot.widget)
+            << "something covers the place pressed";
+    }
+    hands::mouse(*spot.widget, type, spot.at, buttonOf(button), held);
+    settle();
+}
+
+void QtStage::gesture(TabuletWidget& box, QPointF grip, QPointF way) {
+    // The mouse moves on the screen while the box moves below it.
+    const QPointF start = box.mapToGlobal(grip);
+    hands::mouse(box, QEvent::MouseButtonPress, grip, Qt::LeftButton, Qt::LeftButton);
+    const QPointer<QWidget> alive = &box;
+    for (const double part : {0.5, 1.0})
+        if (alive)
+            hands::mouse(box, QEvent::MouseMove, box.mapFromGlobal(start + part * way),
+                         Qt::NoButton, Qt::LeftButton);
+    if (alive)
+        hands::mouse(box, QEvent::MouseButtonRelease, box.mapFromGlobal(start + way),
+                     Qt::LeftButton);
+    settle();
+}
+
+void QtStage::drag(std::int16_t from, std::int32_t entry, const Spot& to) {
+    const Spot start = entrySpot(from, entry);
+    send(start, QEvent::MouseButtonPress, 1, Qt::LeftButton);
+    mDropAt = to;
+    send(start, QEvent::MouseMove, 0, Qt::LeftButton);
+    mDropAt = {};
+}
+
+bool QtStage::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() == QEvent::Show) {
+        if (auto* box = qobject_cast<QMessageBox*>(watched))
+            boxOpened(*box);
+        else if (auto* dialog = qobject_cast<QDialog*>(watched))
+            dialogOpened(*dialog);
+        else if (auto* menu = qobject_cast<QMenu*>(watched))
+            menuOpened(*menu);
+    } else if (watched == mWidget.get() &&
+               event->type() == ZandorWindowMessage::typeOf("TALVIKDISABLEVELT")) {
+        const auto& message = static_cast<const ZandorWindowMessage&>(*event);
+        messages.push_back({fromQt(message.name()), message.wParam(),
+                            QApplication::activePopupWidget() != nullptr});
+        transcript.push_back("message:" + std::to_string(message.wParam()));
+    }
+    return QObject::eventFilter(watched, event);
+}
+
+void QtStage::boxOpened(QMessageBox& box) {
+    const Box seen{fromQt(box.property(platform::qt::promptProperty).toString()),
+                   fromQt(box.windowTitle()), box.property(platform::qt::styleProperty).toInt()};
+    boxes.push_back(seen);
+    transcript.push_back("box:" + platform::toUtf8(seen.text));
+    QTimer::singleShot(0, &box, [&box] {
+        QWidget& ok = *box.button(QMessageBox::Ok);
+        hands::click(ok, QRectF(ok.rect()).center());
+    });
+}
+
+void QtStage::menuOpened(QMenu& menu) {
+    transcript.push_back("menu");
+    QTimer::singleShot(0, &menu, [this, &menu] {
+        std::vector<Entry> entries;
+        for (const QAction* action : menu.actions())
+            entries.push_back({fromQt(action->objectName()),
+                               action->isSeparator() ? u"-" : fromQt(action->text()),
+                               action->isEnabled(), action->isVisible()});
+        const String chosen = onMenu ? onMenu(entries) : String();
+        for (QAction* action : menu.actions())
+            if (!chosen.empty() && fromQt(action->objectName()) == chosen)
+                hands::click(menu, QRectF(menu.actionGeometry(action)).center());
+        // An entry that is disabled leaves the menu open.
+        if (menu.isVisible()) hands::key(menu, Qt::Key_Escape);
+    });
+}
+
+void QtStage::dialogOpened(QDialog& dialog) {
+    transcript.push_back("dialog");
+    QTimer::singleShot(0, &dialog, [this, open = QPointer<QDialog>(&dialog)] {
+        if (onDialog) onDialog();
+        if (open && open->isVisible()) hands::key(*open, Qt::Key_Escape);
+    });
+}
+
+} // namespace
+
+std::unique_ptr<Stage> Stage::open(TalvikZandorLib::Library& library) {
+    return std::make_unique<QtStage>(library);
+}
+
+int main(int argc, char** argv) {
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    QApplication application(argc, argv);
+    // The platform without a screen complains of what it lacks; nothing here depends on it.
+    qInstallMessageHandler([](QtMsgType, const QMessageLogContext&, const QString& text) {
+        if (!text.startsWith("This plugin does not support"))
+            std::fprintf(stderr, "%s\n", qPrintable(text));
+    });
+    testing::InitGoogleTest(&argc, argv);
+    return RUN_ALL_TESTS();
+}
