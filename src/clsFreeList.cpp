@@ -61,9 +61,8 @@ bool clsFreeList::GetNextFreeIndex(std::int32_t& Index) {
         for (std::int64_t i = mRangeFrom; i <= mRangeTo; ++i) {
             const std::size_t position = Position(i);
             if (mInUse[position]) continue;
-            const std::int32_t remaining = toLongExact(std::int64_t{mFreeCount} - 1);
             mInUse[position] = true;
-            mFreeCount = remaining;
+            mFreeCount = toLongExact(std::int64_t{mFreeCount} - 1);
             Index = static_cast<std::int32_t>(i);
             result = true;
             return;
@@ -75,10 +74,8 @@ bool clsFreeList::GetNextFreeIndex(std::int32_t& Index) {
 bool clsFreeList::FreeIndex(std::int32_t Index) {
     bool result = false;
     Guard(u"FreeIndex", [&] {
-        const std::size_t position = Position(Index);
-        const std::int32_t count = toLongExact(std::int64_t{mFreeCount} + 1);
-        mInUse[position] = false;
-        mFreeCount = count;
+        mInUse[Position(Index)] = false;
+        mFreeCount = toLongExact(std::int64_t{mFreeCount} + 1);
         result = true;
     });
     return result;

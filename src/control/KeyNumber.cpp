@@ -3,6 +3,7 @@
 #include "platform/Numbers.h"
 
 #include <algorithm>
+#include <limits>
 
 namespace TalvikDBxZandor {
 
@@ -10,20 +11,24 @@ namespace {
 
 bool isDigit(char16_t c) { return c >= u'0' && c <= u'9'; }
 
-} // namespace
-
-std::int32_t numberOfKey(platform::StringView key) {
+/// The digits after the first character; exact as far as 32 bits go, beyond any limit in the end.
+double digitsOf(platform::StringView key) {
     double number = 0;
     for (const char16_t c : key.substr(std::min<std::size_t>(1, key.size()))) {
         if (!isDigit(c)) break;
         number = number * 10 + (c - u'0');
     }
-    return platform::toLong(number);
+    return number;
 }
 
+} // namespace
+
+std::int32_t numberOfKey(platform::StringView key) { return platform::toLong(digitsOf(key)); }
+
 bool isKeyOfNumber(platform::StringView key) {
-    return key.size() > 1 && key.front() == u'x' &&
-           std::all_of(key.begin() + 1, key.end(), isDigit);
+    const double number = digitsOf(key);
+    return number <= std::numeric_limits<std::int32_t>::max() &&
+           key == keyOfNumber(static_cast<std::int32_t>(number));
 }
 
 platform::String keyOfNumber(std::int32_t number) { return u"x" + platform::decimal(number); }

@@ -8,9 +8,11 @@ namespace TalvikDBxZandor {
 /// value, 0 without any. Error 6 when it does not fit 32 bits.
 std::int32_t numberOfKey(platform::StringView key);
 
-/// Whether a key is "x" and nothing but digits after it, as `keyOfNumber` writes them.
+/// Whether a key is one that `keyOfNumber` writes, so that its number leads back to it: "x007" and
+/// a number beyond 32 bits are none.
 bool isKeyOfNumber(platform::StringView key);
 
+/// "x" and the number in decimal digits.
 platform::String keyOfNumber(std::int32_t number);
 
 } // namespace TalvikDBxZandor

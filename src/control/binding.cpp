@@ -32,9 +32,10 @@ void Zandor::P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& model) {
         lstTable(0)->Font(mToolkit.AmbientFont());
         sprColumn->Font(mToolkit.AmbientFont());
         SetZandor();
-        TieBoundColumns();
         OrganizeTables();
         ShowMenuEntries();
+        // Last, so that a model whose keys cannot be read is bound all the same.
+        TieBoundColumns();
     });
 }
 
@@ -128,9 +129,9 @@ void Zandor::ShowDefinition(std::int32_t column, TalvikZandorLib::ZDColumnDefini
     std::int32_t row = 4;
     sprColumn->Row(row);
     for (const auto& criterium : Each(definition.Criteria())) {
-        if (row >= sprColumn->Rows()) break;
-        sprColumn->Row(row++);
         SetCell(criterium->Criterium(), MSFlexGridLib::alignLeftCenter);
+        if (++row >= sprColumn->Rows()) break;
+        sprColumn->Row(row);
     }
 }
 
@@ -182,7 +183,7 @@ void Zandor::MakeCurrent(Tabulet& table) {
     if (table.Visible()) {
         try {
             table.SetFocus();
-        } catch (const platform::RuntimeError&) {
+        } catch (...) {
             // A control that is not on the screen yet cannot take the focus, and need not.
         }
     }

@@ -25,7 +25,15 @@ void Zandor::OrganizeTables() {
 }
 
 void Zandor::lstTable_Moving(std::int16_t) {
-    Guard(u"lstTable_Moving", [&] { DrawJoins(); });
+    Guard(u"lstTable_Moving", [&] {
+        for (const auto& record : platform::Each<clsJoinLine>(mJoinLines)) {
+            try {
+                PlaceJoin(*record);
+            } catch (const platform::RuntimeError&) {
+                // Reported once, where the move ends, not at every step of the mouse.
+            }
+        }
+    });
 }
 
 void Zandor::lstTable_Moved(std::int16_t Index) {

@@ -22,10 +22,12 @@ void Zandor::lstTable_ColumnMouseDown(std::int16_t Index, const Ref<ColumnItem>&
     constexpr platform::StringView procedure = u"lstTable_ColumnMouseDown";
     Guard(procedure, [&] {
         Trace(procedure);
-        auto& entries = lstTable(Index)->ColumnItems();
+        // Held, because a host told of a column may unload the element.
+        const Ref<Tabulet> element = lstTable(Index);
+        auto& entries = element->ColumnItems();
         const ZDTableRef table = TableOf(Index);
         for (std::int32_t n = 1; n <= entries.Count(); ++n) {
-            const auto& entry = entries.Item(n);
+            const Ref<ColumnItem> entry = entries.Item(n);
             const ZDColumnRef column = table->Columns().Item(entry->Key());
             const bool selected = entry->Selected();
             if (selected) Trace(u"Selected column found: " + entry->Text(), procedure);
@@ -42,7 +44,9 @@ void Zandor::lstTable_ColumnMouseMove(std::int16_t Index, const Ref<ColumnItem>&
         if (Button != platform::leftButton) return;
         mDragTableIndex = Index;
         GetDragColumns(Index);
-        lstTable(Index)->Drag(1);
+        // Held, because the drop may come while Drag still runs and unload the element.
+        const Ref<Tabulet> table = lstTable(Index);
+        table->Drag(1);
     });
 }
 
@@ -57,13 +61,14 @@ bool Zandor::GetDragColumns(std::int16_t Index) {
     bool result = false;
     Guard(u"GetDragColumns", [&] {
         std::vector<Ref<clsDragColumn>> records;
-        auto& entries = lstTable(Index)->ColumnItems();
+        const Ref<Tabulet> element = lstTable(Index);
+        auto& entries = element->ColumnItems();
         for (std::int32_t n = 1; n <= entries.Count(); ++n) {
-            const auto& entry = entries.Item(n);
+            const Ref<ColumnItem> entry = entries.Item(n);
             if (!entry->Selected()) continue;
             auto record = platform::makeRef<clsDragColumn>(mToolkit);
             record->TableIndex(Index);
-            record->Table(lstTable(Index));
+            record->Table(element);
             record->Column(entry);
             record->ZDTable(TableOf(Index));
             record->ZDColumn(record->ZDTable()->Columns().Item(entry->Key()));

@@ -6,7 +6,9 @@ using platform::Each;
 
 void Zandor::ShowTable(std::int16_t slot, TalvikZandorLib::ZDTable& table, std::int32_t& cascade) {
     lstTable.Load(slot);
-    Tabulet& element = *lstTable(slot);
+    // Held, because a host asked for a column may unload the element.
+    const Ref<Tabulet> held = lstTable(slot);
+    Tabulet& element = *held;
     element.Text(table.Name());
     element.Tag(table.Key());
 

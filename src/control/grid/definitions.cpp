@@ -28,7 +28,9 @@ void Zandor::InsertDragColumns(float X, float Y) {
     basZandor::SpreadHitTest(mToolkit, column, row, *sprColumn, X, Y);
     column = std::max(column, 1);
     for (const auto& record : std::vector(mDragColumns)) {
-        InsertColumnDefinition(record->Table()->Text() + u"." + record->Column()->Text(), column);
+        String fieldName = record->Table()->Text() + u".";
+        fieldName += record->Column()->Text();
+        InsertColumnDefinition(fieldName, column);
         AddNewAndCriterium(record->ZDColumn(), column);
         mEvents.Raise(Event::ColumnCreated, {.Definition = DefinitionOf(column)});
         ++column;

@@ -7,6 +7,26 @@ namespace {
 constexpr std::int32_t synonymRow = 1;
 constexpr std::int32_t sortRow = 2;
 constexpr std::int32_t visibleRow = 3;
+constexpr std::int32_t firstCriteriaRow = 4;
+
+/// Writes the text of a synonym or criteria row. False when there was nothing to change.
+bool storeText(TalvikZandorLib::ZDColumnDefinition& definition, std::int32_t row,
+               const platform::String& text) {
+    if (row == synonymRow) {
+        definition.Synonym(text);
+        return true;
+    }
+    const platform::String key = platform::decimal(row);
+    if (!definition.HasCriterium(key)) {
+        if (text.empty()) return false;
+        definition.AddCriterium(text, key);
+    } else if (text.empty()) {
+        definition.Criteria().Remove(key);
+    } else {
+        definition.Criteria().Item(key)->Criterium(text);
+    }
+    return true;
+}
 
 } // namespace
 
@@ -68,22 +88,14 @@ void Zandor::cmdSetTextValue_Click() {
     Guard(u"cmdSetTextValue_Click", [&] {
         if (Model().ColumnDefinitions().Count() != 0) {
             const std::int32_t row = sprColumn->Row();
-            const String key = platform::decimal(row);
             const auto definition = DefinitionOf(sprColumn->Col());
             const String text = txtValue->Text();
-            bool modified = true;
-            if (row == synonymRow)
-                definition->Synonym(text);
-            else if (definition->HasCriterium(key) && text.empty())
-                definition->Criteria().Remove(key);
-            else if (definition->HasCriterium(key))
-                definition->Criteria().Item(key)->Criterium(text);
-            else if (!text.empty())
-                definition->AddCriterium(text, key);
-            else
-                modified = false;
-            if (modified) mEvents.Raise(Event::ColumnModified, {.Definition = definition});
-            SetCell(text, MSFlexGridLib::alignLeftCenter);
+            // A drop under an open editor makes the new column's field current: nothing to write.
+            if (row == synonymRow || row >= firstCriteriaRow) {
+                if (storeText(*definition, row, text))
+                    mEvents.Raise(Event::ColumnModified, {.Definition = definition});
+                SetCell(text, MSFlexGridLib::alignLeftCenter);
+            }
         }
         fraValue->Visible(false);
     });

@@ -19,14 +19,13 @@ constexpr std::int32_t leftOuter = 1;
 float clampedTop(float rowMiddle, float markHeight, const TalvikTabulet::Tabulet& table) {
     const float half = markHeight / 2;
     const float tableTop = table.Top();
-    const float tableBottom = single(tableTop + table.Height());
     if (tableTop >= single(rowMiddle - half)) return tableTop;
+    const float tableBottom = single(tableTop + table.Height());
     if (tableBottom <= single(rowMiddle + half)) return single(tableBottom - markHeight);
     return single(rowMiddle - half);
 }
 
-void makeMark(platform::Shape& mark) {
-    mark.ShapeStyle(platform::shapeSquare);
+void sizeMark(platform::Shape& mark) {
     mark.setBounds({mark.Left(), mark.Top(), connectorSize, connectorSize});
 }
 
@@ -59,8 +58,10 @@ void Zandor::PlaceJoin(const clsJoinLine& JoinLine) {
 
     platform::Shape& markA = *shpJoin(JoinLine.LeftConnectorIndex());
     platform::Shape& markB = *shpJoin(JoinLine.RightConnectorIndex());
-    makeMark(markA);
-    makeMark(markB);
+    markA.ShapeStyle(platform::shapeSquare); // takes the circle of an earlier type back
+    markB.ShapeStyle(platform::shapeSquare);
+    sizeMark(markA);
+    sizeMark(markB);
 
     const bool leftIsWest = rightTable->Left() > leftTable->Left();
     Tabulet& west = leftIsWest ? *leftTable : *rightTable;
@@ -68,8 +69,8 @@ void Zandor::PlaceJoin(const clsJoinLine& JoinLine) {
     const auto westPoint = (leftIsWest ? leftItem : rightItem)->RightEdgePoint();
     const auto eastPoint = (leftIsWest ? rightItem : leftItem)->LeftEdgePoint();
 
-    markA.setBounds({westPoint.X, clampedTop(westPoint.Y, connectorSize, west), connectorSize,
-                     connectorSize});
+    markA.setBounds(
+        {westPoint.X, clampedTop(westPoint.Y, connectorSize, west), connectorSize, connectorSize});
     markB.setBounds({single(eastPoint.X - connectorSize),
                      clampedTop(eastPoint.Y, connectorSize, east), connectorSize, connectorSize});
 
@@ -120,8 +121,7 @@ bool Zandor::JoinHitTest(Ref<clsJoinLine>& JoinLine, float X, float Y) {
                 std::swap(firstY, secondY);
             }
             if (X < firstX || X > secondX) continue;
-            const float distance =
-                std::fabs(DeltaJoinLine(X, Y, firstX, firstY, secondX, secondY));
+            const float distance = std::fabs(DeltaJoinLine(X, Y, firstX, firstY, secondX, secondY));
             if (distance < hitTolerance && distance < best) {
                 best = distance;
                 JoinLine = record;

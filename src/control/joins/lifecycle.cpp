@@ -84,7 +84,8 @@ void Zandor::AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTa
         // A join drawn by the user always enters the model as a normal one with "=".
         join->JoinType(0);
         join->CompareOperator(0);
-        record->Tag(Model().AddJoin(join)->Key());
+        const auto stored = Model().AddJoin(join);
+        record->Tag(stored->Key());
     });
 }
 

@@ -1,0 +1,163 @@
+#include "control/JoinScene.h"
+
+namespace {
+
+struct TheDistanceFromAJoinLine : JoinScene {
+    float delta(float x, float y, float x1, float y1, float x2, float y2) {
+        return Back::DeltaJoinLine(control, x, y, x1, y1, x2, y2);
+    }
+};
+
+TEST_F(TheDistanceFromAJoinLine, IsPositiveOnOneSideAndNegativeOnTheOther) {
+    EXPECT_FLOAT_EQ(delta(20, 10, 0, 0, 100, 0), 10);
+    EXPECT_FLOAT_EQ(delta(20, -10, 0, 0, 100, 0), -10);
+    EXPECT_FLOAT_EQ(delta(20, 10, 100, 0, 0, 0), -10);
+}
+
+TEST_F(TheDistanceFromAJoinLine, IsZeroOnTheLine) {
+    EXPECT_EQ(delta(20, 0, 0, 0, 100, 0), 0);
+    EXPECT_NEAR(delta(6, 8, 0, 0, 3, 4), 0, 1e-5);
+}
+
+TEST_F(TheDistanceFromAJoinLine, IsPerpendicular) {
+    EXPECT_FLOAT_EQ(delta(4, -3, 0, 0, 3, 4), -5);
+    EXPECT_NEAR(delta(1000 - 4, 1000 + 3, 1000, 1000, 1003, 1004), 5, 1e-3);
+}
+
+TEST_F(TheDistanceFromAJoinLine, IsThatFromTheInfiniteLine) {
+    EXPECT_FLOAT_EQ(delta(-5000, 10, 0, 0, 100, 0), 10);
+}
+
+TEST_F(TheDistanceFromAJoinLine, IsZeroAndReportedWhenBothEndsCoincide) {
+    EXPECT_EQ(delta(20, 10, 5, 5, 5, 5), 0);
+    EXPECT_EQ(stage->boxes, Boxes{controlErrorBox(u"DeltaJoinLine", 11, u"Division by zero")});
+}
+
+/// Three joins; the tests put their lines where they need them.
+struct TheJoinUnderAPoint : JoinScene {
+    TheJoinUnderAPoint() {
+        join();
+        join();
+        join();
+        bind();
+        for (const std::int16_t n : {1, 2, 3}) line(n).setEnds(-9000, -9000, -8000, -9000);
+    }
+
+    Record hit;
+    bool at(float x, float y) { return Back::JoinHitTest(control, hit, x, y); }
+    bool isHit(float x, float y) {
+        hit = nullptr;
+        return at(x, y);
+    }
+};
+
+TEST_F(TheJoinUnderAPoint, IsOneCloserThan50) {
+    line(1).setEnds(1000, 1000, 3000, 1000);
+    EXPECT_TRUE(isHit(2000, 1049.9F));
+    EXPECT_EQ(hit, record(u"1"));
+    EXPECT_FALSE(isHit(2000, 1050));
+    EXPECT_EQ(hit, nullptr);
+    EXPECT_TRUE(isHit(2000, 950.1F));
+    EXPECT_FALSE(isHit(2000, 950));
+}
+
+TEST_F(TheJoinUnderAPoint, IsOneWhoseRangeOfXHoldsThePointEndsIncluded) {
+    line(1).setEnds(1000, 1000, 3000, 1000);
+    EXPECT_TRUE(isHit(1000, 1000));
+    EXPECT_TRUE(isHit(3000, 1000));
+    EXPECT_FALSE(isHit(999.9F, 1000));
+    EXPECT_FALSE(isHit(3000.1F, 1000));
+}
+
+TEST_F(TheJoinUnderAPoint, IsNeverBeyondTheRangeOfXOfASteepLineHoweverClose) {
+    line(1).setEnds(1000, 1000, 1010, 5000);
+    EXPECT_TRUE(isHit(1005, 3000));
+    EXPECT_FALSE(isHit(999, 1001));
+    EXPECT_FALSE(isHit(1011, 4999));
+}
+
+TEST_F(TheJoinUnderAPoint, IsNotTestedForTheRangeOfY) {
+    // Past the end of the steep line, in line with it and within its range of X.
+    line(1).setEnds(1000, 1000, 1010, 5000);
+    EXPECT_TRUE(isHit(1010, 5030));
+}
+
+TEST_F(TheJoinUnderAPoint, IsFoundWhicheverEndOfItsLineIsTheWesternOne) {
+    line(1).setEnds(3000, 2000, 1000, 1000);
+    EXPECT_TRUE(isHit(2000, 1500));
+    EXPECT_FALSE(isHit(2000, 1600));
+    EXPECT_FALSE(isHit(3001, 2000));
+}
+
+TEST_F(TheJoinUnderAPoint, IsTheNearest) {
+    line(1).setEnds(1000, 1000, 3000, 1000);
+    line(2).setEnds(1000, 1030, 3000, 1030);
+    line(3).setEnds(1000, 1060, 3000, 1060);
+    EXPECT_TRUE(isHit(2000, 1028));
+    EXPECT_EQ(hit, record(u"2"));
+    EXPECT_TRUE(isHit(2000, 1058));
+    EXPECT_EQ(hit, record(u"3"));
+    EXPECT_TRUE(isHit(2000, 1002));
+    EXPECT_EQ(hit, record(u"1"));
+}
+
+TEST_F(TheJoinUnderAPoint, IsTheEarlierOfTwoAtTheSameDistance) {
+    line(2).setEnds(1000, 1040, 3000, 1040);
+    line(3).setEnds(1000, 1000, 3000, 1000);
+    EXPECT_TRUE(isHit(2000, 1020));
+    EXPECT_EQ(hit, record(u"2"));
+}
+
+TEST_F(TheJoinUnderAPoint, IsAVerticalOneOnlyAtExactlyItsX) {
+    line(1).setEnds(2000, 1000, 2000, 3000);
+    EXPECT_TRUE(isHit(2000, 2000));
+    EXPECT_FALSE(isHit(2000.5F, 2000));
+    EXPECT_FALSE(isHit(1999.5F, 2000));
+}
+
+TEST_F(TheJoinUnderAPoint, IsTheOneHandedInWhenNoLineIsNear) {
+    hit = record(u"2");
+    EXPECT_TRUE(at(11000, 8000));
+    EXPECT_EQ(hit, record(u"2"));
+}
+
+TEST_F(TheJoinUnderAPoint, ReplacesTheOneHandedIn) {
+    line(1).setEnds(1000, 1000, 3000, 1000);
+    hit = record(u"2");
+    EXPECT_TRUE(at(2000, 1000));
+    EXPECT_EQ(hit, record(u"1"));
+}
+
+TEST_F(TheJoinUnderAPoint, IsNothingWhereNoLineIs) {
+    EXPECT_FALSE(isHit(11000, 8000));
+    EXPECT_EQ(hit, nullptr);
+    EXPECT_EQ(stage->boxes, Boxes());
+}
+
+const Stage::Box noLine =
+    controlErrorBox(u"JoinHitTest", 340, u"Control array element '99' doesn't exist");
+
+TEST_F(TheJoinUnderAPoint, IsAnsweredWithYesWhenTheSearchFails) {
+    record(u"1")->JoinLineIndex(99);
+    EXPECT_TRUE(isHit(2000, 1000));
+    EXPECT_EQ(hit, nullptr);
+    EXPECT_EQ(stage->boxes, Boxes{noLine});
+}
+
+TEST_F(TheJoinUnderAPoint, IsTheOneFoundBeforeAFailureEndsTheSearch) {
+    line(1).setEnds(1000, 1030, 3000, 1030);
+    record(u"2")->JoinLineIndex(99);
+    line(3).setEnds(1000, 1000, 3000, 1000);
+    EXPECT_TRUE(isHit(2000, 1000));
+    EXPECT_EQ(hit, record(u"1"));
+    EXPECT_EQ(stage->boxes, Boxes{noLine});
+}
+
+TEST_F(TheJoinUnderAPoint, IsOneOfNoLengthAtItsXBecauseTheFailedDistanceIsZero) {
+    line(1).setEnds(2000, 1000, 2000, 1000);
+    EXPECT_TRUE(isHit(2000, 7000));
+    EXPECT_EQ(hit, record(u"1"));
+    EXPECT_EQ(stage->boxes, Boxes{controlErrorBox(u"DeltaJoinLine", 11, u"Division by zero")});
+}
+
+} // namespace
