@@ -1,0 +1,63 @@
+#include "platform/qt/ColumnDelegate.h"
+
+#include "platform/qt/ColumnListModel.h"
+#include "platform/qt/KeyMarker.h"
+
+#include <QApplication>
+#include <QPainter>
+
+namespace platform::qt {
+
+namespace {
+
+int gutter(const QFontMetrics& metrics) { return metrics.height() + 4; }
+
+} // namespace
+
+QRect ColumnDelegate::textPlace(const QRect& entry, const QFontMetrics& metrics) {
+    return entry.adjusted(gutter(metrics), 0, -3, 0);
+}
+
+void ColumnDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
+                           const QModelIndex& index) const {
+    QStyleOptionViewItem item = option;
+    item.index = index;
+    // Nothing is cut off from the selection: it goes over the gutter, too.
+    item.showDecorationSelected = true;
+    const QStyle* style = item.widget ? item.widget->style() : QApplication::style();
+    style->drawPrimitive(QStyle::PE_PanelItemViewItem, &item, painter, item.widget);
+
+    const bool selected = item.state & QStyle::State_Selected;
+    const QPalette::ColorGroup group = !(item.state & QStyle::State_Enabled) ? QPalette::Disabled
+                                       : item.state & QStyle::State_Active   ? QPalette::Active
+                                                                             : QPalette::Inactive;
+    const QColor colour =
+        item.palette.color(group, selected ? QPalette::HighlightedText : QPalette::Text);
+    if (index.data(ColumnListModel::markedRole).toBool()) {
+        const qreal side = item.fontMetrics.height() - 2;
+        const QPointF corner(item.rect.left() + 3.0, item.rect.center().y() + 0.5 - side / 2);
+        QColor key = colour;
+        if (!selected) key.setAlphaF(0.75F);
+        paintKeyMarker(*painter, QRectF(corner, QSizeF(side, side)), key);
+    }
+    const QRect place = textPlace(item.rect, item.fontMetrics);
+    painter->setFont(item.font);
+    painter->setPen(colour);
+    painter->drawText(place, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextSingleLine,
+                      item.fontMetrics.elidedText(index.data().toString(), Qt::ElideRight,
+                                                  place.width()));
+    if (item.state & QStyle::State_HasFocus) {
+        QStyleOptionFocusRect focus;
+        focus.QStyleOption::operator=(item);
+        focus.state |= QStyle::State_KeyboardFocusChange | QStyle::State_Item;
+        focus.backgroundColor =
+            item.palette.color(group, selected ? QPalette::Highlight : QPalette::Base);
+        style->drawPrimitive(QStyle::PE_FrameFocusRect, &focus, painter, item.widget);
+    }
+}
+
+QSize ColumnDelegate::sizeHint(const QStyleOptionViewItem& option, const QModelIndex&) const {
+    return {gutter(option.fontMetrics), rowHeight(option.fontMetrics)};
+}
+
+} // namespace platform::qt

@@ -1,0 +1,34 @@
+#include "platform/qt/ColumnListModel.h"
+
+namespace platform::qt {
+
+int ColumnListModel::rowCount(const QModelIndex& parent) const {
+    return parent.isValid() ? 0 : static_cast<int>(mRows.size());
+}
+
+QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
+    if (!index.isValid() || index.row() >= rowCount()) return {};
+    if (role == Qt::DisplayRole) return text(index.row());
+    if (role == markedRole) return marked(index.row());
+    return {};
+}
+
+void ColumnListModel::append(const QString& text) {
+    const int row = rowCount();
+    beginInsertRows({}, row, row);
+    mRows.push_back({text, false});
+    endInsertRows();
+}
+
+void ColumnListModel::setMarked(int row, bool marked) {
+    mRows[static_cast<std::size_t>(row)].marked = marked;
+    emit dataChanged(index(row), index(row), {markedRole});
+}
+
+void ColumnListModel::clear() {
+    beginResetModel();
+    mRows.clear();
+    endResetModel();
+}
+
+} // namespace platform::qt

@@ -1,0 +1,35 @@
+#pragma once
+
+#include <QAbstractListModel>
+
+#include <vector>
+
+namespace platform::qt {
+
+/// The rows of a table list as the view sees them.
+class ColumnListModel : public QAbstractListModel {
+public:
+    /// Whether the column is marked.
+    static constexpr int markedRole = Qt::UserRole;
+
+    using QAbstractListModel::QAbstractListModel;
+
+    int rowCount(const QModelIndex& parent = {}) const override;
+    QVariant data(const QModelIndex& index, int role) const override;
+
+    const QString& text(int row) const { return mRows[static_cast<std::size_t>(row)].text; }
+    bool marked(int row) const { return mRows[static_cast<std::size_t>(row)].marked; }
+    void append(const QString& text);
+    void setMarked(int row, bool marked);
+    void clear();
+
+private:
+    struct Row {
+        QString text;
+        bool marked = false;
+    };
+
+    std::vector<Row> mRows;
+};
+
+} // namespace platform::qt

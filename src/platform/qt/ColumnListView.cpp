@@ -1,0 +1,113 @@
+#include "platform/qt/ColumnListView.h"
+
+#include "platform/qt/ColumnDelegate.h"
+#include "platform/qt/ElisionToolTip.h"
+#include "platform/qt/KeyCodes.h"
+
+#include <QContextMenuEvent>
+#include <QHelpEvent>
+#include <QScrollBar>
+#include <QWheelEvent>
+
+namespace platform::qt {
+
+ColumnListView::ColumnListView(QWidget* parent) : QListView(parent) {
+    setFrameShape(QFrame::NoFrame);
+    setSelectionMode(ExtendedSelection);
+    setEditTriggers(NoEditTriggers);
+    setDragDropMode(NoDragDrop);
+    setUniformItemSizes(true);
+    setVerticalScrollMode(ScrollPerPixel);
+    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    setTextElideMode(Qt::ElideRight);
+    setItemDelegate(new ColumnDelegate(this));
+    // The frame around the list shows the arrows of its border; the list does not inherit them.
+    setCursor(Qt::ArrowCursor);
+    connect(verticalScrollBar(), &QScrollBar::valueChanged, this, [this](int value) {
+        mScrolledBy = value;
+        if (mListener) mListener->listScrolled();
+    });
+    measure();
+}
+
+void ColumnListView::measure() {
+    mRowHeight = ColumnDelegate::rowHeight(fontMetrics());
+    verticalScrollBar()->setSingleStep(mRowHeight);
+}
+
+void ColumnListView::changeEvent(QEvent* event) {
+    QListView::changeEvent(event);
+    if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) measure();
+}
+
+void ColumnListView::selectFor(QMouseEvent& event, const QModelIndex& index) {
+    mClickPending = QPersistentModelIndex();
+    const bool left = event.button() == Qt::LeftButton;
+    if (!left) {
+        if (!index.isValid()) return;
+        selectionModel()->setCurrentIndex(
+            index, selectionModel()->isSelected(index) ? QItemSelectionModel::NoUpdate
+                                                       : QItemSelectionModel::ClearAndSelect);
+        return;
+    }
+    const bool plain = event.modifiers() == Qt::NoModifier;
+    if (plain && index.isValid() && selectionModel()->isSelected(index)) {
+        selectionModel()->setCurrentIndex(index, QItemSelectionModel::NoUpdate);
+        mClickPending = index;
+        return;
+    }
+    QListView::mousePressEvent(&event);
+    // The base class would go on to select along the way of the mouse.
+    setState(NoState);
+}
+
+void ColumnListView::mousePressEvent(QMouseEvent* event) {
+    const QModelIndex index = indexAt(event->position().toPoint());
+    selectFor(*event, index);
+    if (mListener && index.isValid())
+        mListener->entryPressed(index.row(), buttonState(event->button()),
+                                shiftState(event->modifiers()));
+}
+
+void ColumnListView::mouseMoveEvent(QMouseEvent* event) {
+    const QModelIndex index = indexAt(event->position().toPoint());
+    if (!mListener || !index.isValid() || event->buttons() == Qt::NoButton) return;
+    mListener->entryMoved(index.row(), buttonState(event->buttons()),
+                          shiftState(event->modifiers()));
+}
+
+void ColumnListView::mouseReleaseEvent(QMouseEvent* event) {
+    const QModelIndex index = indexAt(event->position().toPoint());
+    if (event->button() == Qt::LeftButton && mClickPending.isValid() && mClickPending == index)
+        selectionModel()->setCurrentIndex(index, QItemSelectionModel::ClearAndSelect);
+    mClickPending = QPersistentModelIndex();
+    if (mListener && index.isValid())
+        mListener->entryReleased(index.row(), buttonState(event->button()),
+                                 shiftState(event->modifiers()));
+}
+
+void ColumnListView::mouseDoubleClickEvent(QMouseEvent* event) { mousePressEvent(event); }
+
+void ColumnListView::contextMenuEvent(QContextMenuEvent* event) {
+    // The mouse opens the menu on release; the menu key has no release of its own.
+    if (event->reason() == QContextMenuEvent::Keyboard && mListener && currentIndex().isValid())
+        mListener->entryReleased(currentIndex().row(), buttonState(Qt::RightButton), 0);
+}
+
+void ColumnListView::wheelEvent(QWheelEvent* event) {
+    QListView::wheelEvent(event);
+    // At its end the list stands still; the canvas below does not take over.
+    event->accept();
+}
+
+bool ColumnListView::viewportEvent(QEvent* event) {
+    if (event->type() != QEvent::ToolTip) return QListView::viewportEvent(event);
+    const auto& help = *static_cast<QHelpEvent*>(event);
+    const QModelIndex index = indexAt(help.pos());
+    if (index.isValid())
+        showElisionToolTip(help, *viewport(), index.data().toString(), font(),
+                           ColumnDelegate::textPlace(visualRect(index), fontMetrics()));
+    return true;
+}
+
+} // namespace platform::qt

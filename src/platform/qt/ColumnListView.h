@@ -1,0 +1,49 @@
+#pragma once
+
+#include <QListView>
+#include <QPersistentModelIndex>
+
+namespace platform::qt {
+
+/// What a list tells about the mouse on its entries (row counts from 0). The selection is already
+/// as the gesture leaves it.
+class EntryListener {
+public:
+    virtual ~EntryListener() = default;
+    virtual void entryPressed(int row, std::int16_t button, std::int16_t shift) = 0;
+    virtual void entryMoved(int row, std::int16_t buttons, std::int16_t shift) = 0;
+    virtual void entryReleased(int row, std::int16_t button, std::int16_t shift) = 0;
+    virtual void listScrolled() = 0;
+};
+
+/// The list of a table's columns. Several entries can be selected and dragged together: a press on
+/// one of them leaves the others selected until the button comes up.
+class ColumnListView : public QListView {
+public:
+    explicit ColumnListView(QWidget* parent);
+
+    void setListener(EntryListener* listener) { mListener = listener; }
+    int rowHeight() const { return mRowHeight; }
+    int scrolledBy() const { return mScrolledBy; }
+
+protected:
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void mouseDoubleClickEvent(QMouseEvent* event) override;
+    void contextMenuEvent(QContextMenuEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+    bool viewportEvent(QEvent* event) override;
+    void changeEvent(QEvent* event) override;
+
+private:
+    void selectFor(QMouseEvent& event, const QModelIndex& index);
+    void measure();
+
+    EntryListener* mListener = nullptr;
+    QPersistentModelIndex mClickPending; ///< to be selected alone when the button comes up
+    int mRowHeight = 0;
+    int mScrolledBy = 0;
+};
+
+} // namespace platform::qt

@@ -1,0 +1,43 @@
+#pragma once
+
+#include "platform/Intrinsic.h"
+#include "platform/qt/Adapter.h"
+
+#include <QDialog>
+
+class QFormLayout;
+class QHBoxLayout;
+
+namespace platform::qt {
+
+/// A form: labels and fields pair up in the order of their making, buttons stand in a row below.
+class FormDialog : public QDialog {
+public:
+    FormDialog(QWidget* parent, PlainEvent Close);
+
+    void place(QWidget* child, Role role);
+    void setCloseEvent(PlainEvent Close) { mClose = std::move(Close); }
+
+    /// Escape and the close button of the frame both come here.
+    void reject() override;
+
+private:
+    QFormLayout* mForm;
+    QHBoxLayout* mButtons;
+    int mLabels = 0;
+    int mFields = 0;
+    PlainEvent mClose;
+};
+
+class DialogAdapter final : public Adapter<platform::Dialog, FormDialog> {
+public:
+    using Adapter::Adapter;
+    ~DialogAdapter() override;
+
+    void place(QWidget* child, Role role) override;
+    void Caption(const String& value) override;
+    void ShowModal() override;
+    void Hide() override;
+};
+
+} // namespace platform::qt

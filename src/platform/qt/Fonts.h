@@ -1,0 +1,15 @@
+#pragma once
+
+#include "platform/Control.h"
+
+#include <QFont>
+
+namespace platform::qt {
+
+Font fromQt(const QFont& font);
+
+/// The font in the style of `base`: what a platform font does not say (weight, hinting, fallback
+/// families) stays as the widget has it.
+QFont toQt(const Font& font, const QFont& base);
+
+} // namespace platform::qt

@@ -1,0 +1,48 @@
+#pragma once
+
+#include "platform/Intrinsic.h"
+#include "platform/qt/Adapter.h"
+#include "platform/qt/Canvas.h"
+
+#include <QFrame>
+
+namespace platform::qt {
+
+/// The frame that tables and joins are drawn on.
+class CanvasAdapter final : public Adapter<platform::Frame, Canvas> {
+public:
+    CanvasAdapter(Canvas* widget, FocusTracker& focus, FrameEvents events);
+    ~CanvasAdapter() override;
+
+    void Visible(bool value) override { show(value); }
+    void ZOrder() override;
+};
+
+/// A frame whose children stand side by side in the order of their making. It is as large as they
+/// need, until a size is set.
+class RowFrame : public QFrame {
+public:
+    explicit RowFrame(QWidget* parent, bool outermost);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+
+private:
+    const bool mOutermost;
+};
+
+class RowFrameAdapter final : public Adapter<platform::Frame, RowFrame> {
+public:
+    using Adapter::Adapter;
+
+    Bounds bounds() const override;
+    void setBounds(const Bounds& bounds) override;
+    void place(QWidget* child, Role role) override;
+    void Visible(bool value) override;
+    void ZOrder() override;
+
+private:
+    bool mSized = false;
+};
+
+} // namespace platform::qt

@@ -1,0 +1,65 @@
+#pragma once
+
+#include "platform/MSFlexGrid.h"
+#include "platform/qt/Adapter.h"
+#include "platform/qt/GridWidget.h"
+
+namespace platform::qt {
+
+class DragSession;
+
+class GridAdapter final : public Adapter<MSFlexGridLib::MSFlexGrid, GridWidget>,
+                          private GridListener {
+public:
+    GridAdapter(GridWidget* widget, FocusTracker& focus, DragSession& drags,
+                MSFlexGridLib::GridEvents events);
+    ~GridAdapter() override;
+
+    void Visible(bool value) override { show(value); }
+    void Font(const platform::Font& value) override;
+    void SetFocus() override;
+
+    std::int32_t Rows() const override;
+    std::int32_t Cols() const override;
+    std::int32_t TopRow() const override { return grid().firstRow(); }
+    std::int32_t LeftCol() const override { return grid().firstCol(); }
+    std::int32_t Row() const override { return grid().currentRow(); }
+    void Row(std::int32_t value) override;
+    std::int32_t Col() const override { return grid().currentCol(); }
+    void Col(std::int32_t value) override;
+    String Text() const override;
+    void Text(const String& value) override;
+    void CellAlignment(std::int16_t value) override;
+    float CellLeft() const override;
+    float CellTop() const override;
+    float CellWidth() const override;
+    float CellHeight() const override;
+
+    String TextMatrix(std::int32_t row, std::int32_t col) const override;
+    void TextMatrix(std::int32_t row, std::int32_t col, const String& value) override;
+    float ColPos(std::int32_t col) const override;
+    float RowPos(std::int32_t row) const override;
+    float ColWidth(std::int32_t col) const override;
+    void ColWidth(std::int32_t col, float value) override;
+    void ColPosition(std::int32_t col, std::int32_t position) override;
+    std::int32_t ColData(std::int32_t col) const override;
+    void ColData(std::int32_t col, std::int32_t value) override;
+
+private:
+    void pressed(Qt::MouseButton button, Qt::KeyboardModifiers modifiers, QPointF at) override;
+    void released(Qt::MouseButton button, Qt::KeyboardModifiers modifiers, QPointF at) override;
+    void scrolled() override;
+    bool dragAccepted(const QMimeData* data) override;
+    bool dropped(const QMimeData* data, QPointF at) override;
+
+    /// Error 91 once the widget has gone.
+    GridWidget& grid() const;
+    void mustBeRow(std::int32_t row) const;
+    void mustBeCol(std::int32_t col) const;
+    void mustBeCell(std::int32_t row, std::int32_t col) const;
+
+    DragSession& mDrags;
+    const MSFlexGridLib::GridEvents mEvents;
+};
+
+} // namespace platform::qt

@@ -1,0 +1,27 @@
+#include "platform/qt/GridCorner.h"
+
+#include "platform/qt/GridModel.h"
+
+#include <QStyleOptionHeader>
+#include <QStylePainter>
+
+namespace platform::qt {
+
+GridCorner::GridCorner(const GridModel& model, QWidget* parent)
+    : QWidget(parent), mModel(model) {
+    setAutoFillBackground(true);
+}
+
+void GridCorner::paintEvent(QPaintEvent*) {
+    QStylePainter painter(this);
+    QStyleOptionHeader option;
+    option.initFrom(this);
+    option.state |= QStyle::State_Raised;
+    option.orientation = Qt::Horizontal;
+    option.position = QStyleOptionHeader::OnlyOneSection;
+    option.text = mModel.text(0, 0);
+    option.textAlignment = Qt::AlignLeft | Qt::AlignVCenter;
+    painter.drawControl(QStyle::CE_Header, option);
+}
+
+} // namespace platform::qt

@@ -1,0 +1,63 @@
+#include "platform/qt/GridModel.h"
+
+#include <algorithm>
+#include <array>
+
+namespace platform::qt {
+
+GridModel::GridModel(int rows, int cols, QObject* parent)
+    : QAbstractTableModel(parent), mRows(rows), mColumns(static_cast<std::size_t>(cols)) {
+    for (Column& column : mColumns) column.cells.resize(static_cast<std::size_t>(rows));
+}
+
+void GridModel::setAlignment(int row, int col, std::int16_t alignment) {
+    // 0 to 8 run down the left, the middle and the right; 9 leaves it to the kind of the text.
+    static constexpr std::array<Qt::AlignmentFlag, 3> across = {Qt::AlignLeft, Qt::AlignHCenter,
+                                                                Qt::AlignRight};
+    static constexpr std::array<Qt::AlignmentFlag, 3> down = {Qt::AlignTop, Qt::AlignVCenter,
+                                                              Qt::AlignBottom};
+    const auto place = static_cast<std::size_t>(alignment > 8 ? 1 : alignment);
+    cell(row, col).alignment = across[place / 3] | down[place % 3];
+}
+
+void GridModel::move(int from, int to) {
+    const auto at = [this](int col) { return mColumns.begin() + col; };
+    if (from < to)
+        std::rotate(at(from), at(from + 1), at(to + 1));
+    else
+        std::rotate(at(to), at(from), at(from + 1));
+}
+
+void GridModel::announce() {
+    emit dataChanged(index(0, 0), index(rowCount() - 1, columnCount() - 1));
+    emit headerDataChanged(Qt::Horizontal, 0, columnCount() - 1);
+    emit headerDataChanged(Qt::Vertical, 0, rowCount() - 1);
+}
+
+int GridModel::rowCount(const QModelIndex& parent) const {
+    return parent.isValid() ? 0 : mRows - 1;
+}
+
+int GridModel::columnCount(const QModelIndex& parent) const {
+    return parent.isValid() ? 0 : cols() - 1;
+}
+
+QVariant GridModel::valueOf(const Cell& cell, int role) {
+    if (role == Qt::DisplayRole) return cell.text;
+    if (role == Qt::TextAlignmentRole) return static_cast<int>(cell.alignment);
+    return {};
+}
+
+QVariant GridModel::data(const QModelIndex& index, int role) const {
+    if (!index.isValid()) return {};
+    return valueOf(cell(index.row() + 1, index.column() + 1), role);
+}
+
+QVariant GridModel::headerData(int section, Qt::Orientation orientation, int role) const {
+    if (section < 0) return {};
+    if (orientation == Qt::Horizontal)
+        return section < columnCount() ? valueOf(cell(0, section + 1), role) : QVariant();
+    return section < rowCount() ? valueOf(cell(section + 1, 0), role) : QVariant();
+}
+
+} // namespace platform::qt

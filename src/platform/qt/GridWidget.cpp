@@ -1,0 +1,254 @@
+#include "platform/qt/GridWidget.h"
+
+#include "platform/qt/ElisionToolTip.h"
+#include "platform/qt/GridCorner.h"
+#include "platform/qt/GridModel.h"
+#include "platform/qt/Twips.h"
+
+#include <QDropEvent>
+#include <QHeaderView>
+#include <QHelpEvent>
+#include <QScrollBar>
+
+namespace platform::qt {
+
+namespace {
+
+constexpr float designWidth = 1500; ///< twips
+constexpr int textMargin = 8;
+
+/// Opens up what scrolling by whole columns needs.
+class TableView : public QTableView {
+public:
+    using QTableView::QTableView;
+    using QTableView::updateGeometries;
+};
+
+void prepareHeader(QHeaderView& header) {
+    header.setMinimumSectionSize(0);
+    header.setSectionsClickable(false);
+    header.setHighlightSections(false);
+    header.setTextElideMode(Qt::ElideRight);
+}
+
+} // namespace
+
+GridWidget::GridWidget(int rows, int cols, QWidget* parent)
+    : QWidget(parent), mModel(new GridModel(rows, cols, this)), mView(new TableView(this)),
+      mCorner(new GridCorner(*mModel, mView)) {
+    setAcceptDrops(true);
+    setFocusProxy(mView);
+    mView->setModel(mModel);
+    mView->setFrameShape(QFrame::NoFrame);
+    mView->setEditTriggers(QTableView::NoEditTriggers);
+    mView->setSelectionMode(QTableView::SingleSelection);
+    mView->setAutoScroll(false);
+    mView->setHorizontalScrollMode(QTableView::ScrollPerItem);
+    mView->setVerticalScrollMode(QTableView::ScrollPerItem);
+    mView->setCornerButtonEnabled(false);
+    mView->setWordWrap(false);
+    mView->setTextElideMode(Qt::ElideRight);
+    mView->setTabKeyNavigation(false);
+    prepareHeader(*mView->horizontalHeader());
+    prepareHeader(*mView->verticalHeader());
+    mView->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    for (int col = 0; col < cols; ++col) mModel->setWidth(col, designWidth);
+
+    mView->installEventFilter(this);
+    for (QWidget* part : {mView->viewport(), mView->horizontalHeader()->viewport(),
+                          mView->verticalHeader()->viewport(), static_cast<QWidget*>(mCorner)})
+        part->installEventFilter(this);
+    const auto scrolled = [this] {
+        if (mListener) mListener->scrolled();
+    };
+    connect(mView->horizontalScrollBar(), &QScrollBar::valueChanged, this, scrolled);
+    connect(mView->verticalScrollBar(), &QScrollBar::valueChanged, this, scrolled);
+    connect(mView->horizontalHeader(), &QHeaderView::sectionResized, this,
+            [this](int section, int, int size) {
+                if (!mRefreshing) mModel->setWidth(section + 1, toTwips(size));
+            });
+    connect(mView->selectionModel(), &QItemSelectionModel::currentChanged, this,
+            [this](const QModelIndex& current) {
+                if (mRefreshing || !current.isValid()) return;
+                mRow = current.row() + 1;
+                mCol = current.column() + 1;
+            });
+    measure();
+}
+
+void GridWidget::measure() {
+    mRowHeight = fontMetrics().height() + 8;
+    mView->verticalHeader()->setDefaultSectionSize(mRowHeight);
+    mView->horizontalHeader()->setFixedHeight(mRowHeight);
+    touch();
+}
+
+void GridWidget::touch() {
+    if (std::exchange(mStale, true)) return;
+    QMetaObject::invokeMethod(this, [this] { bringUpToDate(); }, Qt::QueuedConnection);
+}
+
+void GridWidget::setCurrentCell(int row, int col) {
+    mRow = row;
+    mCol = col;
+    touch();
+}
+
+void GridWidget::bringUpToDate() const {
+    // Showing what is already so is no change of the grid, whatever the view has to do for it.
+    if (mStale) const_cast<GridWidget*>(this)->refresh();
+}
+
+void GridWidget::refresh() {
+    mStale = false;
+    mRefreshing = true;
+    fitLabels();
+    QHeaderView& header = *mView->horizontalHeader();
+    bool resized = false;
+    for (int col = 1; col < mModel->cols(); ++col) {
+        if (header.sectionSize(col - 1) == columnWidth(col)) continue;
+        header.resizeSection(col - 1, columnWidth(col));
+        resized = true;
+    }
+    if (resized) static_cast<TableView*>(mView)->updateGeometries();
+    if (mRow > 0 && mCol > 0)
+        mView->setCurrentIndex(mModel->index(mRow - 1, mCol - 1));
+    else
+        mView->selectionModel()->clear();
+    mModel->announce();
+    mCorner->update();
+    mRefreshing = false;
+}
+
+void GridWidget::setLabelWidth(float twips) {
+    mLabelWidthSet = true;
+    mModel->setWidth(0, twips);
+    touch();
+}
+
+void GridWidget::fitLabels() {
+    if (!mLabelWidthSet) {
+        int widest = 0;
+        for (int row = 0; row < mModel->rows(); ++row)
+            widest = std::max(widest, fontMetrics().horizontalAdvance(mModel->text(row, 0)));
+        mModel->setWidth(0, toTwips(std::max(widest + 2 * textMargin + 4, 70)));
+    }
+    const int width = columnWidth(0);
+    mView->verticalHeader()->setFixedWidth(width);
+    mCorner->setGeometry(0, 0, width, mRowHeight);
+    mCorner->raise();
+}
+
+int GridWidget::firstRow() const {
+    bringUpToDate();
+    return mView->verticalHeader()->visualIndexAt(0) + 1;
+}
+
+int GridWidget::firstCol() const {
+    bringUpToDate();
+    return mView->horizontalHeader()->visualIndexAt(0) + 1;
+}
+
+int GridWidget::columnWidth(int col) const { return toPixels(mModel->width(col)); }
+
+QRect GridWidget::cellRect(int row, int col) const {
+    bringUpToDate();
+    QRect cell(0, 0, columnWidth(col), mRowHeight);
+    if (col > 0) {
+        const QHeaderView& header = *mView->horizontalHeader();
+        cell.moveLeft(columnWidth(0) + header.sectionPosition(col - 1) - header.offset());
+    }
+    if (row > 0) cell.moveTop(mRowHeight * row - mView->verticalHeader()->offset());
+    return cell;
+}
+
+void GridWidget::resizeEvent(QResizeEvent*) { mView->setGeometry(rect()); }
+
+void GridWidget::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) measure();
+}
+
+bool GridWidget::eventFilter(QObject* watched, QEvent* event) {
+    auto* part = static_cast<QWidget*>(watched);
+    switch (event->type()) {
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonDblClick:
+    case QEvent::MouseButtonRelease:
+        if (part != mView) return mouse(part, static_cast<QMouseEvent*>(event));
+        break;
+    case QEvent::MouseMove:
+        // No selecting along the way of a held button; headers need it for their widths.
+        if (part == mView->viewport()) return true;
+        break;
+    case QEvent::KeyPress:
+        if (part == mView) return keyPressed(*static_cast<QKeyEvent*>(event));
+        break;
+    case QEvent::ToolTip:
+        if (part != mView) return toolTip(part, *static_cast<QHelpEvent*>(event));
+        break;
+    default: break;
+    }
+    return QWidget::eventFilter(watched, event);
+}
+
+bool GridWidget::mouse(QWidget* part, QMouseEvent* event) {
+    const bool body = part == mView->viewport();
+    const bool pressed = event->type() != QEvent::MouseButtonRelease;
+    const QModelIndex index = mView->indexAt(event->position().toPoint());
+    if (body && pressed && event->button() == Qt::LeftButton && index.isValid()) {
+        bringUpToDate();
+        mView->setCurrentIndex(index);
+    }
+    const QPointF at = part->mapTo(this, event->position());
+    if (mListener && pressed)
+        mListener->pressed(event->button(), event->modifiers(), at);
+    else if (mListener)
+        mListener->released(event->button(), event->modifiers(), at);
+    return body;
+}
+
+bool GridWidget::keyPressed(const QKeyEvent& event) {
+    const bool opens = event.key() == Qt::Key_F2 || event.key() == Qt::Key_Return ||
+                       event.key() == Qt::Key_Enter;
+    if (!opens || !mListener) return false;
+    // For the keyboard, what a click on the current cell is for the mouse.
+    const QPointF middle = QRectF(cellRect(mRow, mCol)).center();
+    const QPointer<GridWidget> alive = this;
+    mListener->pressed(Qt::LeftButton, Qt::NoModifier, middle);
+    if (alive && mListener) mListener->released(Qt::LeftButton, Qt::NoModifier, middle);
+    return true;
+}
+
+bool GridWidget::toolTip(QWidget* part, const QHelpEvent& help) {
+    const QPoint at = part->mapTo(this, help.pos());
+    for (int row = 0; row < mModel->rows(); ++row) {
+        for (int col = 0; col < mModel->cols(); ++col) {
+            // The fixed cells lie over those that have been scrolled below them.
+            const bool fixedRow = at.y() < mRowHeight;
+            const bool fixedCol = at.x() < columnWidth(0);
+            if (fixedRow != (row == 0) || fixedCol != (col == 0)) continue;
+            const QRect cell = cellRect(row, col);
+            if (!cell.contains(at)) continue;
+            const QRect place(part->mapFrom(this, cell.topLeft()), cell.size());
+            showElisionToolTip(help, *part, mModel->text(row, col), font(),
+                               place.adjusted(textMargin / 2, 0, -textMargin / 2, 0));
+            return true;
+        }
+    }
+    return true;
+}
+
+void GridWidget::dragEnterEvent(QDragEnterEvent* event) {
+    event->setAccepted(mListener && mListener->dragAccepted(event->mimeData()));
+}
+
+void GridWidget::dragMoveEvent(QDragMoveEvent* event) {
+    event->setAccepted(mListener && mListener->dragAccepted(event->mimeData()));
+}
+
+void GridWidget::dropEvent(QDropEvent* event) {
+    event->setAccepted(mListener && mListener->dropped(event->mimeData(), event->position()));
+}
+
+} // namespace platform::qt

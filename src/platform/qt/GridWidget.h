@@ -1,0 +1,80 @@
+#pragma once
+
+#include <QTableView>
+
+#include <functional>
+
+namespace platform::qt {
+
+class GridCorner;
+class GridModel;
+
+class GridListener {
+public:
+    virtual ~GridListener() = default;
+    /// `at` is in the grid's own coordinates, headers included.
+    virtual void pressed(Qt::MouseButton button, Qt::KeyboardModifiers modifiers, QPointF at) = 0;
+    virtual void released(Qt::MouseButton button, Qt::KeyboardModifiers modifiers,
+                          QPointF at) = 0;
+    virtual void scrolled() = 0;
+    virtual bool dragAccepted(const QMimeData* data) = 0;
+    virtual bool dropped(const QMimeData* data, QPointF at) = 0;
+};
+
+/// The grid of output columns: a table view whose headers are the fixed row and column. The view
+/// follows the model's data, widths and current cell when the events at hand have been dealt with,
+/// or at once by `bringUpToDate`.
+class GridWidget : public QWidget {
+public:
+    GridWidget(int rows, int cols, QWidget* parent);
+
+    void setListener(GridListener* listener) { mListener = listener; }
+    GridModel& model() const { return *mModel; }
+    QTableView& view() const { return *mView; }
+
+    /// The model has changed.
+    void touch();
+    /// The model's current cell has changed; rows and columns count the fixed ones.
+    void setCurrentCell(int row, int col);
+    int currentRow() const { return mRow; }
+    int currentCol() const { return mCol; }
+
+    void bringUpToDate() const;
+    int firstRow() const;
+    int firstCol() const;
+    int columnWidth(int col) const;
+    int rowHeight() const { return mRowHeight; }
+    /// The rectangle of a cell in the grid's own coordinates, in logical pixels.
+    QRect cellRect(int row, int col) const;
+    void setLabelWidth(float twips);
+
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+protected:
+    void resizeEvent(QResizeEvent* event) override;
+    void changeEvent(QEvent* event) override;
+    void dragEnterEvent(QDragEnterEvent* event) override;
+    void dragMoveEvent(QDragMoveEvent* event) override;
+    void dropEvent(QDropEvent* event) override;
+
+private:
+    void measure();
+    void refresh();
+    void fitLabels();
+    bool mouse(QWidget* part, QMouseEvent* event);
+    bool keyPressed(const QKeyEvent& event);
+    bool toolTip(QWidget* part, const QHelpEvent& help);
+
+    GridListener* mListener = nullptr;
+    GridModel* mModel;
+    QTableView* mView;
+    GridCorner* mCorner;
+    int mRow = 1;
+    int mCol = 1;
+    int mRowHeight = 0;
+    bool mStale = false;
+    bool mRefreshing = false;
+    bool mLabelWidthSet = false;
+};
+
+} // namespace platform::qt

@@ -1,0 +1,145 @@
+#include "platform/qt/Inputs.h"
+
+#include "platform/RuntimeError.h"
+#include "platform/qt/Fonts.h"
+#include "platform/qt/KeyCodes.h"
+#include "platform/qt/Text.h"
+
+#include <QDialog>
+#include <QKeyEvent>
+#include <QPushButton>
+
+namespace platform::qt {
+
+namespace {
+
+/// Marks the button that Enter presses.
+constexpr char defaultProperty[] = "zandorDefault";
+
+/// The keys of an input: reports them, and has Enter press the default button beside it.
+class InputKeys : public QObject {
+public:
+    InputKeys(QWidget* input, KeyEvent KeyDown)
+        : QObject(input), mInput(*input), mKeyDown(std::move(KeyDown)) {
+        input->installEventFilter(this);
+    }
+
+    bool eventFilter(QObject* watched, QEvent* event) override {
+        // In a dialog of its own, Enter and Escape are the dialog's.
+        if (qobject_cast<QDialog*>(mInput.parentWidget()))
+            return QObject::eventFilter(watched, event);
+        const bool override = event->type() == QEvent::ShortcutOverride;
+        if (!override && event->type() != QEvent::KeyPress)
+            return QObject::eventFilter(watched, event);
+        auto& key = *static_cast<QKeyEvent*>(event);
+        const bool enter = key.key() == Qt::Key_Return || key.key() == Qt::Key_Enter;
+        const bool ours = enter || key.key() == Qt::Key_Escape;
+        if (override) {
+            // The host's shortcuts on these keys have to wait while an editor is open.
+            if (ours) key.accept();
+            return ours;
+        }
+        if (mKeyDown && keyCode(key) != 0) mKeyDown(keyCode(key), shiftState(key.modifiers()));
+        if (enter) pressDefault();
+        return ours;
+    }
+
+private:
+    void pressDefault() {
+        for (auto* button : mInput.parentWidget()->findChildren<QAbstractButton*>())
+            if (button->property(defaultProperty).toBool() && button->isEnabled())
+                return button->click();
+    }
+
+    QWidget& mInput;
+    KeyEvent mKeyDown;
+};
+
+} // namespace
+
+ButtonAdapter::ButtonAdapter(QAbstractButton* widget, FocusTracker& focus,
+                             CommandButtonEvents events)
+    : Adapter(widget, focus) {
+    QObject::connect(widget, &QAbstractButton::clicked, widget, [click = events.Click] {
+        if (click) click();
+    });
+    if (events.GotFocus) mFocus.watch(widget, events.GotFocus);
+}
+
+void ButtonAdapter::Caption(const String& value) {
+    if (mWidget) mWidget->setText(toQt(value));
+}
+
+void ButtonAdapter::Default(bool value) {
+    if (!mWidget) return;
+    mWidget->setProperty(defaultProperty, value);
+    if (auto* button = qobject_cast<QPushButton*>(mWidget.data())) button->setDefault(value);
+}
+
+void ButtonAdapter::Font(const platform::Font& value) {
+    if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
+}
+
+ComboBoxAdapter::ComboBoxAdapter(QComboBox* widget, FocusTracker& focus,
+                                 const std::vector<String>& items, KeyEvent KeyDown)
+    : Adapter(widget, focus) {
+    for (const String& item : items) widget->addItem(toQt(item));
+    widget->setCurrentIndex(-1);
+    widget->setSizeAdjustPolicy(QComboBox::AdjustToContents);
+    new InputKeys(widget, std::move(KeyDown));
+}
+
+std::int16_t ComboBoxAdapter::ListIndex() const {
+    return mWidget ? static_cast<std::int16_t>(mWidget->currentIndex()) : std::int16_t{-1};
+}
+
+void ComboBoxAdapter::ListIndex(std::int16_t value) {
+    if (!mWidget) return;
+    if (value < -1 || value >= mWidget->count()) throw errors::invalidPropertyValue();
+    mWidget->setCurrentIndex(value);
+}
+
+String ComboBoxAdapter::Text() const { return mWidget ? fromQt(mWidget->currentText()) : String(); }
+
+void ComboBoxAdapter::Clear() {
+    if (mWidget) mWidget->clear();
+}
+
+void ComboBoxAdapter::AddItem(const String& text) {
+    if (!mWidget) return;
+    // Qt chooses the first item of its own accord; here nothing is chosen until somebody does.
+    const int chosen = mWidget->currentIndex();
+    mWidget->addItem(toQt(text));
+    mWidget->setCurrentIndex(chosen);
+}
+
+void ComboBoxAdapter::Font(const platform::Font& value) {
+    if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
+}
+
+TextBoxAdapter::TextBoxAdapter(QLineEdit* widget, FocusTracker& focus, KeyEvent KeyDown)
+    : Adapter(widget, focus) {
+    widget->setMinimumWidth(180);
+    new InputKeys(widget, std::move(KeyDown));
+}
+
+String TextBoxAdapter::Text() const { return mWidget ? fromQt(mWidget->text()) : String(); }
+
+void TextBoxAdapter::Text(const String& value) {
+    if (mWidget) mWidget->setText(toQt(value));
+}
+
+void TextBoxAdapter::SetFocus() {
+    mFocus.take(mWidget);
+    mWidget->selectAll();
+}
+
+void LabelAdapter::Caption(const String& value) {
+    if (mWidget) mWidget->setText(toQt(value));
+}
+
+void LabelAdapter::Font(const platform::Font& value) {
+    if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
+}
+
+} // namespace platform::qt

@@ -1,0 +1,47 @@
+#include "platform/qt/KeyCodes.h"
+
+#include <QKeyEvent>
+
+namespace platform::qt {
+
+std::int16_t keyCode(const QKeyEvent& event) {
+    const int key = event.key();
+    // Letters, digits and the blank have their character as their code in both worlds.
+    if (key == Qt::Key_Space || (key >= Qt::Key_0 && key <= Qt::Key_9) ||
+        (key >= Qt::Key_A && key <= Qt::Key_Z))
+        return static_cast<std::int16_t>(key);
+    if (key >= Qt::Key_F1 && key <= Qt::Key_F12)
+        return static_cast<std::int16_t>(112 + key - Qt::Key_F1);
+    switch (key) {
+    case Qt::Key_Backspace: return 8;
+    case Qt::Key_Tab: return 9;
+    case Qt::Key_Return:
+    case Qt::Key_Enter: return 13;
+    case Qt::Key_Escape: return 27;
+    case Qt::Key_PageUp: return 33;
+    case Qt::Key_PageDown: return 34;
+    case Qt::Key_End: return 35;
+    case Qt::Key_Home: return 36;
+    case Qt::Key_Left: return 37;
+    case Qt::Key_Up: return 38;
+    case Qt::Key_Right: return 39;
+    case Qt::Key_Down: return 40;
+    case Qt::Key_Insert: return 45;
+    case Qt::Key_Delete: return 46;
+    default: return 0;
+    }
+}
+
+std::int16_t shiftState(Qt::KeyboardModifiers modifiers) {
+    return static_cast<std::int16_t>((modifiers & Qt::ShiftModifier ? 1 : 0) +
+                                     (modifiers & Qt::ControlModifier ? 2 : 0) +
+                                     (modifiers & Qt::AltModifier ? 4 : 0));
+}
+
+std::int16_t buttonState(Qt::MouseButtons buttons) {
+    return static_cast<std::int16_t>((buttons & Qt::LeftButton ? 1 : 0) +
+                                     (buttons & Qt::RightButton ? 2 : 0) +
+                                     (buttons & Qt::MiddleButton ? 4 : 0));
+}
+
+} // namespace platform::qt

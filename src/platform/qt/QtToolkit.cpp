@@ -1,0 +1,189 @@
+#include "platform/qt/QtToolkit.h"
+
+#include "platform/RuntimeError.h"
+#include "platform/qt/CanvasItems.h"
+#include "platform/qt/Dialog.h"
+#include "platform/qt/Fonts.h"
+#include "platform/qt/Frames.h"
+#include "platform/qt/GridAdapter.h"
+#include "platform/qt/HomeButton.h"
+#include "platform/qt/Inputs.h"
+#include "platform/qt/MessageBox.h"
+#include "platform/qt/PopupMenu.h"
+#include "platform/qt/ScrollBar.h"
+#include "platform/qt/Text.h"
+#include "platform/qt/ZandorWindowMessage.h"
+
+#include <QApplication>
+#include <QFontMetricsF>
+#include <QPushButton>
+
+namespace platform::qt {
+
+namespace {
+
+WidgetHolder* holderOf(const Design& design) {
+    if (!design.Container) return nullptr;
+    auto* holder = dynamic_cast<WidgetHolder*>(design.Container);
+    if (!holder || !holder->widget()) throw errors::invalidProcedureCall();
+    return holder;
+}
+
+Canvas& canvasOf(const Design& design) {
+    WidgetHolder* holder = holderOf(design);
+    auto* canvas = holder ? dynamic_cast<Canvas*>(holder->widget()) : nullptr;
+    if (!canvas) throw errors::invalidProcedureCall();
+    return *canvas;
+}
+
+} // namespace
+
+QtToolkit::QtToolkit(QWidget& surface) : mSurface(surface), mFocus(surface) {}
+
+QWidget* QtToolkit::parentOf(const Design& design) const {
+    WidgetHolder* holder = holderOf(design);
+    return holder ? holder->widget() : &mSurface;
+}
+
+QWidget* QtToolkit::window() const { return mClosing ? nullptr : mSurface.window(); }
+
+template <class AdapterType, class W, class... Arguments>
+std::unique_ptr<AdapterType> QtToolkit::adapt(const Design& design, Role role, W* widget,
+                                              Arguments&&... arguments) {
+    widget->setObjectName(toQt(design.Name));
+    auto adapter =
+        std::make_unique<AdapterType>(widget, mFocus, std::forward<Arguments>(arguments)...);
+    if (WidgetHolder* holder = holderOf(design)) holder->place(widget, role);
+    return adapter;
+}
+
+void QtToolkit::MsgBox(const String& prompt, std::int32_t style, const String& title) {
+    QWidget* const parent = window();
+    showMessageBox(parent && parent->isVisible() ? parent : nullptr, prompt, style, title);
+}
+
+std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents events) {
+    // Only the drawing surface listens to the mouse; other frames hold an editor's parts.
+    if (events.MouseDown || events.MouseUp) {
+        auto* canvas = new Canvas(parentOf(design));
+        canvas->show();
+        return adapt<CanvasAdapter>(design, Role::frame, canvas, std::move(events));
+    }
+    return adapt<RowFrameAdapter>(design, Role::frame,
+                                  new RowFrame(parentOf(design), !design.Container));
+}
+
+std::unique_ptr<CommandButton> QtToolkit::makeCommandButton(const Design& design,
+                                                            CommandButtonEvents events) {
+    QAbstractButton* button = nullptr;
+    if (design.Container)
+        button = new QPushButton(parentOf(design));
+    else
+        button = new HomeButton(parentOf(design));
+    button->setText(toQt(design.Caption));
+    button->show();
+    return adapt<ButtonAdapter>(design, Role::button, button, std::move(events));
+}
+
+std::unique_ptr<ComboBox> QtToolkit::makeComboBox(const Design& design,
+                                                  const std::vector<String>& items,
+                                                  KeyEvent KeyDown) {
+    auto* combo = new QComboBox(parentOf(design));
+    combo->show();
+    return adapt<ComboBoxAdapter>(design, Role::field, combo, items, std::move(KeyDown));
+}
+
+std::unique_ptr<TextBox> QtToolkit::makeTextBox(const Design& design, KeyEvent KeyDown) {
+    auto* text = new QLineEdit(parentOf(design));
+    text->show();
+    return adapt<TextBoxAdapter>(design, Role::field, text, std::move(KeyDown));
+}
+
+std::unique_ptr<Label> QtToolkit::makeLabel(const Design& design) {
+    auto* label = new QLabel(toQt(design.Caption), parentOf(design));
+    label->setTextFormat(Qt::PlainText);
+    label->show();
+    return adapt<LabelAdapter>(design, Role::label, label);
+}
+
+std::unique_ptr<ScrollBar> QtToolkit::makeScrollBar(const Design& design, Orientation orientation,
+                                                    ScrollBarEvents events) {
+    const bool horizontal = orientation == Orientation::horizontal;
+    auto* bar = new QScrollBar(horizontal ? Qt::Horizontal : Qt::Vertical, parentOf(design));
+    (horizontal ? mHorizontal : mVertical) = bar;
+    bar->setAutoFillBackground(true);
+    bar->show();
+    return adapt<ScrollBarAdapter>(design, Role::field, bar, std::move(events));
+}
+
+std::unique_ptr<MSFlexGridLib::MSFlexGrid> QtToolkit::makeGrid(const Design& design,
+                                                               std::int32_t rows,
+                                                               std::int32_t cols,
+                                                               MSFlexGridLib::GridEvents events) {
+    auto* grid = new GridWidget(rows, cols, parentOf(design));
+    mFocus.setFallback(&grid->view());
+    return adapt<GridAdapter>(design, Role::field, grid, mDrags, std::move(events));
+}
+
+std::unique_ptr<PopupMenu> QtToolkit::makePopupMenu(const Design& design, PlainEvent Click) {
+    return std::make_unique<PopupMenuAdapter>(mSurface, design, std::move(Click));
+}
+
+std::unique_ptr<Dialog> QtToolkit::makeDialog(const Design& design, DialogEvents events) {
+    auto* dialog = new FormDialog(window(), std::move(events.Close));
+    dialog->setPalette(mSurface.palette());
+    dialog->setFont(mSurface.font());
+    dialog->setWindowTitle(toQt(design.Caption));
+    dialog->setObjectName(toQt(design.Name));
+    return std::make_unique<DialogAdapter>(dialog, mFocus);
+}
+
+Ref<TalvikTabulet::Tabulet> QtToolkit::makeTabulet(const Design& design, std::int16_t index,
+                                                   const TalvikTabulet::Tabulet* pattern,
+                                                   const TalvikTabulet::TabuletEvents& events) {
+    Canvas& canvas = canvasOf(design);
+    auto* box = new TabuletWidget(&canvas);
+    box->hide();
+    box->setObjectName(elementName(design.Name, index));
+    if (const auto* holder = dynamic_cast<const WidgetHolder*>(pattern); holder && holder->widget())
+        box->setFont(holder->widget()->font());
+    return std::make_shared<TabuletAdapter>(box, mFocus, mDrags, mCurrentTabulet, index, events);
+}
+
+Ref<Line> QtToolkit::makeLine(const Design& design, std::int16_t index) {
+    return std::make_shared<CanvasLine>(canvasOf(design), elementName(design.Name, index));
+}
+
+Ref<Shape> QtToolkit::makeShape(const Design& design, std::int16_t index) {
+    return std::make_shared<CanvasShape>(canvasOf(design), elementName(design.Name, index));
+}
+
+Font QtToolkit::AmbientFont() const {
+    const QWidget* host = mSurface.parentWidget();
+    return fromQt(host ? host->font() : QApplication::font(&mSurface));
+}
+
+Font QtToolkit::ControlFont() const { return fromQt(mSurface.font()); }
+
+float QtToolkit::TextWidth(const String& text) const {
+    return toTwips(QFontMetricsF(mSurface.font()).horizontalAdvance(toQt(text)));
+}
+
+float QtToolkit::ScaleWidth() const { return toTwips(mSurface.width()); }
+
+float QtToolkit::ScaleHeight() const { return toTwips(mSurface.height()); }
+
+std::uint32_t QtToolkit::RegisterWindowMessage(const String& name) {
+    return static_cast<std::uint32_t>(ZandorWindowMessage::typeOf(toQt(name)));
+}
+
+void QtToolkit::SendMessage(std::uint32_t message, std::uintptr_t wParam, std::int32_t* lParam) {
+    ZandorWindowMessage event(static_cast<QEvent::Type>(message), wParam, lParam);
+    QCoreApplication::sendEvent(&mSurface, &event);
+}
+
+void QtToolkit::scrollByWheel(QWheelEvent& event) {
+    qt::scrollByWheel(mHorizontal, mVertical, event);
+}
+
+} // namespace platform::qt

@@ -1,0 +1,74 @@
+#include "platform/qt/ScrollBar.h"
+
+#include "platform/RuntimeError.h"
+
+#include <QApplication>
+#include <QStyle>
+#include <QWheelEvent>
+
+#include <algorithm>
+
+namespace platform::qt {
+
+namespace {
+
+/// One press on an arrow, one line of the wheel: twips.
+constexpr int singleStep = 240;
+
+void scrollBy(QScrollBar* bar, int twips) {
+    if (bar && bar->isEnabled() && twips != 0) bar->setValue(bar->value() - twips);
+}
+
+} // namespace
+
+ScrollBarAdapter::ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus,
+                                   ScrollBarEvents events)
+    : Adapter(widget, focus) {
+    widget->setRange(0, 0);
+    widget->setSingleStep(singleStep);
+    widget->setFocusPolicy(Qt::StrongFocus);
+    const int extent = widget->style()->pixelMetric(QStyle::PM_ScrollBarExtent, nullptr, widget);
+    widget->resize(widget->orientation() == Qt::Horizontal ? QSize(4 * extent, extent)
+                                                           : QSize(extent, 4 * extent));
+    QObject::connect(widget, &QScrollBar::valueChanged, widget, [change = events.Change] {
+        if (change) change();
+    });
+    mFocus.watch(widget, events.GotFocus);
+}
+
+std::int16_t ScrollBarAdapter::Max() const {
+    return mWidget ? static_cast<std::int16_t>(mWidget->maximum()) : std::int16_t{0};
+}
+
+void ScrollBarAdapter::Max(std::int16_t value) {
+    if (value < 0) throw errors::invalidPropertyValue();
+    if (mWidget) mWidget->setMaximum(value);
+}
+
+std::int16_t ScrollBarAdapter::Value() const {
+    return mWidget ? static_cast<std::int16_t>(mWidget->value()) : std::int16_t{0};
+}
+
+void ScrollBarAdapter::Value(std::int16_t value) {
+    if (value < 0 || value > Max()) throw errors::invalidPropertyValue();
+    if (mWidget) mWidget->setValue(value);
+}
+
+void ScrollBarAdapter::LargeChange(std::int16_t value) {
+    if (value < 1) throw errors::invalidPropertyValue();
+    if (mWidget) mWidget->setPageStep(value);
+}
+
+void scrollByWheel(QScrollBar* horizontal, QScrollBar* vertical, QWheelEvent& event) {
+    event.accept();
+    QPoint way;
+    if (!event.pixelDelta().isNull())
+        way = event.pixelDelta() * static_cast<int>(twipsPerPixel);
+    else
+        way = event.angleDelta() * (QApplication::wheelScrollLines() * singleStep) / 120;
+    if (event.modifiers() & Qt::ShiftModifier && way.x() == 0) way = way.transposed();
+    scrollBy(horizontal, way.x());
+    scrollBy(vertical, way.y());
+}
+
+} // namespace platform::qt

@@ -1,0 +1,27 @@
+#pragma once
+
+#include "platform/Intrinsic.h"
+#include "platform/qt/Adapter.h"
+
+#include <QScrollBar>
+
+class QWheelEvent;
+
+namespace platform::qt {
+
+class ScrollBarAdapter final : public Adapter<platform::ScrollBar, QScrollBar> {
+public:
+    ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, ScrollBarEvents events);
+
+    std::int16_t Max() const override;
+    void Max(std::int16_t value) override;
+    std::int16_t Value() const override;
+    void Value(std::int16_t value) override;
+    void LargeChange(std::int16_t value) override;
+    void Enabled(bool value) override { enable(value); }
+};
+
+/// Scrolls by a turn of the wheel or a stroke on a touchpad; a bar may be missing or disabled.
+void scrollByWheel(QScrollBar* horizontal, QScrollBar* vertical, QWheelEvent& event);
+
+} // namespace platform::qt

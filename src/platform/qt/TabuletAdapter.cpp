@@ -1,0 +1,270 @@
+#include "platform/qt/TabuletAdapter.h"
+
+#include "platform/RuntimeError.h"
+#include "platform/qt/ColumnListModel.h"
+#include "platform/qt/DragSession.h"
+#include "platform/qt/Fonts.h"
+#include "platform/qt/Text.h"
+
+#include <algorithm>
+#include <atomic>
+
+namespace platform::qt {
+
+namespace {
+
+std::int32_t nextHandle() {
+    static std::atomic<std::int32_t> last{0};
+    return ++last;
+}
+
+} // namespace
+
+/// An entry outlives its list where somebody still holds it; it then keeps what it last said.
+class TabuletAdapter::Entry final : public TalvikTabulet::ColumnItem {
+public:
+    Entry(TabuletAdapter& table, int row, const String& key, const String& text)
+        : mTable(&table), mRow(row), mKey(key), mText(text) {}
+
+    void detach() {
+        mSelected = Selected();
+        mTable = nullptr;
+    }
+
+    const String& Text() const override { return mText; }
+    const String& Key() const override { return mKey; }
+
+    bool Selected() const override {
+        return live() ? list().selectionModel()->isSelected(index()) : mSelected;
+    }
+
+    void Selected(bool value) override {
+        mSelected = value;
+        if (live())
+            list().selectionModel()->select(index(), value ? QItemSelectionModel::Select
+                                                           : QItemSelectionModel::Deselect);
+    }
+
+    void Image(std::int16_t value) override {
+        if (live()) mTable->mWidget->model().setMarked(mRow, value == 1);
+    }
+
+    void Refresh() override {
+        if (live()) list().update(index());
+    }
+
+    void EnsureVisible() override {
+        if (live()) list().scrollTo(index());
+    }
+
+    TalvikTabulet::Point LeftEdgePoint() const override { return edge(0); }
+    TalvikTabulet::Point RightEdgePoint() const override { return edge(1); }
+
+private:
+    bool live() const { return mTable && mTable->mWidget; }
+    ColumnListView& list() const { return mTable->mWidget->list(); }
+    QModelIndex index() const { return mTable->mWidget->model().index(mRow); }
+
+    TalvikTabulet::Point edge(float side) const {
+        if (!live()) throw errors::objectNotSet();
+        const Bounds box = mTable->bounds();
+        const ColumnListView& view = list();
+        const float row = static_cast<float>(view.rowHeight());
+        const float middle = static_cast<float>(mTable->mWidget->listTop() - view.scrolledBy()) +
+                             row * (static_cast<float>(mRow) + 0.5F);
+        return {box.Left + side * box.Width, box.Top + middle * twipsPerPixel};
+    }
+
+    TabuletAdapter* mTable;
+    const int mRow;
+    const String mKey;
+    const String mText;
+    bool mSelected = false;
+};
+
+std::int32_t TabuletAdapter::Entries::Count() const {
+    return static_cast<std::int32_t>(items.size());
+}
+
+const Ref<TalvikTabulet::ColumnItem>& TabuletAdapter::Entries::Item(std::int32_t position) const {
+    if (position < 1 || position > Count()) throw errors::subscriptOutOfRange();
+    return items[static_cast<std::size_t>(position) - 1];
+}
+
+Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Add(const String& key,
+                                                            const String& text) {
+    auto entry = std::make_shared<Entry>(mTable, Count(), key, text);
+    if (mTable.mWidget) mTable.mWidget->model().append(toQt(text));
+    return items.emplace_back(std::move(entry));
+}
+
+TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus, DragSession& drags,
+                               CurrentTabulet& current, std::int16_t index,
+                               const TalvikTabulet::TabuletEvents& events)
+    : Adapter(widget, focus), mDrags(drags), mCurrent(current), mIndex(index),
+      mHandle(nextHandle()), mEvents(events) {
+    widget->setListener(this);
+    mFocus.watch(&widget->list(), [this] {
+        if (mEvents.GotFocus) mEvents.GotFocus(mIndex);
+    });
+}
+
+TabuletAdapter::~TabuletAdapter() {
+    Terminate();
+    mDrags.forget(this);
+    if (mCurrent.adapter == this) mCurrent.adapter = nullptr;
+    if (!mWidget) return;
+    mFocus.release(mWidget);
+    mFocus.forget(&mWidget->list());
+    mWidget->setListener(nullptr);
+}
+
+void TabuletAdapter::Text(const String& value) {
+    mText = value;
+    if (mWidget) mWidget->setTitle(toQt(value));
+}
+
+void TabuletAdapter::Visible(bool value) {
+    mVisible = value;
+    show(value);
+}
+
+void TabuletAdapter::Activated(bool value) {
+    if (value && mCurrent.adapter && mCurrent.adapter != this) mCurrent.adapter->Activated(false);
+    if (value)
+        mCurrent.adapter = this;
+    else if (mCurrent.adapter == this)
+        mCurrent.adapter = nullptr;
+    if (mWidget) mWidget->setCurrent(value);
+}
+
+void TabuletAdapter::Font(const platform::Font& value) {
+    if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
+}
+
+Ref<TalvikTabulet::ColumnItem> TabuletAdapter::ColumnAt(float X, float Y) const {
+    if (!mWidget) return {};
+    const QPoint at(static_cast<int>(std::floor(X / twipsPerPixel)),
+                    static_cast<int>(std::floor(Y / twipsPerPixel)));
+    const ColumnListView& view = mWidget->list();
+    const QPoint inside = view.viewport()->mapFrom(mWidget.data(), at);
+    if (!view.viewport()->rect().contains(inside)) return {};
+    const QModelIndex index = view.indexAt(inside);
+    if (!index.isValid()) return {};
+    return mEntries.items[static_cast<std::size_t>(index.row())];
+}
+
+void TabuletAdapter::ZOrder() {
+    if (mWidget) mWidget->raise();
+}
+
+void TabuletAdapter::Drag(std::int16_t action) {
+    if (action != 1 || !mWidget) return;
+    QStringList names;
+    for (const auto& entry : mEntries.items)
+        if (entry->Selected()) names += toQt(entry->Text());
+    mDrags.request(&mWidget->list(), this, names);
+}
+
+void TabuletAdapter::Complete() {
+    if (!mWidget) return;
+    // Laid out at once: the ends of join lines depend on how far the list is scrolled.
+    mWidget->list().doItemsLayout();
+    mWidget->update();
+}
+
+void TabuletAdapter::Terminate() {
+    for (const auto& entry : mEntries.items) static_cast<Entry&>(*entry).detach();
+    mEntries.items.clear();
+    if (mWidget) mWidget->model().clear();
+}
+
+void TabuletAdapter::report(const TalvikTabulet::TabuletEvents::Mouse& handler, int row,
+                            std::int16_t button, std::int16_t shift) {
+    if (!handler || row >= mEntries.Count()) return;
+    // A copy: the handler may end the table.
+    const Ref<TalvikTabulet::ColumnItem> entry = mEntries.Item(row + 1);
+    handler(mIndex, entry, button, shift);
+}
+
+void TabuletAdapter::entryPressed(int row, std::int16_t button, std::int16_t shift) {
+    report(mEvents.ColumnMouseDown, row, button, shift);
+}
+
+void TabuletAdapter::entryMoved(int row, std::int16_t buttons, std::int16_t shift) {
+    DragSession& drags = mDrags;
+    report(mEvents.ColumnMouseMove, row, buttons, shift);
+    drags.runRequested();
+}
+
+void TabuletAdapter::entryReleased(int row, std::int16_t button, std::int16_t shift) {
+    report(mEvents.ColumnMouseUp, row, button, shift);
+}
+
+void TabuletAdapter::listScrolled() {
+    if (mEvents.Scroll) mEvents.Scroll(mIndex);
+}
+
+void TabuletAdapter::closeClicked() {
+    if (mEvents.CloseClick) mEvents.CloseClick(mIndex);
+}
+
+void TabuletAdapter::gestureBegan() { mGestureStart = bounds(); }
+
+void TabuletAdapter::gestureMoved(Qt::Edges edges, QPointF way) {
+    if (!mWidget) return;
+    Bounds box = mGestureStart;
+    const float right = toTwips(way.x());
+    const float down = toTwips(way.y());
+    if (!edges) {
+        box.Left += right;
+        box.Top += down;
+    }
+    // A box may be smaller than the smallest by its model; the user then cannot shrink it more.
+    const QSize smallest = mWidget->smallest();
+    const float width = std::min(toTwips(smallest.width()), box.Width);
+    const float height = std::min(toTwips(smallest.height()), box.Height);
+    if (edges & Qt::RightEdge) box.Width = std::max(box.Width + right, width);
+    if (edges & Qt::BottomEdge) box.Height = std::max(box.Height + down, height);
+    if (edges & Qt::LeftEdge) {
+        const float by = std::min(right, box.Width - width);
+        box.Left += by;
+        box.Width -= by;
+    }
+    if (edges & Qt::TopEdge) {
+        const float by = std::min(down, box.Height - height);
+        box.Top += by;
+        box.Height -= by;
+    }
+    if (box == bounds()) return;
+    setBounds(box);
+    if (mEvents.Moving) mEvents.Moving(mIndex);
+}
+
+void TabuletAdapter::gestureEnded(Qt::Edges edges) {
+    const TalvikTabulet::TabuletEvents& events = mEvents;
+    const std::int16_t index = mIndex;
+    const QPointer<TabuletWidget> alive = mWidget;
+    const bool movesCorner = !edges || edges & (Qt::LeftEdge | Qt::TopEdge);
+    if (movesCorner && events.Moved) events.Moved(index);
+    if (edges && alive && events.Resized) events.Resized(index);
+}
+
+bool TabuletAdapter::draggedOver(const QMimeData* data, QPointF at, std::int16_t state) {
+    constexpr std::int16_t leaving = 1;
+    if (state == leaving ? !mDrags.source() : !mDrags.accepts(data)) return false;
+    if (mEvents.DragOver)
+        mEvents.DragOver(mIndex, mDrags.source(), toTwips(at.x()), toTwips(at.y()), state);
+    return true;
+}
+
+bool TabuletAdapter::dropped(const QMimeData* data, QPointF at) {
+    if (!mDrags.accepts(data)) return false;
+    mDrags.drop([this, alive = mWidget, at] {
+        if (alive && alive->property(controlProperty).isValid() && mEvents.DragDrop)
+            mEvents.DragDrop(mIndex, mDrags.source(), toTwips(at.x()), toTwips(at.y()));
+    });
+    return true;
+}
+
+} // namespace platform::qt

@@ -1,0 +1,84 @@
+#pragma once
+
+#include "platform/Tabulet.h"
+#include "platform/qt/Adapter.h"
+#include "platform/qt/TabuletWidget.h"
+
+#include <vector>
+
+namespace platform::qt {
+
+class DragSession;
+class TabuletAdapter;
+
+/// Which table list of a control is the activated one.
+struct CurrentTabulet {
+    TabuletAdapter* adapter = nullptr;
+};
+
+class TabuletAdapter final : public Adapter<TalvikTabulet::Tabulet, TabuletWidget>,
+                             private TabuletListener {
+public:
+    TabuletAdapter(TabuletWidget* widget, FocusTracker& focus, DragSession& drags,
+                   CurrentTabulet& current, std::int16_t index,
+                   const TalvikTabulet::TabuletEvents& events);
+    ~TabuletAdapter() override;
+
+    const String& Text() const override { return mText; }
+    void Text(const String& value) override;
+    const String& Tag() const override { return mTag; }
+    void Tag(const String& value) override { mTag = value; }
+    bool Visible() const override { return mVisible; }
+    void Visible(bool value) override;
+    void Activated(bool value) override;
+    void Font(const platform::Font& value) override;
+    std::int32_t TableHandle() const override { return mHandle; }
+    TalvikTabulet::ColumnList& ColumnItems() override { return mEntries; }
+    Ref<TalvikTabulet::ColumnItem> ColumnAt(float X, float Y) const override;
+    void ZOrder() override;
+    void SetFocus() override { mFocus.take(mWidget ? &mWidget->list() : nullptr); }
+    void Drag(std::int16_t action) override;
+    void Complete() override;
+    void Terminate() override;
+
+private:
+    class Entry;
+    class Entries final : public TalvikTabulet::ColumnList {
+    public:
+        explicit Entries(TabuletAdapter& table) : mTable(table) {}
+        std::int32_t Count() const override;
+        const Ref<TalvikTabulet::ColumnItem>& Item(std::int32_t position) const override;
+        Ref<TalvikTabulet::ColumnItem> Add(const String& key, const String& text) override;
+
+        std::vector<Ref<TalvikTabulet::ColumnItem>> items;
+
+    private:
+        TabuletAdapter& mTable;
+    };
+
+    void entryPressed(int row, std::int16_t button, std::int16_t shift) override;
+    void entryMoved(int row, std::int16_t buttons, std::int16_t shift) override;
+    void entryReleased(int row, std::int16_t button, std::int16_t shift) override;
+    void listScrolled() override;
+    void closeClicked() override;
+    void gestureBegan() override;
+    void gestureMoved(Qt::Edges edges, QPointF way) override;
+    void gestureEnded(Qt::Edges edges) override;
+    bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) override;
+    bool dropped(const QMimeData* data, QPointF at) override;
+    void report(const TalvikTabulet::TabuletEvents::Mouse& handler, int row, std::int16_t button,
+                std::int16_t shift);
+
+    DragSession& mDrags;
+    CurrentTabulet& mCurrent;
+    const std::int16_t mIndex;
+    const std::int32_t mHandle;
+    const TalvikTabulet::TabuletEvents& mEvents;
+    Entries mEntries{*this};
+    String mText;
+    String mTag;
+    bool mVisible = false;
+    Bounds mGestureStart;
+};
+
+} // namespace platform::qt

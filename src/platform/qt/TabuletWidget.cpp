@@ -1,0 +1,268 @@
+#include "platform/qt/TabuletWidget.h"
+
+#include "platform/qt/ColumnListModel.h"
+#include "platform/qt/ElisionToolTip.h"
+
+#include <QDropEvent>
+#include <QHelpEvent>
+#include <QPainter>
+
+#include <cmath>
+
+namespace platform::qt {
+
+namespace {
+
+constexpr int border = 4;      ///< resizes the box; its outermost pixel is the frame line
+constexpr int cornerReach = 14; ///< how far a corner reaches along its edges
+
+QColor blend(const QColor& one, const QColor& other, double share) {
+    const auto mix = [share](int a, int b) {
+        return static_cast<int>(std::lround(a + (b - a) * share));
+    };
+    return {mix(one.red(), other.red()), mix(one.green(), other.green()),
+            mix(one.blue(), other.blue())};
+}
+
+struct TitleColours {
+    QColor back;
+    QColor text;
+    QColor frame;
+};
+
+TitleColours titleColours(const TabuletWidget& box) {
+    const QPalette palette = box.palette();
+    const QColor window = palette.color(QPalette::Window);
+    const QColor windowText = palette.color(QPalette::WindowText);
+    const QColor highlight = palette.color(QPalette::Active, QPalette::Highlight);
+    const bool focused = box.list().hasFocus() && box.isActiveWindow();
+    if (focused)
+        return {highlight, palette.color(QPalette::Active, QPalette::HighlightedText), highlight};
+    if (box.isCurrent())
+        return {blend(window, highlight, 0.3), windowText, blend(window, highlight, 0.7)};
+    return {blend(window, windowText, 0.08), windowText, blend(window, windowText, 0.35)};
+}
+
+/// The cross in the title bar.
+class CloseButton : public QAbstractButton {
+public:
+    explicit CloseButton(TabuletWidget& box) : QAbstractButton(&box), mBox(box) {
+        setFocusPolicy(Qt::NoFocus);
+        setCursor(Qt::ArrowCursor);
+        setAttribute(Qt::WA_Hover);
+        setToolTip(QObject::tr("Remove the table"));
+        setAccessibleName(toolTip());
+    }
+
+protected:
+    void paintEvent(QPaintEvent*) override {
+        QPainter painter(this);
+        painter.setRenderHint(QPainter::Antialiasing);
+        const TitleColours colours = titleColours(mBox);
+        if (underMouse()) {
+            painter.setPen(Qt::NoPen);
+            painter.setBrush(blend(colours.back, colours.text, isDown() ? 0.35 : 0.2));
+            painter.drawRoundedRect(rect(), 3, 3);
+        }
+        const QPointF middle = QRectF(rect()).center();
+        const qreal arm = width() * 0.22;
+        painter.setPen(QPen(colours.text, 1.3, Qt::SolidLine, Qt::RoundCap));
+        painter.drawLine(middle + QPointF(-arm, -arm), middle + QPointF(arm, arm));
+        painter.drawLine(middle + QPointF(-arm, arm), middle + QPointF(arm, -arm));
+    }
+
+private:
+    TabuletWidget& mBox;
+};
+
+Qt::CursorShape cursorFor(Qt::Edges edges) {
+    const bool sideways = edges & (Qt::LeftEdge | Qt::RightEdge);
+    const bool upright = edges & (Qt::TopEdge | Qt::BottomEdge);
+    if (sideways && upright)
+        return edges == (Qt::LeftEdge | Qt::TopEdge) || edges == (Qt::RightEdge | Qt::BottomEdge)
+                   ? Qt::SizeFDiagCursor
+                   : Qt::SizeBDiagCursor;
+    return sideways ? Qt::SizeHorCursor : upright ? Qt::SizeVerCursor : Qt::ArrowCursor;
+}
+
+} // namespace
+
+TabuletWidget::TabuletWidget(QWidget* parent)
+    : QWidget(parent), mModel(new ColumnListModel(this)), mList(new ColumnListView(this)),
+      mClose(new CloseButton(*this)) {
+    // Opaque, so that moving the box moves its pixels instead of painting it anew.
+    setAttribute(Qt::WA_OpaquePaintEvent);
+    setMouseTracking(true);
+    setAcceptDrops(true);
+    setFocusProxy(mList);
+    mList->setModel(mModel);
+    mList->installEventFilter(this);
+    mList->viewport()->installEventFilter(this);
+    connect(mClose, &QAbstractButton::clicked, this, [this] {
+        if (mListener) mListener->closeClicked();
+    });
+    measure();
+}
+
+void TabuletWidget::setListener(TabuletListener* listener) {
+    mListener = listener;
+    mList->setListener(listener);
+}
+
+void TabuletWidget::setTitle(const QString& title) {
+    mTitle = title;
+    setAccessibleName(title);
+    mList->setAccessibleName(title);
+    update(titleBar());
+}
+
+void TabuletWidget::setCurrent(bool current) {
+    if (mCurrent == current) return;
+    mCurrent = current;
+    update();
+}
+
+QSize TabuletWidget::smallest() const {
+    return {mTitleHeight * 3, mTitleHeight + mList->rowHeight() + border};
+}
+
+QRect TabuletWidget::titleBar() const { return {0, 0, width(), mTitleHeight}; }
+
+void TabuletWidget::measure() {
+    mTitleHeight = fontMetrics().height() + 10;
+    arrange();
+}
+
+void TabuletWidget::arrange() {
+    const int side = mTitleHeight - 8;
+    mClose->setGeometry(width() - side - border, 4, side, side);
+    mList->setGeometry(QRect(border, mTitleHeight, width() - 2 * border,
+                             height() - mTitleHeight - border));
+}
+
+void TabuletWidget::resizeEvent(QResizeEvent*) { arrange(); }
+
+void TabuletWidget::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) measure();
+    if (event->type() == QEvent::ActivationChange) update();
+}
+
+void TabuletWidget::paintEvent(QPaintEvent*) {
+    QPainter painter(this);
+    const TitleColours colours = titleColours(*this);
+    painter.fillRect(rect(), palette().base());
+    painter.fillRect(titleBar(), colours.back);
+
+    QFont bold = font();
+    bold.setWeight(QFont::DemiBold);
+    painter.setFont(bold);
+    painter.setPen(colours.text);
+    const QRect place = titleBar().adjusted(border + 4, 0, -mTitleHeight, 0);
+    painter.drawText(place, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextSingleLine,
+                     QFontMetrics(bold).elidedText(mTitle, Qt::ElideRight, place.width()));
+
+    painter.setPen(colours.frame);
+    painter.drawRect(rect().adjusted(0, 0, -1, -1));
+}
+
+bool TabuletWidget::event(QEvent* event) {
+    if (event->type() == QEvent::ToolTip) {
+        const auto& help = *static_cast<QHelpEvent*>(event);
+        QFont bold = font();
+        bold.setWeight(QFont::DemiBold);
+        if (titleBar().contains(help.pos()))
+            showElisionToolTip(help, *this, mTitle, bold,
+                               titleBar().adjusted(border + 4, 0, -mTitleHeight, 0));
+        return true;
+    }
+    return QWidget::event(event);
+}
+
+bool TabuletWidget::eventFilter(QObject* watched, QEvent* event) {
+    switch (event->type()) {
+    case QEvent::FocusIn:
+    case QEvent::FocusOut:
+        update();
+        mClose->update();
+        break;
+    case QEvent::MouseButtonPress: raise(); break;
+    default: break;
+    }
+    return QWidget::eventFilter(watched, event);
+}
+
+Qt::Edges TabuletWidget::edgesAt(QPoint at) const {
+    Qt::Edges edges;
+    if (at.x() < border) edges |= Qt::LeftEdge;
+    if (at.x() >= width() - border) edges |= Qt::RightEdge;
+    if (at.y() < border) edges |= Qt::TopEdge;
+    if (at.y() >= height() - border) edges |= Qt::BottomEdge;
+    // Near a corner an edge takes its neighbour along.
+    if (edges & (Qt::TopEdge | Qt::BottomEdge)) {
+        if (at.x() < cornerReach) edges |= Qt::LeftEdge;
+        if (at.x() >= width() - cornerReach) edges |= Qt::RightEdge;
+    } else if (edges) {
+        if (at.y() < cornerReach) edges |= Qt::TopEdge;
+        if (at.y() >= height() - cornerReach) edges |= Qt::BottomEdge;
+    }
+    return edges;
+}
+
+void TabuletWidget::mousePressEvent(QMouseEvent* event) {
+    raise();
+    if (event->button() != Qt::LeftButton) return;
+    mEdges = edgesAt(event->position().toPoint());
+    mGesture = mEdges ? Gesture::resize : Gesture::move;
+    mPressedAt = event->globalPosition();
+    mMoved = false;
+    if (mListener) mListener->gestureBegan();
+    mList->setFocus(Qt::MouseFocusReason);
+}
+
+void TabuletWidget::mouseMoveEvent(QMouseEvent* event) {
+    // The release may have gone to a message box that came up in between.
+    if (!(event->buttons() & Qt::LeftButton)) endGesture();
+    if (mGesture == Gesture::none) {
+        setCursor(cursorFor(edgesAt(event->position().toPoint())));
+        return;
+    }
+    const QPointF way = event->globalPosition() - mPressedAt;
+    if (!mMoved && way.isNull()) return;
+    mMoved = true;
+    if (mListener) mListener->gestureMoved(mEdges, way);
+}
+
+void TabuletWidget::mouseReleaseEvent(QMouseEvent* event) {
+    if (event->button() == Qt::LeftButton) endGesture();
+}
+
+void TabuletWidget::endGesture() {
+    const bool moved = mGesture != Gesture::none && mMoved;
+    mGesture = Gesture::none;
+    mMoved = false;
+    if (moved && mListener) mListener->gestureEnded(mEdges);
+}
+
+// The canvas below does not scroll while the mouse is over a table.
+void TabuletWidget::wheelEvent(QWheelEvent* event) { event->accept(); }
+
+void TabuletWidget::dragEnterEvent(QDragEnterEvent* event) {
+    mDraggedAt = event->position();
+    event->setAccepted(mListener && mListener->draggedOver(event->mimeData(), mDraggedAt, 0));
+}
+
+void TabuletWidget::dragMoveEvent(QDragMoveEvent* event) {
+    mDraggedAt = event->position();
+    event->setAccepted(mListener && mListener->draggedOver(event->mimeData(), mDraggedAt, 2));
+}
+
+void TabuletWidget::dragLeaveEvent(QDragLeaveEvent*) {
+    if (mListener) mListener->draggedOver(nullptr, mDraggedAt, 1);
+}
+
+void TabuletWidget::dropEvent(QDropEvent* event) {
+    event->setAccepted(mListener && mListener->dropped(event->mimeData(), event->position()));
+}
+
+} // namespace platform::qt

@@ -1,0 +1,82 @@
+#pragma once
+
+#include "platform/qt/ColumnListView.h"
+
+#include <QAbstractButton>
+#include <QWidget>
+
+namespace platform::qt {
+
+class ColumnListModel;
+
+class TabuletListener : public EntryListener {
+public:
+    virtual void closeClicked() = 0;
+    /// A move (no edge) or a resize by one or two edges begins.
+    virtual void gestureBegan() = 0;
+    /// The mouse is `way` logical pixels from where the gesture began.
+    virtual void gestureMoved(Qt::Edges edges, QPointF way) = 0;
+    virtual void gestureEnded(Qt::Edges edges) = 0;
+    virtual bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) = 0;
+    virtual bool dropped(const QMimeData* data, QPointF at) = 0;
+};
+
+/// A table as a box: title bar with name and close button, list of columns, a border to resize by.
+class TabuletWidget : public QWidget {
+public:
+    explicit TabuletWidget(QWidget* parent);
+
+    void setListener(TabuletListener* listener);
+    ColumnListView& list() const { return *mList; }
+    ColumnListModel& model() const { return *mModel; }
+    QAbstractButton& closeButton() const { return *mClose; }
+
+    void setTitle(const QString& title);
+    const QString& title() const { return mTitle; }
+    void setCurrent(bool current);
+    bool isCurrent() const { return mCurrent; }
+
+    /// Top of the list inside the box, the same at every size.
+    int listTop() const { return mTitleHeight; }
+    /// The smallest box that still shows its name and one entry.
+    QSize smallest() const;
+    QRect titleBar() const;
+
+protected:
+    bool event(QEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+    void changeEvent(QEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+    void dragEnterEvent(QDragEnterEvent* event) override;
+    void dragMoveEvent(QDragMoveEvent* event) override;
+    void dragLeaveEvent(QDragLeaveEvent* event) override;
+    void dropEvent(QDropEvent* event) override;
+
+private:
+    enum class Gesture { none, move, resize };
+
+    void measure();
+    void arrange();
+    Qt::Edges edgesAt(QPoint at) const;
+    void endGesture();
+
+    TabuletListener* mListener = nullptr;
+    ColumnListModel* mModel;
+    ColumnListView* mList;
+    QAbstractButton* mClose;
+    QString mTitle;
+    bool mCurrent = false;
+    int mTitleHeight = 0;
+    Gesture mGesture = Gesture::none;
+    Qt::Edges mEdges;
+    QPointF mPressedAt;
+    QPointF mDraggedAt;
+    bool mMoved = false;
+};
+
+} // namespace platform::qt

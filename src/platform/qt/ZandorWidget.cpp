@@ -1,0 +1,183 @@
+#include "platform/qt/ZandorWidget.h"
+
+#include "platform/Numbers.h"
+#include "platform/qt/QtToolkit.h"
+#include "platform/qt/Text.h"
+
+#include <QWheelEvent>
+
+using platform::qt::fromQt;
+using platform::qt::toQt;
+using TalvikDBxZandor::Zandor;
+
+/// Turns the control's events into the widget's signals.
+class ZandorWidget::Events : public TalvikDBxZandor::ZandorEvents {
+public:
+    explicit Events(ZandorWidget& widget) : mWidget(widget) {}
+
+    void Raise(TalvikDBxZandor::Event event,
+               const TalvikDBxZandor::EventArguments& arguments) override {
+        using TalvikDBxZandor::Event;
+        switch (event) {
+        case Event::TableDeleted: emit mWidget.TableDeleted(); break;
+        case Event::TableMoved: emit mWidget.TableMoved(); break;
+        case Event::Activate: emit mWidget.Activate(); break;
+        case Event::ColumnCreated: emit mWidget.ColumnCreated(arguments.Definition); break;
+        case Event::ColumnModified: emit mWidget.ColumnModified(arguments.Definition); break;
+        case Event::ColumnRemoved: emit mWidget.ColumnRemoved(arguments.Definition); break;
+        case Event::Error: emit mWidget.Error(toQt(arguments.Text), arguments.Number); break;
+        case Event::JoinCreated: emit mWidget.JoinCreated(arguments.Join); break;
+        case Event::JoinModified: emit mWidget.JoinModified(arguments.Join); break;
+        case Event::JoinRemoved: emit mWidget.JoinRemoved(arguments.Join); break;
+        }
+    }
+
+private:
+    ZandorWidget& mWidget;
+};
+
+ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
+    : QWidget(parent), mToolkit(std::make_unique<platform::qt::QtToolkit>(*this)),
+      mEvents(std::make_unique<Events>(*this)) {
+    // The canvas has the same background, so that none sees where it ends.
+    setAutoFillBackground(true);
+    setBackgroundRole(QPalette::Window);
+    resize(sizeHint());
+    mControl = std::make_unique<Zandor>(*mToolkit, library, *mEvents);
+    mControl->UserControl_Resize();
+}
+
+ZandorWidget::~ZandorWidget() {
+    // The window around may be in the middle of its own destruction.
+    mToolkit->close();
+    mControl.reset();
+}
+
+QSize ZandorWidget::sizeHint() const { return {900, 600}; }
+
+QSize ZandorWidget::minimumSizeHint() const { return {240, 160}; }
+
+void ZandorWidget::paintEvent(QPaintEvent*) { queuePaint(); }
+
+void ZandorWidget::resizeEvent(QResizeEvent*) {
+    if (mControl) mControl->UserControl_Resize();
+}
+
+void ZandorWidget::showEvent(QShowEvent*) { queuePaint(); }
+
+void ZandorWidget::wheelEvent(QWheelEvent* event) { mToolkit->scrollByWheel(*event); }
+
+void ZandorWidget::queuePaint() {
+    // The control's paint may open message boxes, which must never happen while Qt paints.
+    if (std::exchange(mPaintQueued, true)) return;
+    QMetaObject::invokeMethod(
+        this,
+        [this] {
+            mPaintQueued = false;
+            if (mControl) mControl->UserControl_Paint();
+        },
+        Qt::QueuedConnection);
+}
+
+void ZandorWidget::setInteger(platform::StringView procedure, int value,
+                              void (*set)(Zandor&, std::int16_t)) {
+    TalvikDBxZandor::basZandor::Guard(*mToolkit, Zandor::ModuleName, procedure,
+                                      [&] { set(*mControl, platform::toInteger(value)); });
+}
+
+// The properties: one line a getter, one line a setter.
+
+#define FIELD_TEXT(name)                                                                          \
+    QString ZandorWidget::name() const { return toQt(mControl->name); }                           \
+    void ZandorWidget::set##name(const QString& value) { mControl->name = fromQt(value); }
+#define FIELD_FLAG(name)                                                                          \
+    bool ZandorWidget::name() const { return mControl->name; }                                    \
+    void ZandorWidget::set##name(bool value) { mControl->name = value; }
+#define FIELD_NUMBER(name)                                                                        \
+    int ZandorWidget::name() const { return mControl->name; }                                     \
+    void ZandorWidget::set##name(int value) {                                                     \
+        setInteger(u"P_LET " #name, value, [](Zandor& zandor, std::int16_t v) { zandor.name = v; }); \
+    }
+#define PROPERTY_FLAG(name)                                                                       \
+    bool ZandorWidget::name() const { return mControl->name(); }                                  \
+    void ZandorWidget::set##name(bool value) { mControl->name(value); }
+#define PROPERTY_NUMBER(name)                                                                     \
+    int ZandorWidget::name() const { return mControl->name(); }                                   \
+    void ZandorWidget::set##name(int value) {                                                     \
+        setInteger(u"P_LET " #name, value, [](Zandor& zandor, std::int16_t v) { zandor.name(v); }); \
+    }
+
+FIELD_TEXT(LNGJoinForm)
+FIELD_TEXT(LNGJoinLeftTable)
+FIELD_TEXT(LNGJoinLeftColumn)
+FIELD_TEXT(LNGJoinRightTable)
+FIELD_TEXT(LNGJoinRightColumn)
+FIELD_TEXT(LNGJoinType)
+FIELD_TEXT(LNGJoinTypeNormal)
+FIELD_TEXT(LNGJoinTypeLeftOuter)
+FIELD_TEXT(LNGJoinTypeRightOuter)
+FIELD_TEXT(LNGJoinTypeBothOuter)
+FIELD_TEXT(LNGJoinOk)
+FIELD_TEXT(LNGJoinCancel)
+FIELD_TEXT(LNGMnuShowJoinDef)
+FIELD_TEXT(LNGMnuDelJoin)
+FIELD_TEXT(LNGMnuCopyCol)
+FIELD_TEXT(LNGMnuCreateJoin)
+FIELD_TEXT(LNGMnuDelTable)
+FIELD_TEXT(LNGMnuPasteCol)
+FIELD_TEXT(LNGMnuDelCol)
+FIELD_TEXT(LNGSpreadField)
+FIELD_TEXT(LNGSpreadSynonym)
+FIELD_TEXT(LNGSpreadSort)
+FIELD_TEXT(LNGSpreadVisible)
+FIELD_TEXT(LNGSpreadCriteria)
+FIELD_TEXT(LNGSpreadOr)
+FIELD_FLAG(LNGMnuShowJoinDefVis)
+FIELD_FLAG(LNGMnuDelJoinVis)
+FIELD_FLAG(LNGMnuCopyColVis)
+FIELD_FLAG(LNGMnuCreateJoinVis)
+FIELD_FLAG(LNGMnuDelTableVis)
+FIELD_FLAG(LNGMnuPasteColVis)
+FIELD_FLAG(LNGMnuDelColVis)
+FIELD_FLAG(LNGMnuSep1Vis)
+FIELD_FLAG(LNGMnuSep2Vis)
+FIELD_NUMBER(MXHorzFrameSize)
+FIELD_NUMBER(MXVertFrameSize)
+FIELD_TEXT(DeletedTable)
+PROPERTY_NUMBER(DebugSwitch)
+PROPERTY_NUMBER(JoinModifyDisabled)
+PROPERTY_NUMBER(VisibleFrameLeft)
+PROPERTY_NUMBER(VisibleFrameTop)
+PROPERTY_NUMBER(HorizMaxScrollPos)
+PROPERTY_NUMBER(VertMaxScrollPos)
+PROPERTY_NUMBER(HorizontalScrollbarPos)
+PROPERTY_NUMBER(VerticalScrollbarPos)
+PROPERTY_FLAG(OnlyJoin)
+PROPERTY_FLAG(UseJoinTypeNormal)
+PROPERTY_FLAG(UseJoinTypeLeft)
+PROPERTY_FLAG(UseJoinTypeRight)
+PROPERTY_FLAG(UseJoinTypeBoth)
+PROPERTY_FLAG(UseJoinCompareOperatorEquals)
+PROPERTY_FLAG(UseJoinCompareOperatorNotEquals)
+PROPERTY_FLAG(UseJoinCompareOperatorLess)
+PROPERTY_FLAG(UseJoinCompareOperatorGreater)
+PROPERTY_FLAG(UseJoinCompareOperatorLessEquals)
+PROPERTY_FLAG(UseJoinCompareOperatorGreaterEquals)
+PROPERTY_FLAG(UseJoinCompareOperatorLE)
+PROPERTY_FLAG(UseJoinCompareOperatorGE)
+
+ZandorWidget::ZandorModel ZandorWidget::model() const { return mControl->P_GET_Zandor(); }
+void ZandorWidget::setModel(const ZandorModel& model) { mControl->P_SET_Zandor(model); }
+ZandorWidget::ZDJoin ZandorWidget::lastjoin() const { return mControl->lastjoin(); }
+ZandorWidget::ZDTable ZandorWidget::activetable() const { return mControl->activetable(); }
+ZandorWidget::ZDColumn ZandorWidget::ActiveColumn() const { return mControl->ActiveColumn(); }
+
+void ZandorWidget::Terminate() { mControl->Terminate(); }
+
+void ZandorWidget::SelectColumnNames(const QString& TabName, const QString& ColName) {
+    mControl->SelectColumnNames(fromQt(TabName), fromQt(ColName));
+}
+
+void ZandorWidget::SetCurrentTable(const QString& TabName) {
+    mControl->SetCurrentTable(fromQt(TabName));
+}
