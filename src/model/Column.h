@@ -1,0 +1,36 @@
+#pragma once
+
+#include "model/Description.h"
+#include "model/Place.h"
+
+namespace model {
+
+/// A column of a table in the query. Its key is unique in the whole query.
+class Column final : public TalvikZandorLib::ZDColumn {
+public:
+    /// The name of the entry that stands for all columns of its table.
+    static constexpr platform::StringView allColumns = u"*";
+
+    Column(ColumnPlace place, ColumnDescription description)
+        : mPlace(std::move(place)), mDescription(std::move(description)) {}
+
+    String Name() const override { return mDescription.name; }
+    String Key() const override { return mPlace.key(); }
+    /// Whether the column belongs to the table's primary key.
+    bool Marker() const override { return mDescription.primaryKey; }
+    bool Selected() const override { return mSelected; }
+    void Selected(bool value) override { mSelected = value; }
+    void activated(std::int16_t value) override { mActivated = value; }
+
+    std::int16_t activated() const { return mActivated; }
+    const ColumnDescription& description() const { return mDescription; }
+    const ColumnPlace& place() const { return mPlace; }
+
+private:
+    const ColumnPlace mPlace;
+    const ColumnDescription mDescription;
+    bool mSelected = false;
+    std::int16_t mActivated = 0;
+};
+
+} // namespace model

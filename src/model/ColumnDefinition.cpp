@@ -1,0 +1,23 @@
+#include "model/ColumnDefinition.h"
+
+#include "model/Table.h"
+
+namespace model {
+
+Ref<TalvikZandorLib::ZDColumn> ColumnDefinition::Column() const { return mPlace.column(); }
+
+void ColumnDefinition::Column(const Ref<TalvikZandorLib::ZDColumn>& value) {
+    const ColumnPlace place = placeOf(value);
+    if (!mKey.empty()) {
+        if (place.empty()) throw platform::errors::objectNotSet();
+        if (!place.table().sameHome(mPlace.table())) throw platform::errors::invalidProcedureCall();
+    }
+    mPlace = place;
+}
+
+void ColumnDefinition::SortOrder(std::int16_t value) {
+    if (value < 0 || value > 2) throw platform::errors::invalidPropertyValue();
+    mSortOrder = value;
+}
+
+} // namespace model

@@ -1,0 +1,47 @@
+#pragma once
+
+#include "model/Criteria.h"
+#include "model/Place.h"
+
+namespace model {
+
+class Query;
+
+/// One output column. It names its column by key, which reads as nothing once the table was
+/// deleted or the query is gone.
+class ColumnDefinition final : public TalvikZandorLib::ZDColumnDefinition {
+public:
+    Ref<TalvikZandorLib::ZDColumn> Column() const override;
+    /// Any column as long as the definition is new. Once it has its key it stays with its query:
+    /// a column of another query is error 5, and nothing is error 91.
+    void Column(const Ref<TalvikZandorLib::ZDColumn>& value) override;
+    String Synonym() const override { return mSynonym; }
+    void Synonym(const String& value) override { mSynonym = value; }
+    std::int16_t SortOrder() const override { return mSortOrder; }
+    /// Error 380 outside 0 to 2.
+    void SortOrder(std::int16_t value) override;
+    bool Visible() const override { return mVisible; }
+    void Visible(bool value) override { mVisible = value; }
+    /// Empty until the definition was added to a query; then "x" and a number, kept for good.
+    String Key() const override { return mKey; }
+    class Criteria& Criteria() override {
+        return mCriteria;
+    }
+    bool HasCriterium(const String& key) const override { return mCriteria.Contains(key); }
+    void AddCriterium(const String& text, const String& key) override { mCriteria.Add(text, key); }
+
+    const class Criteria& criteria() const { return mCriteria; }
+    const ColumnPlace& place() const { return mPlace; }
+
+private:
+    friend class Query; ///< gives the key
+
+    ColumnPlace mPlace;
+    String mSynonym;
+    std::int16_t mSortOrder = 0;
+    bool mVisible = true;
+    String mKey;
+    class Criteria mCriteria;
+};
+
+} // namespace model

@@ -1,0 +1,41 @@
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <utility>
+#include <vector>
+
+/// Places for new tables on the canvas. All lengths are twips.
+namespace model::layout {
+
+inline constexpr std::int32_t margin = 300;          ///< left of and above the first table
+inline constexpr std::int32_t betweenColumns = 1200; ///< room for the join marks of both sides
+inline constexpr std::int32_t betweenRows = 450;
+
+struct Size {
+    std::int32_t width = 0;
+    std::int32_t height = 0;
+};
+
+struct Box {
+    std::int32_t left = 0;
+    std::int32_t top = 0;
+    std::int32_t width = 0;
+    std::int32_t height = 0;
+};
+
+/// The size of a table with this many entries, the longest of which (or the title) has this many
+/// characters: all entries show up to ten, behind that the list scrolls.
+Size fittedSize(std::size_t entries, std::size_t longestText);
+
+/// A pair of tables that a join connects: positions from 0 in `sizes`, or behind them in `taken`.
+using Link = std::pair<std::size_t, std::size_t>;
+
+/// Boxes for tables of these sizes, in their order, on a grid whose cells are as large as the
+/// largest table. Joined tables come near each other; no box comes closer to another or to one of
+/// `taken` than the distances above. The grid is as wide as `canvasWidth` allows (one column at
+/// least) and as deep as it needs.
+std::vector<Box> arrange(const std::vector<Size>& sizes, const std::vector<Link>& links,
+                         const std::vector<Box>& taken, std::int32_t canvasWidth);
+
+} // namespace model::layout

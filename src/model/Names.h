@@ -1,0 +1,14 @@
+#pragma once
+
+#include "platform/String.h"
+
+namespace model {
+
+/// Whether two names are one to a database: the letters A to Z count without regard to case, all
+/// other characters as they stand.
+bool sameName(platform::StringView left, platform::StringView right);
+
+/// The name in the form that all names alike share: equal for two names exactly when sameName.
+platform::String foldedName(platform::StringView name);
+
+} // namespace model

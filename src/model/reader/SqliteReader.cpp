@@ -1,0 +1,137 @@
+#include "model/reader/DatabaseReader.h"
+
+#include "model/reader/columnType.h"
+#include "model/reader/sqliteError.h"
+
+#include <QSqlQuery>
+#include <QVariant>
+
+#include <functional>
+#include <optional>
+
+namespace reader {
+
+namespace {
+
+QString toQt(const String& text) { return QString::fromStdU16String(text); }
+
+String textAt(const QSqlQuery& query, int column) {
+    return query.value(column).toString().toStdU16String();
+}
+
+/// The pragmas as tables, for as such they take a name as a bound parameter, whatever characters it
+/// has.
+class SqliteReader final : public DatabaseReader {
+public:
+    explicit SqliteReader(const QSqlDatabase& database) : mDatabase(database) {}
+
+    Result<std::vector<TableEntry>> tables() override;
+    Result<model::TableDescription> table(const TableId& id) override;
+    Result<std::vector<ForeignKey>> foreignKeys(const TableId& child) override;
+
+private:
+    static QString schemaOf(const TableId& id) {
+        return id.schema.empty() ? QStringLiteral("main") : toQt(id.schema);
+    }
+    /// Calls `use` for every row; the error when the statement fails.
+    std::optional<Error> read(const QString& what, const QString& statement,
+                              const QVariantList& parameters,
+                              const std::function<void(const QSqlQuery&)>& use) const;
+    Result<std::vector<String>> primaryKey(const TableId& id) const;
+
+    QSqlDatabase mDatabase;
+};
+
+std::optional<Error> SqliteReader::read(const QString& what, const QString& statement,
+                                        const QVariantList& parameters,
+                                        const std::function<void(const QSqlQuery&)>& use) const {
+    QSqlQuery query(mDatabase);
+    query.setForwardOnly(true);
+    bool done = query.prepare(statement);
+    for (const QVariant& parameter : parameters) query.addBindValue(parameter);
+    done = done && query.exec();
+    while (done && query.next()) use(query);
+    // A failure between two rows ends the loop like the last row does.
+    if (done && !query.lastError().isValid()) return {};
+    return sqliteError(QStringLiteral("%1 cannot be read").arg(what), query.lastError());
+}
+
+Result<std::vector<TableEntry>> SqliteReader::tables() {
+    std::vector<TableEntry> entries;
+    const auto error =
+        read(QStringLiteral("The list of tables"),
+             QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list "
+                            "WHERE schema = 'main' AND type IN ('table', 'view', 'virtual') "
+                            "AND name NOT LIKE 'sqlite\\_%' ESCAPE '\\' "
+                            "ORDER BY name COLLATE NOCASE, name"),
+             {}, [&](const QSqlQuery& row) {
+                 entries.push_back({{{}, textAt(row, 0)}, row.value(1).toBool()});
+             });
+    if (error) return *error;
+    return entries;
+}
+
+Result<model::TableDescription> SqliteReader::table(const TableId& id) {
+    model::TableDescription description{id.schema, id.name, {}};
+    constexpr int hiddenInVirtualTable = 1; // generated columns, 2 and 3, are like any other
+    const QString named = QStringLiteral("The table \"%1\"").arg(toQt(id.name));
+    const auto error =
+        read(named, QStringLiteral("SELECT name, type, pk, hidden FROM pragma_table_xinfo(?, ?)"),
+             {toQt(id.name), schemaOf(id)}, [&](const QSqlQuery& row) {
+                 if (row.value(3).toInt() == hiddenInVirtualTable) return;
+                 const String type = textAt(row, 1);
+                 description.columns.push_back(
+                     {textAt(row, 0), columnType(type), type, row.value(2).toInt() > 0});
+             });
+    if (error) return *error;
+    if (description.columns.empty())
+        return Error{QStringLiteral("%1 is not in the database; read the list of tables afresh.")
+                         .arg(named)};
+    return description;
+}
+
+Result<std::vector<String>> SqliteReader::primaryKey(const TableId& id) const {
+    std::vector<String> columns;
+    const auto error =
+        read(QStringLiteral("The primary key of \"%1\"").arg(toQt(id.name)),
+             QStringLiteral("SELECT name FROM pragma_table_xinfo(?, ?) WHERE pk > 0 ORDER BY pk"),
+             {toQt(id.name), schemaOf(id)},
+             [&](const QSqlQuery& row) { columns.push_back(textAt(row, 0)); });
+    if (error) return *error;
+    return columns;
+}
+
+Result<std::vector<ForeignKey>> SqliteReader::foreignKeys(const TableId& child) {
+    std::vector<ForeignKey> keys;
+    const auto error = read(
+        QStringLiteral("The foreign keys of \"%1\"").arg(toQt(child.name)),
+        // SQLite numbers them backwards.
+        QStringLiteral("SELECT seq, \"table\", \"from\", \"to\" FROM pragma_foreign_key_list(?, ?) "
+                       "ORDER BY id DESC, seq"),
+        {toQt(child.name), schemaOf(child)}, [&](const QSqlQuery& row) {
+            if (row.value(0).toInt() == 0)
+                keys.push_back({child, {child.schema, textAt(row, 1)}, {}});
+            keys.back().columns.emplace_back(textAt(row, 2), textAt(row, 3));
+        });
+    if (error) return *error;
+
+    std::vector<ForeignKey> usable;
+    for (ForeignKey& key : keys) {
+        if (key.columns.front().second.empty()) {
+            const auto parent = primaryKey(key.parent);
+            if (!parent) return Error{parent.error()};
+            if (parent->size() != key.columns.size()) continue;
+            for (std::size_t n = 0; n < parent->size(); ++n) key.columns[n].second = (*parent)[n];
+        }
+        usable.push_back(std::move(key));
+    }
+    return usable;
+}
+
+} // namespace
+
+std::unique_ptr<DatabaseReader> makeSqliteReader(const QSqlDatabase& database) {
+    return std::make_unique<SqliteReader>(database);
+}
+
+} // namespace reader

@@ -1,0 +1,147 @@
+#include "model/reader/addTables.h"
+
+#include "model/Layout.h"
+#include "model/Names.h"
+
+#include <algorithm>
+#include <optional>
+
+namespace reader {
+
+using model::layout::Box;
+using platform::Each;
+using platform::makeRef;
+using platform::Ref;
+using TalvikZandorLib::ZDTable;
+
+namespace {
+
+using TableList = std::vector<Ref<model::Table>>;
+
+TableList tablesOf(model::Query& query) {
+    TableList tables;
+    for (const auto& table : Each<ZDTable>(query.Tables()))
+        tables.push_back(std::static_pointer_cast<model::Table>(table));
+    return tables;
+}
+
+/// A foreign key with the tables that it connects, as positions in a list of tables.
+struct Relation {
+    std::size_t child = 0;
+    std::size_t parent = 0;
+    ForeignKey key;
+};
+
+/// Positions of the tables in a list that were made from a source.
+std::vector<std::size_t> instancesOf(const TableId& source, const std::vector<TableId>& sources) {
+    std::vector<std::size_t> positions;
+    for (std::size_t n = 0; n < sources.size(); ++n)
+        if (model::sameName(sources[n].schema, source.schema) &&
+            model::sameName(sources[n].name, source.name))
+            positions.push_back(n);
+    return positions;
+}
+
+/// The relations among the sources that reach one from `firstNew` on. Those among the earlier
+/// ones are as the user left them.
+Result<std::vector<Relation>> relations(DatabaseReader& reader, const std::vector<TableId>& sources,
+                                        std::size_t firstNew) {
+    std::vector<Relation> result;
+    for (std::size_t child = 0; child < sources.size(); ++child) {
+        if (instancesOf(sources[child], sources).front() != child) continue;
+        auto keys = reader.foreignKeys(sources[child]);
+        if (!keys) return Error{keys.error()};
+        for (ForeignKey& key : *keys) {
+            auto parents = instancesOf(key.parent, sources);
+            std::erase(parents, child);
+            if (parents.empty()) continue;
+            const std::size_t parent = parents.front();
+            if (std::max(child, parent) >= firstNew)
+                result.push_back({child, parent, std::move(key)});
+        }
+    }
+    return result;
+}
+
+void place(const TableList& present, const TableList& added, const std::vector<Relation>& relations,
+           std::int32_t canvasWidth) {
+    // The layout counts the new tables first.
+    std::vector<Box> taken;
+    std::vector<std::optional<std::size_t>> position(present.size());
+    for (std::size_t n = 0; n < present.size(); ++n) {
+        const auto& table = *present[n];
+        if (table.Left() < 0 || table.Top() < 0) continue;
+        constexpr std::int32_t usual = 2000; // what the control gives a table without a size
+        const bool sized = table.Width() > 0 && table.Height() > 0;
+        position[n] = added.size() + taken.size();
+        taken.push_back({table.Left(), table.Top(), sized ? table.Width() : usual,
+                         sized ? table.Height() : usual});
+    }
+    for (std::size_t n = 0; n < added.size(); ++n) position.emplace_back(n);
+
+    std::vector<model::layout::Link> links;
+    for (const Relation& relation : relations)
+        if (position[relation.child] && position[relation.parent])
+            links.emplace_back(*position[relation.child], *position[relation.parent]);
+
+    std::vector<model::layout::Size> sizes;
+    for (const auto& table : added) {
+        std::size_t longest = table->Name().size();
+        for (const auto& column : Each<TalvikZandorLib::ZDColumn>(table->Columns()))
+            longest = std::max(longest, column->Name().size());
+        sizes.push_back(
+            model::layout::fittedSize(static_cast<std::size_t>(table->Columns().Count()), longest));
+    }
+
+    const auto boxes = model::layout::arrange(sizes, links, taken, canvasWidth);
+    for (std::size_t n = 0; n < added.size(); ++n) {
+        added[n]->Left(static_cast<float>(boxes[n].left));
+        added[n]->Top(static_cast<float>(boxes[n].top));
+        added[n]->Width(static_cast<float>(boxes[n].width));
+        added[n]->Height(static_cast<float>(boxes[n].height));
+    }
+}
+
+void addJoins(model::Query& query, const model::Table& child, const model::Table& parent,
+              const ForeignKey& key) {
+    std::vector<Ref<model::Join>> joins;
+    for (const auto& [childName, parentName] : key.columns) {
+        const auto childColumn = child.columnNamed(childName);
+        const auto parentColumn = parent.columnNamed(parentName);
+        if (!childColumn || !parentColumn) return; // a key that fits no longer
+        const auto join = makeRef<model::Join>();
+        join->LeftColumn(childColumn);
+        join->RightColumn(parentColumn);
+        joins.push_back(join);
+    }
+    for (const auto& join : joins) query.AddJoin(join);
+}
+
+} // namespace
+
+Result<TableList> addTables(model::Query& query, DatabaseReader& reader,
+                            const std::vector<TableId>& names, std::int32_t canvasWidth) {
+    std::vector<model::TableDescription> descriptions;
+    for (const TableId& name : names) {
+        auto description = reader.table(name);
+        if (!description) return Error{description.error()};
+        descriptions.push_back(std::move(*description));
+    }
+    const TableList present = tablesOf(query);
+    std::vector<TableId> sources;
+    for (const auto& table : present) sources.push_back({table->schema(), table->sourceName()});
+    sources.insert(sources.end(), names.begin(), names.end());
+    const auto found = relations(reader, sources, present.size());
+    if (!found) return Error{found.error()};
+
+    TableList added;
+    for (const auto& description : descriptions) added.push_back(query.addTable(description));
+    place(present, added, *found, canvasWidth);
+    TableList all = present;
+    all.insert(all.end(), added.begin(), added.end());
+    for (const Relation& relation : *found)
+        addJoins(query, *all[relation.child], *all[relation.parent], relation.key);
+    return added;
+}
+
+} // namespace reader

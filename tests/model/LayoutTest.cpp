@@ -1,0 +1,112 @@
+#include "model/Layout.h"
+
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+
+using namespace model::layout;
+
+namespace {
+
+/// Whether no two boxes come closer than the distances kept free for joins.
+bool apart(const std::vector<Box>& boxes) {
+    for (std::size_t i = 0; i < boxes.size(); ++i) {
+        for (std::size_t j = 0; j < i; ++j) {
+            const Box& a = boxes[i];
+            const Box& b = boxes[j];
+            const bool beside =
+                a.left >= b.left + b.width + 900 || b.left >= a.left + a.width + 900;
+            const bool below = a.top >= b.top + b.height + 300 || b.top >= a.top + a.height + 300;
+            if (!beside && !below) return false;
+        }
+    }
+    return true;
+}
+
+int stepsBetween(const Box& a, const Box& b, Size cell) {
+    return std::abs(a.left - b.left) / (cell.width + betweenColumns) +
+           std::abs(a.top - b.top) / (cell.height + betweenRows);
+}
+
+const Size cell{2000, 2000};
+
+} // namespace
+
+TEST(ATableSize, ShowsAllEntriesUpToTen) {
+    EXPECT_LT(fittedSize(3, 10).height, fittedSize(4, 10).height);
+    EXPECT_LT(fittedSize(9, 10).height, fittedSize(10, 10).height);
+    EXPECT_EQ(fittedSize(10, 10).height, fittedSize(200, 10).height);
+}
+
+TEST(ATableSize, GrowsWithItsLongestTextWithinBounds) {
+    EXPECT_LT(fittedSize(3, 12).width, fittedSize(3, 20).width);
+    EXPECT_EQ(fittedSize(3, 0).width, fittedSize(3, 1).width);
+    EXPECT_EQ(fittedSize(3, 60).width, fittedSize(3, 1000000).width);
+}
+
+TEST(TheLayout, BeginsAtTheMargin) {
+    const auto boxes = arrange({cell}, {}, {}, 16000);
+    ASSERT_EQ(boxes.size(), 1U);
+    EXPECT_EQ(boxes[0].left, 300);
+    EXPECT_EQ(boxes[0].top, 300);
+    EXPECT_EQ(boxes[0].width, 2000);
+    EXPECT_EQ(boxes[0].height, 2000);
+}
+
+TEST(TheLayout, OfNoTablesIsEmpty) { EXPECT_TRUE(arrange({}, {}, {}, 16000).empty()); }
+
+TEST(TheLayout, KeepsTablesOfAllSizesApartAndWithinTheCanvas) {
+    std::vector<Size> sizes;
+    for (std::int32_t n = 0; n < 16; ++n) sizes.push_back({1800 + n * 90, 700 + n % 5 * 600});
+    const auto boxes = arrange(sizes, {{0, 5}, {5, 9}, {1, 2}}, {}, 16000);
+    EXPECT_TRUE(apart(boxes));
+    for (std::size_t n = 0; n < boxes.size(); ++n) {
+        EXPECT_GE(boxes[n].left, 300);
+        EXPECT_GE(boxes[n].top, 300);
+        EXPECT_LE(boxes[n].left + boxes[n].width, 16000 - 300);
+        EXPECT_EQ(boxes[n].width, sizes[n].width);
+        EXPECT_EQ(boxes[n].height, sizes[n].height);
+    }
+}
+
+TEST(TheLayout, PutsTablesBelowEachOtherOnANarrowCanvas) {
+    const auto boxes = arrange({cell, cell, cell}, {}, {}, 1000);
+    EXPECT_TRUE(apart(boxes));
+    for (const Box& box : boxes) EXPECT_EQ(box.left, 300);
+}
+
+TEST(TheLayout, PutsJoinedTablesNextToEachOther) {
+    // A chain that runs criss-cross through the order of the tables.
+    const std::vector<std::size_t> chain = {3, 11, 0, 7, 5, 9, 2, 10, 1, 8, 4, 6};
+    std::vector<Link> links;
+    for (std::size_t n = 1; n < chain.size(); ++n) links.emplace_back(chain[n - 1], chain[n]);
+    const auto boxes = arrange(std::vector<Size>(12, cell), links, {}, 4 * 3200);
+    int steps = 0;
+    for (const auto& [a, b] : links) steps += stepsBetween(boxes[a], boxes[b], cell);
+    EXPECT_LE(steps, 18); // 11 at best; in the order of the tables it is 26
+}
+
+TEST(TheLayout, PutsTheTablesOfAHubAroundIt) {
+    std::vector<Link> links;
+    for (std::size_t n = 0; n < 5; ++n) links.emplace_back(n, 5);
+    const auto boxes = arrange(std::vector<Size>(6, cell), links, {}, 3 * 3200);
+    for (std::size_t n = 0; n < 5; ++n) EXPECT_LE(stepsBetween(boxes[n], boxes[5], cell), 2);
+}
+
+TEST(TheLayout, LeavesThePlacesThatAreTaken) {
+    const std::vector<Box> taken = {{500, 400, 2500, 1800}, {7000, 3000, 2000, 4000}};
+    auto boxes = arrange(std::vector<Size>(5, cell), {}, taken, 13000);
+    boxes.insert(boxes.end(), taken.begin(), taken.end());
+    EXPECT_TRUE(apart(boxes));
+}
+
+TEST(TheLayout, PutsANewTableBesideATakenOneItIsJoinedTo) {
+    const std::vector<Box> taken = {{300, 300, 2000, 2000}, {9900, 300, 2000, 2000}};
+    const auto boxes = arrange({cell}, {{0, 2}}, taken, 13000);
+    EXPECT_EQ(boxes[0].left, 300 + 2 * 3200);
+    EXPECT_EQ(boxes[0].top, 300);
+}
+
+TEST(TheLayout, IgnoresAJoinOfATableWithItself) {
+    EXPECT_TRUE(apart(arrange({cell, cell}, {{0, 0}}, {}, 13000)));
+}
