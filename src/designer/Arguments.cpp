@@ -1,0 +1,83 @@
+#include "designer/Arguments.h"
+
+#include <QCommandLineParser>
+
+namespace designer {
+
+namespace {
+
+/// Whether an option is there, alone or with "=" and a value.
+bool hasAny(const QStringList& arguments, const QStringList& options) {
+    for (const QString& argument : arguments) {
+        if (argument == QLatin1String("--")) return false; // behind it everything is a file
+        if (options.contains(argument.section(QLatin1Char('='), 0, 0))) return true;
+    }
+    return false;
+}
+
+} // namespace
+
+reader::Result<Arguments> readArguments(const QStringList& arguments) {
+    QCommandLineParser parser;
+    const QCommandLineOption tables(QStringLiteral("tables"), {}, QStringLiteral("names"));
+    const QCommandLineOption picture(QStringLiteral("picture"), {}, QStringLiteral("file"));
+    const QCommandLineOption dark(QStringLiteral("dark"));
+    parser.addOptions({tables, picture, dark});
+    // The parser takes the first argument for the program's name.
+    if (!parser.parse(QStringList(QStringLiteral("zandor-designer")) + arguments))
+        return reader::Error{parser.errorText() + QStringLiteral(" See --help.")};
+
+    const QStringList files = parser.positionalArguments();
+    if (files.size() > 1)
+        return reader::Error{QStringLiteral("There are %1 files; name one.").arg(files.size())};
+
+    Arguments result;
+    if (!files.isEmpty()) result.file = files.first();
+    for (const QString& list : parser.values(tables))
+        for (const QString& name : list.split(QLatin1Char(',')))
+            if (const QString trimmed = name.trimmed(); !trimmed.isEmpty())
+                result.tables.append(trimmed);
+    if (parser.isSet(tables) && result.tables.isEmpty())
+        return reader::Error{
+            QStringLiteral("--tables names no table; write --tables customers,orders.")};
+    result.picture = parser.value(picture);
+    if (parser.isSet(picture) && result.picture.isEmpty())
+        return reader::Error{QStringLiteral("--picture names no file; write --picture query.png.")};
+    result.dark = parser.isSet(dark);
+    return result;
+}
+
+bool asksForHelp(const QStringList& arguments) {
+    return hasAny(arguments, {QStringLiteral("--help"), QStringLiteral("-h")});
+}
+
+bool asksForVersion(const QStringList& arguments) {
+    return hasAny(arguments, {QStringLiteral("--version"), QStringLiteral("-v")});
+}
+
+bool asksForPicture(const QStringList& arguments) {
+    return hasAny(arguments, {QStringLiteral("--picture")});
+}
+
+QString helpText() {
+    return QStringLiteral(R"(Usage: zandor-designer [options] [FILE]
+Designs a query over the tables of an SQLite database, which is only read.
+
+Without FILE the sample database is opened, with a small query to look at.
+
+Options:
+  --tables NAMES   the tables to show, with commas between them; otherwise
+                   the first 16 in the order of their names
+  --picture FILE   draw the window into a picture (PNG) and end
+  --dark           dark colours, whatever the desktop uses
+  --help, -h       show this
+  --version, -v    show the version
+
+Exit codes: 0 all well, 1 the picture could not be written, 2 the arguments
+or the database cannot be used.
+)");
+}
+
+QString versionText() { return QStringLiteral("zandor-designer " ZANDOR_VERSION "\n"); }
+
+} // namespace designer

@@ -1,0 +1,68 @@
+#include "designer/Colours.h"
+#include "designer/DesignerWindow.h"
+#include "designer/Screen.h"
+
+#include <QDir>
+#include <QPixmap>
+
+#include <cstdio>
+
+namespace {
+
+constexpr int pictureFailed = 1;
+constexpr int unusable = 2;
+
+QStringList argumentsOf(int argc, char** argv) {
+    QStringList arguments;
+    for (int n = 1; n < argc; ++n) arguments << QString::fromLocal8Bit(argv[n]);
+    return arguments;
+}
+
+void say(std::FILE* stream, const QString& text) {
+    std::fputs(text.toLocal8Bit().constData(), stream);
+}
+
+int refuse(const QString& why) {
+    say(stderr, QStringLiteral("zandor-designer: %1\n").arg(why));
+    return unusable;
+}
+
+/// Draws a window that is shown into a file.
+int draw(designer::DesignerWindow& window, const QString& file) {
+    QCoreApplication::processEvents();
+    if (window.grab().save(file, "PNG")) return 0;
+    say(stderr, QStringLiteral("zandor-designer: The picture \"%1\" cannot be written; check the "
+                               "folder and your permissions.\n")
+                    .arg(file));
+    return pictureFailed;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    const QStringList given = argumentsOf(argc, argv);
+    if (designer::asksForHelp(given)) return say(stdout, designer::helpText()), 0;
+    if (designer::asksForVersion(given)) return say(stdout, designer::versionText()), 0;
+
+    const auto application = designer::makeApplication(argc, argv, designer::asksForPicture(given));
+    // Qt has taken its own arguments out by now.
+    const auto arguments = designer::readArguments(argumentsOf(argc, argv));
+    if (!arguments) return refuse(arguments.error());
+    if (arguments->dark) designer::useDarkColours();
+    const auto opened = designer::openQuery(*arguments, QStringLiteral(ZANDOR_SAMPLE_DATABASE),
+                                            designer::DesignerWindow::canvasWidth());
+    if (!opened) return refuse(opened.error());
+
+    designer::DesignerWindow window(*opened);
+    window.show();
+    if (!arguments->picture.isEmpty()) return draw(window, arguments->picture);
+    if (!designer::isOffscreen()) return QApplication::exec();
+
+    const QString file = QDir::temp().filePath(QStringLiteral("zandor-designer.png"));
+    const int result = draw(window, file);
+    if (result == 0)
+        say(stdout, QStringLiteral("No display can be reached; the window was drawn off screen:\n"
+                                   "%1\n")
+                        .arg(file));
+    return result;
+}

@@ -1,0 +1,43 @@
+#include "Databases.h"
+
+#include "designer/DesignerWindow.h"
+
+#include <gtest/gtest.h>
+
+#include <QFile>
+#include <QSqlDatabase>
+#include <QSqlError>
+#include <QSqlQuery>
+
+QString sampleDatabase() { return QStringLiteral(ZANDOR_SAMPLE_DATABASE); }
+
+designer::OpenedQuery openedSample(const designer::Arguments& arguments) {
+    const auto opened =
+        designer::openQuery(arguments, sampleDatabase(), designer::DesignerWindow::canvasWidth());
+    if (!opened) {
+        ADD_FAILURE() << opened.error().toStdString();
+        return {platform::makeRef<model::Query>(), {}, {}};
+    }
+    return *opened;
+}
+
+QString DatabaseFolder::database(const QString& name, const QStringList& statements) {
+    const QString connection = QStringLiteral("made for a test");
+    {
+        auto database = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), connection);
+        database.setDatabaseName(path(name));
+        EXPECT_TRUE(database.open()) << database.lastError().text().toStdString();
+        QSqlQuery query(database);
+        for (const QString& statement : statements)
+            EXPECT_TRUE(query.exec(statement)) << query.lastError().text().toStdString();
+    }
+    QSqlDatabase::removeDatabase(connection);
+    return path(name);
+}
+
+QString DatabaseFolder::file(const QString& name, const QByteArray& content) {
+    QFile file(path(name));
+    EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+    file.write(content);
+    return path(name);
+}

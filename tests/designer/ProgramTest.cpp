@@ -1,0 +1,143 @@
+#include "Databases.h"
+
+#include <gmock/gmock.h>
+
+#include <QDir>
+#include <QImage>
+#include <QProcess>
+#include <QProcessEnvironment>
+
+using testing::EndsWith;
+using testing::HasSubstr;
+using testing::StartsWith;
+
+namespace {
+
+struct Ended {
+    int code = -1;
+    std::string out;
+    std::string err;
+};
+
+/// Runs the program to its end. Nothing names a screen unless `environment` does.
+Ended run(const QStringList& arguments, const QMap<QString, QString>& environment = {}) {
+    QProcess process;
+    auto variables = QProcessEnvironment::systemEnvironment();
+    for (const char* name : {"DISPLAY", "WAYLAND_DISPLAY", "QT_QPA_PLATFORM"})
+        variables.remove(QLatin1String(name));
+    for (auto it = environment.begin(); it != environment.end(); ++it)
+        variables.insert(it.key(), it.value());
+    process.setProcessEnvironment(variables);
+    process.setStandardInputFile(QProcess::nullDevice());
+    process.start(QStringLiteral(ZANDOR_DESIGNER), arguments);
+    EXPECT_TRUE(process.waitForFinished(60000)) << process.errorString().toStdString();
+    EXPECT_EQ(process.exitStatus(), QProcess::NormalExit);
+    return {process.exitCode(), process.readAllStandardOutput().toStdString(),
+            process.readAllStandardError().toStdString()};
+}
+
+/// Expects the program to end with code 2 and one line about why.
+void expectRefusal(const QStringList& arguments, const std::string& why) {
+    const Ended ended = run(arguments);
+    EXPECT_EQ(ended.code, 2);
+    EXPECT_EQ(ended.out, "");
+    EXPECT_THAT(ended.err, StartsWith("zandor-designer: "));
+    EXPECT_THAT(ended.err, HasSubstr(why));
+    EXPECT_EQ(std::count(ended.err.begin(), ended.err.end(), '\n'), 1) << ended.err;
+    EXPECT_THAT(ended.err, EndsWith("\n"));
+}
+
+QRgb cornerOf(const QImage& picture) {
+    // Of the canvas, where no table stands.
+    return picture.pixel(5, 5);
+}
+
+} // namespace
+
+TEST(TheDesignerProgram, RefusesAMissingFileInOneLine) {
+    expectRefusal({"/no/such/file.db"}, "There is no file \"/no/such/file.db\"");
+}
+
+TEST(TheDesignerProgram, RefusesAFolderInOneLine) {
+    expectRefusal({QDir::tempPath()}, "is a folder");
+}
+
+TEST(TheDesignerProgram, RefusesAFileOfAnotherKindInOneLine) {
+    DatabaseFolder folder;
+    expectRefusal({folder.file("notes.txt", "just some words, and more of them")},
+                  "is not an SQLite database");
+}
+
+TEST(TheDesignerProgram, RefusesADamagedDatabaseInOneLine) {
+    DatabaseFolder folder;
+    expectRefusal(
+        {folder.file("damaged.db", QByteArray("SQLite format 3\0", 16) + QByteArray(4096, '\xA5'))},
+        "cannot be opened");
+}
+
+TEST(TheDesignerProgram, RefusesAnUnknownTableInOneLine) {
+    expectRefusal({"--tables", "customers,nowhere"}, "There is no table \"nowhere\"");
+}
+
+TEST(TheDesignerProgram, RefusesAnUnknownOptionInOneLine) {
+    expectRefusal({"--colour"}, "Unknown option 'colour'. See --help.");
+}
+
+TEST(TheDesignerProgram, ShowsHelpAndVersionWithoutAScreen) {
+    const QMap<QString, QString> broken{{"QT_QPA_PLATFORM", "no-such-platform"}};
+    const Ended help = run({"--help"}, broken);
+    EXPECT_EQ(help.code, 0);
+    EXPECT_THAT(help.out, StartsWith("Usage: zandor-designer"));
+    const Ended version = run({"--version"}, broken);
+    EXPECT_EQ(version.code, 0);
+    EXPECT_THAT(version.out, StartsWith("zandor-designer 0."));
+}
+
+TEST(TheDesignerProgram, DrawsItsWindowIntoAPicture) {
+    DatabaseFolder folder;
+    const Ended ended = run({"--picture", folder.path("window.png")});
+    EXPECT_EQ(ended.code, 0) << ended.err;
+    EXPECT_EQ(ended.err, "");
+    EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(1200, 800));
+}
+
+TEST(TheDesignerProgram, DrawsATwiceAsLargePictureOnATwiceAsFineScreen) {
+    DatabaseFolder folder;
+    const Ended ended = run({"--picture", folder.path("window.png")}, {{"QT_SCALE_FACTOR", "2"}});
+    EXPECT_EQ(ended.code, 0) << ended.err;
+    EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(2400, 1600));
+}
+
+TEST(TheDesignerProgram, DrawsDarkColoursWhenAskedTo) {
+    DatabaseFolder folder;
+    ASSERT_EQ(run({"--picture", folder.path("light.png")}).code, 0);
+    ASSERT_EQ(run({"--dark", "--picture", folder.path("dark.png")}).code, 0);
+    EXPECT_GT(qGray(cornerOf(QImage(folder.path("light.png")))), 200);
+    EXPECT_LT(qGray(cornerOf(QImage(folder.path("dark.png")))), 80);
+}
+
+TEST(TheDesignerProgram, EndsWithCodeOneWhenThePictureCannotBeWritten) {
+    const Ended ended = run({"--picture", "/no/such/folder/window.png"});
+    EXPECT_EQ(ended.code, 1);
+    EXPECT_EQ(ended.err, "zandor-designer: The picture \"/no/such/folder/window.png\" cannot be "
+                         "written; check the folder and your permissions.\n");
+}
+
+TEST(TheDesignerProgram, DrawsAPictureWhenThereIsNoDisplay) {
+    DatabaseFolder folder;
+    const Ended ended = run({}, {{"TMPDIR", folder.path("")}});
+    EXPECT_EQ(ended.code, 0);
+    EXPECT_EQ(ended.err, "");
+    EXPECT_THAT(ended.out, StartsWith("No display can be reached"));
+    EXPECT_THAT(ended.out, HasSubstr("\n" + folder.path("zandor-designer.png").toStdString()));
+    EXPECT_EQ(QImage(folder.path("zandor-designer.png")).size(), QSize(1200, 800));
+}
+
+TEST(TheDesignerProgram, DrawsAPictureWhenTheDisplayCannotBeReached) {
+    DatabaseFolder folder;
+    const Ended ended = run({}, {{"TMPDIR", folder.path("")}, {"DISPLAY", ":8765"}});
+    EXPECT_EQ(ended.code, 0);
+    EXPECT_EQ(ended.err, "");
+    EXPECT_THAT(ended.out, StartsWith("No display can be reached"));
+    EXPECT_FALSE(QImage(folder.path("zandor-designer.png")).isNull());
+}
