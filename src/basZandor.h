@@ -30,8 +30,8 @@ void Guard(platform::MessageBoxes& boxes, platform::StringView moduleName,
     }
 }
 
-/// The cell of a point in the grid's coordinates (twips). Col and Row keep their values when the
-/// grid fails; the failure is reported.
+/// The cell of a point in the grid's coordinates (twips). A failure of the grid is reported; what
+/// had not been found by then keeps its value.
 void SpreadHitTest(platform::MessageBoxes& boxes, std::int32_t& Col, std::int32_t& Row,
                    const MSFlexGridLib::MSFlexGrid& grid, float X, float Y);
 

@@ -188,7 +188,7 @@ private:
     void MakeMenu();
 
     // Binding
-    TalvikZandorLib::Zandor& Model();
+    Ref<TalvikZandorLib::Zandor> Model();
     void SetZandor();
     bool ShowTables();
     void ShowJoins();

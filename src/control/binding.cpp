@@ -6,17 +6,17 @@ namespace TalvikDBxZandor {
 
 using platform::Each;
 
-/// The model held; an empty one is made where none is.
-TalvikZandorLib::Zandor& Zandor::Model() {
+/// The model held; an empty one is made where none is. A walk over it keeps the reference, because
+/// a host asked for a table may bind another model.
+platform::Ref<TalvikZandorLib::Zandor> Zandor::Model() {
     if (!mModel) mModel = mLibrary.NewZandor();
-    return *mModel;
+    return mModel;
 }
 
 platform::Ref<TalvikZandorLib::Zandor> Zandor::P_GET_Zandor() {
     Ref<TalvikZandorLib::Zandor> result;
     Guard(u"P_GET Zandor", [&] {
-        Model();
-        result = mModel;
+        result = Model();
     });
     return result;
 }
@@ -66,7 +66,7 @@ bool Zandor::ShowTables() {
     Ref<Tabulet> first;
     Ref<Tabulet> selected;
     std::int32_t cascade = 0;
-    for (const auto& table : Each(Model().Tables())) {
+    for (const auto model = Model(); const auto& table : Each(model->Tables())) {
         if (mTableFreeList->FreeCount() == 0) continue;
         std::int32_t slot = 0;
         if (!mTableFreeList->GetNextFreeIndex(slot)) return false;
@@ -84,7 +84,7 @@ bool Zandor::ShowTables() {
 }
 
 void Zandor::ShowJoins() {
-    for (const auto& join : Each(Model().Joins())) {
+    for (const auto model = Model(); const auto& join : Each(model->Joins())) {
         Ref<Tabulet> leftTable, rightTable;
         Ref<ColumnItem> leftColumn, rightColumn;
         FindTable(join->LeftTable()->Name(), leftTable);
@@ -100,7 +100,7 @@ void Zandor::ShowJoins() {
 
 void Zandor::ShowDefinitions() {
     std::int32_t column = 1;
-    for (const auto& definition : Each(Model().ColumnDefinitions()))
+    for (const auto model = Model(); const auto& definition : Each(model->ColumnDefinitions()))
         ShowDefinition(column++, *definition);
 }
 
@@ -139,7 +139,7 @@ void Zandor::ShowDefinition(std::int32_t column, TalvikZandorLib::ZDColumnDefini
 /// and deleted like one dropped by the user. A key of another form leaves the column untied.
 void Zandor::TieBoundColumns() {
     for (std::int32_t column = 1; column <= mBoundColumns; ++column) {
-        const String key = Model().ColumnDefinitions().Item(column)->Key();
+        const String key = Model()->ColumnDefinitions().Item(column)->Key();
         sprColumn->ColData(column, isKeyOfNumber(key) ? numberOfKey(key) : 0);
     }
 }
@@ -215,7 +215,7 @@ void Zandor::SelectColumnNames(const String& TabName, const String& ColName) {
                 entry->EnsureVisible();
             }
         }
-        for (const auto& table : Each(Model().Tables())) {
+        for (const auto model = Model(); const auto& table : Each(model->Tables())) {
             if (table->Name() != TabName) continue;
             for (const auto& column : Each(table->Columns()))
                 column->Selected(column->Name() == ColName);

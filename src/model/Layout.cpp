@@ -85,8 +85,8 @@ private:
 Size fittedSize(std::size_t entries, std::size_t longestText) {
     constexpr std::int32_t character = 105;
     constexpr std::int32_t besideText = 750; // border, key mark and scroll bar
-    constexpr std::int32_t entry = 255;
-    constexpr std::int32_t aroundEntries = 450; // title bar and border
+    constexpr std::int32_t entry = 270;
+    constexpr std::int32_t aroundEntries = 480; // title bar and border
     constexpr std::size_t mostEntries = 10;
     const auto text = static_cast<std::int32_t>(std::min<std::size_t>(longestText, 100));
     const auto shown = static_cast<std::int32_t>(std::clamp<std::size_t>(entries, 2, mostEntries));

@@ -14,7 +14,7 @@ platform::Ref<TalvikTabulet::ColumnItem> Zandor::FirstSelected(Tabulet& table) {
 
 /// The model table behind a shown one. Error 5 when the model holds none under its key.
 Zandor::ZDTableRef Zandor::TableOf(std::int16_t Index) {
-    return Model().Tables().Item(lstTable(Index)->Tag());
+    return Model()->Tables().Item(lstTable(Index)->Tag());
 }
 
 void Zandor::lstTable_ColumnMouseDown(std::int16_t Index, const Ref<ColumnItem>&, std::int16_t,

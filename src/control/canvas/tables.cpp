@@ -85,7 +85,7 @@ bool Zandor::SetSelectedTable(const String& TableName) {
     Guard(u"SetSelectedTable", [&] {
         Trace(u"SetSelectedTable");
         bool found = false;
-        for (const auto& table : Each(Model().Tables())) {
+        for (const auto model = Model(); const auto& table : Each(model->Tables())) {
             const bool match = !found && table->Key() == TableName;
             table->Selected(match ? std::int16_t{1} : std::int16_t{0});
             found = found || match;
@@ -99,7 +99,7 @@ bool Zandor::ShowSelectedTable() {
     bool result = false;
     Guard(u"ShowSelectedTable", [&] {
         ZDTableRef current;
-        for (const auto& table : Each(Model().Tables())) {
+        for (const auto model = Model(); const auto& table : Each(model->Tables())) {
             if (!current) current = table;
             if (table->Selected() == 0) continue;
             current = table;
@@ -157,7 +157,7 @@ void Zandor::TerminateTable(std::int16_t Index) {
 
 void Zandor::lstTable_CloseClick(std::int16_t Index) {
     Guard(u"lstTable_CloseClick", [&] {
-        Model().DeleteTable(TableOf(Index));
+        Model()->DeleteTable(TableOf(Index));
         RemoveTable(Index);
         mEvents.Raise(Event::TableDeleted, {});
     });

@@ -9,7 +9,7 @@ using platform::single;
 
 /// The definition tied to a grid column. Error 5 when the model holds none under its key.
 platform::Ref<TalvikZandorLib::ZDColumnDefinition> Zandor::DefinitionOf(std::int32_t column) {
-    return Model().ColumnDefinitions().Item(keyOfNumber(sprColumn->ColData(column)));
+    return Model()->ColumnDefinitions().Item(keyOfNumber(sprColumn->ColData(column)));
 }
 
 void Zandor::SetCell(const String& text, std::int16_t alignment) {
@@ -28,7 +28,7 @@ void Zandor::AddNewAndCriterium(const ZDColumnRef& sourceColumn, std::int32_t co
         definition->Visible(true);
         definition->SortOrder(0);
         definition->Synonym({});
-        const auto stored = Model().AddColumnDefinition(definition);
+        const auto stored = Model()->AddColumnDefinition(definition);
         sprColumn->ColData(column, numberOfKey(stored->Key()));
     });
 }

@@ -64,6 +64,8 @@ bool Zandor::RemoveColumn(std::int32_t column) {
             for (std::int32_t row = 0; row < sprColumn->Rows(); ++row)
                 sprColumn->TextMatrix(row, column, {});
             sprColumn->ColWidth(column, sprColumn->ColWidth(0));
+            // A blank column names no definition, so that an editor over it finds none.
+            sprColumn->ColData(column, 0);
             for (std::int32_t i = column + 1; i <= last; ++i) sprColumn->ColPosition(i, i - 1);
         }
         // The last column has nothing behind it that could close the gap; it stays as it is.
@@ -80,7 +82,7 @@ void Zandor::mnuColumnDefinitionDelete_Click() {
         if (column < 1) return;
         const auto definition = DefinitionOf(column);
         RemoveColumn(column);
-        Model().ColumnDefinitions().Remove(definition->Key());
+        Model()->ColumnDefinitions().Remove(definition->Key());
         mEvents.Raise(Event::ColumnRemoved, {.Definition = definition});
     });
 }

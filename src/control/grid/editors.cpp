@@ -62,7 +62,7 @@ void Zandor::sprColumn_Scroll() {
 
 void Zandor::cmdSetSortOrder_Click() {
     Guard(u"cmdSetSortOrder_Click", [&] {
-        if (Model().ColumnDefinitions().Count() != 0) {
+        if (Model()->ColumnDefinitions().Count() != 0) {
             const auto definition = DefinitionOf(sprColumn->Col());
             definition->SortOrder(cobSortOrder->ListIndex());
             mEvents.Raise(Event::ColumnModified, {.Definition = definition});
@@ -74,7 +74,7 @@ void Zandor::cmdSetSortOrder_Click() {
 
 void Zandor::cmdSetVisibility_Click() {
     Guard(u"cmdSetVisibility_Click", [&] {
-        if (Model().ColumnDefinitions().Count() != 0) {
+        if (Model()->ColumnDefinitions().Count() != 0) {
             const auto definition = DefinitionOf(sprColumn->Col());
             definition->Visible(cobVisibility->ListIndex() == 0);
             mEvents.Raise(Event::ColumnModified, {.Definition = definition});
@@ -86,7 +86,7 @@ void Zandor::cmdSetVisibility_Click() {
 
 void Zandor::cmdSetTextValue_Click() {
     Guard(u"cmdSetTextValue_Click", [&] {
-        if (Model().ColumnDefinitions().Count() != 0) {
+        if (Model()->ColumnDefinitions().Count() != 0) {
             const std::int32_t row = sprColumn->Row();
             const auto definition = DefinitionOf(sprColumn->Col());
             const String text = txtValue->Text();

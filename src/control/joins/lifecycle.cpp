@@ -13,7 +13,7 @@ platform::Ref<TalvikZandorLib::ZDJoin> Zandor::ModelJoin(const clsJoinLine& reco
     const platform::Variant tag = record.Tag();
     const String* const key = std::get_if<String>(&tag);
     if (!key) throw platform::errors::typeMismatch();
-    return Model().Joins().Item(*key);
+    return Model()->Joins().Item(*key);
 }
 
 // The test reads the records' column texts, which a join made on the canvas leaves empty: such a
@@ -84,7 +84,7 @@ void Zandor::AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTa
         // A join drawn by the user always enters the model as a normal one with "=".
         join->JoinType(0);
         join->CompareOperator(0);
-        const auto stored = Model().AddJoin(join);
+        const auto stored = Model()->AddJoin(join);
         record->Tag(stored->Key());
     });
 }
@@ -128,7 +128,7 @@ void Zandor::mnuJoinDelete_Click() {
         if (!JoinHitTest(record, mPopupX, mPopupY)) return;
         const auto join = ModelJoin(*record);
         RemoveJoin(record);
-        Model().Joins().Remove(join->Key());
+        Model()->Joins().Remove(join->Key());
         mEvents.Raise(Event::JoinRemoved, {.Join = join});
     });
 }

@@ -1,0 +1,105 @@
+#include "support/PostgresServer.h"
+
+#include <QDeadlineTimer>
+#include <QDir>
+#include <QSqlError>
+#include <QThread>
+
+#include <stdexcept>
+#include <unistd.h>
+
+namespace {
+
+constexpr int patience = 120'000; // milliseconds; a crowded machine is slow
+
+[[noreturn]] void fail(const QString& what, QProcess& process) {
+    const QString words = QString::fromLocal8Bit(process.readAll()).trimmed();
+    throw std::runtime_error(
+        QStringLiteral("%1 (%2): %3").arg(what, process.errorString(), words).toStdString());
+}
+
+/// Where Debian keeps the programs, which it does not put into the path: the newest version's.
+QString programOf(const QString& name) {
+    const QDir versions(QStringLiteral("/usr/lib/postgresql"));
+    QString newest;
+    int number = 0;
+    for (const QString& version : versions.entryList(QDir::Dirs | QDir::NoDotAndDotDot)) {
+        const QString program = versions.filePath(version + QStringLiteral("/bin/") + name);
+        if (version.toInt() <= number || !QFile::exists(program)) continue;
+        number = version.toInt();
+        newest = program;
+    }
+    return newest.isEmpty() ? name : newest;
+}
+
+} // namespace
+
+// Not in TMPDIR: the path of a socket has to be short.
+PostgresServer::PostgresServer() : mDirectory(QStringLiteral("/tmp/zandor-postgres-XXXXXX")) {
+    if (!mDirectory.isValid()) throw std::runtime_error(mDirectory.errorString().toStdString());
+    makeDirectory();
+    const QString home = mDirectory.path();
+    launch(mServer, QStringLiteral("postgres"),
+           {QStringLiteral("-D"), home + QStringLiteral("/data"), QStringLiteral("-k"), home,
+            QStringLiteral("-c"), QStringLiteral("listen_addresses="), QStringLiteral("-c"),
+            QStringLiteral("fsync=off")});
+    waitUntilItAnswers();
+}
+
+PostgresServer::~PostgresServer() {
+    if (mServer.state() == QProcess::NotRunning) return;
+    kill(static_cast<pid_t>(mServer.processId()), SIGINT); // ends the sessions that there are
+    if (!mServer.waitForFinished(patience)) mServer.kill();
+    mServer.waitForFinished();
+}
+
+void PostgresServer::launch(QProcess& process, const QString& program,
+                            const QStringList& arguments) const {
+    QStringList line{QStringLiteral("--pdeathsig"), QStringLiteral("INT")};
+    if (geteuid() == 0)
+        line += {QStringLiteral("--reuid=postgres"), QStringLiteral("--regid=postgres"),
+                 QStringLiteral("--init-groups")};
+    line += {QStringLiteral("--"), programOf(program)};
+    process.setProcessChannelMode(QProcess::MergedChannels);
+    process.setWorkingDirectory(mDirectory.path());
+    process.start(QStringLiteral("setpriv"), line + arguments);
+    if (!process.waitForStarted()) fail(QStringLiteral("setpriv did not start"), process);
+}
+
+void PostgresServer::makeDirectory() {
+    if (geteuid() == 0) {
+        QProcess chown;
+        chown.start(QStringLiteral("chown"), {QStringLiteral("postgres"), mDirectory.path()});
+        if (!chown.waitForFinished() || chown.exitCode() != 0)
+            fail(QStringLiteral("The directory could not be given to the user postgres"), chown);
+    }
+    QProcess initdb;
+    launch(initdb, QStringLiteral("initdb"),
+           {QStringLiteral("--pgdata=") + mDirectory.filePath(QStringLiteral("data")),
+            QStringLiteral("--locale=C"), QStringLiteral("--encoding=UTF8"),
+            QStringLiteral("--auth=trust"), QStringLiteral("--username=postgres"),
+            QStringLiteral("--no-sync")});
+    if (!initdb.waitForFinished(patience) || initdb.exitCode() != 0)
+        fail(QStringLiteral("initdb failed; is the package postgresql installed?"), initdb);
+}
+
+void PostgresServer::waitUntilItAnswers() {
+    const QDeadlineTimer end(patience);
+    const QString probe = QStringLiteral("postgres-probe");
+    for (bool answers = false; !answers;) {
+        if (mServer.waitForFinished(0) || end.hasExpired())
+            fail(QStringLiteral("The PostgreSQL server does not answer"), mServer);
+        QThread::msleep(50);
+        answers = connect(probe).isOpen();
+        QSqlDatabase::removeDatabase(probe);
+    }
+}
+
+QSqlDatabase PostgresServer::connect(const QString& connectionName) const {
+    QSqlDatabase database = QSqlDatabase::addDatabase(QStringLiteral("QPSQL"), connectionName);
+    database.setHostName(mDirectory.path());
+    database.setUserName(QStringLiteral("postgres"));
+    database.setDatabaseName(QStringLiteral("postgres"));
+    database.open();
+    return database;
+}
