@@ -67,7 +67,7 @@ private:
         else if (*number > last)
             fault(path, "is beyond the last key " + std::to_string(last) + " of its kind");
         else if (!mKeys.insert(key).second)
-            fault(path, "is a key that stands before already");
+            fault(path, "is used before already");
     }
 
     void table(const TableRecord& table, const std::string& path) {

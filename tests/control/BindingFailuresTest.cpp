@@ -82,10 +82,9 @@ TEST_F(AModelThatFails, CanBeBoundAgainOnceItWorks) {
 }
 
 TEST_F(AModelThatFails, WithItsJoinsEndsTheBindingBeforeTheGrid) {
-    for (const char* member :
-         {"Zandor.Joins", "Joins.Count", "Joins.Item(position)", "ZDJoin.LeftTable",
-          "ZDJoin.LeftColumn", "ZDJoin.RightTable", "ZDJoin.RightColumn", "ZDJoin.JoinType",
-          "ZDJoin.CompareOperator"}) {
+    for (const char* member : {"Zandor.Joins", "Joins.Count", "Joins.Item(position)",
+                               "ZDJoin.LeftTable", "ZDJoin.LeftColumn", "ZDJoin.RightTable",
+                               "ZDJoin.RightColumn", "ZDJoin.JoinType", "ZDJoin.CompareOperator"}) {
         bind(library.newModel());
         forget();
         fail(member);
@@ -115,9 +114,8 @@ TEST_F(AModelThatFails, WithAJoinOfNothingReportsAnUnsetObject) {
 
 TEST_F(AModelThatFails, WithItsDefinitionsKeepsTablesAndJoins) {
     for (const char* member :
-         {"Zandor.ColumnDefinitions", "ColumnDefinitions.Count",
-          "ColumnDefinitions.Item(position)", "ZDColumnDefinition.Column",
-          "ZDColumnDefinition.Synonym", "ZDColumnDefinition.SortOrder",
+         {"Zandor.ColumnDefinitions", "ColumnDefinitions.Count", "ColumnDefinitions.Item(position)",
+          "ZDColumnDefinition.Column", "ZDColumnDefinition.Synonym", "ZDColumnDefinition.SortOrder",
           "ZDColumnDefinition.Visible", "ZDColumnDefinition.Criteria", "Criteria.Count",
           "Criteria.Item(position)", "ZDCriterium.Criterium"}) {
         bind(library.newModel());

@@ -32,10 +32,15 @@ protected:
     platform::Ref<fake::Table> orders, customers, items;
 };
 
-const char* const menuEntries[] = {
-    "mnuJoinShowDefinition",    "mnuJoinDelete",           "mnuJoinSep",
-    "mnuTableDefinitionCopy",   "mnuTableDefinitionPaste", "mnuTableDefinitionDelete",
-    "mnuTableDefinitionSep",    "mnuColumnDefinitionPaste", "mnuColumnDefinitionDelete"};
+const char* const menuEntries[] = {"mnuJoinShowDefinition",
+                                   "mnuJoinDelete",
+                                   "mnuJoinSep",
+                                   "mnuTableDefinitionCopy",
+                                   "mnuTableDefinitionPaste",
+                                   "mnuTableDefinitionDelete",
+                                   "mnuTableDefinitionSep",
+                                   "mnuColumnDefinitionPaste",
+                                   "mnuColumnDefinitionDelete"};
 
 } // namespace
 
@@ -90,9 +95,8 @@ TEST_F(Binding, EndsTheJoinsAtOneToATableThatIsNotShown) {
     large->join(tables[0], u"ID", tables[1], u"ID");
     large->definition(tables[0], u"ID");
     bind(large);
-    EXPECT_EQ(stage->boxes,
-              (std::vector{objectNotSet(u"FindColumn"), objectNotSet(u"DrawNewJoin"),
-                           objectNotSet(u"SetZandor")}));
+    EXPECT_EQ(stage->boxes, (std::vector{objectNotSet(u"FindColumn"), objectNotSet(u"DrawNewJoin"),
+                                         objectNotSet(u"SetZandor")}));
     EXPECT_EQ(Backstage::mJoinLines(zandor()).Count(), 0);
     EXPECT_EQ(stage->cell(0, 1), u"") << "the grid is not filled any more";
     EXPECT_TRUE(look("lstTable(16)").visible) << "what was shown before stays";
@@ -165,15 +169,11 @@ TEST_F(Binding, ShowsTheMenuEntriesThatTheHostWants) {
     bind(model);
     for (const char* entry : menuEntries) EXPECT_TRUE(look(entry).visible) << entry;
 
-    bool TalvikDBxZandor::Zandor::* const flags[] = {
-        &TalvikDBxZandor::Zandor::LNGMnuShowJoinDefVis,
-        &TalvikDBxZandor::Zandor::LNGMnuDelJoinVis,
-        &TalvikDBxZandor::Zandor::LNGMnuSep1Vis,
-        &TalvikDBxZandor::Zandor::LNGMnuCopyColVis,
-        &TalvikDBxZandor::Zandor::LNGMnuCreateJoinVis,
-        &TalvikDBxZandor::Zandor::LNGMnuDelTableVis,
-        &TalvikDBxZandor::Zandor::LNGMnuSep2Vis,
-        &TalvikDBxZandor::Zandor::LNGMnuPasteColVis,
+    bool TalvikDBxZandor::Zandor::*const flags[] = {
+        &TalvikDBxZandor::Zandor::LNGMnuShowJoinDefVis, &TalvikDBxZandor::Zandor::LNGMnuDelJoinVis,
+        &TalvikDBxZandor::Zandor::LNGMnuSep1Vis,        &TalvikDBxZandor::Zandor::LNGMnuCopyColVis,
+        &TalvikDBxZandor::Zandor::LNGMnuCreateJoinVis,  &TalvikDBxZandor::Zandor::LNGMnuDelTableVis,
+        &TalvikDBxZandor::Zandor::LNGMnuSep2Vis,        &TalvikDBxZandor::Zandor::LNGMnuPasteColVis,
         &TalvikDBxZandor::Zandor::LNGMnuDelColVis};
     for (std::size_t hidden = 0; hidden < std::size(flags); ++hidden) {
         zandor().*flags[hidden] = false;

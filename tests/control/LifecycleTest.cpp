@@ -20,10 +20,9 @@ TEST_F(ANewControl, HasSixteenFreeTableSlotsAndSixtyFourFreeJoinSlots) {
 }
 
 TEST_F(ANewControl, HasTheRowTitlesInItsGrid) {
-    const StringView titles[] = {u"Field:", u"Synonym:", u"Sort:", u"Visible:", u"Criteria:",
-                                 u"Or:", u""};
-    for (std::int32_t row = 0; row < 7; ++row)
-        EXPECT_EQ(stage->cell(row, 0), titles[row]);
+    const StringView titles[] = {u"Field:",    u"Synonym:", u"Sort:", u"Visible:",
+                                 u"Criteria:", u"Or:",      u""};
+    for (std::int32_t row = 0; row < 7; ++row) EXPECT_EQ(stage->cell(row, 0), titles[row]);
 }
 
 TEST_F(ANewControl, HidesItsGrid) {
@@ -39,8 +38,8 @@ TEST_F(ANewControl, HoldsNoModelAndShowsNoTable) {
 }
 
 TEST_F(ANewControl, OffersTheChoicesOfItsCellEditors) {
-    EXPECT_EQ(look("cobSortOrder").items, (std::vector<String>{u"(None)", u"Ascending",
-                                                               u"Descending"}));
+    EXPECT_EQ(look("cobSortOrder").items,
+              (std::vector<String>{u"(None)", u"Ascending", u"Descending"}));
     EXPECT_EQ(look("cobVisibility").items, (std::vector<String>{u"Visible", u"Not Visible"}));
     for (const char* button : {"cmdSetSortOrder", "cmdSetVisibility", "cmdSetTextValue"})
         EXPECT_EQ(look(button).text, u"&Set") << button;

@@ -138,7 +138,8 @@ TEST_F(SelectingByName, MayEndWithSeveralColumnsOfOneNameSelected) {
 TEST_F(SelectingByName, ReachesModelTablesThatAreNotShown) {
     const auto large = library.newModel();
     platform::Ref<fake::Table> last;
-    for (int n = 1; n <= 17; ++n) last = large->table(u"T" + platform::decimal(n), {u"ID", u"NAME"});
+    for (int n = 1; n <= 17; ++n)
+        last = large->table(u"T" + platform::decimal(n), {u"ID", u"NAME"});
     bind(large);
     zandor().SelectColumnNames(u"T17", u"NAME");
     EXPECT_EQ(columnsSelected(*last), (Flags{false, true}));

@@ -63,8 +63,8 @@ TEST(ConversionToSixteenBits, ReachesBothEndsOfItsRange) {
 }
 
 TEST(ConversionToSixteenBits, OverflowsOutsideItsRange) {
-    for (const double value : {32767.5, 32768.0, -32768.51, -32769.0, 1e300, infinity, -infinity,
-                               notANumber})
+    for (const double value :
+         {32767.5, 32768.0, -32768.51, -32769.0, 1e300, infinity, -infinity, notANumber})
         EXPECT_EQ(errorNumber([&] { toInteger(value); }), 6) << value;
 }
 

@@ -19,6 +19,7 @@ std::string houseOf(const std::string& file) {
     if (startsWith("platform/qt/")) return "qt";
     if (startsWith("platform/")) return "platform";
     if (startsWith("model/reader/")) return "reader";
+    if (startsWith("model/files/")) return "files";
     if (startsWith("model/")) return "model";
     if (startsWith("designer/")) return "designer";
     return "control";
@@ -31,7 +32,8 @@ const std::map<std::string, Houses> mayInclude = {
     {"qt", {"qt", "control", "platform"}},
     {"model", {"model", "platform"}},
     {"reader", {"reader", "model", "platform"}},
-    {"designer", {"designer", "reader", "model", "qt", "control", "platform"}},
+    {"files", {"files", "model", "platform"}},
+    {"designer", {"designer", "files", "reader", "model", "qt", "control", "platform"}},
 };
 
 /// The houses that use the standard library and nothing else.

@@ -150,10 +150,10 @@ TEST_F(AToolkitThatFails, InTheLayoutLeavesTheControlsAsFarAsTheyWerePlaced) {
 
 TEST_F(AToolkitThatFails, AtAnyStepOfTheLayoutIsReportedAsTheLayout) {
     zandor().OnlyJoin(false);
-    for (const char* call : {"ScaleWidth", "hsbTable.Max=", "fraTable.setBounds",
-                             "sprColumn.setBounds", "vsbTable.bounds", "vsbTable.setBounds",
-                             "hsbTable.setBounds", "cmdHome.setBounds", "ScaleHeight",
-                             "vsbTable.Max="}) {
+    for (const char* call :
+         {"ScaleWidth", "hsbTable.Max=", "fraTable.setBounds", "sprColumn.setBounds",
+          "vsbTable.bounds", "vsbTable.setBounds", "hsbTable.setBounds", "cmdHome.setBounds",
+          "ScaleHeight", "vsbTable.Max="}) {
         fail(call);
         zandor().UserControl_Resize();
         EXPECT_FALSE(faults().isArmed(call)) << call;
@@ -264,6 +264,6 @@ TEST_F(AToolkitThatFails, WithAMessageBoxLeavesTheCallerUnharmed) {
 TEST_F(AToolkitThatFails, ForLackOfMemoryIsReportedAsSuch) {
     faults().failNext("hsbTable.Max", std::bad_alloc());
     EXPECT_EQ(zandor().HorizMaxScrollPos(), 0);
-    EXPECT_EQ(stage->boxes, std::vector{unexpected(u"P_GET HorizMaxScrollPos", u"7",
-                                                   u"Out of memory")});
+    EXPECT_EQ(stage->boxes,
+              std::vector{unexpected(u"P_GET HorizMaxScrollPos", u"7", u"Out of memory")});
 }

@@ -5,7 +5,9 @@
 #include <QSqlError>
 #include <QThread>
 
+#include <csignal>
 #include <stdexcept>
+
 #include <unistd.h>
 
 namespace {

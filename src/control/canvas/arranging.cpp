@@ -39,8 +39,11 @@ void Zandor::lstTable_Moving(std::int16_t) {
 void Zandor::lstTable_Moved(std::int16_t Index) {
     Guard(u"lstTable_Moved", [&] {
         const Ref<Tabulet> table = lstTable(Index);
-        if (table->Top() < -fraTable->Top()) table->Top(-fraTable->Top());
-        if (table->Left() < -fraTable->Left()) table->Left(-fraTable->Left());
+        // Not negated, which would hand a host -0 as the place of the edge.
+        const float visibleTop = 0 - fraTable->Top();
+        const float visibleLeft = 0 - fraTable->Left();
+        if (table->Top() < visibleTop) table->Top(visibleTop);
+        if (table->Left() < visibleLeft) table->Left(visibleLeft);
         // The lower limit reckons with the grid's top, not its height; it comes last and wins.
         float bottom = single(mToolkit.ScaleHeight() - sprColumn->Top());
         bottom = single(single(bottom - fraTable->Top()) - 600);

@@ -50,7 +50,12 @@ public:
     virtual Result<std::vector<ForeignKey>> foreignKeys(const TableId& child) = 0;
 };
 
-/// Reads from an open database, which stays open as long as the reader is used.
+/// Readers of an open database, which stays open as long as the reader is used.
 std::unique_ptr<DatabaseReader> makeSqliteReader(const QSqlDatabase& database);
+std::unique_ptr<DatabaseReader> makePostgresReader(const QSqlDatabase& database);
+/// Knows of any engine what its Qt driver tells: tables, columns, primary keys; no foreign keys.
+std::unique_ptr<DatabaseReader> makeGenericReader(const QSqlDatabase& database);
+/// The one for the database's engine.
+std::unique_ptr<DatabaseReader> makeReader(const QSqlDatabase& database);
 
 } // namespace reader

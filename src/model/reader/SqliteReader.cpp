@@ -1,23 +1,11 @@
 #include "model/reader/DatabaseReader.h"
 
 #include "model/reader/columnType.h"
-#include "model/reader/sqliteError.h"
-
-#include <QSqlQuery>
-#include <QVariant>
-
-#include <functional>
-#include <optional>
+#include "model/reader/rows.h"
 
 namespace reader {
 
 namespace {
-
-QString toQt(const String& text) { return QString::fromStdU16String(text); }
-
-String textAt(const QSqlQuery& query, int column) {
-    return query.value(column).toString().toStdU16String();
-}
 
 /// The pragmas as tables, for as such they take a name as a bound parameter, whatever characters it
 /// has.
@@ -33,40 +21,22 @@ private:
     static QString schemaOf(const TableId& id) {
         return id.schema.empty() ? QStringLiteral("main") : toQt(id.schema);
     }
-    /// Calls `use` for every row; the error when the statement fails.
-    std::optional<Error> read(const QString& what, const QString& statement,
-                              const QVariantList& parameters,
-                              const std::function<void(const QSqlQuery&)>& use) const;
     Result<std::vector<String>> primaryKey(const TableId& id) const;
 
     QSqlDatabase mDatabase;
 };
 
-std::optional<Error> SqliteReader::read(const QString& what, const QString& statement,
-                                        const QVariantList& parameters,
-                                        const std::function<void(const QSqlQuery&)>& use) const {
-    QSqlQuery query(mDatabase);
-    query.setForwardOnly(true);
-    bool done = query.prepare(statement);
-    for (const QVariant& parameter : parameters) query.addBindValue(parameter);
-    done = done && query.exec();
-    while (done && query.next()) use(query);
-    // A failure between two rows ends the loop like the last row does.
-    if (done && !query.lastError().isValid()) return {};
-    return sqliteError(QStringLiteral("%1 cannot be read").arg(what), query.lastError());
-}
-
 Result<std::vector<TableEntry>> SqliteReader::tables() {
     std::vector<TableEntry> entries;
     const auto error =
-        read(QStringLiteral("The list of tables"),
-             QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list "
-                            "WHERE schema = 'main' AND type IN ('table', 'view', 'virtual') "
-                            "AND name NOT LIKE 'sqlite\\_%' ESCAPE '\\' "
-                            "ORDER BY name COLLATE NOCASE, name"),
-             {}, [&](const QSqlQuery& row) {
-                 entries.push_back({{{}, textAt(row, 0)}, row.value(1).toBool()});
-             });
+        readRows(mDatabase, QStringLiteral("The list of tables"),
+                 QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list "
+                                "WHERE schema = 'main' AND type IN ('table', 'view', 'virtual') "
+                                "AND name NOT LIKE 'sqlite\\_%' ESCAPE '\\' "
+                                "ORDER BY name COLLATE NOCASE, name"),
+                 {}, [&](const QSqlQuery& row) {
+                     entries.push_back({{{}, textAt(row, 0)}, row.value(1).toBool()});
+                 });
     if (error) return *error;
     return entries;
 }
@@ -75,14 +45,15 @@ Result<model::TableDescription> SqliteReader::table(const TableId& id) {
     model::TableDescription description{id.schema, id.name, {}};
     constexpr int hiddenInVirtualTable = 1; // generated columns, 2 and 3, are like any other
     const QString named = QStringLiteral("The table \"%1\"").arg(toQt(id.name));
-    const auto error =
-        read(named, QStringLiteral("SELECT name, type, pk, hidden FROM pragma_table_xinfo(?, ?)"),
-             {toQt(id.name), schemaOf(id)}, [&](const QSqlQuery& row) {
-                 if (row.value(3).toInt() == hiddenInVirtualTable) return;
-                 const String type = textAt(row, 1);
-                 description.columns.push_back(
-                     {textAt(row, 0), columnType(type), type, row.value(2).toInt() > 0});
-             });
+    const auto error = readRows(
+        mDatabase, named,
+        QStringLiteral("SELECT name, type, pk, hidden FROM pragma_table_xinfo(?, ?)"),
+        {toQt(id.name), schemaOf(id)}, [&](const QSqlQuery& row) {
+            if (row.value(3).toInt() == hiddenInVirtualTable) return;
+            const String type = textAt(row, 1);
+            description.columns.push_back(
+                {textAt(row, 0), columnType(type), type, row.value(2).toInt() > 0});
+        });
     if (error) return *error;
     if (description.columns.empty())
         return Error{QStringLiteral("%1 is not in the database; read the list of tables afresh.")
@@ -93,7 +64,7 @@ Result<model::TableDescription> SqliteReader::table(const TableId& id) {
 Result<std::vector<String>> SqliteReader::primaryKey(const TableId& id) const {
     std::vector<String> columns;
     const auto error =
-        read(QStringLiteral("The primary key of \"%1\"").arg(toQt(id.name)),
+        readRows(mDatabase, QStringLiteral("The primary key of \"%1\"").arg(toQt(id.name)),
              QStringLiteral("SELECT name FROM pragma_table_xinfo(?, ?) WHERE pk > 0 ORDER BY pk"),
              {toQt(id.name), schemaOf(id)},
              [&](const QSqlQuery& row) { columns.push_back(textAt(row, 0)); });
@@ -103,8 +74,8 @@ Result<std::vector<String>> SqliteReader::primaryKey(const TableId& id) const {
 
 Result<std::vector<ForeignKey>> SqliteReader::foreignKeys(const TableId& child) {
     std::vector<ForeignKey> keys;
-    const auto error = read(
-        QStringLiteral("The foreign keys of \"%1\"").arg(toQt(child.name)),
+    const auto error = readRows(
+        mDatabase, QStringLiteral("The foreign keys of \"%1\"").arg(toQt(child.name)),
         // SQLite numbers them backwards.
         QStringLiteral("SELECT seq, \"table\", \"from\", \"to\" FROM pragma_foreign_key_list(?, ?) "
                        "ORDER BY id DESC, seq"),

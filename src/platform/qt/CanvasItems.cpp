@@ -1,7 +1,9 @@
 #include "platform/qt/CanvasItems.h"
 
+#include "platform/qt/CanvasAccessible.h"
 #include "platform/qt/Twips.h"
 
+#include <QLineF>
 #include <QPainter>
 
 #include <algorithm>
@@ -10,6 +12,8 @@
 namespace platform::qt {
 
 namespace {
+
+constexpr int haloWidth = 7; ///< of the shine around a line with the focus, in logical pixels
 
 QPointF pixelPoint(float x, float y) {
     // The rim keeps nonsense coordinates of a host away from integer overflow further down.
@@ -44,36 +48,66 @@ void CanvasItem::setVisible(bool value) {
     if (mCanvas) mCanvas->update(mExtent);
 }
 
-void CanvasItem::changed(const QRegion& extent) {
+void CanvasItem::setFocused(bool value) {
+    if (mFocused == value) return;
+    mFocused = value;
+    changed();
+}
+
+void CanvasItem::changed() {
+    const QRegion extent = area();
     if (mCanvas && mVisible) mCanvas->update(mExtent.united(extent));
     mExtent = extent;
 }
 
-CanvasLine::CanvasLine(Canvas& canvas, QString name) : CanvasItem(canvas, std::move(name)) {
+CanvasLine::CanvasLine(Canvas& canvas, QString name, std::int16_t index, const LineEnds& asked)
+    : CanvasItem(canvas, std::move(name)), mIndex(index), mAsked(asked) {
     canvas.add(*this);
 }
 
-CanvasLine::~CanvasLine() { leave(); }
+CanvasLine::~CanvasLine() {
+    leave();
+    if (mAccessible) QAccessible::deleteAccessibleInterface(mAccessible);
+}
+
+QAccessibleInterface* CanvasLine::accessible() {
+    if (!canvas()) return nullptr;
+    if (!mAccessible)
+        mAccessible = QAccessible::registerAccessibleInterface(makeAccessible(*this, *canvas()));
+    return QAccessible::accessibleInterface(mAccessible);
+}
+
+QPointF CanvasLine::at(double share) const {
+    return QLineF(QPointF(mX1, mY1), QPointF(mX2, mY2)).pointAt(share);
+}
+
+double CanvasLine::distanceTo(QPointF place) const {
+    const QPointF way = at(1) - at(0);
+    const double square = QPointF::dotProduct(way, way);
+    const double share = square > 0 ? QPointF::dotProduct(place - at(0), way) / square : 0;
+    return QLineF(place, at(std::clamp(share, 0.0, 1.0))).length();
+}
 
 void CanvasLine::setEnds(float X1, float Y1, float X2, float Y2) {
+    mEnds = mAsked;
     if (X1 == mX1 && Y1 == mY1 && X2 == mX2 && Y2 == mY2) return;
     mX1 = X1;
     mY1 = Y1;
     mX2 = X2;
     mY2 = Y2;
-    changed(area());
+    changed();
 }
 
 void CanvasLine::BorderWidth(std::int16_t value) {
     if (value == mBorderWidth) return;
     mBorderWidth = value;
-    changed(area());
+    changed();
 }
 
 QRegion CanvasLine::area() const {
     const QPointF from = pixelPoint(mX1, mY1);
     const QPointF way = pixelPoint(mX2, mY2) - from;
-    const qreal margin = mBorderWidth / 2.0 + 1;
+    const qreal margin = (focused() ? haloWidth : mBorderWidth) / 2.0 + 1;
     // A slanting line in pieces: its bounding box would have the tables beside it painted too.
     const qreal thin = std::min(std::abs(way.x()), std::abs(way.y()));
     const int pieces = std::clamp(static_cast<int>(thin / 32), 1, 16);
@@ -90,12 +124,18 @@ QRegion CanvasLine::area() const {
 }
 
 void CanvasLine::paint(QPainter& painter, const QPalette& palette) const {
-    const bool highlighted = mBorderWidth > 1;
+    const bool highlighted = mBorderWidth > 1 || focused();
     const QColor colour =
         highlighted ? palette.color(QPalette::Highlight)
                     : between(palette.color(QPalette::Window),
                               palette.color(QPalette::WindowText), 0.6);
-    painter.setPen(QPen(colour, highlighted ? mBorderWidth : 1.2, Qt::SolidLine, Qt::FlatCap));
+    if (focused()) {
+        QColor halo = palette.color(QPalette::Active, QPalette::Highlight);
+        halo.setAlphaF(0.35F);
+        painter.setPen(QPen(halo, haloWidth, Qt::SolidLine, Qt::FlatCap));
+        painter.drawLine(pixelPoint(mX1, mY1), pixelPoint(mX2, mY2));
+    }
+    painter.setPen(QPen(colour, highlighted ? std::max<qreal>(mBorderWidth, 2) : 1.2, Qt::SolidLine, Qt::FlatCap));
     painter.drawLine(pixelPoint(mX1, mY1), pixelPoint(mX2, mY2));
 }
 
@@ -108,13 +148,20 @@ CanvasShape::~CanvasShape() { leave(); }
 void CanvasShape::setBounds(const Bounds& bounds) {
     if (bounds == mBounds) return;
     mBounds = bounds;
-    changed(area());
+    changed();
 }
 
 void CanvasShape::ShapeStyle(std::int16_t value) {
     if (value == mStyle) return;
     mStyle = value;
-    changed(area());
+    changed();
+}
+
+bool CanvasShape::touches(const CanvasLine& line) const {
+    // The line begins on the mark's edge.
+    const QRectF box = QRectF(mBounds.Left, mBounds.Top, mBounds.Width, mBounds.Height)
+                           .adjusted(-1, -1, 1, 1);
+    return visible() && (box.contains(line.at(0)) || box.contains(line.at(1)));
 }
 
 QRegion CanvasShape::area() const {
@@ -129,8 +176,9 @@ void CanvasShape::paint(QPainter& painter, const QPalette& palette) const {
                      pixelPoint(mBounds.Left + mBounds.Width, mBounds.Top + mBounds.Height));
     const QColor outline = between(palette.color(QPalette::Window),
                                    palette.color(QPalette::WindowText), 0.6);
-    painter.setPen(QPen(outline, 1.2));
-    painter.setBrush(palette.color(QPalette::Base));
+    const QColor focus = palette.color(QPalette::Active, QPalette::Highlight);
+    painter.setPen(QPen(focused() ? focus : outline, 1.2));
+    painter.setBrush(focused() ? focus : palette.color(QPalette::Base));
     const QRectF inner = box.adjusted(0.6, 0.6, -0.6, -0.6);
     if (mStyle == shapeCircle)
         painter.drawEllipse(inner);

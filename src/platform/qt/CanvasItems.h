@@ -2,8 +2,9 @@
 
 #include "platform/Intrinsic.h"
 #include "platform/qt/Canvas.h"
+#include "platform/qt/LineEnds.h"
 
-#include <QPointer>
+#include <QAccessible>
 #include <QRegion>
 #include <QString>
 
@@ -25,6 +26,11 @@ public:
     virtual int layer() const = 0;
     virtual void paint(QPainter& painter, const QPalette& palette) const = 0;
 
+    /// Whether the item is one of the marks at a line's ends.
+    virtual bool touches(const CanvasLine&) const { return false; }
+    /// Shows that the keyboard's focus is on the item.
+    void setFocused(bool value);
+
     /// The canvas is going.
     void detach() { mCanvas = nullptr; }
 
@@ -33,18 +39,23 @@ protected:
     void leave();
     void setVisible(bool value);
     /// To be called after every change of what `paint` draws.
-    void changed(const QRegion& extent);
+    void changed();
+    virtual QRegion area() const = 0;
+    Canvas* canvas() const { return mCanvas; }
+    bool focused() const { return mFocused; }
 
 private:
     Canvas* mCanvas;
     QString mName;
     QRegion mExtent;
     bool mVisible = false;
+    bool mFocused = false;
 };
 
 class CanvasLine final : public platform::Line, public CanvasItem {
 public:
-    CanvasLine(Canvas& canvas, QString name);
+    /// `asked` holds, whenever the ends are set, the entries that they belong to.
+    CanvasLine(Canvas& canvas, QString name, std::int16_t index, const LineEnds& asked);
     ~CanvasLine() override;
 
     float X1() const override { return mX1; }
@@ -56,14 +67,27 @@ public:
     std::int16_t borderWidth() const { return mBorderWidth; }
     void Visible(bool value) override { setVisible(value); }
 
+    std::int16_t index() const { return mIndex; }
+    const LineEnds& ends() const { return mEnds; }
+    /// In twips: the place at a share of the way from the first end.
+    QPointF at(double share) const;
+    /// In twips, from the nearest place of the line.
+    double distanceTo(QPointF place) const;
+    /// What stands for the line in the tree of accessible objects; lives as long as the line.
+    QAccessibleInterface* accessible();
+
     int layer() const override { return 0; }
     void paint(QPainter& painter, const QPalette& palette) const override;
 
 private:
-    QRegion area() const;
+    QRegion area() const override;
 
+    const std::int16_t mIndex;
+    const LineEnds& mAsked;
+    LineEnds mEnds;
     float mX1 = 0, mY1 = 0, mX2 = 0, mY2 = 0;
     std::int16_t mBorderWidth = 1;
+    QAccessible::Id mAccessible = 0;
 };
 
 class CanvasShape final : public platform::Shape, public CanvasItem {
@@ -78,10 +102,11 @@ public:
     void Visible(bool value) override { setVisible(value); }
 
     int layer() const override { return 1; }
+    bool touches(const CanvasLine& line) const override;
     void paint(QPainter& painter, const QPalette& palette) const override;
 
 private:
-    QRegion area() const;
+    QRegion area() const override;
 
     Bounds mBounds;
     std::int16_t mStyle = shapeSquare;

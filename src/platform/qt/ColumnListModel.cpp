@@ -10,6 +10,7 @@ QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid() || index.row() >= rowCount()) return {};
     if (role == Qt::DisplayRole) return text(index.row());
     if (role == markedRole) return marked(index.row());
+    if (role == Qt::AccessibleDescriptionRole && marked(index.row())) return tr("key column");
     return {};
 }
 
@@ -22,7 +23,7 @@ void ColumnListModel::append(const QString& text) {
 
 void ColumnListModel::setMarked(int row, bool marked) {
     mRows[static_cast<std::size_t>(row)].marked = marked;
-    emit dataChanged(index(row), index(row), {markedRole});
+    emit dataChanged(index(row), index(row), {markedRole, Qt::AccessibleDescriptionRole});
 }
 
 void ColumnListModel::clear() {

@@ -6,6 +6,7 @@
 
 #include <QContextMenuEvent>
 #include <QHelpEvent>
+#include <QPointer>
 #include <QScrollBar>
 #include <QWheelEvent>
 
@@ -13,6 +14,7 @@ namespace platform::qt {
 
 ColumnListView::ColumnListView(QWidget* parent) : QListView(parent) {
     setFrameShape(QFrame::NoFrame);
+    setFocusPolicy(Qt::ClickFocus);
     setSelectionMode(ExtendedSelection);
     setEditTriggers(NoEditTriggers);
     setDragDropMode(NoDragDrop);
@@ -88,10 +90,32 @@ void ColumnListView::mouseReleaseEvent(QMouseEvent* event) {
 
 void ColumnListView::mouseDoubleClickEvent(QMouseEvent* event) { mousePressEvent(event); }
 
+void ColumnListView::keyPressEvent(QKeyEvent* event) {
+    if (isMenuKey(*event)) return openMenu();
+    if (mListener && event->key() == Qt::Key_Delete && modifiersOf(*event) == Qt::NoModifier)
+        return mListener->deleteKey(currentIndex().row());
+    const QPointer<ColumnListView> alive = this;
+    const QItemSelection before = selectionModel()->selection();
+    QListView::keyPressEvent(event);
+    const int row = currentIndex().row();
+    if (!mListener || row < 0 || selectionModel()->selection() == before) return;
+    // To the control, selecting is what a press of the mouse has done.
+    const std::int16_t left = buttonState(Qt::LeftButton);
+    mListener->entryPressed(row, left, shiftState(event->modifiers()));
+    if (alive && mListener) mListener->entryReleased(row, left, shiftState(event->modifiers()));
+}
+
 void ColumnListView::contextMenuEvent(QContextMenuEvent* event) {
     // The mouse opens the menu on release; the menu key has no release of its own.
-    if (event->reason() == QContextMenuEvent::Keyboard && mListener && currentIndex().isValid())
-        mListener->entryReleased(currentIndex().row(), buttonState(Qt::RightButton), 0);
+    if (event->reason() == QContextMenuEvent::Keyboard) openMenu();
+}
+
+void ColumnListView::openMenu() {
+    if (!mListener) return;
+    const QModelIndex current = currentIndex();
+    if (current.isValid()) scrollTo(current);
+    const QRect place = current.isValid() ? visualRect(current) : viewport()->rect();
+    mListener->menuKey(current.row(), viewport()->mapToGlobal(place.center()));
 }
 
 void ColumnListView::wheelEvent(QWheelEvent* event) {

@@ -14,6 +14,9 @@ public:
     virtual void entryMoved(int row, std::int16_t buttons, std::int16_t shift) = 0;
     virtual void entryReleased(int row, std::int16_t button, std::int16_t shift) = 0;
     virtual void listScrolled() = 0;
+    /// A key asks for the menu at a place of the screen; the row is -1 in a list without entries.
+    virtual void menuKey(int row, QPoint at) = 0;
+    virtual void deleteKey(int row) = 0;
 };
 
 /// The list of a table's columns. Several entries can be selected and dragged together: a press on
@@ -27,6 +30,7 @@ public:
     int scrolledBy() const { return mScrolledBy; }
 
 protected:
+    void keyPressEvent(QKeyEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
@@ -38,6 +42,7 @@ protected:
 
 private:
     void selectFor(QMouseEvent& event, const QModelIndex& index);
+    void openMenu();
     void measure();
 
     EntryListener* mListener = nullptr;

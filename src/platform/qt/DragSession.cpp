@@ -16,6 +16,26 @@ namespace {
 
 constexpr char columnsMimeType[] = "application/x-talvik-zandor-columns";
 
+/// A barred circle, legible on light and on dark; Qt takes pictures only for the cursors of a drag
+/// over a place that takes drops.
+QPixmap forbiddenCursor() {
+    constexpr int side = 20;
+    const qreal ratio = qApp->devicePixelRatio();
+    QPixmap pixmap(QSize(side, side) * ratio);
+    pixmap.setDevicePixelRatio(ratio);
+    pixmap.fill(Qt::transparent);
+    QPainter painter(&pixmap);
+    painter.setRenderHint(QPainter::Antialiasing);
+    const QRectF circle(4, 4, side - 8, side - 8);
+    const QPointF reach(circle.width() * 0.354, circle.width() * 0.354);
+    for (const auto& [colour, width] : {std::pair{Qt::white, 5.0}, std::pair{Qt::darkRed, 2.5}}) {
+        painter.setPen(QPen(colour, width));
+        painter.drawEllipse(circle);
+        painter.drawLine(circle.center() - reach, circle.center() + reach);
+    }
+    return pixmap;
+}
+
 } // namespace
 
 DragSession::DragSession()
@@ -47,6 +67,7 @@ void DragSession::runRequested() {
     const QPointer<DragSession> alive = this;
     mRunning = true;
     const QPointer<QDrag> drag = new QDrag(widget);
+    mDrag = drag;
     auto* data = new QMimeData;
     data->setData(QLatin1String(columnsMimeType), mIdentity);
     drag->setMimeData(data);
@@ -66,6 +87,10 @@ void DragSession::forget(const Control* source) {
 
 bool DragSession::accepts(const QMimeData* data) const {
     return mRunning && mSource && data && data->data(QLatin1String(columnsMimeType)) == mIdentity;
+}
+
+void DragSession::showWhetherDropCounts(bool counts) {
+    if (mDrag) mDrag->setDragCursor(counts ? QPixmap() : forbiddenCursor(), Qt::CopyAction);
 }
 
 QPixmap DragSession::picture(const QWidget& widget, const QStringList& names) {

@@ -38,6 +38,8 @@ public:
     void forget(const Control* source);
 
     bool accepts(const QMimeData* data) const;
+    /// Gives the running drag the cursor of forbidden places, or takes it back.
+    void showWhetherDropCounts(bool counts);
     Control* source() const { return mSource; }
     /// Keeps the drop until the drag's own event loop has ended: a handler may open message
     /// boxes, which must not stand inside the drag.
@@ -51,6 +53,7 @@ private:
     QStringList mNames;
     Control* mSource = nullptr;
     bool mRunning = false;
+    QPointer<QDrag> mDrag;
     Carrier mCarrier;
     std::function<void()> mDrop;
 };

@@ -1,6 +1,10 @@
 #include "platform/qt/Frames.h"
 
+#include <QComboBox>
+#include <QCoreApplication>
 #include <QHBoxLayout>
+#include <QKeyEvent>
+#include <QLineEdit>
 #include <QPainter>
 
 namespace platform::qt {
@@ -11,7 +15,9 @@ CanvasAdapter::CanvasAdapter(Canvas* widget, FocusTracker& focus, FrameEvents ev
 }
 
 CanvasAdapter::~CanvasAdapter() {
-    if (mWidget) mWidget->setEvents({});
+    if (!mWidget) return;
+    mWidget->setEvents({});
+    mWidget->dragGone();
 }
 
 void CanvasAdapter::ZOrder() {
@@ -26,6 +32,31 @@ RowFrame::RowFrame(QWidget* parent, bool outermost) : QFrame(parent), mOutermost
     row->setContentsMargins(margin, margin, margin, margin);
     row->setSpacing(5);
     if (outermost) hide();
+}
+
+bool RowFrame::event(QEvent* event) {
+    const bool key = event->type() == QEvent::KeyPress || event->type() == QEvent::ShortcutOverride;
+    if (!key || static_cast<QKeyEvent*>(event)->key() != Qt::Key_Escape || !mOutermost)
+        return QFrame::event(event);
+    // From the button beside it, Escape is the input's as well.
+    QWidget* input = findChild<QLineEdit*>();
+    if (!input) input = findChild<QComboBox*>();
+    if (!input) return QFrame::event(event);
+    event->accept();
+    if (event->type() == QEvent::KeyPress) {
+        QKeyEvent escape(event->type(), Qt::Key_Escape, Qt::NoModifier);
+        QCoreApplication::sendEvent(input, &escape);
+    }
+    return true;
+}
+
+void RowFrame::showEvent(QShowEvent* event) {
+    QFrame::showEvent(event);
+    if (!mTitle) return;
+    const QString title = mTitle();
+    setAccessibleName(title);
+    for (auto* input : findChildren<QLineEdit*>()) input->setAccessibleName(title);
+    for (auto* input : findChildren<QComboBox*>()) input->setAccessibleName(title);
 }
 
 void RowFrame::paintEvent(QPaintEvent*) {

@@ -22,13 +22,21 @@ public:
 /// need, until a size is set.
 class RowFrame : public QFrame {
 public:
-    explicit RowFrame(QWidget* parent, bool outermost);
+    /// What the inputs inside are for, asked as the frame is shown.
+    using Title = std::function<QString()>;
+
+    RowFrame(QWidget* parent, bool outermost);
+
+    void setTitle(Title title) { mTitle = std::move(title); }
 
 protected:
+    bool event(QEvent* event) override;
+    void showEvent(QShowEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
 
 private:
     const bool mOutermost;
+    Title mTitle;
 };
 
 class RowFrameAdapter final : public Adapter<platform::Frame, RowFrame> {

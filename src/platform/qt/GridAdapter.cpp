@@ -5,6 +5,7 @@
 #include "platform/qt/Fonts.h"
 #include "platform/qt/GridModel.h"
 #include "platform/qt/KeyCodes.h"
+#include "platform/qt/KeyboardMenu.h"
 #include "platform/qt/Text.h"
 
 namespace platform::qt {
@@ -19,8 +20,8 @@ QRect currentCell(const GridWidget& grid) {
 } // namespace
 
 GridAdapter::GridAdapter(GridWidget* widget, FocusTracker& focus, DragSession& drags,
-                         MSFlexGridLib::GridEvents events)
-    : Adapter(widget, focus), mDrags(drags), mEvents(std::move(events)) {
+                         KeyboardMenu& menu, MSFlexGridLib::GridEvents events)
+    : Adapter(widget, focus), mDrags(drags), mMenu(menu), mEvents(std::move(events)) {
     widget->setListener(this);
     widget->hide();
 }
@@ -153,6 +154,20 @@ void GridAdapter::released(Qt::MouseButton button, Qt::KeyboardModifiers modifie
 
 void GridAdapter::scrolled() {
     if (mEvents.Scroll) mEvents.Scroll();
+}
+
+void GridAdapter::menuKey(QPointF at, QPoint screen) {
+    mMenu.openAt(screen, [&] { clickWithRightButton(at); });
+}
+
+void GridAdapter::deleteKey(QPointF at) {
+    mMenu.choose(menuentry::deleteColumn, [&] { clickWithRightButton(at); });
+}
+
+void GridAdapter::clickWithRightButton(QPointF at) {
+    const QPointer<GridWidget> alive = mWidget;
+    pressed(Qt::RightButton, Qt::NoModifier, at);
+    if (alive) released(Qt::RightButton, Qt::NoModifier, at);
 }
 
 bool GridAdapter::dragAccepted(const QMimeData* data) { return mDrags.accepts(data); }

@@ -7,11 +7,12 @@
 namespace platform::qt {
 
 class DragSession;
+class KeyboardMenu;
 
 class GridAdapter final : public Adapter<MSFlexGridLib::MSFlexGrid, GridWidget>,
                           private GridListener {
 public:
-    GridAdapter(GridWidget* widget, FocusTracker& focus, DragSession& drags,
+    GridAdapter(GridWidget* widget, FocusTracker& focus, DragSession& drags, KeyboardMenu& menu,
                 MSFlexGridLib::GridEvents events);
     ~GridAdapter() override;
 
@@ -49,6 +50,9 @@ private:
     void pressed(Qt::MouseButton button, Qt::KeyboardModifiers modifiers, QPointF at) override;
     void released(Qt::MouseButton button, Qt::KeyboardModifiers modifiers, QPointF at) override;
     void scrolled() override;
+    void menuKey(QPointF at, QPoint screen) override;
+    void deleteKey(QPointF at) override;
+    void clickWithRightButton(QPointF at);
     bool dragAccepted(const QMimeData* data) override;
     bool dropped(const QMimeData* data, QPointF at) override;
 
@@ -59,6 +63,7 @@ private:
     void mustBeCell(std::int32_t row, std::int32_t col) const;
 
     DragSession& mDrags;
+    KeyboardMenu& mMenu;
     const MSFlexGridLib::GridEvents mEvents;
 };
 

@@ -1,5 +1,6 @@
 #include "platform/qt/GridCorner.h"
 
+#include "platform/qt/GridCells.h"
 #include "platform/qt/GridModel.h"
 
 #include <QStyleOptionHeader>
@@ -21,7 +22,7 @@ void GridCorner::paintEvent(QPaintEvent*) {
     option.position = QStyleOptionHeader::OnlyOneSection;
     option.text = mModel.text(0, 0);
     option.textAlignment = Qt::AlignLeft | Qt::AlignVCenter;
-    painter.drawControl(QStyle::CE_Header, option);
+    paintFixedCell(painter, option, *this);
 }
 
 } // namespace platform::qt

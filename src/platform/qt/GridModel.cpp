@@ -48,8 +48,22 @@ QVariant GridModel::valueOf(const Cell& cell, int role) {
     return {};
 }
 
+QString GridModel::titleOf(int row, int col) const {
+    // Rows without a title of their own go on with the one above.
+    int titled = row;
+    while (titled > 0 && text(titled, 0).isEmpty()) --titled;
+    const QString& field = text(0, col);
+    return text(titled, 0) + QStringLiteral(", ") +
+           (field.isEmpty() ? tr("column %1").arg(col) : field);
+}
+
 QVariant GridModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid()) return {};
+    if (role == Qt::AccessibleTextRole) {
+        const QString& written = text(index.row() + 1, index.column() + 1);
+        const QString title = titleOf(index.row() + 1, index.column() + 1);
+        return written.isEmpty() ? title : title + QStringLiteral(": ") + written;
+    }
     return valueOf(cell(index.row() + 1, index.column() + 1), role);
 }
 

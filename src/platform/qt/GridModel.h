@@ -27,6 +27,9 @@ public:
     /// Moves a column with all it has; those in between shift by one.
     void move(int from, int to);
 
+    /// A cell as it is spoken, without its text: the row's title and the column's field.
+    QString titleOf(int row, int col) const;
+
     /// Tells the views to show everything afresh.
     void announce();
 

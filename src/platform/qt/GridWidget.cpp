@@ -1,10 +1,13 @@
 #include "platform/qt/GridWidget.h"
 
 #include "platform/qt/ElisionToolTip.h"
+#include "platform/qt/GridCells.h"
 #include "platform/qt/GridCorner.h"
 #include "platform/qt/GridModel.h"
+#include "platform/qt/KeyCodes.h"
 #include "platform/qt/Twips.h"
 
+#include <QContextMenuEvent>
 #include <QDropEvent>
 #include <QHeaderView>
 #include <QHelpEvent>
@@ -38,6 +41,10 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
       mCorner(new GridCorner(*mModel, mView)) {
     setAcceptDrops(true);
     setFocusProxy(mView);
+    mView->setFocusPolicy(Qt::ClickFocus);
+    mView->setAccessibleName(tr("Output columns"));
+    mView->setVerticalHeader(new RowTitles(mView));
+    mView->setItemDelegate(new GridCellDelegate(*mView));
     mView->setModel(mModel);
     mView->setFrameShape(QFrame::NoFrame);
     mView->setEditTriggers(QTableView::NoEditTriggers);
@@ -184,6 +191,13 @@ bool GridWidget::eventFilter(QObject* watched, QEvent* event) {
     case QEvent::KeyPress:
         if (part == mView) return keyPressed(*static_cast<QKeyEvent*>(event));
         break;
+    case QEvent::ContextMenu:
+        // The mouse opens the menu on release; the menu key has no release of its own.
+        if (part != mView ||
+            static_cast<QContextMenuEvent*>(event)->reason() != QContextMenuEvent::Keyboard)
+            break;
+        openMenu();
+        return true;
     case QEvent::ToolTip:
         if (part != mView) return toolTip(part, *static_cast<QHelpEvent*>(event));
         break;
@@ -208,16 +222,38 @@ bool GridWidget::mouse(QWidget* part, QMouseEvent* event) {
     return body;
 }
 
+QPointF GridWidget::middleOfCurrentCell() {
+    bringUpToDate();
+    if (mView->currentIndex().isValid()) mView->scrollTo(mView->currentIndex());
+    return QRectF(cellRect(mRow, mCol)).center();
+}
+
 bool GridWidget::keyPressed(const QKeyEvent& event) {
+    if (!mListener) return false;
+    const bool plain = modifiersOf(event) == Qt::NoModifier;
+    if (isMenuKey(event)) {
+        openMenu();
+        return true;
+    }
+    if (event.key() == Qt::Key_Delete && plain) {
+        mListener->deleteKey(middleOfCurrentCell());
+        return true;
+    }
     const bool opens = event.key() == Qt::Key_F2 || event.key() == Qt::Key_Return ||
                        event.key() == Qt::Key_Enter;
-    if (!opens || !mListener) return false;
+    if (!opens) return false;
     // For the keyboard, what a click on the current cell is for the mouse.
-    const QPointF middle = QRectF(cellRect(mRow, mCol)).center();
+    const QPointF middle = middleOfCurrentCell();
     const QPointer<GridWidget> alive = this;
     mListener->pressed(Qt::LeftButton, Qt::NoModifier, middle);
     if (alive && mListener) mListener->released(Qt::LeftButton, Qt::NoModifier, middle);
     return true;
+}
+
+void GridWidget::openMenu() {
+    if (!mListener) return;
+    const QPointF middle = middleOfCurrentCell();
+    mListener->menuKey(middle, mapToGlobal(middle.toPoint()));
 }
 
 bool GridWidget::toolTip(QWidget* part, const QHelpEvent& help) {

@@ -17,6 +17,9 @@ public:
     virtual void released(Qt::MouseButton button, Qt::KeyboardModifiers modifiers,
                           QPointF at) = 0;
     virtual void scrolled() = 0;
+    /// A key asks for the menu of the cell around `at`; it is to open at a place of the screen.
+    virtual void menuKey(QPointF at, QPoint screen) = 0;
+    virtual void deleteKey(QPointF at) = 0;
     virtual bool dragAccepted(const QMimeData* data) = 0;
     virtual bool dropped(const QMimeData* data, QPointF at) = 0;
 };
@@ -63,6 +66,9 @@ private:
     void fitLabels();
     bool mouse(QWidget* part, QMouseEvent* event);
     bool keyPressed(const QKeyEvent& event);
+    void openMenu();
+    /// Brings the current cell into view.
+    QPointF middleOfCurrentCell();
     bool toolTip(QWidget* part, const QHelpEvent& help);
 
     GridListener* mListener = nullptr;

@@ -1,5 +1,7 @@
 #include "platform/qt/HomeButton.h"
 
+#include "platform/qt/FocusFrame.h"
+
 #include <QPainter>
 #include <QPainterPath>
 #include <QStyleOptionToolButton>
@@ -10,7 +12,7 @@
 namespace platform::qt {
 
 HomeButton::HomeButton(QWidget* parent) : QToolButton(parent) {
-    setFocusPolicy(Qt::StrongFocus);
+    setFocusPolicy(Qt::ClickFocus);
     setToolTip(tr("Back to the origin"));
     setAccessibleName(toolTip());
     setAutoFillBackground(true);
@@ -20,7 +22,9 @@ void HomeButton::paintEvent(QPaintEvent*) {
     QStylePainter painter(this);
     QStyleOptionToolButton option;
     initStyleOption(&option);
+    option.state &= ~QStyle::State_HasFocus; // too small for the style's own frame
     painter.drawComplexControl(QStyle::CC_ToolButton, option);
+    if (hasFocus()) paintFocusFrame(painter, rect(), palette());
 
     // An arrow into the upper left corner.
     const qreal side = std::min({width(), height(), 20}) - 5.0;

@@ -32,6 +32,24 @@ std::int16_t keyCode(const QKeyEvent& event) {
     }
 }
 
+bool isMenuKey(const QKeyEvent& event) {
+    return event.key() == Qt::Key_F10 && modifiersOf(event) == Qt::ShiftModifier;
+}
+
+Qt::KeyboardModifiers modifiersOf(const QKeyEvent& event) {
+    return event.modifiers() & ~Qt::KeypadModifier;
+}
+
+QPoint arrowOf(const QKeyEvent& event) {
+    switch (event.key()) {
+    case Qt::Key_Left: return {-1, 0};
+    case Qt::Key_Right: return {1, 0};
+    case Qt::Key_Up: return {0, -1};
+    case Qt::Key_Down: return {0, 1};
+    default: return {};
+    }
+}
+
 std::int16_t shiftState(Qt::KeyboardModifiers modifiers) {
     return static_cast<std::int16_t>((modifiers & Qt::ShiftModifier ? 1 : 0) +
                                      (modifiers & Qt::ControlModifier ? 2 : 0) +

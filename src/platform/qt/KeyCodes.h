@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QEvent>
+#include <QPoint>
 
 #include <cstdint>
 
@@ -10,6 +11,15 @@ namespace platform::qt {
 
 /// The classic code of a key; 0 for a key that has none.
 std::int16_t keyCode(const QKeyEvent& event);
+
+/// The keys that open the context menu where the window system does not say so itself.
+bool isMenuKey(const QKeyEvent& event);
+
+/// The modifiers held, without the mark of the numeric pad's keys.
+Qt::KeyboardModifiers modifiersOf(const QKeyEvent& event);
+
+/// The unit step of an arrow key, right and down positive; null for any other key.
+QPoint arrowOf(const QKeyEvent& event);
 
 std::int16_t shiftState(Qt::KeyboardModifiers modifiers);
 

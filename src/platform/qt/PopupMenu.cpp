@@ -32,8 +32,9 @@ private:
 
 } // namespace
 
-PopupMenuAdapter::PopupMenuAdapter(QWidget& surface, const Design& design, PlainEvent Click)
-    : mSurface(surface), mClick(std::move(Click)) {
+PopupMenuAdapter::PopupMenuAdapter(QWidget& surface, KeyboardMenu& keys, const Design& design,
+                                   PlainEvent Click)
+    : mSurface(surface), mKeys(keys), mClick(std::move(Click)) {
     mMenu.setObjectName(toQt(design.Name));
 }
 
@@ -46,12 +47,25 @@ std::unique_ptr<MenuEntry> PopupMenuAdapter::makeEntry(const Design& design, Pla
     return entry;
 }
 
-void PopupMenuAdapter::PopupMenuAtMouse() {
-    if (mClick) mClick();
+QAction* PopupMenuAdapter::chosenByKey(const QString& name) const {
+    for (const auto& [action, handler] : mHandlers)
+        if (action->objectName() == name && action->isEnabled() && action->isVisible())
+            return action;
+    return nullptr;
+}
+
+QAction* PopupMenuAdapter::chosenByUser(std::optional<QPoint> at) {
     // The menu has no parent, so it does not follow the widget's looks by itself.
     mMenu.setPalette(mSurface.palette());
     mMenu.setFont(mSurface.font());
-    const QAction* chosen = mMenu.exec(QCursor::pos());
+    return mMenu.exec(at.value_or(QCursor::pos()));
+}
+
+void PopupMenuAdapter::PopupMenuAtMouse() {
+    const KeyboardMenu::Request request = mKeys.take();
+    if (mClick) mClick();
+    const QAction* chosen =
+        request.entry.isEmpty() ? chosenByUser(request.at) : chosenByKey(request.entry);
     if (!chosen) return;
     for (const auto& [action, handler] : mHandlers) {
         if (action != chosen) continue;

@@ -1,11 +1,13 @@
 #include "platform/qt/QtToolkit.h"
 
 #include "platform/RuntimeError.h"
+#include "platform/qt/CanvasAccessible.h"
 #include "platform/qt/CanvasItems.h"
 #include "platform/qt/Dialog.h"
 #include "platform/qt/Fonts.h"
 #include "platform/qt/Frames.h"
 #include "platform/qt/GridAdapter.h"
+#include "platform/qt/GridModel.h"
 #include "platform/qt/HomeButton.h"
 #include "platform/qt/Inputs.h"
 #include "platform/qt/MessageBox.h"
@@ -38,7 +40,9 @@ Canvas& canvasOf(const Design& design) {
 
 } // namespace
 
-QtToolkit::QtToolkit(QWidget& surface) : mSurface(surface), mFocus(surface) {}
+QtToolkit::QtToolkit(QWidget& surface) : mSurface(surface), mFocus(surface) {
+    installAccessibleObjects();
+}
 
 QWidget* QtToolkit::parentOf(const Design& design) const {
     WidgetHolder* holder = holderOf(design);
@@ -51,6 +55,9 @@ template <class AdapterType, class W, class... Arguments>
 std::unique_ptr<AdapterType> QtToolkit::adapt(const Design& design, Role role, W* widget,
                                               Arguments&&... arguments) {
     widget->setObjectName(toQt(design.Name));
+    // Within the control, Tab goes the way of the navigation; to the window it is a single stop.
+    if (mSurface.isAncestorOf(widget) && widget->focusPolicy() & Qt::TabFocus)
+        widget->setFocusPolicy(Qt::ClickFocus);
     auto adapter =
         std::make_unique<AdapterType>(widget, mFocus, std::forward<Arguments>(arguments)...);
     if (WidgetHolder* holder = holderOf(design)) holder->place(widget, role);
@@ -65,12 +72,18 @@ void QtToolkit::MsgBox(const String& prompt, std::int32_t style, const String& t
 std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents events) {
     // Only the drawing surface listens to the mouse; other frames hold an editor's parts.
     if (events.MouseDown || events.MouseUp) {
-        auto* canvas = new Canvas(parentOf(design));
+        auto* canvas = new Canvas(mView, parentOf(design));
         canvas->show();
+        mView.setCanvas(canvas);
         return adapt<CanvasAdapter>(design, Role::frame, canvas, std::move(events));
     }
-    return adapt<RowFrameAdapter>(design, Role::frame,
-                                  new RowFrame(parentOf(design), !design.Container));
+    auto* frame = new RowFrame(parentOf(design), !design.Container);
+    if (!design.Container)
+        frame->setTitle([this] {
+            const auto* grid = static_cast<const GridWidget*>(mGrid.data());
+            return grid ? grid->model().titleOf(grid->currentRow(), grid->currentCol()) : QString();
+        });
+    return adapt<RowFrameAdapter>(design, Role::frame, frame);
 }
 
 std::unique_ptr<CommandButton> QtToolkit::makeCommandButton(const Design& design,
@@ -79,7 +92,7 @@ std::unique_ptr<CommandButton> QtToolkit::makeCommandButton(const Design& design
     if (design.Container)
         button = new QPushButton(parentOf(design));
     else
-        button = new HomeButton(parentOf(design));
+        mNavigation.setHomeButton(button = new HomeButton(parentOf(design)));
     button->setText(toQt(design.Caption));
     button->show();
     return adapt<ButtonAdapter>(design, Role::button, button, std::move(events));
@@ -109,11 +122,11 @@ std::unique_ptr<Label> QtToolkit::makeLabel(const Design& design) {
 std::unique_ptr<ScrollBar> QtToolkit::makeScrollBar(const Design& design, Orientation orientation,
                                                     ScrollBarEvents events) {
     const bool horizontal = orientation == Orientation::horizontal;
-    auto* bar = new QScrollBar(horizontal ? Qt::Horizontal : Qt::Vertical, parentOf(design));
-    (horizontal ? mHorizontal : mVertical) = bar;
-    bar->setAutoFillBackground(true);
+    auto* bar = new CanvasScrollBar(horizontal ? Qt::Horizontal : Qt::Vertical, parentOf(design));
+    mView.setBar(bar);
     bar->show();
-    return adapt<ScrollBarAdapter>(design, Role::field, bar, std::move(events));
+    return adapt<ScrollBarAdapter>(design, Role::field, static_cast<QScrollBar*>(bar),
+                                   std::move(events));
 }
 
 std::unique_ptr<MSFlexGridLib::MSFlexGrid> QtToolkit::makeGrid(const Design& design,
@@ -121,12 +134,14 @@ std::unique_ptr<MSFlexGridLib::MSFlexGrid> QtToolkit::makeGrid(const Design& des
                                                                std::int32_t cols,
                                                                MSFlexGridLib::GridEvents events) {
     auto* grid = new GridWidget(rows, cols, parentOf(design));
+    mGrid = grid;
     mFocus.setFallback(&grid->view());
-    return adapt<GridAdapter>(design, Role::field, grid, mDrags, std::move(events));
+    mNavigation.setGrid(grid);
+    return adapt<GridAdapter>(design, Role::field, grid, mDrags, mMenu, std::move(events));
 }
 
 std::unique_ptr<PopupMenu> QtToolkit::makePopupMenu(const Design& design, PlainEvent Click) {
-    return std::make_unique<PopupMenuAdapter>(mSurface, design, std::move(Click));
+    return std::make_unique<PopupMenuAdapter>(mSurface, mMenu, design, std::move(Click));
 }
 
 std::unique_ptr<Dialog> QtToolkit::makeDialog(const Design& design, DialogEvents events) {
@@ -142,16 +157,17 @@ Ref<TalvikTabulet::Tabulet> QtToolkit::makeTabulet(const Design& design, std::in
                                                    const TalvikTabulet::Tabulet* pattern,
                                                    const TalvikTabulet::TabuletEvents& events) {
     Canvas& canvas = canvasOf(design);
-    auto* box = new TabuletWidget(&canvas);
+    auto* box = new TabuletWidget(index, canvas);
     box->hide();
     box->setObjectName(elementName(design.Name, index));
     if (const auto* holder = dynamic_cast<const WidgetHolder*>(pattern); holder && holder->widget())
         box->setFont(holder->widget()->font());
-    return std::make_shared<TabuletAdapter>(box, mFocus, mDrags, mCurrentTabulet, index, events);
+    return std::make_shared<TabuletAdapter>(box, mFocus, mTables, index, events);
 }
 
 Ref<Line> QtToolkit::makeLine(const Design& design, std::int16_t index) {
-    return std::make_shared<CanvasLine>(canvasOf(design), elementName(design.Name, index));
+    return std::make_shared<CanvasLine>(canvasOf(design), elementName(design.Name, index), index,
+                                        mAsked);
 }
 
 Ref<Shape> QtToolkit::makeShape(const Design& design, std::int16_t index) {
@@ -180,10 +196,6 @@ std::uint32_t QtToolkit::RegisterWindowMessage(const String& name) {
 void QtToolkit::SendMessage(std::uint32_t message, std::uintptr_t wParam, std::int32_t* lParam) {
     ZandorWindowMessage event(static_cast<QEvent::Type>(message), wParam, lParam);
     QCoreApplication::sendEvent(&mSurface, &event);
-}
-
-void QtToolkit::scrollByWheel(QWheelEvent& event) {
-    qt::scrollByWheel(mHorizontal, mVertical, event);
 }
 
 } // namespace platform::qt

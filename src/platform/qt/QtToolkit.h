@@ -1,17 +1,19 @@
 #pragma once
 
 #include "platform/Toolkit.h"
+#include "platform/qt/CanvasView.h"
 #include "platform/qt/DragSession.h"
 #include "platform/qt/FocusTracker.h"
+#include "platform/qt/KeyboardMenu.h"
+#include "platform/qt/LineEnds.h"
+#include "platform/qt/Navigation.h"
 #include "platform/qt/TabuletAdapter.h"
 
 #include <QPointer>
 
-class QScrollBar;
-class QWheelEvent;
-
 namespace platform::qt {
 
+class GridWidget;
 class WidgetHolder;
 
 /// Makes one control's constituents as children of a widget, its surface.
@@ -22,8 +24,8 @@ public:
     /// The surface is about to go: boxes shown from now on stand on their own.
     void close() { mClosing = true; }
     DragSession& drags() { return mDrags; }
-    /// Scrolls the canvas.
-    void scrollByWheel(QWheelEvent& event);
+    CanvasView& view() { return mView; }
+    Navigation& navigation() { return mNavigation; }
 
     void MsgBox(const String& prompt, std::int32_t style, const String& title) override;
     std::unique_ptr<Frame> makeFrame(const Design& design, FrameEvents events) override;
@@ -64,9 +66,12 @@ private:
     QWidget& mSurface;
     FocusTracker mFocus;
     DragSession mDrags;
-    CurrentTabulet mCurrentTabulet;
-    QPointer<QScrollBar> mHorizontal;
-    QPointer<QScrollBar> mVertical;
+    KeyboardMenu mMenu;
+    LineEnds mAsked;
+    TabuletSurroundings mTables{mDrags, mMenu, mAsked};
+    CanvasView mView{mMenu, mDrags};
+    Navigation mNavigation{mSurface, mView};
+    QPointer<QWidget> mGrid;
     bool mClosing = false;
 };
 

@@ -1,6 +1,7 @@
 #include "platform/qt/ScrollBar.h"
 
 #include "platform/RuntimeError.h"
+#include "platform/qt/FocusFrame.h"
 
 #include <QApplication>
 #include <QStyle>
@@ -21,12 +22,37 @@ void scrollBy(QScrollBar* bar, int twips) {
 
 } // namespace
 
+CanvasScrollBar::CanvasScrollBar(Qt::Orientation orientation, QWidget* parent)
+    : QScrollBar(orientation, parent) {
+    // No stop of the Tab key: the canvas itself scrolls by keys, and the control may send the
+    // focus on from a bar.
+    setFocusPolicy(Qt::ClickFocus);
+    setAutoFillBackground(true);
+    setAccessibleName(orientation == Qt::Horizontal ? tr("Scroll across") : tr("Scroll down"));
+}
+
+void CanvasScrollBar::paintEvent(QPaintEvent* event) {
+    QScrollBar::paintEvent(event);
+    if (!hasFocus()) return;
+    QPainter painter(this);
+    paintFocusFrame(painter, rect(), palette());
+}
+
+void CanvasScrollBar::focusInEvent(QFocusEvent* event) {
+    QScrollBar::focusInEvent(event);
+    update();
+}
+
+void CanvasScrollBar::focusOutEvent(QFocusEvent* event) {
+    QScrollBar::focusOutEvent(event);
+    update();
+}
+
 ScrollBarAdapter::ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus,
                                    ScrollBarEvents events)
     : Adapter(widget, focus) {
     widget->setRange(0, 0);
     widget->setSingleStep(singleStep);
-    widget->setFocusPolicy(Qt::StrongFocus);
     const int extent = widget->style()->pixelMetric(QStyle::PM_ScrollBarExtent, nullptr, widget);
     widget->resize(widget->orientation() == Qt::Horizontal ? QSize(4 * extent, extent)
                                                            : QSize(extent, 4 * extent));

@@ -9,6 +9,17 @@ class QWheelEvent;
 
 namespace platform::qt {
 
+/// Moves the canvas; shows that it has the focus, which scroll bars of most styles do not.
+class CanvasScrollBar : public QScrollBar {
+public:
+    CanvasScrollBar(Qt::Orientation orientation, QWidget* parent);
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void focusInEvent(QFocusEvent* event) override;
+    void focusOutEvent(QFocusEvent* event) override;
+};
+
 class ScrollBarAdapter final : public Adapter<platform::ScrollBar, QScrollBar> {
 public:
     ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, ScrollBarEvents events);

@@ -4,6 +4,8 @@
 #include "platform/qt/ColumnListModel.h"
 #include "platform/qt/DragSession.h"
 #include "platform/qt/Fonts.h"
+#include "platform/qt/KeyCodes.h"
+#include "platform/qt/KeyboardMenu.h"
 #include "platform/qt/Text.h"
 
 #include <algorithm>
@@ -21,7 +23,8 @@ std::int32_t nextHandle() {
 } // namespace
 
 /// An entry outlives its list where somebody still holds it; it then keeps what it last said.
-class TabuletAdapter::Entry final : public TalvikTabulet::ColumnItem {
+class TabuletAdapter::Entry final : public TableEntry,
+                                    public std::enable_shared_from_this<Entry> {
 public:
     Entry(TabuletAdapter& table, int row, const String& key, const String& text)
         : mTable(&table), mRow(row), mKey(key), mText(text) {}
@@ -40,6 +43,7 @@ public:
 
     void Selected(bool value) override {
         mSelected = value;
+        if (mTable && value) mTable->mEntryTaken = true;
         if (live())
             list().selectionModel()->select(index(), value ? QItemSelectionModel::Select
                                                            : QItemSelectionModel::Deselect);
@@ -57,8 +61,16 @@ public:
         if (live()) list().scrollTo(index());
     }
 
-    TalvikTabulet::Point LeftEdgePoint() const override { return edge(0); }
-    TalvikTabulet::Point RightEdgePoint() const override { return edge(1); }
+    TalvikTabulet::Point LeftEdgePoint() const override {
+        if (mTable) mTable->mSurroundings.asked.east = weak_from_this();
+        return edge(0);
+    }
+    TalvikTabulet::Point RightEdgePoint() const override {
+        if (mTable) mTable->mSurroundings.asked.west = weak_from_this();
+        return edge(1);
+    }
+
+    const TalvikTabulet::Tabulet* table() const override { return mTable; }
 
 private:
     bool live() const { return mTable && mTable->mWidget; }
@@ -98,11 +110,11 @@ Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Add(const String& key,
     return items.emplace_back(std::move(entry));
 }
 
-TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus, DragSession& drags,
-                               CurrentTabulet& current, std::int16_t index,
+TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus,
+                               TabuletSurroundings& surroundings, std::int16_t index,
                                const TalvikTabulet::TabuletEvents& events)
-    : Adapter(widget, focus), mDrags(drags), mCurrent(current), mIndex(index),
-      mHandle(nextHandle()), mEvents(events) {
+    : Adapter(widget, focus), mSurroundings(surroundings), mDrags(surroundings.drags),
+      mIndex(index), mHandle(nextHandle()), mEvents(events) {
     widget->setListener(this);
     mFocus.watch(&widget->list(), [this] {
         if (mEvents.GotFocus) mEvents.GotFocus(mIndex);
@@ -112,7 +124,7 @@ TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus, DragS
 TabuletAdapter::~TabuletAdapter() {
     Terminate();
     mDrags.forget(this);
-    if (mCurrent.adapter == this) mCurrent.adapter = nullptr;
+    if (mSurroundings.current == this) mSurroundings.current = nullptr;
     if (!mWidget) return;
     mFocus.release(mWidget);
     mFocus.forget(&mWidget->list());
@@ -130,11 +142,11 @@ void TabuletAdapter::Visible(bool value) {
 }
 
 void TabuletAdapter::Activated(bool value) {
-    if (value && mCurrent.adapter && mCurrent.adapter != this) mCurrent.adapter->Activated(false);
+    if (value && mSurroundings.current && mSurroundings.current != this) mSurroundings.current->Activated(false);
     if (value)
-        mCurrent.adapter = this;
-    else if (mCurrent.adapter == this)
-        mCurrent.adapter = nullptr;
+        mSurroundings.current = this;
+    else if (mSurroundings.current == this)
+        mSurroundings.current = nullptr;
     if (mWidget) mWidget->setCurrent(value);
 }
 
@@ -183,7 +195,8 @@ void TabuletAdapter::report(const TalvikTabulet::TabuletEvents::Mouse& handler, 
                             std::int16_t button, std::int16_t shift) {
     if (!handler || row >= mEntries.Count()) return;
     // A copy: the handler may end the table.
-    const Ref<TalvikTabulet::ColumnItem> entry = mEntries.Item(row + 1);
+    Ref<TalvikTabulet::ColumnItem> entry;
+    if (row >= 0) entry = mEntries.Item(row + 1);
     handler(mIndex, entry, button, shift);
 }
 
@@ -199,6 +212,16 @@ void TabuletAdapter::entryMoved(int row, std::int16_t buttons, std::int16_t shif
 
 void TabuletAdapter::entryReleased(int row, std::int16_t button, std::int16_t shift) {
     report(mEvents.ColumnMouseUp, row, button, shift);
+}
+
+void TabuletAdapter::menuKey(int row, QPoint at) {
+    mSurroundings.menu.openAt(at, [&] { entryReleased(row, buttonState(Qt::RightButton), 0); });
+}
+
+void TabuletAdapter::deleteKey(int row) {
+    mSurroundings.menu.choose(menuentry::deleteTable, [&] {
+        entryReleased(row, buttonState(Qt::RightButton), 0);
+    });
 }
 
 void TabuletAdapter::listScrolled() {
@@ -252,9 +275,14 @@ void TabuletAdapter::gestureEnded(Qt::Edges edges) {
 
 bool TabuletAdapter::draggedOver(const QMimeData* data, QPointF at, std::int16_t state) {
     constexpr std::int16_t leaving = 1;
-    if (state == leaving ? !mDrags.source() : !mDrags.accepts(data)) return false;
+    if (data ? !mDrags.accepts(data) : !mDrags.source()) return false;
+    mEntryTaken = false;
+    const QPointer<TabuletWidget> alive = mWidget;
     if (mEvents.DragOver)
         mEvents.DragOver(mIndex, mDrags.source(), toTwips(at.x()), toTwips(at.y()), state);
+    // The control answers by selecting the entry under the mouse if it can be dropped on. The drop
+    // goes to the control either way; the cursor tells the user beforehand.
+    if (alive) mDrags.showWhetherDropCounts(state == leaving || mEntryTaken);
     return true;
 }
 

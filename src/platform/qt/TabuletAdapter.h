@@ -2,6 +2,7 @@
 
 #include "platform/Tabulet.h"
 #include "platform/qt/Adapter.h"
+#include "platform/qt/LineEnds.h"
 #include "platform/qt/TabuletWidget.h"
 
 #include <vector>
@@ -9,19 +10,22 @@
 namespace platform::qt {
 
 class DragSession;
+class KeyboardMenu;
 class TabuletAdapter;
 
-/// Which table list of a control is the activated one.
-struct CurrentTabulet {
-    TabuletAdapter* adapter = nullptr;
+/// What the table lists of one control share.
+struct TabuletSurroundings {
+    DragSession& drags;
+    KeyboardMenu& menu;
+    LineEnds& asked;                   ///< told when an entry is asked for an edge
+    TabuletAdapter* current = nullptr; ///< the activated one
 };
 
 class TabuletAdapter final : public Adapter<TalvikTabulet::Tabulet, TabuletWidget>,
                              private TabuletListener {
 public:
-    TabuletAdapter(TabuletWidget* widget, FocusTracker& focus, DragSession& drags,
-                   CurrentTabulet& current, std::int16_t index,
-                   const TalvikTabulet::TabuletEvents& events);
+    TabuletAdapter(TabuletWidget* widget, FocusTracker& focus, TabuletSurroundings& surroundings,
+                   std::int16_t index, const TalvikTabulet::TabuletEvents& events);
     ~TabuletAdapter() override;
 
     const String& Text() const override { return mText; }
@@ -60,6 +64,8 @@ private:
     void entryMoved(int row, std::int16_t buttons, std::int16_t shift) override;
     void entryReleased(int row, std::int16_t button, std::int16_t shift) override;
     void listScrolled() override;
+    void menuKey(int row, QPoint at) override;
+    void deleteKey(int row) override;
     void closeClicked() override;
     void gestureBegan() override;
     void gestureMoved(Qt::Edges edges, QPointF way) override;
@@ -69,8 +75,8 @@ private:
     void report(const TalvikTabulet::TabuletEvents::Mouse& handler, int row, std::int16_t button,
                 std::int16_t shift);
 
+    TabuletSurroundings& mSurroundings;
     DragSession& mDrags;
-    CurrentTabulet& mCurrent;
     const std::int16_t mIndex;
     const std::int32_t mHandle;
     const TalvikTabulet::TabuletEvents& mEvents;
@@ -78,6 +84,7 @@ private:
     String mText;
     String mTag;
     bool mVisible = false;
+    bool mEntryTaken = false; ///< the control has selected an entry
     Bounds mGestureStart;
 };
 

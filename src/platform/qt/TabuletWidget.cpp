@@ -1,11 +1,16 @@
 #include "platform/qt/TabuletWidget.h"
 
+#include "platform/qt/Canvas.h"
+#include "platform/qt/CanvasView.h"
 #include "platform/qt/ColumnListModel.h"
 #include "platform/qt/ElisionToolTip.h"
+#include "platform/qt/KeyCodes.h"
 
 #include <QDropEvent>
 #include <QHelpEvent>
 #include <QPainter>
+#include <QPointer>
+#include <QScrollBar>
 
 #include <cmath>
 
@@ -14,6 +19,7 @@ namespace platform::qt {
 namespace {
 
 constexpr int border = 4;      ///< resizes the box; its outermost pixel is the frame line
+constexpr int keyStep = 10;    ///< 150 twips
 constexpr int cornerReach = 14; ///< how far a corner reaches along its edges
 
 QColor blend(const QColor& one, const QColor& other, double share) {
@@ -87,9 +93,10 @@ Qt::CursorShape cursorFor(Qt::Edges edges) {
 
 } // namespace
 
-TabuletWidget::TabuletWidget(QWidget* parent)
-    : QWidget(parent), mModel(new ColumnListModel(this)), mList(new ColumnListView(this)),
-      mClose(new CloseButton(*this)) {
+TabuletWidget::TabuletWidget(int slot, Canvas& canvas)
+    : QWidget(&canvas), mCanvas(canvas), mSlot(slot), mModel(new ColumnListModel(this)),
+      mList(new ColumnListView(this)), mClose(new CloseButton(*this)),
+      mScroller(Qt::Vertical, [this](QPoint direction) { scrollUnderDrag(direction); }) {
     // Opaque, so that moving the box moves its pixels instead of painting it anew.
     setAttribute(Qt::WA_OpaquePaintEvent);
     setMouseTracking(true);
@@ -187,9 +194,28 @@ bool TabuletWidget::eventFilter(QObject* watched, QEvent* event) {
         mClose->update();
         break;
     case QEvent::MouseButtonPress: raise(); break;
+    case QEvent::KeyPress: return moveOrResize(*static_cast<QKeyEvent*>(event));
     default: break;
     }
     return QWidget::eventFilter(watched, event);
+}
+
+/// Alt and an arrow move the box as its title does, with Shift they resize it as its lower right
+/// corner does; Control stands for Alt there. Control alone is the list's.
+bool TabuletWidget::moveOrResize(const QKeyEvent& event) {
+    const Qt::KeyboardModifiers held = modifiersOf(event);
+    const QPoint arrow = arrowOf(event);
+    const bool resize = held == (Qt::AltModifier | Qt::ShiftModifier) ||
+                        held == (Qt::ControlModifier | Qt::ShiftModifier);
+    if (arrow.isNull() || !mListener || !(resize || held == Qt::AltModifier)) return false;
+    Qt::Edges edges;
+    if (resize) edges = arrow.x() != 0 ? Qt::RightEdge : Qt::BottomEdge;
+    const QPointer<TabuletWidget> alive = this;
+    mListener->gestureBegan();
+    mListener->gestureMoved(edges, arrow * keyStep);
+    if (alive && mListener) mListener->gestureEnded(edges);
+    if (alive) mCanvas.view().reveal(geometry());
+    return true;
 }
 
 Qt::Edges TabuletWidget::edgesAt(QPoint at) const {
@@ -255,13 +281,31 @@ void TabuletWidget::dragEnterEvent(QDragEnterEvent* event) {
 void TabuletWidget::dragMoveEvent(QDragMoveEvent* event) {
     mDraggedAt = event->position();
     event->setAccepted(mListener && mListener->draggedOver(event->mimeData(), mDraggedAt, 2));
+    if (!event->isAccepted()) return;
+    // The list first: below its edge the canvas would run away.
+    const bool scrolls = mList->verticalScrollBar()->maximum() > 0;
+    if (scrolls && mScroller.hover(mDraggedAt.toPoint(), mList->geometry()))
+        mCanvas.dragGone();
+    else
+        mCanvas.dragHovers(mapToParent(mDraggedAt.toPoint()));
+}
+
+void TabuletWidget::scrollUnderDrag(QPoint direction) {
+    QScrollBar& bar = *mList->verticalScrollBar();
+    const int before = bar.value();
+    bar.setValue(before + direction.y() * bar.singleStep() / 2);
+    if (bar.value() != before && mListener) mListener->draggedOver(nullptr, mDraggedAt, 2);
 }
 
 void TabuletWidget::dragLeaveEvent(QDragLeaveEvent*) {
+    mScroller.stop();
+    mCanvas.dragGone();
     if (mListener) mListener->draggedOver(nullptr, mDraggedAt, 1);
 }
 
 void TabuletWidget::dropEvent(QDropEvent* event) {
+    mScroller.stop();
+    mCanvas.dragGone();
     event->setAccepted(mListener && mListener->dropped(event->mimeData(), event->position()));
 }
 

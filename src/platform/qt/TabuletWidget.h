@@ -1,12 +1,14 @@
 #pragma once
 
 #include "platform/qt/ColumnListView.h"
+#include "platform/qt/DragScroller.h"
 
 #include <QAbstractButton>
 #include <QWidget>
 
 namespace platform::qt {
 
+class Canvas;
 class ColumnListModel;
 
 class TabuletListener : public EntryListener {
@@ -17,14 +19,20 @@ public:
     /// The mouse is `way` logical pixels from where the gesture began.
     virtual void gestureMoved(Qt::Edges edges, QPointF way) = 0;
     virtual void gestureEnded(Qt::Edges edges) = 0;
+    /// Without data it is the drag that has come before. State 0 enters, 1 leaves, 2 is over.
     virtual bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) = 0;
     virtual bool dropped(const QMimeData* data, QPointF at) = 0;
 };
 
 /// A table as a box: title bar with name and close button, list of columns, a border to resize by.
 class TabuletWidget : public QWidget {
+    Q_OBJECT
+
 public:
-    explicit TabuletWidget(QWidget* parent);
+    /// The slot orders the tables for the keyboard.
+    TabuletWidget(int slot, Canvas& canvas);
+
+    int slot() const { return mSlot; }
 
     void setListener(TabuletListener* listener);
     ColumnListView& list() const { return *mList; }
@@ -64,7 +72,11 @@ private:
     void arrange();
     Qt::Edges edgesAt(QPoint at) const;
     void endGesture();
+    bool moveOrResize(const QKeyEvent& event);
+    void scrollUnderDrag(QPoint direction);
 
+    Canvas& mCanvas;
+    const int mSlot;
     TabuletListener* mListener = nullptr;
     ColumnListModel* mModel;
     ColumnListView* mList;
@@ -77,6 +89,7 @@ private:
     QPointF mPressedAt;
     QPointF mDraggedAt;
     bool mMoved = false;
+    DragScroller mScroller;
 };
 
 } // namespace platform::qt

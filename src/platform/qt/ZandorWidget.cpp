@@ -1,9 +1,12 @@
 #include "platform/qt/ZandorWidget.h"
 
 #include "platform/Numbers.h"
+#include "platform/qt/CanvasItems.h"
+#include "platform/qt/JoinName.h"
 #include "platform/qt/QtToolkit.h"
 #include "platform/qt/Text.h"
 
+#include <QKeyEvent>
 #include <QWheelEvent>
 
 using platform::qt::fromQt;
@@ -42,8 +45,13 @@ ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
     // The canvas has the same background, so that none sees where it ends.
     setAutoFillBackground(true);
     setBackgroundRole(QPalette::Window);
+    setFocusPolicy(Qt::TabFocus);
+    setAccessibleName(tr("Query designer"));
     resize(sizeHint());
     mControl = std::make_unique<Zandor>(*mToolkit, library, *mEvents);
+    mToolkit->view().setNamer([this](const platform::qt::CanvasLine& line) {
+        return mControl ? joinName(*mControl, line.ends()) : QString();
+    });
     mControl->UserControl_Resize();
 }
 
@@ -65,7 +73,27 @@ void ZandorWidget::resizeEvent(QResizeEvent*) {
 
 void ZandorWidget::showEvent(QShowEvent*) { queuePaint(); }
 
-void ZandorWidget::wheelEvent(QWheelEvent* event) { mToolkit->scrollByWheel(*event); }
+void ZandorWidget::wheelEvent(QWheelEvent* event) { mToolkit->view().scrollByWheel(*event); }
+
+bool ZandorWidget::event(QEvent* event) {
+    if (event->type() == QEvent::ShortcutOverride &&
+        mToolkit->navigation().claims(static_cast<QKeyEvent&>(*event))) {
+        event->accept();
+        return true;
+    }
+    return QWidget::event(event);
+}
+
+bool ZandorWidget::focusNextPrevChild(bool next) { return mToolkit->navigation().goOn(next); }
+
+void ZandorWidget::focusInEvent(QFocusEvent* event) {
+    if (event->reason() == Qt::TabFocusReason) mToolkit->navigation().enter(true);
+    if (event->reason() == Qt::BacktabFocusReason) mToolkit->navigation().enter(false);
+}
+
+void ZandorWidget::keyPressEvent(QKeyEvent* event) {
+    if (!mToolkit->navigation().keyPressed(*event)) QWidget::keyPressEvent(event);
+}
 
 void ZandorWidget::queuePaint() {
     // The control's paint may open message boxes, which must never happen while Qt paints.

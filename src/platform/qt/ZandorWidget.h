@@ -20,6 +20,8 @@ class QtToolkit;
 /// are the control's own under their own names; integers are 16-bit ones, and a value outside
 /// -32768 to 32767 is refused as error 6 in a message box, the property staying as it was.
 ///
+/// To the Tab key of the window around, the widget is a single stop; docs/keyboard.md lists its keys.
+///
 /// The library outlives the widget. With DebugSwitch nonzero (its default) the widget shows trace
 /// boxes, one of them while it is destroyed.
 ///
@@ -248,6 +250,10 @@ signals:
     void JoinRemoved(const ZDJoin& join);
 
 protected:
+    bool event(QEvent* event) override;
+    bool focusNextPrevChild(bool next) override;
+    void focusInEvent(QFocusEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
     void showEvent(QShowEvent* event) override;

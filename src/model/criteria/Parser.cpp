@@ -1,0 +1,379 @@
+#include "model/criteria/Parser.h"
+
+#include "model/Table.h"
+#include "model/criteria/Literals.h"
+
+#include <algorithm>
+
+namespace model::criteria {
+
+using sql::Node;
+
+namespace {
+
+constexpr int deepestNesting = 100;
+
+class Parser {
+public:
+    Parser(StringView text, std::vector<Token> tokens, const sql::ColumnRef& subject,
+           const Resolver& resolver, const References& known)
+        : mText(text), mTokens(std::move(tokens)), mSubjectColumn(subject),
+          mSubject(sql::make(subject)), mResolver(resolver), mKnown(known) {}
+
+    Reading read() {
+        try {
+            if (peek().kind != TokenKind::end) mReading.condition = disjunction();
+            if (peek().kind != TokenKind::end) fail(u"expected And, Or or the end");
+        } catch (Error& error) {
+            mReading.condition = {};
+            mReading.error = std::move(error);
+            keepKnown();
+        }
+        return std::move(mReading);
+    }
+
+private:
+    /// One step down into parentheses or a Not.
+    class Nesting {
+    public:
+        explicit Nesting(Parser& parser) : mParser(parser) {
+            if (++mParser.mDepth > deepestNesting)
+                mParser.fail(u"expected less nesting, 100 levels are the most");
+        }
+        ~Nesting() { --mParser.mDepth; }
+
+    private:
+        Parser& mParser;
+    };
+
+    const Token& peek(std::size_t ahead = 0) const {
+        return mTokens[std::min(mAt + ahead, mTokens.size() - 1)];
+    }
+    Token take() { return mTokens[mAt < mTokens.size() - 1 ? mAt++ : mAt]; }
+    bool at(StringView keyword, std::size_t ahead = 0) const {
+        return isKeyword(peek(ahead), keyword);
+    }
+    bool takeKeyword(StringView keyword) {
+        if (!at(keyword)) return false;
+        take();
+        return true;
+    }
+    bool takeKind(TokenKind kind) {
+        if (peek().kind != kind) return false;
+        take();
+        return true;
+    }
+    [[noreturn]] void fail(StringView expected) const { throw errorAt(peek().begin, expected); }
+    [[noreturn]] void failValue(const Token& token, ColumnType type) const {
+        String what = u"expected ";
+        what += nameOf(type);
+        throw errorAt(token.begin, what);
+    }
+
+    Node disjunction() {
+        std::vector<Node> terms{conjunction()};
+        while (takeKeyword(u"Or")) terms.push_back(conjunction());
+        return sql::anyOf(std::move(terms));
+    }
+
+    Node conjunction() {
+        std::vector<Node> terms{negation()};
+        while (takeKeyword(u"And")) terms.push_back(negation());
+        return sql::allOf(std::move(terms));
+    }
+
+    Node negation() {
+        if (!at(u"Not")) return predicate(false);
+        if (at(u"Like", 1) || at(u"Between", 1) || at(u"In", 1)) {
+            take();
+            return predicate(true);
+        }
+        const Nesting nesting(*this);
+        take();
+        return sql::make(sql::Not{negation()});
+    }
+
+    Node predicate(bool negated) {
+        if (peek().kind == TokenKind::open) {
+            const Nesting nesting(*this);
+            take();
+            Node inner = disjunction();
+            if (!takeKind(TokenKind::close)) fail(u"expected a closing )");
+            return inner;
+        }
+        if (at(u"Like")) return like(negated);
+        if (takeKeyword(u"Between")) return between(negated);
+        if (at(u"In") && peek(1).kind == TokenKind::open) return in(negated);
+        if (negated) {
+            take();
+            fail(u"expected ( after In");
+        }
+        if (at(u"Is")) return isNull();
+        auto comparison = sql::Comparison::equal;
+        if (peek().kind == TokenKind::comparison) comparison = operatorOf(take().text);
+        return sql::make(sql::Compare{comparison, mSubject, operand()});
+    }
+
+    static sql::Comparison operatorOf(StringView symbol) {
+        if (symbol == u"<>") return sql::Comparison::notEqual;
+        if (symbol == u"<") return sql::Comparison::less;
+        if (symbol == u">") return sql::Comparison::greater;
+        if (symbol == u"<=") return sql::Comparison::lessEqual;
+        if (symbol == u">=") return sql::Comparison::greaterEqual;
+        return sql::Comparison::equal;
+    }
+
+    Node isNull() {
+        take();
+        const bool negated = takeKeyword(u"Not");
+        if (!takeKeyword(u"Null")) fail(u"expected Null, a text that begins so needs quotes");
+        return sql::make(sql::IsNull{negated, mSubject});
+    }
+
+    Node like(bool negated) {
+        const Token word = take();
+        if (!takesAnyText())
+            throw errorAt(word.begin,
+                          u"expected a comparison, Like works on columns that hold text");
+        const Token first = peek();
+        const bool qualified = first.kind == TokenKind::bracketed && peek(1).kind == TokenKind::dot;
+        Node asked;
+        if (!qualified)
+            asked = first.kind == TokenKind::bracketed ? bracketedName() : takeParameter();
+        const auto* parameter = asked ? std::get_if<sql::Parameter>(&asked->node) : nullptr;
+        if (qualified || (asked && !parameter))
+            throw errorAt(first.begin, u"expected a pattern, as in Like 'A*', not a column");
+        if (parameter) {
+            sql::Parameter pattern = *parameter;
+            pattern.pattern = true;
+            return sql::make(sql::Like{negated, mSubject, sql::make(std::move(pattern))});
+        }
+        const String typed = first.kind == TokenKind::quoted ? take().text : barePattern();
+        if (first.kind != TokenKind::quoted && typed.empty())
+            fail(u"expected a pattern, as in Like 'A*'");
+        return sql::make(sql::Like{
+            negated, mSubject, sql::make(sql::Value{ColumnType::Text, likePattern(typed)})});
+    }
+
+    Node between(bool negated) {
+        Node low = operand();
+        if (!takeKeyword(u"And")) fail(u"expected And and the upper value");
+        Node high = operand();
+        return sql::make(sql::Between{negated, mSubject, std::move(low), std::move(high)});
+    }
+
+    Node in(bool negated) {
+        take();
+        take();
+        std::vector<Node> list{operand()};
+        while (takeKind(TokenKind::comma)) list.push_back(operand());
+        if (!takeKind(TokenKind::close)) fail(u"expected a comma or a closing )");
+        return sql::make(sql::In{negated, mSubject, std::move(list)});
+    }
+
+    /// A value, a column or a parameter.
+    Node operand() {
+        if (Node parameter = takeParameter()) return parameter;
+        if (Node column = takeColumn()) return column;
+        const Token first = peek();
+        switch (first.kind) {
+        case TokenKind::quoted:
+        case TokenKind::dated: return delimitedValue(take());
+        case TokenKind::word: return bareValue();
+        case TokenKind::bracketed: return bracketedName();
+        default: failValue(first, mSubjectColumn.type);
+        }
+    }
+
+    Node delimitedValue(const Token& token) {
+        ColumnType type = mSubjectColumn.type;
+        if (token.kind == TokenKind::dated) {
+            const auto moment = momentLiteral(token.text, type);
+            if (!moment) failValue(token, type);
+            return sql::make(*moment);
+        }
+        // Quotes around a value say that it is text wherever the column does not know better.
+        if (type == ColumnType::Unknown) type = ColumnType::Text;
+        const auto value = literal(token.text, type);
+        if (!value) failValue(token, type);
+        return sql::make(*value);
+    }
+
+    Node bareValue() {
+        const Token first = peek();
+        if (at(u"Null"))
+            fail(u"expected a value, write Is Null for a missing one or 'Null' for the word");
+        const String typed = bareText();
+        if (typed.empty()) failValue(first, mSubjectColumn.type);
+        const auto value = literal(typed, mSubjectColumn.type);
+        if (!value) failValue(first, mSubjectColumn.type);
+        return sql::make(*value);
+    }
+
+    bool atWord() const {
+        return peek().kind == TokenKind::word && !at(u"And") && !at(u"Or");
+    }
+
+    /// The bare words from here up to And, Or or another kind of token, with the blanks between
+    /// them as typed.
+    String bareText() {
+        const std::size_t begin = peek().begin;
+        std::size_t end = begin;
+        while (atWord()) end = take().end;
+        return String(mText.substr(begin, end - begin));
+    }
+
+    /// The same with brackets, which make a wildcard an ordinary character, as typed.
+    String barePattern() {
+        const std::size_t begin = peek().begin;
+        std::size_t end = begin;
+        while (atWord() || peek().kind == TokenKind::bracketed || peek().kind == TokenKind::dot)
+            end = take().end;
+        return String(mText.substr(begin, end - begin));
+    }
+
+    /// Whether any text is a value for the column.
+    bool takesAnyText() const {
+        return mSubjectColumn.type == ColumnType::Text ||
+               mSubjectColumn.type == ColumnType::Unknown;
+    }
+
+    Node takeParameter() {
+        const Token& token = peek();
+        if (token.kind != TokenKind::word || token.text.front() != u':') return {};
+        String name = token.text.substr(1);
+        if (!isBareName(name)) {
+            // A text may begin with a colon; other values cannot.
+            if (takesAnyText()) return {};
+            throw errorAt(token.begin + 1, u"expected the parameter's name");
+        }
+        take();
+        return sql::make(sql::Parameter{std::move(name), mSubjectColumn.type});
+    }
+
+    /// table.column in any mix of bare and bracketed names. A bare pair that names no column of the
+    /// query is left alone: it may be a text.
+    Node takeColumn() {
+        const Token first = peek();
+        if (first.kind != TokenKind::word && first.kind != TokenKind::bracketed) return {};
+        if (peek(1).kind == TokenKind::dot) {
+            take();
+            take();
+            const Token second = take();
+            if (second.kind != TokenKind::bracketed && second.kind != TokenKind::word)
+                throw errorAt(second.begin, u"expected the column's name");
+            const auto found = lookUp({first.begin, first.end}, first.text, second.text);
+            if (!found) {
+                String what = u"expected a column of the query, there is no ";
+                what += first.text + u"." + second.text;
+                throw errorAt(first.begin, what);
+            }
+            return columnNode(first, *found);
+        }
+        if (first.kind != TokenKind::word) return {};
+        const StringView whole = first.text;
+        const std::size_t dot = whole.find(u'.');
+        if (dot == StringView::npos || !isBareName(whole.substr(0, dot)) ||
+            !isBareName(whole.substr(dot + 1)))
+            return {};
+        Reference reference{first.begin, first.begin + dot};
+        const auto found = lookUp(reference, whole.substr(0, dot), whole.substr(dot + 1));
+        if (!found) {
+            // From now on it is the text that it looks like, whatever tables come later.
+            if (takesAnyText()) mReading.references.push_back(std::move(reference));
+            return {};
+        }
+        take();
+        return columnNode(first, *found);
+    }
+
+    /// [name] is a column when just one table has it, and a parameter when none has.
+    Node bracketedName() {
+        const Token token = take();
+        if (const Reference* known = knownAt(token.begin)) {
+            mReading.references.push_back(*known);
+            if (const auto column = columnOf(*known)) return columnNode(token, *column);
+            return sql::make(sql::Parameter{token.text, mSubjectColumn.type});
+        }
+        const auto found = mResolver.columnsNamed(token.text);
+        if (found.size() > 1) {
+            String what = u"expected the table too, as in [" + found.front().column.table + u"].[" +
+                          token.text + u"], several tables have this column";
+            throw errorAt(token.begin, what);
+        }
+        Reference reference{token.begin, token.begin};
+        if (found.size() == 1) reference.column = found.front().place;
+        mReading.references.push_back(std::move(reference));
+        if (found.size() == 1) return columnNode(token, found.front().column);
+        return sql::make(sql::Parameter{token.text, mSubjectColumn.type});
+    }
+
+    /// The column that a table's and a column's name stand for, or nothing.
+    std::optional<sql::ColumnRef> lookUp(Reference reference, StringView table, StringView column) {
+        if (const Reference* known = knownAt(reference.begin)) {
+            // A settled text is entered by the caller.
+            if (known->column.empty()) return {};
+            mReading.references.push_back(*known);
+            return columnOf(*known);
+        }
+        const auto found = mResolver.columnsNamed(table, column);
+        if (found.size() != 1) return {};
+        reference.column = found.front().place;
+        mReading.references.push_back(std::move(reference));
+        return found.front().column;
+    }
+
+    const Reference* knownAt(std::size_t begin) const {
+        const auto at = std::find_if(mKnown.begin(), mKnown.end(),
+                                     [&](const Reference& known) { return known.begin == begin; });
+        return at == mKnown.end() ? nullptr : &*at;
+    }
+
+    static std::optional<sql::ColumnRef> columnOf(const Reference& known) {
+        if (known.column.empty()) return {};
+        const auto column = known.column.column();
+        if (!column)
+            throw errorAt(known.begin,
+                          u"expected a column of the query, the table that had this one was deleted");
+        return columnRef(*column, *known.column.table().table());
+    }
+
+    /// What was known behind the place where reading stopped stays known.
+    void keepKnown() {
+        auto& references = mReading.references;
+        for (const Reference& known : mKnown)
+            if (references.empty() || known.begin > references.back().begin)
+                references.push_back(known);
+    }
+
+    Node columnNode(const Token& token, const sql::ColumnRef& column) {
+        if (!comparable(column.type, mSubjectColumn.type)) {
+            String what = u"expected a column that holds ";
+            what += nameOf(mSubjectColumn.type);
+            throw errorAt(token.begin, what);
+        }
+        return sql::make(column);
+    }
+
+    StringView mText;
+    std::vector<Token> mTokens;
+    const sql::ColumnRef& mSubjectColumn;
+    Node mSubject;
+    const Resolver& mResolver;
+    const References& mKnown;
+    Reading mReading;
+    std::size_t mAt = 0;
+    int mDepth = 0;
+};
+
+} // namespace
+
+Reading read(StringView text, const sql::ColumnRef& subject, const Resolver& resolver,
+             const References& known) {
+    auto scanned = tokens(text);
+    if (auto* error = std::get_if<Error>(&scanned)) return {{}, std::move(*error), known};
+    return Parser(text, std::move(std::get<std::vector<Token>>(scanned)), subject, resolver, known)
+        .read();
+}
+
+} // namespace model::criteria

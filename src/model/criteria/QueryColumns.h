@@ -1,0 +1,22 @@
+#pragma once
+
+#include "model/Table.h"
+#include "model/criteria/Parser.h"
+
+namespace model::criteria {
+
+/// The columns that criteria of one query may name: those of its tables.
+class QueryColumns final : public Resolver {
+public:
+    /// `tables` must outlive the object.
+    explicit QueryColumns(const TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& tables)
+        : mTables(tables) {}
+
+    std::vector<NamedColumn> columnsNamed(StringView table, StringView column) const override;
+    std::vector<NamedColumn> columnsNamed(StringView column) const override;
+
+private:
+    const TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& mTables;
+};
+
+} // namespace model::criteria

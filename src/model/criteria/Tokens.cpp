@@ -1,0 +1,170 @@
+#include "model/criteria/Tokens.h"
+
+#include "model/Names.h"
+
+#include <algorithm>
+#include <optional>
+
+namespace model::criteria {
+
+namespace {
+
+constexpr std::size_t longestText = 10000;
+
+bool isSpace(char16_t c) {
+    return c == u' ' || (c >= u'\t' && c <= u'\r') || c == 0x00A0 || c == 0x2003 || c == 0x3000;
+}
+
+bool isSpecial(char16_t c) { return StringView(u"'\"()[],=<>!").find(c) != StringView::npos; }
+
+/// A character that text cannot carry to any engine.
+std::optional<Error> unusable(StringView text) {
+    if (text.size() > longestText)
+        return errorAt(longestText, u"expected the end, a criterion has at most 10000 characters");
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        const char16_t c = text[i];
+        if (c == 0) return errorAt(i, u"expected a character, found the character zero");
+        if (c < 0xD800 || c > 0xDFFF) continue;
+        const bool paired = c < 0xDC00 && i + 1 < text.size() && text[i + 1] >= 0xDC00 &&
+                            text[i + 1] <= 0xDFFF;
+        if (!paired) return errorAt(i, u"expected a character, found half of one");
+        ++i;
+    }
+    return {};
+}
+
+class Scanner {
+public:
+    explicit Scanner(StringView text) : mText(text) {}
+
+    std::variant<std::vector<Token>, Error> scan() {
+        while (skipSpaces(), mAt < mText.size()) {
+            if (auto error = next()) return *error;
+        }
+        mTokens.push_back({TokenKind::end, mText.size(), mText.size(), {}});
+        return std::move(mTokens);
+    }
+
+private:
+    void skipSpaces() {
+        while (mAt < mText.size() && isSpace(mText[mAt])) ++mAt;
+    }
+
+    std::optional<Error> next() {
+        switch (mText[mAt]) {
+        case u'\'': return delimited(TokenKind::quoted, u'\'', u"expected a closing '");
+        case u'"': return delimited(TokenKind::quoted, u'"', u"expected a closing \"");
+        case u'[': return bracketed();
+        case u'#': return delimited(TokenKind::dated, u'#', u"expected a closing #");
+        case u'(': return single(TokenKind::open);
+        case u')': return single(TokenKind::close);
+        case u',': return single(TokenKind::comma);
+        case u']': return errorAt(mAt, u"expected a [ before this ]");
+        case u'!': return errorAt(mAt, u"expected an operator, write <> for unequal");
+        case u'=':
+        case u'<':
+        case u'>': return comparison();
+        case u'.':
+            if (!mTokens.empty() && mTokens.back().kind == TokenKind::bracketed &&
+                mTokens.back().end == mAt)
+                return single(TokenKind::dot);
+            return word();
+        default: return word();
+        }
+    }
+
+    std::optional<Error> add(TokenKind kind, std::size_t begin, String text) {
+        mTokens.push_back({kind, begin, mAt, std::move(text)});
+        return {};
+    }
+
+    std::optional<Error> single(TokenKind kind) {
+        const std::size_t begin = mAt++;
+        return add(kind, begin, String(mText.substr(begin, 1)));
+    }
+
+    /// A text between two of the same character; two of them inside stand for one.
+    std::optional<Error> delimited(TokenKind kind, char16_t close, StringView missing) {
+        const std::size_t begin = mAt++;
+        String text;
+        for (; mAt < mText.size(); ++mAt) {
+            if (mText[mAt] == close) {
+                if (mAt + 1 >= mText.size() || mText[mAt + 1] != close) {
+                    ++mAt;
+                    return add(kind, begin, std::move(text));
+                }
+                ++mAt;
+            }
+            text.push_back(mText[mAt]);
+        }
+        return errorAt(mText.size(), missing);
+    }
+
+    std::optional<Error> bracketed() {
+        if (auto error = delimited(TokenKind::bracketed, u']', u"expected a closing ]"))
+            return error;
+        if (mTokens.back().text.empty())
+            return errorAt(mTokens.back().begin + 1, u"expected a name between the brackets");
+        return {};
+    }
+
+    std::optional<Error> comparison() {
+        const std::size_t begin = mAt++;
+        const StringView two = mText.substr(begin, 2);
+        if (two == u"<>" || two == u"<=" || two == u">=") ++mAt;
+        return add(TokenKind::comparison, begin, String(mText.substr(begin, mAt - begin)));
+    }
+
+    /// Bare characters. An apostrophe within a word belongs to it (O'Brien); a dot before a
+    /// bracket ends it.
+    std::optional<Error> word() {
+        const std::size_t begin = mAt++;
+        while (mAt < mText.size() && !isSpace(mText[mAt]) &&
+               (mText[mAt] == u'\'' || !isSpecial(mText[mAt])))
+            ++mAt;
+        const bool qualifies = mAt < mText.size() && mText[mAt] == u'[' && mAt - begin > 1 &&
+                               mText[mAt - 1] == u'.';
+        if (!qualifies) return add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
+        --mAt;
+        add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
+        return single(TokenKind::dot);
+    }
+
+    StringView mText;
+    std::size_t mAt = 0;
+    std::vector<Token> mTokens;
+};
+
+} // namespace
+
+Error errorAt(std::size_t position, StringView what) {
+    String message = u"At character " + platform::decimal(static_cast<std::int64_t>(position) + 1);
+    message += u": ";
+    message += what;
+    message += u'.';
+    return {position, std::move(message)};
+}
+
+std::variant<std::vector<Token>, Error> tokens(StringView text) {
+    if (auto error = unusable(text)) return *error;
+    return Scanner(text).scan();
+}
+
+bool isBlank(StringView text) { return std::all_of(text.begin(), text.end(), isSpace); }
+
+bool isBareName(StringView text) {
+    const auto starts = [](char16_t c) {
+        return (c >= u'a' && c <= u'z') || (c >= u'A' && c <= u'Z') || c == u'_' ||
+               (c >= 0x80 && !isSpace(c));
+    };
+    return !text.empty() && starts(text.front()) &&
+           std::all_of(text.begin(), text.end(), [&](char16_t c) {
+               return starts(c) || (c >= u'0' && c <= u'9') || c == u'$';
+           });
+}
+
+bool isKeyword(const Token& token, StringView keyword) {
+    return token.kind == TokenKind::word && sameName(token.text, keyword);
+}
+
+} // namespace model::criteria

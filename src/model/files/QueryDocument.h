@@ -1,0 +1,58 @@
+#pragma once
+
+#include "model/Query.h"
+#include "model/Result.h"
+
+#include <filesystem>
+#include <memory>
+#include <string>
+#include <string_view>
+
+/// Queries as files. The format is described in docs/file-format.md.
+namespace files {
+
+/// What went wrong, where, and what to do about it: one line of UTF-8, ready to be shown to a user.
+struct Error {
+    std::string text;
+};
+
+template <class T>
+using Result = model::Result<T, Error>;
+
+/// What a file has beyond what this version knows.
+struct Unknown;
+
+/// A query as a file holds it. A document made from a query alone has nothing beyond it. What the
+/// file said beyond this version's knowledge belongs to the object it stood at, by that object's
+/// key, and is written again as long as the object is there.
+struct QueryDocument {
+    QueryDocument() = default;
+    QueryDocument(platform::Ref<model::Query> query) : query(std::move(query)) {}
+
+    platform::Ref<model::Query> query = platform::makeRef<model::Query>();
+    std::shared_ptr<const Unknown> unknown = {};
+};
+
+/// The version that is written; older ones are read.
+inline constexpr int currentVersion = 2;
+
+/// The document as JSON. Refused when a text in the query has half a character (an unpaired
+/// surrogate) or the query goes beyond the limits of a file: what is written can be read again,
+/// and is the same then.
+Result<std::string> toJson(const QueryDocument& document);
+
+/// The document that a text holds: UTF-8, of this version or an older one. Refuses everything else
+/// and says in which line or under which JSON pointer the fault is.
+Result<QueryDocument> fromJson(std::string_view text);
+
+/// The path of the file as saved or loaded.
+using Path = std::filesystem::path;
+
+/// Writes a file beside the old one and puts it in the old one's place when all of it is on the
+/// disk; on a failure the old file is as it was and no other is left. A link stays a link, and the
+/// file's permissions stay. Nothing on success.
+std::optional<Error> saveQuery(const Path& path, const QueryDocument& document);
+
+Result<QueryDocument> loadQuery(const Path& path);
+
+} // namespace files

@@ -1,0 +1,16 @@
+#pragma once
+
+#include "model/files/Json.h"
+
+#include <map>
+
+namespace files {
+
+/// Members of the file that this version does not know, by the object that they stand in: "" the
+/// file itself, "lastKeys", then by keys "t1", "t1/source", "t1/place", "c1", "j1", "j1/left",
+/// "j1/right", "x1", "x1/4" (the criterion of row 4).
+struct Unknown {
+    std::map<std::string, json::Members> membersOf = {};
+};
+
+} // namespace files

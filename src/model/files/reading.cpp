@@ -1,0 +1,179 @@
+#include "model/files/JsonReader.h"
+#include "model/files/QueryDocument.h"
+#include "model/files/Unknown.h"
+#include "model/files/limits.h"
+#include "model/files/migrations.h"
+#include "model/files/words.h"
+
+#include <functional>
+
+namespace files {
+
+namespace {
+
+using platform::String;
+
+/// Makes a record of the query of what stands in a file, and puts aside what it does not know.
+class Reader {
+public:
+    void read(json::Value file);
+
+    model::QueryRecord record = {};
+    Unknown unknown = {};
+
+private:
+    void table(Object object);
+    model::ColumnRecord column(Object object);
+    void join(Object object);
+    model::EndRecord end(Object object, const std::string& owner);
+    void definition(Object object);
+
+    static void each(json::Items items, const Pointer& list,
+                     const std::function<void(Object)>& use) {
+        for (std::size_t n = 0; n < items.size(); ++n) use({std::move(items[n]), list / n});
+    }
+
+    void keep(Object&& object, const std::string& owner) {
+        json::Members members = std::move(object).unknown();
+        if (!members.empty()) unknown.membersOf[owner] = std::move(members);
+    }
+
+    std::size_t mColumns = 0;
+};
+
+void Reader::read(json::Value file) {
+    Object object(std::move(file), {});
+    auto tables = object.list("tables", limits::tables);
+    auto joins = object.list("joins", limits::joins);
+    auto definitions = object.list("definitions", limits::definitions);
+    Object last = object.object("lastKeys");
+    record.lastKeys = {last.integer<std::int32_t>("table"), last.integer<std::int32_t>("column"),
+                       last.integer<std::int32_t>("join"),
+                       last.integer<std::int32_t>("definition")};
+    keep(std::move(last), "lastKeys");
+    each(std::move(tables), object.place() / "tables", [&](Object each) { table(std::move(each)); });
+    each(std::move(joins), object.place() / "joins", [&](Object each) { join(std::move(each)); });
+    each(std::move(definitions), object.place() / "definitions",
+         [&](Object each) { definition(std::move(each)); });
+    keep(std::move(object), "");
+}
+
+void Reader::table(Object object) {
+    model::TableRecord table;
+    table.key = object.text("key");
+    table.name = object.text("name");
+    table.selected = object.integer<std::int16_t>("selected", std::int16_t{0});
+    Object source = object.object("source");
+    table.schema = source.text("schema", String());
+    table.sourceName = source.text("name");
+    Object place = object.objectOrNone("place");
+    table.left = place.integer<std::int32_t>("left", table.left);
+    table.top = place.integer<std::int32_t>("top", table.top);
+    table.width = place.integer<std::int32_t>("width", table.width);
+    table.height = place.integer<std::int32_t>("height", table.height);
+    auto columns = object.list("columns", limits::columnsOfTable);
+    mColumns += columns.size();
+    if (mColumns > limits::columns)
+        refuse(object.place() / "columns", "makes the columns of all tables more than " +
+                                               std::to_string(limits::columns));
+    each(std::move(columns), object.place() / "columns",
+         [&](Object each) { table.columns.push_back(column(std::move(each))); });
+
+    const std::string key = platform::toUtf8(table.key);
+    keep(std::move(source), key + "/source");
+    keep(std::move(place), key + "/place");
+    keep(std::move(object), key);
+    record.tables.push_back(std::move(table));
+}
+
+model::ColumnRecord Reader::column(Object object) {
+    model::ColumnRecord column;
+    column.key = object.text("key");
+    column.description.name = object.text("name");
+    column.description.type =
+        static_cast<model::ColumnType>(object.word("type", words::columnTypes, 0));
+    column.description.declaredType = object.text("declaredType", String());
+    column.description.primaryKey = object.flag("primaryKey", false);
+    column.selected = object.flag("selected", false);
+    keep(std::move(object), platform::toUtf8(column.key));
+    return column;
+}
+
+void Reader::join(Object object) {
+    model::JoinRecord join;
+    join.key = object.text("key");
+    const std::string key = platform::toUtf8(join.key);
+    join.left = end(object.object("left"), key + "/left");
+    join.right = end(object.object("right"), key + "/right");
+    join.type = object.word("type", words::joinTypes, 0);
+    join.comparison = object.word("operator", words::comparisons, 0);
+    keep(std::move(object), key);
+    record.joins.push_back(std::move(join));
+}
+
+model::EndRecord Reader::end(Object object, const std::string& owner) {
+    model::EndRecord end{object.textOrNull("table"), object.textOrNull("column")};
+    keep(std::move(object), owner);
+    return end;
+}
+
+void Reader::definition(Object object) {
+    model::DefinitionRecord definition;
+    definition.key = object.text("key");
+    definition.column = object.textOrNull("column");
+    definition.synonym = object.text("synonym", String());
+    definition.sortOrder = object.word("sort", words::sortOrders, 0);
+    definition.visible = object.flag("visible", true);
+    const std::string key = platform::toUtf8(definition.key);
+    each(object.listOrNone("criteria", INT16_MAX), object.place() / "criteria", [&](Object each) {
+        const auto row = each.integer<std::int16_t>("row");
+        definition.criteria.push_back({row, each.text("text")});
+        keep(std::move(each), key + '/' + std::to_string(row));
+    });
+    keep(std::move(object), key);
+    record.definitions.push_back(std::move(definition));
+}
+
+/// Takes the members that say what the file is; refuses what is no query of a version that is
+/// known.
+json::Value current(json::Value file) {
+    constexpr const char* choose = "Choose a query file";
+    auto* members = std::get_if<json::Members>(&file.content);
+    if (!members) refuse({}, "is not an object", choose);
+    const json::Value* format = json::find(*members, "format");
+    const auto* name = format ? std::get_if<std::string>(&format->content) : nullptr;
+    if (!name || *name != words::format)
+        refuse(Pointer() / "format", "is not \"" + std::string(words::format) + '"', choose);
+
+    Object object(std::move(file), {});
+    object.text("format");
+    const auto version = object.integer<std::int32_t>("version");
+    if (version < 1) refuse(Pointer() / "version", "is less than 1");
+    if (version > currentVersion)
+        refuse(Pointer() / "version",
+               "is " + std::to_string(version) + " and newer than " +
+                   std::to_string(currentVersion) + ", the newest that can be read here",
+               "Open the file with a newer version of this program");
+    json::Members rest = std::move(object).unknown();
+    migrate(rest, version);
+    return {std::move(rest)};
+}
+
+} // namespace
+
+Result<QueryDocument> fromJson(std::string_view text) {
+    try {
+        Reader reader;
+        reader.read(current(json::read(text)));
+        if (const auto fault = model::faultOf(reader.record))
+            throw Refusal{'/' + fault->path + ' ' + fault->reason, mendIt};
+        QueryDocument document(model::Query::restored(reader.record));
+        if (!reader.unknown.membersOf.empty())
+            document.unknown = std::make_shared<const Unknown>(std::move(reader.unknown));
+        return document;
+    } catch (const Refusal& refusal) {
+        return Error{refusal.fault + ". " + refusal.advice + '.'};
+    }
+}
+
+} // namespace files

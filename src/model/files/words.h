@@ -1,0 +1,19 @@
+#pragma once
+
+#include "model/files/Object.h"
+
+#include <array>
+
+/// The words of the file, in the order of the codes that they stand for.
+namespace files::words {
+
+inline constexpr std::string_view format = "zandor-query";
+
+/// model::ColumnType
+inline constexpr std::array<std::string_view, 9> columnTypes = {
+    "unknown", "text", "integer", "decimal", "date", "time", "timestamp", "boolean", "blob"};
+inline constexpr std::array<std::string_view, 4> joinTypes = {"inner", "left", "right", "full"};
+inline constexpr std::array<std::string_view, 6> comparisons = {"=", "<>", "<", ">", "<=", ">="};
+inline constexpr std::array<std::string_view, 3> sortOrders = {"none", "ascending", "descending"};
+
+} // namespace files::words

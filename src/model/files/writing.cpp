@@ -1,0 +1,166 @@
+#include "model/files/QueryDocument.h"
+#include "model/files/Unknown.h"
+#include "model/files/limits.h"
+#include "model/files/words.h"
+
+namespace files {
+
+namespace {
+
+using platform::String;
+
+/// A text of the query for the file.
+json::Value textOf(const String& text, const Pointer& place) {
+    std::string utf8 = platform::toUtf8(text);
+    if (platform::fromUtf8(utf8) != text)
+        refuse(place, "has half a character in it (an unpaired surrogate)",
+               "Type that text afresh and save again");
+    return {std::move(utf8)};
+}
+
+json::Value orNull(const String& key) {
+    if (key.empty()) return {};
+    return {platform::toUtf8(key)};
+}
+
+std::string word(Words words, std::int16_t code) {
+    return std::string(words[static_cast<std::size_t>(code)]);
+}
+
+/// Makes the file's content of a record, each object followed by what its version did not know.
+class Writer {
+public:
+    explicit Writer(const Unknown* unknown) : mUnknown(unknown) {}
+
+    json::Value file(const model::QueryRecord& record) const;
+
+private:
+    json::Value table(const model::TableRecord& table, const Pointer& place) const;
+    json::Value column(const model::ColumnRecord& column, const Pointer& place) const;
+    json::Value join(const model::JoinRecord& join) const;
+    json::Value end(const model::EndRecord& end, const std::string& owner) const;
+    json::Value definition(const model::DefinitionRecord& definition, const Pointer& place) const;
+
+    json::Value whole(json::Members members, const std::string& owner) const {
+        if (mUnknown) {
+            const auto at = mUnknown->membersOf.find(owner);
+            if (at != mUnknown->membersOf.end())
+                members.insert(members.end(), at->second.begin(), at->second.end());
+        }
+        return {std::move(members)};
+    }
+
+    const Unknown* mUnknown;
+};
+
+json::Value Writer::file(const model::QueryRecord& record) const {
+    json::Items tables;
+    for (const auto& each : record.tables)
+        tables.push_back(table(each, Pointer() / "tables" / tables.size()));
+    json::Items joins;
+    for (const auto& each : record.joins) joins.push_back(join(each));
+    json::Items definitions;
+    for (const auto& each : record.definitions)
+        definitions.push_back(definition(each, Pointer() / "definitions" / definitions.size()));
+    const model::LastKeys& last = record.lastKeys;
+    return whole({{"format", {std::string(words::format)}},
+                  {"version", json::number(currentVersion)},
+                  {"lastKeys", whole({{"table", json::number(last.table)},
+                                      {"column", json::number(last.column)},
+                                      {"join", json::number(last.join)},
+                                      {"definition", json::number(last.definition)}},
+                                     "lastKeys")},
+                  {"tables", {std::move(tables)}},
+                  {"joins", {std::move(joins)}},
+                  {"definitions", {std::move(definitions)}}},
+                 "");
+}
+
+json::Value Writer::table(const model::TableRecord& table, const Pointer& place) const {
+    json::Items columns;
+    for (const auto& each : table.columns)
+        columns.push_back(column(each, place / "columns" / columns.size()));
+    const std::string key = platform::toUtf8(table.key);
+    return whole(
+        {{"key", {key}},
+         {"name", textOf(table.name, place / "name")},
+         {"source", whole({{"schema", textOf(table.schema, place / "source" / "schema")},
+                           {"name", textOf(table.sourceName, place / "source" / "name")}},
+                          key + "/source")},
+         {"place", whole({{"left", json::number(table.left)},
+                          {"top", json::number(table.top)},
+                          {"width", json::number(table.width)},
+                          {"height", json::number(table.height)}},
+                         key + "/place")},
+         {"selected", json::number(table.selected)},
+         {"columns", {std::move(columns)}}},
+        key);
+}
+
+json::Value Writer::column(const model::ColumnRecord& column, const Pointer& place) const {
+    const model::ColumnDescription& description = column.description;
+    const std::string key = platform::toUtf8(column.key);
+    json::Members members = {{"key", {key}}, {"name", textOf(description.name, place / "name")}};
+    // Most columns are plain, and a table has many.
+    if (description.type != model::ColumnType::Unknown)
+        members.push_back(
+            {"type", {word(words::columnTypes, static_cast<std::int16_t>(description.type))}});
+    if (!description.declaredType.empty())
+        members.push_back(
+            {"declaredType", textOf(description.declaredType, place / "declaredType")});
+    if (description.primaryKey) members.push_back({"primaryKey", {true}});
+    if (column.selected) members.push_back({"selected", {true}});
+    return whole(std::move(members), key);
+}
+
+json::Value Writer::join(const model::JoinRecord& join) const {
+    const std::string key = platform::toUtf8(join.key);
+    return whole({{"key", {key}},
+                  {"left", end(join.left, key + "/left")},
+                  {"right", end(join.right, key + "/right")},
+                  {"type", {word(words::joinTypes, join.type)}},
+                  {"operator", {word(words::comparisons, join.comparison)}}},
+                 key);
+}
+
+json::Value Writer::end(const model::EndRecord& end, const std::string& owner) const {
+    return whole({{"table", orNull(end.table)}, {"column", orNull(end.column)}}, owner);
+}
+
+json::Value Writer::definition(const model::DefinitionRecord& definition,
+                               const Pointer& place) const {
+    const std::string key = platform::toUtf8(definition.key);
+    json::Items criteria;
+    for (const auto& [row, text] : definition.criteria)
+        criteria.push_back(
+            whole({{"row", json::number(row)},
+                   {"text", textOf(text, place / "criteria" / criteria.size() / "text")}},
+                  key + '/' + std::to_string(row)));
+    return whole({{"key", {key}},
+                  {"column", orNull(definition.column)},
+                  {"synonym", textOf(definition.synonym, place / "synonym")},
+                  {"sort", {word(words::sortOrders, definition.sortOrder)}},
+                  {"visible", {definition.visible}},
+                  {"criteria", {std::move(criteria)}}},
+                 key);
+}
+
+} // namespace
+
+Result<std::string> toJson(const QueryDocument& document) {
+    const model::QueryRecord record = document.query->record();
+    std::string text;
+    try {
+        text = json::print(Writer(document.unknown.get()).file(record));
+    } catch (const Refusal& refusal) {
+        return Error{refusal.fault + ". " + refusal.advice + '.'};
+    }
+    // Better no file than one that cannot be read, whatever the reason.
+    const auto again = fromJson(text);
+    if (!again) return Error{"The query could not be read again: " + again.error()};
+    if (again->query->record() != record)
+        return Error{"The query would not be the same when read again. Report this, please."};
+    return text;
+}
+
+} // namespace files

@@ -1,0 +1,153 @@
+#include "model/reader/DatabaseReader.h"
+
+#include "model/reader/columnType.h"
+#include "model/reader/rows.h"
+
+namespace reader {
+
+namespace {
+
+/// Reads pg_catalog, which knows materialized views, partitioned and foreign tables and domains;
+/// information_schema knows less, and only what the user owns.
+class PostgresReader final : public DatabaseReader {
+public:
+    explicit PostgresReader(const QSqlDatabase& database) : mDatabase(database) {}
+
+    Result<std::vector<TableEntry>> tables() override;
+    Result<model::TableDescription> table(const TableId& id) override;
+    Result<std::vector<ForeignKey>> foreignKeys(const TableId& child) override;
+
+private:
+    QSqlDatabase mDatabase;
+};
+
+/// A table is of the default schema when a statement finds it there without being told.
+const QString schemaColumn = QStringLiteral(
+    "CASE WHEN %1.nspname = current_schema() AND pg_table_is_visible(%2.oid) THEN '' "
+    "ELSE %1.nspname END");
+
+/// The table that an id names; two parameters, schema and name. Not to_regclass, which reads the
+/// name as SQL does.
+const QString named = QStringLiteral(
+    "n.nspname = coalesce(nullif(?, ''), current_schema()) AND c.relname = ?");
+
+/// What a column's type means. `base` is the declared type or, of a domain, the one it is made
+/// from. Only the engine's own types are known by name: another's may have any.
+model::ColumnType typeOf(const QString& base, const QString& category, bool builtIn) {
+    using model::ColumnType;
+    const char16_t kind = category.isEmpty() ? u'X' : category.front().unicode();
+    switch (kind) {
+    case u'A': // arrays
+    case u'C': // rows
+    case u'R': // ranges
+        return ColumnType::Unknown;
+    case u'E': return ColumnType::Text;
+    default: break;
+    }
+    if (builtIn) return columnType(base.toStdU16String());
+    switch (kind) {
+    case u'B': return ColumnType::Boolean;
+    case u'D': return ColumnType::Timestamp;
+    case u'N': return ColumnType::Decimal;
+    case u'S': return ColumnType::Text;
+    default: return ColumnType::Unknown;
+    }
+}
+
+Result<std::vector<TableEntry>> PostgresReader::tables() {
+    std::vector<TableEntry> entries;
+    const auto error = readRows(
+        mDatabase, QStringLiteral("The list of tables"),
+        QStringLiteral("SELECT %1, c.relname, c.relkind IN ('v', 'm') "
+                       "FROM pg_catalog.pg_class c "
+                       "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
+                       "WHERE c.relkind IN ('r', 'p', 'f', 'v', 'm') "
+                       "AND n.nspname <> 'information_schema' AND n.nspname NOT LIKE 'pg\\_%' "
+                       "ORDER BY lower(c.relname), c.relname, n.nspname")
+            .arg(schemaColumn.arg(QStringLiteral("n"), QStringLiteral("c"))),
+        {}, [&](const QSqlQuery& row) {
+            entries.push_back({{textAt(row, 0), textAt(row, 1)}, row.value(2).toBool()});
+        });
+    if (error) return *error;
+    return entries;
+}
+
+Result<model::TableDescription> PostgresReader::table(const TableId& id) {
+    model::TableDescription description{id.schema, id.name, {}};
+    bool found = false;
+    const QString what = QStringLiteral("The table \"%1\"").arg(toQt(id.name));
+    const auto error = readRows(
+        mDatabase, what,
+        // A table without columns is one row without a name.
+        QStringLiteral(
+            "SELECT a.attname, pg_catalog.format_type(a.atttypid, a.atttypmod), "
+            "pg_catalog.format_type(base.oid, NULL), base.typcategory, "
+            "base.typnamespace = 'pg_catalog'::regnamespace, "
+            "coalesce(a.attnum = ANY (pk.indkey), false) "
+            "FROM pg_catalog.pg_class c "
+            "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
+            "LEFT JOIN pg_catalog.pg_index pk ON pk.indrelid = c.oid AND pk.indisprimary "
+            "LEFT JOIN pg_catalog.pg_attribute a "
+            "ON a.attrelid = c.oid AND a.attnum > 0 AND NOT a.attisdropped "
+            "LEFT JOIN LATERAL (WITH RECURSIVE chain AS ("
+            "SELECT t.oid, t.typbasetype, t.typcategory, t.typnamespace "
+            "FROM pg_catalog.pg_type t WHERE t.oid = a.atttypid UNION ALL "
+            "SELECT t.oid, t.typbasetype, t.typcategory, t.typnamespace "
+            "FROM chain JOIN pg_catalog.pg_type t ON t.oid = chain.typbasetype) "
+            "SELECT * FROM chain WHERE typbasetype = 0) base ON true "
+            "WHERE c.relkind IN ('r', 'p', 'f', 'v', 'm') AND %1 ORDER BY a.attnum")
+            .arg(named),
+        {toQt(id.schema), toQt(id.name)}, [&](const QSqlQuery& row) {
+            found = true;
+            if (row.isNull(0)) return;
+            description.columns.push_back(
+                {textAt(row, 0),
+                 typeOf(row.value(2).toString(), row.value(3).toString(), row.value(4).toBool()),
+                 textAt(row, 1), row.value(5).toBool()});
+        });
+    if (error) return *error;
+    if (!found)
+        return Error{QStringLiteral("%1 is not in the database; read the list of tables afresh.")
+                         .arg(what)};
+    return description;
+}
+
+Result<std::vector<ForeignKey>> PostgresReader::foreignKeys(const TableId& child) {
+    std::vector<ForeignKey> keys;
+    const auto error = readRows(
+        mDatabase, QStringLiteral("The foreign keys of \"%1\"").arg(toQt(child.name)),
+        // A key to a partitioned table stands there once more for every partition: those are left
+        // out. One that a partition has from its parent is its own.
+        QStringLiteral("SELECT pair.position, %2, p.relname, ca.attname, pa.attname "
+                       "FROM pg_catalog.pg_constraint k "
+                       "JOIN pg_catalog.pg_class c ON c.oid = k.conrelid "
+                       "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
+                       "JOIN pg_catalog.pg_class p ON p.oid = k.confrelid "
+                       "JOIN pg_catalog.pg_namespace pn ON pn.oid = p.relnamespace "
+                       "CROSS JOIN LATERAL unnest(k.conkey, k.confkey) "
+                       "WITH ORDINALITY AS pair(own, other, position) "
+                       "JOIN pg_catalog.pg_attribute ca "
+                       "ON ca.attrelid = k.conrelid AND ca.attnum = pair.own "
+                       "JOIN pg_catalog.pg_attribute pa "
+                       "ON pa.attrelid = k.confrelid AND pa.attnum = pair.other "
+                       "LEFT JOIN pg_catalog.pg_constraint origin ON origin.oid = k.conparentid "
+                       "WHERE k.contype = 'f' AND %1 "
+                       "AND origin.conrelid IS DISTINCT FROM k.conrelid "
+                       "ORDER BY k.oid, pair.position")
+            .arg(named, schemaColumn.arg(QStringLiteral("pn"), QStringLiteral("p"))),
+        {toQt(child.schema), toQt(child.name)}, [&](const QSqlQuery& row) {
+            if (row.value(0).toInt() == 1)
+                keys.push_back({child, {textAt(row, 1), textAt(row, 2)}, {}});
+            keys.back().columns.emplace_back(textAt(row, 3), textAt(row, 4));
+        });
+    if (error) return *error;
+    return keys;
+}
+
+} // namespace
+
+std::unique_ptr<DatabaseReader> makePostgresReader(const QSqlDatabase& database) {
+    return std::make_unique<PostgresReader>(database);
+}
+
+} // namespace reader

@@ -1,0 +1,126 @@
+#include "model/reader/Connection.h"
+
+#include "model/reader/rows.h"
+#include "model/reader/serverError.h"
+
+#include <QSqlQuery>
+#include <QUrl>
+#include <QUrlQuery>
+#include <QUuid>
+
+#include <algorithm>
+#include <array>
+#include <optional>
+
+namespace reader {
+
+namespace {
+
+struct Engine {
+    const char* scheme;
+    const char* driver;
+    const char* name;
+    const char* package; ///< of Debian, with the driver
+    const char* options; ///< for the driver
+    /// Makes the session one that cannot write.
+    const char* readOnly;
+};
+
+constexpr std::array<Engine, 5> engines = {{
+    {"postgresql", "QPSQL", "PostgreSQL", "libqt6sql6-psql", "",
+     "SET default_transaction_read_only = on"},
+    {"postgres", "QPSQL", "PostgreSQL", "libqt6sql6-psql", "",
+     "SET default_transaction_read_only = on"},
+    {"mysql", "QMYSQL", "MySQL", "libqt6sql6-mysql", "MYSQL_OPT_CONNECT_TIMEOUT=10",
+     "SET SESSION TRANSACTION READ ONLY"},
+    {"mariadb", "QMYSQL", "MariaDB", "libqt6sql6-mysql", "MYSQL_OPT_CONNECT_TIMEOUT=10",
+     "SET SESSION TRANSACTION READ ONLY"},
+    {"odbc", "QODBC", "ODBC", "libqt6sql6-odbc",
+     "SQL_ATTR_ACCESS_MODE=SQL_MODE_READ_ONLY;SQL_ATTR_LOGIN_TIMEOUT=10", nullptr},
+}};
+
+const QString example = QStringLiteral("write it like postgresql://user@host:5432/database");
+
+/// The options of an address as the driver of PostgreSQL takes them, or what is wrong with them.
+/// They go into a line that the driver makes, so only known names get there, and values in quotes.
+Result<QString> postgresOptions(const QUrlQuery& query) {
+    static const QStringList known = {
+        QStringLiteral("sslmode"), QStringLiteral("sslrootcert"),     QStringLiteral("sslcert"),
+        QStringLiteral("sslkey"),  QStringLiteral("connect_timeout"),
+        QStringLiteral("application_name")};
+    QString options;
+    bool timed = false;
+    for (auto [name, value] : query.queryItems(QUrl::FullyDecoded)) {
+        if (name == QStringLiteral("host")) continue;
+        if (!known.contains(name))
+            return Error{QStringLiteral("The address has an unknown option \"%1\"; known are %2 "
+                                        "and host.")
+                             .arg(name.simplified(), known.join(QStringLiteral(", ")))};
+        if (value.contains(u';'))
+            return Error{QStringLiteral("The option %1 of the address has a semicolon in it; use "
+                                        "a value without one.")
+                             .arg(name)};
+        timed = timed || name == QStringLiteral("connect_timeout");
+        value.replace(u'\\', QStringLiteral("\\\\")).replace(u'\'', QStringLiteral("\\'"));
+        options += QStringLiteral("%1='%2';").arg(name, value);
+    }
+    if (!timed) options += QStringLiteral("connect_timeout=10");
+    return options;
+}
+
+Result<Connection> openServer(const Engine& engine, const QUrl& url, const QString& password) {
+    const QString driver = QLatin1String(engine.driver);
+    if (!QSqlDatabase::isDriverAvailable(driver))
+        return Error{QStringLiteral("The Qt driver for %1 is missing; install it (Debian: apt "
+                                    "install %2).")
+                         .arg(QLatin1String(engine.name), QLatin1String(engine.package))};
+    QString options = QLatin1String(engine.options);
+    const QUrlQuery query(url.query());
+    if (driver == QStringLiteral("QPSQL")) {
+        const auto made = postgresOptions(query);
+        if (!made) return Error{made.error()};
+        options = *made;
+    }
+
+    Connection connection(QSqlDatabase::addDatabase(
+        driver, QUuid::createUuid().toString(QUuid::WithoutBraces)));
+    QSqlDatabase database = connection.database();
+    const QString folder = query.queryItemValue(QStringLiteral("host"), QUrl::FullyDecoded);
+    database.setHostName(folder.isEmpty() ? url.host() : folder);
+    if (url.port() > 0) database.setPort(url.port());
+    database.setDatabaseName(driver == QStringLiteral("QODBC") ? url.host() : url.path().mid(1));
+    database.setUserName(url.userName());
+    database.setPassword(password.isEmpty() ? url.password() : password);
+    database.setConnectOptions(options);
+    const QString opening = QStringLiteral("The database %1 cannot be opened")
+                                .arg(url.toDisplayString(QUrl::RemoveQuery).simplified());
+    if (!database.open()) return serverError(opening, database.lastError());
+    if (engine.readOnly) {
+        QSqlQuery statement(database);
+        if (!statement.exec(QLatin1String(engine.readOnly)))
+            return serverError(opening, statement.lastError());
+    }
+    return connection;
+}
+
+} // namespace
+
+Result<Connection> openDatabase(const QString& address, const QString& password) {
+    if (!address.contains(QStringLiteral("://"))) return openSqlite(address);
+    const QUrl url(address, QUrl::StrictMode);
+    if (url.isLocalFile()) return openSqlite(url.toLocalFile());
+    const auto engine = std::find_if(engines.begin(), engines.end(), [&](const Engine& each) {
+        return url.scheme() == QLatin1String(each.scheme);
+    });
+    // Not the address itself: what cannot be read may have a password at any place.
+    if (!url.isValid())
+        return Error{QStringLiteral("The address of the database cannot be read; %1, with %XX for "
+                                    "a character that means something else there.")
+                         .arg(example)};
+    if (engine == engines.end())
+        return Error{QStringLiteral("There is no kind of database \"%1\"; %2.")
+                         .arg(url.scheme(), example)};
+    return openServer(*engine, url, password);
+}
+
+} // namespace reader

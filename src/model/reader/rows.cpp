@@ -1,0 +1,40 @@
+#include "model/reader/rows.h"
+
+#include "model/reader/serverError.h"
+#include "model/reader/sqliteError.h"
+
+namespace reader {
+
+QString toQt(const platform::String& text) { return QString::fromStdU16String(text); }
+
+platform::String textAt(const QSqlQuery& row, int column) {
+    return row.value(column).toString().toStdU16String();
+}
+
+std::optional<Error> readRows(const QSqlDatabase& database, const QString& what,
+                              const QString& statement, const QVariantList& parameters,
+                              const std::function<void(const QSqlQuery&)>& use) {
+    QSqlQuery query(database);
+    query.setForwardOnly(true);
+    // Without parameters it goes to the engine in one step.
+    bool done = false;
+    if (parameters.isEmpty()) {
+        done = query.exec(statement);
+    } else {
+        done = query.prepare(statement);
+        for (const QVariant& parameter : parameters) query.addBindValue(parameter);
+        done = done && query.exec();
+    }
+    while (done && query.next()) use(query);
+    // A failure between two rows ends the loop like the last row does.
+    if (done && !query.lastError().isValid()) return {};
+    return databaseError(database, QStringLiteral("%1 cannot be read").arg(what),
+                         query.lastError());
+}
+
+Error databaseError(const QSqlDatabase& database, const QString& failed, const QSqlError& error) {
+    if (database.driverName() == QStringLiteral("QSQLITE")) return sqliteError(failed, error);
+    return serverError(failed, error);
+}
+
+} // namespace reader

@@ -1,0 +1,13 @@
+#pragma once
+
+#include "model/reader/Result.h"
+
+#include <QSqlError>
+
+namespace reader {
+
+/// An error of an engine behind a network: its own words in one line, and what to do about it as
+/// far as the words tell. `failed` is what could not be done, without a full stop.
+Error serverError(const QString& failed, const QSqlError& error);
+
+} // namespace reader

@@ -1,0 +1,30 @@
+#pragma once
+
+#include "model/sql/Dialect.h"
+
+namespace model::sql {
+
+/// Whether values leave beside the statement, for running it, or within it, for showing it.
+enum class ValueForm { bound, literal };
+
+/// What takes the place of one placeholder.
+using Binding = std::variant<Value, Parameter>;
+
+struct Printed {
+    String text;
+    std::vector<Binding> bindings; ///< in the order of the placeholders; parameters in either form
+};
+
+/// Why a dialect cannot say a statement, in one line.
+struct Refusal {
+    enum class Reason { name, join, size };
+
+    Reason reason;
+    String message;
+    String join{}; ///< key of the query's join that is refused
+};
+
+/// The statement in a dialect, one clause a line. The same statement gives the same text.
+std::variant<Printed, Refusal> print(const Statement& statement, Dialect dialect, ValueForm form);
+
+} // namespace model::sql

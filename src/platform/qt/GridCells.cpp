@@ -1,0 +1,52 @@
+#include "platform/qt/GridCells.h"
+
+#include "platform/qt/FocusFrame.h"
+
+#include <QPainter>
+#include <QTableView>
+
+namespace platform::qt {
+
+GridCellDelegate::GridCellDelegate(QTableView& view) : QStyledItemDelegate(&view), mView(view) {}
+
+void GridCellDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
+                             const QModelIndex& index) const {
+    QStyleOptionViewItem cell = option;
+    cell.state &= ~(QStyle::State_Selected | QStyle::State_HasFocus);
+    QStyledItemDelegate::paint(painter, cell, index);
+    if (index != mView.currentIndex()) return;
+    if (mView.hasFocus()) return paintFocusFrame(*painter, option.rect, option.palette);
+    QColor thin = option.palette.color(QPalette::Active, QPalette::Highlight);
+    thin.setAlphaF(0.6F);
+    painter->save();
+    painter->setPen(thin);
+    painter->setBrush(Qt::NoBrush);
+    painter->drawRect(option.rect.adjusted(0, 0, -1, -1));
+    painter->restore();
+}
+
+void paintFixedCell(QPainter& painter, QStyleOptionHeader option, const QWidget& widget) {
+    const QStyle& style = *widget.style();
+    style.drawControl(QStyle::CE_HeaderSection, &option, &painter, &widget);
+    option.rect.adjust(cellMargin, 0, -cellMargin, 0);
+    option.text = option.fontMetrics.elidedText(option.text, Qt::ElideRight, option.rect.width());
+    style.drawControl(QStyle::CE_HeaderLabel, &option, &painter, &widget);
+}
+
+void RowTitles::paintSection(QPainter* painter, const QRect& place, int section) const {
+    QStyleOptionHeader option;
+    initStyleOption(&option);
+    option.rect = place;
+    option.section = section;
+    option.text = model()->headerData(section, orientation(), Qt::DisplayRole).toString();
+    option.textAlignment = Qt::AlignLeft | Qt::AlignVCenter;
+    option.position = count() == 1            ? QStyleOptionHeader::OnlyOneSection
+                      : section == 0          ? QStyleOptionHeader::Beginning
+                      : section + 1 < count() ? QStyleOptionHeader::Middle
+                                              : QStyleOptionHeader::End;
+    painter->save();
+    paintFixedCell(*painter, option, *this);
+    painter->restore();
+}
+
+} // namespace platform::qt

@@ -1,0 +1,47 @@
+#include "QueryText.h"
+
+#include "platform/qt/Text.h"
+
+using platform::qt::toQt;
+
+namespace {
+
+const char* const operators[] = {"=", "<>", "<", ">", "<=", ">="};
+
+QString columnName(model::Query& query, const TalvikZandorLib::ZDColumn* column) {
+    for (std::int32_t i = 1; i <= query.Tables().Count(); ++i) {
+        const auto table = query.Tables().Item(i);
+        for (std::int32_t n = 1; n <= table->Columns().Count(); ++n)
+            if (table->Columns().Item(n).get() == column)
+                return toQt(table->Name() + u"." + column->Name());
+    }
+    return QStringLiteral("(none)");
+}
+
+} // namespace
+
+QString textOf(model::Query& query) {
+    QString text;
+    for (std::int32_t i = 1; i <= query.Tables().Count(); ++i)
+        text += "table " + toQt(query.Tables().Item(i)->Name()) + "\n";
+    for (std::int32_t i = 1; i <= query.Joins().Count(); ++i) {
+        const auto join = query.Joins().Item(i);
+        text += QStringLiteral("join %1 %2 %3, type %4\n")
+                    .arg(columnName(query, join->LeftColumn().get()),
+                         QLatin1String(operators[join->CompareOperator()]),
+                         columnName(query, join->RightColumn().get()))
+                    .arg(join->JoinType());
+    }
+    for (std::int32_t i = 1; i <= query.ColumnDefinitions().Count(); ++i) {
+        const auto definition = query.ColumnDefinitions().Item(i);
+        text += QStringLiteral("column %1 '%2' sort %3 %4")
+                    .arg(columnName(query, definition->Column().get()),
+                         toQt(definition->Synonym()))
+                    .arg(definition->SortOrder())
+                    .arg(QLatin1String(definition->Visible() ? "visible" : "hidden"));
+        for (std::int32_t n = 1; n <= definition->Criteria().Count(); ++n)
+            text += " [" + toQt(definition->Criteria().Item(n)->Criterium()) + "]";
+        text += "\n";
+    }
+    return text;
+}

@@ -1,0 +1,12 @@
+#pragma once
+
+#include "model/Query.h"
+
+#include <QString>
+
+/// What a query is, a line for each table, join and output column:
+///
+///     table orders
+///     join orders.customer_id = customers.id, type 0
+///     column orders.id 'synonym' sort 0 visible [= 1]
+QString textOf(model::Query& query);

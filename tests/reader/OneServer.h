@@ -1,0 +1,52 @@
+#pragma once
+
+#include "model/reader/Connection.h"
+#include "support/PostgresServer.h"
+
+#include <QSqlError>
+#include <QSqlQuery>
+
+#include <gtest/gtest.h>
+
+/// The server of this program, started when first asked for and ended by the last test's end.
+class OneServer : public testing::Environment {
+public:
+    void TearDown() override { mServer.reset(); }
+
+    PostgresServer& server() {
+        if (!mServer) mServer = std::make_unique<PostgresServer>();
+        return *mServer;
+    }
+
+    /// Registered with the first use.
+    static OneServer& instance() {
+        static auto* environment =
+            static_cast<OneServer*>(testing::AddGlobalTestEnvironment(new OneServer));
+        return *environment;
+    }
+
+private:
+    std::unique_ptr<PostgresServer> mServer;
+};
+
+/// Tests with a server, whose environment has to be there before the first test runs.
+[[maybe_unused]] inline OneServer& oneServer = OneServer::instance();
+
+/// Runs statements that may write.
+inline void runOnServer(const QStringList& statements) {
+    const reader::Connection connection(
+        oneServer.server().connect(QStringLiteral("statements")));
+    for (const QString& statement : statements) {
+        QSqlQuery query(connection.database());
+        ASSERT_TRUE(query.exec(statement))
+            << statement.toStdString() << ": " << query.lastError().text().toStdString();
+    }
+}
+
+/// The address of the server's database, as this user or that.
+inline QString serverAddress(const QString& user = QStringLiteral("postgres"),
+                             const QString& database = QStringLiteral("postgres")) {
+    const reader::Connection connection(oneServer.server().connect(QStringLiteral("address")));
+    return QStringLiteral("postgresql://%1@localhost/%2?host=%3")
+        .arg(user, database, connection.database().hostName());
+}

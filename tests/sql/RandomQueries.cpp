@@ -1,0 +1,224 @@
+#include "RandomQueries.h"
+
+#include "model/Library.h"
+
+#include <algorithm>
+#include <cctype>
+#include <stdexcept>
+
+using model::ColumnType;
+using platform::String;
+
+namespace {
+
+constexpr const char16_t* comparisons[] = {u"", u"= ", u"<> ", u"< ", u"> ", u"<= ", u">= "};
+
+const std::vector<String> words = {
+    u"Wien", u"Graz", u"a", u"M", u"'open'", u"\"paid\"", u"O'Brien & Sons", u"'it''s'", u"100 % sure",
+    u"N", u"''", u"Ö", u"'50'", u"'\\'", u"?", u":-)", u"x?y", u"--", u"/* */", u"A\\B"};
+
+const std::vector<String> pieces = {
+    u"'", u"''", u"\"", u"`", u"[", u"]", u"(", u")", u";", u"--", u"/*", u"*/", u"\\", u"\\'",
+    u"%", u"_", u"?", u":x", u"$1", u"$$", u"@a", u"#", u",", u"=", u"<", u">", u"!", u" Or ",
+    u" And ", u" Not ", u" Like ", u" In ", u" Is ", u" Null ", u" Between ", u" Or 1=1", u"1",
+    u"0x", u"union select * from employees", u"; drop table customers; --", u"') or ('1'='1",
+    u"' Or 'a'='a", u"E'\\x27'", u"U&'\\0027'", u"\n", u"\t", u"\u00A0", u"\u2019", u"\uFF07",
+    u"\u202E", u"😀", u"é", u"\uFFFF", u"[orders].[id]", u"customers.name", u"abc", u" ", u" ",
+    u"word", u"{d '2024-01-01'}", u"N'x'", u"x'00'", u"current_user", u"null"};
+
+} // namespace
+
+RandomQueries::RandomQueries(std::uint32_t seed, reader::DatabaseReader& database) : mDice(seed) {
+    const auto entries = database.tables();
+    if (!entries) throw std::runtime_error(entries.error().toStdString());
+    for (const auto& entry : *entries) {
+        const auto table = database.table(entry.id);
+        if (!table) throw std::runtime_error(table.error().toStdString());
+        mTables.push_back(*table);
+    }
+}
+
+platform::Ref<model::Query> RandomQueries::next() {
+    const auto query = platform::makeRef<model::Query>();
+    const std::size_t tables = 1 + mDice.roll(4);
+    for (std::size_t i = 0; i < tables; ++i) {
+        const auto table = query->addTable(mDice.pick(mTables));
+        if (mDice.oneIn(6))
+            query->renameTable(table, u"odd \"name\"; " + platform::decimal(static_cast<int>(i)));
+    }
+    // As many joins as tables now and then, so that there are cycles and islands.
+    const std::size_t joins = tables == 1 ? mDice.roll(6) / 5 : tables - 1 + mDice.roll(3) - 1;
+    for (std::size_t i = 0; i < joins; ++i) addJoin(*query);
+    mColumns.clear();
+    const std::size_t definitions = mDice.roll(5);
+    for (std::size_t i = 0; i < definitions; ++i) addDefinition(*query);
+    return query;
+}
+
+platform::Ref<model::Column> RandomQueries::anyColumn(model::Query& query) {
+    auto& columns =
+        query.Tables()
+            .Item(1 + static_cast<std::int32_t>(
+                          mDice.roll(static_cast<std::size_t>(query.Tables().Count()))))
+            ->Columns();
+    const auto count = static_cast<std::size_t>(columns.Count());
+    return std::static_pointer_cast<model::Column>(
+        columns.Item(2 + static_cast<std::int32_t>(mDice.roll(count - 1))));
+}
+
+void RandomQueries::addJoin(model::Query& query) {
+    static constexpr std::int16_t types[] = {0, 0, 0, 1, 1, 2, 2, 3};
+    static constexpr std::int16_t operators[] = {0, 0, 0, 0, 1, 2, 3, 4, 5};
+    // Most pairs do not fit; the query has a join less when none was found.
+    for (int attempt = 0; attempt < 40; ++attempt) {
+        const auto left = anyColumn(query);
+        const auto right = anyColumn(query);
+        const ColumnType type = left->description().type;
+        const bool sameTable = left->place().table() == right->place().table();
+        if (type != right->description().type || type == ColumnType::Unknown ||
+            type == ColumnType::Blob || (sameTable && !mDice.oneIn(20)))
+            continue;
+        model::Library library;
+        const auto join = library.NewZDJoin();
+        join->LeftColumn(left);
+        join->RightColumn(right);
+        join->JoinType(mDice.pick(types));
+        join->CompareOperator(mDice.pick(operators));
+        query.AddJoin(join);
+        return;
+    }
+}
+
+void RandomQueries::addDefinition(model::Query& query) {
+    model::Library library;
+    const auto definition = library.NewZDColumnDefinition();
+    const auto column = anyColumn(query);
+    const auto table = column->place().table().table();
+    definition->Column(column);
+    if (mDice.oneIn(12)) definition->Column(table->Columns().Item(1));
+    definition->Visible(!mDice.oneIn(6));
+    if (mDice.oneIn(4)) definition->Synonym(mDice.oneIn(2) ? u"s" : u"say \"x?\"");
+    if (mDice.oneIn(3)) definition->SortOrder(static_cast<std::int16_t>(1 + mDice.roll(2)));
+    for (int row = 4; row < 7; ++row)
+        if (mDice.oneIn(2))
+            definition->AddCriterium(criterion(column->description().type), platform::decimal(row));
+    query.AddColumnDefinition(definition);
+    String name;
+    for (const char16_t c : table->Name()) name += c == u']' ? String(u"]]") : String(1, c);
+    mColumns.push_back(u"[" + name + u"].[" + column->Name() + u"]");
+}
+
+String RandomQueries::criterion(ColumnType type) {
+    if (mDice.oneIn(25)) return hostileText();
+    String text = predicate(type);
+    for (int more = 0; more < 3 && mDice.oneIn(3); ++more) {
+        const bool either = mDice.oneIn(2);
+        text = (mDice.oneIn(4) ? u"(" + text + u")" : text) + (either ? u" Or " : u" And ") +
+               (mDice.oneIn(5) ? u"Not (" + predicate(type) + u")" : predicate(type));
+    }
+    return text;
+}
+
+String RandomQueries::predicate(ColumnType type) {
+    const bool text = type == ColumnType::Text;
+    if (type == ColumnType::Blob) return mDice.oneIn(2) ? u"Is Null" : u"Is Not Null";
+    switch (mDice.roll(9)) {
+    case 0: return mDice.oneIn(2) ? u"Is Null" : u"Not Is Null";
+    case 1: return u"Between " + value(type) + u" And " + value(type);
+    case 2: return u"Not In (" + value(type) + u", " + value(type) + u")";
+    case 3: return u"In (" + value(type) + u")";
+    case 4: return u"Not " + value(type);
+    case 5:
+        if (text) return u"Like '" + String(mDice.oneIn(2) ? u"*" : u"?") + u"a[*]_%\\*'";
+        break;
+    case 6:
+        if (text) return u"Not Like *" + String(1, u"aeSr"[mDice.roll(4)]) + u"*";
+        break;
+    case 7:
+        if (!mColumns.empty()) return mDice.pick(comparisons) + mDice.pick(mColumns);
+        break;
+    default: break;
+    }
+    return mDice.pick(comparisons) + value(type);
+}
+
+String RandomQueries::number(std::size_t sides) {
+    return platform::decimal(static_cast<std::int64_t>(mDice.roll(sides)));
+}
+
+String RandomQueries::value(ColumnType type) {
+    switch (type) {
+    case ColumnType::Integer: return (mDice.oneIn(8) ? u"-" : u"") + number(12);
+    case ColumnType::Unknown:
+    case ColumnType::Decimal: return number(90) + u"." + number(100);
+    case ColumnType::Date: return u"2019-0" + platform::decimal(1 + static_cast<int>(mDice.roll(9))) + u"-1" + number(10);
+    case ColumnType::Time: return u"1" + number(10) + u":30";
+    case ColumnType::Timestamp: return u"#2019-01-0" + platform::decimal(1 + static_cast<int>(mDice.roll(9))) + u" 12:00#";
+    case ColumnType::Boolean: return mDice.oneIn(2) ? u"true" : u"no";
+    case ColumnType::Text:
+    case ColumnType::Blob: break;
+    }
+    return mDice.pick(words);
+}
+
+String RandomQueries::hostileText() {
+    String text;
+    const std::size_t count = 1 + mDice.roll(8);
+    for (std::size_t i = 0; i < count; ++i) text += mDice.pick(pieces);
+    return text;
+}
+
+std::string shape(const std::string& sql) {
+    std::string out;
+    const auto add = [&out](const std::string& token) {
+        // "DATE '...'" and "CAST(? AS date)" are one value each.
+        const auto endsWith = [&out](const std::string& end) {
+            return out.size() >= end.size() &&
+                   out.compare(out.size() - end.size(), end.size(), end) == 0;
+        };
+        if (token == "?")
+            for (const char* keyword : {" DATE", " TIME", " TIMESTAMP"})
+                if (endsWith(keyword)) out.erase(out.size() - std::string(keyword).size());
+        out += ' ' + token;
+        for (const char* type :
+             {"bigint", "numeric", "boolean", "date", "time", "timestamp"}) {
+            const std::string cast = std::string(" CAST ( ? AS ") + type + " )";
+            if (endsWith(cast)) out.replace(out.size() - cast.size(), cast.size(), " ?");
+        }
+        if (token == "TRUE" || token == "FALSE") out.replace(out.size() - token.size(), token.size(), "?");
+    };
+    for (std::size_t at = 0; at < sql.size();) {
+        const auto c = static_cast<unsigned char>(sql[at]);
+        const std::size_t begin = at++;
+        if (std::isspace(c)) continue;
+        if (c == '\'' || c == '"') {
+            for (;; ++at) {
+                if (at >= sql.size()) return out + " <open quote>";
+                if (sql[at] != static_cast<char>(c)) continue;
+                if (at + 1 < sql.size() && sql[at + 1] == static_cast<char>(c)) {
+                    ++at;
+                    continue;
+                }
+                ++at;
+                break;
+            }
+            const std::string token = sql.substr(begin, at - begin);
+            const bool isEscape = token == "'\\'" && out.size() > 7 &&
+                                  out.compare(out.size() - 7, 7, " ESCAPE") == 0;
+            add(c == '\'' && !isEscape ? "?" : token);
+        } else if (std::isalpha(c) || c == '_' || c >= 0x80) {
+            while (at < sql.size() && (std::isalnum(static_cast<unsigned char>(sql[at])) ||
+                                       sql[at] == '_' || (sql[at] & 0x80)))
+                ++at;
+            add(sql.substr(begin, at - begin));
+        } else if (std::isdigit(c) || (c == '-' && at < sql.size() && std::isdigit(sql[at]))) {
+            while (at < sql.size() && (std::isalnum(static_cast<unsigned char>(sql[at])) ||
+                                       sql[at] == '.' || (sql[at - 1] == 'e' && std::string("+-").find(sql[at]) != std::string::npos)))
+                ++at;
+            add("?");
+        } else {
+            add(std::string(1, static_cast<char>(c)));
+        }
+    }
+    return out;
+}
