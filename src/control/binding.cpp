@@ -1,6 +1,7 @@
 #include "control/Zandor.h"
 
 #include "control/KeyNumber.h"
+#include "control/canvas/focus.h"
 
 namespace TalvikDBxZandor {
 
@@ -180,13 +181,7 @@ void Zandor::SetCurrentTable(const String& TabName) {
 }
 
 void Zandor::MakeCurrent(Tabulet& table) {
-    if (table.Visible()) {
-        try {
-            table.SetFocus();
-        } catch (...) {
-            // A control that is not on the screen yet cannot take the focus, and need not.
-        }
-    }
+    if (table.Visible()) offerFocus(table);
     table.Activated(true);
     Trace(u"Table found.");
     table.Complete();

@@ -17,6 +17,12 @@ bool sameName(platform::StringView left, platform::StringView right) {
                       [](char16_t a, char16_t b) { return folded(a) == folded(b); });
 }
 
+platform::String oneLine(platform::String text) {
+    for (char16_t& c : text)
+        if (c < u' ' || c == 0x85 || c == 0x2028 || c == 0x2029) c = u' ';
+    return text;
+}
+
 platform::String foldedName(platform::StringView name) {
     platform::String result(name);
     std::transform(result.begin(), result.end(), result.begin(), folded);

@@ -11,4 +11,7 @@ bool sameName(platform::StringView left, platform::StringView right);
 /// The name in the form that all names alike share: equal for two names exactly when sameName.
 platform::String foldedName(platform::StringView name);
 
+/// A text without line breaks: names may have some, messages must not.
+platform::String oneLine(platform::String text);
+
 } // namespace model

@@ -113,6 +113,14 @@ TEST_F(SettingTheFocusBack, GivesTheFocusToAShownGridAndKeepsTheActiveTable) {
     EXPECT_TRUE(stage->look("sprColumn").focused);
 }
 
+TEST_F(SettingTheFocusBack, IsSilentWhenTheGridIsNotOnTheScreenToTakeTheFocus) {
+    control().OnlyJoin(false);
+    Back::sprColumn(control())->Visible(false);
+    activate(0);
+    EXPECT_EQ(activeAfterwards(), 0);
+    EXPECT_FALSE(stage->look("sprColumn").focused);
+}
+
 TEST_F(SettingTheFocusBack, LeavesTheFocusWithATableInReachThoughTheGridIsShown) {
     control().OnlyJoin(false);
     activate(2);

@@ -29,3 +29,13 @@ TEST(AFileOfTheCurrentVersion, IsWrittenAsItWasRead) {
               std::string::npos);
     EXPECT_EQ(jsonOf(documentOf(text)), text);
 }
+
+TEST(ThePageAboutTheFormat, ShowsAFileAsItIsWritten) {
+    const std::string page = contentOf(testFile("../../docs/file-format.md"));
+    const std::string begin = "```json\n";
+    const auto at = page.find(begin);
+    ASSERT_NE(at, std::string::npos);
+    const std::string example =
+        page.substr(at + begin.size(), page.find("```", at + 1) - at - begin.size());
+    EXPECT_EQ(jsonOf(documentOf(example)), example);
+}

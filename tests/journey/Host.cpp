@@ -19,6 +19,7 @@
 #include <QSocketNotifier>
 
 #include <cstdio>
+#include <cstdlib>
 
 #include <unistd.h>
 
@@ -51,11 +52,9 @@ public:
     bool eventFilter(QObject* watched, QEvent* event) override {
         if (auto* over = qobject_cast<QWidget*>(watched);
             over && (event->type() == QEvent::DragEnter || event->type() == QEvent::DragMove))
-            mDraggedOver =
-                over->mapToGlobal(static_cast<QDropEvent*>(event)->position().toPoint());
+            mDraggedOver = over->mapToGlobal(static_cast<QDropEvent*>(event)->position().toPoint());
         // The share of a window manager, of which there is none.
-        if (auto* dialog = qobject_cast<QDialog*>(watched);
-            dialog && event->type() == QEvent::Show)
+        if (auto* dialog = qobject_cast<QDialog*>(watched); dialog && event->type() == QEvent::Show)
             dialog->activateWindow();
         return QObject::eventFilter(watched, event);
     }
@@ -81,10 +80,7 @@ private:
     void read() {
         char buffer[4096];
         const ssize_t count = ::read(STDIN_FILENO, buffer, sizeof buffer);
-        if (count <= 0) { // whoever asks has gone
-            QApplication::exit(1);
-            std::_Exit(1);
-        }
+        if (count <= 0) std::_Exit(1); // whoever asks has gone
         mPending.append(buffer, count);
         for (qsizetype end; (end = mPending.indexOf('\n')) >= 0;) {
             const QString question = QString::fromUtf8(mPending.left(end));
@@ -112,10 +108,10 @@ private:
         if (asked == "active") return QString::fromLatin1(mWidget.isActiveWindow() ? "yes" : "");
         if (asked == "picture") {
             const QRect window = mWidget.geometry();
-            return QString::number(QGuiApplication::primaryScreen()
-                                       ->grabWindow(0, window.x(), window.y(), window.width(),
-                                                    window.height())
-                                       .save(question.mid(8)));
+            return QString::number(
+                QGuiApplication::primaryScreen()
+                    ->grabWindow(0, window.x(), window.y(), window.width(), window.height())
+                    .save(question.mid(8)));
         }
         if (asked == "quit") QApplication::quit();
         return {};

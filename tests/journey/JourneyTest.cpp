@@ -6,6 +6,11 @@
 
 #include <unistd.h>
 
+/// A failed comparison shows the lines.
+void PrintTo(const QStringList& lines, std::ostream* out) {
+    for (const QString& line : lines) *out << "\n  " << line.toStdString();
+}
+
 namespace {
 
 /// From four tables of the sample database to a finished query, and part of the way back.
@@ -137,9 +142,4 @@ int main(int argc, char** argv) {
     const QCoreApplication application(argc, argv);
     testing::InitGoogleTest(&argc, argv);
     return RUN_ALL_TESTS();
-}
-
-/// A failed comparison shows the lines.
-void PrintTo(const QStringList& lines, std::ostream* out) {
-    for (const QString& line : lines) *out << "\n  " << line.toStdString();
 }

@@ -17,8 +17,7 @@ Program::Program(const QString& path, const QStringList& arguments,
     mProcess.start(QStringLiteral("setpriv"),
                    QStringList{"--pdeathsig", "KILL", "--", path} + arguments);
     if (!mProcess.waitForStarted(patience))
-        throw std::runtime_error("setpriv did not start: " +
-                                 mProcess.errorString().toStdString());
+        throw std::runtime_error("setpriv did not start: " + mProcess.errorString().toStdString());
 }
 
 Program::~Program() {

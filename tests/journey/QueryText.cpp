@@ -35,8 +35,7 @@ QString textOf(model::Query& query) {
     for (std::int32_t i = 1; i <= query.ColumnDefinitions().Count(); ++i) {
         const auto definition = query.ColumnDefinitions().Item(i);
         text += QStringLiteral("column %1 '%2' sort %3 %4")
-                    .arg(columnName(query, definition->Column().get()),
-                         toQt(definition->Synonym()))
+                    .arg(columnName(query, definition->Column().get()), toQt(definition->Synonym()))
                     .arg(definition->SortOrder())
                     .arg(QLatin1String(definition->Visible() ? "visible" : "hidden"));
         for (std::int32_t n = 1; n <= definition->Criteria().Count(); ++n)

@@ -3,8 +3,8 @@
 #include <stdexcept>
 
 Screen::Screen()
-    : mServer(QStringLiteral("Xvfb"), {"-displayfd", "1", "-screen", "0", "1366x900x24",
-                                       "-nolisten", "tcp", "-noreset"}),
+    : mServer(QStringLiteral("Xvfb"),
+              {"-displayfd", "1", "-screen", "0", "1366x900x24", "-nolisten", "tcp", "-noreset"}),
       mNumber(mServer.line()) {}
 
 void Screen::click(QPoint at, int button) {

@@ -41,8 +41,7 @@ protected:
     Parts targets() {
         auto& list = table(3).list();
         auto& view = grid().view();
-        return {{list.viewport(),
-                 QRectF(list.visualRect(list.model()->index(1, 0))).center()},
+        return {{list.viewport(), QRectF(list.visualRect(list.model()->index(1, 0))).center()},
                 {list.viewport(), QPointF(20, list.viewport()->height() - 2)},
                 {&table(2), QRectF(table(2).titleBar()).center()},
                 {view.viewport(), QPointF(30, 30)},
@@ -97,9 +96,9 @@ protected:
             ++carried;
             meanwhile(drag);
         });
-        auto& list = static_cast<platform::qt::TabuletWidget*>(
-                         from.findChild<QWidget*>("lstTable(1)"))
-                         ->list();
+        auto& list =
+            static_cast<platform::qt::TabuletWidget*>(from.findChild<QWidget*>("lstTable(1)"))
+                ->list();
         const QPointF at = QRectF(list.visualRect(list.model()->index(2, 0))).center();
         hands::mouse(*list.viewport(), QEvent::MouseButtonPress, at, Qt::LeftButton,
                      Qt::LeftButton);

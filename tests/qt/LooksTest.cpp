@@ -1,3 +1,4 @@
+#include "platform/qt/CanvasItems.h"
 #include "qt/Desk.h"
 
 #include <QApplication>
@@ -175,4 +176,67 @@ TEST_F(Looks, UseTheHostsFontForTablesAndGrid) {
     EXPECT_EQ(grid().font().pointSizeF(), 13);
     EXPECT_GE(grid().rowHeight(), QFontMetrics(font).height()) << "no text is cut off";
     widget.reset();
+}
+
+TEST_F(Looks, FrameTheCurrentCellAndFrameItMoreWithTheFocus) {
+    show();
+    bind();
+    widget->activateWindow();
+    auto& view = grid().view();
+    view.setCurrentIndex(view.model()->index(4, 3)); // an empty one
+    const QColor highlight = widget->palette().color(QPalette::Active, QPalette::Highlight);
+    const auto pixel = [&](QPoint inside) {
+        const QImage image = view.viewport()->grab().toImage();
+        const QPoint at = view.visualRect(view.currentIndex()).topLeft() + inside;
+        return image.pixelColor((QPointF(at) * image.devicePixelRatio()).toPoint());
+    };
+    table(1).list().setFocus();
+    settle();
+    EXPECT_EQ(pixel({10, 8}), widget->palette().color(QPalette::Base)) << "no block";
+    EXPECT_NE(pixel({10, 0}), widget->palette().color(QPalette::Base));
+    EXPECT_EQ(pixel({10, 1}), widget->palette().color(QPalette::Base)) << "thin";
+    view.setFocus();
+    settle();
+    EXPECT_EQ(pixel({10, 8}), widget->palette().color(QPalette::Base));
+    EXPECT_EQ(pixel({10, 0}), highlight);
+    EXPECT_EQ(pixel({10, 1}), highlight);
+}
+
+TEST_F(Looks, KeepTheRowTitlesAwayFromTheFrame) {
+    show();
+    bind();
+    const auto leftmost = [](QWidget& part, QRect row) {
+        const QImage image = part.grab(row.adjusted(1, 2, -1, -2)).toImage();
+        for (int x = 0; x < image.width(); ++x)
+            for (int y = 0; y < image.height(); ++y)
+                if (image.pixelColor(x, y).lightness() < 110)
+                    return x / image.devicePixelRatio() + 1;
+        return -1.0;
+    };
+    auto& titles = *grid().view().verticalHeader();
+    const int height = grid().rowHeight();
+    const QRect first(0, 0, grid().cellRect(1, 0).width(), height);
+    EXPECT_GE(leftmost(*titles.viewport(), first), 4);
+    EXPECT_LE(leftmost(*titles.viewport(), first), 9);
+}
+
+TEST_F(Looks, ShowTheLineWithTheFocus) {
+    show();
+    bind();
+    widget->activateWindow();
+    auto& canvas = child<platform::qt::Canvas>("fraTable");
+    auto* line = canvas.lines().front();
+    const QPoint mark = (line->at(0) / 15).toPoint() - QPoint(5, 0);
+    const auto colour = [&](QPoint at) {
+        const QImage image = canvas.grab().toImage();
+        return image.pixelColor((QPointF(at) * image.devicePixelRatio()).toPoint());
+    };
+    const QColor highlight = widget->palette().color(QPalette::Active, QPalette::Highlight);
+    EXPECT_NE(colour(mark), highlight);
+    canvas.focusOn(line, Qt::TabFocusReason);
+    settle();
+    EXPECT_EQ(colour(mark), highlight) << "the mark at its end is filled";
+    table(1).list().setFocus();
+    settle();
+    EXPECT_NE(colour(mark), highlight);
 }

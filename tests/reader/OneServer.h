@@ -29,14 +29,15 @@ private:
     std::unique_ptr<PostgresServer> mServer;
 };
 
-/// Tests with a server, whose environment has to be there before the first test runs.
+/// Here, because an environment has to be there before the first test runs.
 [[maybe_unused]] inline OneServer& oneServer = OneServer::instance();
 
 /// Runs statements that may write.
 inline void runOnServer(const QStringList& statements) {
     const reader::Connection connection(
         oneServer.server().connect(QStringLiteral("statements")));
-    for (const QString& statement : statements) {
+    const QStringList quiet{QStringLiteral("SET client_min_messages = warning")};
+    for (const QString& statement : quiet + statements) {
         QSqlQuery query(connection.database());
         ASSERT_TRUE(query.exec(statement))
             << statement.toStdString() << ": " << query.lastError().text().toStdString();

@@ -46,8 +46,8 @@ Table table(const std::string& text) {
 /// "a.x = b.y", "left a.x = b.y", or a list of the four parts.
 Join join(const json& value) {
     if (value.is_array())
-        return {names(value.at(1)), names(value.at(3)),
-                positionIn(types, value.at(0)), positionIn(operators, value.at(2))};
+        return {names(value.at(1)), names(value.at(3)), positionIn(types, value.at(0)),
+                positionIn(operators, value.at(2))};
     std::string text = value;
     int type = 0;
     for (std::size_t i = 1; i < types.size(); ++i) {
@@ -91,7 +91,8 @@ Case readCase(const json& from) {
     if (from.contains("sql"))
         for (const auto& [dialects, text] : from["sql"].items())
             for (const auto dialect : model::sql::allDialects)
-                if ((", " + dialects + ",").find(", " + corpus::nameOf(dialect) + ",") != std::string::npos)
+                if ((", " + dialects + ",").find(", " + corpus::nameOf(dialect) + ",") !=
+                    std::string::npos)
                     to.sql[corpus::nameOf(dialect)] = lines(text);
     if (from.contains("findings"))
         for (const json& value : from["findings"])
@@ -124,11 +125,16 @@ std::vector<Case> read(const std::string& directory) {
 
 std::string nameOf(model::sql::Dialect dialect) {
     switch (dialect) {
-    case model::sql::Dialect::SQLite: return "sqlite";
-    case model::sql::Dialect::PostgreSQL: return "postgresql";
-    case model::sql::Dialect::MySQL: return "mysql";
-    case model::sql::Dialect::SqlServer: return "sqlserver";
-    case model::sql::Dialect::Standard: break;
+    case model::sql::Dialect::SQLite:
+        return "sqlite";
+    case model::sql::Dialect::PostgreSQL:
+        return "postgresql";
+    case model::sql::Dialect::MySQL:
+        return "mysql";
+    case model::sql::Dialect::SqlServer:
+        return "sqlserver";
+    case model::sql::Dialect::Standard:
+        break;
     }
     return "standard";
 }
@@ -136,16 +142,26 @@ std::string nameOf(model::sql::Dialect dialect) {
 std::string nameOf(model::Finding::Kind kind) {
     using Kind = model::Finding::Kind;
     switch (kind) {
-    case Kind::noTables: return "noTables";
-    case Kind::definitionWithoutColumn: return "definitionWithoutColumn";
-    case Kind::sortOnAllColumns: return "sortOnAllColumns";
-    case Kind::duplicateOutputName: return "duplicateOutputName";
-    case Kind::cartesianProduct: return "cartesianProduct";
-    case Kind::incomparableJoin: return "incomparableJoin";
-    case Kind::ambiguousOuterJoin: return "ambiguousOuterJoin";
-    case Kind::badCriterion: return "badCriterion";
-    case Kind::nameNotCarried: return "nameNotCarried";
-    case Kind::notInDialect: break;
+    case Kind::noTables:
+        return "noTables";
+    case Kind::definitionWithoutColumn:
+        return "definitionWithoutColumn";
+    case Kind::sortOnAllColumns:
+        return "sortOnAllColumns";
+    case Kind::duplicateOutputName:
+        return "duplicateOutputName";
+    case Kind::cartesianProduct:
+        return "cartesianProduct";
+    case Kind::incomparableJoin:
+        return "incomparableJoin";
+    case Kind::ambiguousOuterJoin:
+        return "ambiguousOuterJoin";
+    case Kind::badCriterion:
+        return "badCriterion";
+    case Kind::nameNotCarried:
+        return "nameNotCarried";
+    case Kind::notInDialect:
+        break;
     }
     return "notInDialect";
 }

@@ -45,10 +45,10 @@ struct Case {
     std::vector<Table> tables;
     std::vector<Join> joins;
     std::vector<Column> columns;
-    std::map<std::string, std::string> answers;  ///< to parameters, as a user types them
-    std::map<std::string, std::string> sql;      ///< by dialect, with the values written out
-    std::vector<ExpectedFinding> findings;       ///< for the first dialect of `sql`, else SQLite
-    std::string reference;                       ///< empty when there is nothing to run
+    std::map<std::string, std::string> answers; ///< to parameters, as a user types them
+    std::map<std::string, std::string> sql;     ///< by dialect, with the values written out
+    std::vector<ExpectedFinding> findings;      ///< for the first dialect of `sql`, else SQLite
+    std::string reference;                      ///< empty when there is nothing to run
 };
 
 /// The cases of every file of a directory, in the order of the files' names. Throws

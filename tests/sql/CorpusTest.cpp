@@ -97,8 +97,7 @@ TEST(TheCorpus, FindsTheRowsOfItsReferenceQueriesOnBothEngines) {
             const auto text = model::sql::statementText(*query, dialect, ValueForm::bound);
             ASSERT_TRUE(text.runnable());
             Outcome ours = sampleEngines().run(dialect, text, drawn.answers);
-            Outcome theirs =
-                sampleEngines().run(dialect, QString::fromStdString(drawn.reference));
+            Outcome theirs = sampleEngines().run(dialect, QString::fromStdString(drawn.reference));
             ASSERT_EQ(ours.error.toStdString(), "") << toUtf8(text.text);
             ASSERT_EQ(theirs.error.toStdString(), "") << drawn.reference;
             EXPECT_FALSE(theirs.rows.isEmpty()) << "a reference that proves nothing";
@@ -128,8 +127,7 @@ TEST(TheCorpus, FindsTheSameRowsWithTheValuesWrittenOut) {
             const Outcome outcome =
                 sampleEngines().run(dialect, QString::fromStdU16String(literal.text));
             ASSERT_EQ(outcome.error.toStdString(), "") << toUtf8(literal.text);
-            EXPECT_TRUE(sorted(outcome.rows) ==
-                        sorted(sampleEngines().run(dialect, bound).rows))
+            EXPECT_TRUE(sorted(outcome.rows) == sorted(sampleEngines().run(dialect, bound).rows))
                 << toUtf8(literal.text);
         }
     }

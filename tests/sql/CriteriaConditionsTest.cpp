@@ -46,7 +46,8 @@ TEST_F(ACondition, MayBeBetweenTwoValues) {
     EXPECT_EQ(condition(u"text", u"Between A b And C d"), "t.text BETWEEN 'A b' AND 'C d'");
     EXPECT_EQ(condition(u"on_day", u"Not Between 2024-01-01 And #2024-12-31#"),
               "t.on_day NOT BETWEEN '2024-01-01' AND '2024-12-31'");
-    EXPECT_EQ(condition(u"whole", u"Between [low] And t.number"), "t.whole BETWEEN :low AND t.number");
+    EXPECT_EQ(condition(u"whole", u"Between [low] And t.number"),
+              "t.whole BETWEEN :low AND t.number");
 }
 
 TEST_F(ACondition, MayBeOneOfAList) {
@@ -67,7 +68,8 @@ TEST_F(ACondition, MayBeAPattern) {
     EXPECT_EQ(condition(u"text", u"Like '[x] [] ['"), "t.text LIKE '[x] [] ['");
     EXPECT_EQ(condition(u"text", u"Like ''"), "t.text LIKE ''");
     EXPECT_EQ(condition(u"anything", u"Like 4*"), "t.anything LIKE '4%'");
-    EXPECT_EQ(condition(u"text", u"Like [the pattern]"), "t.text LIKE :\"the pattern\" ESCAPE '\\'");
+    EXPECT_EQ(condition(u"text", u"Like [the pattern]"),
+              "t.text LIKE :\"the pattern\" ESCAPE '\\'");
 }
 
 TEST_F(ACondition, MayAskForAPatternWhichIsMarkedAsOne) {
@@ -89,8 +91,8 @@ TEST_F(ACondition, MayBeOfNothing) {
 }
 
 TEST_F(ACondition, MayNameAColumnInAnyMixOfBracketsAndCases) {
-    for (const auto* text : {u"t.number", u"[t].[number]", u"t.[number]", u"[t].number", u"T.NUMBER",
-                             u"[number]", u"= [Number]"})
+    for (const auto* text : {u"t.number", u"[t].[number]", u"t.[number]", u"[t].number",
+                             u"T.NUMBER", u"[number]", u"= [Number]"})
         EXPECT_EQ(condition(u"whole", text), "t.whole = t.number") << platform::toUtf8(text);
 }
 

@@ -87,7 +87,8 @@ TEST_F(ABadCriterion, UsesAnOperatorOfAnotherLanguage) {
 TEST_F(ABadCriterion, UsesAPatternWhereThereIsNoText) {
     expectError(u"whole", u"1 Or Like '1*'", 5,
                 "expected a comparison, Like works on columns that hold text");
-    expectError(u"text", u"Like [t].[text]", 5, "expected a pattern, as in Like 'A*', not a column");
+    expectError(u"text", u"Like [t].[text]", 5,
+                "expected a pattern, as in Like 'A*', not a column");
     expectError(u"text", u"Like [text]", 5, "expected a pattern, as in Like 'A*', not a column");
 }
 

@@ -66,9 +66,9 @@ TEST_F(AValue, OfADateColumnIsADayOfTheCalendar) {
     EXPECT_EQ(condition(u"on_day", u"2000-2-29"), "t.on_day = '2000-02-29'");
     EXPECT_EQ(condition(u"on_day", u"#2024-12-31#"), "t.on_day = '2024-12-31'");
     EXPECT_EQ(condition(u"on_day", u"'0001-01-01'"), "t.on_day = '0001-01-01'");
-    for (const auto* text : {u"2023-02-29", u"1900-02-29", u"2024-13-01", u"2024-00-10",
-                             u"2024-04-31", u"2024-01-00", u"0000-01-01", u"24-01-01", u"2024/1/1",
-                             u"2024-01-01 10:00", u"tomorrow", u"##"})
+    for (const auto* text :
+         {u"2023-02-29", u"1900-02-29", u"2024-13-01", u"2024-00-10", u"2024-04-31", u"2024-01-00",
+          u"0000-01-01", u"24-01-01", u"2024/1/1", u"2024-01-01 10:00", u"tomorrow", u"##"})
         EXPECT_EQ(condition(u"on_day", text), "At character 1: expected a date (2024-12-31).")
             << platform::toUtf8(text);
 }

@@ -112,15 +112,15 @@ TEST(AName, IsNotCarriedByMySqlWhenItLiesBeyondTheBasicPlaneOrEndsWithABlank) {
 
 TEST(AName, IsShortenedInAMessageBetweenTwoCharacters) {
     const platform::String name = platform::String(39, u'n') + u"😀" + platform::String(99, u'n');
-    EXPECT_EQ(refused(name, Dialect::Standard),
-              "Standard SQL cannot carry the name \"" + std::string(39, 'n') +
-                  "…\", it has more than 128 characters");
+    EXPECT_EQ(refused(name, Dialect::Standard), "Standard SQL cannot carry the name \"" +
+                                                    std::string(39, 'n') +
+                                                    "…\", it has more than 128 characters");
 }
 
 TEST(ALiteral, OfTextHasItsApostrophesDoubled) {
     const platform::String hostile = u"'; drop table x; --";
-    for (const Dialect dialect : {Dialect::SQLite, Dialect::PostgreSQL, Dialect::MySQL,
-                                  Dialect::Standard})
+    for (const Dialect dialect :
+         {Dialect::SQLite, Dialect::PostgreSQL, Dialect::MySQL, Dialect::Standard})
         EXPECT_EQ(written(ColumnType::Text, hostile, dialect), "'''; drop table x; --'");
     EXPECT_EQ(written(ColumnType::Text, hostile, Dialect::SqlServer), "N'''; drop table x; --'");
 }

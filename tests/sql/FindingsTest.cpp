@@ -19,7 +19,8 @@ protected:
     using TableRef = platform::Ref<model::Table>;
 
     TableRef added(String name) {
-        return query->addTable({u"", std::move(name),
+        return query->addTable({u"",
+                                std::move(name),
                                 {{u"id", model::ColumnType::Integer},
                                  {u"word", model::ColumnType::Text},
                                  {String(70, u'l'), model::ColumnType::Integer}}});
@@ -108,8 +109,8 @@ TEST_F(AFinding, IsNotMadeOfAColumnThatIsReallyNamedStar) {
     definition->SortOrder(1);
     definition->AddCriterium(u"x", u"4");
     query->AddColumnDefinition(definition);
-    const auto text = model::sql::statementText(*query, Dialect::SQLite,
-                                                model::sql::ValueForm::literal);
+    const auto text =
+        model::sql::statementText(*query, Dialect::SQLite, model::sql::ValueForm::literal);
     EXPECT_TRUE(text.findings.empty());
     EXPECT_EQ(toUtf8(text.text),
               "SELECT\n    odd.\"*\"\nFROM odd\nWHERE odd.\"*\" = 'x'\nORDER BY odd.\"*\"");

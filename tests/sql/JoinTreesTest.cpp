@@ -31,7 +31,8 @@ std::string from(const Drawing& drawing, model::Findings* findings = nullptr) {
         return query->tableNamed(platform::String(1, static_cast<char16_t>(name)));
     };
     for (const char name : drawing.tables)
-        query->addTable({u"", platform::String(1, static_cast<char16_t>(name)),
+        query->addTable({u"",
+                         platform::String(1, static_cast<char16_t>(name)),
                          {{u"x", model::ColumnType::Integer}}});
     for (const std::string& drawn : drawing.joins) {
         const auto join = library.NewZDJoin();
@@ -46,7 +47,7 @@ std::string from(const Drawing& drawing, model::Findings* findings = nullptr) {
     std::string sql = toUtf8(text.text);
     sql.erase(0, sql.find("FROM ") + 5);
     const std::pair<const char*, const char*> shorter[] = {
-        {".x = ", ""},      {".x", ""},          {"\n    ", " "},     {"INNER JOIN", "="},
+        {".x = ", ""},      {".x", ""},          {"\n    ", " "},    {"INNER JOIN", "="},
         {"LEFT JOIN", ">"}, {"RIGHT JOIN", "<"}, {"FULL JOIN", "#"}, {"CROSS JOIN", "*"},
         {" ON ", " on "},   {"\n", " "}};
     for (const auto& [what, by] : shorter) sql = replaced(sql, what, by);
@@ -95,7 +96,8 @@ TEST(InnerJoins, AddEachTableAsSoonAsAJoinReachesIt) {
 
 TEST(InnerJoins, CloseACycleInTheOnThatSeesAllOfIt) {
     EXPECT_EQ(from({"abc", {"a=b", "b=c", "c=a"}}), "a = b on ab = c on bc AND ca");
-    EXPECT_EQ(from({"abcd", {"a=b", "b=c", "c=d", "d=a"}}), "a = b on ab = c on bc = d on cd AND da");
+    EXPECT_EQ(from({"abcd", {"a=b", "b=c", "c=d", "d=a"}}),
+              "a = b on ab = c on bc = d on cd AND da");
     EXPECT_EQ(from({"abcd", {"a=b", "c=d", "b=d", "a=c", "a=d"}}),
               "a = b on ab = c on ac = d on cd AND bd AND ad");
 }
@@ -142,9 +144,15 @@ TEST(OuterJoins, ThatFillOneTableFromTwoSidesAreAmbiguous) {
 }
 
 TEST(OuterJoins, ThatReadOneWayOnlyAreNotAmbiguous) {
-    for (const auto& joins : std::vector<std::vector<std::string>>{
-             {"a>b", "b>c"}, {"a>b", "a>c"}, {"a#b", "b#c"}, {"a#b", "b>c"}, {"a#b", "a>c"},
-             {"a>b", "b=c"}, {"a#b", "b=c"}, {"a<b", "b>c"}, {"a<b", "b<c"}}) {
+    for (const auto& joins : std::vector<std::vector<std::string>>{{"a>b", "b>c"},
+                                                                   {"a>b", "a>c"},
+                                                                   {"a#b", "b#c"},
+                                                                   {"a#b", "b>c"},
+                                                                   {"a#b", "a>c"},
+                                                                   {"a>b", "b=c"},
+                                                                   {"a#b", "b=c"},
+                                                                   {"a<b", "b>c"},
+                                                                   {"a<b", "b<c"}}) {
         for (std::string tables : {"abc", "acb", "bac", "bca", "cab", "cba"}) {
             model::Findings findings;
             from({tables, joins}, &findings);

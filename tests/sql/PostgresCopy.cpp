@@ -46,8 +46,7 @@ private:
     void create() {
         QStringList columns;
         QMap<int, QString> key;
-        QSqlQuery info =
-            selected(mFrom, QStringLiteral("PRAGMA table_info(%1)").arg(mTable));
+        QSqlQuery info = selected(mFrom, QStringLiteral("PRAGMA table_info(%1)").arg(mTable));
         while (info.next()) {
             const QString name = quoted(info.value(QStringLiteral("name")).toString());
             const QString type = typeOf(info.value(QStringLiteral("type")).toString());

@@ -76,16 +76,17 @@ TEST(ThePrinter, WritesSchemaNameAndAlias) {
 
 TEST(ThePrinter, HandsOverValuesInTheOrderOfTheirPlaceholders) {
     Statement statement = where(allOf(
-        {make(Between{false, column(u"a"), value(u"1"), make(Parameter{u"top", ColumnType::Integer})}),
+        {make(Between{false, column(u"a"), value(u"1"),
+                      make(Parameter{u"top", ColumnType::Integer})}),
          make(Like{false, column(u"b", ColumnType::Text), value(u"x%", ColumnType::Text)}),
-         make(In{true, column(u"c", ColumnType::Date), {value(u"2024-01-02", ColumnType::Date)}})}));
+         make(
+             In{true, column(u"c", ColumnType::Date), {value(u"2024-01-02", ColumnType::Date)}})}));
     const auto printed = print(statement, Dialect::PostgreSQL, ValueForm::bound);
     const auto& result = std::get<Printed>(printed);
-    EXPECT_EQ(toUtf8(result.text),
-              "SELECT\n    t.*\nFROM t\n"
-              "WHERE t.a BETWEEN CAST(? AS bigint) AND CAST(? AS numeric)\n"
-              "    AND t.b ILIKE ?\n"
-              "    AND t.c NOT IN (CAST(? AS date))");
+    EXPECT_EQ(toUtf8(result.text), "SELECT\n    t.*\nFROM t\n"
+                                   "WHERE t.a BETWEEN CAST(? AS bigint) AND CAST(? AS numeric)\n"
+                                   "    AND t.b ILIKE ?\n"
+                                   "    AND t.c NOT IN (CAST(? AS date))");
     ASSERT_EQ(result.bindings.size(), 4u);
     EXPECT_EQ(std::get<Value>(result.bindings[0]), (Value{ColumnType::Integer, u"1"}));
     EXPECT_EQ(std::get<Parameter>(result.bindings[1]).name, u"top");
@@ -117,7 +118,8 @@ TEST(ThePrinter, PutsParenthesesWhereTheTreeNeedsThemOnly) {
               "WHERE (t.a = 1 AND t.a = 2)\n    OR t.a = 3");
     EXPECT_EQ(shown(make(Not{both(equals(u"1"), equals(u"2"))})),
               "WHERE NOT (t.a = 1 AND t.a = 2)");
-    EXPECT_EQ(shown(both(make(Not{equals(u"1")}), either(equals(u"2"), both(equals(u"3"), equals(u"4"))))),
+    EXPECT_EQ(shown(both(make(Not{equals(u"1")}),
+                         either(equals(u"2"), both(equals(u"3"), equals(u"4"))))),
               "WHERE NOT (t.a = 1)\n    AND (t.a = 2 OR (t.a = 3 AND t.a = 4))");
 }
 
@@ -153,8 +155,8 @@ TEST(ThePrinter, PagesWithALimitOrAnOffsetAlone) {
 TEST(ThePrinter, RefusesAFullJoinWhereTheEngineHasNone) {
     const Statement equal = all(joined(JoinKind::fullOuter, on(Comparison::equal)));
     const Statement less = all(joined(JoinKind::fullOuter, on(Comparison::less)));
-    const Statement mixed = all(joined(
-        JoinKind::fullOuter, make(And{{on(Comparison::less), on(Comparison::equal)}})));
+    const Statement mixed =
+        all(joined(JoinKind::fullOuter, make(And{{on(Comparison::less), on(Comparison::equal)}})));
     EXPECT_EQ(text(equal, Dialect::MySQL),
               "MySQL/MariaDB has no full outer join: make it a left or a right one.");
     EXPECT_EQ(text(less, Dialect::PostgreSQL),
@@ -187,8 +189,8 @@ TEST(ThePrinter, RefusesMoreConditionsInARowThanSqliteTakes) {
 }
 
 TEST(ThePrinter, MatchesAColumnOfUnknownTypeAsTextOnPostgres) {
-    const Statement statement = where(make(
-        Like{true, column(u"x", ColumnType::Unknown), value(u"4\\%%", ColumnType::Text)}));
+    const Statement statement = where(
+        make(Like{true, column(u"x", ColumnType::Unknown), value(u"4\\%%", ColumnType::Text)}));
     EXPECT_EQ(behind(statement, Dialect::PostgreSQL, ValueForm::literal),
               "WHERE CAST(t.x AS text) NOT ILIKE '4\\%%'");
     EXPECT_EQ(behind(statement, Dialect::SQLite, ValueForm::literal),

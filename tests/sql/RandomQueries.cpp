@@ -3,7 +3,6 @@
 #include "model/Library.h"
 
 #include <algorithm>
-#include <cctype>
 #include <stdexcept>
 
 using model::ColumnType;
@@ -14,17 +13,74 @@ namespace {
 constexpr const char16_t* comparisons[] = {u"", u"= ", u"<> ", u"< ", u"> ", u"<= ", u">= "};
 
 const std::vector<String> words = {
-    u"Wien", u"Graz", u"a", u"M", u"'open'", u"\"paid\"", u"O'Brien & Sons", u"'it''s'", u"100 % sure",
-    u"N", u"''", u"Ö", u"'50'", u"'\\'", u"?", u":-)", u"x?y", u"--", u"/* */", u"A\\B"};
+    u"Wien",    u"Graz", u"a",  u"M", u"'open'", u"\"paid\"", u"O'Brien & Sons",
+    u"'it''s'", u"N",    u"''", u"Ö", u"'50'",   u"'\\'",     u"100 % sure",
+    u":-|",     u"x?y",  u"--", u"?", u"/**/",   u"A\\B"};
 
-const std::vector<String> pieces = {
-    u"'", u"''", u"\"", u"`", u"[", u"]", u"(", u")", u";", u"--", u"/*", u"*/", u"\\", u"\\'",
-    u"%", u"_", u"?", u":x", u"$1", u"$$", u"@a", u"#", u",", u"=", u"<", u">", u"!", u" Or ",
-    u" And ", u" Not ", u" Like ", u" In ", u" Is ", u" Null ", u" Between ", u" Or 1=1", u"1",
-    u"0x", u"union select * from employees", u"; drop table customers; --", u"') or ('1'='1",
-    u"' Or 'a'='a", u"E'\\x27'", u"U&'\\0027'", u"\n", u"\t", u"\u00A0", u"\u2019", u"\uFF07",
-    u"\u202E", u"😀", u"é", u"\uFFFF", u"[orders].[id]", u"customers.name", u"abc", u" ", u" ",
-    u"word", u"{d '2024-01-01'}", u"N'x'", u"x'00'", u"current_user", u"null"};
+const std::vector<String> pieces = {u"'",
+                                    u"''",
+                                    u"\"",
+                                    u"`",
+                                    u"[",
+                                    u"]",
+                                    u"(",
+                                    u")",
+                                    u";",
+                                    u"--",
+                                    u"/*",
+                                    u"*/",
+                                    u"\\",
+                                    u"\\'",
+                                    u"%",
+                                    u"_",
+                                    u"?",
+                                    u":x",
+                                    u"$1",
+                                    u"$$",
+                                    u"@a",
+                                    u"#",
+                                    u",",
+                                    u"=",
+                                    u"<",
+                                    u">",
+                                    u"!",
+                                    u" Or ",
+                                    u" And ",
+                                    u" Not ",
+                                    u" Like ",
+                                    u" In ",
+                                    u" Is ",
+                                    u" Null ",
+                                    u" Between ",
+                                    u" Or 1=1",
+                                    u"1",
+                                    u"0x",
+                                    u"union select * from employees",
+                                    u"; drop table customers; --",
+                                    u"') or ('1'='1",
+                                    u"' Or 'a'='a",
+                                    u"E'\\x27'",
+                                    u"U&'\\0027'",
+                                    u"\n",
+                                    u"\t",
+                                    u"\u00A0",
+                                    u"\u2019",
+                                    u"\uFF07",
+                                    u"\u202E",
+                                    u"😀",
+                                    u"é",
+                                    u"\uFFFF",
+                                    u"[orders].[id]",
+                                    u"customers.name",
+                                    u"abc",
+                                    u" ",
+                                    u" ",
+                                    u"word",
+                                    u"{d '2024-01-01'}",
+                                    u"N'x'",
+                                    u"x'00'",
+                                    u"current_user",
+                                    u"null"};
 
 } // namespace
 
@@ -56,11 +112,10 @@ platform::Ref<model::Query> RandomQueries::next() {
 }
 
 platform::Ref<model::Column> RandomQueries::anyColumn(model::Query& query) {
-    auto& columns =
-        query.Tables()
-            .Item(1 + static_cast<std::int32_t>(
-                          mDice.roll(static_cast<std::size_t>(query.Tables().Count()))))
-            ->Columns();
+    auto& columns = query.Tables()
+                        .Item(1 + static_cast<std::int32_t>(
+                                      mDice.roll(static_cast<std::size_t>(query.Tables().Count()))))
+                        ->Columns();
     const auto count = static_cast<std::size_t>(columns.Count());
     return std::static_pointer_cast<model::Column>(
         columns.Item(2 + static_cast<std::int32_t>(mDice.roll(count - 1))));
@@ -103,13 +158,15 @@ void RandomQueries::addDefinition(model::Query& query) {
         if (mDice.oneIn(2))
             definition->AddCriterium(criterion(column->description().type), platform::decimal(row));
     query.AddColumnDefinition(definition);
+    if (column->description().type == ColumnType::Unknown) return;
     String name;
     for (const char16_t c : table->Name()) name += c == u']' ? String(u"]]") : String(1, c);
     mColumns.push_back(u"[" + name + u"].[" + column->Name() + u"]");
 }
 
 String RandomQueries::criterion(ColumnType type) {
-    if (mDice.oneIn(25)) return hostileText();
+    // Of a column of unknown type PostgreSQL knows the type, and takes no text for a number.
+    if (type != ColumnType::Unknown && mDice.oneIn(25)) return hostileText();
     String text = predicate(type);
     for (int more = 0; more < 3 && mDice.oneIn(3); ++more) {
         const bool either = mDice.oneIn(2);
@@ -123,11 +180,16 @@ String RandomQueries::predicate(ColumnType type) {
     const bool text = type == ColumnType::Text;
     if (type == ColumnType::Blob) return mDice.oneIn(2) ? u"Is Null" : u"Is Not Null";
     switch (mDice.roll(9)) {
-    case 0: return mDice.oneIn(2) ? u"Is Null" : u"Not Is Null";
-    case 1: return u"Between " + value(type) + u" And " + value(type);
-    case 2: return u"Not In (" + value(type) + u", " + value(type) + u")";
-    case 3: return u"In (" + value(type) + u")";
-    case 4: return u"Not " + value(type);
+    case 0:
+        return mDice.oneIn(2) ? u"Is Null" : u"Not Is Null";
+    case 1:
+        return u"Between " + value(type) + u" And " + value(type);
+    case 2:
+        return u"Not In (" + value(type) + u", " + value(type) + u")";
+    case 3:
+        return u"In (" + value(type) + u")";
+    case 4:
+        return u"Not " + value(type);
     case 5:
         if (text) return u"Like '" + String(mDice.oneIn(2) ? u"*" : u"?") + u"a[*]_%\\*'";
         break;
@@ -135,9 +197,11 @@ String RandomQueries::predicate(ColumnType type) {
         if (text) return u"Not Like *" + String(1, u"aeSr"[mDice.roll(4)]) + u"*";
         break;
     case 7:
-        if (!mColumns.empty()) return mDice.pick(comparisons) + mDice.pick(mColumns);
+        if (!mColumns.empty() && type != ColumnType::Unknown)
+            return mDice.pick(comparisons) + mDice.pick(mColumns);
         break;
-    default: break;
+    default:
+        break;
     }
     return mDice.pick(comparisons) + value(type);
 }
@@ -148,15 +212,22 @@ String RandomQueries::number(std::size_t sides) {
 
 String RandomQueries::value(ColumnType type) {
     switch (type) {
-    case ColumnType::Integer: return (mDice.oneIn(8) ? u"-" : u"") + number(12);
+    case ColumnType::Integer:
+        return (mDice.oneIn(8) ? u"-" : u"") + number(12);
     case ColumnType::Unknown:
-    case ColumnType::Decimal: return number(90) + u"." + number(100);
-    case ColumnType::Date: return u"2019-0" + platform::decimal(1 + static_cast<int>(mDice.roll(9))) + u"-1" + number(10);
-    case ColumnType::Time: return u"1" + number(10) + u":30";
-    case ColumnType::Timestamp: return u"#2019-01-0" + platform::decimal(1 + static_cast<int>(mDice.roll(9))) + u" 12:00#";
-    case ColumnType::Boolean: return mDice.oneIn(2) ? u"true" : u"no";
+    case ColumnType::Decimal:
+        return number(90) + u"." + number(100);
+    case ColumnType::Date:
+        return u"2019-01-1" + number(10);
+    case ColumnType::Time:
+        return u"1" + number(10) + u":30";
+    case ColumnType::Timestamp:
+        return u"#2019-01-1" + number(10) + u" 12:00#";
+    case ColumnType::Boolean:
+        return mDice.oneIn(2) ? u"true" : u"no";
     case ColumnType::Text:
-    case ColumnType::Blob: break;
+    case ColumnType::Blob:
+        break;
     }
     return mDice.pick(words);
 }
@@ -168,57 +239,87 @@ String RandomQueries::hostileText() {
     return text;
 }
 
-std::string shape(const std::string& sql) {
-    std::string out;
-    const auto add = [&out](const std::string& token) {
-        // "DATE '...'" and "CAST(? AS date)" are one value each.
-        const auto endsWith = [&out](const std::string& end) {
-            return out.size() >= end.size() &&
-                   out.compare(out.size() - end.size(), end.size(), end) == 0;
-        };
-        if (token == "?")
+namespace {
+
+bool endsWith(const std::string& text, const std::string& end) {
+    return text.size() >= end.size() &&
+           text.compare(text.size() - end.size(), end.size(), end) == 0;
+}
+
+bool isDigit(char c) { return c >= '0' && c <= '9'; }
+
+bool isLetter(char c) {
+    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || c == '_' || (c & 0x80) != 0;
+}
+
+/// Collects tokens; what makes one value together becomes one.
+class Shape {
+public:
+    void add(const std::string& token) {
+        if (token == "?") {
             for (const char* keyword : {" DATE", " TIME", " TIMESTAMP"})
-                if (endsWith(keyword)) out.erase(out.size() - std::string(keyword).size());
-        out += ' ' + token;
-        for (const char* type :
-             {"bigint", "numeric", "boolean", "date", "time", "timestamp"}) {
-            const std::string cast = std::string(" CAST ( ? AS ") + type + " )";
-            if (endsWith(cast)) out.replace(out.size() - cast.size(), cast.size(), " ?");
+                if (endsWith(mOut, keyword)) mOut.erase(mOut.size() - std::string(keyword).size());
         }
-        if (token == "TRUE" || token == "FALSE") out.replace(out.size() - token.size(), token.size(), "?");
-    };
-    for (std::size_t at = 0; at < sql.size();) {
-        const auto c = static_cast<unsigned char>(sql[at]);
-        const std::size_t begin = at++;
-        if (std::isspace(c)) continue;
-        if (c == '\'' || c == '"') {
-            for (;; ++at) {
-                if (at >= sql.size()) return out + " <open quote>";
-                if (sql[at] != static_cast<char>(c)) continue;
-                if (at + 1 < sql.size() && sql[at + 1] == static_cast<char>(c)) {
-                    ++at;
-                    continue;
-                }
-                ++at;
-                break;
-            }
-            const std::string token = sql.substr(begin, at - begin);
-            const bool isEscape = token == "'\\'" && out.size() > 7 &&
-                                  out.compare(out.size() - 7, 7, " ESCAPE") == 0;
-            add(c == '\'' && !isEscape ? "?" : token);
-        } else if (std::isalpha(c) || c == '_' || c >= 0x80) {
-            while (at < sql.size() && (std::isalnum(static_cast<unsigned char>(sql[at])) ||
-                                       sql[at] == '_' || (sql[at] & 0x80)))
-                ++at;
-            add(sql.substr(begin, at - begin));
-        } else if (std::isdigit(c) || (c == '-' && at < sql.size() && std::isdigit(sql[at]))) {
-            while (at < sql.size() && (std::isalnum(static_cast<unsigned char>(sql[at])) ||
-                                       sql[at] == '.' || (sql[at - 1] == 'e' && std::string("+-").find(sql[at]) != std::string::npos)))
-                ++at;
-            add("?");
-        } else {
-            add(std::string(1, static_cast<char>(c)));
+        mOut += ' ' + (token == "TRUE" || token == "FALSE" ? "?" : token);
+        if (token != ")") return;
+        for (const char* type : {"bigint", "numeric", "boolean", "date", "time", "timestamp"}) {
+            const std::string cast = std::string(" CAST ( ? AS ") + type + " )";
+            if (endsWith(mOut, cast)) mOut.replace(mOut.size() - cast.size(), cast.size(), " ?");
         }
     }
-    return out;
+
+    void addText(const std::string& token) {
+        const bool isEscape = token == "'\\'" && endsWith(mOut, " ESCAPE");
+        add(token.front() == '\'' && !isEscape ? "?" : token);
+    }
+
+    std::string take() { return std::move(mOut); }
+
+private:
+    std::string mOut;
+};
+
+/// Behind the closing one of two quotes, or behind the end when there is none.
+std::size_t behindQuoted(const std::string& sql, std::size_t begin) {
+    for (std::size_t at = begin + 1; at < sql.size(); ++at) {
+        if (sql[at] != sql[begin]) continue;
+        if (at + 1 == sql.size() || sql[at + 1] != sql[begin]) return at + 1;
+        ++at;
+    }
+    return sql.size() + 1;
+}
+
+std::size_t behindNumber(const std::string& sql, std::size_t at) {
+    const auto signsExponent = [&](std::size_t i) {
+        return (sql[i] == '+' || sql[i] == '-') && sql[i - 1] == 'e';
+    };
+    for (++at; at < sql.size(); ++at)
+        if (!isDigit(sql[at]) && !isLetter(sql[at]) && sql[at] != '.' && !signsExponent(at)) break;
+    return at;
+}
+
+} // namespace
+
+std::string shape(const std::string& sql) {
+    Shape shape;
+    for (std::size_t at = 0; at < sql.size();) {
+        const std::size_t begin = at;
+        const char c = sql[at];
+        if (c == ' ' || c == '\n') {
+            ++at;
+        } else if (c == '\'' || c == '"') {
+            at = behindQuoted(sql, begin);
+            if (at > sql.size()) return "an open quote in " + sql;
+            shape.addText(sql.substr(begin, at - begin));
+        } else if (isLetter(c)) {
+            while (at < sql.size() && (isLetter(sql[at]) || isDigit(sql[at]))) ++at;
+            shape.add(sql.substr(begin, at - begin));
+        } else if (isDigit(c) || (c == '-' && at + 1 < sql.size() && isDigit(sql[at + 1]))) {
+            at = behindNumber(sql, begin);
+            shape.add("?");
+        } else {
+            shape.add(std::string(1, sql[at++]));
+        }
+    }
+    return shape.take();
 }

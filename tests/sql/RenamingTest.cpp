@@ -17,9 +17,10 @@ protected:
     using DefinitionRef = platform::Ref<TalvikZandorLib::ZDColumnDefinition>;
 
     static model::TableDescription described(platform::String name, platform::String column) {
-        return {u"",
-                std::move(name),
-                {{u"id", model::ColumnType::Integer}, {std::move(column), model::ColumnType::Integer}}};
+        return {
+            u"",
+            std::move(name),
+            {{u"id", model::ColumnType::Integer}, {std::move(column), model::ColumnType::Integer}}};
     }
 
     DefinitionRef defined(const TableRef& table, platform::StringView column,
@@ -36,8 +37,7 @@ protected:
 
     /// The statement's condition, or the text of its first error.
     std::string where() {
-        const auto printed =
-            model::sql::statementText(*query, Dialect::SQLite, ValueForm::literal);
+        const auto printed = model::sql::statementText(*query, Dialect::SQLite, ValueForm::literal);
         for (const auto& finding : printed.findings)
             if (finding.isError()) return toUtf8(finding.text);
         const std::string sql = toUtf8(printed.text);
@@ -139,14 +139,17 @@ TEST_F(CriteriaThatNameTables, StayParametersAndTextsWhateverTablesComeLater) {
     const auto texts = query->addTable({u"", u"texts", {{u"word", model::ColumnType::Text}}});
     defined(a, u"id", u"[height]");
     defined(texts, u"word", u"late.word");
-    query->addTable({u"", u"late", {{u"word", model::ColumnType::Text},
-                                    {u"height", model::ColumnType::Integer}}});
+    query->addTable(
+        {u"",
+         u"late",
+         {{u"word", model::ColumnType::Text}, {u"height", model::ColumnType::Integer}}});
     EXPECT_EQ(where(), "a.id = :height\n    AND texts.word = 'late.word'");
 }
 
 TEST_F(CriteriaThatNameTables, MayNameATableBeforeItIsThere) {
     defined(a, u"id", u"[late].[id] Or late.size");
-    EXPECT_EQ(where(), "a.id: At character 1: expected a column of the query, there is no late.id.");
+    EXPECT_EQ(where(),
+              "a.id: At character 1: expected a column of the query, there is no late.id.");
     const auto late = query->addTable(described(u"late", u"size"));
     EXPECT_EQ(where(), "a.id = late.id\n    OR a.id = late.size");
     query->renameTable(late, u"now");

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QApplication>
+#include <QContextMenuEvent>
 #include <QDrag>
 #include <QDropEvent>
 #include <QKeyEvent>
@@ -28,14 +29,21 @@ inline void click(QWidget& widget, QPointF at) {
     if (alive) mouse(widget, QEvent::MouseButtonRelease, at, Qt::LeftButton);
 }
 
-inline void key(QWidget& widget, int key, const QString& text = {}) {
+inline void key(QWidget& widget, int key, const QString& text = {},
+                Qt::KeyboardModifiers modifiers = {}) {
     const QPointer<QWidget> alive = &widget;
     for (const auto type : {QEvent::ShortcutOverride, QEvent::KeyPress, QEvent::KeyRelease}) {
         if (!alive) return;
-        QKeyEvent event(type, key, Qt::NoModifier, text);
+        QKeyEvent event(type, key, modifiers, text);
         QSpontaneKeyEvent::setSpontaneous(&event);
         qApp->notify(&widget, &event);
     }
+}
+
+/// The menu key, which the window system reports as a request for the menu of its own kind.
+inline void menuKey(QWidget& window) {
+    QContextMenuEvent event(QContextMenuEvent::Keyboard, {}, window.mapToGlobal(QPoint()));
+    QCoreApplication::sendEvent(window.windowHandle(), &event);
 }
 
 /// Carries a drag to a place of a widget and drops it there, or leaves where nothing takes it.

@@ -1,5 +1,7 @@
 #include "control/Zandor.h"
 
+#include "control/canvas/focus.h"
+
 namespace TalvikDBxZandor {
 
 using platform::Each;
@@ -179,7 +181,7 @@ void Zandor::SetFocusBack() {
                                 lstTable(mActiveTableIndex)->Left() < 0;
         if (!outOfReach) return;
         if (!mOnlyJoin) {
-            sprColumn->SetFocus();
+            offerFocus(*sprColumn);
             return;
         }
         for (std::int16_t i = 1; i <= lastTableSlot; ++i) {

@@ -151,8 +151,8 @@ private:
         const String typed = first.kind == TokenKind::quoted ? take().text : barePattern();
         if (first.kind != TokenKind::quoted && typed.empty())
             fail(u"expected a pattern, as in Like 'A*'");
-        return sql::make(sql::Like{
-            negated, mSubject, sql::make(sql::Value{ColumnType::Text, likePattern(typed)})});
+        return sql::make(sql::Like{negated, mSubject,
+                                   sql::make(sql::Value{ColumnType::Text, likePattern(typed)})});
     }
 
     Node between(bool negated) {
@@ -178,10 +178,14 @@ private:
         const Token first = peek();
         switch (first.kind) {
         case TokenKind::quoted:
-        case TokenKind::dated: return delimitedValue(take());
-        case TokenKind::word: return bareValue();
-        case TokenKind::bracketed: return bracketedName();
-        default: failValue(first, mSubjectColumn.type);
+        case TokenKind::dated:
+            return delimitedValue(take());
+        case TokenKind::word:
+            return bareValue();
+        case TokenKind::bracketed:
+            return bracketedName();
+        default:
+            failValue(first, mSubjectColumn.type);
         }
     }
 
@@ -210,9 +214,7 @@ private:
         return sql::make(*value);
     }
 
-    bool atWord() const {
-        return peek().kind == TokenKind::word && !at(u"And") && !at(u"Or");
-    }
+    bool atWord() const { return peek().kind == TokenKind::word && !at(u"And") && !at(u"Or"); }
 
     /// The bare words from here up to And, Or or another kind of token, with the blanks between
     /// them as typed.
@@ -333,8 +335,9 @@ private:
         if (known.column.empty()) return {};
         const auto column = known.column.column();
         if (!column)
-            throw errorAt(known.begin,
-                          u"expected a column of the query, the table that had this one was deleted");
+            throw errorAt(
+                known.begin,
+                u"expected a column of the query, the table that had this one was deleted");
         return columnRef(*column, *known.column.table().table());
     }
 

@@ -25,8 +25,8 @@ std::optional<Error> unusable(StringView text) {
         const char16_t c = text[i];
         if (c == 0) return errorAt(i, u"expected a character, found the character zero");
         if (c < 0xD800 || c > 0xDFFF) continue;
-        const bool paired = c < 0xDC00 && i + 1 < text.size() && text[i + 1] >= 0xDC00 &&
-                            text[i + 1] <= 0xDFFF;
+        const bool paired =
+            c < 0xDC00 && i + 1 < text.size() && text[i + 1] >= 0xDC00 && text[i + 1] <= 0xDFFF;
         if (!paired) return errorAt(i, u"expected a character, found half of one");
         ++i;
     }
@@ -52,24 +52,35 @@ private:
 
     std::optional<Error> next() {
         switch (mText[mAt]) {
-        case u'\'': return delimited(TokenKind::quoted, u'\'', u"expected a closing '");
-        case u'"': return delimited(TokenKind::quoted, u'"', u"expected a closing \"");
-        case u'[': return bracketed();
-        case u'#': return delimited(TokenKind::dated, u'#', u"expected a closing #");
-        case u'(': return single(TokenKind::open);
-        case u')': return single(TokenKind::close);
-        case u',': return single(TokenKind::comma);
-        case u']': return errorAt(mAt, u"expected a [ before this ]");
-        case u'!': return errorAt(mAt, u"expected an operator, write <> for unequal");
+        case u'\'':
+            return delimited(TokenKind::quoted, u'\'', u"expected a closing '");
+        case u'"':
+            return delimited(TokenKind::quoted, u'"', u"expected a closing \"");
+        case u'[':
+            return bracketed();
+        case u'#':
+            return delimited(TokenKind::dated, u'#', u"expected a closing #");
+        case u'(':
+            return single(TokenKind::open);
+        case u')':
+            return single(TokenKind::close);
+        case u',':
+            return single(TokenKind::comma);
+        case u']':
+            return errorAt(mAt, u"expected a [ before this ]");
+        case u'!':
+            return errorAt(mAt, u"expected an operator, write <> for unequal");
         case u'=':
         case u'<':
-        case u'>': return comparison();
+        case u'>':
+            return comparison();
         case u'.':
             if (!mTokens.empty() && mTokens.back().kind == TokenKind::bracketed &&
                 mTokens.back().end == mAt)
                 return single(TokenKind::dot);
             return word();
-        default: return word();
+        default:
+            return word();
         }
     }
 
@@ -122,9 +133,10 @@ private:
         while (mAt < mText.size() && !isSpace(mText[mAt]) &&
                (mText[mAt] == u'\'' || !isSpecial(mText[mAt])))
             ++mAt;
-        const bool qualifies = mAt < mText.size() && mText[mAt] == u'[' && mAt - begin > 1 &&
-                               mText[mAt - 1] == u'.';
-        if (!qualifies) return add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
+        const bool qualifies =
+            mAt < mText.size() && mText[mAt] == u'[' && mAt - begin > 1 && mText[mAt - 1] == u'.';
+        if (!qualifies)
+            return add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
         --mAt;
         add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
         return single(TokenKind::dot);
@@ -142,7 +154,7 @@ Error errorAt(std::size_t position, StringView what) {
     message += u": ";
     message += what;
     message += u'.';
-    return {position, std::move(message)};
+    return {position, oneLine(std::move(message))};
 }
 
 std::variant<std::vector<Token>, Error> tokens(StringView text) {

@@ -36,10 +36,9 @@ Result<Connection> openSqlite(const QString& path);
 ///
 /// each part but the scheme as far as the engine needs it. Behind a "?" an address may have the
 /// options sslmode, sslrootcert, sslcert, sslkey, connect_timeout (seconds; 10 unless given) and
-/// application_name of PostgreSQL, and host, the folder of the server's socket, which takes the place
-/// of the host. The password is
-/// `password`, or that of the address when it is empty; no message shows it. Needs a
-/// QCoreApplication.
+/// application_name of PostgreSQL, and host, the folder of the server's socket, which takes the
+/// place of the host. The password is `password`, or that of the address when it is empty; no
+/// message shows it. Needs a QCoreApplication.
 Result<Connection> openDatabase(const QString& address, const QString& password = {});
 
 } // namespace reader

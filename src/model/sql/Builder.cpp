@@ -12,13 +12,6 @@ namespace model::sql {
 
 namespace {
 
-/// A text without line breaks: names may have some.
-String oneLine(String text) {
-    for (char16_t& c : text)
-        if (c < u' ' || c == 0x85 || c == 0x2028 || c == 0x2029) c = u' ';
-    return text;
-}
-
 class Builder {
 public:
     explicit Builder(Query& query) : mQuery(query), mColumns(query.Tables()) {}
@@ -72,7 +65,7 @@ private:
         if (definition.Visible()) {
             mStatement.items.push_back({reference, definition.Synonym()});
             mNames.push_back({&definition, definition.Synonym().empty() ? column->Name()
-                                                                       : definition.Synonym()});
+                                                                        : definition.Synonym()});
         }
         if (definition.SortOrder() != 0)
             mStatement.order.push_back({reference, definition.SortOrder() == 2});
@@ -109,10 +102,9 @@ private:
 
     void reportDuplicates() {
         for (std::size_t i = 0; i < mNames.size(); ++i) {
-            const bool seen = std::any_of(mNames.begin(), mNames.begin() + static_cast<long>(i),
-                                          [&](const auto& other) {
-                                              return sameName(other.second, mNames[i].second);
-                                          });
+            const bool seen = std::any_of(
+                mNames.begin(), mNames.begin() + static_cast<long>(i),
+                [&](const auto& other) { return sameName(other.second, mNames[i].second); });
             if (seen)
                 report(Finding::Kind::duplicateOutputName, *mNames[i].first,
                        u"Two output columns are named " + mNames[i].second +

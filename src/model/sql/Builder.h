@@ -21,7 +21,7 @@ Built build(Query& query);
 Findings validate(Query& query, Dialect dialect);
 
 struct Text {
-    String text;                   ///< empty when there is none
+    String text; ///< empty when there is none
     std::vector<Binding> bindings;
     Findings findings;
 

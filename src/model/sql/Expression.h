@@ -50,9 +50,9 @@ struct Compare {
     Node right;
 };
 
-/// `pattern` is a Value or a Parameter of that kind. In a value's text % stands for any run and _ for any one
-/// character; a backslash makes the next character stand for itself. Letters match without regard
-/// to case as far as the engine knows them.
+/// `pattern` is a Value or a Parameter of that kind. In a value's text % stands for any run and _
+/// for any one character; a backslash makes the next character stand for itself. Letters match
+/// without regard to case as far as the engine knows them.
 struct Like {
     bool negated;
     Node operand;

@@ -124,8 +124,8 @@ private:
                 const bool first = waiting.size() + 1 == mGroups[group].size();
                 if (first) addOwnConditions(mGroups[group].front(), on);
                 addOwnConditions(*next, on);
-                tree = std::make_shared<const Source>(
-                    Source{JoinSource{JoinKind::inner, tree, leaf(*next), allOf(std::move(on)), {}}});
+                tree = std::make_shared<const Source>(Source{
+                    JoinSource{JoinKind::inner, tree, leaf(*next), allOf(std::move(on)), {}}});
                 in[*next] = true;
                 waiting.erase(next);
                 break;
@@ -139,8 +139,8 @@ private:
         std::vector<Node> conditions;
         bool reached = false;
         for (const Edge& edge : mEdges) {
-            const bool touches = (edge.left == table && in[edge.right]) ||
-                                 (edge.right == table && in[edge.left]);
+            const bool touches =
+                (edge.left == table && in[edge.right]) || (edge.right == table && in[edge.left]);
             if (!touches) continue;
             reached = reached || edge.type == normal;
             conditions.push_back(edge.condition);
@@ -333,8 +333,8 @@ private:
     std::vector<Ref<Table>> mTables;
     std::vector<Edge> mEdges;
     std::vector<std::pair<std::size_t, Node>> mOwnConditions; ///< of joins within one table
-    std::vector<std::size_t> mGroupOf;              ///< by table
-    std::vector<std::vector<std::size_t>> mGroups;  ///< their tables
+    std::vector<std::size_t> mGroupOf;                        ///< by table
+    std::vector<std::vector<std::size_t>> mGroups;            ///< their tables
     JoinTrees mResult;
 };
 

@@ -12,22 +12,32 @@ constexpr StringView nextLine = u"\n    ";
 
 StringView symbol(Comparison comparison) {
     switch (comparison) {
-    case Comparison::equal: return u" = ";
-    case Comparison::notEqual: return u" <> ";
-    case Comparison::less: return u" < ";
-    case Comparison::greater: return u" > ";
-    case Comparison::lessEqual: return u" <= ";
-    case Comparison::greaterEqual: break;
+    case Comparison::equal:
+        return u" = ";
+    case Comparison::notEqual:
+        return u" <> ";
+    case Comparison::less:
+        return u" < ";
+    case Comparison::greater:
+        return u" > ";
+    case Comparison::lessEqual:
+        return u" <= ";
+    case Comparison::greaterEqual:
+        break;
     }
     return u" >= ";
 }
 
 StringView words(JoinKind kind) {
     switch (kind) {
-    case JoinKind::inner: return u"INNER JOIN ";
-    case JoinKind::leftOuter: return u"LEFT JOIN ";
-    case JoinKind::rightOuter: return u"RIGHT JOIN ";
-    case JoinKind::fullOuter: break;
+    case JoinKind::inner:
+        return u"INNER JOIN ";
+    case JoinKind::leftOuter:
+        return u"LEFT JOIN ";
+    case JoinKind::rightOuter:
+        return u"RIGHT JOIN ";
+    case JoinKind::fullOuter:
+        break;
     }
     return u"FULL JOIN ";
 }
@@ -88,7 +98,8 @@ public:
 
 private:
     void name(StringView text) {
-        if (const auto why = cannotCarry(text, mDialect)) throw Refusal{Refusal::Reason::name, *why + u"."};
+        if (const auto why = cannotCarry(text, mDialect))
+            throw Refusal{Refusal::Reason::name, *why + u"."};
         mOut += identifier(text, mDialect);
     }
 
@@ -264,7 +275,8 @@ private:
     void write(const Parameter& parameter, Tightness) {
         mBindings.push_back(parameter);
         if (mForm == ValueForm::bound) {
-            // What the user will answer may be a fraction even where the column holds whole numbers.
+            // What the user will answer may be a fraction even where the column holds whole
+            // numbers.
             const bool whole = parameter.type == ColumnType::Integer;
             mOut += placeholder(whole ? ColumnType::Decimal : parameter.type, mDialect);
             return;
@@ -301,8 +313,8 @@ private:
     /// PostgreSQL matches nothing but text, and what type the column has may be unknown here.
     void likeOperand(const Expression& operand) {
         const auto* reference = std::get_if<ColumnRef>(&operand.node);
-        const bool cast = mDialect == Dialect::PostgreSQL && reference &&
-                          reference->type == ColumnType::Unknown;
+        const bool cast =
+            mDialect == Dialect::PostgreSQL && reference && reference->type == ColumnType::Unknown;
         if (cast) mOut += u"CAST(";
         condition(operand, Tightness::predicate);
         if (cast) mOut += u" AS text)";

@@ -96,7 +96,11 @@ void ColumnListView::keyPressEvent(QKeyEvent* event) {
         return mListener->deleteKey(currentIndex().row());
     const QPointer<ColumnListView> alive = this;
     const QItemSelection before = selectionModel()->selection();
-    QListView::keyPressEvent(event);
+    if (event->key() == Qt::Key_Space && currentIndex().isValid())
+        // The base class goes on to search for a name that begins with a blank.
+        selectionModel()->select(currentIndex(), selectionCommand(currentIndex(), event));
+    else
+        QListView::keyPressEvent(event);
     const int row = currentIndex().row();
     if (!mListener || row < 0 || selectionModel()->selection() == before) return;
     // To the control, selecting is what a press of the mouse has done.

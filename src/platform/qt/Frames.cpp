@@ -56,7 +56,11 @@ void RowFrame::showEvent(QShowEvent* event) {
     const QString title = mTitle();
     setAccessibleName(title);
     for (auto* input : findChildren<QLineEdit*>()) input->setAccessibleName(title);
-    for (auto* input : findChildren<QComboBox*>()) input->setAccessibleName(title);
+    for (auto* input : findChildren<QComboBox*>()) {
+        input->setAccessibleName(title);
+        // On some platforms the name of a list is what it has chosen.
+        input->setAccessibleDescription(title);
+    }
 }
 
 void RowFrame::paintEvent(QPaintEvent*) {

@@ -12,7 +12,7 @@ GridCellDelegate::GridCellDelegate(QTableView& view) : QStyledItemDelegate(&view
 void GridCellDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
                              const QModelIndex& index) const {
     QStyleOptionViewItem cell = option;
-    cell.state &= ~(QStyle::State_Selected | QStyle::State_HasFocus);
+    cell.state &= ~QStyle::State_HasFocus;
     QStyledItemDelegate::paint(painter, cell, index);
     if (index != mView.currentIndex()) return;
     if (mView.hasFocus()) return paintFocusFrame(*painter, option.rect, option.palette);

@@ -52,8 +52,10 @@ QString GridModel::titleOf(int row, int col) const {
     // Rows without a title of their own go on with the one above.
     int titled = row;
     while (titled > 0 && text(titled, 0).isEmpty()) --titled;
+    QString title = text(titled, 0);
+    if (title.endsWith(u':')) title.chop(1);
     const QString& field = text(0, col);
-    return text(titled, 0) + QStringLiteral(", ") +
+    return title + QStringLiteral(", ") +
            (field.isEmpty() ? tr("column %1").arg(col) : field);
 }
 

@@ -48,7 +48,7 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     mView->setModel(mModel);
     mView->setFrameShape(QFrame::NoFrame);
     mView->setEditTriggers(QTableView::NoEditTriggers);
-    mView->setSelectionMode(QTableView::SingleSelection);
+    mView->setSelectionMode(QTableView::NoSelection); // the current cell has a frame instead
     mView->setAutoScroll(false);
     mView->setHorizontalScrollMode(QTableView::ScrollPerItem);
     mView->setVerticalScrollMode(QTableView::ScrollPerItem);
