@@ -37,8 +37,8 @@ protected:
     }
 
     /// The accessible objects below one, itself included, that a test accepts.
-    static QList<QAccessibleInterface*> all(
-        QAccessibleInterface* from, const std::function<bool(QAccessibleInterface&)>& accepts) {
+    static QList<QAccessibleInterface*>
+    all(QAccessibleInterface* from, const std::function<bool(QAccessibleInterface&)>& accepts) {
         QList<QAccessibleInterface*> found;
         if (accepts(*from)) found += from;
         for (int i = 0; i < from->childCount(); ++i) {
@@ -78,10 +78,12 @@ TEST_F(Accessibility, NamesTheControlAndItsParts) {
     one(control, QAccessible::ScrollBar, "Scroll across");
     one(control, QAccessible::ScrollBar, "Scroll down");
     EXPECT_EQ(name(of(child<QWidget>("cmdHome"))), "Back to the origin");
-    EXPECT_EQ(all(control, [](auto& object) {
-                  return object.role() == QAccessible::Button &&
-                         object.text(QAccessible::Name) == "Remove the table";
-              }).size(),
+    EXPECT_EQ(all(control,
+                  [](auto& object) {
+                      return object.role() == QAccessible::Button &&
+                             object.text(QAccessible::Name) == "Remove the table";
+                  })
+                  .size(),
               3);
 }
 

@@ -44,9 +44,7 @@ protected:
         QCoreApplication::sendEvent(widget->windowHandle(), &gone);
     }
 
-    static bool forbidden(const QDrag& drag) {
-        return !drag.dragCursor(Qt::CopyAction).isNull();
-    }
+    static bool forbidden(const QDrag& drag) { return !drag.dragCursor(Qt::CopyAction).isNull(); }
 
     static void wait(const std::function<bool()>& until) {
         for (const QDeadlineTimer limit(5000); !limit.hasExpired() && !until();)

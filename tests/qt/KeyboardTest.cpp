@@ -16,7 +16,8 @@ protected:
     public:
         Dialogs() { qApp->installEventFilter(this); }
         bool eventFilter(QObject* watched, QEvent* event) override {
-            auto* dialog = event->type() == QEvent::Show ? qobject_cast<QDialog*>(watched) : nullptr;
+            auto* dialog =
+                event->type() == QEvent::Show ? qobject_cast<QDialog*>(watched) : nullptr;
             if (!dialog) return false;
             titles += dialog->windowTitle();
             QTimer::singleShot(0, dialog, [dialog] { hands::key(*dialog, Qt::Key_Escape); });

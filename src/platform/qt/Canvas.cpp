@@ -43,9 +43,9 @@ Canvas::~Canvas() {
 }
 
 void Canvas::add(CanvasItem& item) {
-    const auto at = std::upper_bound(
-        mItems.begin(), mItems.end(), item.layer(),
-        [](int layer, const CanvasItem* other) { return layer < other->layer(); });
+    const auto at =
+        std::upper_bound(mItems.begin(), mItems.end(), item.layer(),
+                         [](int layer, const CanvasItem* other) { return layer < other->layer(); });
     mItems.insert(at, &item);
 }
 

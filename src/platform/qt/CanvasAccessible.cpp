@@ -43,15 +43,13 @@ public:
         QAccessible::State state;
         state.focusable = true;
         state.focused = mCanvas.hasFocus() && mCanvas.currentLine() == &mLine;
-        state.offscreen =
-            !mCanvas.view().seen().intersects(mLine.extent().boundingRect());
+        state.offscreen = !mCanvas.view().seen().intersects(mLine.extent().boundingRect());
         return state;
     }
 
     void* interface_cast(QAccessible::InterfaceType type) override {
-        return type == QAccessible::ActionInterface
-                   ? static_cast<QAccessibleActionInterface*>(this)
-                   : nullptr;
+        return type == QAccessible::ActionInterface ? static_cast<QAccessibleActionInterface*>(this)
+                                                    : nullptr;
     }
     QStringList actionNames() const override { return {setFocusAction(), pressAction()}; }
     QStringList keyBindingsForAction(const QString&) const override { return {}; }

@@ -125,17 +125,17 @@ QRegion CanvasLine::area() const {
 
 void CanvasLine::paint(QPainter& painter, const QPalette& palette) const {
     const bool highlighted = mBorderWidth > 1 || focused();
-    const QColor colour =
-        highlighted ? palette.color(QPalette::Highlight)
-                    : between(palette.color(QPalette::Window),
-                              palette.color(QPalette::WindowText), 0.6);
+    const QColor colour = highlighted ? palette.color(QPalette::Highlight)
+                                      : between(palette.color(QPalette::Window),
+                                                palette.color(QPalette::WindowText), 0.6);
     if (focused()) {
         QColor halo = palette.color(QPalette::Active, QPalette::Highlight);
         halo.setAlphaF(0.35F);
         painter.setPen(QPen(halo, haloWidth, Qt::SolidLine, Qt::FlatCap));
         painter.drawLine(pixelPoint(mX1, mY1), pixelPoint(mX2, mY2));
     }
-    painter.setPen(QPen(colour, highlighted ? std::max<qreal>(mBorderWidth, 2) : 1.2, Qt::SolidLine, Qt::FlatCap));
+    painter.setPen(QPen(colour, highlighted ? std::max<qreal>(mBorderWidth, 2) : 1.2, Qt::SolidLine,
+                        Qt::FlatCap));
     painter.drawLine(pixelPoint(mX1, mY1), pixelPoint(mX2, mY2));
 }
 
@@ -159,8 +159,8 @@ void CanvasShape::ShapeStyle(std::int16_t value) {
 
 bool CanvasShape::touches(const CanvasLine& line) const {
     // The line begins on the mark's edge.
-    const QRectF box = QRectF(mBounds.Left, mBounds.Top, mBounds.Width, mBounds.Height)
-                           .adjusted(-1, -1, 1, 1);
+    const QRectF box =
+        QRectF(mBounds.Left, mBounds.Top, mBounds.Width, mBounds.Height).adjusted(-1, -1, 1, 1);
     return visible() && (box.contains(line.at(0)) || box.contains(line.at(1)));
 }
 
@@ -174,8 +174,8 @@ QRegion CanvasShape::area() const {
 void CanvasShape::paint(QPainter& painter, const QPalette& palette) const {
     const QRectF box(pixelPoint(mBounds.Left, mBounds.Top),
                      pixelPoint(mBounds.Left + mBounds.Width, mBounds.Top + mBounds.Height));
-    const QColor outline = between(palette.color(QPalette::Window),
-                                   palette.color(QPalette::WindowText), 0.6);
+    const QColor outline =
+        between(palette.color(QPalette::Window), palette.color(QPalette::WindowText), 0.6);
     const QColor focus = palette.color(QPalette::Active, QPalette::Highlight);
     painter.setPen(QPen(focused() ? focus : outline, 1.2));
     painter.setBrush(focused() ? focus : palette.color(QPalette::Base));

@@ -17,8 +17,7 @@ int direction(int at, int low, int high) {
 
 } // namespace
 
-DragScroller::DragScroller(Qt::Orientations ways, Step step)
-    : mWays(ways), mStep(std::move(step)) {
+DragScroller::DragScroller(Qt::Orientations ways, Step step) : mWays(ways), mStep(std::move(step)) {
     mTimer.setInterval(milliseconds);
     connect(&mTimer, &QTimer::timeout, this, [this] { mStep(mDirection); });
 }

@@ -25,8 +25,9 @@ QString field(const String& table, const String& column) {
 /// Empty for a type or an operator that there is none of.
 template <std::size_t size>
 StringView textOf(std::int16_t code, const std::array<StringView, size>& texts) {
-    return code >= 0 && static_cast<std::size_t>(code) < size ? texts[static_cast<std::size_t>(code)]
-                                                              : StringView();
+    return code >= 0 && static_cast<std::size_t>(code) < size
+               ? texts[static_cast<std::size_t>(code)]
+               : StringView();
 }
 
 QString describe(TalvikDBxZandor::Zandor& control, const TalvikZandorLib::ZDJoin& join) {
@@ -35,10 +36,9 @@ QString describe(TalvikDBxZandor::Zandor& control, const TalvikZandorLib::ZDJoin
     const std::array<StringView, 4> types = {u"", control.LNGJoinTypeLeftOuter,
                                              control.LNGJoinTypeRightOuter,
                                              control.LNGJoinTypeBothOuter};
-    const QString sides =
-        phrase(field(join.LeftTable()->Name(), join.LeftColumn()->Name()),
-               textOf(join.CompareOperator(), symbols),
-               field(join.RightTable()->Name(), join.RightColumn()->Name()));
+    const QString sides = phrase(field(join.LeftTable()->Name(), join.LeftColumn()->Name()),
+                                 textOf(join.CompareOperator(), symbols),
+                                 field(join.RightTable()->Name(), join.RightColumn()->Name()));
     const StringView type = textOf(join.JoinType(), types);
     return type.empty() ? sides : sides + QStringLiteral(", ") + toQt(type);
 }
