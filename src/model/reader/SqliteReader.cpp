@@ -27,16 +27,33 @@ private:
 };
 
 Result<std::vector<TableEntry>> SqliteReader::tables() {
+    const QString what = QStringLiteral("The list of tables");
+    const QString order = QStringLiteral(" AND name NOT LIKE 'sqlite\\_%' ESCAPE '\\' "
+                                         "ORDER BY name COLLATE NOCASE, name");
     std::vector<TableEntry> entries;
-    const auto error =
-        readRows(mDatabase, QStringLiteral("The list of tables"),
-                 QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list "
-                                "WHERE schema = 'main' AND type IN ('table', 'view', 'virtual') "
-                                "AND name NOT LIKE 'sqlite\\_%' ESCAPE '\\' "
-                                "ORDER BY name COLLATE NOCASE, name"),
-                 {}, [&](const QSqlQuery& row) {
-                     entries.push_back({{{}, textAt(row, 0)}, row.value(1).toBool()});
-                 });
+    bool hasVirtual = false;
+    const auto add = [&](const QSqlQuery& row) {
+        entries.push_back({{{}, textAt(row, 0)}, row.value(1).toBool()});
+    };
+    // Neither a view nor a virtual table has a page of its own.
+    auto error = readRows(mDatabase, what,
+                          QStringLiteral("SELECT name, type = 'view', rootpage FROM sqlite_master "
+                                         "WHERE type IN ('table', 'view')") +
+                              order,
+                          {}, [&](const QSqlQuery& row) {
+                              add(row);
+                              hasVirtual |= !entries.back().isView && row.value(2).toInt() == 0;
+                          });
+    if (hasVirtual && !error) {
+        // Only this tells the tables that a virtual one keeps for itself, but it reads the columns
+        // of all tables for it.
+        entries.clear();
+        error = readRows(mDatabase, what,
+                         QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list WHERE "
+                                        "schema = 'main' AND type IN ('table', 'view', 'virtual')") +
+                             order,
+                         {}, add);
+    }
     if (error) return *error;
     return entries;
 }

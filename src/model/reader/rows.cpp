@@ -15,7 +15,8 @@ std::optional<Error> readRows(const QSqlDatabase& database, const QString& what,
                               const QString& statement, const QVariantList& parameters,
                               const std::function<void(const QSqlQuery&)>& use) {
     QSqlQuery query(database);
-    query.setForwardOnly(true);
+    // SQLite then keeps no rows. From a server they come one by one, which takes longer.
+    query.setForwardOnly(database.driverName() == QStringLiteral("QSQLITE"));
     // Without parameters it goes to the engine in one step.
     bool done = false;
     if (parameters.isEmpty()) {
