@@ -25,11 +25,13 @@ platform::Ref<model::Query> someQuery() {
     auto query = platform::makeRef<model::Query>();
     model::TableDescription one{u"", u"orders", {{u"id", ColumnType::Integer, u"", true}}};
     for (int type = 0; type < typeCount; ++type)
-        one.columns.push_back({u"c" + platform::decimal(type), static_cast<ColumnType>(type), u"",
-                               false});
+        one.columns.push_back(
+            {u"c" + platform::decimal(type), static_cast<ColumnType>(type), u"", false});
     query->addTable(one);
-    query->addTable({u"sales", u"a \"b] c", {{u"id", ColumnType::Text, u"", false},
-                                             {u"or", ColumnType::Date, u"", false}}});
+    query->addTable(
+        {u"sales",
+         u"a \"b] c",
+         {{u"id", ColumnType::Text, u"", false}, {u"or", ColumnType::Date, u"", false}}});
     return query;
 }
 
@@ -74,8 +76,7 @@ void use(const String& text, int type, model::sql::Dialect dialect) {
     definition->Column(column);
     definition->AddCriterium(text, u"4");
     query->AddColumnDefinition(definition);
-    const auto statement =
-        model::sql::statementText(*query, dialect, model::sql::ValueForm::bound);
+    const auto statement = model::sql::statementText(*query, dialect, model::sql::ValueForm::bound);
     must(statement.runnable() || !statement.findings.empty(), "a statement or a reason");
     query->renameTable(table, u"an Or [other");
     for (const auto& finding : model::sql::build(*query).findings)

@@ -110,8 +110,8 @@ void Query::restoreTable(const TableRecord& record) {
         column->Selected(from.selected);
         columns.Add(column, from.key);
     }
-    const auto table = makeRef<Table>(place, record.name, record.schema, record.sourceName,
-                                      std::move(columns));
+    const auto table =
+        makeRef<Table>(place, record.name, record.schema, record.sourceName, std::move(columns));
     // Not by the properties, which take singles and would round beyond 24 bits.
     table->mLeft = record.left;
     table->mTop = record.top;

@@ -19,9 +19,8 @@ std::string part(const std::string& file, const std::string& name) {
     const auto begin = text.find(mark);
     const auto end = text.find(mark, begin + 1);
     EXPECT_NE(end, std::string::npos) << file << " has no part " << name;
-    return end == std::string::npos
-               ? std::string()
-               : text.substr(begin + mark.size(), end - begin - mark.size());
+    return end == std::string::npos ? std::string()
+                                    : text.substr(begin + mark.size(), end - begin - mark.size());
 }
 
 } // namespace

@@ -59,8 +59,7 @@ protected:
         settle();
     }
 
-    std::shared_ptr<report::Report> ours =
-        std::make_shared<report::Report>(report::someReport());
+    std::shared_ptr<report::Report> ours = std::make_shared<report::Report>(report::someReport());
     report::Library library;
     ZandorWidget widget{library};
 };

@@ -11,9 +11,9 @@ std::string valid() { return contentOf(testFile("version-2.json")); }
 void expectOneLine(const std::string& message) {
     EXPECT_FALSE(message.empty());
     EXPECT_LT(message.size(), 400U) << message;
-    EXPECT_TRUE(std::all_of(message.begin(), message.end(),
-                            [](char c) { return c >= 0x20 && c < 0x7f; }))
-        << message;
+    EXPECT_TRUE(std::all_of(message.begin(), message.end(), [](char c) {
+        return c >= 0x20 && c < 0x7f;
+    })) << message;
     EXPECT_EQ(message.back(), '.');
 }
 
@@ -70,10 +70,18 @@ TEST(AChangedFile, IsAnotherQueryOrRefusedWithOneLine) {
         for (std::size_t times = upTo(2) + 1; times > 0; --times) {
             const std::size_t at = upTo(changed.size() - 1);
             switch (upTo(3)) {
-            case 0: changed[at] = static_cast<char>(upTo(255)); break;
-            case 1: changed.erase(at, upTo(20) + 1); break;
-            case 2: changed.insert(at, 1, "\"{}[],:0-e\\"[upTo(10)]); break;
-            default: changed.insert(at, changed.substr(upTo(changed.size() - 1), upTo(80))); break;
+            case 0:
+                changed[at] = static_cast<char>(upTo(255));
+                break;
+            case 1:
+                changed.erase(at, upTo(20) + 1);
+                break;
+            case 2:
+                changed.insert(at, 1, "\"{}[],:0-e\\"[upTo(10)]);
+                break;
+            default:
+                changed.insert(at, changed.substr(upTo(changed.size() - 1), upTo(80)));
+                break;
             }
         }
         const auto document = files::fromJson(changed);
@@ -101,8 +109,9 @@ TEST(AHostileFile, OfManyValuesIsRefusedBeforeItTakesMuchMemory) {
 }
 
 TEST(AHostileFile, WithAnEndlessTextOrNumberOrNameIsRefused) {
-    EXPECT_EQ(errorOf("{\"a\": \"" + std::string(3'000'000, 'x') + "\"}"),
-              "/a is longer than 100000 characters. Mend the file there, or restore it from a copy.");
+    EXPECT_EQ(
+        errorOf("{\"a\": \"" + std::string(3'000'000, 'x') + "\"}"),
+        "/a is longer than 100000 characters. Mend the file there, or restore it from a copy.");
     errorOf("{\"" + std::string(3'000'000, 'x') + "\": 1}");
     errorOf("[" + std::string(3'000'000, '1') + "]");
     errorOf("[0." + std::string(3'000'000, '1') + "]");
@@ -112,11 +121,13 @@ TEST(AHostileFile, WithAnEndlessTextOrNumberOrNameIsRefused) {
 TEST(AHostileFile, WithTooManyObjectsOfAKindIsRefused) {
     std::string tables = tableWithColumns(0, 1);
     tables.replace(tables.find("t0"), 2, "t1");
-    EXPECT_EQ(errorOf(withTables(repeated(tables + ',', 1000) + tables)),
-              "/tables has more than 1000 entries. Mend the file there, or restore it from a copy.");
-    EXPECT_EQ(errorOf(withTables(tableWithColumns(1, 5001))),
-              "/tables/0/columns has more than 5000 entries. Mend the file there, or restore it from "
-              "a copy.");
+    EXPECT_EQ(
+        errorOf(withTables(repeated(tables + ',', 1000) + tables)),
+        "/tables has more than 1000 entries. Mend the file there, or restore it from a copy.");
+    EXPECT_EQ(
+        errorOf(withTables(tableWithColumns(1, 5001))),
+        "/tables/0/columns has more than 5000 entries. Mend the file there, or restore it from "
+        "a copy.");
     std::string many = tableWithColumns(1, 5000);
     for (std::size_t n = 2; n <= 21; ++n) many += ',' + tableWithColumns(n, 5000);
     EXPECT_EQ(errorOf(withTables(many)),

@@ -28,8 +28,9 @@ private:
     /// Text with all that a file could trip over, but half characters and NUL.
     String text() {
         static const std::vector<String> pieces = {
-            u"a", u"B", u"9", u" ", u"\"", u"\\", u"/", u"\n", u"\t", u"\x1b", u"\x7f", u"*",
-            u"\u00e4", u"\u2028", u"\ufeff", u"\uffff", u"\U0001F600", u"null", u"{\"", u"]}", u"~1"};
+            u"a",      u"B",      u"9",          u" ",    u"\"",  u"\\",     u"/",
+            u"\n",     u"\t",     u"\x1b",       u"\x7f", u"*",   u"\u00e4", u"\u2028",
+            u"\ufeff", u"\uffff", u"\U0001F600", u"null", u"{\"", u"]}",     u"~1"};
         String result;
         for (int n = upTo(12); n > 0; --n)
             result += pieces[static_cast<std::size_t>(upTo(static_cast<int>(pieces.size()) - 1))];
@@ -52,15 +53,20 @@ private:
     void act() {
         switch (upTo(7)) {
         case 0:
-        case 1: return addTable();
+        case 1:
+            return addTable();
         case 2:
-        case 3: return addJoin();
-        case 4: return addDefinition();
-        case 5: return change();
+        case 3:
+            return addJoin();
+        case 4:
+            return addDefinition();
+        case 5:
+            return change();
         case 6:
             if (chance(50) && table()) mQuery->renameTable(table(), name() + suffix());
             return;
-        default: return remove();
+        default:
+            return remove();
         }
     }
 

@@ -34,8 +34,7 @@ private:
 
 /// Runs statements that may write.
 inline void runOnServer(const QStringList& statements) {
-    const reader::Connection connection(
-        oneServer.server().connect(QStringLiteral("statements")));
+    const reader::Connection connection(oneServer.server().connect(QStringLiteral("statements")));
     const QStringList quiet{QStringLiteral("SET client_min_messages = warning")};
     for (const QString& statement : quiet + statements) {
         QSqlQuery query(connection.database());

@@ -14,11 +14,10 @@ TEST(AConnectionToPostgres, CannotWrite) {
 TEST(AConnectionToPostgres, SaysWhichDatabaseOrUserIsNotThere) {
     const auto noDatabase =
         reader::openDatabase(serverAddress(QStringLiteral("postgres"), QStringLiteral("gone")));
-    EXPECT_TRUE(noDatabase.error().endsWith(
-        QStringLiteral("check the name of the database.")))
+    EXPECT_TRUE(noDatabase.error().endsWith(QStringLiteral("check the name of the database.")))
         << noDatabase.error().toStdString();
-    EXPECT_TRUE(noDatabase.error().startsWith(QStringLiteral(
-        "The database postgresql://postgres@localhost/gone cannot be opened (")))
+    EXPECT_TRUE(noDatabase.error().startsWith(
+        QStringLiteral("The database postgresql://postgres@localhost/gone cannot be opened (")))
         << noDatabase.error().toStdString();
     EXPECT_FALSE(noDatabase.error().contains(u'\n'));
     const auto noUser = reader::openDatabase(serverAddress(QStringLiteral("nobody")));
@@ -31,8 +30,9 @@ TEST(AConnectionToPostgres, SaysThatTheServerEndedIt) {
     ASSERT_TRUE(opened) << opened.error().toStdString();
     const auto schema = reader::makeReader(opened->database());
     ASSERT_TRUE(schema->tables());
-    runOnServer({QStringLiteral("SELECT pg_terminate_backend(pid) FROM pg_stat_activity "
-                                "WHERE pid <> pg_backend_pid() AND backend_type = 'client backend'")});
+    runOnServer(
+        {QStringLiteral("SELECT pg_terminate_backend(pid) FROM pg_stat_activity "
+                        "WHERE pid <> pg_backend_pid() AND backend_type = 'client backend'")});
     const auto tables = schema->tables();
     ASSERT_FALSE(tables);
     EXPECT_TRUE(tables.error().startsWith(QStringLiteral("The list of tables cannot be read (")))

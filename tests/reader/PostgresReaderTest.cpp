@@ -85,37 +85,36 @@ TEST_F(PostgresReader, ReadsColumnsWithDeclaredTypeAndMeaning) {
                      "po pointer, pt point, gone int, g int GENERATED ALWAYS AS (i + 1) STORED, "
                      "me mood[])"),
                  sql("ALTER TABLE t DROP COLUMN gone")});
-    const Columns expected = {
-        {u"i", ColumnType::Integer, u"integer", false},
-        {u"b", ColumnType::Integer, u"bigint", false},
-        {u"n", ColumnType::Decimal, u"numeric(10,2)", false},
-        {u"r", ColumnType::Decimal, u"real", false},
-        {u"d", ColumnType::Decimal, u"double precision", false},
-        {u"v", ColumnType::Text, u"character varying(40)", false},
-        {u"c", ColumnType::Text, u"character(2)", false},
-        {u"x", ColumnType::Text, u"text", false},
-        {u"o", ColumnType::Boolean, u"boolean", false},
-        {u"da", ColumnType::Date, u"date", false},
-        {u"ti", ColumnType::Time, u"time without time zone", false},
-        {u"tz", ColumnType::Timestamp, u"timestamp with time zone", false},
-        {u"ts", ColumnType::Timestamp, u"timestamp without time zone", false},
-        {u"y", ColumnType::Blob, u"bytea", false},
-        {u"u", ColumnType::Text, u"uuid", false},
-        {u"j", ColumnType::Text, u"jsonb", false},
-        {u"iv", ColumnType::Unknown, u"interval", false},
-        {u"a", ColumnType::Unknown, u"integer[]", false},
-        {u"e", ColumnType::Text, u"mood", false},
-        {u"p", ColumnType::Decimal, u"price", false},
-        {u"ra", ColumnType::Unknown, u"int4range", false},
-        {u"po", ColumnType::Unknown, u"pointer", false},
-        {u"pt", ColumnType::Unknown, u"point", false},
-        {u"g", ColumnType::Integer, u"integer", false},
-        {u"me", ColumnType::Unknown, u"mood[]", false}};
+    const Columns expected = {{u"i", ColumnType::Integer, u"integer", false},
+                              {u"b", ColumnType::Integer, u"bigint", false},
+                              {u"n", ColumnType::Decimal, u"numeric(10,2)", false},
+                              {u"r", ColumnType::Decimal, u"real", false},
+                              {u"d", ColumnType::Decimal, u"double precision", false},
+                              {u"v", ColumnType::Text, u"character varying(40)", false},
+                              {u"c", ColumnType::Text, u"character(2)", false},
+                              {u"x", ColumnType::Text, u"text", false},
+                              {u"o", ColumnType::Boolean, u"boolean", false},
+                              {u"da", ColumnType::Date, u"date", false},
+                              {u"ti", ColumnType::Time, u"time without time zone", false},
+                              {u"tz", ColumnType::Timestamp, u"timestamp with time zone", false},
+                              {u"ts", ColumnType::Timestamp, u"timestamp without time zone", false},
+                              {u"y", ColumnType::Blob, u"bytea", false},
+                              {u"u", ColumnType::Text, u"uuid", false},
+                              {u"j", ColumnType::Text, u"jsonb", false},
+                              {u"iv", ColumnType::Unknown, u"interval", false},
+                              {u"a", ColumnType::Unknown, u"integer[]", false},
+                              {u"e", ColumnType::Text, u"mood", false},
+                              {u"p", ColumnType::Decimal, u"price", false},
+                              {u"ra", ColumnType::Unknown, u"int4range", false},
+                              {u"po", ColumnType::Unknown, u"pointer", false},
+                              {u"pt", ColumnType::Unknown, u"point", false},
+                              {u"g", ColumnType::Integer, u"integer", false},
+                              {u"me", ColumnType::Unknown, u"mood[]", false}};
     const Columns read = columns({u"", u"t"});
     ASSERT_EQ(read.size(), expected.size());
     for (std::size_t n = 0; n < read.size(); ++n)
-        EXPECT_EQ(read[n], expected[n]) << platform::toUtf8(read[n].name + u" " +
-                                                            read[n].declaredType);
+        EXPECT_EQ(read[n], expected[n])
+            << platform::toUtf8(read[n].name + u" " + read[n].declaredType);
 }
 
 TEST_F(PostgresReader, MarksTheColumnsOfAPrimaryKey) {
@@ -151,7 +150,8 @@ TEST_F(PostgresReader, SaysWhichTableIsNotThere) {
 }
 
 TEST_F(PostgresReader, ReadsForeignKeysInTheirOrderPairByPair) {
-    runOnServer({sql("CREATE SCHEMA aside"), sql("CREATE TABLE p (a int, b int, PRIMARY KEY (b, a))"),
+    runOnServer({sql("CREATE SCHEMA aside"),
+                 sql("CREATE TABLE p (a int, b int, PRIMARY KEY (b, a))"),
                  sql("CREATE TABLE aside.q (id int PRIMARY KEY)"),
                  sql("CREATE TABLE c (x int, y int, q int REFERENCES aside.q, own int UNIQUE, "
                      "up int REFERENCES c (own), FOREIGN KEY (x, y) REFERENCES p (a, b))")});

@@ -23,31 +23,32 @@ bool printLine(const Value& value, std::string& out, std::size_t limit) {
         out += text;
         return out.size() <= limit;
     };
-    return std::visit(
-        Overloaded{[&](Null) { return add("null"); },
-                   [&](bool flag) { return add(flag ? "true" : "false"); },
-                   [&](const Number& number) { return add(number.text); },
-                   [&](const std::string& text) { return text.size() <= limit && add(quoted(text)); },
-                   [&](const Items& items) {
-                       if (items.empty()) return add("[]");
-                       add("[");
-                       for (const Value& item : items) {
-                           if (&item != &items.front()) add(", ");
-                           if (!printLine(item, out, limit)) return false;
-                       }
-                       return add("]");
-                   },
-                   [&](const Members& members) {
-                       if (members.empty()) return add("{}");
-                       add("{");
-                       for (const Member& member : members) {
-                           if (&member != &members.front()) add(", ");
-                           if (!add(quoted(member.name)) || !add(": ")) return false;
-                           if (!printLine(member.value, out, limit)) return false;
-                       }
-                       return add("}");
-                   }},
-        value.content);
+    return std::visit(Overloaded{[&](Null) { return add("null"); },
+                                 [&](bool flag) { return add(flag ? "true" : "false"); },
+                                 [&](const Number& number) { return add(number.text); },
+                                 [&](const std::string& text) {
+                                     return text.size() <= limit && add(quoted(text));
+                                 },
+                                 [&](const Items& items) {
+                                     if (items.empty()) return add("[]");
+                                     add("[");
+                                     for (const Value& item : items) {
+                                         if (&item != &items.front()) add(", ");
+                                         if (!printLine(item, out, limit)) return false;
+                                     }
+                                     return add("]");
+                                 },
+                                 [&](const Members& members) {
+                                     if (members.empty()) return add("{}");
+                                     add("{");
+                                     for (const Member& member : members) {
+                                         if (&member != &members.front()) add(", ");
+                                         if (!add(quoted(member.name)) || !add(": ")) return false;
+                                         if (!printLine(member.value, out, limit)) return false;
+                                     }
+                                     return add("}");
+                                 }},
+                      value.content);
 }
 
 /// `used` characters stand in the line already.

@@ -34,11 +34,11 @@ std::string complaint(std::string what) {
 }
 
 std::size_t utf16Length(std::string_view utf8) {
-    return static_cast<std::size_t>(std::count_if(utf8.begin(), utf8.end(), [](char c) {
-               return (static_cast<unsigned char>(c) & 0xC0) != 0x80;
-           }) +
-           std::count_if(utf8.begin(), utf8.end(),
-                         [](char c) { return static_cast<unsigned char>(c) >= 0xF0; }));
+    return static_cast<std::size_t>(
+        std::count_if(utf8.begin(), utf8.end(),
+                      [](char c) { return (static_cast<unsigned char>(c) & 0xC0) != 0x80; }) +
+        std::count_if(utf8.begin(), utf8.end(),
+                      [](char c) { return static_cast<unsigned char>(c) >= 0xF0; }));
 }
 
 /// Builds the tree from what the parser meets, and refuses what goes beyond the limits before it
@@ -126,8 +126,8 @@ private:
 
     bool add(Value value) {
         if (++mCount > limits::values)
-            refuse(place(), "is one value too many: a file may have " +
-                                std::to_string(limits::values));
+            refuse(place(),
+                   "is one value too many: a file may have " + std::to_string(limits::values));
         if (mOpen.empty()) {
             mRoot = std::move(value);
             return true;

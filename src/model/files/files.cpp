@@ -57,14 +57,20 @@ std::string quoted(const Path& path) {
 /// By the number of the system's error.
 std::string advice(int error) {
     switch (error) {
-    case ENOENT: return "check the path";
+    case ENOENT:
+        return "check the path";
     case EACCES:
-    case EPERM: return "ask the owner for permission, or choose another folder";
+    case EPERM:
+        return "ask the owner for permission, or choose another folder";
     case ENOSPC:
-    case EDQUOT: return "make room on the disk, or choose another one";
-    case EFBIG: return "choose another disk";
-    case EROFS: return "choose a folder on another disk";
-    default: return "try again, or choose another folder";
+    case EDQUOT:
+        return "make room on the disk, or choose another one";
+    case EFBIG:
+        return "choose another disk";
+    case EROFS:
+        return "choose a folder on another disk";
+    default:
+        return "try again, or choose another folder";
     }
 }
 
@@ -111,8 +117,7 @@ std::optional<Error> saveQuery(const Path& path, const QueryDocument& document) 
     if (replaces && !S_ISREG(old.st_mode))
         return Error{quoted(path) + " is not a file; choose another name."};
     if (replaces && ::access(target.c_str(), W_OK) != 0)
-        return Error{"The file " + quoted(path) +
-                     " is write-protected; save under another name."};
+        return Error{"The file " + quoted(path) + " is write-protected; save under another name."};
 
     const Path beside = nameBeside(target);
     constexpr mode_t everybody = 0666; // less what the user's mask forbids

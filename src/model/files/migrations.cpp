@@ -4,8 +4,8 @@
 #include "model/files/QueryDocument.h"
 #include "model/files/words.h"
 
-#include <array>
 #include <algorithm>
+#include <array>
 
 namespace files {
 
@@ -27,8 +27,7 @@ void numberToWord(json::Members& join, std::string_view name, Words words, const
     if (!value) return;
     const auto greatest = static_cast<std::int64_t>(words.size()) - 1;
     const auto code = wholeNumber(*value, 0, greatest);
-    if (!code)
-        refuse(place / name, "is not a whole number from 0 to " + std::to_string(greatest));
+    if (!code) refuse(place / name, "is not a whole number from 0 to " + std::to_string(greatest));
     value->content = std::string(words[static_cast<std::size_t>(*code)]);
 }
 
@@ -38,8 +37,8 @@ std::int64_t greatestKey(const std::vector<json::Members*>& objects, char16_t le
         const json::Value* key = json::find(*object, "key");
         const auto* text = key ? std::get_if<std::string>(&key->content) : nullptr;
         if (!text) continue;
-        greatest = std::max(
-            greatest, model::keyNumber(platform::fromUtf8(*text), letter).value_or(0));
+        greatest =
+            std::max(greatest, model::keyNumber(platform::fromUtf8(*text), letter).value_or(0));
     }
     return greatest;
 }

@@ -51,7 +51,8 @@ void Reader::read(json::Value file) {
                        last.integer<std::int32_t>("join"),
                        last.integer<std::int32_t>("definition")};
     keep(std::move(last), "lastKeys");
-    each(std::move(tables), object.place() / "tables", [&](Object each) { table(std::move(each)); });
+    each(std::move(tables), object.place() / "tables",
+         [&](Object each) { table(std::move(each)); });
     each(std::move(joins), object.place() / "joins", [&](Object each) { join(std::move(each)); });
     each(std::move(definitions), object.place() / "definitions",
          [&](Object each) { definition(std::move(each)); });
@@ -74,8 +75,8 @@ void Reader::table(Object object) {
     auto columns = object.list("columns", limits::columnsOfTable);
     mColumns += columns.size();
     if (mColumns > limits::columns)
-        refuse(object.place() / "columns", "makes the columns of all tables more than " +
-                                               std::to_string(limits::columns));
+        refuse(object.place() / "columns",
+               "makes the columns of all tables more than " + std::to_string(limits::columns));
     each(std::move(columns), object.place() / "columns",
          [&](Object each) { table.columns.push_back(column(std::move(each))); });
 

@@ -81,20 +81,19 @@ json::Value Writer::table(const model::TableRecord& table, const Pointer& place)
     for (const auto& each : table.columns)
         columns.push_back(column(each, place / "columns" / columns.size()));
     const std::string key = platform::toUtf8(table.key);
-    return whole(
-        {{"key", {key}},
-         {"name", textOf(table.name, place / "name")},
-         {"source", whole({{"schema", textOf(table.schema, place / "source" / "schema")},
-                           {"name", textOf(table.sourceName, place / "source" / "name")}},
-                          key + "/source")},
-         {"place", whole({{"left", json::number(table.left)},
-                          {"top", json::number(table.top)},
-                          {"width", json::number(table.width)},
-                          {"height", json::number(table.height)}},
-                         key + "/place")},
-         {"selected", json::number(table.selected)},
-         {"columns", {std::move(columns)}}},
-        key);
+    return whole({{"key", {key}},
+                  {"name", textOf(table.name, place / "name")},
+                  {"source", whole({{"schema", textOf(table.schema, place / "source" / "schema")},
+                                    {"name", textOf(table.sourceName, place / "source" / "name")}},
+                                   key + "/source")},
+                  {"place", whole({{"left", json::number(table.left)},
+                                   {"top", json::number(table.top)},
+                                   {"width", json::number(table.width)},
+                                   {"height", json::number(table.height)}},
+                                  key + "/place")},
+                  {"selected", json::number(table.selected)},
+                  {"columns", {std::move(columns)}}},
+                 key);
 }
 
 json::Value Writer::column(const model::ColumnRecord& column, const Pointer& place) const {

@@ -31,8 +31,8 @@ const QString schemaColumn = QStringLiteral(
 
 /// The table that an id names; two parameters, schema and name. Not to_regclass, which reads the
 /// name as SQL does.
-const QString named = QStringLiteral(
-    "n.nspname = coalesce(nullif(?, ''), current_schema()) AND c.relname = ?");
+const QString named =
+    QStringLiteral("n.nspname = coalesce(nullif(?, ''), current_schema()) AND c.relname = ?");
 
 /// What a column's type means. `base` is the declared type or, of a domain, the one it is made
 /// from. Only the engine's own types are known by name: another's may have any.
@@ -44,16 +44,23 @@ model::ColumnType typeOf(const QString& base, const QString& category, bool buil
     case u'C': // rows
     case u'R': // ranges
         return ColumnType::Unknown;
-    case u'E': return ColumnType::Text;
-    default: break;
+    case u'E':
+        return ColumnType::Text;
+    default:
+        break;
     }
     if (builtIn) return columnType(base.toStdU16String());
     switch (kind) {
-    case u'B': return ColumnType::Boolean;
-    case u'D': return ColumnType::Timestamp;
-    case u'N': return ColumnType::Decimal;
-    case u'S': return ColumnType::Text;
-    default: return ColumnType::Unknown;
+    case u'B':
+        return ColumnType::Boolean;
+    case u'D':
+        return ColumnType::Timestamp;
+    case u'N':
+        return ColumnType::Decimal;
+    case u'S':
+        return ColumnType::Text;
+    default:
+        return ColumnType::Unknown;
     }
 }
 
@@ -110,8 +117,8 @@ Result<model::TableDescription> PostgresReader::table(const TableId& id) {
         });
     if (error) return *error;
     if (!found)
-        return Error{QStringLiteral("%1 is not in the database; read the list of tables afresh.")
-                         .arg(what)};
+        return Error{
+            QStringLiteral("%1 is not in the database; read the list of tables afresh.").arg(what)};
     return description;
 }
 

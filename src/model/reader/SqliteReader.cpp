@@ -48,11 +48,12 @@ Result<std::vector<TableEntry>> SqliteReader::tables() {
         // Only this tells the tables that a virtual one keeps for itself, but it reads the columns
         // of all tables for it.
         entries.clear();
-        error = readRows(mDatabase, what,
-                         QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list WHERE "
-                                        "schema = 'main' AND type IN ('table', 'view', 'virtual')") +
-                             order,
-                         {}, add);
+        error =
+            readRows(mDatabase, what,
+                     QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list WHERE "
+                                    "schema = 'main' AND type IN ('table', 'view', 'virtual')") +
+                         order,
+                     {}, add);
     }
     if (error) return *error;
     return entries;
@@ -62,15 +63,15 @@ Result<model::TableDescription> SqliteReader::table(const TableId& id) {
     model::TableDescription description{id.schema, id.name, {}};
     constexpr int hiddenInVirtualTable = 1; // generated columns, 2 and 3, are like any other
     const QString named = QStringLiteral("The table \"%1\"").arg(toQt(id.name));
-    const auto error = readRows(
-        mDatabase, named,
-        QStringLiteral("SELECT name, type, pk, hidden FROM pragma_table_xinfo(?, ?)"),
-        {toQt(id.name), schemaOf(id)}, [&](const QSqlQuery& row) {
-            if (row.value(3).toInt() == hiddenInVirtualTable) return;
-            const String type = textAt(row, 1);
-            description.columns.push_back(
-                {textAt(row, 0), columnType(type), type, row.value(2).toInt() > 0});
-        });
+    const auto error =
+        readRows(mDatabase, named,
+                 QStringLiteral("SELECT name, type, pk, hidden FROM pragma_table_xinfo(?, ?)"),
+                 {toQt(id.name), schemaOf(id)}, [&](const QSqlQuery& row) {
+                     if (row.value(3).toInt() == hiddenInVirtualTable) return;
+                     const String type = textAt(row, 1);
+                     description.columns.push_back(
+                         {textAt(row, 0), columnType(type), type, row.value(2).toInt() > 0});
+                 });
     if (error) return *error;
     if (description.columns.empty())
         return Error{QStringLiteral("%1 is not in the database; read the list of tables afresh.")
@@ -80,11 +81,11 @@ Result<model::TableDescription> SqliteReader::table(const TableId& id) {
 
 Result<std::vector<String>> SqliteReader::primaryKey(const TableId& id) const {
     std::vector<String> columns;
-    const auto error =
-        readRows(mDatabase, QStringLiteral("The primary key of \"%1\"").arg(toQt(id.name)),
-             QStringLiteral("SELECT name FROM pragma_table_xinfo(?, ?) WHERE pk > 0 ORDER BY pk"),
-             {toQt(id.name), schemaOf(id)},
-             [&](const QSqlQuery& row) { columns.push_back(textAt(row, 0)); });
+    const auto error = readRows(
+        mDatabase, QStringLiteral("The primary key of \"%1\"").arg(toQt(id.name)),
+        QStringLiteral("SELECT name FROM pragma_table_xinfo(?, ?) WHERE pk > 0 ORDER BY pk"),
+        {toQt(id.name), schemaOf(id)},
+        [&](const QSqlQuery& row) { columns.push_back(textAt(row, 0)); });
     if (error) return *error;
     return columns;
 }

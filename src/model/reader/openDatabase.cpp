@@ -45,9 +45,9 @@ const QString example = QStringLiteral("write it like postgresql://user@host:543
 /// They go into a line that the driver makes, so only known names get there, and values in quotes.
 Result<QString> postgresOptions(const QUrlQuery& query) {
     static const QStringList known = {
-        QStringLiteral("sslmode"), QStringLiteral("sslrootcert"),     QStringLiteral("sslcert"),
-        QStringLiteral("sslkey"),  QStringLiteral("connect_timeout"),
-        QStringLiteral("application_name")};
+        QStringLiteral("sslmode"),         QStringLiteral("sslrootcert"),
+        QStringLiteral("sslcert"),         QStringLiteral("sslkey"),
+        QStringLiteral("connect_timeout"), QStringLiteral("application_name")};
     QString options;
     bool timed = false;
     for (auto [name, value] : query.queryItems(QUrl::FullyDecoded)) {
@@ -82,8 +82,8 @@ Result<Connection> openServer(const Engine& engine, const QUrl& url, const QStri
         options = *made;
     }
 
-    Connection connection(QSqlDatabase::addDatabase(
-        driver, QUuid::createUuid().toString(QUuid::WithoutBraces)));
+    Connection connection(
+        QSqlDatabase::addDatabase(driver, QUuid::createUuid().toString(QUuid::WithoutBraces)));
     QSqlDatabase database = connection.database();
     const QString folder = query.queryItemValue(QStringLiteral("host"), QUrl::FullyDecoded);
     database.setHostName(folder.isEmpty() ? url.host() : folder);
@@ -118,8 +118,8 @@ Result<Connection> openDatabase(const QString& address, const QString& password)
                                     "a character that means something else there.")
                          .arg(example)};
     if (engine == engines.end())
-        return Error{QStringLiteral("There is no kind of database \"%1\"; %2.")
-                         .arg(url.scheme(), example)};
+        return Error{
+            QStringLiteral("There is no kind of database \"%1\"; %2.").arg(url.scheme(), example)};
     return openServer(*engine, url, password);
 }
 
