@@ -1,0 +1,50 @@
+#pragma once
+
+#include "model/Library.h"
+#include "platform/qt/ZandorWidget.h"
+
+#include <QPointer>
+#include <QVariantMap>
+
+namespace designer {
+
+class Document;
+
+/// The control over the document's query. The control shows what it changed itself; for everything
+/// else it is made anew, because binding a model again keeps the grid's columns of the one before.
+class DrawingArea final : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit DrawingArea(Document& document, QWidget* parent = nullptr);
+    ~DrawingArea() override;
+
+    /// The control of the moment. It goes whenever the drawing is shown anew: keep it no longer than
+    /// a statement, and connect to every one from controlMade().
+    ZandorWidget& control() { return *mControl; }
+    /// The control's properties by name, set on this control and all later ones before they get
+    /// their model.
+    void setOptions(const QVariantMap& options);
+    const QVariantMap& options() const { return mOptions; }
+
+    /// The place on the canvas, in twips, that is seen at a place of this widget.
+    QPoint canvasPlace(QPoint at) const;
+
+signals:
+    /// A control was made, and has its options and not yet its model.
+    void controlMade(ZandorWidget* control);
+
+protected:
+    void resizeEvent(QResizeEvent* event) override;
+
+private:
+    void showAnew();
+    void fitCanvas();
+
+    Document& mDocument;
+    model::Library mLibrary; ///< outlives every control
+    QVariantMap mOptions;
+    ZandorWidget* mControl = nullptr;
+};
+
+} // namespace designer
