@@ -2,7 +2,6 @@
 
 namespace TalvikDBxZandor {
 
-using platform::Design;
 using platform::StringView;
 
 namespace {
@@ -31,16 +30,16 @@ frmJoinDefinition::frmJoinDefinition(platform::Toolkit& toolkit, bool debug)
       lblRightColumn(label(toolkit, form.get(), u"lblRightColumn", u"Right Column:")),
       txtRightColumn(textBox(toolkit, form.get(), u"txtRightColumn")),
       lblJoinType(label(toolkit, form.get(), u"lblJoinType", u"Join Type")),
-      cboJoinType(toolkit.makeComboBox(
-          {.Name = u"cboJoinType", .Container = form.get()},
-          {u"Normal", u"Left Outer", u"Right Outer", u"Both Outer"}, {})),
-      lblJoinCompareOperator(label(toolkit, form.get(), u"lblJoinCompareOperator",
-                                   u"Join Compare Operator")),
+      cboJoinType(toolkit.makeComboBox({.Name = u"cboJoinType", .Container = form.get()},
+                                       {u"Normal", u"Left Outer", u"Right Outer", u"Both Outer"},
+                                       {})),
+      lblJoinCompareOperator(
+          label(toolkit, form.get(), u"lblJoinCompareOperator", u"Join Compare Operator")),
       cboJoinCompareOperator(toolkit.makeComboBox(
           {.Name = u"cboJoinCompareOperator", .Container = form.get()}, {}, {})),
-      cmdOk(toolkit.makeCommandButton(
-          {.Name = u"cmdOk", .Caption = u"&Ok", .Container = form.get()},
-          {.Click = [this] { cmdOk_Click(); }, .GotFocus = {}})),
+      cmdOk(
+          toolkit.makeCommandButton({.Name = u"cmdOk", .Caption = u"&Ok", .Container = form.get()},
+                                    {.Click = [this] { cmdOk_Click(); }, .GotFocus = {}})),
       cmdCancel(toolkit.makeCommandButton(
           {.Name = u"cmdCancel", .Caption = u"&Cancel", .Container = form.get()},
           {.Click = [this] { cmdCancel_Click(); }, .GotFocus = {}})),

@@ -42,36 +42,24 @@ std::string quoted(platform::StringView text) {
 
 std::string_view nameOf(Type type) {
     switch (type) {
-    case Type::none:
-        return "";
-    case Type::String:
-        return "String";
-    case Type::Boolean:
-        return "Boolean";
-    case Type::Integer:
-        return "Integer";
-    case Type::Zandor:
-        return "query model";
-    case Type::ZDJoin:
-        return "ZDJoin";
-    case Type::ZDTable:
-        return "ZDTable";
-    case Type::ZDColumn:
-        return "ZDColumn";
+    case Type::none: return "";
+    case Type::String: return "String";
+    case Type::Boolean: return "Boolean";
+    case Type::Integer: return "Integer";
+    case Type::Zandor: return "query model";
+    case Type::ZDJoin: return "ZDJoin";
+    case Type::ZDTable: return "ZDTable";
+    case Type::ZDColumn: return "ZDColumn";
     }
     return "";
 }
 
 std::string_view access(Setter setter) {
     switch (setter) {
-    case Setter::none:
-        return "get";
-    case Setter::byValue:
-        return "get, set";
-    case Setter::byReference:
-        return "get, set by reference";
-    case Setter::object:
-        return "get, set an object";
+    case Setter::none: return "get";
+    case Setter::byValue: return "get, set";
+    case Setter::byReference: return "get, set by reference";
+    case Setter::object: return "get, set an object";
     }
     return "";
 }
@@ -105,14 +93,10 @@ std::string parametersOf(const Member& member) {
 
 std::string_view argumentsOf(automation::Carries carries) {
     switch (carries) {
-    case automation::Carries::nothing:
-        return "none";
-    case automation::Carries::definition:
-        return "the output column's `ZDColumnDefinition`";
-    case automation::Carries::join:
-        return "the `ZDJoin`";
-    case automation::Carries::textAndNumber:
-        return "a text, a number";
+    case automation::Carries::nothing: return "none";
+    case automation::Carries::definition: return "the output column's `ZDColumnDefinition`";
+    case automation::Carries::join: return "the `ZDJoin`";
+    case automation::Carries::textAndNumber: return "a text, a number";
     }
     return "";
 }
@@ -148,9 +132,7 @@ void Page::describedRows(Kind kind, Zandor& control) {
             row(id, code, nameOf(member.type), access(member.setter), defaultOf(member, control),
                 descriptionOf(name), reports(member));
             break;
-        case Kind::method:
-            row(id, code, parametersOf(member), descriptionOf(name));
-            break;
+        case Kind::method: row(id, code, parametersOf(member), descriptionOf(name)); break;
         }
     }
 }

@@ -40,15 +40,10 @@ Report someReport() {
     };
     const auto orders = source("orders", {{.name = "id", .key = true}, {.name = "customer"}});
     const auto customers = source("customers", {{.name = "id", .key = true}, {.name = "name"}});
-    report.links.push_back(std::make_shared<Link>(Link{.id = ++report.lastId,
-                                                       .from = orders,
-                                                       .to = customers,
-                                                       .fromField = 1,
-                                                       .toField = 0}));
-    report.outputs.push_back(std::make_shared<Output>(Output{.id = ++report.lastId,
-                                                             .source = customers,
-                                                             .field = 1,
-                                                             .conditions = {{4, "Like 'A*'"}}}));
+    report.links.push_back(std::make_shared<Link>(Link{
+        .id = ++report.lastId, .from = orders, .to = customers, .fromField = 1, .toField = 0}));
+    report.outputs.push_back(std::make_shared<Output>(Output{
+        .id = ++report.lastId, .source = customers, .field = 1, .conditions = {{4, "Like 'A*'"}}}));
     return report;
 }
 

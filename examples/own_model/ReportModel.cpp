@@ -39,15 +39,16 @@ auto countOf(std::vector<T>& items) {
 
 template <class T>
 auto removeFrom(std::vector<T>& items) {
-    return [&items](std::size_t at) { items.erase(items.begin() + static_cast<std::ptrdiff_t>(at)); };
+    return
+        [&items](std::size_t at) { items.erase(items.begin() + static_cast<std::ptrdiff_t>(at)); };
 }
 
 } // namespace
 
 Table::Table(std::shared_ptr<Source> from)
-    : source(std::move(from)),
-      mColumns(countOf(source->fields),
-               [source = source](std::size_t at) { return makeRef<Column>(source, at); }) {}
+    : source(std::move(from)), mColumns(countOf(source->fields), [source = source](std::size_t at) {
+          return makeRef<Column>(source, at);
+      }) {}
 
 // [join]
 Ref<ZDTable> Join::LeftTable() const { return tableOf(link->from); }
@@ -140,9 +141,8 @@ Ref<ZDColumnDefinition> Model::AddColumnDefinition(const Ref<ZDColumnDefinition>
 
 void Model::DeleteTable(const Ref<ZDTable>& table) {
     const std::shared_ptr<Source> source = own<Table>(table).source;
-    std::erase_if(mReport->links, [&](const auto& link) {
-        return link->from == source || link->to == source;
-    });
+    std::erase_if(mReport->links,
+                  [&](const auto& link) { return link->from == source || link->to == source; });
     std::erase_if(mReport->outputs, [&](const auto& output) { return output->source == source; });
     std::erase(mReport->sources, source);
 }

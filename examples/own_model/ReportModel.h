@@ -128,8 +128,7 @@ private:
 
 /// By position every row from the first to the last one with a condition, so that each shows in
 /// its own; a row without one reads as empty.
-class Conditions final
-    : public TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDCriterium> {
+class Conditions final : public TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDCriterium> {
 public:
     explicit Conditions(std::shared_ptr<Output> output) : mOutput(std::move(output)) {}
 

@@ -16,9 +16,8 @@ int main(int argc, char** argv) {
     designer.setDebugSwitch(0);  // no trace boxes
     designer.setOnlyJoin(false); // with the grid below the canvas
     designer.setModel(platform::makeRef<report::Model>(ours));
-    QObject::connect(&designer, &ZandorWidget::JoinCreated, [&] {
-        qInfo("now there are %zu links", ours->links.size());
-    });
+    QObject::connect(&designer, &ZandorWidget::JoinCreated,
+                     [&] { qInfo("now there are %zu links", ours->links.size()); });
     designer.resize(900, 600);
     designer.show();
     if (QApplication::arguments().contains("--close"))

@@ -23,7 +23,7 @@ struct EventArguments {
     platform::Ref<TalvikZandorLib::ZDColumnDefinition> Definition{}; ///< the Column... events
     platform::Ref<TalvikZandorLib::ZDJoin> Join{};                   ///< the Join... events
     platform::String Text{};                                         ///< Error
-    std::int32_t Number = 0;                                       ///< Error
+    std::int32_t Number = 0;                                         ///< Error
 };
 
 /// The host's end of the events.

@@ -26,7 +26,13 @@ constexpr Type typeOf() {
 template <auto Pointer>
 constexpr Member field(std::uint32_t dispatchId, platform::StringView name) {
     using T = std::remove_cvref_t<decltype(std::declval<Zandor&>().*Pointer)>;
-    return {dispatchId, name, Kind::field, typeOf<T>(), Setter::byValue, {}, {},
+    return {dispatchId,
+            name,
+            Kind::field,
+            typeOf<T>(),
+            Setter::byValue,
+            {},
+            {},
             [](Zandor& zandor) -> Variant { return zandor.*Pointer; },
             [](Zandor& zandor, const Variant& value) { zandor.*Pointer = valueOf<T>(value); }};
 }

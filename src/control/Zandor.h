@@ -155,7 +155,6 @@ private:
     static constexpr std::int16_t lastTableSlot = 16;
     static constexpr std::int16_t lastJoinSlot = 64;
 
-
     // Errors and traces
     template <class Body>
     void Guard(platform::StringView procedure, Body&& body) const noexcept {

@@ -16,9 +16,7 @@ platform::Ref<TalvikZandorLib::Zandor> Zandor::Model() {
 
 platform::Ref<TalvikZandorLib::Zandor> Zandor::P_GET_Zandor() {
     Ref<TalvikZandorLib::Zandor> result;
-    Guard(u"P_GET Zandor", [&] {
-        result = Model();
-    });
+    Guard(u"P_GET Zandor", [&] { result = Model(); });
     return result;
 }
 

@@ -4,7 +4,6 @@
 
 namespace TalvikDBxZandor {
 
-using platform::Design;
 using platform::Orientation;
 
 namespace {
@@ -20,13 +19,11 @@ constexpr std::int32_t gridCols = 256;
 
 } // namespace
 
-Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library,
-               ZandorEvents& events)
+Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, ZandorEvents& events)
     : mToolkit(toolkit), mLibrary(library), mEvents(events), mTableEvents(TableEvents()),
-      fraTable(toolkit.makeFrame(
-          {.Name = u"fraTable", .FontName = arial, .Caption = u"Frame1"},
-          {.MouseDown = [this](auto... a) { fraTable_MouseDown(a...); },
-           .MouseUp = [this](auto... a) { fraTable_MouseUp(a...); }})),
+      fraTable(toolkit.makeFrame({.Name = u"fraTable", .FontName = arial, .Caption = u"Frame1"},
+                                 {.MouseDown = [this](auto... a) { fraTable_MouseDown(a...); },
+                                  .MouseUp = [this](auto... a) { fraTable_MouseUp(a...); }})),
       linJoin([this](std::int16_t index, const platform::Line*) {
           return mToolkit.makeLine({.Name = u"linJoin", .Container = fraTable.get()}, index);
       }),
@@ -38,21 +35,20 @@ Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library,
               {.Name = u"lstTable", .FontName = sansSerif, .Container = fraTable.get()}, index,
               pattern, mTableEvents);
       }),
-      sprColumn(toolkit.makeGrid(
-          {.Name = u"sprColumn", .FontName = comicSans}, gridRows, gridCols,
-          {.MouseDown = [this](auto... a) { sprColumn_MouseDown(a...); },
-           .MouseUp = [this](auto... a) { sprColumn_MouseUp(a...); },
-           .DragDrop = [this](auto... a) { sprColumn_DragDrop(a...); },
-           .Scroll = [this] { sprColumn_Scroll(); }})),
-      hsbTable(toolkit.makeScrollBar({.Name = u"hsbTable"}, Orientation::horizontal,
-                                     {.Change = [this] { hsbTable_Change(); },
-                                      .GotFocus = [this] { hsbTable_GotFocus(); }})),
-      vsbTable(toolkit.makeScrollBar({.Name = u"vsbTable"}, Orientation::vertical,
-                                     {.Change = [this] { vsbTable_Change(); },
-                                      .GotFocus = [this] { vsbTable_GotFocus(); }})),
-      cmdHome(toolkit.makeCommandButton({.Name = u"cmdHome", .FontName = sansSerif},
-                                        {.Click = [this] { cmdHome_Click(); },
-                                         .GotFocus = [this] { cmdHome_GotFocus(); }})),
+      sprColumn(toolkit.makeGrid({.Name = u"sprColumn", .FontName = comicSans}, gridRows, gridCols,
+                                 {.MouseDown = [this](auto... a) { sprColumn_MouseDown(a...); },
+                                  .MouseUp = [this](auto... a) { sprColumn_MouseUp(a...); },
+                                  .DragDrop = [this](auto... a) { sprColumn_DragDrop(a...); },
+                                  .Scroll = [this] { sprColumn_Scroll(); }})),
+      hsbTable(toolkit.makeScrollBar(
+          {.Name = u"hsbTable"}, Orientation::horizontal,
+          {.Change = [this] { hsbTable_Change(); }, .GotFocus = [this] { hsbTable_GotFocus(); }})),
+      vsbTable(toolkit.makeScrollBar(
+          {.Name = u"vsbTable"}, Orientation::vertical,
+          {.Change = [this] { vsbTable_Change(); }, .GotFocus = [this] { vsbTable_GotFocus(); }})),
+      cmdHome(toolkit.makeCommandButton(
+          {.Name = u"cmdHome", .FontName = sansSerif},
+          {.Click = [this] { cmdHome_Click(); }, .GotFocus = [this] { cmdHome_GotFocus(); }})),
       fraSortOrder(toolkit.makeFrame({.Name = u"fraSortOrder", .FontName = sansSerif}, {})),
       fraSortOrder2(toolkit.makeFrame(
           {.Name = u"fraSortOrder2", .FontName = arial, .Container = fraSortOrder.get()}, {})),
@@ -60,36 +56,36 @@ Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library,
           {.Name = u"cobSortOrder", .FontName = arial, .Container = fraSortOrder2.get()},
           {u"(None)", u"Ascending", u"Descending"},
           [this](auto... a) { cobSortOrder_KeyDown(a...); })),
-      cmdSetSortOrder(toolkit.makeCommandButton({.Name = u"cmdSetSortOrder",
-                                                 .FontName = arial,
-                                                 .Caption = setCaption,
-                                                 .Container = fraSortOrder2.get()},
-                                                {.Click = [this] { cmdSetSortOrder_Click(); },
-                                                 .GotFocus = {}})),
+      cmdSetSortOrder(toolkit.makeCommandButton(
+          {.Name = u"cmdSetSortOrder",
+           .FontName = arial,
+           .Caption = setCaption,
+           .Container = fraSortOrder2.get()},
+          {.Click = [this] { cmdSetSortOrder_Click(); }, .GotFocus = {}})),
       fraVisibility(toolkit.makeFrame({.Name = u"fraVisibility", .FontName = sansSerif}, {})),
       fraVisibility2(toolkit.makeFrame(
           {.Name = u"fraVisibility2", .FontName = arial, .Container = fraVisibility.get()}, {})),
       cobVisibility(toolkit.makeComboBox(
           {.Name = u"cobVisibility", .FontName = arial, .Container = fraVisibility2.get()},
           {u"Visible", u"Not Visible"}, [this](auto... a) { cobVisibility_KeyDown(a...); })),
-      cmdSetVisibility(toolkit.makeCommandButton({.Name = u"cmdSetVisibility",
-                                                  .FontName = arial,
-                                                  .Caption = setCaption,
-                                                  .Container = fraVisibility2.get()},
-                                                 {.Click = [this] { cmdSetVisibility_Click(); },
-                                                  .GotFocus = {}})),
+      cmdSetVisibility(toolkit.makeCommandButton(
+          {.Name = u"cmdSetVisibility",
+           .FontName = arial,
+           .Caption = setCaption,
+           .Container = fraVisibility2.get()},
+          {.Click = [this] { cmdSetVisibility_Click(); }, .GotFocus = {}})),
       fraValue(toolkit.makeFrame({.Name = u"fraValue", .FontName = sansSerif}, {})),
       fraValue2(toolkit.makeFrame(
           {.Name = u"fraValue2", .FontName = arial, .Container = fraValue.get()}, {})),
       txtValue(toolkit.makeTextBox(
           {.Name = u"txtValue", .FontName = arial, .Container = fraValue2.get()},
           [this](auto... a) { txtValue_KeyDown(a...); })),
-      cmdSetTextValue(toolkit.makeCommandButton({.Name = u"cmdSetTextValue",
-                                                 .FontName = sansSerif,
-                                                 .Caption = setCaption,
-                                                 .Container = fraValue2.get()},
-                                                {.Click = [this] { cmdSetTextValue_Click(); },
-                                                 .GotFocus = {}})),
+      cmdSetTextValue(toolkit.makeCommandButton(
+          {.Name = u"cmdSetTextValue",
+           .FontName = sansSerif,
+           .Caption = setCaption,
+           .Container = fraValue2.get()},
+          {.Click = [this] { cmdSetTextValue_Click(); }, .GotFocus = {}})),
       mnuZandor(toolkit.makePopupMenu({.Name = u"mnuZandor"}, [this] { mnuZandor_Click(); })) {
     MakeMenu();
     UserControl_Initialize();
@@ -122,10 +118,10 @@ void Zandor::MakeMenu() {
                                   &Zandor::mnuJoinShowDefinition_Click);
     mnuJoinDelete = entry(u"mnuJoinDelete", u"&Delete Join", &Zandor::mnuJoinDelete_Click);
     mnuJoinSep = entry(u"mnuJoinSep", u"-", nullptr);
-    mnuTableDefinitionCopy = entry(u"mnuTableDefinitionCopy", u"&Copy Column",
-                                   &Zandor::mnuTableDefinitionCopy_Click);
-    mnuTableDefinitionPaste = entry(u"mnuTableDefinitionPaste", u"&Create Join",
-                                    &Zandor::mnuTableDefinitionPaste_Click);
+    mnuTableDefinitionCopy =
+        entry(u"mnuTableDefinitionCopy", u"&Copy Column", &Zandor::mnuTableDefinitionCopy_Click);
+    mnuTableDefinitionPaste =
+        entry(u"mnuTableDefinitionPaste", u"&Create Join", &Zandor::mnuTableDefinitionPaste_Click);
     mnuTableDefinitionDelete = entry(u"mnuTableDefinitionDelete", u"&Delete Table",
                                      &Zandor::mnuTableDefinitionDelete_Click);
     mnuTableDefinitionSep = entry(u"mnuTableDefinitionSep", u"-", nullptr);

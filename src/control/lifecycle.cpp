@@ -8,8 +8,7 @@ using platform::single;
 using platform::toInteger;
 
 void Zandor::Trace(platform::StringView text, platform::StringView title) const {
-    if (mDebugSwitch != 0)
-        mToolkit.MsgBox(String(text), platform::styleSystemModal, String(title));
+    if (mDebugSwitch != 0) mToolkit.MsgBox(String(text), platform::styleSystemModal, String(title));
 }
 
 // Texts and flags have their defaults as initialisers.

@@ -27,8 +27,8 @@ struct Finding {
     platform::String table{};
     platform::String join{};
     platform::String definition{};
-    std::int16_t row = 0;          ///< grid row of a criterion
-    std::size_t position = 0;      ///< in the criterion's text, UTF-16 code units from 0
+    std::int16_t row = 0;     ///< grid row of a criterion
+    std::size_t position = 0; ///< in the criterion's text, UTF-16 code units from 0
 
     /// Whether the statement would not say what the user drew, or could not be written.
     bool isError() const {

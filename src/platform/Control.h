@@ -53,10 +53,10 @@ private:
 
 /// What a constituent control is born with: the settings of design time.
 struct Design {
-    StringView Name;                ///< the control's name, "hsbTable"
-    StringView FontName = {};       ///< empty: the container's font
+    StringView Name;          ///< the control's name, "hsbTable"
+    StringView FontName = {}; ///< empty: the container's font
     StringView Caption = {};
-    Control* Container = nullptr;   ///< nullptr: the control's own surface
+    Control* Container = nullptr; ///< nullptr: the control's own surface
 };
 
 } // namespace platform

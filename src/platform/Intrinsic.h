@@ -15,8 +15,7 @@ inline constexpr std::int16_t leftButton = 1;
 inline constexpr std::int16_t rightButton = 2;
 inline constexpr std::int16_t keyEscape = 27;
 
-using MouseEvent =
-    std::function<void(std::int16_t Button, std::int16_t Shift, float X, float Y)>;
+using MouseEvent = std::function<void(std::int16_t Button, std::int16_t Shift, float X, float Y)>;
 using KeyEvent = std::function<void(std::int16_t KeyCode, std::int16_t Shift)>;
 using PlainEvent = std::function<void()>;
 

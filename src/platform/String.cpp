@@ -79,8 +79,8 @@ std::string toUtf8(StringView text) {
         if (point >= 0xD800 && point < 0xE000) {
             const bool paired = point < 0xDC00 && i + 1 < text.size() && text[i + 1] >= 0xDC00 &&
                                 text[i + 1] < 0xE000;
-            point = paired ? 0x10000 + ((point - 0xD800) << 10) + (text[++i] - 0xDC00u)
-                           : replacement;
+            point =
+                paired ? 0x10000 + ((point - 0xD800) << 10) + (text[++i] - 0xDC00u) : replacement;
         }
         appendUtf8(out, point);
     }

@@ -118,8 +118,8 @@ public:
     /// Stores the join and returns it as stored.
     virtual Ref<ZDJoin> AddJoin(const Ref<ZDJoin>& join) = 0;
     /// Stores the definition and returns it as stored.
-    virtual Ref<ZDColumnDefinition> AddColumnDefinition(
-        const Ref<ZDColumnDefinition>& definition) = 0;
+    virtual Ref<ZDColumnDefinition>
+    AddColumnDefinition(const Ref<ZDColumnDefinition>& definition) = 0;
     virtual void DeleteTable(const Ref<ZDTable>& table) = 0;
 };
 

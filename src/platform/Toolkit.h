@@ -24,16 +24,15 @@ public:
     virtual std::unique_ptr<Frame> makeFrame(const Design& design, FrameEvents events) = 0;
     virtual std::unique_ptr<CommandButton> makeCommandButton(const Design& design,
                                                              CommandButtonEvents events) = 0;
-    virtual std::unique_ptr<ComboBox> makeComboBox(const Design& design,
-                                                   const std::vector<String>& items,
-                                                   KeyEvent KeyDown) = 0;
+    virtual std::unique_ptr<ComboBox>
+    makeComboBox(const Design& design, const std::vector<String>& items, KeyEvent KeyDown) = 0;
     virtual std::unique_ptr<TextBox> makeTextBox(const Design& design, KeyEvent KeyDown) = 0;
     virtual std::unique_ptr<Label> makeLabel(const Design& design) = 0;
     virtual std::unique_ptr<ScrollBar> makeScrollBar(const Design& design, Orientation orientation,
                                                      ScrollBarEvents events) = 0;
-    virtual std::unique_ptr<MSFlexGridLib::MSFlexGrid> makeGrid(
-        const Design& design, std::int32_t rows, std::int32_t cols,
-        MSFlexGridLib::GridEvents events) = 0;
+    virtual std::unique_ptr<MSFlexGridLib::MSFlexGrid>
+    makeGrid(const Design& design, std::int32_t rows, std::int32_t cols,
+             MSFlexGridLib::GridEvents events) = 0;
     /// Click is the menu's own, fired as it opens.
     virtual std::unique_ptr<PopupMenu> makePopupMenu(const Design& design, PlainEvent Click) = 0;
     virtual std::unique_ptr<Dialog> makeDialog(const Design& design, DialogEvents events) = 0;
@@ -41,9 +40,9 @@ public:
     /// Elements of control arrays stand inside design.Container. A table list takes its font from
     /// the pattern, the array's element 0 (nullptr when element 0 itself is made), and starts
     /// invisible; `events` outlives the element.
-    virtual Ref<TalvikTabulet::Tabulet> makeTabulet(
-        const Design& design, std::int16_t index, const TalvikTabulet::Tabulet* pattern,
-        const TalvikTabulet::TabuletEvents& events) = 0;
+    virtual Ref<TalvikTabulet::Tabulet> makeTabulet(const Design& design, std::int16_t index,
+                                                    const TalvikTabulet::Tabulet* pattern,
+                                                    const TalvikTabulet::TabuletEvents& events) = 0;
     virtual Ref<Line> makeLine(const Design& design, std::int16_t index) = 0;
     virtual Ref<Shape> makeShape(const Design& design, std::int16_t index) = 0;
 

@@ -206,10 +206,8 @@ void RandomUser::scrollSomething() {
         const std::int16_t table = slot();
         return mStage->scrollList(table, entryOf(table));
     }
-    case 1:
-        return mStage->scrollGrid(number(1, grid().Rows()), chance(70) ? 1 : column());
-    case 2:
-        return mStage->clickButton("cmdHome");
+    case 1: return mStage->scrollGrid(number(1, grid().Rows()), chance(70) ? 1 : column());
+    case 2: return mStage->clickButton("cmdHome");
     default:
         return mStage->scrollBarTo(chance(50) ? "hsbTable" : "vsbTable",
                                    static_cast<std::int16_t>(chance(40) ? 0 : number(0, 16000)));
@@ -308,12 +306,9 @@ void RandomUser::useEditor() {
         else
             mStage->choose(editor.input, static_cast<std::int16_t>(number(0, editor.items - 1)));
         switch (number(0, 3)) {
-        case 0:
-            return mStage->key(editor.input, escape);
-        case 1:
-            return mStage->key(editor.input, enter);
-        default:
-            return mStage->clickButton(editor.set);
+        case 0: return mStage->key(editor.input, escape);
+        case 1: return mStage->key(editor.input, enter);
+        default: return mStage->clickButton(editor.set);
         }
     }
     throw std::logic_error("no editor is open");
@@ -328,20 +323,13 @@ void RandomUser::resizeControl() {
 
 void RandomUser::host() {
     switch (number(0, 11)) {
-    case 0:
-        return control().OnlyJoin(!mCalm && chance(20));
-    case 1:
-        return control().SetCurrentTable(u"T" + platform::decimal(number(0, 8)));
-    case 2:
-        return control().SelectColumnNames(u"T" + platform::decimal(number(0, 8)), u"ID");
-    case 3:
-        return control().VisibleFrameLeft(static_cast<std::int16_t>(number(-50, 20000)));
-    case 4:
-        return control().VisibleFrameTop(static_cast<std::int16_t>(number(-50, 20000)));
-    case 5:
-        return control().JoinModifyDisabled(static_cast<std::int16_t>(number(0, 1)));
-    case 6:
-        return control().P_SET_Zandor({});
+    case 0: return control().OnlyJoin(!mCalm && chance(20));
+    case 1: return control().SetCurrentTable(u"T" + platform::decimal(number(0, 8)));
+    case 2: return control().SelectColumnNames(u"T" + platform::decimal(number(0, 8)), u"ID");
+    case 3: return control().VisibleFrameLeft(static_cast<std::int16_t>(number(-50, 20000)));
+    case 4: return control().VisibleFrameTop(static_cast<std::int16_t>(number(-50, 20000)));
+    case 5: return control().JoinModifyDisabled(static_cast<std::int16_t>(number(0, 1)));
+    case 6: return control().P_SET_Zandor({});
     case 7:
         if (mCalm || !chance(10)) return bind(mModel);
         mInvariants->abandonColumns();
@@ -351,8 +339,7 @@ void RandomUser::host() {
         mInvariants->abandonColumns();
         control().Terminate();
         return bind(newModel());
-    default:
-        return control().HorizontalScrollbarPos(static_cast<std::int16_t>(number(0, 9000)));
+    default: return control().HorizontalScrollbarPos(static_cast<std::int16_t>(number(0, 9000)));
     }
 }
 

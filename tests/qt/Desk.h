@@ -37,9 +37,9 @@ protected:
     /// Shows three tables, two joins and three output columns.
     void bind() {
         model = library.newModel();
-        orders = model->table(u"ORDERS", {u"*", u"ORDER_ID", u"CUSTOMER_ID", u"EMPLOYEE_ID",
-                                          u"ORDERED_ON", u"SHIPPED_ON", u"FREIGHT", u"REMARKS",
-                                          u"STATE", u"PRIORITY"});
+        orders = model->table(u"ORDERS",
+                              {u"*", u"ORDER_ID", u"CUSTOMER_ID", u"EMPLOYEE_ID", u"ORDERED_ON",
+                               u"SHIPPED_ON", u"FREIGHT", u"REMARKS", u"STATE", u"PRIORITY"});
         orders->place(600, 600, 2400, 2700);
         orders->column(u"ORDER_ID").marker = true;
         customers = model->table(u"CUSTOMERS", {u"*", u"CUSTOMER_ID", u"NAME", u"TOWN"});

@@ -85,8 +85,8 @@ TEST_F(Geometry, OfATableShrinksNoFurtherThanItsNameAndOneEntry) {
     const QPointF grip(box.width() - 2, box.height() - 2);
     const QPointF start = box.mapToGlobal(grip);
     hands::mouse(box, QEvent::MouseButtonPress, grip, Qt::LeftButton, Qt::LeftButton);
-    hands::mouse(box, QEvent::MouseMove, box.mapFromGlobal(start - QPointF(900, 900)),
-                 Qt::NoButton, Qt::LeftButton);
+    hands::mouse(box, QEvent::MouseMove, box.mapFromGlobal(start - QPointF(900, 900)), Qt::NoButton,
+                 Qt::LeftButton);
     hands::mouse(box, QEvent::MouseButtonRelease, box.mapFromGlobal(start - QPointF(900, 900)),
                  Qt::LeftButton);
     EXPECT_EQ(box.size(), box.smallest());
@@ -146,16 +146,15 @@ TEST_F(Geometry, PutsATableThatIsPressedInFrontOfTheOthers) {
     const auto& siblings = child<QWidget>("fraTable").children();
     ASSERT_NE(siblings.last(), &table(1));
     auto& list = table(1).list();
-    hands::click(*list.viewport(),
-                 QRectF(list.visualRect(list.model()->index(2, 0))).center());
+    hands::click(*list.viewport(), QRectF(list.visualRect(list.model()->index(2, 0))).center());
     EXPECT_EQ(siblings.last(), &table(1));
 }
 
 TEST_F(Geometry, OfAnEditorIsAsLargeAsItsParts) {
     show();
     bind();
-    for (const auto& [row, name] : {std::pair{2, "fraSortOrder"}, std::pair{3, "fraVisibility"},
-                                    std::pair{4, "fraValue"}}) {
+    for (const auto& [row, name] :
+         {std::pair{2, "fraSortOrder"}, std::pair{3, "fraVisibility"}, std::pair{4, "fraValue"}}) {
         press(row, 1);
         auto& frame = child<QWidget>(name);
         ASSERT_TRUE(frame.isVisible()) << name;

@@ -7,7 +7,6 @@
 #include <QHeaderView>
 #include <QLineEdit>
 #include <QMenu>
-#include <QMimeData>
 #include <QShortcut>
 #include <QWheelEvent>
 
@@ -149,43 +148,6 @@ TEST_F(Hands, ThatDropOnAnEntryJoinItWithTheDraggedColumn) {
     EXPECT_EQ(model->joinAt(before + 1).leftColumn->Name(), u"FREIGHT");
     EXPECT_EQ(model->joinAt(before + 1).rightColumn->Name(),
               u"AMOUNT_OF_MONEY_INCLUDING_EVERY_TAX_THERE_IS");
-}
-
-TEST_F(Hands, ThatDragTextOrFilesFindNoTarget) {
-    show();
-    bind();
-    QMimeData data;
-    data.setText("CUSTOMER_ID");
-    QDragEnterEvent enter(table(2).mapTo(widget.get(), QPoint(50, 60)), Qt::CopyAction, &data,
-                          Qt::LeftButton, Qt::NoModifier);
-    QCoreApplication::sendEvent(widget->windowHandle(), &enter);
-    EXPECT_FALSE(enter.isAccepted());
-    const int before = model->joinCount();
-    QDropEvent drop(table(2).mapTo(widget.get(), QPoint(50, 60)), Qt::CopyAction, &data,
-                    Qt::NoButton, Qt::NoModifier);
-    QCoreApplication::sendEvent(&table(2), &drop);
-    EXPECT_FALSE(drop.isAccepted());
-    EXPECT_EQ(model->joinCount(), before);
-}
-
-TEST_F(Hands, ThatDragFromAnotherControlFindNoTarget) {
-    show();
-    bind();
-    auto first = std::move(widget);
-    auto* const strange = static_cast<platform::qt::TabuletWidget*>(
-        first->findChild<QWidget*>("lstTable(2)"));
-    open();
-    show();
-    bind();
-    bool accepted = true;
-    widget->toolkit().drags().setCarrier([&](QDrag& drag) {
-        QDragEnterEvent enter({50, 60}, Qt::CopyAction, drag.mimeData(), Qt::LeftButton,
-                              Qt::NoModifier);
-        QCoreApplication::sendEvent(strange, &enter);
-        accepted = enter.isAccepted();
-    });
-    drag(1, 2);
-    EXPECT_FALSE(accepted);
 }
 
 TEST_F(Hands, ThatOpenTheMenuAreToldOfToTheHostsFilter) {

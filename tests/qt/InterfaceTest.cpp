@@ -26,34 +26,23 @@ const QMetaObject& meta() { return ZandorWidget::staticMetaObject; }
 
 QMetaType qtTypeOf(Type type) {
     switch (type) {
-    case Type::String:
-        return QMetaType::fromType<QString>();
-    case Type::Boolean:
-        return QMetaType::fromType<bool>();
-    case Type::Integer:
-        return QMetaType::fromType<int>();
-    case Type::Zandor:
-        return QMetaType::fromType<ZandorWidget::ZandorModel>();
-    case Type::ZDJoin:
-        return QMetaType::fromType<ZandorWidget::ZDJoin>();
-    case Type::ZDTable:
-        return QMetaType::fromType<ZandorWidget::ZDTable>();
-    case Type::ZDColumn:
-        return QMetaType::fromType<ZandorWidget::ZDColumn>();
-    case Type::none:
-        break;
+    case Type::String: return QMetaType::fromType<QString>();
+    case Type::Boolean: return QMetaType::fromType<bool>();
+    case Type::Integer: return QMetaType::fromType<int>();
+    case Type::Zandor: return QMetaType::fromType<ZandorWidget::ZandorModel>();
+    case Type::ZDJoin: return QMetaType::fromType<ZandorWidget::ZDJoin>();
+    case Type::ZDTable: return QMetaType::fromType<ZandorWidget::ZDTable>();
+    case Type::ZDColumn: return QMetaType::fromType<ZandorWidget::ZDColumn>();
+    case Type::none: break;
     }
     return {};
 }
 
 std::vector<QMetaType> qtTypesOf(Carries carries) {
     switch (carries) {
-    case Carries::nothing:
-        return {};
-    case Carries::definition:
-        return {QMetaType::fromType<ZandorWidget::ZDColumnDefinition>()};
-    case Carries::join:
-        return {QMetaType::fromType<ZandorWidget::ZDJoin>()};
+    case Carries::nothing: return {};
+    case Carries::definition: return {QMetaType::fromType<ZandorWidget::ZDColumnDefinition>()};
+    case Carries::join: return {QMetaType::fromType<ZandorWidget::ZDJoin>()};
     case Carries::textAndNumber:
         return {QMetaType::fromType<QString>(), QMetaType::fromType<int>()};
     }

@@ -111,9 +111,8 @@ TEST_F(Lifetime, OfATraceBoxGivesTheTableNoSecondFocus) {
         widget->activateWindow();
         settle();
     }
-    EXPECT_EQ(boxes.texts,
-              QStringList({"SetCurrentTable", "Looking for Table: CUSTOMERS", "Table found.",
-                           "Table refreshed.", "SetSelectedTable"}));
+    EXPECT_EQ(boxes.texts, QStringList({"SetCurrentTable", "Looking for Table: CUSTOMERS",
+                                        "Table found.", "Table refreshed.", "SetSelectedTable"}));
     widget->setDebugSwitch(0);
 }
 

@@ -96,7 +96,9 @@ TEST_F(Looks, FollowADarkPalette) {
     settle();
     const QImage image = widget->grab().toImage();
     const qreal ratio = image.devicePixelRatio();
-    const auto colour = [&](QPoint at) { return image.pixelColor((QPointF(at) * ratio).toPoint()); };
+    const auto colour = [&](QPoint at) {
+        return image.pixelColor((QPointF(at) * ratio).toPoint());
+    };
     EXPECT_EQ(colour({700, 150}), dark().color(QPalette::Window)) << "the canvas";
     const QPoint list = table(2).mapTo(widget.get(), QPoint(100, 105));
     EXPECT_EQ(colour(list), dark().color(QPalette::Base)) << "a list below its entries";
@@ -134,8 +136,8 @@ TEST_F(Looks, OfAMarkedColumnDifferFromThoseOfAnUnmarkedOne) {
 TEST_F(Looks, OfAnOpenEditorStayUntilSomethingClosesIt) {
     show();
     bind();
-    for (const auto& [row, name] : {std::pair{2, "fraSortOrder"}, std::pair{3, "fraVisibility"},
-                                    std::pair{4, "fraValue"}}) {
+    for (const auto& [row, name] :
+         {std::pair{2, "fraSortOrder"}, std::pair{3, "fraVisibility"}, std::pair{4, "fraValue"}}) {
         press(row, 1);
         settle();
         EXPECT_TRUE(child<QWidget>(name).isVisible()) << name;

@@ -178,7 +178,7 @@ public:
              Qt::NoButton);
     }
     void pressCell(std::int16_t button, std::int32_t row, std::int32_t col) override {
-            send(cellSpot(row, col), QEvent::MouseButtonPress, button, buttonsOf(button));
+        send(cellSpot(row, col), QEvent::MouseButtonPress, button, buttonsOf(button));
     }
     void releaseCell(std::int16_t button, std::int32_t row, std::int32_t col) override {
         send(cellSpot(row, col), QEvent::MouseButtonRelease, button, Qt::NoButton);

@@ -45,7 +45,7 @@ public:
         std::int16_t borderWidth = 0;                     ///< lines
         std::int16_t shape = 0;                           ///< marks
         std::vector<String> items;                        ///< combo boxes, table lists
-        std::vector<String> selected;                     ///< table lists: texts of selected entries
+        std::vector<String> selected; ///< table lists: texts of selected entries
     };
 
     /// A menu entry at the moment the menu stands open.

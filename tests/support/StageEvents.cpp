@@ -3,26 +3,16 @@
 std::string eventName(TalvikDBxZandor::Event event) {
     using TalvikDBxZandor::Event;
     switch (event) {
-    case Event::TableDeleted:
-        return "TableDeleted";
-    case Event::TableMoved:
-        return "TableMoved";
-    case Event::Activate:
-        return "Activate";
-    case Event::ColumnCreated:
-        return "ColumnCreated";
-    case Event::ColumnModified:
-        return "ColumnModified";
-    case Event::ColumnRemoved:
-        return "ColumnRemoved";
-    case Event::Error:
-        return "Error";
-    case Event::JoinCreated:
-        return "JoinCreated";
-    case Event::JoinModified:
-        return "JoinModified";
-    case Event::JoinRemoved:
-        return "JoinRemoved";
+    case Event::TableDeleted: return "TableDeleted";
+    case Event::TableMoved: return "TableMoved";
+    case Event::Activate: return "Activate";
+    case Event::ColumnCreated: return "ColumnCreated";
+    case Event::ColumnModified: return "ColumnModified";
+    case Event::ColumnRemoved: return "ColumnRemoved";
+    case Event::Error: return "Error";
+    case Event::JoinCreated: return "JoinCreated";
+    case Event::JoinModified: return "JoinModified";
+    case Event::JoinRemoved: return "JoinRemoved";
     }
     return std::to_string(static_cast<int>(event));
 }

@@ -80,8 +80,8 @@ void Zandor::OpenEditor(platform::Frame& frame, platform::CommandButton& set) {
     } else {
         left = single(mToolkit.ScaleWidth() - width - margin);
     }
-    float top = single(sprColumn->Top() + sprColumn->CellTop() + sprColumn->CellHeight() / 2 -
-                       height / 2);
+    float top =
+        single(sprColumn->Top() + sprColumn->CellTop() + sprColumn->CellHeight() / 2 - height / 2);
     if (single(top + height) > mToolkit.ScaleHeight())
         top = single(mToolkit.ScaleHeight() - height - margin);
 

@@ -170,46 +170,30 @@ bool isNumber(ColumnType type) {
 
 StringView nameOf(ColumnType type) {
     switch (type) {
-    case ColumnType::Text:
-        return u"a text";
+    case ColumnType::Text: return u"a text";
     case ColumnType::Integer:
-    case ColumnType::Decimal:
-        return u"a number";
-    case ColumnType::Date:
-        return u"a date (2024-12-31)";
-    case ColumnType::Time:
-        return u"a time (23:59)";
-    case ColumnType::Timestamp:
-        return u"a date and time (2024-12-31 23:59)";
-    case ColumnType::Boolean:
-        return u"true or false";
-    case ColumnType::Blob:
-        return u"Is Null, a column or a parameter";
-    case ColumnType::Unknown:
-        break;
+    case ColumnType::Decimal: return u"a number";
+    case ColumnType::Date: return u"a date (2024-12-31)";
+    case ColumnType::Time: return u"a time (23:59)";
+    case ColumnType::Timestamp: return u"a date and time (2024-12-31 23:59)";
+    case ColumnType::Boolean: return u"true or false";
+    case ColumnType::Blob: return u"Is Null, a column or a parameter";
+    case ColumnType::Unknown: break;
     }
     return u"a value";
 }
 
 std::optional<sql::Value> literal(StringView text, ColumnType type) {
     switch (type) {
-    case ColumnType::Text:
-        return sql::Value{ColumnType::Text, String(text)};
+    case ColumnType::Text: return sql::Value{ColumnType::Text, String(text)};
     case ColumnType::Integer:
-    case ColumnType::Decimal:
-        return numberValue(text);
-    case ColumnType::Date:
-        return dateValue(text);
-    case ColumnType::Time:
-        return timeValue(text);
-    case ColumnType::Timestamp:
-        return timestampValue(text);
-    case ColumnType::Boolean:
-        return booleanValue(text);
-    case ColumnType::Blob:
-        return {};
-    case ColumnType::Unknown:
-        break;
+    case ColumnType::Decimal: return numberValue(text);
+    case ColumnType::Date: return dateValue(text);
+    case ColumnType::Time: return timeValue(text);
+    case ColumnType::Timestamp: return timestampValue(text);
+    case ColumnType::Boolean: return booleanValue(text);
+    case ColumnType::Blob: return {};
+    case ColumnType::Unknown: break;
     }
     if (auto number = numberValue(text)) return number;
     return sql::Value{ColumnType::Text, String(text)};
@@ -219,12 +203,9 @@ std::optional<sql::Value> momentLiteral(StringView text, ColumnType type) {
     switch (type) {
     case ColumnType::Date:
     case ColumnType::Time:
-    case ColumnType::Timestamp:
-        return literal(text, type);
-    case ColumnType::Unknown:
-        break;
-    default:
-        return {};
+    case ColumnType::Timestamp: return literal(text, type);
+    case ColumnType::Unknown: break;
+    default: return {};
     }
     for (const auto kind : {ColumnType::Date, ColumnType::Time, ColumnType::Timestamp})
         if (auto value = literal(text, kind)) return value;

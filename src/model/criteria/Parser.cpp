@@ -178,14 +178,10 @@ private:
         const Token first = peek();
         switch (first.kind) {
         case TokenKind::quoted:
-        case TokenKind::dated:
-            return delimitedValue(take());
-        case TokenKind::word:
-            return bareValue();
-        case TokenKind::bracketed:
-            return bracketedName();
-        default:
-            failValue(first, mSubjectColumn.type);
+        case TokenKind::dated: return delimitedValue(take());
+        case TokenKind::word: return bareValue();
+        case TokenKind::bracketed: return bracketedName();
+        default: failValue(first, mSubjectColumn.type);
         }
     }
 

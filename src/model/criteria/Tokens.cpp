@@ -52,35 +52,24 @@ private:
 
     std::optional<Error> next() {
         switch (mText[mAt]) {
-        case u'\'':
-            return delimited(TokenKind::quoted, u'\'', u"expected a closing '");
-        case u'"':
-            return delimited(TokenKind::quoted, u'"', u"expected a closing \"");
-        case u'[':
-            return bracketed();
-        case u'#':
-            return delimited(TokenKind::dated, u'#', u"expected a closing #");
-        case u'(':
-            return single(TokenKind::open);
-        case u')':
-            return single(TokenKind::close);
-        case u',':
-            return single(TokenKind::comma);
-        case u']':
-            return errorAt(mAt, u"expected a [ before this ]");
-        case u'!':
-            return errorAt(mAt, u"expected an operator, write <> for unequal");
+        case u'\'': return delimited(TokenKind::quoted, u'\'', u"expected a closing '");
+        case u'"': return delimited(TokenKind::quoted, u'"', u"expected a closing \"");
+        case u'[': return bracketed();
+        case u'#': return delimited(TokenKind::dated, u'#', u"expected a closing #");
+        case u'(': return single(TokenKind::open);
+        case u')': return single(TokenKind::close);
+        case u',': return single(TokenKind::comma);
+        case u']': return errorAt(mAt, u"expected a [ before this ]");
+        case u'!': return errorAt(mAt, u"expected an operator, write <> for unequal");
         case u'=':
         case u'<':
-        case u'>':
-            return comparison();
+        case u'>': return comparison();
         case u'.':
             if (!mTokens.empty() && mTokens.back().kind == TokenKind::bracketed &&
                 mTokens.back().end == mAt)
                 return single(TokenKind::dot);
             return word();
-        default:
-            return word();
+        default: return word();
         }
     }
 

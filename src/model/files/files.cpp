@@ -57,20 +57,14 @@ std::string quoted(const Path& path) {
 /// By the number of the system's error.
 std::string advice(int error) {
     switch (error) {
-    case ENOENT:
-        return "check the path";
+    case ENOENT: return "check the path";
     case EACCES:
-    case EPERM:
-        return "ask the owner for permission, or choose another folder";
+    case EPERM: return "ask the owner for permission, or choose another folder";
     case ENOSPC:
-    case EDQUOT:
-        return "make room on the disk, or choose another one";
-    case EFBIG:
-        return "choose another disk";
-    case EROFS:
-        return "choose a folder on another disk";
-    default:
-        return "try again, or choose another folder";
+    case EDQUOT: return "make room on the disk, or choose another one";
+    case EFBIG: return "choose another disk";
+    case EROFS: return "choose a folder on another disk";
+    default: return "try again, or choose another folder";
     }
 }
 

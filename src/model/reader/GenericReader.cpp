@@ -18,8 +18,7 @@ namespace {
 model::ColumnType typeOf(const QSqlField& field) {
     using model::ColumnType;
     switch (field.metaType().id()) {
-    case QMetaType::Bool:
-        return ColumnType::Boolean;
+    case QMetaType::Bool: return ColumnType::Boolean;
     case QMetaType::Char:
     case QMetaType::SChar:
     case QMetaType::UChar:
@@ -30,24 +29,16 @@ model::ColumnType typeOf(const QSqlField& field) {
     case QMetaType::Long:
     case QMetaType::ULong:
     case QMetaType::LongLong:
-    case QMetaType::ULongLong:
-        return ColumnType::Integer;
+    case QMetaType::ULongLong: return ColumnType::Integer;
     case QMetaType::Float:
-    case QMetaType::Double:
-        return ColumnType::Decimal;
+    case QMetaType::Double: return ColumnType::Decimal;
     case QMetaType::QChar:
-    case QMetaType::QString:
-        return ColumnType::Text;
-    case QMetaType::QDate:
-        return ColumnType::Date;
-    case QMetaType::QTime:
-        return ColumnType::Time;
-    case QMetaType::QDateTime:
-        return ColumnType::Timestamp;
-    case QMetaType::QByteArray:
-        return ColumnType::Blob;
-    default:
-        return ColumnType::Unknown;
+    case QMetaType::QString: return ColumnType::Text;
+    case QMetaType::QDate: return ColumnType::Date;
+    case QMetaType::QTime: return ColumnType::Time;
+    case QMetaType::QDateTime: return ColumnType::Timestamp;
+    case QMetaType::QByteArray: return ColumnType::Blob;
+    default: return ColumnType::Unknown;
     }
 }
 
@@ -110,14 +101,12 @@ std::unique_ptr<DatabaseReader> makeGenericReader(const QSqlDatabase& database) 
 
 std::unique_ptr<DatabaseReader> makeReader(const QSqlDatabase& database) {
     switch (database.driver()->dbmsType()) {
-    case QSqlDriver::SQLite:
-        return makeSqliteReader(database);
+    case QSqlDriver::SQLite: return makeSqliteReader(database);
     case QSqlDriver::PostgreSQL:
         // Behind ODBC a statement's parameters are another matter.
         if (database.driverName() == QStringLiteral("QPSQL")) return makePostgresReader(database);
         [[fallthrough]];
-    default:
-        return makeGenericReader(database);
+    default: return makeGenericReader(database);
     }
 }
 

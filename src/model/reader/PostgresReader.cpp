@@ -44,23 +44,16 @@ model::ColumnType typeOf(const QString& base, const QString& category, bool buil
     case u'C': // rows
     case u'R': // ranges
         return ColumnType::Unknown;
-    case u'E':
-        return ColumnType::Text;
-    default:
-        break;
+    case u'E': return ColumnType::Text;
+    default: break;
     }
     if (builtIn) return columnType(base.toStdU16String());
     switch (kind) {
-    case u'B':
-        return ColumnType::Boolean;
-    case u'D':
-        return ColumnType::Timestamp;
-    case u'N':
-        return ColumnType::Decimal;
-    case u'S':
-        return ColumnType::Text;
-    default:
-        return ColumnType::Unknown;
+    case u'B': return ColumnType::Boolean;
+    case u'D': return ColumnType::Timestamp;
+    case u'N': return ColumnType::Decimal;
+    case u'S': return ColumnType::Text;
+    default: return ColumnType::Unknown;
     }
 }
 

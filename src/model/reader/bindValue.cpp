@@ -8,15 +8,12 @@ QVariant bindValue(const model::sql::Value& value, model::sql::Dialect dialect) 
     using model::ColumnType;
     const QString text = QString::fromStdU16String(value.text);
     switch (value.type) {
-    case ColumnType::Integer:
-        return text.toLongLong();
-    case ColumnType::Boolean:
-        return value.text == u"true";
+    case ColumnType::Integer: return text.toLongLong();
+    case ColumnType::Boolean: return value.text == u"true";
     case ColumnType::Decimal:
         if (dialect == model::sql::Dialect::SQLite) return text.toDouble();
         break;
-    default:
-        break;
+    default: break;
     }
     return text;
 }

@@ -76,16 +76,11 @@ String moment(StringView text, StringView keyword, StringView serverType, Dialec
 
 StringView nameOf(Dialect dialect) {
     switch (dialect) {
-    case Dialect::SQLite:
-        return u"SQLite";
-    case Dialect::PostgreSQL:
-        return u"PostgreSQL";
-    case Dialect::MySQL:
-        return u"MySQL/MariaDB";
-    case Dialect::SqlServer:
-        return u"SQL Server";
-    case Dialect::Standard:
-        break;
+    case Dialect::SQLite: return u"SQLite";
+    case Dialect::PostgreSQL: return u"PostgreSQL";
+    case Dialect::MySQL: return u"MySQL/MariaDB";
+    case Dialect::SqlServer: return u"SQL Server";
+    case Dialect::Standard: break;
     }
     return u"Standard SQL";
 }
@@ -115,18 +110,15 @@ std::optional<String> cannotCarry(StringView name, Dialect dialect) {
                             u" " + String(unit))));
     };
     switch (dialect) {
-    case Dialect::PostgreSQL:
-        return tooLong(platform::toUtf8(name).size(), 63, u"bytes");
+    case Dialect::PostgreSQL: return tooLong(platform::toUtf8(name).size(), 63, u"bytes");
     case Dialect::MySQL:
         if (std::any_of(name.begin(), name.end(), isHighSurrogate))
             return refusal(theName(u"has a character beyond U+FFFF"));
         if (name.back() == u' ') return refusal(theName(u"ends with a blank"));
         return tooLong(name.size(), 64, u"characters");
     case Dialect::SqlServer:
-    case Dialect::Standard:
-        return tooLong(name.size(), 128, u"characters");
-    case Dialect::SQLite:
-        break;
+    case Dialect::Standard: return tooLong(name.size(), 128, u"characters");
+    case Dialect::SQLite: break;
     }
     return {};
 }
@@ -134,21 +126,16 @@ std::optional<String> cannotCarry(StringView name, Dialect dialect) {
 String literal(const Value& value, Dialect dialect) {
     switch (value.type) {
     case ColumnType::Integer:
-    case ColumnType::Decimal:
-        return value.text;
+    case ColumnType::Decimal: return value.text;
     case ColumnType::Boolean:
         if (dialect == Dialect::SqlServer) return value.text == u"true" ? u"1" : u"0";
         return value.text == u"true" ? u"TRUE" : u"FALSE";
-    case ColumnType::Date:
-        return moment(value.text, u"DATE", u"date", dialect);
-    case ColumnType::Time:
-        return moment(value.text, u"TIME", u"time", dialect);
-    case ColumnType::Timestamp:
-        return moment(value.text, u"TIMESTAMP", u"datetime2", dialect);
+    case ColumnType::Date: return moment(value.text, u"DATE", u"date", dialect);
+    case ColumnType::Time: return moment(value.text, u"TIME", u"time", dialect);
+    case ColumnType::Timestamp: return moment(value.text, u"TIMESTAMP", u"datetime2", dialect);
     case ColumnType::Text:
     case ColumnType::Blob:
-    case ColumnType::Unknown:
-        break;
+    case ColumnType::Unknown: break;
     }
     return quotedText(value.text, dialect);
 }
@@ -169,22 +156,15 @@ String placeholder(ColumnType type, Dialect dialect) {
     // PostgreSQL gives a bare placeholder the type of what it is compared with, and then refuses
     // a value that type cannot hold: 1.5 for a whole number, 70000 for a small one.
     switch (type) {
-    case ColumnType::Integer:
-        return u"CAST(? AS bigint)";
-    case ColumnType::Decimal:
-        return u"CAST(? AS numeric)";
-    case ColumnType::Boolean:
-        return u"CAST(? AS boolean)";
-    case ColumnType::Date:
-        return u"CAST(? AS date)";
-    case ColumnType::Time:
-        return u"CAST(? AS time)";
-    case ColumnType::Timestamp:
-        return u"CAST(? AS timestamp)";
+    case ColumnType::Integer: return u"CAST(? AS bigint)";
+    case ColumnType::Decimal: return u"CAST(? AS numeric)";
+    case ColumnType::Boolean: return u"CAST(? AS boolean)";
+    case ColumnType::Date: return u"CAST(? AS date)";
+    case ColumnType::Time: return u"CAST(? AS time)";
+    case ColumnType::Timestamp: return u"CAST(? AS timestamp)";
     case ColumnType::Text:
     case ColumnType::Blob:
-    case ColumnType::Unknown:
-        break;
+    case ColumnType::Unknown: break;
     }
     return u"?";
 }

@@ -12,32 +12,22 @@ constexpr StringView nextLine = u"\n    ";
 
 StringView symbol(Comparison comparison) {
     switch (comparison) {
-    case Comparison::equal:
-        return u" = ";
-    case Comparison::notEqual:
-        return u" <> ";
-    case Comparison::less:
-        return u" < ";
-    case Comparison::greater:
-        return u" > ";
-    case Comparison::lessEqual:
-        return u" <= ";
-    case Comparison::greaterEqual:
-        break;
+    case Comparison::equal: return u" = ";
+    case Comparison::notEqual: return u" <> ";
+    case Comparison::less: return u" < ";
+    case Comparison::greater: return u" > ";
+    case Comparison::lessEqual: return u" <= ";
+    case Comparison::greaterEqual: break;
     }
     return u" >= ";
 }
 
 StringView words(JoinKind kind) {
     switch (kind) {
-    case JoinKind::inner:
-        return u"INNER JOIN ";
-    case JoinKind::leftOuter:
-        return u"LEFT JOIN ";
-    case JoinKind::rightOuter:
-        return u"RIGHT JOIN ";
-    case JoinKind::fullOuter:
-        break;
+    case JoinKind::inner: return u"INNER JOIN ";
+    case JoinKind::leftOuter: return u"LEFT JOIN ";
+    case JoinKind::rightOuter: return u"RIGHT JOIN ";
+    case JoinKind::fullOuter: break;
     }
     return u"FULL JOIN ";
 }

@@ -60,8 +60,8 @@ void CommandButton::Default(bool value) {
 
 void CommandButton::endDefaults(const Element& inside) {
     for (Element* child : inside.children()) {
-        if (auto* button = dynamic_cast<CommandButton*>(child)) button->mDefault = false;
         endDefaults(*child);
+        if (auto* button = dynamic_cast<CommandButton*>(child)) button->mDefault = false;
     }
 }
 

@@ -236,8 +236,7 @@ const Ref<TalvikTabulet::ColumnItem>& Tabulet::Item(std::int32_t position) const
 Ref<TalvikTabulet::ColumnItem> Tabulet::Add(const String& key, const String& text) {
     called("ColumnItems.Add");
     const auto position = static_cast<std::int32_t>(mItems.size()) + 1;
-    mItems.push_back(makeRef<ColumnItem>(*this, position, key, text));
-    return mItems.back();
+    return mItems.emplace_back(makeRef<ColumnItem>(*this, position, key, text));
 }
 
 void Tabulet::gotFocus() {

@@ -213,8 +213,8 @@ void Toolkit::runModal(Dialog& dialog) {
 
     // The window behind is active again, with the focus where it was and no event of it.
     const auto still = mObjects.find(nameBefore);
-    const bool back =
-        still != mObjects.end() && still->second == before && before->shown() && before->usable();
+    const bool back = before && still != mObjects.end() && still->second == before &&
+                      before->shown() && before->usable();
     mFocus = back ? before : nullptr;
 }
 

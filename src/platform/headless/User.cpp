@@ -8,9 +8,9 @@ constexpr std::int16_t keyEnter = 13;
 
 CommandButton* defaultButtonIn(const Element& inside) {
     for (Element* child : inside.children()) {
+        if (CommandButton* deeper = defaultButtonIn(*child)) return deeper;
         auto* button = dynamic_cast<CommandButton*>(child);
         if (button && button->isDefault() && button->shown() && button->usable()) return button;
-        if (CommandButton* deeper = defaultButtonIn(*child)) return deeper;
     }
     return nullptr;
 }

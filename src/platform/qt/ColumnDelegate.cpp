@@ -43,9 +43,9 @@ void ColumnDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option
     const QRect place = textPlace(item.rect, item.fontMetrics);
     painter->setFont(item.font);
     painter->setPen(colour);
-    painter->drawText(place, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextSingleLine,
-                      item.fontMetrics.elidedText(index.data().toString(), Qt::ElideRight,
-                                                  place.width()));
+    painter->drawText(
+        place, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextSingleLine,
+        item.fontMetrics.elidedText(index.data().toString(), Qt::ElideRight, place.width()));
     if (item.state & QStyle::State_HasFocus) {
         QStyleOptionFocusRect focus;
         focus.QStyleOption::operator=(item);

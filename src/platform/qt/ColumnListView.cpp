@@ -47,9 +47,9 @@ void ColumnListView::selectFor(QMouseEvent& event, const QModelIndex& index) {
     const bool left = event.button() == Qt::LeftButton;
     if (!left) {
         if (!index.isValid()) return;
-        selectionModel()->setCurrentIndex(
-            index, selectionModel()->isSelected(index) ? QItemSelectionModel::NoUpdate
-                                                       : QItemSelectionModel::ClearAndSelect);
+        selectionModel()->setCurrentIndex(index, selectionModel()->isSelected(index)
+                                                     ? QItemSelectionModel::NoUpdate
+                                                     : QItemSelectionModel::ClearAndSelect);
         return;
     }
     const bool plain = event.modifiers() == Qt::NoModifier;

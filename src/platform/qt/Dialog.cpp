@@ -24,8 +24,7 @@ void showReadOnly(QLineEdit& text) {
 } // namespace
 
 FormDialog::FormDialog(QWidget* parent, PlainEvent Close)
-    : QDialog(parent), mForm(new QFormLayout), mButtons(new QHBoxLayout),
-      mClose(std::move(Close)) {
+    : QDialog(parent), mForm(new QFormLayout), mButtons(new QHBoxLayout), mClose(std::move(Close)) {
     setModal(true);
     setMinimumWidth(380);
     mForm->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);

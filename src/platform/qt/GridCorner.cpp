@@ -8,8 +8,7 @@
 
 namespace platform::qt {
 
-GridCorner::GridCorner(const GridModel& model, QWidget* parent)
-    : QWidget(parent), mModel(model) {
+GridCorner::GridCorner(const GridModel& model, QWidget* parent) : QWidget(parent), mModel(model) {
     setAutoFillBackground(true);
 }
 
@@ -19,7 +18,7 @@ void GridCorner::paintEvent(QPaintEvent*) {
     option.initFrom(this);
     option.state |= QStyle::State_Raised;
     option.orientation = Qt::Horizontal;
-    option.position = QStyleOptionHeader::OnlyOneSection;
+    option.position = QStyleOptionHeader::Beginning; // column headers follow
     option.text = mModel.text(0, 0);
     option.textAlignment = Qt::AlignLeft | Qt::AlignVCenter;
     paintFixedCell(painter, option, *this);

@@ -55,8 +55,7 @@ QString GridModel::titleOf(int row, int col) const {
     QString title = text(titled, 0);
     if (title.endsWith(u':')) title.chop(1);
     const QString& field = text(0, col);
-    return title + QStringLiteral(", ") +
-           (field.isEmpty() ? tr("column %1").arg(col) : field);
+    return title + QStringLiteral(", ") + (field.isEmpty() ? tr("column %1").arg(col) : field);
 }
 
 QVariant GridModel::data(const QModelIndex& index, int role) const {

@@ -92,7 +92,8 @@ void GridWidget::measure() {
 
 void GridWidget::touch() {
     if (std::exchange(mStale, true)) return;
-    QMetaObject::invokeMethod(this, [this] { bringUpToDate(); }, Qt::QueuedConnection);
+    QMetaObject::invokeMethod(
+        this, [this] { bringUpToDate(); }, Qt::QueuedConnection);
 }
 
 void GridWidget::setCurrentCell(int row, int col) {
@@ -239,8 +240,8 @@ bool GridWidget::keyPressed(const QKeyEvent& event) {
         mListener->deleteKey(middleOfCurrentCell());
         return true;
     }
-    const bool opens = event.key() == Qt::Key_F2 || event.key() == Qt::Key_Return ||
-                       event.key() == Qt::Key_Enter;
+    const bool opens =
+        event.key() == Qt::Key_F2 || event.key() == Qt::Key_Return || event.key() == Qt::Key_Enter;
     if (!opens) return false;
     // For the keyboard, what a click on the current cell is for the mouse.
     const QPointF middle = middleOfCurrentCell();

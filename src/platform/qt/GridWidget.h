@@ -14,8 +14,7 @@ public:
     virtual ~GridListener() = default;
     /// `at` is in the grid's own coordinates, headers included.
     virtual void pressed(Qt::MouseButton button, Qt::KeyboardModifiers modifiers, QPointF at) = 0;
-    virtual void released(Qt::MouseButton button, Qt::KeyboardModifiers modifiers,
-                          QPointF at) = 0;
+    virtual void released(Qt::MouseButton button, Qt::KeyboardModifiers modifiers, QPointF at) = 0;
     virtual void scrolled() = 0;
     /// A key asks for the menu of the cell around `at`; it is to open at a place of the screen.
     virtual void menuKey(QPointF at, QPoint screen) = 0;

@@ -32,9 +32,9 @@ void HomeButton::paintEvent(QPaintEvent*) {
     painter.translate((width() - side) / 2, (height() - side) / 2);
     QTransform grown;
     grown.scale(side / 10, side / 10);
-    painter.setPen(QPen(palette().color(isEnabled() ? QPalette::Active : QPalette::Disabled,
-                                        QPalette::ButtonText),
-                        1.3, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
+    painter.setPen(QPen(
+        palette().color(isEnabled() ? QPalette::Active : QPalette::Disabled, QPalette::ButtonText),
+        1.3, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
     QPainterPath arrow;
     arrow.moveTo(9, 9);
     arrow.lineTo(1, 1);

@@ -12,7 +12,6 @@ inline constexpr char promptProperty[] = "prompt";
 inline constexpr char styleProperty[] = "style";
 
 /// Shows a box and returns when the user has closed it. Does nothing without an application.
-void showMessageBox(QWidget* parent, const String& prompt, std::int32_t style,
-                    const String& title);
+void showMessageBox(QWidget* parent, const String& prompt, std::int32_t style, const String& title);
 
 } // namespace platform::qt

@@ -176,17 +176,12 @@ bool Navigation::scroll(const QKeyEvent& event) {
         return true;
     }
     switch (event.key()) {
-    case Qt::Key_PageUp:
-        mView.scrollBy({0, -seen.height()});
-        return true;
-    case Qt::Key_PageDown:
-        mView.scrollBy({0, seen.height()});
-        return true;
+    case Qt::Key_PageUp: mView.scrollBy({0, -seen.height()}); return true;
+    case Qt::Key_PageDown: mView.scrollBy({0, seen.height()}); return true;
     case Qt::Key_Home:
         mView.scrollBy(withControl ? -seen.topLeft() : QPoint(-seen.left(), 0));
         return true;
-    default:
-        return false;
+    default: return false;
     }
 }
 

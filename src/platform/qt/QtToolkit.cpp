@@ -98,9 +98,8 @@ std::unique_ptr<CommandButton> QtToolkit::makeCommandButton(const Design& design
     return adapt<ButtonAdapter>(design, Role::button, button, std::move(events));
 }
 
-std::unique_ptr<ComboBox> QtToolkit::makeComboBox(const Design& design,
-                                                  const std::vector<String>& items,
-                                                  KeyEvent KeyDown) {
+std::unique_ptr<ComboBox>
+QtToolkit::makeComboBox(const Design& design, const std::vector<String>& items, KeyEvent KeyDown) {
     auto* combo = new QComboBox(parentOf(design));
     combo->show();
     return adapt<ComboBoxAdapter>(design, Role::field, combo, items, std::move(KeyDown));
@@ -130,8 +129,7 @@ std::unique_ptr<ScrollBar> QtToolkit::makeScrollBar(const Design& design, Orient
 }
 
 std::unique_ptr<MSFlexGridLib::MSFlexGrid> QtToolkit::makeGrid(const Design& design,
-                                                               std::int32_t rows,
-                                                               std::int32_t cols,
+                                                               std::int32_t rows, std::int32_t cols,
                                                                MSFlexGridLib::GridEvents events) {
     auto* grid = new GridWidget(rows, cols, parentOf(design));
     mGrid = grid;

@@ -48,8 +48,7 @@ void CanvasScrollBar::focusOutEvent(QFocusEvent* event) {
     update();
 }
 
-ScrollBarAdapter::ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus,
-                                   ScrollBarEvents events)
+ScrollBarAdapter::ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, ScrollBarEvents events)
     : Adapter(widget, focus) {
     widget->setRange(0, 0);
     widget->setSingleStep(singleStep);

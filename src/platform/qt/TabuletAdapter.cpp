@@ -23,8 +23,7 @@ std::int32_t nextHandle() {
 } // namespace
 
 /// An entry outlives its list where somebody still holds it; it then keeps what it last said.
-class TabuletAdapter::Entry final : public TableEntry,
-                                    public std::enable_shared_from_this<Entry> {
+class TabuletAdapter::Entry final : public TableEntry, public std::enable_shared_from_this<Entry> {
 public:
     Entry(TabuletAdapter& table, int row, const String& key, const String& text)
         : mTable(&table), mRow(row), mKey(key), mText(text) {}
@@ -103,8 +102,7 @@ const Ref<TalvikTabulet::ColumnItem>& TabuletAdapter::Entries::Item(std::int32_t
     return items[static_cast<std::size_t>(position) - 1];
 }
 
-Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Add(const String& key,
-                                                            const String& text) {
+Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Add(const String& key, const String& text) {
     auto entry = std::make_shared<Entry>(mTable, Count(), key, text);
     if (mTable.mWidget) mTable.mWidget->model().append(toQt(text));
     return items.emplace_back(std::move(entry));
@@ -142,7 +140,8 @@ void TabuletAdapter::Visible(bool value) {
 }
 
 void TabuletAdapter::Activated(bool value) {
-    if (value && mSurroundings.current && mSurroundings.current != this) mSurroundings.current->Activated(false);
+    if (value && mSurroundings.current && mSurroundings.current != this)
+        mSurroundings.current->Activated(false);
     if (value)
         mSurroundings.current = this;
     else if (mSurroundings.current == this)
@@ -219,9 +218,8 @@ void TabuletAdapter::menuKey(int row, QPoint at) {
 }
 
 void TabuletAdapter::deleteKey(int row) {
-    mSurroundings.menu.choose(menuentry::deleteTable, [&] {
-        entryReleased(row, buttonState(Qt::RightButton), 0);
-    });
+    mSurroundings.menu.choose(menuentry::deleteTable,
+                              [&] { entryReleased(row, buttonState(Qt::RightButton), 0); });
 }
 
 void TabuletAdapter::listScrolled() {

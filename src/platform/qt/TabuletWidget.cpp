@@ -18,8 +18,8 @@ namespace platform::qt {
 
 namespace {
 
-constexpr int border = 4;      ///< resizes the box; its outermost pixel is the frame line
-constexpr int keyStep = 10;    ///< 150 twips
+constexpr int border = 4;       ///< resizes the box; its outermost pixel is the frame line
+constexpr int keyStep = 10;     ///< 150 twips
 constexpr int cornerReach = 14; ///< how far a corner reaches along its edges
 
 QColor blend(const QColor& one, const QColor& other, double share) {
@@ -143,8 +143,8 @@ void TabuletWidget::measure() {
 void TabuletWidget::arrange() {
     const int side = mTitleHeight - 8;
     mClose->setGeometry(width() - side - border, 4, side, side);
-    mList->setGeometry(QRect(border, mTitleHeight, width() - 2 * border,
-                             height() - mTitleHeight - border));
+    mList->setGeometry(
+        QRect(border, mTitleHeight, width() - 2 * border, height() - mTitleHeight - border));
 }
 
 void TabuletWidget::resizeEvent(QResizeEvent*) { arrange(); }

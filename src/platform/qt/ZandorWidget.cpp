@@ -115,24 +115,26 @@ void ZandorWidget::setInteger(platform::StringView procedure, int value,
 
 // The properties: one line a getter, one line a setter.
 
-#define FIELD_TEXT(name)                                                                          \
-    QString ZandorWidget::name() const { return toQt(mControl->name); }                           \
+#define FIELD_TEXT(name)                                                                           \
+    QString ZandorWidget::name() const { return toQt(mControl->name); }                            \
     void ZandorWidget::set##name(const QString& value) { mControl->name = fromQt(value); }
-#define FIELD_FLAG(name)                                                                          \
-    bool ZandorWidget::name() const { return mControl->name; }                                    \
+#define FIELD_FLAG(name)                                                                           \
+    bool ZandorWidget::name() const { return mControl->name; }                                     \
     void ZandorWidget::set##name(bool value) { mControl->name = value; }
-#define FIELD_NUMBER(name)                                                                        \
-    int ZandorWidget::name() const { return mControl->name; }                                     \
-    void ZandorWidget::set##name(int value) {                                                     \
-        setInteger(u"P_LET " #name, value, [](Zandor& zandor, std::int16_t v) { zandor.name = v; }); \
+#define FIELD_NUMBER(name)                                                                         \
+    int ZandorWidget::name() const { return mControl->name; }                                      \
+    void ZandorWidget::set##name(int value) {                                                      \
+        setInteger(u"P_LET " #name, value,                                                         \
+                   [](Zandor& zandor, std::int16_t v) { zandor.name = v; });                       \
     }
-#define PROPERTY_FLAG(name)                                                                       \
-    bool ZandorWidget::name() const { return mControl->name(); }                                  \
+#define PROPERTY_FLAG(name)                                                                        \
+    bool ZandorWidget::name() const { return mControl->name(); }                                   \
     void ZandorWidget::set##name(bool value) { mControl->name(value); }
-#define PROPERTY_NUMBER(name)                                                                     \
-    int ZandorWidget::name() const { return mControl->name(); }                                   \
-    void ZandorWidget::set##name(int value) {                                                     \
-        setInteger(u"P_LET " #name, value, [](Zandor& zandor, std::int16_t v) { zandor.name(v); }); \
+#define PROPERTY_NUMBER(name)                                                                      \
+    int ZandorWidget::name() const { return mControl->name(); }                                    \
+    void ZandorWidget::set##name(int value) {                                                      \
+        setInteger(u"P_LET " #name, value,                                                         \
+                   [](Zandor& zandor, std::int16_t v) { zandor.name(v); });                        \
     }
 
 FIELD_TEXT(LNGJoinForm)
