@@ -82,7 +82,8 @@ void DrawingArea::resizeEvent(QResizeEvent* event) {
 void DrawingArea::fitCanvas() {
     int right = 0;
     int bottom = 0;
-    for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(mDocument.query()->Tables())) {
+    for (const auto& table :
+         platform::Each<TalvikZandorLib::ZDTable>(mDocument.query()->Tables())) {
         right = std::max(right, table->Left() + table->Width() + model::layout::margin);
         bottom = std::max(bottom, table->Top() + table->Height() + model::layout::margin);
     }
@@ -90,7 +91,8 @@ void DrawingArea::fitCanvas() {
     const int visibleHeight = height() * twipsPerPixel;
     // The grid covers the lower half, yet the control scrolls a canvas only when it is higher than
     // both halves together.
-    const int scrolling = bottom > visibleHeight / 2 ? visibleHeight + twipsPerPixel : visibleHeight;
+    const int scrolling =
+        bottom > visibleHeight / 2 ? visibleHeight + twipsPerPixel : visibleHeight;
     mControl->setMXHorzFrameSize(canvasSize(std::max(right, visibleWidth)));
     mControl->setMXVertFrameSize(canvasSize(std::max(bottom, scrolling)));
 }

@@ -19,8 +19,8 @@ public:
     explicit DrawingArea(Document& document, QWidget* parent = nullptr);
     ~DrawingArea() override;
 
-    /// The control of the moment. It goes whenever the drawing is shown anew: keep it no longer than
-    /// a statement, and connect to every one from controlMade().
+    /// The control of the moment. It goes whenever the drawing is shown anew: keep it no longer
+    /// than a statement, and connect to every one from controlMade().
     ZandorWidget& control() { return *mControl; }
     /// The control's properties by name, set on this control and all later ones before they get
     /// their model.

@@ -70,18 +70,10 @@ TEST(AChangedFile, IsAnotherQueryOrRefusedWithOneLine) {
         for (std::size_t times = upTo(2) + 1; times > 0; --times) {
             const std::size_t at = upTo(changed.size() - 1);
             switch (upTo(3)) {
-            case 0:
-                changed[at] = static_cast<char>(upTo(255));
-                break;
-            case 1:
-                changed.erase(at, upTo(20) + 1);
-                break;
-            case 2:
-                changed.insert(at, 1, "\"{}[],:0-e\\"[upTo(10)]);
-                break;
-            default:
-                changed.insert(at, changed.substr(upTo(changed.size() - 1), upTo(80)));
-                break;
+            case 0: changed[at] = static_cast<char>(upTo(255)); break;
+            case 1: changed.erase(at, upTo(20) + 1); break;
+            case 2: changed.insert(at, 1, "\"{}[],:0-e\\"[upTo(10)]); break;
+            default: changed.insert(at, changed.substr(upTo(changed.size() - 1), upTo(80))); break;
             }
         }
         const auto document = files::fromJson(changed);

@@ -53,20 +53,15 @@ private:
     void act() {
         switch (upTo(7)) {
         case 0:
-        case 1:
-            return addTable();
+        case 1: return addTable();
         case 2:
-        case 3:
-            return addJoin();
-        case 4:
-            return addDefinition();
-        case 5:
-            return change();
+        case 3: return addJoin();
+        case 4: return addDefinition();
+        case 5: return change();
         case 6:
             if (chance(50) && table()) mQuery->renameTable(table(), name() + suffix());
             return;
-        default:
-            return remove();
+        default: return remove();
         }
     }
 

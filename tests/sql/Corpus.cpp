@@ -125,16 +125,11 @@ std::vector<Case> read(const std::string& directory) {
 
 std::string nameOf(model::sql::Dialect dialect) {
     switch (dialect) {
-    case model::sql::Dialect::SQLite:
-        return "sqlite";
-    case model::sql::Dialect::PostgreSQL:
-        return "postgresql";
-    case model::sql::Dialect::MySQL:
-        return "mysql";
-    case model::sql::Dialect::SqlServer:
-        return "sqlserver";
-    case model::sql::Dialect::Standard:
-        break;
+    case model::sql::Dialect::SQLite: return "sqlite";
+    case model::sql::Dialect::PostgreSQL: return "postgresql";
+    case model::sql::Dialect::MySQL: return "mysql";
+    case model::sql::Dialect::SqlServer: return "sqlserver";
+    case model::sql::Dialect::Standard: break;
     }
     return "standard";
 }
@@ -142,26 +137,16 @@ std::string nameOf(model::sql::Dialect dialect) {
 std::string nameOf(model::Finding::Kind kind) {
     using Kind = model::Finding::Kind;
     switch (kind) {
-    case Kind::noTables:
-        return "noTables";
-    case Kind::definitionWithoutColumn:
-        return "definitionWithoutColumn";
-    case Kind::sortOnAllColumns:
-        return "sortOnAllColumns";
-    case Kind::duplicateOutputName:
-        return "duplicateOutputName";
-    case Kind::cartesianProduct:
-        return "cartesianProduct";
-    case Kind::incomparableJoin:
-        return "incomparableJoin";
-    case Kind::ambiguousOuterJoin:
-        return "ambiguousOuterJoin";
-    case Kind::badCriterion:
-        return "badCriterion";
-    case Kind::nameNotCarried:
-        return "nameNotCarried";
-    case Kind::notInDialect:
-        break;
+    case Kind::noTables: return "noTables";
+    case Kind::definitionWithoutColumn: return "definitionWithoutColumn";
+    case Kind::sortOnAllColumns: return "sortOnAllColumns";
+    case Kind::duplicateOutputName: return "duplicateOutputName";
+    case Kind::cartesianProduct: return "cartesianProduct";
+    case Kind::incomparableJoin: return "incomparableJoin";
+    case Kind::ambiguousOuterJoin: return "ambiguousOuterJoin";
+    case Kind::badCriterion: return "badCriterion";
+    case Kind::nameNotCarried: return "nameNotCarried";
+    case Kind::notInDialect: break;
     }
     return "notInDialect";
 }

@@ -23,20 +23,14 @@ namespace {
 QString written(const QVariant& value) {
     if (value.isNull()) return QStringLiteral("null");
     switch (value.typeId()) {
-    case QMetaType::Bool:
-        return value.toBool() ? QStringLiteral("1") : QStringLiteral("0");
-    case QMetaType::QDate:
-        return value.toDate().toString(Qt::ISODate);
-    case QMetaType::QTime:
-        return value.toTime().toString(QStringLiteral("HH:mm:ss"));
+    case QMetaType::Bool: return value.toBool() ? QStringLiteral("1") : QStringLiteral("0");
+    case QMetaType::QDate: return value.toDate().toString(Qt::ISODate);
+    case QMetaType::QTime: return value.toTime().toString(QStringLiteral("HH:mm:ss"));
     case QMetaType::QDateTime:
         return value.toDateTime().toString(QStringLiteral("yyyy-MM-dd HH:mm:ss"));
-    case QMetaType::QByteArray:
-        return QString::fromLatin1(value.toByteArray().toHex());
-    case QMetaType::QString:
-        return u'\'' + value.toString() + u'\'';
-    default:
-        break;
+    case QMetaType::QByteArray: return QString::fromLatin1(value.toByteArray().toHex());
+    case QMetaType::QString: return u'\'' + value.toString() + u'\'';
+    default: break;
     }
     // Exact decimals here, doubles there: the same up to the digits that both have.
     return QString::number(value.toDouble(), 'g', 12);

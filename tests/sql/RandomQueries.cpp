@@ -180,16 +180,11 @@ String RandomQueries::predicate(ColumnType type) {
     const bool text = type == ColumnType::Text;
     if (type == ColumnType::Blob) return mDice.oneIn(2) ? u"Is Null" : u"Is Not Null";
     switch (mDice.roll(9)) {
-    case 0:
-        return mDice.oneIn(2) ? u"Is Null" : u"Not Is Null";
-    case 1:
-        return u"Between " + value(type) + u" And " + value(type);
-    case 2:
-        return u"Not In (" + value(type) + u", " + value(type) + u")";
-    case 3:
-        return u"In (" + value(type) + u")";
-    case 4:
-        return u"Not " + value(type);
+    case 0: return mDice.oneIn(2) ? u"Is Null" : u"Not Is Null";
+    case 1: return u"Between " + value(type) + u" And " + value(type);
+    case 2: return u"Not In (" + value(type) + u", " + value(type) + u")";
+    case 3: return u"In (" + value(type) + u")";
+    case 4: return u"Not " + value(type);
     case 5:
         if (text) return u"Like '" + String(mDice.oneIn(2) ? u"*" : u"?") + u"a[*]_%\\*'";
         break;
@@ -200,8 +195,7 @@ String RandomQueries::predicate(ColumnType type) {
         if (!mColumns.empty() && type != ColumnType::Unknown)
             return mDice.pick(comparisons) + mDice.pick(mColumns);
         break;
-    default:
-        break;
+    default: break;
     }
     return mDice.pick(comparisons) + value(type);
 }
@@ -212,22 +206,15 @@ String RandomQueries::number(std::size_t sides) {
 
 String RandomQueries::value(ColumnType type) {
     switch (type) {
-    case ColumnType::Integer:
-        return (mDice.oneIn(8) ? u"-" : u"") + number(12);
+    case ColumnType::Integer: return (mDice.oneIn(8) ? u"-" : u"") + number(12);
     case ColumnType::Unknown:
-    case ColumnType::Decimal:
-        return number(90) + u"." + number(100);
-    case ColumnType::Date:
-        return u"2019-01-1" + number(10);
-    case ColumnType::Time:
-        return u"1" + number(10) + u":30";
-    case ColumnType::Timestamp:
-        return u"#2019-01-1" + number(10) + u" 12:00#";
-    case ColumnType::Boolean:
-        return mDice.oneIn(2) ? u"true" : u"no";
+    case ColumnType::Decimal: return number(90) + u"." + number(100);
+    case ColumnType::Date: return u"2019-01-1" + number(10);
+    case ColumnType::Time: return u"1" + number(10) + u":30";
+    case ColumnType::Timestamp: return u"#2019-01-1" + number(10) + u" 12:00#";
+    case ColumnType::Boolean: return mDice.oneIn(2) ? u"true" : u"no";
     case ColumnType::Text:
-    case ColumnType::Blob:
-        break;
+    case ColumnType::Blob: break;
     }
     return mDice.pick(words);
 }
