@@ -5,12 +5,14 @@
 #include "platform/qt/GridWidget.h"
 #include "platform/qt/TabuletWidget.h"
 #include "platform/qt/Twips.h"
-#include "platform/qt/ZandorWidget.h"
 
+#include <QAbstractButton>
+#include <QAbstractItemView>
 #include <QApplication>
 #include <QComboBox>
 #include <QDialog>
 #include <QMenu>
+#include <QMenuBar>
 
 using platform::qt::Canvas;
 using platform::qt::CanvasLine;
@@ -34,8 +36,8 @@ Place middle(const QWidget* widget, const QRect& rect) {
     return widget->mapToGlobal(shown.center());
 }
 
-TabuletWidget* tableOf(const ZandorWidget& widget, const QString& title) {
-    for (QWidget* child : widget.findChildren<QWidget*>())
+TabuletWidget* tableOf(const QWidget& window, const QString& title) {
+    for (QWidget* child : window.findChildren<QWidget*>())
         if (auto* table = dynamic_cast<TabuletWidget*>(child); table && table->title() == title)
             return table;
     return nullptr;
@@ -50,9 +52,9 @@ Place entry(const TabuletWidget* table, const QString& column) {
     return {};
 }
 
-Place join(const ZandorWidget& widget, const QString& number) {
+Place join(const QWidget& window, const QString& number) {
     auto* const canvas =
-        dynamic_cast<Canvas*>(widget.findChild<QWidget*>(QStringLiteral("fraTable")));
+        dynamic_cast<Canvas*>(window.findChild<QWidget*>(QStringLiteral("fraTable")));
     if (!canvas) return {};
     for (const auto* item : canvas->items()) {
         const auto* line = dynamic_cast<const CanvasLine*>(item);
@@ -63,11 +65,18 @@ Place join(const ZandorWidget& widget, const QString& number) {
     return {};
 }
 
-Place menu(const QString& name) {
-    auto* const open = qobject_cast<QMenu*>(QApplication::activePopupWidget());
-    if (!open) return {};
-    for (QAction* action : open->actions())
-        if (action->objectName() == name) return middle(open, open->actionGeometry(action));
+/// By the action's name, in the open menu or else in the menu bar.
+Place menu(const QWidget& window, const QString& name) {
+    if (auto* const open = qobject_cast<QMenu*>(QApplication::activePopupWidget())) {
+        for (QAction* action : open->actions())
+            if (action->objectName() == name) return middle(open, open->actionGeometry(action));
+        return {};
+    }
+    const auto* bar = window.findChild<QMenuBar*>();
+    if (!bar) return {};
+    for (QAction* action : bar->actions())
+        if (action->menu() && action->menu()->objectName() == name)
+            return middle(bar, bar->actionGeometry(action));
     return {};
 }
 
@@ -78,29 +87,57 @@ Place item(const QWidget* control, int number) {
                   combo->view()->visualRect(combo->model()->index(number, 0)));
 }
 
+Place row(const QWidget* control, const QString& text) {
+    const auto* view = qobject_cast<const QAbstractItemView*>(control);
+    if (!view) return {};
+    const auto* model = view->model();
+    for (int row = 0; row < model->rowCount(view->rootIndex()); ++row) {
+        const QModelIndex index = model->index(row, 0, view->rootIndex());
+        if (index.data().toString() == text)
+            return middle(view->viewport(), view->visualRect(index));
+    }
+    return {};
+}
+
+Place button(const QString& text) {
+    const QWidget* const dialog = QApplication::activeModalWidget();
+    if (!dialog) return {};
+    for (const auto* button : dialog->findChildren<QAbstractButton*>())
+        if (QString(button->text()).remove(u'&') == text) return middle(button, button->rect());
+    return {};
+}
+
+Place canvasPlace(const QWidget& window, QPoint at) {
+    const auto* canvas = window.findChild<QWidget*>(QStringLiteral("fraTable"));
+    return canvas ? middle(canvas, QRect(at, QSize(1, 1))) : Place();
+}
+
 } // namespace
 
-QWidget* shownControl(const ZandorWidget& widget, const QString& name) {
+QWidget* shownControl(const QWidget& window, const QString& name) {
     const QWidget* const dialog = QApplication::activeModalWidget();
-    auto* const found = (dialog ? dialog : &widget)->findChild<QWidget*>(name);
+    auto* const found = (dialog ? dialog : &window)->findChild<QWidget*>(name);
     return found && found->isVisible() ? found : nullptr;
 }
 
-Place placeOf(const ZandorWidget& widget, const QStringList& words) {
+Place placeOf(const QWidget& window, const QStringList& words) {
     const QString& kind = words.value(0);
     const QString& name = words.value(1);
-    if (kind == "entry") return entry(tableOf(widget, name), words.value(2));
-    if (kind == "join") return join(widget, name);
-    if (kind == "menu") return menu(name);
-    const QWidget* const control = shownControl(widget, name);
+    if (kind == "entry") return entry(tableOf(window, name), words.value(2));
+    if (kind == "join") return join(window, name);
+    if (kind == "canvas") return canvasPlace(window, {name.toInt(), words.value(2).toInt()});
+    if (kind == "menu") return menu(window, name);
+    if (kind == "button") return button(words.mid(1).join(u' '));
+    const QWidget* const control = shownControl(window, name);
     if (kind == "control") return control ? middle(control, control->rect()) : Place();
     if (kind == "item") return item(control, words.value(2).toInt());
+    if (kind == "row") return row(control, words.mid(2).join(u' '));
     if (kind == "cell") {
         const auto* grid =
-            dynamic_cast<GridWidget*>(widget.findChild<QWidget*>(QStringLiteral("sprColumn")));
+            dynamic_cast<GridWidget*>(window.findChild<QWidget*>(QStringLiteral("sprColumn")));
         return grid ? middle(grid, grid->cellRect(name.toInt(), words.value(2).toInt())) : Place();
     }
-    if (const auto* table = tableOf(widget, name)) {
+    if (const auto* table = tableOf(window, name)) {
         if (kind == "title") return middle(table, table->titleBar());
         if (kind == "close") return middle(&table->closeButton(), table->closeButton().rect());
     }

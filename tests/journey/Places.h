@@ -6,18 +6,21 @@
 #include <optional>
 
 class QWidget;
-class ZandorWidget;
 
-/// Where on the screen a thing stands that the user points at, or nothing while it is not shown:
+/// Where on the screen a thing of a window stands that the user points at, or nothing while it is
+/// not shown:
 ///
 ///     entry TABLE COLUMN      a column in a table's list
 ///     title TABLE, close TABLE
 ///     cell ROW COL            of the grid
 ///     join NUMBER             the middle of a line
-///     menu NAME               an entry of the open menu
-///     control NAME            a control on the widget or in the open dialog
+///     canvas X Y              a place of the canvas, in pixels from its corner
+///     menu NAME               an entry of the open menu, or of the menu bar
+///     control NAME            a control on the window or in the open dialog
 ///     item NAME NUMBER        an item of an open list, counted from 0
-std::optional<QPoint> placeOf(const ZandorWidget& widget, const QStringList& words);
+///     row NAME TEXT           the first row of a list or table that has this text
+///     button TEXT             a button of the open dialog
+std::optional<QPoint> placeOf(const QWidget& window, const QStringList& words);
 
-/// A control on the widget or in the open dialog; nullptr when there is none.
-QWidget* shownControl(const ZandorWidget& widget, const QString& name);
+/// A control on the window or in the open dialog; nullptr when there is none.
+QWidget* shownControl(const QWidget& window, const QString& name);
