@@ -23,6 +23,7 @@ reader::Result<Arguments> readArguments(const QStringList& arguments) {
     const QCommandLineOption picture(QStringLiteral("picture"), {}, QStringLiteral("file"));
     const QCommandLineOption dark(QStringLiteral("dark"));
     parser.addOptions({tables, picture, dark});
+    parser.addOptions(shell::options());
     // The parser takes the first argument for the program's name.
     if (!parser.parse(QStringList(QStringLiteral("zandor-designer")) + arguments))
         return reader::Error{parser.errorText() + QStringLiteral(" See --help.")};
@@ -44,6 +45,14 @@ reader::Result<Arguments> readArguments(const QStringList& arguments) {
     if (parser.isSet(picture) && result.picture.isEmpty())
         return reader::Error{QStringLiteral("--picture names no file; write --picture query.png.")};
     result.dark = parser.isSet(dark);
+    const auto task = shell::taskOf(parser);
+    if (!task) return reader::Error{task.error()};
+    result.task = *task;
+    const bool window =
+        !result.file.isEmpty() || !result.tables.isEmpty() || !result.picture.isEmpty();
+    if (result.task && window)
+        return reader::Error{
+            QStringLiteral("--sql and --run open no window; leave out what is for one.")};
     return result;
 }
 
@@ -57,6 +66,10 @@ bool asksForVersion(const QStringList& arguments) {
 
 bool asksForPicture(const QStringList& arguments) {
     return hasAny(arguments, {QStringLiteral("--picture")});
+}
+
+bool asksForTask(const QStringList& arguments) {
+    return hasAny(arguments, {QStringLiteral("--sql"), QStringLiteral("--run")});
 }
 
 QString helpText() {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/reader/Result.h"
+#include "designer/shell/Task.h"
 
 #include <QStringList>
 
@@ -8,20 +8,22 @@ namespace designer {
 
 /// What the designer was asked on its command line.
 struct Arguments {
-    QString file;       ///< empty: the sample database
-    QStringList tables; ///< empty: the designer chooses
-    QString picture;    ///< a file to draw the window into instead of staying open; may be empty
+    QString file = {};       ///< empty: the sample database
+    QStringList tables = {}; ///< empty: the designer chooses
+    QString picture = {}; ///< a file to draw the window into instead of staying open; may be empty
     bool dark = false;
+    std::optional<shell::Task> task = {}; ///< to be done instead of opening a window
 };
 
 /// Reads the arguments behind the program's name.
 reader::Result<Arguments> readArguments(const QStringList& arguments);
 
-// Known before there is an application: help and the version need no screen, a picture none that
-// anybody sees.
+// Known before there is an application: help, the version and a task need no screen, a picture none
+// that anybody sees.
 bool asksForHelp(const QStringList& arguments);
 bool asksForVersion(const QStringList& arguments);
 bool asksForPicture(const QStringList& arguments);
+bool asksForTask(const QStringList& arguments);
 
 QString helpText();
 QString versionText();

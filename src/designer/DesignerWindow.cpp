@@ -1,72 +1,314 @@
 #include "designer/DesignerWindow.h"
 
-#include "model/Layout.h"
-#include "platform/KeyedCollection.h"
+#include "designer/DatabaseCommands.h"
+#include "designer/OpenedQuery.h"
+#include "designer/Screen.h"
+#include "designer/canvasSize.h"
+#include "designer/database/ConnectionBanner.h"
+#include "designer/database/droppedDatabase.h"
+#include "designer/document/Autosave.h"
+#include "designer/document/FileDialogs.h"
+#include "designer/document/RecentMenu.h"
+#include "designer/document/Recovery.h"
+#include "designer/options/EventPanel.h"
+#include "designer/options/OptionsDialog.h"
+#include "designer/run/ResultsPanel.h"
+#include "designer/show/ShowCommands.h"
+#include "designer/statement/FindingPlace.h"
+#include "designer/statement/StatementPanel.h"
+#include "designer/tables/RenameDialog.h"
+#include "designer/tables/TableAdding.h"
+#include "designer/tables/TableDropTarget.h"
+#include "designer/tables/TablesPanel.h"
+#include "designer/tables/placeTables.h"
 
+#include <QCloseEvent>
+#include <QDockWidget>
 #include <QLabel>
-#include <QResizeEvent>
+#include <QMenuBar>
+#include <QMessageBox>
+#include <QMimeData>
+#include <QScreen>
 #include <QStatusBar>
-
-#include <algorithm>
-#include <limits>
+#include <QVBoxLayout>
 
 namespace designer {
 
 namespace {
 
-constexpr QSize newSize(1200, 800); // logical pixels
-constexpr int twipsPerPixel = 15;
-constexpr int besideCanvas = 24; // the scroll bar and the window's edges
+constexpr QSize newSize(1340, 800); // logical pixels
+constexpr int layoutVersion = 1;    // another number forgets where the panels were
+constexpr int mostOutputColumns = 255;
+constexpr int messageTime = 10'000; // milliseconds
 
-/// As much as the control's 16-bit sizes can say.
-std::int16_t canvasSize(int twips) {
-    return static_cast<std::int16_t>(
-        std::clamp<int>(twips, 0, std::numeric_limits<std::int16_t>::max()));
-}
+QString geometryKey() { return QStringLiteral("window/geometry"); }
+QString layoutKey() { return QStringLiteral("window/layout"); }
 
 } // namespace
 
-std::int32_t DesignerWindow::canvasWidth() {
-    return (newSize.width() - besideCanvas) * twipsPerPixel;
+DesignerWindow::DesignerWindow()
+    : mDrawing(new DrawingArea(mDocument)),
+      mFiles(new FileDialogs(mDocument, mFile, mRecentQueries, *this)),
+      mDatabases(new DatabaseCommands(mDatabase, mFile, *mFiles, mRecentDatabases, *this)),
+      mShow(new ShowCommands(mDocument, *mDrawing, *this)) {
+    mDrawing->setOptions(ControlOptions::read(mSettings).properties());
+    auto* const middle = new QWidget;
+    auto* const layout = new QVBoxLayout(middle);
+    layout->setContentsMargins({});
+    layout->setSpacing(0);
+    layout->addWidget(new ConnectionBanner(mDatabase));
+    layout->addWidget(mDrawing, 1);
+    setCentralWidget(middle);
+    setAcceptDrops(true);
+    makePanels();
+    makeMenus();
+    connectParts();
+    // Off screen there is no edge that a window could reach beyond.
+    resize(isOffscreen() ? newSize : newSize.boundedTo(screen()->availableSize()));
+    restoreLayout();
+    showTitle();
+    showCounts();
 }
 
-DesignerWindow::DesignerWindow(const OpenedQuery& opened)
-    : mQuery(opened.query), mDesigner(new ZandorWidget(mLibrary, this)) {
-    setWindowTitle(opened.name + QStringLiteral(" \u2014 Zandor Designer"));
-    mDesigner->setDebugSwitch(0);
-    mDesigner->installEventFilter(this);
-    setCentralWidget(mDesigner);
-    statusBar()->addWidget(new QLabel(opened.message));
-    resize(newSize);
-    mDesigner->setOnlyJoin(false);
-    mDesigner->setModel(mQuery);
+DesignerWindow::~DesignerWindow() {
+    // Before the document and the database that they look at.
+    mAutosave.reset();
+    qDeleteAll(findChildren<QDockWidget*>(Qt::FindDirectChildrenOnly));
+    delete takeCentralWidget();
 }
 
-// The control leaves its library's objects behind, so it goes before the library.
-DesignerWindow::~DesignerWindow() { delete mDesigner; }
-
-bool DesignerWindow::eventFilter(QObject* watched, QEvent* event) {
-    // Before the control lays itself out for its new size.
-    if (watched == mDesigner && event->type() == QEvent::Resize)
-        fitCanvas(static_cast<QResizeEvent*>(event)->size());
-    return QMainWindow::eventFilter(watched, event);
+void DesignerWindow::makePanels() {
+    // The panels at the side keep their height when one is opened below.
+    setCorner(Qt::BottomLeftCorner, Qt::LeftDockWidgetArea);
+    mTables = new TablesPanel(mDatabase);
+    mStatement = new StatementPanel(mDocument);
+    mResults = new ResultsPanel(mDocument, mDatabase);
+    mEvents = new EventPanel;
+    dock(mTables, QStringLiteral("tablesDock"), tr("Tables"), Qt::LeftDockWidgetArea);
+    QDockWidget* const statement =
+        dock(mStatement, QStringLiteral("statementDock"), tr("SQL"), Qt::BottomDockWidgetArea);
+    QDockWidget* const results =
+        dock(mResults, QStringLiteral("resultsDock"), tr("Rows"), Qt::BottomDockWidgetArea);
+    QDockWidget* const events =
+        dock(mEvents, QStringLiteral("eventsDock"), tr("Events"), Qt::BottomDockWidgetArea);
+    tabifyDockWidget(statement, results);
+    tabifyDockWidget(results, events);
+    events->hide();
+    statement->raise();
+    resizeDocks({findChild<QDockWidget*>(QStringLiteral("tablesDock"))}, {220}, Qt::Horizontal);
+    resizeDocks({statement}, {220}, Qt::Vertical);
+    connect(mResults, &ResultsPanel::shown, results, [results] {
+        results->show();
+        results->raise();
+    });
 }
 
-/// Makes the canvas as large as its tables need, and never smaller than what can be seen of it.
-void DesignerWindow::fitCanvas(const QSize& visible) {
-    int right = 0;
-    int bottom = 0;
-    for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(mQuery->Tables())) {
-        right = std::max(right, table->Left() + table->Width() + model::layout::margin);
-        bottom = std::max(bottom, table->Top() + table->Height() + model::layout::margin);
+QDockWidget* DesignerWindow::dock(QWidget* panel, const QString& name, const QString& title,
+                                  Qt::DockWidgetArea area) {
+    auto* const dock = new QDockWidget(title, this);
+    dock->setObjectName(name);
+    dock->setWidget(panel);
+    addDockWidget(area, dock);
+    return dock;
+}
+
+void DesignerWindow::makeMenus() {
+    const auto add = [this](const QString& title, const char* name) {
+        QMenu* const menu = menuBar()->addMenu(title);
+        menu->setObjectName(QLatin1String(name));
+        return menu;
+    };
+    const auto command = [this](QMenu* menu, const QString& text, const char* name, auto what) {
+        QAction* const action = menu->addAction(text);
+        action->setObjectName(QLatin1String(name));
+        connect(action, &QAction::triggered, this, what);
+        return action;
+    };
+
+    QMenu* const file = add(tr("&File"), "fileMenu");
+    auto* const recent = new RecentMenu(mRecentQueries, file);
+    connect(recent, &RecentMenu::chosen, mFiles,
+            [this](const QString& path) { mFiles->open(path); });
+    command(file, tr("&New query"), "new", [this] {
+        mFiles->startNew();
+    })->setShortcut(QKeySequence::New);
+    command(file, tr("&Open query\u2026"), "open", [this] {
+        mFiles->open();
+    })->setShortcut(QKeySequence::Open);
+    file->addMenu(recent);
+    file->addSeparator();
+    command(file, tr("&Save"), "save", [this] { mFiles->save(); })->setShortcut(QKeySequence::Save);
+    command(file, tr("Save &as\u2026"), "saveAs", [this] {
+        mFiles->saveAs();
+    })->setShortcut(QKeySequence::SaveAs);
+    file->addSeparator();
+    file->addAction(&mShow->exportPicture);
+    file->addAction(&mShow->print);
+    file->addSeparator();
+    command(file, tr("&Quit"), "quit", [this] { close(); })->setShortcut(QKeySequence::Quit);
+
+    QMenu* const edit = add(tr("&Edit"), "editMenu");
+    QAction* const undo = mDocument.makeUndoAction(this);
+    QAction* const redo = mDocument.makeRedoAction(this);
+    undo->setObjectName(QStringLiteral("undo"));
+    redo->setObjectName(QStringLiteral("redo"));
+    edit->addActions({undo, redo});
+    edit->addSeparator();
+    edit->addAction(&mShow->copyPicture);
+    command(edit, tr("Copy &SQL"), "copySql", [this] { mStatement->copy(); });
+    edit->addSeparator();
+    command(edit, tr("&Options\u2026"), "options", &DesignerWindow::showOptions);
+
+    mDatabases->addTo(*add(tr("&Database"), "databaseMenu"));
+
+    QMenu* const query = add(tr("&Query"), "queryMenu");
+    mResults->runAction()->setObjectName(QStringLiteral("run"));
+    mResults->cancelAction()->setObjectName(QStringLiteral("cancel"));
+    mResults->exportAction()->setObjectName(QStringLiteral("exportRows"));
+    query->addAction(mResults->runAction());
+    query->addAction(mResults->cancelAction());
+    query->addAction(mResults->exportAction());
+    query->addSeparator();
+    command(query, tr("&Arrange tables"), "arrange", [this] {
+        arrangeTables(mDocument, mDrawing->width() * twipsPerPixel);
+    })->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_A);
+    command(query, tr("Re&name table\u2026"), "rename", &DesignerWindow::renameTable);
+
+    QMenu* const view = add(tr("&View"), "viewMenu");
+    for (const auto* panel : findChildren<QDockWidget*>())
+        view->addAction(panel->toggleViewAction());
+
+    command(add(tr("&Help"), "helpMenu"), tr("&About"), "about", &DesignerWindow::about);
+}
+
+void DesignerWindow::connectParts() {
+    mAdding = new TableAdding(mDocument, mDatabase, *mDrawing);
+    auto* const target = new TableDropTarget(*mDrawing);
+    connect(mTables, &TablesPanel::chosen, mAdding,
+            [this](const std::vector<reader::TableId>& tables) { mAdding->add(tables); });
+    connect(target, &TableDropTarget::dropped, mAdding, &TableAdding::add);
+    connect(mAdding, &TableAdding::refused, this,
+            [this](const QString& why) { QMessageBox::warning(this, tr("Add tables"), why); });
+
+    connect(mStatement, &StatementPanel::findingChosen, this,
+            [this](const model::Finding& finding) {
+                showPlace(mDrawing->control(), *mDocument.query(), finding);
+            });
+    mEvents->watch(&mDrawing->control());
+    connect(mDrawing, &DrawingArea::controlMade, mEvents, &EventPanel::watch);
+
+    connect(&mDatabase, &Database::opened, this, [this] {
+        mStatement->setDatabaseDialect(mDatabase.dialect());
+        showTitle();
+    });
+    connect(&mFile, &QueryFile::changed, this, &DesignerWindow::showTitle);
+    connect(mFiles, &FileDialogs::opened, mDatabases, &DatabaseCommands::followFile);
+    connect(&mDocument, &Document::changed, this, &DesignerWindow::showCounts);
+    connect(&mDocument, &Document::changed, this, &DesignerWindow::warnOfFullGrid);
+}
+
+std::optional<QString> DesignerWindow::openAtFirst(const Arguments& arguments,
+                                                   const QString& sample) {
+    if (arguments.file.endsWith(QLatin1String(".json"), Qt::CaseInsensitive)) {
+        const auto error = mFile.open(arguments.file);
+        if (!error) mDatabases->followFile();
+        return error;
     }
-    const int width = visible.width() * twipsPerPixel;
-    const int height = visible.height() * twipsPerPixel;
-    // The grid covers the lower half, yet the control scrolls a canvas only when it is higher than
-    // both halves together.
-    const int scrolling = bottom > height / 2 ? height + twipsPerPixel : height;
-    mDesigner->setMXHorzFrameSize(canvasSize(std::max(right, width)));
-    mDesigner->setMXVertFrameSize(canvasSize(std::max(bottom, scrolling)));
+    const bool isSample = arguments.file.isEmpty();
+    const QString address = isSample ? sample : arguments.file;
+    const QString error = mDatabases->openAtFirst(address);
+    if (!error.isEmpty()) return error;
+    const auto opened =
+        openQuery(mDatabase.reader(), mDatabase.tables(),
+                  {arguments.tables, isSample, address, mDrawing->width() * twipsPerPixel});
+    if (!opened) return opened.error();
+    mDocument.setQuery(opened->query);
+    statusBar()->showMessage(opened->message, messageTime);
+    return {};
+}
+
+void DesignerWindow::keepSafe(const QString& folder) {
+    mAutosave = std::make_unique<Autosave>(mDocument, mFile, folder);
+    connect(mAutosave.get(), &Autosave::failed, this,
+            [this](const QString& message) { statusBar()->showMessage(message); });
+    if (offerRecovery(mFile, *mAutosave, folder, this)) mDatabases->followFile();
+}
+
+void DesignerWindow::closeEvent(QCloseEvent* event) {
+    if (!mFiles->mayLose()) return event->ignore();
+    mResults->cancel();
+    mSettings.setValue(geometryKey(), saveGeometry());
+    mSettings.setValue(layoutKey(), saveState(layoutVersion));
+    mAutosave.reset();
+    event->accept();
+}
+
+void DesignerWindow::restoreLayout() {
+    restoreGeometry(mSettings.value(geometryKey()).toByteArray());
+    restoreState(mSettings.value(layoutKey()).toByteArray(), layoutVersion);
+}
+
+void DesignerWindow::dragEnterEvent(QDragEnterEvent* event) {
+    if (droppedDatabase(*event->mimeData())) event->acceptProposedAction();
+}
+
+void DesignerWindow::dropEvent(QDropEvent* event) {
+    const auto path = droppedDatabase(*event->mimeData());
+    if (!path) return;
+    event->acceptProposedAction();
+    // After the drop, for there may be questions.
+    QMetaObject::invokeMethod(
+        mDatabases, [this, path] { mDatabases->openAddress(*path); }, Qt::QueuedConnection);
+}
+
+void DesignerWindow::showTitle() {
+    QStringList parts{mFile.name() + QStringLiteral("[*]")};
+    if (mDatabase.isOpen()) parts += mDatabase.name();
+    parts += QStringLiteral("Zandor Designer");
+    setWindowTitle(parts.join(QStringLiteral(" \u2014 ")));
+}
+
+void DesignerWindow::showCounts() {
+    auto* label = statusBar()->findChild<QLabel*>(QStringLiteral("counts"));
+    if (!label) {
+        label = new QLabel;
+        label->setObjectName(QStringLiteral("counts"));
+        statusBar()->addWidget(label);
+    }
+    model::Query& query = *mDocument.query();
+    label->setText(
+        tr("Tables: %1   Joins: %2").arg(query.Tables().Count()).arg(query.Joins().Count()));
+}
+
+/// What is added to a full grid takes the place of its last column.
+void DesignerWindow::warnOfFullGrid() {
+    const bool full = mDocument.query()->ColumnDefinitions().Count() >= mostOutputColumns;
+    if (full && !mWarnedOfFullGrid)
+        QMessageBox::warning(
+            this, tr("Output columns"),
+            tr("The grid shows %1 output columns and is full. Delete one before you "
+               "add another; it would take the place of the last.")
+                .arg(mostOutputColumns));
+    mWarnedOfFullGrid = full;
+}
+
+void DesignerWindow::showOptions() {
+    OptionsDialog dialog(mSettings, this);
+    connect(&dialog, &OptionsDialog::applied, this,
+            [this](const ControlOptions& options) { mDrawing->setOptions(options.properties()); });
+    dialog.exec();
+}
+
+void DesignerWindow::renameTable() {
+    if (mDocument.query()->Tables().Count() > 0) RenameDialog(mDocument, this).exec();
+}
+
+void DesignerWindow::about() {
+    QMessageBox::about(
+        this, tr("About Zandor Designer"),
+        tr("Zandor Designer %1\n\nDraw a query, read its SQL, run it. The database is "
+           "only read.")
+            .arg(QStringLiteral(ZANDOR_VERSION)));
 }
 
 } // namespace designer

@@ -1,35 +1,84 @@
 #pragma once
 
-#include "designer/OpenedQuery.h"
-#include "model/Library.h"
-#include "platform/qt/ZandorWidget.h"
+#include "designer/Arguments.h"
+#include "designer/DrawingArea.h"
+#include "designer/database/Database.h"
+#include "designer/document/Document.h"
+#include "designer/document/QueryFile.h"
+#include "designer/document/RecentFiles.h"
 
 #include <QMainWindow>
+#include <QSettings>
 
 namespace designer {
 
-/// The designer's window: the control over one query.
+class Autosave;
+class DatabaseCommands;
+class EventPanel;
+class FileDialogs;
+class ResultsPanel;
+class ShowCommands;
+class StatementPanel;
+class TableAdding;
+class TablesPanel;
+
+/// The designer's window: the drawing, and the panels around it.
 class DesignerWindow final : public QMainWindow {
     Q_OBJECT
 
 public:
-    /// The inner width of a new window in twips, for the arranging of tables.
-    static std::int32_t canvasWidth();
-
-    explicit DesignerWindow(const OpenedQuery& opened);
+    DesignerWindow();
     ~DesignerWindow() override;
 
-    ZandorWidget& designer() { return *mDesigner; }
+    /// Opens what the command line names: a database with the tables named, or a query with its
+    /// database. Nothing named opens the sample. Returns what went wrong; the window is empty then.
+    std::optional<QString> openAtFirst(const Arguments& arguments, const QString& sample);
+    /// Saves what is done from time to time, in a folder, and offers to go on with what a designer
+    /// that was killed has left there. To be called once the window stands.
+    void keepSafe(const QString& folder);
+
+    Document& document() { return mDocument; }
+    Database& database() { return mDatabase; }
+    DrawingArea& drawing() { return *mDrawing; }
+    ResultsPanel& results() { return *mResults; }
 
 protected:
-    bool eventFilter(QObject* watched, QEvent* event) override;
+    void closeEvent(QCloseEvent* event) override;
+    void dragEnterEvent(QDragEnterEvent* event) override;
+    void dropEvent(QDropEvent* event) override;
 
 private:
-    void fitCanvas(const QSize& visible);
+    void makePanels();
+    QDockWidget* dock(QWidget* panel, const QString& name, const QString& title,
+                      Qt::DockWidgetArea area);
+    void makeMenus();
+    void connectParts();
+    void restoreLayout();
+    void showTitle();
+    void showCounts();
+    void warnOfFullGrid();
+    void showOptions();
+    void renameTable();
+    void about();
 
-    model::Library mLibrary;
-    const platform::Ref<model::Query> mQuery;
-    ZandorWidget* mDesigner; ///< a child of the window
+    bool mWarnedOfFullGrid = false;
+    QSettings mSettings;
+    Document mDocument;
+    QueryFile mFile{mDocument};
+    RecentFiles mRecentQueries{mSettings, QStringLiteral("queries")};
+    RecentFiles mRecentDatabases{mSettings, QStringLiteral("databases")};
+    Database mDatabase;
+    // Children of the window.
+    DrawingArea* mDrawing;
+    TablesPanel* mTables;
+    StatementPanel* mStatement;
+    ResultsPanel* mResults;
+    EventPanel* mEvents;
+    TableAdding* mAdding;
+    FileDialogs* mFiles;
+    DatabaseCommands* mDatabases;
+    ShowCommands* mShow;
+    std::unique_ptr<Autosave> mAutosave;
 };
 
 } // namespace designer

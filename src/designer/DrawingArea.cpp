@@ -1,26 +1,13 @@
 #include "designer/DrawingArea.h"
 
+#include "designer/canvasSize.h"
 #include "designer/document/Document.h"
-#include "model/Layout.h"
-#include "platform/KeyedCollection.h"
 
 #include <QResizeEvent>
 
 #include <algorithm>
-#include <limits>
 
 namespace designer {
-
-namespace {
-
-constexpr int twipsPerPixel = 15;
-
-/// As much as the control's 16-bit sizes can say.
-int canvasSize(int twips) {
-    return std::clamp<int>(twips, 0, std::numeric_limits<std::int16_t>::max());
-}
-
-} // namespace
 
 DrawingArea::DrawingArea(Document& document, QWidget* parent)
     : QWidget(parent), mDocument(document) {
@@ -29,7 +16,10 @@ DrawingArea::DrawingArea(Document& document, QWidget* parent)
 }
 
 // The control leaves its library's objects behind, so it goes before the library.
-DrawingArea::~DrawingArea() { delete mControl; }
+DrawingArea::~DrawingArea() {
+    // Those that were shown before may still be there.
+    qDeleteAll(findChildren<ZandorWidget*>(Qt::FindDirectChildrenOnly));
+}
 
 void DrawingArea::setOptions(const QVariantMap& options) {
     mOptions = options;
@@ -80,21 +70,14 @@ void DrawingArea::resizeEvent(QResizeEvent* event) {
 
 /// Makes the canvas as large as its tables need, and never smaller than what can be seen of it.
 void DrawingArea::fitCanvas() {
-    int right = 0;
-    int bottom = 0;
-    for (const auto& table :
-         platform::Each<TalvikZandorLib::ZDTable>(mDocument.query()->Tables())) {
-        right = std::max(right, table->Left() + table->Width() + model::layout::margin);
-        bottom = std::max(bottom, table->Top() + table->Height() + model::layout::margin);
-    }
-    const int visibleWidth = width() * twipsPerPixel;
-    const int visibleHeight = height() * twipsPerPixel;
+    const QSize needed = canvasNeeded(*mDocument.query());
+    const QSize visible = size() * twipsPerPixel;
     // The grid covers the lower half, yet the control scrolls a canvas only when it is higher than
     // both halves together.
-    const int scrolling =
-        bottom > visibleHeight / 2 ? visibleHeight + twipsPerPixel : visibleHeight;
-    mControl->setMXHorzFrameSize(canvasSize(std::max(right, visibleWidth)));
-    mControl->setMXVertFrameSize(canvasSize(std::max(bottom, scrolling)));
+    const int scrolling = needed.height() > visible.height() / 2 ? visible.height() + twipsPerPixel
+                                                                 : visible.height();
+    mControl->setMXHorzFrameSize(canvasLength(std::max(needed.width(), visible.width())));
+    mControl->setMXVertFrameSize(canvasLength(std::max(needed.height(), scrolling)));
 }
 
 } // namespace designer

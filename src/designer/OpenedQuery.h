@@ -1,7 +1,9 @@
 #pragma once
 
-#include "designer/Arguments.h"
 #include "model/Query.h"
+#include "model/reader/DatabaseReader.h"
+
+#include <QStringList>
 
 namespace designer {
 
@@ -12,14 +14,20 @@ inline constexpr std::int32_t mostJoins = 64;
 /// A query over a database that was read, ready to be shown.
 struct OpenedQuery {
     platform::Ref<model::Query> query;
-    QString name;    ///< of the database, for the window's title
-    QString message; ///< what is in the query, and what was left out
+    QString message; ///< what of the database was left out, or empty
 };
 
-/// Reads the tables named, or chooses some: of the sample database those of the example, of
-/// another the first ones. `sample` is the file that an empty one stands for; `canvasWidth` is in
-/// twips.
-reader::Result<OpenedQuery> openQuery(const Arguments& arguments, const QString& sample,
-                                      std::int32_t canvasWidth);
+/// Which tables a new query begins with.
+struct FirstTables {
+    QStringList names = {}; ///< empty: the first ones
+    bool example = false;   ///< those of the example with its output columns, when no name is given
+    QString database = {};  ///< how messages call it
+    std::int32_t canvasWidth = 18000; ///< twips
+};
+
+/// Reads the tables that are wanted, with the joins between them. `present` are the database's.
+reader::Result<OpenedQuery> openQuery(reader::DatabaseReader& schema,
+                                      const std::vector<reader::TableEntry>& present,
+                                      const FirstTables& wanted);
 
 } // namespace designer

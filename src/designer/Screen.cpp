@@ -31,6 +31,9 @@ std::unique_ptr<QApplication> makeApplication(int& argc, char** argv, bool offsc
             QStringLiteral("qt.qpa.plugin=false\nqt.qpa.xcb=false\nqt.qpa.wayland=false"));
     }
     if (!previousHandler) previousHandler = qInstallMessageHandler(leaveOutRemarks);
+    // Where the settings and what is kept safe stand.
+    QCoreApplication::setOrganizationName(QStringLiteral("Zandor"));
+    QCoreApplication::setApplicationName(QStringLiteral("zandor-designer"));
     auto application = std::make_unique<QApplication>(argc, argv);
     if (!decided) {
         QLoggingCategory::setFilterRules({});

@@ -1,6 +1,8 @@
 #include "designer/Colours.h"
 #include "designer/DesignerWindow.h"
 #include "designer/Screen.h"
+#include "designer/document/AutosaveSlot.h"
+#include "designer/options/Languages.h"
 
 #include <QDir>
 #include <QPixmap>
@@ -49,14 +51,16 @@ int main(int argc, char** argv) {
     const auto arguments = designer::readArguments(argumentsOf(argc, argv));
     if (!arguments) return refuse(arguments.error());
     if (arguments->dark) designer::useDarkColours();
-    const auto opened = designer::openQuery(*arguments, QStringLiteral(ZANDOR_SAMPLE_DATABASE),
-                                            designer::DesignerWindow::canvasWidth());
-    if (!opened) return refuse(opened.error());
-
-    designer::DesignerWindow window(*opened);
+    designer::speak();
+    designer::DesignerWindow window;
+    if (const auto error = window.openAtFirst(*arguments, QStringLiteral(ZANDOR_SAMPLE_DATABASE)))
+        return refuse(*error);
     window.show();
     if (!arguments->picture.isEmpty()) return draw(window, arguments->picture);
-    if (!designer::isOffscreen()) return QApplication::exec();
+    if (!designer::isOffscreen()) {
+        window.keepSafe(designer::AutosaveSlot::standardFolder());
+        return QApplication::exec();
+    }
 
     const QString file = QDir::temp().filePath(QStringLiteral("zandor-designer.png"));
     const int result = draw(window, file);

@@ -1,5 +1,7 @@
 #include "model/Layout.h"
 
+#include "model/Columns.h"
+
 #include <algorithm>
 #include <cstdlib>
 #include <optional>
@@ -98,6 +100,7 @@ std::vector<Box> arrange(const std::vector<Size>& sizes, const std::vector<Link>
     const std::size_t count = sizes.size();
     std::vector<Box> boxes(count);
     if (count == 0) return boxes;
+    if (taken.empty()) return arrangeInColumns(sizes, links, canvasWidth);
 
     std::vector<std::vector<std::size_t>> neighbours(count + taken.size());
     for (const auto& [a, b] : links) {

@@ -31,10 +31,11 @@ Size fittedSize(std::size_t entries, std::size_t longestText);
 /// A pair of tables that a join connects: positions from 0 in `sizes`, or behind them in `taken`.
 using Link = std::pair<std::size_t, std::size_t>;
 
-/// Boxes for tables of these sizes, in their order, on a grid whose cells are as large as the
-/// largest table. Joined tables come near each other; no box comes closer to another or to one of
-/// `taken` than the distances above. The grid is as wide as `canvasWidth` allows (one column at
-/// least) and as deep as it needs.
+/// Boxes for tables of these sizes, in their order. Joined tables come near each other; no box
+/// comes closer to another or to one of `taken` than the distances above. They are as wide together
+/// as `canvasWidth` allows (one column at least) and as deep as they need. Where nothing is taken
+/// they stand in columns by their joins (arrangeInColumns); otherwise in the free cells, as large
+/// as the largest table, of a grid.
 std::vector<Box> arrange(const std::vector<Size>& sizes, const std::vector<Link>& links,
                          const std::vector<Box>& taken, std::int32_t canvasWidth);
 

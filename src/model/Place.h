@@ -54,6 +54,8 @@ public:
     /// tables.
     void require(const std::shared_ptr<const Tables>& tables) const;
 
+    friend bool operator==(const ColumnPlace&, const ColumnPlace&) = default;
+
 private:
     TablePlace mTable;
     String mKey;

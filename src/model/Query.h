@@ -1,5 +1,6 @@
 #pragma once
 
+#include "model/Change.h"
 #include "model/ColumnDefinition.h"
 #include "model/Description.h"
 #include "model/Join.h"
@@ -12,7 +13,8 @@ namespace model {
 /// held longer than the query, and then know nothing of each other.
 ///
 /// Keys are a letter and a number ("t1" tables, "c1" columns, "j1" joins, "x1" definitions) and are
-/// never given twice in a query, not even after the object was deleted.
+/// never given twice in a query, not even after the object was deleted. Only a change that is undone
+/// takes the keys back that it gave.
 class Query final : public TalvikZandorLib::Zandor {
 public:
     Query() = default;
@@ -57,7 +59,16 @@ public:
     /// fault.
     static Ref<Query> restored(const QueryRecord& record);
 
+    LastKeys lastKeys() const { return {mLastTable, mLastColumn, mLastJoin, mLastDefinition}; }
+    /// Makes what a Snapshot of this query found once more; reversed, it is undone. The query must
+    /// be as it was before the change (after it): error 5 when it is seen not to be, nothing
+    /// changes then.
+    void apply(const Change& change);
+
 private:
+    void set(const TableState& state);
+    void set(const JoinState& state);
+    void set(const DefinitionState& state);
     void restoreTable(const TableRecord& record);
     ColumnPlace restoredEnd(const EndRecord& record) const;
     /// Error 6 when there are no more numbers.

@@ -59,15 +59,19 @@ private:
                   "is not from 0 to " + std::to_string(greatestKeyNumber));
     }
 
-    void key(const String& key, char16_t letter, std::int32_t last, const std::string& path) {
+    /// One that was given, whether its object is still there or not.
+    void given(const String& key, char16_t letter, std::int32_t last, const std::string& path) {
         const auto number = keyNumber(key, letter);
         if (!number)
             fault(path, std::string("is not the letter ") + static_cast<char>(letter) +
                             " and a number from 1 to " + std::to_string(greatestKeyNumber));
         else if (*number > last)
             fault(path, "is beyond the last key " + std::to_string(last) + " of its kind");
-        else if (!mKeys.insert(key).second)
-            fault(path, "is used before already");
+    }
+
+    void key(const String& key, char16_t letter, std::int32_t last, const std::string& path) {
+        given(key, letter, last, path);
+        if (!mFault && !mKeys.insert(key).second) fault(path, "is used before already");
     }
 
     void table(const TableRecord& table, const std::string& path) {
@@ -117,6 +121,26 @@ private:
                       n == 0 ? "is less than the first row, " + std::to_string(Criteria::firstRow)
                              : "does not come behind the row before it");
             before = row;
+            names(definition.criteria[n], path + at("criteria", n));
+        }
+    }
+
+    void names(const CriterionRecord& criterion, const std::string& path) {
+        std::int32_t end = 0;
+        for (std::size_t n = 0; n < criterion.names.size() && !mFault; ++n) {
+            const NameRecord& name = criterion.names[n];
+            const std::string place = path + at("names", n);
+            const bool inOrder = name.begin >= end && name.tableEnd >= name.begin;
+            if (!inOrder || static_cast<std::size_t>(name.tableEnd) > criterion.text.size())
+                fault(place + "at", "is no place in the text behind the name before it");
+            end = name.tableEnd;
+            if (name.table.empty() && name.column.empty()) continue;
+            given(name.table, u't', mRecord.lastKeys.table, place + "table");
+            given(name.column, u'c', mRecord.lastKeys.column, place + "column");
+            const auto column = mTableOf.find(name.column);
+            const bool gone = column == mTableOf.end() && !mKeys.contains(name.table);
+            if (!gone && (column == mTableOf.end() || column->second != name.table))
+                fault(place + "column", "is the key of no column of that table");
         }
     }
 

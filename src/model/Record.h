@@ -52,9 +52,21 @@ struct JoinRecord {
     friend bool operator==(const JoinRecord&, const JoinRecord&) = default;
 };
 
+/// What a name in a criterion's text means (see criteria::Reference). The keys may be those of a
+/// table that is gone; both are empty for what was no name of a column when it was typed.
+struct NameRecord {
+    std::int32_t begin = 0;
+    std::int32_t tableEnd = 0;
+    String table = {};
+    String column = {};
+
+    friend bool operator==(const NameRecord&, const NameRecord&) = default;
+};
+
 struct CriterionRecord {
     std::int16_t row = 0;
     String text = {};
+    std::vector<NameRecord> names = {}; ///< known by now, in the order of the text
 
     friend bool operator==(const CriterionRecord&, const CriterionRecord&) = default;
 };

@@ -41,6 +41,15 @@ JoinRecord recordOf(const Join& join) {
             join.CompareOperator()};
 }
 
+std::vector<NameRecord> recordOf(const criteria::References& references) {
+    std::vector<NameRecord> names;
+    for (const criteria::Reference& reference : references)
+        names.push_back({static_cast<std::int32_t>(reference.begin),
+                         static_cast<std::int32_t>(reference.tableEnd),
+                         reference.column.table().key(), reference.column.key()});
+    return names;
+}
+
 DefinitionRecord recordOf(const ColumnDefinition& definition) {
     DefinitionRecord record{.key = definition.Key(),
                             .column = recordOf(definition.place()).column,
@@ -49,7 +58,7 @@ DefinitionRecord recordOf(const ColumnDefinition& definition) {
                             .visible = definition.Visible(),
                             .criteria = {}};
     for (const auto& [row, criterium] : definition.criteria().rows())
-        record.criteria.push_back({row, criterium->Criterium()});
+        record.criteria.push_back({row, criterium->Criterium(), recordOf(criterium->references())});
     return record;
 }
 
@@ -57,7 +66,7 @@ DefinitionRecord recordOf(const ColumnDefinition& definition) {
 
 QueryRecord Query::record() const {
     QueryRecord record;
-    record.lastKeys = {mLastTable, mLastColumn, mLastJoin, mLastDefinition};
+    record.lastKeys = lastKeys();
     for (const auto& table : Each<ZDTable>(*mTables))
         record.tables.push_back(recordOf(static_cast<Table&>(*table)));
     for (const auto& join : Each<ZDJoin>(mJoins))
@@ -95,8 +104,16 @@ Ref<Query> Query::restored(const QueryRecord& record) {
         definition->mSortOrder = from.sortOrder;
         definition->mVisible = from.visible;
         definition->mKey = from.key;
-        for (const CriterionRecord& criterion : from.criteria)
+        for (const CriterionRecord& criterion : from.criteria) {
             definition->AddCriterium(criterion.text, platform::decimal(criterion.row));
+            criteria::References references;
+            for (const NameRecord& name : criterion.names)
+                references.push_back(
+                    {static_cast<std::size_t>(name.begin), static_cast<std::size_t>(name.tableEnd),
+                     name.column.empty() ? ColumnPlace()
+                                         : query->restoredEnd({name.table, name.column})});
+            definition->criteria().rows().at(criterion.row)->tie(criterion.text, references);
+        }
         query->mDefinitions.Add(definition, from.key);
     }
     return query;

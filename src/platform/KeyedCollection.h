@@ -32,6 +32,14 @@ public:
         mItems.push_back({key, std::move(item)});
     }
 
+    /// The item then has this 1-based position: error 9 outside 1 to Count + 1, error 457 when the
+    /// key is taken; nothing is added then.
+    void Insert(std::int32_t position, Ref<T> item, const String& key) {
+        if (position < 1 || position > Count() + 1) throw errors::subscriptOutOfRange();
+        if (Contains(key)) throw errors::duplicateKey();
+        mItems.insert(mItems.begin() + (position - 1), {key, std::move(item)});
+    }
+
     void Remove(const String& key) override {
         const auto at = find(key);
         if (at == mItems.end()) throw errors::invalidProcedureCall();

@@ -57,6 +57,17 @@ TEST_F(AKeyedCollection, FindsByKeyToTheCase) {
     EXPECT_EQ(errorNumber([&] { items.Item(u"A"); }), 5);
 }
 
+TEST_F(AKeyedCollection, TakesAnItemAtAnyPositionUpToBehindTheLast) {
+    items.Insert(1, makeRef<int>(1), u"x");
+    items.Insert(5, makeRef<int>(9), u"y");
+    EXPECT_EQ(walked(), (std::vector{1, 30, 10, 20, 9}));
+    EXPECT_EQ(*items.Item(u"x"), 1);
+    for (const std::int32_t position : {0, 7})
+        EXPECT_EQ(errorNumber([&] { items.Insert(position, makeRef<int>(5), u"z"); }), 9);
+    EXPECT_EQ(errorNumber([&] { items.Insert(1, makeRef<int>(5), u"y"); }), 457);
+    EXPECT_EQ(items.Count(), 5);
+}
+
 TEST_F(AKeyedCollection, RefusesAKeyThatIsTakenAndStaysAsItWas) {
     EXPECT_EQ(errorNumber([&] { items.Add(makeRef<int>(99), u"a"); }), 457);
     EXPECT_EQ(walked(), (std::vector{30, 10, 20}));

@@ -1,6 +1,5 @@
-#include "Databases.h"
-
-#include "designer/DesignerWindow.h"
+#include "designer/DrawingArea.h"
+#include "designer/document/Document.h"
 
 #include <gtest/gtest.h>
 
@@ -10,52 +9,63 @@ namespace {
 
 constexpr int twipsPerPixel = 15;
 
-/// A query of one table that stands and ends where the test says.
-designer::OpenedQuery oneTable(std::int32_t left, std::int32_t top) {
-    const auto opened = openedSample({{}, {"orders"}, {}, false});
-    const auto table = opened.query->Tables().Item(1);
-    table->Left(static_cast<float>(left));
-    table->Top(static_cast<float>(top));
-    table->Width(2000);
-    table->Height(2000);
-    return opened;
-}
+/// The drawing of one table that stands where the test says.
+class TheDesignersCanvas : public testing::Test {
+protected:
+    void show(float left, float top, QSize size) {
+        const auto query = platform::makeRef<model::Query>();
+        const auto table = query->addTable({{}, u"orders", {{u"id"}}});
+        table->Left(left);
+        table->Top(top);
+        table->Width(2000);
+        table->Height(2000);
+        document.setQuery(query);
+        area.resize(size);
+        area.show();
+        QCoreApplication::processEvents();
+    }
 
-void resizeTo(designer::DesignerWindow& window, int width, int height) {
-    window.resize(width, height);
-    window.show();
-    QCoreApplication::processEvents();
-}
+    ZandorWidget& control() { return area.control(); }
+
+    designer::Document document;
+    designer::DrawingArea area{document};
+};
 
 } // namespace
 
-TEST(TheDesignersCanvas, IsAsLargeAsWhatCanBeSeenOfIt) {
-    designer::DesignerWindow window(oneTable(300, 300));
-    resizeTo(window, 1300, 900);
-    EXPECT_EQ(window.designer().MXHorzFrameSize(), 1300 * twipsPerPixel);
-    EXPECT_EQ(window.designer().MXVertFrameSize(), window.designer().height() * twipsPerPixel);
-    EXPECT_EQ(window.designer().HorizMaxScrollPos(), 0);
-    EXPECT_EQ(window.designer().VertMaxScrollPos(), 0);
+TEST_F(TheDesignersCanvas, IsAsLargeAsWhatCanBeSeenOfIt) {
+    show(300, 300, {1300, 900});
+    EXPECT_EQ(control().MXHorzFrameSize(), 1300 * twipsPerPixel);
+    EXPECT_EQ(control().MXVertFrameSize(), 900 * twipsPerPixel);
+    EXPECT_EQ(control().HorizMaxScrollPos(), 0);
+    EXPECT_EQ(control().VertMaxScrollPos(), 0);
 }
 
-TEST(TheDesignersCanvas, ReachesATableBeyondTheRightEdge) {
-    designer::DesignerWindow window(oneTable(25000, 300));
-    resizeTo(window, 1200, 800);
-    EXPECT_EQ(window.designer().MXHorzFrameSize(), 25000 + 2000 + 300);
-    EXPECT_EQ(window.designer().HorizMaxScrollPos(), 27300 - 1200 * twipsPerPixel);
+TEST_F(TheDesignersCanvas, ReachesATableBeyondTheRightEdge) {
+    show(25000, 300, {1200, 800});
+    EXPECT_EQ(control().MXHorzFrameSize(), 25000 + 2000 + 300);
+    EXPECT_EQ(control().HorizMaxScrollPos(), 27300 - 1200 * twipsPerPixel);
 }
 
-TEST(TheDesignersCanvas, CanBeScrolledToATableBehindTheGrid) {
-    designer::DesignerWindow window(oneTable(300, 7000));
-    resizeTo(window, 1200, 800);
-    const int upperHalf = window.designer().height() * twipsPerPixel / 2;
+TEST_F(TheDesignersCanvas, CanBeScrolledToATableBehindTheGrid) {
+    show(300, 7000, {1200, 800});
+    const int upperHalf = 800 * twipsPerPixel / 2;
     ASSERT_GT(7000 + 2000, upperHalf);
-    EXPECT_GE(window.designer().VertMaxScrollPos(), 7000 + 2000 - upperHalf);
+    EXPECT_GE(control().VertMaxScrollPos(), 7000 + 2000 - upperHalf);
 }
 
-TEST(TheDesignersCanvas, EndsWhereTheControlsNumbersEnd) {
-    designer::DesignerWindow window(oneTable(40000, 50000));
-    resizeTo(window, 1200, 800);
-    EXPECT_EQ(window.designer().MXHorzFrameSize(), 32767);
-    EXPECT_EQ(window.designer().MXVertFrameSize(), 32767);
+TEST_F(TheDesignersCanvas, EndsWhereTheControlsNumbersEnd) {
+    show(40000, 50000, {1200, 800});
+    EXPECT_EQ(control().MXHorzFrameSize(), 32767);
+    EXPECT_EQ(control().MXVertFrameSize(), 32767);
+}
+
+TEST_F(TheDesignersCanvas, StaysWhereItIsScrolledToWhenTheDrawingIsShownAnew) {
+    show(25000, 15000, {1200, 800});
+    control().setHorizontalScrollbarPos(3000);
+    control().setVerticalScrollbarPos(2000);
+    emit document.outdated();
+    EXPECT_EQ(control().HorizontalScrollbarPos(), 3000);
+    EXPECT_EQ(control().VerticalScrollbarPos(), 2000);
+    EXPECT_EQ(area.canvasPlace({10, 20}), QPoint(3000 + 150, 2000 + 300));
 }

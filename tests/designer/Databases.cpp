@@ -1,6 +1,6 @@
 #include "Databases.h"
 
-#include "designer/DesignerWindow.h"
+#include "designer/database/Database.h"
 
 #include <gtest/gtest.h>
 
@@ -11,14 +11,21 @@
 
 QString sampleDatabase() { return QStringLiteral(ZANDOR_SAMPLE_DATABASE); }
 
-designer::OpenedQuery openedSample(const designer::Arguments& arguments) {
+designer::OpenedQuery openedSample(const QStringList& tables) {
     const auto opened =
-        designer::openQuery(arguments, sampleDatabase(), designer::DesignerWindow::canvasWidth());
+        openDatabaseFile(sampleDatabase(), {.names = tables, .example = tables.isEmpty()});
     if (!opened) {
         ADD_FAILURE() << opened.error().toStdString();
-        return {platform::makeRef<model::Query>(), {}, {}};
+        return {platform::makeRef<model::Query>(), {}};
     }
     return *opened;
+}
+
+reader::Result<designer::OpenedQuery> openDatabaseFile(const QString& file,
+                                                       const designer::FirstTables& wanted) {
+    designer::Database database;
+    if (const auto error = database.open(file)) return reader::Error{*error};
+    return designer::openQuery(database.reader(), database.tables(), wanted);
 }
 
 QString DatabaseFolder::database(const QString& name, const QStringList& statements) {

@@ -9,9 +9,12 @@
 /// The sample database, and folders with databases of a test's own.
 QString sampleDatabase();
 
-/// The query that the designer opens with these arguments over the sample; fails the test when it
-/// opens none.
-designer::OpenedQuery openedSample(const designer::Arguments& arguments = {});
+/// The query that the designer opens with over the sample, or one of these tables; fails the test
+/// when it opens none.
+designer::OpenedQuery openedSample(const QStringList& tables = {});
+/// The query that the designer opens with over a database.
+reader::Result<designer::OpenedQuery> openDatabaseFile(const QString& file,
+                                                       const designer::FirstTables& wanted = {});
 
 class DatabaseFolder {
 public:

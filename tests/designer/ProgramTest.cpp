@@ -98,14 +98,14 @@ TEST(TheDesignerProgram, DrawsItsWindowIntoAPicture) {
     const Ended ended = run({"--picture", folder.path("window.png")});
     EXPECT_EQ(ended.code, 0) << ended.err;
     EXPECT_EQ(ended.err, "");
-    EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(1200, 800));
+    EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(1340, 800));
 }
 
 TEST(TheDesignerProgram, DrawsATwiceAsLargePictureOnATwiceAsFineScreen) {
     DatabaseFolder folder;
     const Ended ended = run({"--picture", folder.path("window.png")}, {{"QT_SCALE_FACTOR", "2"}});
     EXPECT_EQ(ended.code, 0) << ended.err;
-    EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(2400, 1600));
+    EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(2680, 1600));
 }
 
 TEST(TheDesignerProgram, DrawsDarkColoursWhenAskedTo) {
@@ -130,7 +130,7 @@ TEST(TheDesignerProgram, DrawsAPictureWhenThereIsNoDisplay) {
     EXPECT_EQ(ended.err, "");
     EXPECT_THAT(ended.out, StartsWith("No display can be reached"));
     EXPECT_THAT(ended.out, HasSubstr("\n" + folder.path("zandor-designer.png").toStdString()));
-    EXPECT_EQ(QImage(folder.path("zandor-designer.png")).size(), QSize(1200, 800));
+    EXPECT_EQ(QImage(folder.path("zandor-designer.png")).size(), QSize(1340, 800));
 }
 
 TEST(TheDesignerProgram, DrawsAPictureWhenTheDisplayCannotBeReached) {

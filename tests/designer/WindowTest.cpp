@@ -22,22 +22,24 @@ namespace {
 
 class TheDesignersWindow : public testing::Test {
 protected:
-    void show(const designer::OpenedQuery& opened) {
-        window = std::make_unique<designer::DesignerWindow>(opened);
+    void open(const designer::Arguments& arguments = {}) {
+        window = std::make_unique<designer::DesignerWindow>();
+        const auto error = window->openAtFirst(arguments, sampleDatabase());
+        EXPECT_EQ(error.value_or(QString()), QString());
         window->show();
         QCoreApplication::processEvents();
     }
 
     template <class Widget>
     Widget& part(const QString& name) {
-        for (QWidget* widget : window->findChildren<QWidget*>(name))
+        for (QWidget* widget : window->drawing().control().findChildren<QWidget*>(name))
             if (auto* found = dynamic_cast<Widget*>(widget)) return *found;
         throw std::runtime_error("no part " + name.toStdString());
     }
 
     std::vector<std::string> shownTables() {
         std::vector<std::string> titles;
-        for (QWidget* widget : window->findChildren<QWidget*>())
+        for (QWidget* widget : window->drawing().control().findChildren<QWidget*>())
             if (const auto* table = dynamic_cast<TabuletWidget*>(widget);
                 table && table->isVisible())
                 titles.push_back(table->title().toStdString());
@@ -65,15 +67,15 @@ protected:
 } // namespace
 
 TEST_F(TheDesignersWindow, ShowsTheTablesOfTheQuery) {
-    show(openedSample());
+    open();
     EXPECT_THAT(shownTables(), UnorderedElementsAre("customers", "orders", "order_lines",
                                                     "products", "categories"));
 }
 
 TEST_F(TheDesignersWindow, ShowsEachJoinAsALineBetweenTwoMarks) {
-    show(openedSample({{}, {"customers", "orders", "products"}, {}, false}));
+    open({.tables = {"customers", "orders", "products"}});
     EXPECT_THAT(paintedItems(), UnorderedElementsAre("linJoin(1)", "shpJoin(1)", "shpJoin(2)"));
-    show(openedSample());
+    open();
     EXPECT_THAT(paintedItems(),
                 UnorderedElementsAre("linJoin(1)", "linJoin(2)", "linJoin(3)", "linJoin(4)",
                                      "shpJoin(1)", "shpJoin(2)", "shpJoin(3)", "shpJoin(4)",
@@ -81,7 +83,7 @@ TEST_F(TheDesignersWindow, ShowsEachJoinAsALineBetweenTwoMarks) {
 }
 
 TEST_F(TheDesignersWindow, ShowsTheOutputColumnsOfTheExample) {
-    show(openedSample());
+    open();
     EXPECT_TRUE(part<GridWidget>("sprColumn").isVisible());
     EXPECT_THAT(gridColumn(0),
                 ElementsAre("Field:", "Synonym:", "Sort:", "Visible:", "Criteria:", "Or:"));
@@ -95,26 +97,26 @@ TEST_F(TheDesignersWindow, ShowsTheOutputColumnsOfTheExample) {
 }
 
 TEST_F(TheDesignersWindow, ShowsAnEmptyGridForAQueryWithoutOutputColumns) {
-    show(openedSample({{}, {"orders"}, {}, false}));
+    open({.tables = {"orders"}});
     EXPECT_TRUE(part<GridWidget>("sprColumn").isVisible());
     EXPECT_EQ(gridColumn(1), std::vector<std::string>(6));
 }
 
 TEST_F(TheDesignersWindow, NamesTheDatabaseAndSaysWhatIsInTheQuery) {
-    show(openedSample());
-    EXPECT_EQ(window->windowTitle(), QStringLiteral("trading.sqlite \u2014 Zandor Designer"));
-    EXPECT_EQ(window->statusBar()->findChild<QLabel*>()->text(), "5 tables, 4 joins");
-    EXPECT_EQ(window->size(), QSize(1200, 800));
+    open();
+    EXPECT_EQ(window->windowTitle(),
+              QStringLiteral("Untitled[*] \u2014 trading.sqlite \u2014 Zandor Designer"));
+    EXPECT_EQ(window->statusBar()->findChild<QLabel*>("counts")->text(), "Tables: 5   Joins: 4");
 }
 
 TEST_F(TheDesignersWindow, ShowsNoTraceBoxesAndNoReports) {
-    show(openedSample());
-    EXPECT_EQ(window->designer().DebugSwitch(), 0);
+    open();
+    EXPECT_EQ(window->drawing().control().DebugSwitch(), 0);
     EXPECT_EQ(QApplication::activeModalWidget(), nullptr);
 }
 
 TEST_F(TheDesignersWindow, BindsTheWholeSample) {
-    show(openedSample({sampleDatabase(), {}, {}, false}));
+    open({.file = sampleDatabase()});
     EXPECT_EQ(shownTables().size(), 16U);
     EXPECT_EQ(paintedItems().size(), 3U * 19U);
 }

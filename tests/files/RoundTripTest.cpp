@@ -122,3 +122,42 @@ TEST(ASavedQuery, IsRefusedWhenItCouldNotBeReadAgain) {
     definition->Synonym(std::u16string(100'000, u'\u00e4'));
     EXPECT_TRUE(files::toJson(small.query));
 }
+
+TEST(ASavedQuery, RemembersItsDatabase) {
+    SmallQuery small;
+    files::QueryDocument document(small.query);
+    EXPECT_EQ(jsonOf(document).find("database"), std::string::npos);
+    document.database = u"postgresql://ann@host/tr\u00e4de";
+    const auto loaded = documentOf(jsonOf(document));
+    EXPECT_EQ(loaded.database, document.database);
+    EXPECT_FALSE(loaded.unknown) << "it is known";
+}
+
+TEST(ASavedQuery, KnowsWhatTheNamesInItsCriteriaMeant) {
+    SmallQuery small;
+    const auto definition = small.query->AddColumnDefinition(small.newDefinition(small.orders));
+    definition->AddCriterium(u"> customers.id And < [limit]", u"4");
+    small.query->DeleteTable(small.customers);
+    small.query->addTable(SmallQuery::described(u"customers"));
+    small.query->addTable({u"", u"limits", {{u"limit", model::ColumnType::Integer}}});
+
+    const auto loaded = documentOf(jsonOf(small.query)).query;
+    EXPECT_EQ(loaded->record(), small.query->record());
+    loaded->renameTable(loaded->tableNamed(u"customers"), u"buyers");
+    loaded->renameTable(loaded->tableNamed(u"limits"), u"bounds");
+    EXPECT_EQ(loaded->ColumnDefinitions().Item(1)->Criteria().Item(u"4")->Criterium(),
+              u"> customers.id And < [limit]")
+        << "neither the new table nor the new column was meant";
+}
+
+TEST(ASavedQuery, LetsACriterionFollowItsTableAfterLoading) {
+    SmallQuery small;
+    const auto definition = small.query->AddColumnDefinition(small.newDefinition(small.orders));
+    definition->AddCriterium(u"> customers.id", u"4");
+    small.query->renameTable(small.orders, u"sales"); // ties the names
+    const auto loaded = documentOf(jsonOf(small.query)).query;
+    ASSERT_EQ(loaded->record().definitions[0].criteria[0].names.size(), 1u);
+    loaded->renameTable(loaded->tableNamed(u"customers"), u"buyers");
+    EXPECT_EQ(loaded->ColumnDefinitions().Item(1)->Criteria().Item(u"4")->Criterium(),
+              u"> buyers.id");
+}

@@ -4,11 +4,12 @@
 
 #include <stdexcept>
 
-Designer::Designer(Screen& screen)
-    : mScreen(screen),
-      mProgram(QStringLiteral(ZANDOR_JOURNEY_HOST), {QStringLiteral(ZANDOR_SAMPLE_DATABASE)},
-               {screen.variable(), "QT_QPA_PLATFORM=xcb", "QT_SCALE_FACTOR=1",
-                "QT_STYLE_OVERRIDE=fusion"}) {
+Designer::Designer(Screen& screen, const QString& program, const QStringList& arguments,
+                   const QStringList& environment)
+    : mScreen(screen), mProgram(program, arguments,
+                                QStringList{screen.variable(), "QT_QPA_PLATFORM=xcb",
+                                            "QT_SCALE_FACTOR=1", "QT_STYLE_OVERRIDE=fusion"} +
+                                    environment) {
     await(QStringLiteral("the window is active"),
           [this] { return !ask(QStringLiteral("active")).isEmpty(); });
 }

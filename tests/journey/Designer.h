@@ -6,7 +6,9 @@
 /// pointed at is waited for first.
 class Designer {
 public:
-    explicit Designer(Screen& screen);
+    /// Starts a program that answers as Host.h says.
+    Designer(Screen& screen, const QString& program, const QStringList& arguments,
+             const QStringList& environment = {});
 
     QStringList ask(const QString& question);
     QStringList events() { return ask(QStringLiteral("events")); }
@@ -33,6 +35,10 @@ public:
     /// Saves what the window shows as a file of this name, without suffix.
     void picture(const QString& name);
     bool quit();
+    /// Whether it has ended by itself, and well.
+    bool endsWell() { return mProgram.endsWell(); }
+    /// As a power failure would.
+    void kill() { mProgram.kill(); }
 
 private:
     Screen& mScreen;

@@ -17,7 +17,8 @@ namespace {
 class AJourney : public testing::Test {
 protected:
     Screen screen;
-    Designer designer{screen};
+    Designer designer{
+        screen, QStringLiteral(ZANDOR_JOURNEY_HOST), {QStringLiteral(ZANDOR_SAMPLE_DATABASE)}};
 
     void joinTwoTables() {
         designer.click("entry customers country_code");

@@ -48,6 +48,11 @@ bool Program::endsWell() {
            mProcess.exitCode() == 0;
 }
 
+void Program::kill() {
+    mProcess.kill();
+    mProcess.waitForFinished();
+}
+
 void await(const QString& what, const std::function<bool()>& holds) {
     const QDeadlineTimer end(patience);
     while (!holds()) {

@@ -21,6 +21,8 @@ public:
     QString line();
     /// Whether it has ended by itself with 0; waits for it.
     bool endsWell();
+    /// Ends it at once, without a word to it.
+    void kill();
 
 private:
     QProcess mProcess;

@@ -110,3 +110,59 @@ TEST(TheLayout, PutsANewTableBesideATakenOneItIsJoinedTo) {
 TEST(TheLayout, IgnoresAJoinOfATableWithItself) {
     EXPECT_TRUE(apart(arrange({cell, cell}, {{0, 0}}, {}, 13000)));
 }
+
+TEST(TheLayout, PutsJoinedTablesIntoDifferentColumns) {
+    // Three tables that are all joined to one another, and one more at each.
+    const std::vector<Link> links = {{0, 1}, {1, 2}, {0, 2}, {0, 3}, {1, 4}, {2, 5}};
+    const auto boxes = arrange(std::vector<Size>(6, cell), links, {}, 4 * 3200);
+    for (const auto& [a, b] : links) EXPECT_NE(boxes[a].left, boxes[b].left) << a << " " << b;
+}
+
+TEST(TheLayout, PutsAChainIntoNeighbouringColumnsAsFarAsTheyGo) {
+    const auto boxes = arrange(std::vector<Size>(4, cell), {{2, 0}, {0, 3}, {3, 1}}, {}, 4 * 3200);
+    for (const Box& box : boxes) EXPECT_EQ(box.top, 300);
+    EXPECT_EQ(std::abs(boxes[2].left - boxes[0].left), 3200);
+    EXPECT_EQ(std::abs(boxes[0].left - boxes[3].left), 3200);
+    EXPECT_EQ(std::abs(boxes[3].left - boxes[1].left), 3200);
+}
+
+TEST(TheLayout, LeadsNoLineBelowATableWhereItCanGoBesideIt) {
+    // Two hubs with four tables each, joined to each other.
+    std::vector<Link> links = {{0, 1}};
+    for (std::size_t n = 2; n < 6; ++n) links.emplace_back(0, n);
+    for (std::size_t n = 6; n < 10; ++n) links.emplace_back(1, n);
+    const auto boxes = arrange(std::vector<Size>(10, cell), links, {}, 4 * 3200);
+    for (const auto& [a, b] : links) EXPECT_EQ(std::abs(boxes[a].left - boxes[b].left), 3200);
+}
+
+TEST(TheLayout, PutsTablesWithoutJoinsBelow) {
+    const auto boxes = arrange(std::vector<Size>(5, cell), {{0, 4}, {4, 2}}, {}, 3 * 3200);
+    for (const std::size_t joined : {0, 2, 4}) EXPECT_EQ(boxes[joined].top, 300);
+    for (const std::size_t alone : {1, 3}) EXPECT_GT(boxes[alone].top, 2300);
+}
+
+TEST(TheLayout, UsesOneColumnMoreWhereNarrowTablesLeaveRoomForIt) {
+    std::vector<Size> sizes(5, Size{1800, 1500});
+    sizes[2].width = 3300; // would allow three of its kind
+    const auto boxes = arrange(sizes, {{0, 1}, {1, 2}, {2, 3}}, {}, 15000);
+    EXPECT_EQ(boxes[0].top, boxes[3].top);
+    for (const Box& box : boxes) EXPECT_LE(box.left + box.width, 15000 - 300);
+    EXPECT_TRUE(apart(boxes));
+}
+
+TEST(TheLayout, OfTheSameTablesIsAlwaysTheSame) {
+    std::vector<Link> links;
+    for (std::size_t n = 1; n < 16; ++n) links.emplace_back(n, n * 7 % n);
+    const auto once = arrange(std::vector<Size>(16, cell), links, {}, 16000);
+    const auto again = arrange(std::vector<Size>(16, cell), links, {}, 16000);
+    for (std::size_t n = 0; n < 16; ++n) {
+        EXPECT_EQ(once[n].left, again[n].left);
+        EXPECT_EQ(once[n].top, again[n].top);
+    }
+}
+
+TEST(TheLayout, OfVeryManyTablesComesToAnEnd) {
+    std::vector<Link> links;
+    for (std::size_t n = 1; n < 400; ++n) links.emplace_back(n, n / 3);
+    EXPECT_TRUE(apart(arrange(std::vector<Size>(400, cell), links, {}, 16000)));
+}

@@ -40,19 +40,61 @@ QString programOf(const QString& name) {
 PostgresServer::PostgresServer() : mDirectory(QStringLiteral("/tmp/zandor-postgres-XXXXXX")) {
     if (!mDirectory.isValid()) throw std::runtime_error(mDirectory.errorString().toStdString());
     makeDirectory();
+    start();
+    waitUntilItAnswers();
+}
+
+void PostgresServer::start() {
     const QString home = mDirectory.path();
     launch(mServer, QStringLiteral("postgres"),
            {QStringLiteral("-D"), home + QStringLiteral("/data"), QStringLiteral("-k"), home,
             QStringLiteral("-c"), QStringLiteral("listen_addresses="), QStringLiteral("-c"),
             QStringLiteral("fsync=off")});
-    waitUntilItAnswers();
 }
 
 PostgresServer::~PostgresServer() {
     if (mServer.state() == QProcess::NotRunning) return;
-    kill(static_cast<pid_t>(mServer.processId()), SIGINT); // ends the sessions that there are
+    ::kill(static_cast<pid_t>(mServer.processId()), SIGINT); // ends the sessions that there are
     if (!mServer.waitForFinished(patience)) mServer.kill();
     mServer.waitForFinished();
+}
+
+void PostgresServer::kill() {
+    mServer.kill();
+    mServer.waitForFinished(patience);
+}
+
+void PostgresServer::restart() {
+    // It ends again as long as a session of the one before has not seen that this is gone.
+    const QDeadlineTimer end(patience);
+    do start();
+    while (!answersBeforeItEnds() && !end.hasExpired());
+    waitUntilItAnswers();
+}
+
+void PostgresServer::requirePassword(const QString& user) {
+    QFile rules(mDirectory.filePath(QStringLiteral("data/pg_hba.conf")));
+    if (!rules.open(QIODevice::ReadWrite))
+        throw std::runtime_error(rules.errorString().toStdString());
+    const QByteArray before = rules.readAll();
+    rules.seek(0); // the first rule that fits counts
+    rules.write("local all " + user.toUtf8() + " scram-sha-256\n" + before);
+    rules.close();
+    ::kill(static_cast<pid_t>(mServer.processId()), SIGHUP);
+    const QString probe = QStringLiteral("postgres-probe");
+    const QDeadlineTimer end(patience);
+    for (bool enters = true; enters;) {
+        if (end.hasExpired()) throw std::runtime_error("the server still asks for no password");
+        QThread::msleep(20);
+        {
+            QSqlDatabase database = QSqlDatabase::addDatabase(QStringLiteral("QPSQL"), probe);
+            database.setHostName(folder());
+            database.setUserName(user);
+            database.setDatabaseName(QStringLiteral("postgres"));
+            enters = database.open();
+        }
+        QSqlDatabase::removeDatabase(probe);
+    }
 }
 
 void PostgresServer::launch(QProcess& process, const QString& program,
@@ -86,15 +128,22 @@ void PostgresServer::makeDirectory() {
 }
 
 void PostgresServer::waitUntilItAnswers() {
+    if (!answersBeforeItEnds())
+        fail(QStringLiteral("The PostgreSQL server does not answer"), mServer);
+}
+
+bool PostgresServer::answersBeforeItEnds() {
     const QDeadlineTimer end(patience);
     const QString probe = QStringLiteral("postgres-probe");
     for (bool answers = false; !answers;) {
-        if (mServer.waitForFinished(0) || end.hasExpired())
-            fail(QStringLiteral("The PostgreSQL server does not answer"), mServer);
+        if (mServer.waitForFinished(0) || mServer.state() == QProcess::NotRunning ||
+            end.hasExpired())
+            return false;
         QThread::msleep(50);
         answers = connect(probe).isOpen();
         QSqlDatabase::removeDatabase(probe);
     }
+    return true;
 }
 
 QSqlDatabase PostgresServer::connect(const QString& connectionName) const {

@@ -1,15 +1,21 @@
 #pragma once
 
+#include "designer/database/RememberingReader.h"
 #include "model/reader/Connection.h"
-#include "model/reader/DatabaseReader.h"
 #include "model/sql/Dialect.h"
 
+#include <QMutex>
 #include <QObject>
 
+#include <functional>
 #include <memory>
 #include <optional>
 
 namespace designer {
+
+/// Makes a connection to one database; keeps what it needs for it, so that it may be taken along to
+/// another thread.
+using Connector = std::function<reader::Result<reader::Connection>()>;
 
 /// The database that the designer works on: what is in it for the panels, and connections to it.
 /// The password is kept in memory only.
@@ -17,44 +23,63 @@ class Database final : public QObject {
     Q_OBJECT
 
 public:
+    using Tables = std::vector<reader::TableEntry>;
+
     explicit Database(QObject* parent = nullptr);
     ~Database() override;
 
     /// Opens another database (see reader::openDatabase) in place of the one before and reads the
-    /// list of its tables; emits opened(). On an error the one before stays. Returns what went
-    /// wrong.
+    /// list of its tables; emits opened(). A password in the address is taken out of it. On an
+    /// error the one before stays. Returns what went wrong. Waits for the server: windows call
+    /// openPatiently() instead.
     std::optional<QString> open(const QString& address, const QString& password = {});
-    /// Connects afresh to the same database and reads the list of its tables again; emits opened().
+    /// The same with a list of tables that was read already.
+    std::optional<QString> open(const QString& address, const QString& password, Tables tables);
+    /// Connects afresh to the same database and reads everything again; emits opened().
     std::optional<QString> renew();
-    bool isOpen() const;
+    std::optional<QString> renew(Tables tables);
+    bool isOpen() const { return mConnection.has_value(); }
 
     /// Path or URL, never with a password; empty before the first open().
     const QString& address() const { return mAddress; }
     /// For titles: the file's or database's name.
     QString name() const;
     model::sql::Dialect dialect() const;
+    /// Whether it is behind a network, and reading may take its time.
+    bool isServer() const;
     /// Tables and views in the order of their names.
-    const std::vector<reader::TableEntry>& tables() const { return mTables; }
-    /// Only while isOpen().
-    reader::DatabaseReader& reader() { return *mReader; }
+    const Tables& tables() const { return mTables; }
+    /// Only while isOpen(). Reads over this object's connection what was not read before.
+    RememberingReader& reader() { return *mReader; }
 
     /// A further read-only connection to the same database, for the thread that calls this. May be
     /// called from any thread.
     reader::Result<reader::Connection> connect() const;
+    /// For connections that are made later, when this object may have another database.
+    Connector connector() const;
+    static Connector connectorTo(const QString& address, const QString& password);
 
-    /// Tells everybody that the connection has broken down; `message` is the engine's.
-    void sayLost(const QString& message) { emit lost(message); }
+    /// Tells everybody, once until the connection is renewed, that it has broken down; `message` is
+    /// the engine's. A file cannot be lost.
+    void sayLost(const QString& message);
+    bool isLost() const { return mLost; }
 
 signals:
+    /// Another database, or the same one afresh.
     void opened();
     void lost(const QString& message);
 
 private:
+    std::optional<QString> take(const QString& address, const QString& password,
+                                std::optional<Tables> tables);
+
     QString mAddress;
     QString mPassword;
+    mutable QMutex mTarget; ///< guards the two above against connect() on other threads
     std::optional<reader::Connection> mConnection;
-    std::unique_ptr<reader::DatabaseReader> mReader;
-    std::vector<reader::TableEntry> mTables;
+    std::unique_ptr<RememberingReader> mReader;
+    Tables mTables;
+    bool mLost = false;
 };
 
 } // namespace designer

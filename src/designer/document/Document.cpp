@@ -1,27 +1,132 @@
 #include "designer/document/Document.h"
 
+#include "designer/document/Step.h"
+#include "designer/document/StepName.h"
+
+#include <QAction>
+#include <QCoreApplication>
+#include <QEvent>
+#include <QKeySequence>
 #include <QUndoStack>
 
 namespace designer {
 
 Document::Document(QObject* parent)
-    : QObject(parent), mQuery(platform::makeRef<model::Query>()), mSteps(new QUndoStack(this)) {}
+    : QObject(parent), mQuery(platform::makeRef<model::Query>()), mKnown(*mQuery),
+      mSteps(new QUndoStack(this)) {
+    // Not from within the step, when the stack's own state is still the one before.
+    connect(mSteps, &QUndoStack::indexChanged, this, [this] {
+        if (!std::exchange(mStepped, false)) return;
+        emit outdated();
+        emit changed();
+    });
+    connect(mSteps, &QUndoStack::cleanChanged, this,
+            [this](bool clean) { emit modifiedChanged(!clean); });
+    if (auto* application = QCoreApplication::instance()) application->installEventFilter(this);
+}
 
-Document::~Document() = default;
+Document::~Document() {
+    // Steps call back.
+    delete mSteps;
+}
 
 void Document::setQuery(const platform::Ref<model::Query>& query) {
     mQuery = query;
+    mKnown = model::Snapshot(*mQuery);
     mSteps->clear();
     emit outdated();
     emit changed();
 }
 
-void Document::change(const QString&, const std::function<void(model::Query&)>& how) {
-    how(*mQuery);
-    emit outdated();
-    emit changed();
+QUndoStack& Document::steps() {
+    settle();
+    return *mSteps;
 }
 
-void Document::changedByControl() { emit changed(); }
+void Document::undo() { steps().undo(); }
+void Document::redo() { steps().redo(); }
+
+QAction* Document::makeUndoAction(QObject* parent) {
+    QAction* action = mSteps->createUndoAction(parent, tr("&Undo"));
+    action->setShortcut(QKeySequence::Undo);
+    disconnect(action, &QAction::triggered, mSteps, nullptr); // which does not settle
+    connect(action, &QAction::triggered, this, &Document::undo);
+    return action;
+}
+
+QAction* Document::makeRedoAction(QObject* parent) {
+    QAction* action = mSteps->createRedoAction(parent, tr("&Redo"));
+    action->setShortcut(QKeySequence::Redo);
+    disconnect(action, &QAction::triggered, mSteps, nullptr); // which does not settle
+    connect(action, &QAction::triggered, this, &Document::redo);
+    return action;
+}
+
+bool Document::isModified() { return !steps().isClean(); }
+
+void Document::setModified(bool modified) {
+    settle();
+    if (modified)
+        mSteps->resetClean();
+    else
+        mSteps->setClean();
+}
+
+void Document::change(const QString& name, const std::function<void(model::Query&)>& how) {
+    settle();
+    const auto tell = [&] {
+        if (!record(name)) return;
+        emit outdated();
+        emit changed();
+    };
+    try {
+        how(*mQuery);
+    } catch (...) {
+        tell();
+        throw;
+    }
+    tell();
+}
+
+void Document::changedByControl() {
+    if (std::exchange(mSettlesLater, true)) return;
+    QMetaObject::invokeMethod(this, &Document::settle, Qt::QueuedConnection);
+}
+
+void Document::settle() {
+    mSettlesLater = false;
+    if (record({})) emit changed();
+}
+
+bool Document::eventFilter(QObject*, QEvent* event) {
+    // The control has no event for a new size of a table, nor for a join from its menu.
+    if (event->type() == QEvent::MouseButtonRelease || event->type() == QEvent::KeyRelease)
+        changedByControl();
+    return false;
+}
+
+bool Document::record(const QString& name) {
+    model::Change change = mKnown.update(*mQuery);
+    if (change.empty()) return false;
+    const QString found = stepName(change);
+    if (found.isEmpty()) {
+        // Something came and went again, so that its keys are free and its names read anew.
+        mQuery->apply(change.reversed());
+        mKnown.update(*mQuery);
+        return false;
+    }
+    mSteps->push(new Step(name.isEmpty() ? found : name, std::move(change),
+                          [this](const model::Change& step) { apply(step); }));
+    return true;
+}
+
+void Document::apply(const model::Change& change) {
+    // A step starts from the state that it knows, whatever was done behind the document's back.
+    const model::Change unknown = mKnown.update(*mQuery);
+    if (!unknown.empty()) mQuery->apply(unknown.reversed());
+    mQuery->apply(change);
+    mKnown.update(*mQuery);
+    mStepped = true;
+}
 
 } // namespace designer

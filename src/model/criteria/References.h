@@ -15,6 +15,8 @@ struct Reference {
     ColumnPlace column{};     ///< empty: no column, so they are a text or a parameter
 
     bool namesTable() const { return tableEnd > begin; }
+
+    friend bool operator==(const Reference&, const Reference&) = default;
 };
 
 /// In the order of the text.

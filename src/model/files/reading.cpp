@@ -5,6 +5,7 @@
 #include "model/files/migrations.h"
 #include "model/files/words.h"
 
+#include <algorithm>
 #include <functional>
 
 namespace files {
@@ -19,6 +20,7 @@ public:
     void read(json::Value file);
 
     model::QueryRecord record = {};
+    String database = {};
     Unknown unknown = {};
 
 private:
@@ -27,6 +29,7 @@ private:
     void join(Object object);
     model::EndRecord end(Object object, const std::string& owner);
     void definition(Object object);
+    static std::vector<model::NameRecord> names(Object& criterion);
 
     static void each(json::Items items, const Pointer& list,
                      const std::function<void(Object)>& use) {
@@ -46,6 +49,7 @@ void Reader::read(json::Value file) {
     auto tables = object.list("tables", limits::tables);
     auto joins = object.list("joins", limits::joins);
     auto definitions = object.list("definitions", limits::definitions);
+    database = object.text("database", String());
     Object last = object.object("lastKeys");
     record.lastKeys = {last.integer<std::int32_t>("table"), last.integer<std::int32_t>("column"),
                        last.integer<std::int32_t>("join"),
@@ -118,6 +122,24 @@ model::EndRecord Reader::end(Object object, const std::string& owner) {
     return end;
 }
 
+std::vector<model::NameRecord> Reader::names(Object& criterion) {
+    std::vector<model::NameRecord> names;
+    each(criterion.listOrNone("names", limits::textLength), criterion.place() / "names",
+         [&](Object each) {
+             constexpr std::int64_t longest = limits::textLength;
+             model::NameRecord name;
+             name.begin = each.integer<std::int32_t>("at");
+             const auto length = each.integer<std::int32_t>("tableLength", 0);
+             if (length < 0 || length > longest)
+                 refuse(each.place() / "tableLength", "is no length of a name in the text");
+             name.tableEnd = std::min<std::int64_t>(name.begin, longest) + length;
+             name.table = each.textOrNull("table");
+             name.column = each.textOrNull("column");
+             names.push_back(std::move(name));
+         });
+    return names;
+}
+
 void Reader::definition(Object object) {
     model::DefinitionRecord definition;
     definition.key = object.text("key");
@@ -128,7 +150,7 @@ void Reader::definition(Object object) {
     const std::string key = platform::toUtf8(definition.key);
     each(object.listOrNone("criteria", INT16_MAX), object.place() / "criteria", [&](Object each) {
         const auto row = each.integer<std::int16_t>("row");
-        definition.criteria.push_back({row, each.text("text")});
+        definition.criteria.push_back({row, each.text("text"), names(each)});
         keep(std::move(each), key + '/' + std::to_string(row));
     });
     keep(std::move(object), key);
@@ -169,6 +191,7 @@ Result<QueryDocument> fromJson(std::string_view text) {
         if (const auto fault = model::faultOf(reader.record))
             throw Refusal{'/' + fault->path + ' ' + fault->reason, mendIt};
         QueryDocument document(model::Query::restored(reader.record));
+        document.database = std::move(reader.database);
         if (!reader.unknown.membersOf.empty())
             document.unknown = std::make_shared<const Unknown>(std::move(reader.unknown));
         return document;

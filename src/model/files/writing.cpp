@@ -32,7 +32,7 @@ class Writer {
 public:
     explicit Writer(const Unknown* unknown) : mUnknown(unknown) {}
 
-    json::Value file(const model::QueryRecord& record) const;
+    json::Value file(const model::QueryRecord& record, const String& database) const;
 
 private:
     json::Value table(const model::TableRecord& table, const Pointer& place) const;
@@ -40,6 +40,7 @@ private:
     json::Value join(const model::JoinRecord& join) const;
     json::Value end(const model::EndRecord& end, const std::string& owner) const;
     json::Value definition(const model::DefinitionRecord& definition, const Pointer& place) const;
+    static json::Value names(const std::vector<model::NameRecord>& names);
 
     json::Value whole(json::Members members, const std::string& owner) const {
         if (mUnknown) {
@@ -53,7 +54,7 @@ private:
     const Unknown* mUnknown;
 };
 
-json::Value Writer::file(const model::QueryRecord& record) const {
+json::Value Writer::file(const model::QueryRecord& record, const String& database) const {
     json::Items tables;
     for (const auto& each : record.tables)
         tables.push_back(table(each, Pointer() / "tables" / tables.size()));
@@ -63,17 +64,19 @@ json::Value Writer::file(const model::QueryRecord& record) const {
     for (const auto& each : record.definitions)
         definitions.push_back(definition(each, Pointer() / "definitions" / definitions.size()));
     const model::LastKeys& last = record.lastKeys;
-    return whole({{"format", {std::string(words::format)}},
-                  {"version", json::number(currentVersion)},
-                  {"lastKeys", whole({{"table", json::number(last.table)},
-                                      {"column", json::number(last.column)},
-                                      {"join", json::number(last.join)},
-                                      {"definition", json::number(last.definition)}},
-                                     "lastKeys")},
-                  {"tables", {std::move(tables)}},
-                  {"joins", {std::move(joins)}},
-                  {"definitions", {std::move(definitions)}}},
-                 "");
+    json::Members members = {{"format", {std::string(words::format)}},
+                             {"version", json::number(currentVersion)}};
+    if (!database.empty())
+        members.push_back({"database", textOf(database, Pointer() / "database")});
+    members.push_back({"lastKeys", whole({{"table", json::number(last.table)},
+                                          {"column", json::number(last.column)},
+                                          {"join", json::number(last.join)},
+                                          {"definition", json::number(last.definition)}},
+                                         "lastKeys")});
+    members.push_back({"tables", {std::move(tables)}});
+    members.push_back({"joins", {std::move(joins)}});
+    members.push_back({"definitions", {std::move(definitions)}});
+    return whole(std::move(members), "");
 }
 
 json::Value Writer::table(const model::TableRecord& table, const Pointer& place) const {
@@ -126,15 +129,31 @@ json::Value Writer::end(const model::EndRecord& end, const std::string& owner) c
     return whole({{"table", orNull(end.table)}, {"column", orNull(end.column)}}, owner);
 }
 
+json::Value Writer::names(const std::vector<model::NameRecord>& names) {
+    json::Items items;
+    for (const auto& name : names) {
+        json::Members members = {{"at", json::number(name.begin)},
+                                 {"tableLength", json::number(name.tableEnd - name.begin)}};
+        if (!name.column.empty()) {
+            members.push_back({"table", {platform::toUtf8(name.table)}});
+            members.push_back({"column", {platform::toUtf8(name.column)}});
+        }
+        items.push_back({std::move(members)});
+    }
+    return {std::move(items)};
+}
+
 json::Value Writer::definition(const model::DefinitionRecord& definition,
                                const Pointer& place) const {
     const std::string key = platform::toUtf8(definition.key);
     json::Items criteria;
-    for (const auto& [row, text] : definition.criteria)
-        criteria.push_back(
-            whole({{"row", json::number(row)},
-                   {"text", textOf(text, place / "criteria" / criteria.size() / "text")}},
-                  key + '/' + std::to_string(row)));
+    for (const auto& criterion : definition.criteria) {
+        json::Members members = {
+            {"row", json::number(criterion.row)},
+            {"text", textOf(criterion.text, place / "criteria" / criteria.size() / "text")}};
+        if (!criterion.names.empty()) members.push_back({"names", names(criterion.names)});
+        criteria.push_back(whole(std::move(members), key + '/' + std::to_string(criterion.row)));
+    }
     return whole({{"key", {key}},
                   {"column", orNull(definition.column)},
                   {"synonym", textOf(definition.synonym, place / "synonym")},
@@ -150,14 +169,14 @@ Result<std::string> toJson(const QueryDocument& document) {
     const model::QueryRecord record = document.query->record();
     std::string text;
     try {
-        text = json::print(Writer(document.unknown.get()).file(record));
+        text = json::print(Writer(document.unknown.get()).file(record, document.database));
     } catch (const Refusal& refusal) {
         return Error{refusal.fault + ". " + refusal.advice + '.'};
     }
     // Better no file than one that cannot be read, whatever the reason.
     const auto again = fromJson(text);
     if (!again) return Error{"The query could not be read again: " + again.error()};
-    if (again->query->record() != record)
+    if (again->query->record() != record || again->database != document.database)
         return Error{"The query would not be the same when read again. Report this, please."};
     return text;
 }

@@ -72,4 +72,9 @@ Result<Connection> openSqlite(const QString& path) {
     return connection;
 }
 
+// By trying, for the words of the engines are in any language, and not all of them give a code.
+bool answers(const Connection& connection) {
+    return QSqlQuery(connection.database()).exec(QStringLiteral("SELECT 1"));
+}
+
 } // namespace reader

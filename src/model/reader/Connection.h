@@ -41,4 +41,8 @@ Result<Connection> openSqlite(const QString& path);
 /// message shows it. Needs a QCoreApplication.
 Result<Connection> openDatabase(const QString& address, const QString& password = {});
 
+/// Whether the engine still answers; after a failure this tells a connection that has broken down
+/// from a statement that was refused. Takes a way to the server and back.
+bool answers(const Connection& connection);
+
 } // namespace reader

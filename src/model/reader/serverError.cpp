@@ -1,5 +1,6 @@
 #include "model/reader/serverError.h"
 
+#include <algorithm>
 #include <array>
 
 namespace reader {
@@ -41,6 +42,15 @@ Error serverError(const QString& failed, const QSqlError& error) {
             break;
         }
     return {QStringLiteral("%1 (%2): %3.").arg(failed, said, advice)};
+}
+
+bool asksForPassword(const QString& message) {
+    // The first one begins so in all languages.
+    static const std::array<QLatin1String, 3> words = {
+        QLatin1String("fe_sendauth"), QLatin1String("password authentication failed"),
+        QLatin1String("Access denied for user")};
+    return std::any_of(words.begin(), words.end(),
+                       [&](QLatin1String each) { return message.contains(each); });
 }
 
 } // namespace reader

@@ -10,4 +10,7 @@ namespace reader {
 /// far as the words tell. `failed` is what could not be done, without a full stop.
 Error serverError(const QString& failed, const QSqlError& error);
 
+/// Whether a message of openDatabase says that the server wants a password, or another one.
+bool asksForPassword(const QString& message);
+
 } // namespace reader

@@ -124,10 +124,12 @@ private:
 
 Built build(Query& query) { return Builder(query).build(); }
 
-Text statementText(Query& query, Dialect dialect, ValueForm form) {
+Text statementText(Query& query, Dialect dialect, ValueForm form,
+                   std::optional<std::int64_t> limit) {
     Built built = build(query);
     Text result{{}, {}, std::move(built.findings)};
     if (!built.statement) return result;
+    built.statement->limit = limit;
     Findings names = uncarriedNames(query, dialect);
     if (!names.empty()) {
         for (Finding& finding : names) finding.text = oneLine(std::move(finding.text));

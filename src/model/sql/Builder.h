@@ -29,7 +29,8 @@ struct Text {
     bool runnable() const;
 };
 
-/// The query as a statement of a dialect.
-Text statementText(Query& query, Dialect dialect, ValueForm form);
+/// The query as a statement of a dialect, of no more rows than `limit`.
+Text statementText(Query& query, Dialect dialect, ValueForm form,
+                   std::optional<std::int64_t> limit = {});
 
 } // namespace model::sql

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QAbstractListModel>
+#include <QCoreApplication>
 
 #include <vector>
 
@@ -8,6 +9,8 @@ namespace platform::qt {
 
 /// The rows of a table list as the view sees them.
 class ColumnListModel : public QAbstractListModel {
+    Q_DECLARE_TR_FUNCTIONS(platform::qt::ColumnListModel)
+
 public:
     /// Whether the column is marked.
     static constexpr int markedRole = Qt::UserRole;

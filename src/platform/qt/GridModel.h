@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QAbstractTableModel>
+#include <QCoreApplication>
 
 #include <vector>
 
@@ -10,6 +11,8 @@ namespace platform::qt {
 /// the rest is the body; nothing is announced until `announce`, so that filling the grid and
 /// moving its columns costs no more than the data.
 class GridModel : public QAbstractTableModel {
+    Q_DECLARE_TR_FUNCTIONS(platform::qt::GridModel)
+
 public:
     GridModel(int rows, int cols, QObject* parent);
 

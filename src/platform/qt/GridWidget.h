@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QCoreApplication>
 #include <QTableView>
 
 #include <functional>
@@ -27,6 +28,8 @@ public:
 /// follows the model's data, widths and current cell when the events at hand have been dealt with,
 /// or at once by `bringUpToDate`.
 class GridWidget : public QWidget {
+    Q_DECLARE_TR_FUNCTIONS(platform::qt::GridWidget)
+
 public:
     GridWidget(int rows, int cols, QWidget* parent);
 

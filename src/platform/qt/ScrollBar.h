@@ -3,6 +3,7 @@
 #include "platform/Intrinsic.h"
 #include "platform/qt/Adapter.h"
 
+#include <QCoreApplication>
 #include <QScrollBar>
 
 class QWheelEvent;
@@ -11,6 +12,8 @@ namespace platform::qt {
 
 /// Moves the canvas; shows that it has the focus, which scroll bars of most styles do not.
 class CanvasScrollBar : public QScrollBar {
+    Q_DECLARE_TR_FUNCTIONS(platform::qt::CanvasScrollBar)
+
 public:
     CanvasScrollBar(Qt::Orientation orientation, QWidget* parent);
 

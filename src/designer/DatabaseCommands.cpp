@@ -1,0 +1,95 @@
+#include "designer/DatabaseCommands.h"
+
+#include "designer/database/ConnectionDialog.h"
+#include "designer/database/opening.h"
+#include "designer/document/FileDialogs.h"
+#include "designer/document/QueryFile.h"
+#include "designer/document/RecentFiles.h"
+#include "designer/document/RecentMenu.h"
+
+#include <QFileDialog>
+#include <QMenu>
+#include <QMessageBox>
+
+namespace designer {
+
+DatabaseCommands::DatabaseCommands(Database& database, QueryFile& file, FileDialogs& files,
+                                   RecentFiles& recent, QWidget& window)
+    : QObject(&window), mDatabase(database), mFile(file), mFiles(files), mRecent(recent),
+      mWindow(window), mOpenFile(tr("Open SQLite &file\u2026")),
+      mConnect(tr("&Connect to a server\u2026")), mReconnect(tr("&Reconnect")) {
+    mOpenFile.setObjectName(QStringLiteral("openDatabaseFile"));
+    mConnect.setObjectName(QStringLiteral("connect"));
+    mReconnect.setObjectName(QStringLiteral("reconnect"));
+    mOpenFile.setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_O);
+    connect(&mOpenFile, &QAction::triggered, this, &DatabaseCommands::askForFile);
+    connect(&mConnect, &QAction::triggered, this, &DatabaseCommands::askForConnection);
+    connect(&mReconnect, &QAction::triggered, this, &DatabaseCommands::reconnect);
+    connect(&database, &Database::opened, this, &DatabaseCommands::remember);
+    mReconnect.setEnabled(false);
+}
+
+void DatabaseCommands::addTo(QMenu& menu) {
+    auto* const recent = new RecentMenu(mRecent, &menu);
+    connect(recent, &RecentMenu::chosen, this, &DatabaseCommands::openAddress);
+    menu.addAction(&mOpenFile);
+    menu.addAction(&mConnect);
+    menu.addMenu(recent);
+    menu.addSeparator();
+    menu.addAction(&mReconnect);
+}
+
+void DatabaseCommands::remember() {
+    mReconnect.setEnabled(true);
+    mRecent.add(mDatabase.address());
+    mFile.setDatabaseAddress(mDatabase.address());
+}
+
+void DatabaseCommands::begin() {
+    mFile.startNew();
+    mFile.setDatabaseAddress(mDatabase.address());
+}
+
+void DatabaseCommands::openAddress(const QString& address) {
+    if (!mFiles.mayLose()) return;
+    const Opening opening = openAskingForPassword(mDatabase, address, &mWindow);
+    if (!opening.error.isEmpty())
+        QMessageBox::warning(&mWindow, tr("Open database"), opening.error);
+    if (opening.opened) begin();
+}
+
+QString DatabaseCommands::openAtFirst(const QString& address) {
+    const Opening opening = openAskingForPassword(mDatabase, address, &mWindow);
+    if (opening.opened) return {};
+    return opening.error.isEmpty() ? tr("The database was not opened.") : opening.error;
+}
+
+void DatabaseCommands::followFile() {
+    const auto address = mFile.databaseAddress();
+    if (!address || (mDatabase.isOpen() && *address == mDatabase.address())) return;
+    const Opening opening = openAskingForPassword(mDatabase, *address, &mWindow);
+    if (opening.opened) return;
+    QMessageBox::warning(
+        &mWindow, tr("Open database"),
+        tr("The query is open, but not its database. %1").arg(opening.error).trimmed());
+}
+
+void DatabaseCommands::askForFile() {
+    const QString path = QFileDialog::getOpenFileName(
+        &mWindow, tr("Open SQLite file"), {},
+        tr("SQLite databases (*.sqlite *.sqlite3 *.db *.db3);;All files (*)"));
+    if (!path.isEmpty()) openAddress(path);
+}
+
+void DatabaseCommands::askForConnection() {
+    if (!mFiles.mayLose()) return;
+    ConnectionDialog dialog(mDatabase, &mWindow);
+    if (dialog.exec() == QDialog::Accepted) begin();
+}
+
+void DatabaseCommands::reconnect() {
+    const Opening opening = renewPatiently(mDatabase, &mWindow);
+    if (!opening.error.isEmpty()) QMessageBox::warning(&mWindow, tr("Reconnect"), opening.error);
+}
+
+} // namespace designer

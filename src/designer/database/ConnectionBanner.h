@@ -1,0 +1,26 @@
+#pragma once
+
+#include <QFrame>
+
+class QLabel;
+
+namespace designer {
+
+class Database;
+
+/// A slim bar that is there while the database is lost, with a button that connects it afresh.
+class ConnectionBanner final : public QFrame {
+    Q_OBJECT
+
+public:
+    explicit ConnectionBanner(Database& database, QWidget* parent = nullptr);
+
+private:
+    void showLoss(const QString& message);
+    void reconnect();
+
+    Database& mDatabase;
+    QLabel* mText;
+};
+
+} // namespace designer

@@ -1,0 +1,18 @@
+#pragma once
+
+#include <QLabel>
+
+namespace designer {
+
+/// A line of a dialog that says what went wrong: wrapped, to be selected and copied, and not there
+/// as long as there is nothing to say.
+class ErrorLine final : public QLabel {
+    Q_OBJECT
+
+public:
+    explicit ErrorLine(QWidget* parent = nullptr);
+
+    void say(const QString& error);
+};
+
+} // namespace designer

@@ -1,0 +1,61 @@
+#include "designer/document/Autosave.h"
+
+#include "designer/document/Document.h"
+#include "designer/document/QueryFile.h"
+
+namespace designer {
+
+Autosave::Autosave(Document& document, QueryFile& file, const QString& folder,
+                   std::chrono::milliseconds delay)
+    : mDocument(document), mFile(file), mFolder(folder) {
+    mWriter.setMaxThreadCount(1);
+    mTimer.setSingleShot(true);
+    mTimer.setInterval(delay);
+    connect(&mTimer, &QTimer::timeout, this, &Autosave::save);
+    connect(&document, &Document::changed, this, &Autosave::documentChanged);
+    connect(&document, &Document::modifiedChanged, this, &Autosave::documentChanged);
+}
+
+Autosave::~Autosave() { remove(); }
+
+void Autosave::adopt(AutosaveSlot::Ptr slot) {
+    remove();
+    mSlot = std::move(slot);
+}
+
+void Autosave::documentChanged() {
+    if (!mDocument.isModified())
+        remove();
+    else if (!mTimer.isActive()) // not anew with every change, or a busy user is never saved
+        mTimer.start();
+}
+
+void Autosave::save() {
+    if (!mSlot) mSlot = AutosaveSlot::made(mFolder);
+    if (!mSlot) return tell(tr("the folder %1 cannot be written").arg(mFolder));
+    const auto bytes = Autosaved{mFile.path(), mFile.content()}.bytes();
+    if (!bytes) return tell(QString::fromStdString(bytes.error()));
+    mWriter.start([this, file = mSlot->file(), content = *bytes] {
+        const auto error = AutosaveSlot::write(file, content);
+        QMetaObject::invokeMethod(this, [this, error] {
+            if (error)
+                tell(*error);
+            else
+                mFailed = false;
+        });
+    });
+}
+
+void Autosave::remove() {
+    mTimer.stop();
+    mWriter.waitForDone();
+    if (mSlot) mSlot->remove();
+}
+
+void Autosave::tell(const QString& reason) {
+    if (!std::exchange(mFailed, true))
+        emit failed(
+            tr("The query could not be saved for a recovery (%1); save it yourself.").arg(reason));
+}
+
+} // namespace designer

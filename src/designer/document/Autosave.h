@@ -1,0 +1,51 @@
+#pragma once
+
+#include "designer/document/AutosaveSlot.h"
+
+#include <QObject>
+#include <QThreadPool>
+#include <QTimer>
+
+#include <chrono>
+
+namespace designer {
+
+class Document;
+class QueryFile;
+
+/// Keeps the document's query in an autosave file as long as it is modified: written soon after a
+/// change, deleted when the query is saved, given up, or the object goes. What is there after the
+/// process was killed is offered by Recovery.
+class Autosave final : public QObject {
+    Q_OBJECT
+
+public:
+    static constexpr std::chrono::milliseconds usualDelay = std::chrono::seconds(3);
+
+    Autosave(Document& document, QueryFile& file, const QString& folder,
+             std::chrono::milliseconds delay = usualDelay);
+    ~Autosave() override;
+
+    /// Goes on with the file of one that was killed, whose query the document has now.
+    void adopt(AutosaveSlot::Ptr slot);
+
+signals:
+    /// It could not be written: one line for the status bar. Told once until it works again.
+    void failed(const QString& message);
+
+private:
+    void documentChanged();
+    void save();
+    void remove();
+    void tell(const QString& reason);
+
+    Document& mDocument;
+    QueryFile& mFile;
+    const QString mFolder;
+    AutosaveSlot::Ptr mSlot; ///< made when it is needed first
+    QTimer mTimer;
+    QThreadPool mWriter; ///< one thread, so that files are written in their order
+    bool mFailed = false;
+};
+
+} // namespace designer

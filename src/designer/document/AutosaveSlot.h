@@ -1,0 +1,55 @@
+#pragma once
+
+#include "model/files/QueryDocument.h"
+
+#include <QByteArray>
+#include <QDateTime>
+#include <QLockFile>
+#include <QString>
+
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace designer {
+
+/// A query that was saved of itself, and where it belongs.
+struct Autosaved {
+    QString path; ///< of the file that it is a later state of; empty: there is none yet
+    files::QueryDocument content;
+
+    /// One line of what is wrong, in place of the bytes, when the query cannot be written.
+    files::Result<QByteArray> bytes() const;
+    static files::Result<Autosaved> read(const QByteArray& bytes);
+};
+
+/// A file for autosaving, and a lock by which it is this process's alone as long as the object is
+/// there. The file stays when the object, or the process, goes; only remove() deletes it.
+class AutosaveSlot {
+public:
+    using Ptr = std::unique_ptr<AutosaveSlot>;
+
+    /// Where the designer keeps them: below QStandardPaths::AppDataLocation, in "autosave".
+    static QString standardFolder();
+    /// A new one, without its file yet; the folder is made for the user alone.
+    static Ptr made(const QString& folder);
+    /// Those with a file that no running process holds, the newest first: what designers left
+    /// behind that were killed.
+    static std::vector<Ptr> abandoned(const QString& folder);
+
+    const QString& file() const { return mFile; }
+    QDateTime saved() const;
+    std::optional<Autosaved> read() const;
+    /// Replaces the file in one step. May be called from another thread; the error's text or
+    /// nothing.
+    static std::optional<QString> write(const QString& file, const QByteArray& bytes);
+    void remove();
+
+private:
+    explicit AutosaveSlot(const QString& file);
+
+    const QString mFile;
+    QLockFile mLock;
+};
+
+} // namespace designer

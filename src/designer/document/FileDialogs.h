@@ -1,0 +1,49 @@
+#pragma once
+
+#include <QObject>
+
+class QWidget;
+
+namespace designer {
+
+class Document;
+class QueryFile;
+class RecentFiles;
+
+/// New, open and save as a user asks for them: with the dialogs, the questions and the errors, on a
+/// window, which also gets its mark for a modified query (its title needs "[*]"). Each returns
+/// whether it was done; not when the user cancelled or it failed, which was told then.
+class FileDialogs final : public QObject {
+    Q_OBJECT
+
+public:
+    FileDialogs(Document& document, QueryFile& file, RecentFiles& recent, QWidget& window);
+
+    bool startNew();
+    /// Asks for a file.
+    bool open();
+    bool open(const QString& path);
+    /// Asks for a file when there is none yet.
+    bool save();
+    bool saveAs();
+    /// Whether the query may be given up: it is saved, the user saves it now, or discards it. To be
+    /// asked before it is replaced by something else than these commands and before the window
+    /// closes.
+    bool mayLose();
+
+signals:
+    /// A file was opened: its database may be another one (QueryFile::databaseAddress()).
+    void opened();
+
+private:
+    bool openFrom(const QString& path);
+    bool saveTo(const QString& path);
+    void tell(const QString& title, const QString& error);
+
+    Document& mDocument;
+    QueryFile& mFile;
+    RecentFiles& mRecent;
+    QWidget& mWindow;
+};
+
+} // namespace designer

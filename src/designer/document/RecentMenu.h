@@ -1,0 +1,25 @@
+#pragma once
+
+#include <QMenu>
+
+namespace designer {
+
+class RecentFiles;
+
+/// "Open Recent": an entry for each file or database, greyed when it is gone, and "Clear List".
+class RecentMenu final : public QMenu {
+    Q_OBJECT
+
+public:
+    explicit RecentMenu(RecentFiles& recent, QWidget* parent = nullptr);
+
+signals:
+    void chosen(const QString& fileOrAddress);
+
+private:
+    void fill();
+
+    RecentFiles& mRecent;
+};
+
+} // namespace designer

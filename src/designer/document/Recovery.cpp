@@ -1,0 +1,61 @@
+#include "designer/document/Recovery.h"
+
+#include "designer/document/Autosave.h"
+#include "designer/document/QueryFile.h"
+
+#include <QCoreApplication>
+#include <QFileInfo>
+#include <QLocale>
+#include <QMessageBox>
+#include <QPushButton>
+
+namespace designer {
+
+namespace {
+
+class Recovery {
+    Q_DECLARE_TR_FUNCTIONS(designer::Recovery)
+
+public:
+    enum class Answer { recover, discard, later };
+
+    static Answer ask(const QString& path, const QDateTime& saved, QWidget* window) {
+        const QString name = path.isEmpty() ? tr("A query that was never saved")
+                                            : tr("\"%1\"").arg(QFileInfo(path).fileName());
+        QMessageBox box(QMessageBox::Question, tr("Recover Query"),
+                        tr("%1 has changes that were not saved.").arg(name), QMessageBox::NoButton,
+                        window);
+        box.setInformativeText(
+            tr("The designer ended unexpectedly. The changes up to %1 can be recovered.")
+                .arg(QLocale().toString(saved, QLocale::ShortFormat)));
+        const auto* recover = box.addButton(tr("&Recover"), QMessageBox::AcceptRole);
+        const auto* discard = box.addButton(QMessageBox::Discard);
+        box.addButton(tr("&Ask Later"), QMessageBox::RejectRole);
+        box.exec();
+        if (box.clickedButton() == recover) return Answer::recover;
+        return box.clickedButton() == discard ? Answer::discard : Answer::later;
+    }
+};
+
+} // namespace
+
+bool offerRecovery(QueryFile& file, Autosave& autosave, const QString& folder, QWidget* window) {
+    for (auto& slot : AutosaveSlot::abandoned(folder)) {
+        const auto saved = slot->read();
+        if (!saved) {
+            slot->remove(); // nobody can read it
+            continue;
+        }
+        switch (Recovery::ask(saved->path, slot->saved(), window)) {
+        case Recovery::Answer::recover:
+            file.recover(saved->path, saved->content);
+            autosave.adopt(std::move(slot));
+            return true;
+        case Recovery::Answer::discard: slot->remove(); break;
+        case Recovery::Answer::later: break;
+        }
+    }
+    return false;
+}
+
+} // namespace designer

@@ -1,0 +1,97 @@
+#include "designer/run/Cell.h"
+
+#include <QCoreApplication>
+#include <QDateTime>
+#include <QLocale>
+#include <QSqlField>
+#include <QSqlQuery>
+#include <QSqlRecord>
+
+namespace designer {
+
+namespace {
+
+/// With as many digits behind the seconds as there are.
+QString clockFormat(const QTime& time) {
+    return time.msec() == 0 ? QStringLiteral("HH:mm:ss") : QStringLiteral("HH:mm:ss.zzz");
+}
+
+/// A moment that Qt cannot hold, such as "infinity" or one before our era.
+QString unknownMoment() {
+    return QCoreApplication::translate("designer::CellReader", "(outside the calendar)");
+}
+
+bool isNumber(const QMetaType& type) {
+    switch (type.id()) {
+    case QMetaType::Double:
+    case QMetaType::Float:
+    case QMetaType::Int:
+    case QMetaType::UInt:
+    case QMetaType::LongLong:
+    case QMetaType::ULongLong:
+    case QMetaType::Short:
+    case QMetaType::UShort:
+    case QMetaType::Char:
+    case QMetaType::SChar:
+    case QMetaType::UChar: return true;
+    default: return false;
+    }
+}
+
+QString momentText(const QVariant& value) {
+    if (value.typeId() == QMetaType::QDate) return value.toDate().toString(Qt::ISODate);
+    if (value.typeId() == QMetaType::QTime) {
+        const QTime time = value.toTime();
+        return time.toString(clockFormat(time));
+    }
+    const QDateTime moment = value.toDateTime();
+    return moment.toString(QStringLiteral("yyyy-MM-dd ") + clockFormat(moment.time()));
+}
+
+} // namespace
+
+CellReader::CellReader(const QSqlQuery& query) : mQuery(query) {
+    const QSqlRecord record = query.record();
+    for (int i = 0; i < record.count(); ++i) {
+        mColumns << record.fieldName(i);
+        mNumbers.push_back(isNumber(record.field(i).metaType()));
+    }
+    mRow.resize(mNumbers.size());
+}
+
+const Row& CellReader::row() {
+    for (std::size_t i = 0; i < mRow.size(); ++i) mRow[i] = cell(static_cast<int>(i));
+    return mRow;
+}
+
+Cell CellReader::cell(int column) const {
+    const QVariant value = mQuery.value(column);
+    // The statement knows it; a value that Qt cannot hold calls itself null as well.
+    if (mQuery.isNull(column)) return {};
+    switch (value.typeId()) {
+    case QMetaType::QByteArray: return {Cell::Kind::blob, {}, value.toByteArray()};
+    case QMetaType::Bool:
+        return {Cell::Kind::boolean,
+                value.toBool() ? QStringLiteral("true") : QStringLiteral("false")};
+    case QMetaType::QDate:
+    case QMetaType::QTime:
+    case QMetaType::QDateTime: {
+        const QString text = momentText(value);
+        return {Cell::Kind::text, text.isEmpty() ? unknownMoment() : text};
+    }
+    case QMetaType::Double:
+    case QMetaType::Float:
+        return {Cell::Kind::number,
+                QString::number(value.toDouble(), 'g', QLocale::FloatingPointShortest)};
+    case QMetaType::QString: {
+        // Exact decimals come as text.
+        const bool number = mNumbers[static_cast<std::size_t>(column)];
+        return {number ? Cell::Kind::number : Cell::Kind::text, value.toString()};
+    }
+    default:
+        return {isNumber(value.metaType()) ? Cell::Kind::number : Cell::Kind::text,
+                value.toString()};
+    }
+}
+
+} // namespace designer

@@ -1,0 +1,26 @@
+#pragma once
+
+#include "designer/run/CsvWriter.h"
+
+#include <QSaveFile>
+
+namespace designer {
+
+/// Writes rows into a file of comma-separated values, which is there only when all of them are in
+/// it; until then one that was there before stays.
+class FileExport final : public Sink {
+public:
+    explicit FileExport(const QString& path) : mFile(path), mWriter(mFile) {}
+
+    std::optional<QString> begin(const QStringList& columns) override;
+    std::optional<QString> add(const Row& row) override;
+    std::optional<QString> finish() override;
+
+private:
+    std::optional<QString> complain() const;
+
+    QSaveFile mFile;
+    CsvWriter mWriter;
+};
+
+} // namespace designer

@@ -1,0 +1,27 @@
+#pragma once
+
+#include "designer/run/fetch.h"
+
+class QIODevice;
+
+namespace designer {
+
+/// Writes rows as an array of objects, an object a line: UTF-8. A blob is a text in Base64. Of
+/// columns with one name the later ones get "_2", "_3" behind it.
+class JsonWriter final : public Sink {
+public:
+    /// The device is open for writing and outlives the writer.
+    explicit JsonWriter(QIODevice& device) : mDevice(device) {}
+
+    std::optional<QString> begin(const QStringList& columns) override;
+    std::optional<QString> add(const Row& row) override;
+    std::optional<QString> finish() override;
+
+private:
+    QIODevice& mDevice;
+    std::vector<QByteArray> mNames; ///< with quotes and colon
+    QByteArray mLine;
+    bool mAny = false;
+};
+
+} // namespace designer

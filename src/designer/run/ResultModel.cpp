@@ -1,0 +1,150 @@
+#include "designer/run/ResultModel.h"
+
+#include <QApplication>
+#include <QFont>
+#include <QLocale>
+#include <QPalette>
+
+#include <limits>
+#include <set>
+
+namespace designer {
+
+namespace {
+
+constexpr qint64 mostBytesOfACell = 4000; // more than anybody reads in a table
+constexpr qsizetype pageMemory = 16 << 20;
+constexpr qint64 mostCellsCopied = 500'000;
+constexpr qsizetype mostShown = 300; // characters of a cell; what is wider is cut off anyway
+
+qsizetype memoryOf(const std::vector<Row>& page) {
+    qsizetype bytes = 0;
+    for (const Row& row : page)
+        for (const Cell& cell : row) bytes += sizeof(Cell) + 2 * cell.text.size();
+    return bytes;
+}
+
+QString readable(const Cell& cell) {
+    if (cell.kind != Cell::Kind::blob) return cell.text;
+    return ResultModel::tr("(blob, %1 bytes)").arg(QLocale().toString(cell.text.toLongLong()));
+}
+
+/// As spreadsheets take it: quotes around what would break the table.
+void appendCopied(QString& text, const Cell& cell) {
+    QString value = readable(cell);
+    const bool breaks = value.contains(u'\t') || value.contains(u'\n') || value.contains(u'\r');
+    text += breaks ? u'"' + value.replace(u'"', QStringLiteral("\"\"")) + u'"' : value;
+}
+
+} // namespace
+
+void ResultModel::setSpool(const std::shared_ptr<Spool>& spool) {
+    beginResetModel();
+    mSpool = spool;
+    mColumns.clear();
+    mRows = 0;
+    mPages.clear();
+    mPages.setMaxCost(pageMemory);
+    endResetModel();
+}
+
+void ResultModel::refresh() {
+    if (!mSpool) return;
+    if (const QStringList columns = mSpool->columns(); columns != mColumns) {
+        beginResetModel();
+        mColumns = columns;
+        endResetModel();
+    }
+    const qint64 present = std::min<qint64>(mSpool->rows(), std::numeric_limits<int>::max());
+    if (present <= mRows) return;
+    mPages.remove(mRows / Spool::rowsInAPage); // it has more rows now
+    beginInsertRows({}, mRows, static_cast<int>(present) - 1);
+    mRows = static_cast<int>(present);
+    endInsertRows();
+}
+
+int ResultModel::rowCount(const QModelIndex& parent) const { return parent.isValid() ? 0 : mRows; }
+
+int ResultModel::columnCount(const QModelIndex& parent) const {
+    return parent.isValid() ? 0 : static_cast<int>(mColumns.size());
+}
+
+QVariant ResultModel::data(const QModelIndex& index, int role) const {
+    switch (role) {
+    case Qt::DisplayRole: {
+        const Cell value = cell(index);
+        if (value.kind == Cell::Kind::null) return QStringLiteral("NULL");
+        return readable(value).left(mostShown).simplified();
+    }
+    case Qt::ToolTipRole: return readable(cell(index));
+    case Qt::TextAlignmentRole: {
+        const bool number = cell(index).kind == Cell::Kind::number;
+        return QVariant(Qt::AlignVCenter | (number ? Qt::AlignRight : Qt::AlignLeft));
+    }
+    case Qt::ForegroundRole:
+        if (const auto kind = cell(index).kind;
+            kind == Cell::Kind::null || kind == Cell::Kind::blob)
+            return QApplication::palette().brush(QPalette::PlaceholderText);
+        return {};
+    default: return {};
+    }
+}
+
+QVariant ResultModel::headerData(int section, Qt::Orientation orientation, int role) const {
+    if (orientation == Qt::Vertical)
+        return role == Qt::DisplayRole ? QVariant(QLocale().toString(section + 1)) : QVariant();
+    const bool asked = role == Qt::DisplayRole || role == Qt::ToolTipRole;
+    return asked ? QVariant(mColumns.value(section)) : QVariant();
+}
+
+Cell ResultModel::cell(const QModelIndex& index) const {
+    if (!mSpool || !index.isValid()) return {};
+    const qint64 number = index.row() / Spool::rowsInAPage;
+    const std::vector<Row>* page = mPages.object(number);
+    if (!page) {
+        auto read = std::make_unique<std::vector<Row>>(mSpool->page(number, mostBytesOfACell));
+        page = read.get();
+        const qsizetype cost = std::min(memoryOf(*page), pageMemory);
+        mPages.insert(number, read.release(), cost);
+    }
+    const auto row = static_cast<std::size_t>(index.row() % Spool::rowsInAPage);
+    if (row >= page->size()) return {};
+    return (*page)[row][static_cast<std::size_t>(index.column())];
+}
+
+std::optional<QString> ResultModel::copied(const QItemSelection& selection) const {
+    qint64 cells = 0;
+    std::set<int> columns;
+    std::map<int, int> rows; // the last one of a run by the first one
+    for (const QItemSelectionRange& range : selection) {
+        cells += qint64(range.width()) * range.height();
+        for (int column = range.left(); column <= range.right(); ++column) columns.insert(column);
+        int& last = rows[range.top()];
+        last = std::max(last, range.bottom());
+    }
+    if (cells > mostCellsCopied) return {};
+
+    QString text;
+    std::vector<Row> page;
+    qint64 pageNumber = -1;
+    int next = 0;
+    for (const auto& [first, last] : rows) {
+        for (int row = std::max(first, next); row <= last; ++row) {
+            if (const qint64 number = row / Spool::rowsInAPage; number != pageNumber) {
+                page = mSpool->page(number, std::numeric_limits<qint64>::max());
+                pageNumber = number;
+            }
+            const auto place = static_cast<std::size_t>(row % Spool::rowsInAPage);
+            if (!text.isEmpty()) text += u'\n';
+            for (const int column : columns) {
+                if (column != *columns.begin()) text += u'\t';
+                if (place < page.size() && selection.contains(index(row, column)))
+                    appendCopied(text, page[place][static_cast<std::size_t>(column)]);
+            }
+        }
+        next = std::max(next, last + 1);
+    }
+    return text;
+}
+
+} // namespace designer

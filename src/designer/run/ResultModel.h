@@ -1,0 +1,44 @@
+#pragma once
+
+#include "designer/run/Spool.h"
+
+#include <QAbstractTableModel>
+#include <QCache>
+#include <QItemSelection>
+
+#include <memory>
+
+namespace designer {
+
+/// The rows of a spool, of which only some pages are in memory.
+class ResultModel final : public QAbstractTableModel {
+    Q_OBJECT
+
+public:
+    using QAbstractTableModel::QAbstractTableModel;
+
+    /// Shows the rows of another spool, or none.
+    void setSpool(const std::shared_ptr<Spool>& spool);
+    /// Looks for what has come: columns, and rows.
+    void refresh();
+
+    int rowCount(const QModelIndex& parent = {}) const override;
+    int columnCount(const QModelIndex& parent = {}) const override;
+    QVariant data(const QModelIndex& index, int role = Qt::DisplayRole) const override;
+    QVariant headerData(int section, Qt::Orientation orientation,
+                        int role = Qt::DisplayRole) const override;
+
+    /// The selected cells in full as text with tabs between columns and a line a row, or nothing
+    /// when they are more than a clipboard should hold.
+    std::optional<QString> copied(const QItemSelection& selection) const;
+
+private:
+    Cell cell(const QModelIndex& index) const;
+
+    std::shared_ptr<Spool> mSpool;
+    QStringList mColumns;
+    int mRows = 0;
+    mutable QCache<qint64, std::vector<Row>> mPages;
+};
+
+} // namespace designer

@@ -1,0 +1,83 @@
+#include "designer/run/ResultTable.h"
+
+#include <QAction>
+#include <QClipboard>
+#include <QGuiApplication>
+#include <QHeaderView>
+#include <QHelpEvent>
+#include <QStyledItemDelegate>
+#include <QTextDocument>
+#include <QToolTip>
+
+namespace designer {
+
+namespace {
+
+constexpr int widestColumn = 320; // logical pixels
+constexpr int narrowestColumn = 48;
+constexpr int roomInARow = 8;
+
+/// Shows a tip where a text is cut off.
+class CellDelegate final : public QStyledItemDelegate {
+public:
+    using QStyledItemDelegate::QStyledItemDelegate;
+
+    bool helpEvent(QHelpEvent* event, QAbstractItemView* view, const QStyleOptionViewItem& option,
+                   const QModelIndex& index) override {
+        const QString text = index.data(Qt::ToolTipRole).toString();
+        const bool whole = sizeHint(option, index).width() <= view->visualRect(index).width() &&
+                           text == index.data().toString();
+        if (event->type() != QEvent::ToolTip || whole || text.isEmpty()) {
+            QToolTip::hideText();
+            return false;
+        }
+        // As rich text it is wrapped.
+        QToolTip::showText(event->globalPos(), Qt::convertFromPlainText(text), view);
+        return true;
+    }
+};
+
+} // namespace
+
+ResultTable::ResultTable(QWidget* parent)
+    : QTableView(parent), mModel(new ResultModel(this)), mCopy(new QAction(tr("&Copy"), this)) {
+    setObjectName(QStringLiteral("resultTable"));
+    setModel(mModel);
+    setItemDelegate(new CellDelegate(this));
+    setEditTriggers(NoEditTriggers);
+    setAlternatingRowColors(true);
+    setWordWrap(false);
+    setFrameShape(NoFrame);
+    setHorizontalScrollMode(ScrollPerPixel);
+    setTabKeyNavigation(false);
+    setContextMenuPolicy(Qt::ActionsContextMenu);
+    // One height for all: the header then need not ask for that of each row.
+    verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    verticalHeader()->setDefaultSectionSize(fontMetrics().height() + roomInARow);
+    verticalHeader()->setHighlightSections(false);
+    verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    horizontalHeader()->setHighlightSections(false);
+    horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
+    horizontalHeader()->setMinimumSectionSize(narrowestColumn);
+
+    mCopy->setShortcut(QKeySequence::Copy);
+    mCopy->setShortcutContext(Qt::WidgetShortcut);
+    connect(mCopy, &QAction::triggered, this, &ResultTable::copy);
+    addAction(mCopy);
+}
+
+void ResultTable::fitColumns() {
+    resizeColumnsToContents();
+    for (int column = 0; column < mModel->columnCount(); ++column)
+        if (columnWidth(column) > widestColumn) setColumnWidth(column, widestColumn);
+}
+
+void ResultTable::copy() {
+    if (!selectionModel()->hasSelection()) return;
+    if (const auto text = mModel->copied(selectionModel()->selection()))
+        QGuiApplication::clipboard()->setText(*text);
+    else
+        emit tooMuchToCopy();
+}
+
+} // namespace designer

@@ -1,0 +1,32 @@
+#pragma once
+
+#include "designer/run/ResultModel.h"
+
+#include <QTableView>
+
+namespace designer {
+
+/// The rows of a result, to be looked at and copied.
+class ResultTable final : public QTableView {
+    Q_OBJECT
+
+public:
+    explicit ResultTable(QWidget* parent = nullptr);
+
+    ResultModel& rows() { return *mModel; }
+    /// Makes the columns as wide as the rows that are there need, within reason.
+    void fitColumns();
+    QAction* copyAction() { return mCopy; }
+
+signals:
+    /// More cells are selected than can be copied.
+    void tooMuchToCopy();
+
+private:
+    void copy();
+
+    ResultModel* mModel;
+    QAction* mCopy;
+};
+
+} // namespace designer

@@ -1,0 +1,252 @@
+#include "designer/run/ResultsPanel.h"
+
+#include "designer/database/Database.h"
+#include "designer/document/Document.h"
+#include "designer/run/FileExport.h"
+#include "designer/run/ParameterDialog.h"
+#include "designer/run/ResultTable.h"
+
+#include <QAction>
+#include <QComboBox>
+#include <QFileDialog>
+#include <QLabel>
+#include <QLocale>
+#include <QPlainTextEdit>
+#include <QProgressBar>
+#include <QStackedWidget>
+#include <QToolButton>
+
+namespace designer {
+
+namespace {
+
+constexpr std::chrono::milliseconds betweenLooks(100);
+constexpr std::chrono::seconds serversTime(10); // to stop a statement
+
+QString number(qint64 value) { return QLocale().toString(value); }
+
+} // namespace
+
+// The layout is in ResultsPanelLayout.cpp.
+ResultsPanel::ResultsPanel(Document& document, Database& database, QWidget* parent)
+    : QWidget(parent), mDocument(document), mDatabase(database) {
+    makeActions();
+    makeLayout();
+    mLook.setInterval(betweenLooks);
+    connect(&mLook, &QTimer::timeout, this, &ResultsPanel::progress);
+    mPatience.setInterval(serversTime);
+    mPatience.setSingleShot(true);
+    connect(&mPatience, &QTimer::timeout, this, &ResultsPanel::giveUp);
+    connect(&mDocument, &Document::changed, this, &ResultsPanel::queryChanged);
+    connect(&mDatabase, &Database::opened, this, [this] {
+        if (mDatabase.address() != mAddress) forget();
+    });
+    connect(mTable, &ResultTable::tooMuchToCopy, this, [this] {
+        setStatus(tr("These are too many cells to copy; export the rows instead."));
+    });
+    forget();
+}
+
+ResultsPanel::~ResultsPanel() = default;
+
+QAction* ResultsPanel::copyAction() { return mTable->copyAction(); }
+
+void ResultsPanel::run() {
+    if (isRunning()) return;
+    const auto made = command(limit());
+    if (!made) return;
+    mSpool = std::make_shared<Spool>();
+    mTable->rows().setSpool(mSpool);
+    mFitted = false;
+    mOutdated = false;
+    mPages->setCurrentWidget(mTable);
+    start(*made, mSpool, {});
+    emit shown();
+}
+
+void ResultsPanel::runAll() {
+    setLimit(mostRows);
+    run();
+}
+
+void ResultsPanel::exportTo(const QString& path) {
+    if (isRunning()) return;
+    if (const auto made = command({})) start(*made, std::make_shared<FileExport>(path), path);
+}
+
+/// Nothing when there is none, which is shown, or when the user asks no further.
+std::optional<Command> ResultsPanel::command(std::optional<qint64> limit) {
+    if (!mDatabase.isOpen()) {
+        showMessage(tr("No database is open: open one first."));
+        return {};
+    }
+    mDocument.settle();
+    const auto dialect = mDatabase.dialect();
+    const auto text = statementFor(*mDocument.query(), dialect, limit);
+    if (!text.runnable()) {
+        QStringList lines(tr("The query cannot be run yet:"));
+        for (const model::Finding& finding : text.findings)
+            if (finding.isError())
+                lines << QStringLiteral("\u2022 ") + QString::fromStdU16String(finding.text);
+        showMessage(lines.join(u'\n'));
+        return {};
+    }
+    if (!answerAll(questions(text))) return {};
+    return makeCommand(text, dialect, mAnswers, limit);
+}
+
+/// The answers are kept for the next time.
+bool ResultsPanel::answerAll(const std::vector<Question>& questions) {
+    if (questions.empty()) return true;
+    ParameterDialog dialog(questions, mAnswers, this);
+    if (dialog.exec() != QDialog::Accepted) return false;
+    mAnswers.insert(dialog.answers());
+    return true;
+}
+
+void ResultsPanel::start(const Command& command, const std::shared_ptr<Sink>& sink,
+                         const QString& file) {
+    mStatement = command.statement;
+    mFile = file;
+    if (file.isEmpty()) mAddress = mDatabase.address();
+    mWorker.reset(new Worker(mDatabase.connector(), command, sink));
+    connect(mWorker.get(), &Worker::progressed, this, &ResultsPanel::progress);
+    connect(mWorker.get(), &Worker::ended, this, &ResultsPanel::finish);
+    mRun->setEnabled(false);
+    mExport->setEnabled(false);
+    mCancel->setEnabled(true);
+    mAll->hide();
+    mBusy->show();
+    mClock.start();
+    mLook.start();
+    progress();
+    mWorker->start();
+}
+
+void ResultsPanel::cancel() {
+    if (!isRunning()) return;
+    mWorker->cancel();
+    mCancel->setEnabled(false);
+    mPatience.start();
+    progress();
+}
+
+void ResultsPanel::progress() {
+    if (!isRunning()) return;
+    const bool exporting = !mFile.isEmpty();
+    if (!exporting) {
+        ResultModel& rows = mTable->rows();
+        rows.refresh();
+        if (!mFitted && rows.rowCount() > 0) {
+            mFitted = true;
+            mTable->fitColumns();
+        }
+    }
+    const QString state = !mCancel->isEnabled() ? tr("Cancelling\u2026")
+                          : exporting           ? tr("Exporting\u2026")
+                                                : tr("Running\u2026");
+    setStatus(tr("%1  Rows so far: %2 \u00b7 %3").arg(state, number(mWorker->rows()), seconds()));
+}
+
+/// The server has not answered since it was asked to stop.
+void ResultsPanel::giveUp() {
+    if (!isRunning()) return;
+    // It ends when the connection does; nobody waits for that.
+    Worker* const left = mWorker.release();
+    left->disconnect();
+    connect(left, &QThread::finished, left, &QObject::deleteLater);
+    const QString message = tr("The server does not answer.");
+    stopped();
+    mDatabase.sayLost(message);
+    showMessage(message, mStatement);
+}
+
+void ResultsPanel::stopped() {
+    mLook.stop();
+    mPatience.stop();
+    mWorker.reset();
+    mRun->setEnabled(true);
+    mExport->setEnabled(true);
+    mCancel->setEnabled(false);
+    mBusy->hide();
+}
+
+void ResultsPanel::finish(const Outcome& outcome) {
+    progress();
+    stopped();
+    const QString rows = number(outcome.rows);
+    const bool exporting = !mFile.isEmpty();
+    switch (outcome.end) {
+    case Outcome::End::complete:
+        setStatus(exporting ? tr("Exported to %1. Rows: %2 \u00b7 %3").arg(mFile, rows, seconds())
+                            : tr("Rows: %1 \u00b7 %2").arg(rows, seconds()));
+        break;
+    case Outcome::End::limited:
+        setStatus(tr("First %1 rows; there are more \u00b7 %2").arg(rows, seconds()));
+        mAll->setVisible(outcome.rows < mostRows);
+        break;
+    case Outcome::End::cancelled:
+        setStatus(exporting ? tr("Cancelled; nothing was exported \u00b7 %1").arg(seconds())
+                            : tr("Cancelled. Rows that came: %1 \u00b7 %2").arg(rows, seconds()));
+        break;
+    case Outcome::End::unreachable:
+        showMessage(outcome.message);
+        mDatabase.sayLost(outcome.message);
+        break;
+    case Outcome::End::refused: showMessage(outcome.message); break;
+    case Outcome::End::failed:
+        showMessage(tr("The database did not run the statement:\n%1").arg(outcome.message),
+                    mStatement);
+        break;
+    case Outcome::End::lost:
+        showMessage(tr("The connection to the database has broken down:\n%1").arg(outcome.message),
+                    mStatement);
+        mDatabase.sayLost(outcome.message);
+        break;
+    }
+    if (!exporting && mPages->currentWidget() == mTable && !mFitted) mTable->fitColumns();
+}
+
+void ResultsPanel::askForFile() {
+    const QString path = QFileDialog::getSaveFileName(this, tr("Export all rows"), {},
+                                                      tr("Comma-separated values (*.csv)"));
+    if (path.isEmpty()) return;
+    const bool named = path.endsWith(QLatin1String(".csv"), Qt::CaseInsensitive);
+    exportTo(named ? path : path + QLatin1String(".csv"));
+}
+
+/// Of another database there are no rows yet.
+void ResultsPanel::forget() {
+    stopped();
+    mTable->rows().setSpool(nullptr);
+    mSpool.reset();
+    mAll->hide();
+    mAddress = mDatabase.address();
+    showMessage(tr("Run the query to see its rows here."));
+}
+
+void ResultsPanel::queryChanged() {
+    if (mOutdated || isRunning() || !mSpool || mPages->currentWidget() != mTable) return;
+    mOutdated = true;
+    setStatus(tr("%1 \u00b7 the drawing has changed since").arg(mStatus->toolTip()));
+}
+
+void ResultsPanel::showMessage(const QString& text, const QString& statement) {
+    mMessage->setText(text);
+    mMessageStatement->setPlainText(statement);
+    mMessageStatement->setVisible(!statement.isEmpty());
+    mPages->setCurrentIndex(0);
+    setStatus({});
+    emit shown();
+}
+
+void ResultsPanel::setStatus(const QString& text) {
+    mStatus->setText(text);
+    mStatus->setToolTip(text);
+}
+
+QString ResultsPanel::seconds() const {
+    return tr("%1 s").arg(QLocale().toString(static_cast<double>(mClock.elapsed()) / 1000, 'f', 1));
+}
+
+} // namespace designer

@@ -1,0 +1,104 @@
+#pragma once
+
+#include "designer/run/Worker.h"
+
+#include <QElapsedTimer>
+#include <QTimer>
+#include <QWidget>
+
+class QAction;
+class QComboBox;
+class QLabel;
+class QPlainTextEdit;
+class QProgressBar;
+class QStackedWidget;
+class QToolButton;
+
+namespace designer {
+
+class Database;
+class Document;
+class ResultTable;
+class Spool;
+
+/// Runs the drawn query and shows its rows, or why there are none. One statement runs at a time; it
+/// runs on a thread and a connection of its own.
+class ResultsPanel final : public QWidget {
+    Q_OBJECT
+
+public:
+    /// As many rows as can be shown of one result. The table keeps some bytes for each.
+    static constexpr qint64 mostRows = 10'000'000;
+
+    /// Both outlive the panel.
+    ResultsPanel(Document& document, Database& database, QWidget* parent = nullptr);
+    ~ResultsPanel() override;
+
+    // For menus; each is enabled when it can be used.
+    QAction* runAction() { return mRun; }
+    QAction* cancelAction() { return mCancel; }
+    QAction* exportAction() { return mExport; } ///< asks for the file
+    QAction* copyAction();
+
+    /// Runs the query as it is drawn now and shows its rows, up to the limit. Asks for parameters.
+    void run();
+    /// Ends what is running, on the engine too.
+    void cancel();
+    /// Runs the query and writes all its rows into a file of comma-separated values.
+    void exportTo(const QString& path);
+    bool isRunning() const { return mWorker != nullptr; }
+
+    qint64 limit() const;
+    void setLimit(qint64 rows);
+
+signals:
+    /// Rows or a message are there to be looked at.
+    void shown();
+
+private:
+    void makeActions();
+    void makeLayout();
+    QWidget* makeMessagePage();
+    std::optional<Command> command(std::optional<qint64> limit);
+    bool answerAll(const std::vector<Question>& questions);
+    void start(const Command& command, const std::shared_ptr<Sink>& sink, const QString& file);
+    void progress();
+    void finish(const Outcome& outcome);
+    void giveUp();
+    void stopped();
+    void askForFile();
+    void runAll();
+    void forget();
+    void queryChanged();
+    void showMessage(const QString& text, const QString& statement = {});
+    void setStatus(const QString& text);
+    QString seconds() const;
+
+    Document& mDocument;
+    Database& mDatabase;
+    QString mAddress; ///< where the rows that are shown came from
+    QMap<QString, QString> mAnswers;
+    QString mStatement; ///< that ran last
+    QString mFile;      ///< that is being exported to; empty while rows are shown
+    std::shared_ptr<Spool> mSpool;
+    WorkerPointer mWorker;
+    QElapsedTimer mClock;
+    QTimer mLook;     ///< at what has come
+    QTimer mPatience; ///< with a server that is to stop
+    bool mFitted = false;
+    bool mOutdated = false;
+
+    QAction* mRun;
+    QAction* mCancel;
+    QAction* mExport;
+    QComboBox* mLimit;
+    QProgressBar* mBusy;
+    QStackedWidget* mPages;
+    QLabel* mMessage;
+    QPlainTextEdit* mMessageStatement;
+    ResultTable* mTable;
+    QLabel* mStatus;
+    QToolButton* mAll;
+};
+
+} // namespace designer

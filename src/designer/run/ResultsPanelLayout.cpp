@@ -1,0 +1,129 @@
+#include "designer/run/ResultTable.h"
+#include "designer/run/ResultsPanel.h"
+
+#include <QAction>
+#include <QComboBox>
+#include <QFontDatabase>
+#include <QLabel>
+#include <QLocale>
+#include <QPlainTextEdit>
+#include <QProgressBar>
+#include <QStackedWidget>
+#include <QStyle>
+#include <QToolBar>
+#include <QToolButton>
+#include <QVBoxLayout>
+
+// What the panel looks like.
+
+namespace designer {
+
+namespace {
+
+constexpr qint64 limits[] = {1'000, 10'000, 100'000, 1'000'000, ResultsPanel::mostRows};
+constexpr qint64 usualLimit = 10'000;
+constexpr int busyHeight = 3; // logical pixels
+
+} // namespace
+
+void ResultsPanel::makeActions() {
+    mRun = new QAction(style()->standardIcon(QStyle::SP_MediaPlay), tr("&Run"), this);
+    mRun->setShortcut(Qt::Key_F5);
+    mRun->setToolTip(tr("Run the query and show its rows (F5)"));
+    connect(mRun, &QAction::triggered, this, &ResultsPanel::run);
+
+    mCancel = new QAction(style()->standardIcon(QStyle::SP_MediaStop), tr("&Cancel"), this);
+    mCancel->setToolTip(tr("Stop what is running, on the database too"));
+    connect(mCancel, &QAction::triggered, this, &ResultsPanel::cancel);
+
+    mExport =
+        new QAction(style()->standardIcon(QStyle::SP_DialogSaveButton), tr("&Export\u2026"), this);
+    mExport->setToolTip(tr("Run the query and write all its rows into a CSV file"));
+    connect(mExport, &QAction::triggered, this, &ResultsPanel::askForFile);
+}
+
+void ResultsPanel::makeLayout() {
+    mLimit = new QComboBox(this);
+    mLimit->setObjectName(QStringLiteral("rowLimit"));
+    mLimit->setToolTip(tr("So many rows are shown at most"));
+    for (const qint64 limit : limits)
+        mLimit->addItem(tr("%1 rows").arg(QLocale().toString(limit)), limit);
+    setLimit(usualLimit);
+
+    auto* bar = new QToolBar(this);
+    bar->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
+    const int icon = style()->pixelMetric(QStyle::PM_SmallIconSize);
+    bar->setIconSize(QSize(icon, icon));
+    bar->addAction(mRun);
+    bar->addAction(mCancel);
+    bar->addWidget(mLimit);
+    bar->addAction(mExport);
+
+    mBusy = new QProgressBar(this);
+    mBusy->setRange(0, 0);
+    mBusy->setTextVisible(false);
+    mBusy->setFixedHeight(busyHeight);
+    QSizePolicy keepsItsRoom = mBusy->sizePolicy();
+    keepsItsRoom.setRetainSizeWhenHidden(true);
+    mBusy->setSizePolicy(keepsItsRoom);
+    mBusy->hide();
+
+    mTable = new ResultTable(this);
+    mPages = new QStackedWidget(this);
+    mPages->addWidget(makeMessagePage());
+    mPages->addWidget(mTable);
+
+    mStatus = new QLabel(this);
+    mStatus->setObjectName(QStringLiteral("runStatus"));
+    mStatus->setTextFormat(Qt::PlainText);
+    mStatus->setWordWrap(true);
+    mStatus->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    mAll = new QToolButton(this);
+    mAll->setObjectName(QStringLiteral("allRows"));
+    mAll->setText(tr("All rows"));
+    mAll->setToolTip(tr("Run the query again without the limit"));
+    connect(mAll, &QToolButton::clicked, this, &ResultsPanel::runAll);
+    auto* foot = new QHBoxLayout;
+    foot->setContentsMargins(6, 3, 6, 3);
+    foot->addWidget(mStatus, 1);
+    foot->addWidget(mAll);
+
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins({});
+    layout->setSpacing(0);
+    layout->addWidget(bar);
+    layout->addWidget(mBusy);
+    layout->addWidget(mPages, 1);
+    layout->addLayout(foot);
+}
+
+QWidget* ResultsPanel::makeMessagePage() {
+    auto* page = new QWidget;
+    page->setBackgroundRole(QPalette::Base);
+    page->setAutoFillBackground(true);
+    mMessage = new QLabel(page);
+    mMessage->setObjectName(QStringLiteral("runMessage"));
+    mMessage->setTextFormat(Qt::PlainText);
+    mMessage->setWordWrap(true);
+    mMessage->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
+    mMessageStatement = new QPlainTextEdit(page);
+    mMessageStatement->setObjectName(QStringLiteral("failedStatement"));
+    mMessageStatement->setReadOnly(true);
+    mMessageStatement->setFrameShape(QFrame::NoFrame);
+    mMessageStatement->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
+    auto* layout = new QVBoxLayout(page);
+    layout->setContentsMargins(12, 10, 12, 10);
+    layout->setSpacing(8);
+    layout->addWidget(mMessage);
+    layout->addWidget(mMessageStatement, 1);
+    layout->addStretch();
+    return page;
+}
+
+qint64 ResultsPanel::limit() const { return mLimit->currentData().toLongLong(); }
+
+void ResultsPanel::setLimit(qint64 rows) {
+    if (const int place = mLimit->findData(rows); place >= 0) mLimit->setCurrentIndex(place);
+}
+
+} // namespace designer

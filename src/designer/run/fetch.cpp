@@ -1,0 +1,92 @@
+#include "designer/run/fetch.h"
+
+#include "designer/run/EngineStop.h"
+
+#include <QSqlError>
+#include <QSqlQuery>
+
+namespace designer {
+
+namespace {
+
+QString words(const QSqlError& error) {
+    const QString said = error.databaseText().trimmed();
+    return said.isEmpty() ? error.driverText().trimmed() : said;
+}
+
+bool send(QSqlQuery& query, const Command& command) {
+    // Without values not prepared: the driver would look for placeholders in the texts.
+    if (command.values.isEmpty()) return query.exec(command.statement);
+    if (!query.prepare(command.statement)) return false;
+    for (const QVariant& value : command.values) query.addBindValue(value);
+    return query.exec();
+}
+
+class Fetch {
+public:
+    Fetch(const Connector& connector, const reader::Connection& connection,
+          const std::atomic<bool>& stop)
+        : mConnection(connection), mStop(stop), mEngineStop(connection.database(), connector, stop),
+          mQuery(connection.database()) {
+        mQuery.setForwardOnly(true); // the drivers then neither wait for all rows nor keep them
+        mQuery.setNumericalPrecisionPolicy(QSql::HighPrecision);
+    }
+
+    Outcome run(const Command& command, Sink& sink) {
+        if (!send(mQuery, command)) return broken();
+        CellReader cells(mQuery);
+        if (const auto error = sink.begin(cells.columns()))
+            return leave(Outcome::End::refused, *error);
+        while (mQuery.next()) {
+            if (mStop) return leave(Outcome::End::cancelled);
+            if (command.limit && mRows == *command.limit) {
+                mQuery.finish();
+                return finished(sink, {Outcome::End::limited, {}, mRows});
+            }
+            if (const auto error = sink.add(cells.row()))
+                return leave(Outcome::End::refused, *error);
+            ++mRows;
+        }
+        // A failure between two rows ends the loop like the last row does.
+        if (mQuery.lastError().isValid()) return broken();
+        return finished(sink, {Outcome::End::complete, {}, mRows});
+    }
+
+private:
+    /// The driver would read all rows that are left; so the engine is stopped first.
+    Outcome leave(Outcome::End end, const QString& message = {}) {
+        mEngineStop.stop();
+        mQuery.finish();
+        return {end, message, mRows};
+    }
+
+    Outcome finished(Sink& sink, const Outcome& outcome) {
+        if (const auto error = sink.finish()) return {Outcome::End::refused, *error, mRows};
+        return outcome;
+    }
+
+    Outcome broken() {
+        const QString said = words(mQuery.lastError());
+        mQuery.finish();
+        if (mStop) return {Outcome::End::cancelled, {}, mRows};
+        return {answers(mConnection) ? Outcome::End::failed : Outcome::End::lost, said, mRows};
+    }
+
+    const reader::Connection& mConnection;
+    const std::atomic<bool>& mStop;
+    EngineStop mEngineStop; // outlives the statement
+    QSqlQuery mQuery;
+    qint64 mRows = 0;
+};
+
+} // namespace
+
+Outcome fetch(const Connector& connector, const Command& command, Sink& sink,
+              const std::atomic<bool>& stop) {
+    const auto connection = connector();
+    if (stop) return {Outcome::End::cancelled};
+    if (!connection) return {Outcome::End::unreachable, connection.error()};
+    return Fetch(connector, *connection, stop).run(command, sink);
+}
+
+} // namespace designer

@@ -1,0 +1,105 @@
+#include "designer/shell/Task.h"
+
+#include "designer/shell/Words.h"
+
+#include <QCommandLineParser>
+
+#include <cstdio>
+#include <utility>
+
+namespace designer::shell {
+
+using model::sql::Dialect;
+using reader::Error;
+
+namespace {
+
+const std::pair<const char*, Dialect> dialects[] = {{"sqlite", Dialect::SQLite},
+                                                    {"postgresql", Dialect::PostgreSQL},
+                                                    {"mysql", Dialect::MySQL},
+                                                    {"sqlserver", Dialect::SqlServer},
+                                                    {"standard", Dialect::Standard}};
+
+std::optional<Dialect> dialectNamed(const QString& name) {
+    for (const auto& [known, dialect] : dialects)
+        if (name == QLatin1String(known)) return dialect;
+    return {};
+}
+
+/// What is wrong with the options that say how to run, or nothing.
+std::optional<QString> takeRun(const QCommandLineParser& parser, Task& task) {
+    const QString format = parser.value(QStringLiteral("format"));
+    if (format == QLatin1String("json"))
+        task.format = Format::json;
+    else if (parser.isSet(QStringLiteral("format")) && format != QLatin1String("csv"))
+        return Words::tr("There is no format \"%1\"; write --format csv or --format json.")
+            .arg(format);
+    task.database = parser.value(QStringLiteral("database"));
+    if (parser.isSet(QStringLiteral("limit"))) {
+        bool whole = false;
+        const qint64 limit = parser.value(QStringLiteral("limit")).toLongLong(&whole);
+        constexpr qint64 most = 1'000'000'000'000;
+        if (!whole || limit < 0 || limit > most)
+            return Words::tr("--limit takes a number of rows; write --limit 100.");
+        task.limit = limit;
+    }
+    for (const QString& setting : parser.values(QStringLiteral("set"))) {
+        const qsizetype sign = setting.indexOf(u'=');
+        if (sign < 1)
+            return Words::tr("\"%1\" sets nothing; write --set NAME=VALUE.")
+                .arg(setting.simplified());
+        task.values.insert(setting.left(sign), setting.mid(sign + 1));
+    }
+    return {};
+}
+
+} // namespace
+
+QList<QCommandLineOption> options() {
+    QList<QCommandLineOption> result;
+    for (const char* name : {"sql", "run", "dialect", "format", "database", "limit", "set"})
+        result << QCommandLineOption(QLatin1String(name), {}, QStringLiteral("value"));
+    return result;
+}
+
+reader::Result<std::optional<Task>> taskOf(const QCommandLineParser& parser) {
+    const bool prints = parser.isSet(QStringLiteral("sql"));
+    const bool runs = parser.isSet(QStringLiteral("run"));
+    if (prints && runs) return Error{Words::tr("--sql and --run go one at a time.")};
+    for (const QString& name : {QStringLiteral("format"), QStringLiteral("database"),
+                                QStringLiteral("limit"), QStringLiteral("set")})
+        if (parser.isSet(name) && !runs)
+            return Error{Words::tr("--%1 goes with --run only.").arg(name)};
+    if (parser.isSet(QStringLiteral("dialect")) && !prints)
+        return Error{Words::tr("--dialect goes with --sql only.")};
+    if (!prints && !runs) return std::optional<Task>();
+
+    Task task;
+    task.kind = prints ? Task::Kind::printStatement : Task::Kind::runQuery;
+    task.query = parser.value(prints ? QStringLiteral("sql") : QStringLiteral("run"));
+    if (task.query.isEmpty())
+        return Error{Words::tr("No query is named; write --%1 query.json.")
+                         .arg(QLatin1String(prints ? "sql" : "run"))};
+    if (parser.isSet(QStringLiteral("dialect"))) {
+        const QString name = parser.value(QStringLiteral("dialect"));
+        task.dialect = dialectNamed(name);
+        if (!task.dialect)
+            return Error{
+                Words::tr("There is no dialect \"%1\"; known are sqlite, postgresql, mysql, "
+                          "sqlserver and standard.")
+                    .arg(name)};
+    }
+    if (const auto wrong = takeRun(parser, task)) return Error{*wrong};
+    return std::optional<Task>(task);
+}
+
+int perform(const Task& task) {
+    return task.kind == Task::Kind::printStatement ? printStatement(task) : runQuery(task);
+}
+
+void complain(const QString& what) {
+    const QByteArray line = "zandor-designer: " + what.simplified().toLocal8Bit() + '\n';
+    std::fputs(line.constData(), stderr);
+}
+
+} // namespace designer::shell

@@ -1,0 +1,51 @@
+#pragma once
+
+#include "model/reader/Result.h"
+#include "model/sql/Dialect.h"
+
+#include <QMap>
+#include <QStringList>
+
+#include <optional>
+
+class QCommandLineOption;
+class QCommandLineParser;
+
+/// What the designer does in a shell, without a window.
+namespace designer::shell {
+
+enum class Format { csv, json };
+
+struct Task {
+    enum class Kind { printStatement, runQuery };
+
+    Kind kind = Kind::printStatement;
+    QString query;                                   ///< the file
+    std::optional<model::sql::Dialect> dialect = {}; ///< nothing: that of the query's database
+    Format format = Format::csv;
+    QString database = {}; ///< an address; empty: the one that the query names
+    std::optional<qint64> limit = {};
+    QMap<QString, QString> values = {}; ///< of the parameters
+};
+
+/// The options by which a task is given.
+QList<QCommandLineOption> options();
+/// The task that a command line asks for; nothing when it asks for none.
+reader::Result<std::optional<Task>> taskOf(const QCommandLineParser& parser);
+
+/// Does a task, and returns the program's exit code. Needs a QCoreApplication and no display. What
+/// went wrong is on the standard error stream, in one line.
+int perform(const Task& task);
+
+// What perform() is made of.
+int printStatement(const Task& task);
+int runQuery(const Task& task);
+
+inline constexpr int allWell = 0;
+inline constexpr int failed = 1;   ///< the statement could not be written or run
+inline constexpr int unusable = 2; ///< arguments, a file or the database
+
+/// Writes a line to the standard error stream, with the program's name before it.
+void complain(const QString& what);
+
+} // namespace designer::shell

@@ -1,0 +1,13 @@
+#pragma once
+
+#include <QString>
+
+#include <optional>
+
+namespace designer::shell {
+
+/// Asks the person at the terminal for a password, which is not shown. Nothing when there is no
+/// terminal, or no answer.
+std::optional<QString> askPassword(const QString& address);
+
+} // namespace designer::shell

@@ -1,0 +1,44 @@
+#include "designer/database/Address.h"
+#include "designer/shell/Task.h"
+#include "model/files/QueryDocument.h"
+#include "model/sql/Builder.h"
+
+#include <QFile>
+
+#include <cstdio>
+
+namespace designer::shell {
+
+using model::sql::Dialect;
+
+namespace {
+
+Dialect dialectFor(const QString& database) {
+    const auto address = parseAddress(database);
+    if (!address) return Dialect::SQLite;
+    switch (address->engine) {
+    case Engine::PostgreSQL: return Dialect::PostgreSQL;
+    case Engine::MySQL: return Dialect::MySQL;
+    case Engine::ODBC: return Dialect::Standard;
+    case Engine::SQLite: break;
+    }
+    return Dialect::SQLite;
+}
+
+} // namespace
+
+int printStatement(const Task& task) {
+    const auto document = files::loadQuery(QFile::encodeName(task.query).toStdString());
+    if (!document) return complain(QString::fromStdString(document.error())), unusable;
+    const Dialect dialect =
+        task.dialect ? *task.dialect : dialectFor(QString::fromStdU16String(document->database));
+    const auto text = statementText(*document->query, dialect, model::sql::ValueForm::literal);
+    for (const model::Finding& finding : text.findings)
+        complain(QString::fromStdU16String(finding.text));
+    // One with something left out would not say what was drawn.
+    if (!text.runnable()) return failed;
+    std::fputs((platform::toUtf8(text.text) + '\n').c_str(), stdout);
+    return std::fflush(stdout) == 0 ? allWell : unusable;
+}
+
+} // namespace designer::shell

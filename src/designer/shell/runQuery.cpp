@@ -1,0 +1,142 @@
+#include "designer/database/Address.h"
+#include "designer/run/CsvWriter.h"
+#include "designer/run/JsonWriter.h"
+#include "designer/shell/Task.h"
+#include "designer/shell/Words.h"
+#include "designer/shell/askPassword.h"
+#include "model/files/QueryDocument.h"
+#include "model/reader/dialectOf.h"
+#include "model/reader/serverError.h"
+
+#include <QFile>
+
+#include <csignal>
+
+#include <unistd.h>
+
+namespace designer::shell {
+
+namespace {
+
+constexpr int mostTries = 3; // for a password
+
+std::atomic<bool> stopWished = false;
+static_assert(std::atomic<bool>::is_always_lock_free); // a signal sets it
+
+extern "C" void wishStop(int signal) {
+    stopWished = true;
+    std::signal(signal, SIG_DFL); // a second one ends the program whatever it does
+}
+
+void heedSignals() {
+    std::signal(SIGINT, wishStop);
+    std::signal(SIGTERM, wishStop);
+    // Whoever reads the rows has enough of them: an end without a word, as of any program in a
+    // pipe. The parent may have turned that off.
+    std::signal(SIGPIPE, SIG_DFL);
+}
+
+struct Opened {
+    model::sql::Dialect dialect;
+    Connector connector; ///< gives the first connection only once
+};
+
+/// Asks for a password where the server does.
+reader::Result<Opened> openDatabase(const QString& address) {
+    auto [bare, password] = partPassword(address);
+    auto connection = reader::openDatabase(bare, password);
+    for (int tries = 0; !connection && tries < mostTries; ++tries) {
+        if (!reader::asksForPassword(connection.error())) break;
+        const auto typed = askPassword(bare);
+        if (!typed) break;
+        password = *typed;
+        connection = reader::openDatabase(bare, password);
+    }
+    if (!connection) return reader::Error{connection.error()};
+    const auto dialect = reader::dialectOf(connection->database());
+    const auto first = std::make_shared<std::optional<reader::Connection>>(std::move(*connection));
+    const Connector others = Database::connectorTo(bare, password);
+    return Opened{dialect, [first, others]() -> reader::Result<reader::Connection> {
+                      if (!*first) return others();
+                      reader::Connection taken = std::move(**first);
+                      first->reset();
+                      return taken;
+                  }};
+}
+
+/// What is wrong with the values for the parameters, or nothing.
+std::optional<QString> complaint(const std::vector<Question>& questions, const Answers& values) {
+    for (const Question& question : questions) {
+        if (!values.contains(question.name))
+            return Words::tr("The query asks for \"%1\"; give it with --set \"%1=VALUE\".")
+                .arg(question.name);
+        if (!fits(question, values[question.name]))
+            return Words::tr("The query asks for \"%1\", which has to be %2; \"%3\" is not.")
+                .arg(question.name, wanted(question), values[question.name]);
+    }
+    for (const QString& name : values.keys()) {
+        const bool asked = std::any_of(questions.begin(), questions.end(),
+                                       [&](const Question& each) { return each.name == name; });
+        if (!asked)
+            return Words::tr("The query does not ask for \"%1\"; leave out its --set.").arg(name);
+    }
+    return {};
+}
+
+int exitCode(const Outcome& outcome) {
+    switch (outcome.end) {
+    case Outcome::End::complete:
+    case Outcome::End::limited: return allWell;
+    case Outcome::End::cancelled: complain(Words::tr("Cancelled.")); return failed;
+    case Outcome::End::failed:
+    case Outcome::End::lost: complain(outcome.message); return failed;
+    case Outcome::End::unreachable:
+    case Outcome::End::refused: break;
+    }
+    complain(outcome.message);
+    return unusable;
+}
+
+std::unique_ptr<Sink> makeWriter(Format format, QIODevice& device) {
+    if (format == Format::json) return std::make_unique<JsonWriter>(device);
+    return std::make_unique<CsvWriter>(device);
+}
+
+} // namespace
+
+int runQuery(const Task& task) {
+    const auto document = files::loadQuery(QFile::encodeName(task.query).toStdString());
+    if (!document) return complain(QString::fromStdString(document.error())), unusable;
+    const QString address =
+        task.database.isEmpty() ? QString::fromStdU16String(document->database) : task.database;
+    if (address.isEmpty())
+        return complain(Words::tr("The query names no database; give one with --database.")),
+               unusable;
+    heedSignals();
+    const auto opened = openDatabase(address);
+    if (!opened) return complain(opened.error()), unusable;
+
+    const auto text = statementFor(*document->query, opened->dialect, task.limit);
+    if (!text.runnable()) {
+        for (const model::Finding& finding : text.findings)
+            if (finding.isError()) complain(QString::fromStdU16String(finding.text));
+        return failed;
+    }
+    if (const auto wrong = complaint(questions(text), task.values))
+        return complain(*wrong), unusable;
+
+    QFile out;
+    // On a terminal one sees each row as it comes.
+    const auto buffering = isatty(STDOUT_FILENO) ? QIODevice::Unbuffered : QIODevice::NotOpen;
+    if (!out.open(STDOUT_FILENO, QIODevice::WriteOnly | buffering))
+        return complain(out.errorString()), unusable;
+    const auto command = makeCommand(text, opened->dialect, task.values, task.limit);
+    const auto writer = makeWriter(task.format, out);
+    const Outcome outcome = fetch(opened->connector, command, *writer, stopWished);
+    const bool written = out.flush() && out.error() == QFileDevice::NoError;
+    if (!written && outcome.end == Outcome::End::complete)
+        return complain(out.errorString()), unusable;
+    return exitCode(outcome);
+}
+
+} // namespace designer::shell

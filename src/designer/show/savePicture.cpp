@@ -1,0 +1,85 @@
+#include "designer/show/savePicture.h"
+
+#include "designer/show/DrawingPicture.h"
+
+#include <QBuffer>
+#include <QCoreApplication>
+#include <QFileInfo>
+#include <QImage>
+#include <QPageSize>
+#include <QPainter>
+#include <QPdfWriter>
+#include <QPrinter>
+#include <QSaveFile>
+
+namespace designer {
+
+namespace {
+
+constexpr qreal pngScale = 2;
+constexpr int pixelsPerInch = 96; // of a logical pixel
+constexpr qreal pointsPerPixel = 72.0 / pixelsPerInch;
+
+QString tr(const char* text) { return QCoreApplication::translate("designer::savePicture", text); }
+
+bool writePng(const DrawingPicture& picture, QIODevice& file) {
+    return picture.image(pngScale).save(&file, "PNG");
+}
+
+bool writeSvg(const DrawingPicture& picture, QIODevice& file) {
+    return file.write(picture.svg()) > 0;
+}
+
+bool writePdf(const DrawingPicture& picture, QIODevice& file) {
+    QPdfWriter writer(&file);
+    writer.setResolution(pixelsPerInch);
+    writer.setPageSize(QPageSize(QSizeF(picture.size()) * pointsPerPixel, QPageSize::Point, {},
+                                 QPageSize::ExactMatch));
+    writer.setPageMargins({});
+    QPainter painter;
+    if (!painter.begin(&writer)) return false;
+    picture.paint(painter, QRectF(0, 0, writer.width(), writer.height()));
+    return painter.end();
+}
+
+} // namespace
+
+std::optional<QString> savePicture(const DrawingPicture& picture, const QString& path) {
+    if (picture.isEmpty()) return tr("There is nothing to draw; add a table first.");
+    const QString suffix = QFileInfo(path).suffix().toLower();
+    using Write = bool (*)(const DrawingPicture&, QIODevice&);
+    const Write write = suffix == QLatin1String("png")   ? writePng
+                        : suffix == QLatin1String("svg") ? writeSvg
+                        : suffix == QLatin1String("pdf") ? writePdf
+                                                         : nullptr;
+    if (!write) return tr("A picture ends in .png, .svg or .pdf; \"%1\" does not.").arg(path);
+
+    // In memory first: not every writer says when its file runs out of room.
+    QBuffer content;
+    content.open(QIODevice::WriteOnly);
+    const bool drawn = write(picture, content);
+    content.close();
+    QSaveFile file(path);
+    if (!drawn || !file.open(QIODevice::WriteOnly) ||
+        file.write(content.data()) != content.data().size() || !file.commit())
+        return tr("The picture \"%1\" cannot be written; check the folder and your permissions.")
+            .arg(path);
+    return {};
+}
+
+std::optional<QString> printPicture(const DrawingPicture& picture, QPrinter& printer) {
+    if (picture.isEmpty()) return tr("There is nothing to draw; add a table first.");
+    QPainter painter;
+    if (!painter.begin(&printer)) return tr("The printer cannot be reached; choose another one.");
+    const QRectF page(0, 0, printer.width(), printer.height());
+    const QSizeF natural = QSizeF(picture.size()) * printer.resolution() / pixelsPerInch;
+    // At the top, where a reader begins.
+    const QSizeF fitted = natural.width() > page.width() || natural.height() > page.height()
+                              ? natural.scaled(page.size(), Qt::KeepAspectRatio)
+                              : natural;
+    picture.paint(painter, QRectF({(page.width() - fitted.width()) / 2, 0}, fitted));
+    if (!painter.end()) return tr("The page could not be printed; see the printer's own messages.");
+    return {};
+}
+
+} // namespace designer

@@ -1,0 +1,21 @@
+#pragma once
+
+#include <QString>
+
+#include <optional>
+
+class QPrinter;
+
+namespace designer {
+
+class DrawingPicture;
+
+/// Writes a picture as its name's suffix says: ".png" (two pixels for a logical one), ".svg" or
+/// ".pdf" (one page of the drawing's size). The file is replaced when all of it is written. Returns
+/// what went wrong.
+std::optional<QString> savePicture(const DrawingPicture& picture, const QString& path);
+
+/// Onto one page, as large as fits, but never enlarged. Returns what went wrong.
+std::optional<QString> printPicture(const DrawingPicture& picture, QPrinter& printer);
+
+} // namespace designer

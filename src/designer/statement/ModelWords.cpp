@@ -1,0 +1,153 @@
+#include "designer/statement/ModelWords.h"
+
+#include <QCoreApplication>
+#include <QRegularExpression>
+
+#include <vector>
+
+namespace designer {
+
+namespace {
+
+constexpr const char* messages[] = {
+    // the query
+    QT_TRANSLATE_NOOP("Model", "The query has no tables: add one first."),
+    QT_TRANSLATE_NOOP("Model", "An output column has no column of the query: delete it."),
+    QT_TRANSLATE_NOOP("Model", "%1.* cannot be sorted: sort one of its columns."),
+    QT_TRANSLATE_NOOP("Model", "%1.* cannot have a criterion: give one to one of its columns."),
+    QT_TRANSLATE_NOOP("Model", "Two output columns are named %1: give one of them a synonym."),
+    // joins
+    QT_TRANSLATE_NOOP("Model", "%1 and %2 hold different kinds of values: the join will find "
+                               "nothing or fail."),
+    QT_TRANSLATE_NOOP("Model", "The outer join between %1 and %2 has no effect: normal joins "
+                               "connect them too."),
+    QT_TRANSLATE_NOOP("Model", "The outer joins around %1 and %2 contradict each other: the one "
+                               "drawn first decides which rows are kept."),
+    QT_TRANSLATE_NOOP("Model", "The outer joins around %1 can be read in several ways: change the "
+                               "type of one of them."),
+    QT_TRANSLATE_NOOP("Model", "No join connects %1 with %2: every row of one comes with every "
+                               "row of the other."),
+    // dialects
+    QT_TRANSLATE_NOOP("Model", "MySQL/MariaDB has no full outer join: make it a left or a right "
+                               "one."),
+    QT_TRANSLATE_NOOP("Model", "PostgreSQL joins both outer only on equal columns: use the "
+                               "operator =, or make it a left or a right outer join."),
+    QT_TRANSLATE_NOOP("Model", "SQLite takes about 900 conditions in a row: use In for a long "
+                               "list."),
+    QT_TRANSLATE_NOOP("Model", "%1 cannot carry an empty name."),
+    QT_TRANSLATE_NOOP("Model", "%1 cannot carry a name with the character zero in it."),
+    QT_TRANSLATE_NOOP("Model", "%1 cannot carry a name with half a character in it."),
+    QT_TRANSLATE_NOOP("Model", "%1 cannot carry the name \"%2\", it has more than %3 bytes."),
+    QT_TRANSLATE_NOOP("Model", "%1 cannot carry the name \"%2\", it has more than %3 characters."),
+    QT_TRANSLATE_NOOP("Model",
+                      "%1 cannot carry the name \"%2\", it has a character beyond U+FFFF."),
+    QT_TRANSLATE_NOOP("Model", "%1 cannot carry the name \"%2\", it ends with a blank."),
+    // criteria
+    QT_TRANSLATE_NOOP("Model", "%1: At character %2: %3."),
+    QT_TRANSLATE_NOOP("Model", "expected And, Or or the end"),
+    QT_TRANSLATE_NOOP("Model", "expected less nesting, 100 levels are the most"),
+    QT_TRANSLATE_NOOP("Model", "expected a closing %1"),
+    QT_TRANSLATE_NOOP("Model", "expected ( after In"),
+    QT_TRANSLATE_NOOP("Model", "expected Null, a text that begins so needs quotes"),
+    QT_TRANSLATE_NOOP("Model", "expected a comparison, Like works on columns that hold text"),
+    QT_TRANSLATE_NOOP("Model", "expected a pattern, as in Like 'A*', not a column"),
+    QT_TRANSLATE_NOOP("Model", "expected a pattern, as in Like 'A*'"),
+    QT_TRANSLATE_NOOP("Model", "expected And and the upper value"),
+    QT_TRANSLATE_NOOP("Model", "expected a comma or a closing )"),
+    QT_TRANSLATE_NOOP("Model", "expected a value, write Is Null for a missing one or 'Null' for "
+                               "the word"),
+    QT_TRANSLATE_NOOP("Model", "expected the parameter's name"),
+    QT_TRANSLATE_NOOP("Model", "expected the column's name"),
+    QT_TRANSLATE_NOOP("Model", "expected a column of the query, there is no %1"),
+    QT_TRANSLATE_NOOP("Model", "expected a column of the query, the table that had this one was "
+                               "deleted"),
+    QT_TRANSLATE_NOOP("Model", "expected the table too, as in %1, several tables have this "
+                               "column"),
+    QT_TRANSLATE_NOOP("Model", "expected a column that holds %1"),
+    QT_TRANSLATE_NOOP("Model", "expected the end, a criterion has at most 10000 characters"),
+    QT_TRANSLATE_NOOP("Model", "expected a character, found the character zero"),
+    QT_TRANSLATE_NOOP("Model", "expected a character, found half of one"),
+    QT_TRANSLATE_NOOP("Model", "expected a [ before this ]"),
+    QT_TRANSLATE_NOOP("Model", "expected an operator, write <> for unequal"),
+    QT_TRANSLATE_NOOP("Model", "expected a name between the brackets"),
+    QT_TRANSLATE_NOOP("Model", "expected a text"),
+    QT_TRANSLATE_NOOP("Model", "expected a number"),
+    QT_TRANSLATE_NOOP("Model", "expected a date (2024-12-31)"),
+    QT_TRANSLATE_NOOP("Model", "expected a time (23:59)"),
+    QT_TRANSLATE_NOOP("Model", "expected a date and time (2024-12-31 23:59)"),
+    QT_TRANSLATE_NOOP("Model", "expected true or false"),
+    QT_TRANSLATE_NOOP("Model", "expected Is Null, a column or a parameter"),
+    QT_TRANSLATE_NOOP("Model", "expected a value"),
+    // what a column holds
+    QT_TRANSLATE_NOOP("Model", "a text"),
+    QT_TRANSLATE_NOOP("Model", "a number"),
+    QT_TRANSLATE_NOOP("Model", "a date (2024-12-31)"),
+    QT_TRANSLATE_NOOP("Model", "a time (23:59)"),
+    QT_TRANSLATE_NOOP("Model", "a date and time (2024-12-31 23:59)"),
+    QT_TRANSLATE_NOOP("Model", "true or false"),
+    QT_TRANSLATE_NOOP("Model", "Is Null, a column or a parameter"),
+};
+
+/// Whether the last of what was put into a message is a message of its own.
+bool nests(QLatin1String english) {
+    return english.endsWith(QLatin1String(": %3.")) || english.endsWith(QLatin1String("holds %1"));
+}
+
+/// A message as it is recognised: its own text around what was put into it.
+struct Message {
+    const char* english;
+    QRegularExpression shape;
+};
+
+QRegularExpression shapeOf(const char* english) {
+    static const QRegularExpression placeholder(QStringLiteral("\\\\%[1-9]"));
+    QString shape = QRegularExpression::escape(QString::fromLatin1(english));
+    shape.replace(placeholder, QStringLiteral("(.*?)"));
+    return QRegularExpression(QRegularExpression::anchoredPattern(shape),
+                              QRegularExpression::DotMatchesEverythingOption);
+}
+
+const std::vector<Message>& shapes() {
+    static const std::vector<Message> all = [] {
+        std::vector<Message> result;
+        for (const char* english : messages) result.push_back({english, shapeOf(english)});
+        return result;
+    }();
+    return all;
+}
+
+/// Puts texts in the place of %1 and so on, all at once: a name may have such a mark in it.
+QString filled(const QString& pattern, const QStringList& texts) {
+    QString result;
+    for (qsizetype at = 0; at < pattern.size(); ++at) {
+        const int number = at + 1 < pattern.size() ? pattern[at + 1].digitValue() : -1;
+        if (pattern[at] == u'%' && number >= 1 && number <= texts.size()) {
+            result += texts[number - 1];
+            ++at;
+        } else {
+            result += pattern[at];
+        }
+    }
+    return result;
+}
+
+} // namespace
+
+QString inWords(const QString& message) {
+    for (const auto& [english, shape] : shapes()) {
+        const auto match = shape.match(message);
+        if (!match.hasMatch()) continue;
+        QStringList texts = match.capturedTexts().mid(1);
+        if (nests(QLatin1String(english))) texts.last() = inWords(texts.last());
+        return filled(QCoreApplication::translate("Model", english), texts);
+    }
+    return message;
+}
+
+QStringList knownMessages() {
+    QStringList result;
+    for (const char* english : messages) result << QString::fromLatin1(english);
+    return result;
+}
+
+} // namespace designer

@@ -1,0 +1,15 @@
+#pragma once
+
+#include <QString>
+#include <QStringList>
+
+namespace designer {
+
+/// A message of the query model, which speaks English, in the designer's language; as it stands
+/// when it is not one that the designer knows.
+QString inWords(const QString& message);
+
+/// The messages that it knows, in English, with %1 and so on in the place of names and numbers.
+QStringList knownMessages();
+
+} // namespace designer

@@ -1,0 +1,174 @@
+#include "designer/statement/StatementPanel.h"
+
+#include "designer/document/Document.h"
+#include "designer/statement/ModelWords.h"
+#include "designer/statement/SqlView.h"
+#include "model/sql/Builder.h"
+#include "platform/qt/Text.h"
+
+#include <QBoxLayout>
+#include <QClipboard>
+#include <QComboBox>
+#include <QGuiApplication>
+#include <QKeyEvent>
+#include <QListWidget>
+#include <QPushButton>
+#include <QSplitter>
+#include <QStyle>
+
+#include <algorithm>
+#include <iterator>
+
+namespace designer {
+
+namespace {
+
+using model::sql::Dialect;
+using platform::qt::toQt;
+
+QString shownName(Dialect dialect) { return toQt(model::sql::nameOf(dialect)); }
+
+} // namespace
+
+StatementPanel::StatementPanel(Document& document, QWidget* parent)
+    : QWidget(parent), mDocument(document), mDialects(new QComboBox),
+      mCopy(new QPushButton(tr("Copy"))), mView(new SqlView), mList(new QListWidget) {
+    mDialects->addItem({});
+    for (const Dialect dialect : model::sql::allDialects) mDialects->addItem(shownName(dialect));
+    mDialects->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+    mDialects->setMinimumContentsLength(8);
+    mDialects->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
+    mDialects->setToolTip(tr("The dialect of SQL that the statement is written in"));
+    mDialects->setAccessibleName(tr("Dialect"));
+    setDatabaseDialect(mDatabaseDialect);
+    mCopy->setToolTip(tr("Copy the statement to the clipboard"));
+    mView->setAccessibleName(tr("SQL statement"));
+    mView->setFrameShape(QFrame::NoFrame);
+    mList->setAccessibleName(tr("Findings"));
+    mList->setWordWrap(true);
+    mList->setIconSize({16, 16});
+    mList->setResizeMode(QListView::Adjust);
+    mList->setFrameShape(QFrame::NoFrame);
+    mList->setToolTip(tr("Click a finding to see its place"));
+    mList->installEventFilter(this);
+
+    auto* const top = new QHBoxLayout;
+    top->setContentsMargins(6, 4, 6, 4);
+    top->setSpacing(6);
+    top->addWidget(mDialects, 1);
+    top->addWidget(mCopy);
+    auto* const parts = new QSplitter(Qt::Vertical);
+    parts->addWidget(mView);
+    parts->addWidget(mList);
+    parts->setChildrenCollapsible(false);
+    parts->setStretchFactor(0, 3);
+    parts->setStretchFactor(1, 1);
+    auto* const layout = new QVBoxLayout(this);
+    layout->setContentsMargins({});
+    layout->setSpacing(0);
+    layout->addLayout(top);
+    layout->addWidget(parts, 1);
+
+    mSoon.setSingleShot(true);
+    connect(&mSoon, &QTimer::timeout, this, &StatementPanel::showNow);
+    connect(&document, &Document::changed, this, &StatementPanel::queue);
+    connect(mDialects, &QComboBox::currentIndexChanged, this, &StatementPanel::queue);
+    connect(mCopy, &QPushButton::clicked, this, &StatementPanel::copy);
+    connect(mList, &QListWidget::itemClicked, this,
+            [this](QListWidgetItem* item) { choose(mList->row(item)); });
+    showNow();
+}
+
+void StatementPanel::setDatabaseDialect(Dialect dialect) {
+    mDatabaseDialect = dialect;
+    mDialects->setItemText(0, tr("%1 (as the database)").arg(shownName(dialect)));
+    queue();
+}
+
+Dialect StatementPanel::dialect() const {
+    const int chosen = mDialects->currentIndex();
+    return chosen <= 0 ? mDatabaseDialect : model::sql::allDialects[chosen - 1];
+}
+
+void StatementPanel::copy() {
+    if (!mView->statement().isEmpty()) QGuiApplication::clipboard()->setText(mView->statement());
+}
+
+void StatementPanel::queue() {
+    mOutdated = true;
+    if (isVisible()) mSoon.start();
+}
+
+void StatementPanel::showEvent(QShowEvent* event) {
+    QWidget::showEvent(event);
+    if (mOutdated) showNow();
+}
+
+bool StatementPanel::event(QEvent* event) {
+    // The list's icons are the style's.
+    if (event->type() == QEvent::StyleChange || event->type() == QEvent::PaletteChange) queue();
+    return QWidget::event(event);
+}
+
+bool StatementPanel::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == mList && event->type() == QEvent::KeyPress) {
+        const int key = static_cast<QKeyEvent*>(event)->key();
+        if (key == Qt::Key_Return || key == Qt::Key_Enter || key == Qt::Key_Space)
+            return choose(mList->currentRow()), true;
+    }
+    return QWidget::eventFilter(watched, event);
+}
+
+void StatementPanel::showNow() {
+    mSoon.stop();
+    mOutdated = false;
+    const auto written =
+        model::sql::statementText(*mDocument.query(), dialect(), model::sql::ValueForm::literal);
+    const QString text = toQt(written.text);
+    QString instead;
+    if (mDocument.query()->Tables().Count() == 0) {
+        instead = tr("Add a table to begin: the statement appears here.");
+    } else if (text.isEmpty()) {
+        QStringList why{tr("%1 cannot say this query:").arg(shownName(dialect()))};
+        for (const model::Finding& finding : written.findings)
+            if (finding.isError()) why << inWords(toQt(finding.text));
+        instead = why.join(QStringLiteral("\n\n"));
+    }
+    mView->setPlaceholderText(instead);
+    mView->setAccessibleDescription(instead);
+    mView->setStatement(text);
+    mCopy->setEnabled(!text.isEmpty());
+    showFindings(written.findings);
+}
+
+void StatementPanel::showFindings(const model::Findings& findings) {
+    const int current = mList->currentRow();
+    mFindings.clear();
+    // That there is nothing yet is said where the statement will be.
+    std::copy_if(
+        findings.begin(), findings.end(), std::back_inserter(mFindings),
+        [](const auto& finding) { return finding.kind != model::Finding::Kind::noTables; });
+    std::stable_partition(mFindings.begin(), mFindings.end(),
+                          [](const auto& finding) { return finding.isError(); });
+    mList->clear();
+    for (const model::Finding& finding : mFindings) {
+        const bool error = finding.isError();
+        auto* const item =
+            new QListWidgetItem(style()->standardIcon(error ? QStyle::SP_MessageBoxCritical
+                                                            : QStyle::SP_MessageBoxWarning),
+                                inWords(toQt(finding.text)), mList);
+        item->setData(Qt::AccessibleTextRole,
+                      (error ? tr("Error: %1") : tr("Warning: %1")).arg(item->text()));
+    }
+    mList->setCurrentRow(std::min(current, mList->count() - 1));
+    mList->setVisible(!mFindings.empty());
+}
+
+void StatementPanel::choose(int row) {
+    if (row < 0 || row >= static_cast<int>(mFindings.size())) return;
+    // By value: whoever shows the place may change the findings.
+    const model::Finding finding = mFindings[static_cast<std::size_t>(row)];
+    emit findingChosen(finding);
+}
+
+} // namespace designer

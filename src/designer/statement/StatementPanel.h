@@ -1,0 +1,64 @@
+#pragma once
+
+#include "model/Finding.h"
+#include "model/sql/Dialect.h"
+
+#include <QTimer>
+#include <QWidget>
+
+class QComboBox;
+class QListWidget;
+class QPushButton;
+
+namespace designer {
+
+class Document;
+class SqlView;
+
+/// The statement that the document's query draws, always as it is now, and what there is to say
+/// about it. It is made when control returns to the event loop, and only while it can be seen.
+class StatementPanel final : public QWidget {
+    Q_OBJECT
+
+public:
+    explicit StatementPanel(Document& document, QWidget* parent = nullptr);
+
+    /// The dialect of the open database, which the statement is in unless another is chosen.
+    void setDatabaseDialect(model::sql::Dialect dialect);
+    /// The one that the statement is in.
+    model::sql::Dialect dialect() const;
+
+    QSize minimumSizeHint() const override { return {200, 160}; }
+
+signals:
+    /// Somebody wants to see what a finding is about.
+    void findingChosen(const model::Finding& finding);
+
+public slots:
+    /// Puts the statement on the clipboard, if there is one.
+    void copy();
+
+protected:
+    bool event(QEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+
+private:
+    void queue();
+    void showNow();
+    void showFindings(const model::Findings& findings);
+    void choose(int row);
+
+    Document& mDocument;
+    model::sql::Dialect mDatabaseDialect = model::sql::Dialect::SQLite;
+    model::Findings mFindings; ///< in the order of the list
+    QTimer mSoon;
+    bool mOutdated = true;
+
+    QComboBox* mDialects;
+    QPushButton* mCopy;
+    SqlView* mView;
+    QListWidget* mList;
+};
+
+} // namespace designer

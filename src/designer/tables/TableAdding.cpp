@@ -1,0 +1,101 @@
+#include "designer/tables/TableAdding.h"
+
+#include "designer/DrawingArea.h"
+#include "designer/OpenedQuery.h"
+#include "designer/canvasSize.h"
+#include "designer/database/patiently.h"
+#include "designer/database/readTables.h"
+#include "designer/document/Document.h"
+#include "designer/tables/placeTables.h"
+#include "model/reader/addTables.h"
+
+namespace designer {
+
+using platform::Each;
+using platform::Ref;
+using reader::TableId;
+
+namespace {
+
+constexpr int besideCanvas = 24 * twipsPerPixel; // the scroll bar and a little air
+// Below it, sixteen tables would reach deeper than the control can say.
+constexpr int leastCanvasWidth = 800 * twipsPerPixel;
+
+std::vector<TableId> sourcesOf(model::Query& query) {
+    std::vector<TableId> sources;
+    for (const auto& each : Each<TalvikZandorLib::ZDTable>(query.Tables())) {
+        const auto table = std::static_pointer_cast<model::Table>(each);
+        sources.push_back({table->schema(), table->sourceName()});
+    }
+    return sources;
+}
+
+} // namespace
+
+TableAdding::TableAdding(Document& document, Database& database, DrawingArea& area)
+    : QObject(&area), mDocument(document), mDatabase(database), mArea(area) {}
+
+void TableAdding::add(const std::vector<TableId>& tables, std::optional<QPoint> place) {
+    if (tables.empty() || !mDatabase.isOpen()) return;
+    const auto present = static_cast<std::size_t>(mDocument.query()->Tables().Count());
+    if (present + tables.size() > mostTables) {
+        emit refused(
+            tables.size() == 1
+                ? tr("The drawing takes %1 tables, and has them; delete one first.").arg(mostTables)
+                : tr("The drawing takes %1 tables and has %2; choose fewer.")
+                      .arg(mostTables)
+                      .arg(present));
+        return;
+    }
+    if (!readBefore(tables) || !fits(tables)) return;
+
+    const QString step =
+        tables.size() == 1 ? tr("Add table %1").arg(QString::fromStdU16String(tables.front().name))
+                           : tr("Add %1 tables").arg(tables.size());
+    QString last;
+    mDocument.change(step, [&](model::Query& query) {
+        const auto added = reader::addTables(query, mDatabase.reader(), tables, canvasWidth());
+        if (!added) return; // it went well on the copy
+        if (place) placeAt(query, *added, *place);
+        last = QString::fromStdU16String(added->back()->Name());
+    });
+    if (!last.isEmpty()) emit added(last);
+}
+
+/// Everything that adding asks for, so that it does not wait for the server then.
+bool TableAdding::readBefore(const std::vector<TableId>& tables) {
+    std::vector<TableId> all = sourcesOf(*mDocument.query());
+    all.insert(all.end(), tables.begin(), tables.end());
+    const Wanted wanted = unknownOf(mDatabase, {tables, all});
+    // A file is read as quickly as memory, and stays readable when somebody deletes it.
+    if (!mDatabase.isServer() || wanted.empty()) return true;
+    const auto read = patiently<TablesRead>(
+        tr("Reading the tables\u2026"), mArea.window(),
+        [connect = mDatabase.connector(), wanted] { return readTables(connect, wanted); });
+    if (!read) return false;
+    const auto error = takeTables(mDatabase, *read);
+    if (error) emit refused(*error);
+    return !error;
+}
+
+/// Tries it on a copy, for the joins are known only when they are made.
+bool TableAdding::fits(const std::vector<TableId>& tables) {
+    const auto copy = model::Query::restored(mDocument.query()->record());
+    const auto added = reader::addTables(*copy, mDatabase.reader(), tables, canvasWidth());
+    if (!added) {
+        emit refused(added.error());
+        return false;
+    }
+    if (copy->Joins().Count() <= mostJoins) return true;
+    emit refused(tr("The drawing takes %1 joins, and with this there would be %2; delete tables or "
+                    "joins first.")
+                     .arg(mostJoins)
+                     .arg(copy->Joins().Count()));
+    return false;
+}
+
+int TableAdding::canvasWidth() const {
+    return std::max(mArea.width() * twipsPerPixel - besideCanvas, leastCanvasWidth);
+}
+
+} // namespace designer

@@ -1,0 +1,40 @@
+#pragma once
+
+#include "designer/database/Database.h"
+
+#include <QPoint>
+
+namespace designer {
+
+class Document;
+class DrawingArea;
+
+/// Adds tables of the database to the drawing, with joins by their foreign keys to what is there.
+class TableAdding final : public QObject {
+    Q_OBJECT
+
+public:
+    TableAdding(Document& document, Database& database, DrawingArea& area);
+
+    /// As one step; at free places, or at a place on the canvas in twips, which then is the upper
+    /// left corner of the first. More tables or joins than the drawing takes are refused.
+    void add(const std::vector<reader::TableId>& tables, std::optional<QPoint> place = {});
+
+signals:
+    /// The tables are there; `name` is that of the last one in the query.
+    void added(const QString& name);
+    /// Nothing was added; one line says why.
+    void refused(const QString& why);
+
+private:
+    /// False when the user has cancelled it or it was refused.
+    bool readBefore(const std::vector<reader::TableId>& tables);
+    bool fits(const std::vector<reader::TableId>& tables);
+    int canvasWidth() const;
+
+    Document& mDocument;
+    Database& mDatabase;
+    DrawingArea& mArea;
+};
+
+} // namespace designer

@@ -1,0 +1,75 @@
+#include "designer/tables/placeTables.h"
+
+#include "designer/document/Document.h"
+#include "model/Layout.h"
+
+#include <QCoreApplication>
+
+#include <algorithm>
+#include <limits>
+
+namespace designer {
+
+using model::layout::Box;
+using platform::Each;
+using platform::Ref;
+
+namespace {
+
+using Tables = std::vector<Ref<model::Table>>;
+
+constexpr int canvasEnd = std::numeric_limits<std::int16_t>::max();
+
+/// Pairs of the tables that a join connects.
+std::vector<model::layout::Link> linksAmong(model::Query& query, const Tables& tables) {
+    const auto position = [&](const Ref<TalvikZandorLib::ZDTable>& table) {
+        return static_cast<std::size_t>(std::find(tables.begin(), tables.end(), table) -
+                                        tables.begin());
+    };
+    std::vector<model::layout::Link> links;
+    for (const auto& join : Each<TalvikZandorLib::ZDJoin>(query.Joins())) {
+        const auto left = position(join->LeftTable());
+        const auto right = position(join->RightTable());
+        if (left < tables.size() && right < tables.size()) links.emplace_back(left, right);
+    }
+    return links;
+}
+
+std::vector<Box> arranged(model::Query& query, const Tables& tables, int canvasWidth) {
+    std::vector<model::layout::Size> sizes;
+    for (const auto& table : tables) {
+        const model::layout::Size usual{2000, 2000}; // what the control gives a table without one
+        const bool sized = table->Width() > 0 && table->Height() > 0;
+        sizes.push_back(sized ? model::layout::Size{table->Width(), table->Height()} : usual);
+    }
+    return model::layout::arrange(sizes, linksAmong(query, tables), {}, canvasWidth);
+}
+
+void move(model::Table& table, const Box& box, QPoint by) {
+    const auto within = [](int start, int size) {
+        return static_cast<float>(std::clamp(start, 0, std::max(canvasEnd - size, 0)));
+    };
+    table.Left(within(box.left + by.x(), box.width));
+    table.Top(within(box.top + by.y(), box.height));
+}
+
+} // namespace
+
+void placeAt(model::Query& query, const Tables& tables, QPoint place) {
+    const auto boxes = arranged(query, tables, canvasEnd / 2);
+    for (std::size_t n = 0; n < tables.size(); ++n)
+        move(*tables[n], boxes[n], place - QPoint(model::layout::margin, model::layout::margin));
+}
+
+void arrangeTables(Document& document, int canvasWidth) {
+    const auto name = QCoreApplication::translate("designer::TableAdding", "Arrange tables");
+    document.change(name, [&](model::Query& query) {
+        Tables tables;
+        for (const auto& each : Each<TalvikZandorLib::ZDTable>(query.Tables()))
+            tables.push_back(std::static_pointer_cast<model::Table>(each));
+        const auto boxes = arranged(query, tables, canvasWidth);
+        for (std::size_t n = 0; n < tables.size(); ++n) move(*tables[n], boxes[n], {});
+    });
+}
+
+} // namespace designer

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "model/reader/DatabaseReader.h"
+
+class QMimeData;
+
+namespace designer {
+
+/// Tables as they are dragged from the list of tables to the drawing.
+std::unique_ptr<QMimeData> tablesAsMime(const std::vector<reader::TableId>& tables);
+bool hasTables(const QMimeData& data);
+/// Empty for data of another kind, or from elsewhere that cannot be read.
+std::vector<reader::TableId> tablesOfMime(const QMimeData& data);
+
+} // namespace designer

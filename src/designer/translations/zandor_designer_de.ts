@@ -1,0 +1,1802 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="de" sourcelanguage="en">
+<context>
+    <name>ControlFlags</name>
+    <message>
+        <source>Show join definition</source>
+        <translation>Verknüpfung bearbeiten</translation>
+    </message>
+    <message>
+        <source>Delete join</source>
+        <translation>Verknüpfung löschen</translation>
+    </message>
+    <message>
+        <source>Copy column</source>
+        <translation>Spalte kopieren</translation>
+    </message>
+    <message>
+        <source>Create join</source>
+        <translation>Verknüpfung erstellen</translation>
+    </message>
+    <message>
+        <source>Delete table</source>
+        <translation>Tabelle löschen</translation>
+    </message>
+    <message>
+        <source>Paste column</source>
+        <translation>Spalte einfügen</translation>
+    </message>
+    <message>
+        <source>Delete output column</source>
+        <translation>Ausgabespalte löschen</translation>
+    </message>
+    <message>
+        <source>Separator below the join entries</source>
+        <translation>Trennlinie unter den Einträgen für Verknüpfungen</translation>
+    </message>
+    <message>
+        <source>Separator below the table entries</source>
+        <translation>Trennlinie unter den Einträgen für Tabellen</translation>
+    </message>
+    <message>
+        <source>Type and operator of a join can be changed</source>
+        <translation>Art und Operator einer Verknüpfung lassen sich ändern</translation>
+    </message>
+    <message>
+        <source>Tables and joins only, no output columns</source>
+        <translation>Nur Tabellen und Verknüpfungen, keine Ausgabespalten</translation>
+    </message>
+    <message>
+        <source>Normal: only rows that match</source>
+        <translation>Normal: nur Zeilen, die zueinander passen</translation>
+    </message>
+    <message>
+        <source>Left outer: all rows of the left table</source>
+        <translation>Links außen: alle Zeilen der linken Tabelle</translation>
+    </message>
+    <message>
+        <source>Right outer: all rows of the right table</source>
+        <translation>Rechts außen: alle Zeilen der rechten Tabelle</translation>
+    </message>
+    <message>
+        <source>Both outer: all rows of both tables</source>
+        <translation>Beide außen: alle Zeilen beider Tabellen</translation>
+    </message>
+    <message>
+        <source>=  equal</source>
+        <translation>=  gleich</translation>
+    </message>
+    <message>
+        <source>&lt;&gt;  not equal</source>
+        <translation>&lt;&gt;  ungleich</translation>
+    </message>
+    <message>
+        <source>&lt;  less</source>
+        <translation>&lt;  kleiner</translation>
+    </message>
+    <message>
+        <source>&gt;  greater</source>
+        <translation>&gt;  größer</translation>
+    </message>
+    <message>
+        <source>&lt;=  less or equal</source>
+        <translation>&lt;=  kleiner oder gleich</translation>
+    </message>
+    <message>
+        <source>&gt;=  greater or equal</source>
+        <translation>&gt;=  größer oder gleich</translation>
+    </message>
+    <message>
+        <source>Show a box at each step of the control</source>
+        <translation>Bei jedem Schritt des Steuerelements ein Meldungsfenster zeigen</translation>
+    </message>
+</context>
+<context>
+    <name>ControlTextUses</name>
+    <message>
+        <source>Join dialog: title</source>
+        <translation>Verknüpfungsfenster: Titel</translation>
+    </message>
+    <message>
+        <source>Join dialog: left table</source>
+        <translation>Verknüpfungsfenster: linke Tabelle</translation>
+    </message>
+    <message>
+        <source>Join dialog: left column</source>
+        <translation>Verknüpfungsfenster: linke Spalte</translation>
+    </message>
+    <message>
+        <source>Join dialog: right table</source>
+        <translation>Verknüpfungsfenster: rechte Tabelle</translation>
+    </message>
+    <message>
+        <source>Join dialog: right column</source>
+        <translation>Verknüpfungsfenster: rechte Spalte</translation>
+    </message>
+    <message>
+        <source>Join dialog: join type</source>
+        <translation>Verknüpfungsfenster: Art der Verknüpfung</translation>
+    </message>
+    <message>
+        <source>Join type: only rows that match</source>
+        <translation>Art der Verknüpfung: nur Zeilen, die zueinander passen</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of the left table</source>
+        <translation>Art der Verknüpfung: alle Zeilen der linken Tabelle</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of the right table</source>
+        <translation>Art der Verknüpfung: alle Zeilen der rechten Tabelle</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of both tables</source>
+        <translation>Art der Verknüpfung: alle Zeilen beider Tabellen</translation>
+    </message>
+    <message>
+        <source>Join dialog: button that takes the changes over</source>
+        <translation>Verknüpfungsfenster: Knopf, der die Änderungen übernimmt</translation>
+    </message>
+    <message>
+        <source>Join dialog: button that drops the changes</source>
+        <translation>Verknüpfungsfenster: Knopf, der die Änderungen verwirft</translation>
+    </message>
+    <message>
+        <source>Menu: open the join dialog</source>
+        <translation>Menü: Verknüpfungsfenster öffnen</translation>
+    </message>
+    <message>
+        <source>Menu: delete a join</source>
+        <translation>Menü: eine Verknüpfung löschen</translation>
+    </message>
+    <message>
+        <source>Menu: copy the selected columns</source>
+        <translation>Menü: die ausgewählten Spalten kopieren</translation>
+    </message>
+    <message>
+        <source>Menu: join the copied column to the selected one</source>
+        <translation>Menü: die kopierte Spalte mit der ausgewählten verknüpfen</translation>
+    </message>
+    <message>
+        <source>Menu: take a table out of the query</source>
+        <translation>Menü: eine Tabelle aus der Abfrage nehmen</translation>
+    </message>
+    <message>
+        <source>Menu: make output columns of the copied columns</source>
+        <translation>Menü: die kopierten Spalten zu Ausgabespalten machen</translation>
+    </message>
+    <message>
+        <source>Menu: delete an output column</source>
+        <translation>Menü: eine Ausgabespalte löschen</translation>
+    </message>
+    <message>
+        <source>Grid: the column</source>
+        <translation>Raster: die Spalte</translation>
+    </message>
+    <message>
+        <source>Grid: the name that the column comes out under</source>
+        <translation>Raster: der Name, unter dem die Spalte ausgegeben wird</translation>
+    </message>
+    <message>
+        <source>Grid: sort order</source>
+        <translation>Raster: Sortierung</translation>
+    </message>
+    <message>
+        <source>Grid: whether the column comes out</source>
+        <translation>Raster: ob die Spalte ausgegeben wird</translation>
+    </message>
+    <message>
+        <source>Grid: the first row of criteria</source>
+        <translation>Raster: die erste Zeile der Kriterien</translation>
+    </message>
+    <message>
+        <source>Grid: further rows of criteria</source>
+        <translation>Raster: weitere Zeilen mit Kriterien</translation>
+    </message>
+</context>
+<context>
+    <name>ControlTexts</name>
+    <message>
+        <source>Join Defintion</source>
+        <translation>Verknüpfung</translation>
+    </message>
+    <message>
+        <source>Left Table:</source>
+        <translation>Linke Tabelle:</translation>
+    </message>
+    <message>
+        <source>Left Column:</source>
+        <translation>Linke Spalte:</translation>
+    </message>
+    <message>
+        <source>Right Table:</source>
+        <translation>Rechte Tabelle:</translation>
+    </message>
+    <message>
+        <source>Right Column:</source>
+        <translation>Rechte Spalte:</translation>
+    </message>
+    <message>
+        <source>Join Type</source>
+        <translation>Art der Verknüpfung</translation>
+    </message>
+    <message>
+        <source>Normal</source>
+        <translation>Normal</translation>
+    </message>
+    <message>
+        <source>Left Outer</source>
+        <translation>Links außen</translation>
+    </message>
+    <message>
+        <source>Right Outer</source>
+        <translation>Rechts außen</translation>
+    </message>
+    <message>
+        <source>Both Outer</source>
+        <translation>Beide außen</translation>
+    </message>
+    <message>
+        <source>&amp;Ok</source>
+        <translation>&amp;OK</translation>
+    </message>
+    <message>
+        <source>&amp;Cancel</source>
+        <translation>&amp;Abbrechen</translation>
+    </message>
+    <message>
+        <source>Show Join Definition</source>
+        <translation>Verknüpfung bearbeiten</translation>
+    </message>
+    <message>
+        <source>Delete Join</source>
+        <translation>Verknüpfung löschen</translation>
+    </message>
+    <message>
+        <source>Copy Column</source>
+        <translation>Spalte kopieren</translation>
+    </message>
+    <message>
+        <source>Create Join</source>
+        <translation>Verknüpfung erstellen</translation>
+    </message>
+    <message>
+        <source>Delete Table</source>
+        <translation>Tabelle löschen</translation>
+    </message>
+    <message>
+        <source>Paste Column</source>
+        <translation>Spalte einfügen</translation>
+    </message>
+    <message>
+        <source>Delete Coumn</source>
+        <translation>Spalte löschen</translation>
+    </message>
+    <message>
+        <source>Field:</source>
+        <translation>Feld:</translation>
+    </message>
+    <message>
+        <source>Synonym:</source>
+        <translation>Synonym:</translation>
+    </message>
+    <message>
+        <source>Sort:</source>
+        <translation>Sortierung:</translation>
+    </message>
+    <message>
+        <source>Visible:</source>
+        <translation>Sichtbar:</translation>
+    </message>
+    <message>
+        <source>Criteria:</source>
+        <translation>Kriterien:</translation>
+    </message>
+    <message>
+        <source>Or:</source>
+        <translation>Oder:</translation>
+    </message>
+</context>
+<context>
+    <name>Model</name>
+    <message>
+        <source>The query has no tables: add one first.</source>
+        <translation>Die Abfrage hat keine Tabellen: Fügen Sie zuerst eine hinzu.</translation>
+    </message>
+    <message>
+        <source>An output column has no column of the query: delete it.</source>
+        <translation>Zu einer Ausgabespalte gehört keine Spalte der Abfrage: Löschen Sie sie.</translation>
+    </message>
+    <message>
+        <source>%1.* cannot be sorted: sort one of its columns.</source>
+        <translation>%1.* lässt sich nicht sortieren: Sortieren Sie nach einer ihrer Spalten.</translation>
+    </message>
+    <message>
+        <source>%1.* cannot have a criterion: give one to one of its columns.</source>
+        <translation>%1.* kann kein Kriterium haben: Geben Sie es einer ihrer Spalten.</translation>
+    </message>
+    <message>
+        <source>Two output columns are named %1: give one of them a synonym.</source>
+        <translation>Zwei Ausgabespalten heißen %1: Geben Sie einer von ihnen ein Synonym.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 hold different kinds of values: the join will find nothing or fail.</source>
+        <translation>%1 und %2 enthalten Werte verschiedener Art: Die Verknüpfung wird nichts finden oder scheitern.</translation>
+    </message>
+    <message>
+        <source>The outer join between %1 and %2 has no effect: normal joins connect them too.</source>
+        <translation>Die äußere Verknüpfung zwischen %1 und %2 bewirkt nichts: Normale Verknüpfungen verbinden sie ebenfalls.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 and %2 contradict each other: the one drawn first decides which rows are kept.</source>
+        <translation>Die äußeren Verknüpfungen um %1 und %2 widersprechen einander: Die zuerst gezeichnete bestimmt, welche Zeilen bleiben.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 can be read in several ways: change the type of one of them.</source>
+        <translation>Die äußeren Verknüpfungen um %1 lassen sich verschieden verstehen: Ändern Sie die Art einer von ihnen.</translation>
+    </message>
+    <message>
+        <source>No join connects %1 with %2: every row of one comes with every row of the other.</source>
+        <translation>Keine Verknüpfung verbindet %1 mit %2: Jede Zeile der einen kommt mit jeder Zeile der anderen.</translation>
+    </message>
+    <message>
+        <source>MySQL/MariaDB has no full outer join: make it a left or a right one.</source>
+        <translation>MySQL/MariaDB kennt keine beidseitige äußere Verknüpfung: Machen Sie eine linke oder rechte daraus.</translation>
+    </message>
+    <message>
+        <source>PostgreSQL joins both outer only on equal columns: use the operator =, or make it a left or a right outer join.</source>
+        <translation>PostgreSQL verknüpft beidseitig außen nur bei gleichen Spalten: Nehmen Sie den Operator = oder eine linke oder rechte äußere Verknüpfung.</translation>
+    </message>
+    <message>
+        <source>SQLite takes about 900 conditions in a row: use In for a long list.</source>
+        <translation>SQLite nimmt etwa 900 Bedingungen hintereinander: Nehmen Sie In für eine lange Liste.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry an empty name.</source>
+        <translation>%1 nimmt keinen leeren Namen an.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry a name with the character zero in it.</source>
+        <translation>%1 nimmt keinen Namen an, der das Zeichen null enthält.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry a name with half a character in it.</source>
+        <translation>%1 nimmt keinen Namen an, der ein halbes Zeichen enthält.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 bytes.</source>
+        <translation>%1 nimmt den Namen „%2“ nicht an, er hat mehr als %3 Bytes.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 characters.</source>
+        <translation>%1 nimmt den Namen „%2“ nicht an, er hat mehr als %3 Zeichen.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has a character beyond U+FFFF.</source>
+        <translation>%1 nimmt den Namen „%2“ nicht an, er enthält ein Zeichen jenseits von U+FFFF.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it ends with a blank.</source>
+        <translation>%1 nimmt den Namen „%2“ nicht an, er endet mit einem Leerzeichen.</translation>
+    </message>
+    <message>
+        <source>%1: At character %2: %3.</source>
+        <translation>%1: Bei Zeichen %2: %3.</translation>
+    </message>
+    <message>
+        <source>expected And, Or or the end</source>
+        <translation>And, Or oder das Ende erwartet</translation>
+    </message>
+    <message>
+        <source>expected less nesting, 100 levels are the most</source>
+        <translation>weniger Verschachtelung erwartet, höchstens 100 Ebenen</translation>
+    </message>
+    <message>
+        <source>expected a closing %1</source>
+        <translation>schließendes %1 erwartet</translation>
+    </message>
+    <message>
+        <source>expected ( after In</source>
+        <translation>( nach In erwartet</translation>
+    </message>
+    <message>
+        <source>expected Null, a text that begins so needs quotes</source>
+        <translation>Null erwartet, ein Text, der so beginnt, braucht Anführungszeichen</translation>
+    </message>
+    <message>
+        <source>expected a comparison, Like works on columns that hold text</source>
+        <translation>ein Vergleich erwartet, Like gilt nur für Spalten mit Text</translation>
+    </message>
+    <message>
+        <source>expected a pattern, as in Like &apos;A*&apos;, not a column</source>
+        <translation>ein Muster erwartet, wie in Like &apos;A*&apos;, keine Spalte</translation>
+    </message>
+    <message>
+        <source>expected a pattern, as in Like &apos;A*&apos;</source>
+        <translation>ein Muster erwartet, wie in Like &apos;A*&apos;</translation>
+    </message>
+    <message>
+        <source>expected And and the upper value</source>
+        <translation>And und der obere Wert erwartet</translation>
+    </message>
+    <message>
+        <source>expected a comma or a closing )</source>
+        <translation>ein Komma oder ) erwartet</translation>
+    </message>
+    <message>
+        <source>expected a value, write Is Null for a missing one or &apos;Null&apos; for the word</source>
+        <translation>ein Wert erwartet, schreiben Sie Is Null für einen fehlenden oder &apos;Null&apos; für das Wort</translation>
+    </message>
+    <message>
+        <source>expected the parameter&apos;s name</source>
+        <translation>der Name des Parameters erwartet</translation>
+    </message>
+    <message>
+        <source>expected the column&apos;s name</source>
+        <translation>der Name der Spalte erwartet</translation>
+    </message>
+    <message>
+        <source>expected a column of the query, there is no %1</source>
+        <translation>eine Spalte der Abfrage erwartet, %1 gibt es nicht</translation>
+    </message>
+    <message>
+        <source>expected a column of the query, the table that had this one was deleted</source>
+        <translation>eine Spalte der Abfrage erwartet, die Tabelle mit dieser Spalte wurde gelöscht</translation>
+    </message>
+    <message>
+        <source>expected the table too, as in %1, several tables have this column</source>
+        <translation>auch die Tabelle erwartet, wie in %1, mehrere Tabellen haben diese Spalte</translation>
+    </message>
+    <message>
+        <source>expected a column that holds %1</source>
+        <translation>eine Spalte mit diesem Inhalt erwartet: %1</translation>
+    </message>
+    <message>
+        <source>expected the end, a criterion has at most 10000 characters</source>
+        <translation>das Ende erwartet, ein Kriterium hat höchstens 10000 Zeichen</translation>
+    </message>
+    <message>
+        <source>expected a character, found the character zero</source>
+        <translation>ein Zeichen erwartet, das Zeichen null gefunden</translation>
+    </message>
+    <message>
+        <source>expected a character, found half of one</source>
+        <translation>ein Zeichen erwartet, ein halbes gefunden</translation>
+    </message>
+    <message>
+        <source>expected a [ before this ]</source>
+        <translation>ein [ vor diesem ] erwartet</translation>
+    </message>
+    <message>
+        <source>expected an operator, write &lt;&gt; for unequal</source>
+        <translation>ein Operator erwartet, schreiben Sie &lt;&gt; für ungleich</translation>
+    </message>
+    <message>
+        <source>expected a name between the brackets</source>
+        <translation>ein Name zwischen den Klammern erwartet</translation>
+    </message>
+    <message>
+        <source>expected a text</source>
+        <translation>ein Text erwartet</translation>
+    </message>
+    <message>
+        <source>expected a number</source>
+        <translation>eine Zahl erwartet</translation>
+    </message>
+    <message>
+        <source>expected a date (2024-12-31)</source>
+        <translation>Datum erwartet (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>expected a time (23:59)</source>
+        <translation>Uhrzeit erwartet (23:59)</translation>
+    </message>
+    <message>
+        <source>expected a date and time (2024-12-31 23:59)</source>
+        <translation>Datum und Uhrzeit erwartet (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>expected true or false</source>
+        <translation>true oder false erwartet</translation>
+    </message>
+    <message>
+        <source>expected Is Null, a column or a parameter</source>
+        <translation>Is Null, eine Spalte oder ein Parameter erwartet</translation>
+    </message>
+    <message>
+        <source>expected a value</source>
+        <translation>ein Wert erwartet</translation>
+    </message>
+    <message>
+        <source>a text</source>
+        <translation>ein Text</translation>
+    </message>
+    <message>
+        <source>a number</source>
+        <translation>eine Zahl</translation>
+    </message>
+    <message>
+        <source>a date (2024-12-31)</source>
+        <translation>ein Datum (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>a time (23:59)</source>
+        <translation>eine Uhrzeit (23:59)</translation>
+    </message>
+    <message>
+        <source>a date and time (2024-12-31 23:59)</source>
+        <translation>Datum und Uhrzeit (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>true or false</source>
+        <translation>true oder false</translation>
+    </message>
+    <message>
+        <source>Is Null, a column or a parameter</source>
+        <translation>Is Null, eine Spalte oder ein Parameter</translation>
+    </message>
+</context>
+<context>
+    <name>QObject</name>
+    <message>
+        <source>Remove the table</source>
+        <translation>Tabelle entfernen</translation>
+    </message>
+</context>
+<context>
+    <name>ZandorWidget</name>
+    <message>
+        <source>Join %1 %2 %3</source>
+        <translation>Verknüpfung %1 %2 %3</translation>
+    </message>
+    <message>
+        <source>Query designer</source>
+        <translation>Abfrageentwurf</translation>
+    </message>
+</context>
+<context>
+    <name>designer</name>
+    <message>
+        <source>There is nothing to draw; add a table first.</source>
+        <translation>Es gibt nichts zu zeichnen; fügen Sie zuerst eine Tabelle hinzu.</translation>
+    </message>
+    <message>
+        <source>A picture ends in .png, .svg or .pdf; &quot;%1&quot; does not.</source>
+        <translation>Ein Bild endet auf .png, .svg oder .pdf; „%1“ nicht.</translation>
+    </message>
+    <message>
+        <source>The picture &quot;%1&quot; cannot be written; check the folder and your permissions.</source>
+        <translation>Das Bild „%1“ kann nicht geschrieben werden; prüfen Sie den Ordner und Ihre Rechte.</translation>
+    </message>
+    <message>
+        <source>The printer cannot be reached; choose another one.</source>
+        <translation>Der Drucker ist nicht erreichbar; wählen Sie einen anderen.</translation>
+    </message>
+    <message>
+        <source>The page could not be printed; see the printer&apos;s own messages.</source>
+        <translation>Die Seite konnte nicht gedruckt werden; beachten Sie die Meldungen des Druckers.</translation>
+    </message>
+    <message>
+        <source>%1 tables are too many; the canvas takes %2.</source>
+        <translation>%1 Tabellen sind zu viele; die Zeichenfläche nimmt %2.</translation>
+    </message>
+    <message>
+        <source>There is no table &quot;%1&quot; in %2.</source>
+        <translation>In %2 gibt es keine Tabelle „%1“.</translation>
+    </message>
+    <message>
+        <source>These tables have %1 joins, and the canvas takes %2; choose fewer tables with --tables.</source>
+        <translation>Diese Tabellen haben %1 Verknüpfungen, die Zeichenfläche nimmt %2; wählen Sie mit --tables weniger Tabellen.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 tables; choose others in the panel &quot;Tables&quot;</source>
+        <translation>%1 von %2 Tabellen; weitere wählen Sie in der Leiste „Tabellen“</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Autosave</name>
+    <message>
+        <source>the folder %1 cannot be written</source>
+        <translation>in den Ordner %1 kann nicht geschrieben werden</translation>
+    </message>
+    <message>
+        <source>The query could not be saved for a recovery (%1); save it yourself.</source>
+        <translation>Die Abfrage konnte nicht für eine Wiederherstellung gesichert werden (%1); speichern Sie sie selbst.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::CellReader</name>
+    <message>
+        <source>(outside the calendar)</source>
+        <translation>(außerhalb des Kalenders)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ConnectionBanner</name>
+    <message>
+        <source>&amp;Reconnect</source>
+        <translation>&amp;Neu verbinden</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Schließen</translation>
+    </message>
+    <message>
+        <source>The connection to %1 is lost. Your query is kept.</source>
+        <translation>Die Verbindung zu %1 ist abgebrochen. Ihre Abfrage bleibt erhalten.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ConnectionDialog</name>
+    <message>
+        <source>Open database</source>
+        <translation>Datenbank öffnen</translation>
+    </message>
+    <message>
+        <source>usual</source>
+        <translation>wie üblich</translation>
+    </message>
+    <message>
+        <source>Port</source>
+        <translation>Port</translation>
+    </message>
+    <message>
+        <source>SQLite file</source>
+        <translation>SQLite-Datei</translation>
+    </message>
+    <message>
+        <source>PostgreSQL</source>
+        <translation>PostgreSQL</translation>
+    </message>
+    <message>
+        <source>MySQL or MariaDB</source>
+        <translation>MySQL oder MariaDB</translation>
+    </message>
+    <message>
+        <source>ODBC</source>
+        <translation>ODBC</translation>
+    </message>
+    <message>
+        <source>%1 (install the package %2)</source>
+        <translation>%1 (installieren Sie das Paket %2)</translation>
+    </message>
+    <message>
+        <source>&amp;Browse…</source>
+        <translation>D&amp;urchsuchen…</translation>
+    </message>
+    <message>
+        <source>P&amp;ort:</source>
+        <translation>P&amp;ort:</translation>
+    </message>
+    <message>
+        <source>&amp;Kind:</source>
+        <translation>&amp;Art:</translation>
+    </message>
+    <message>
+        <source>&amp;File:</source>
+        <translation>&amp;Datei:</translation>
+    </message>
+    <message>
+        <source>&amp;Host:</source>
+        <translation>&amp;Server:</translation>
+    </message>
+    <message>
+        <source>Data &amp;source:</source>
+        <translation>Datenq&amp;uelle:</translation>
+    </message>
+    <message>
+        <source>&amp;Database:</source>
+        <translation>Da&amp;tenbank:</translation>
+    </message>
+    <message>
+        <source>&amp;User:</source>
+        <translation>&amp;Benutzer:</translation>
+    </message>
+    <message>
+        <source>&amp;Password:</source>
+        <translation>&amp;Passwort:</translation>
+    </message>
+    <message>
+        <source>&amp;Address:</source>
+        <translation>Ad&amp;resse:</translation>
+    </message>
+    <message>
+        <source>SQLite databases (*.sqlite *.sqlite3 *.db *.db3);;All files (*)</source>
+        <translation>SQLite-Datenbanken (*.sqlite *.sqlite3 *.db *.db3);;Alle Dateien (*)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::DatabaseCommands</name>
+    <message>
+        <source>Open SQLite &amp;file…</source>
+        <translation>SQLite-&amp;Datei öffnen…</translation>
+    </message>
+    <message>
+        <source>&amp;Connect to a server…</source>
+        <translation>Mit einem &amp;Server verbinden…</translation>
+    </message>
+    <message>
+        <source>&amp;Reconnect</source>
+        <translation>&amp;Neu verbinden</translation>
+    </message>
+    <message>
+        <source>Open database</source>
+        <translation>Datenbank öffnen</translation>
+    </message>
+    <message>
+        <source>The database was not opened.</source>
+        <translation>Die Datenbank wurde nicht geöffnet.</translation>
+    </message>
+    <message>
+        <source>Open SQLite file</source>
+        <translation>SQLite-Datei öffnen</translation>
+    </message>
+    <message>
+        <source>SQLite databases (*.sqlite *.sqlite3 *.db *.db3);;All files (*)</source>
+        <translation>SQLite-Datenbanken (*.sqlite *.sqlite3 *.db *.db3);;Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <source>Reconnect</source>
+        <translation>Neu verbinden</translation>
+    </message>
+    <message>
+        <source>The query is open, but not its database. %1</source>
+        <translation>Die Abfrage ist geöffnet, ihre Datenbank aber nicht. %1</translation>
+    </message>
+</context>
+<context>
+    <name>designer::DesignerWindow</name>
+    <message>
+        <source>Tables</source>
+        <translation>Tabellen</translation>
+    </message>
+    <message>
+        <source>SQL</source>
+        <translation>SQL</translation>
+    </message>
+    <message>
+        <source>Rows</source>
+        <translation>Zeilen</translation>
+    </message>
+    <message>
+        <source>Events</source>
+        <translation>Ereignisse</translation>
+    </message>
+    <message>
+        <source>&amp;File</source>
+        <translation>&amp;Datei</translation>
+    </message>
+    <message>
+        <source>&amp;Quit</source>
+        <translation>&amp;Beenden</translation>
+    </message>
+    <message>
+        <source>&amp;Edit</source>
+        <translation>&amp;Bearbeiten</translation>
+    </message>
+    <message>
+        <source>Copy &amp;SQL</source>
+        <translation>&amp;SQL kopieren</translation>
+    </message>
+    <message>
+        <source>&amp;Options…</source>
+        <translation>&amp;Optionen…</translation>
+    </message>
+    <message>
+        <source>&amp;Database</source>
+        <translation>Da&amp;tenbank</translation>
+    </message>
+    <message>
+        <source>&amp;Query</source>
+        <translation>Ab&amp;frage</translation>
+    </message>
+    <message>
+        <source>&amp;Arrange tables</source>
+        <translation>Tabellen &amp;anordnen</translation>
+    </message>
+    <message>
+        <source>Re&amp;name table…</source>
+        <translation>Tabelle &amp;umbenennen…</translation>
+    </message>
+    <message>
+        <source>&amp;View</source>
+        <translation>&amp;Ansicht</translation>
+    </message>
+    <message>
+        <source>&amp;Help</source>
+        <translation>&amp;Hilfe</translation>
+    </message>
+    <message>
+        <source>&amp;About</source>
+        <translation>&amp;Über</translation>
+    </message>
+    <message>
+        <source>Add tables</source>
+        <translation>Tabellen hinzufügen</translation>
+    </message>
+    <message>
+        <source>Output columns</source>
+        <translation>Ausgabespalten</translation>
+    </message>
+    <message>
+        <source>The grid shows %1 output columns and is full. Delete one before you add another; it would take the place of the last.</source>
+        <translation>Das Raster zeigt %1 Ausgabespalten und ist voll. Löschen Sie eine, bevor Sie eine weitere hinzufügen; sie träte an die Stelle der letzten.</translation>
+    </message>
+    <message>
+        <source>About Zandor Designer</source>
+        <translation>Über Zandor Designer</translation>
+    </message>
+    <message>
+        <source>Zandor Designer %1
+
+Draw a query, read its SQL, run it. The database is only read.</source>
+        <translation>Zandor Designer %1
+
+Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank wird nur gelesen.</translation>
+    </message>
+    <message>
+        <source>&amp;New query</source>
+        <translation>&amp;Neue Abfrage</translation>
+    </message>
+    <message>
+        <source>&amp;Open query…</source>
+        <translation>Abfrage &amp;öffnen…</translation>
+    </message>
+    <message>
+        <source>&amp;Save</source>
+        <translation>&amp;Speichern</translation>
+    </message>
+    <message>
+        <source>Save &amp;as…</source>
+        <translation>Speichern &amp;unter…</translation>
+    </message>
+    <message>
+        <source>Tables: %1   Joins: %2</source>
+        <translation>Tabellen: %1   Verknüpfungen: %2</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Document</name>
+    <message>
+        <source>&amp;Undo</source>
+        <translation>&amp;Rückgängig</translation>
+    </message>
+    <message>
+        <source>&amp;Redo</source>
+        <translation>&amp;Wiederholen</translation>
+    </message>
+</context>
+<context>
+    <name>designer::EventPanel</name>
+    <message>
+        <source>Time</source>
+        <translation>Zeit</translation>
+    </message>
+    <message>
+        <source>No.</source>
+        <translation>Nr.</translation>
+    </message>
+    <message>
+        <source>Event</source>
+        <translation>Ereignis</translation>
+    </message>
+    <message>
+        <source>Arguments</source>
+        <translation>Argumente</translation>
+    </message>
+    <message>
+        <source>Events of the control</source>
+        <translation>Ereignisse des Steuerelements</translation>
+    </message>
+    <message>
+        <source>Clear</source>
+        <translation>Leeren</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Kopieren</translation>
+    </message>
+    <message>
+        <source>Copy the selected events, or all of them</source>
+        <translation>Die ausgewählten Ereignisse oder alle kopieren</translation>
+    </message>
+    <message>
+        <source>DeletedTable: %1</source>
+        <translation>DeletedTable: %1</translation>
+    </message>
+    <message>
+        <source>%1 (number %2)</source>
+        <translation>%1 (Nummer %2)</translation>
+    </message>
+    <message>
+        <source>wParam %1: the menu opens</source>
+        <translation>wParam %1: Das Menü öffnet sich</translation>
+    </message>
+    <message>
+        <source>wParam %1: the menu is closed</source>
+        <translation>wParam %1: Das Menü ist geschlossen</translation>
+    </message>
+</context>
+<context>
+    <name>designer::EventWords</name>
+    <message>
+        <source>(gone)</source>
+        <translation>(gelöscht)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FileDialogs</name>
+    <message>
+        <source>Zandor queries (*.json)</source>
+        <translation>Zandor-Abfragen (*.json)</translation>
+    </message>
+    <message>
+        <source>All files (*)</source>
+        <translation>Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <source>Open Query</source>
+        <translation>Abfrage öffnen</translation>
+    </message>
+    <message>
+        <source>Save Query</source>
+        <translation>Abfrage speichern</translation>
+    </message>
+    <message>
+        <source>query.json</source>
+        <translation>abfrage.json</translation>
+    </message>
+    <message>
+        <source>Save the changes to &quot;%1&quot;?</source>
+        <translation>Die Änderungen an „%1“ speichern?</translation>
+    </message>
+    <message>
+        <source>Changes that are not saved are lost.</source>
+        <translation>Änderungen, die nicht gespeichert sind, gehen verloren.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FileExport</name>
+    <message>
+        <source>The file &quot;%1&quot; cannot be written (%2): check the folder and your permissions.</source>
+        <translation>Die Datei „%1“ kann nicht geschrieben werden (%2): Prüfen Sie den Ordner und Ihre Rechte.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FlagsPage</name>
+    <message>
+        <source>Join types offered</source>
+        <translation>Angebotene Arten der Verknüpfung</translation>
+    </message>
+    <message>
+        <source>Operators offered</source>
+        <translation>Angebotene Operatoren</translation>
+    </message>
+    <message>
+        <source>The join dialog counts what it offers: with one left out, each behind it counts as the one before. Leave out only from the end.</source>
+        <translation>Das Verknüpfungsfenster zählt, was es anbietet: Fehlt ein Eintrag, so gilt jeder dahinter als der davor. Lassen Sie nur am Ende welche weg.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Opening</name>
+    <message>
+        <source>Connecting to %1…</source>
+        <translation>Verbindung zu %1 wird hergestellt…</translation>
+    </message>
+</context>
+<context>
+    <name>designer::OptionsDialog</name>
+    <message>
+        <source>The entries of the context menu that are shown:</source>
+        <translation>Diese Einträge zeigt das Kontextmenü:</translation>
+    </message>
+    <message>
+        <source>What can be done with joins:</source>
+        <translation>Was mit Verknüpfungen möglich ist:</translation>
+    </message>
+    <message>
+        <source>For developers: each box must be answered before the control goes on, and there may be hundreds when a large query is shown.</source>
+        <translation>Für Entwickler: Jedes Meldungsfenster muss beantwortet werden, bevor das Steuerelement fortfährt, und bei einer großen Abfrage können es Hunderte sein.</translation>
+    </message>
+    <message>
+        <source>Options</source>
+        <translation>Optionen</translation>
+    </message>
+    <message>
+        <source>Texts</source>
+        <translation>Texte</translation>
+    </message>
+    <message>
+        <source>Menu</source>
+        <translation>Menü</translation>
+    </message>
+    <message>
+        <source>Joins</source>
+        <translation>Verknüpfungen</translation>
+    </message>
+    <message>
+        <source>Debug</source>
+        <translation>Fehlersuche</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ParameterDialog</name>
+    <message>
+        <source>Values for the query</source>
+        <translation>Werte für die Abfrage</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1:</translation>
+    </message>
+    <message>
+        <source>&amp;Run</source>
+        <translation>Aus&amp;führen</translation>
+    </message>
+    <message>
+        <source>%1 has to be %2.</source>
+        <translation>Für %1 wird verlangt: %2.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::PasswordPrompt</name>
+    <message>
+        <source>Password</source>
+        <translation>Passwort</translation>
+    </message>
+    <message>
+        <source>The database %1 on %2 asks for a password.</source>
+        <translation>Die Datenbank %1 auf %2 verlangt ein Passwort.</translation>
+    </message>
+    <message>
+        <source>The database %1 on %2 asks for the password of %3.</source>
+        <translation>Die Datenbank %1 auf %2 verlangt das Passwort von %3.</translation>
+    </message>
+    <message>
+        <source>&amp;Password:</source>
+        <translation>&amp;Passwort:</translation>
+    </message>
+</context>
+<context>
+    <name>designer::QueryFile</name>
+    <message>
+        <source>Untitled</source>
+        <translation>Unbenannt</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Question</name>
+    <message>
+        <source>a pattern: * for any characters, ? for one</source>
+        <translation>ein Muster: * für beliebige Zeichen, ? für eines</translation>
+    </message>
+    <message>
+        <source>a text</source>
+        <translation>ein Text</translation>
+    </message>
+    <message>
+        <source>a number</source>
+        <translation>eine Zahl</translation>
+    </message>
+    <message>
+        <source>a date such as 2024-12-31</source>
+        <translation>ein Datum wie 2024-12-31</translation>
+    </message>
+    <message>
+        <source>a time such as 23:59</source>
+        <translation>eine Uhrzeit wie 23:59</translation>
+    </message>
+    <message>
+        <source>a date and time such as 2024-12-31 23:59</source>
+        <translation>Datum und Uhrzeit wie 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>true or false</source>
+        <translation>true oder false</translation>
+    </message>
+    <message>
+        <source>a value</source>
+        <translation>ein Wert</translation>
+    </message>
+</context>
+<context>
+    <name>designer::RecentMenu</name>
+    <message>
+        <source>Open &amp;Recent</source>
+        <translation>&amp;Zuletzt geöffnet</translation>
+    </message>
+    <message>
+        <source>&amp;Clear List</source>
+        <translation>Liste &amp;leeren</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Recovery</name>
+    <message>
+        <source>A query that was never saved</source>
+        <translation>Eine nie gespeicherte Abfrage</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot;</source>
+        <translation>„%1“</translation>
+    </message>
+    <message>
+        <source>Recover Query</source>
+        <translation>Abfrage wiederherstellen</translation>
+    </message>
+    <message>
+        <source>%1 has changes that were not saved.</source>
+        <translation>%1 hat Änderungen, die nicht gespeichert wurden.</translation>
+    </message>
+    <message>
+        <source>The designer ended unexpectedly. The changes up to %1 can be recovered.</source>
+        <translation>Das Programm wurde unerwartet beendet. Die Änderungen bis %1 lassen sich wiederherstellen.</translation>
+    </message>
+    <message>
+        <source>&amp;Recover</source>
+        <translation>&amp;Wiederherstellen</translation>
+    </message>
+    <message>
+        <source>&amp;Ask Later</source>
+        <translation>&amp;Später fragen</translation>
+    </message>
+</context>
+<context>
+    <name>designer::RenameDialog</name>
+    <message>
+        <source>Rename table</source>
+        <translation>Tabelle umbenennen</translation>
+    </message>
+    <message>
+        <source>&amp;Rename</source>
+        <translation>&amp;Umbenennen</translation>
+    </message>
+    <message>
+        <source>The name is the table&apos;s in this query only; the database stays as it is.</source>
+        <translation>Der Name gilt nur in dieser Abfrage; die Datenbank bleibt, wie sie ist.</translation>
+    </message>
+    <message>
+        <source>&amp;Table:</source>
+        <translation>&amp;Tabelle:</translation>
+    </message>
+    <message>
+        <source>&amp;New name:</source>
+        <translation>&amp;Neuer Name:</translation>
+    </message>
+    <message>
+        <source>A table needs a name; type one.</source>
+        <translation>Eine Tabelle braucht einen Namen; geben Sie einen ein.</translation>
+    </message>
+    <message>
+        <source>Another table of this query is called &quot;%1&quot;; choose another name.</source>
+        <translation>Eine andere Tabelle dieser Abfrage heißt „%1“; wählen Sie einen anderen Namen.</translation>
+    </message>
+    <message>
+        <source>Rename table %1</source>
+        <translation>Tabelle %1 umbenennen</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultModel</name>
+    <message>
+        <source>(blob, %1 bytes)</source>
+        <translation>(BLOB, %1 Bytes)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultTable</name>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>&amp;Kopieren</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultsPanel</name>
+    <message>
+        <source>These are too many cells to copy; export the rows instead.</source>
+        <translation>Das sind zu viele Zellen zum Kopieren; exportieren Sie stattdessen die Zeilen.</translation>
+    </message>
+    <message>
+        <source>No database is open: open one first.</source>
+        <translation>Keine Datenbank ist geöffnet: Öffnen Sie zuerst eine.</translation>
+    </message>
+    <message>
+        <source>The query cannot be run yet:</source>
+        <translation>Die Abfrage lässt sich noch nicht ausführen:</translation>
+    </message>
+    <message>
+        <source>Cancelling…</source>
+        <translation>Wird abgebrochen…</translation>
+    </message>
+    <message>
+        <source>Exporting…</source>
+        <translation>Wird exportiert…</translation>
+    </message>
+    <message>
+        <source>Running…</source>
+        <translation>Wird ausgeführt…</translation>
+    </message>
+    <message>
+        <source>%1  Rows so far: %2 · %3</source>
+        <translation>%1  Bisher Zeilen: %2 · %3</translation>
+    </message>
+    <message>
+        <source>The server does not answer.</source>
+        <translation>Der Server antwortet nicht.</translation>
+    </message>
+    <message>
+        <source>Exported to %1. Rows: %2 · %3</source>
+        <translation>Nach %1 exportiert. Zeilen: %2 · %3</translation>
+    </message>
+    <message>
+        <source>Rows: %1 · %2</source>
+        <translation>Zeilen: %1 · %2</translation>
+    </message>
+    <message>
+        <source>First %1 rows; there are more · %2</source>
+        <translation>Die ersten %1 Zeilen; es gibt mehr · %2</translation>
+    </message>
+    <message>
+        <source>Cancelled; nothing was exported · %1</source>
+        <translation>Abgebrochen; nichts wurde exportiert · %1</translation>
+    </message>
+    <message>
+        <source>Cancelled. Rows that came: %1 · %2</source>
+        <translation>Abgebrochen. Zeilen bis dahin: %1 · %2</translation>
+    </message>
+    <message>
+        <source>The database did not run the statement:
+%1</source>
+        <translation>Die Datenbank hat die Anweisung nicht ausgeführt:
+%1</translation>
+    </message>
+    <message>
+        <source>The connection to the database has broken down:
+%1</source>
+        <translation>Die Verbindung zur Datenbank ist abgebrochen:
+%1</translation>
+    </message>
+    <message>
+        <source>Export all rows</source>
+        <translation>Alle Zeilen exportieren</translation>
+    </message>
+    <message>
+        <source>Comma-separated values (*.csv)</source>
+        <translation>Durch Komma getrennte Werte (*.csv)</translation>
+    </message>
+    <message>
+        <source>Run the query to see its rows here.</source>
+        <translation>Führen Sie die Abfrage aus, um hier ihre Zeilen zu sehen.</translation>
+    </message>
+    <message>
+        <source>%1 · the drawing has changed since</source>
+        <translation>%1 · die Zeichnung wurde seitdem geändert</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>&amp;Run</source>
+        <translation>Aus&amp;führen</translation>
+    </message>
+    <message>
+        <source>Run the query and show its rows (F5)</source>
+        <translation>Die Abfrage ausführen und ihre Zeilen zeigen (F5)</translation>
+    </message>
+    <message>
+        <source>&amp;Cancel</source>
+        <translation>&amp;Abbrechen</translation>
+    </message>
+    <message>
+        <source>Stop what is running, on the database too</source>
+        <translation>Anhalten, was läuft, auch auf der Datenbank</translation>
+    </message>
+    <message>
+        <source>&amp;Export…</source>
+        <translation>E&amp;xportieren…</translation>
+    </message>
+    <message>
+        <source>Run the query and write all its rows into a CSV file</source>
+        <translation>Die Abfrage ausführen und alle Zeilen in eine CSV-Datei schreiben</translation>
+    </message>
+    <message>
+        <source>So many rows are shown at most</source>
+        <translation>So viele Zeilen werden höchstens gezeigt</translation>
+    </message>
+    <message>
+        <source>%1 rows</source>
+        <translation>%1 Zeilen</translation>
+    </message>
+    <message>
+        <source>All rows</source>
+        <translation>Alle Zeilen</translation>
+    </message>
+    <message>
+        <source>Run the query again without the limit</source>
+        <translation>Die Abfrage ohne diese Grenze noch einmal ausführen</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ShowCommands</name>
+    <message>
+        <source>&amp;Export drawing…</source>
+        <translation>Zeichnung e&amp;xportieren…</translation>
+    </message>
+    <message>
+        <source>&amp;Print…</source>
+        <translation>&amp;Drucken…</translation>
+    </message>
+    <message>
+        <source>Copy as p&amp;icture</source>
+        <translation>Als &amp;Bild kopieren</translation>
+    </message>
+    <message>
+        <source>Export drawing</source>
+        <translation>Zeichnung exportieren</translation>
+    </message>
+    <message>
+        <source>Picture (*.png)</source>
+        <translation>Bild (*.png)</translation>
+    </message>
+    <message>
+        <source>Scalable drawing (*.svg)</source>
+        <translation>Skalierbare Zeichnung (*.svg)</translation>
+    </message>
+    <message>
+        <source>Document (*.pdf)</source>
+        <translation>Dokument (*.pdf)</translation>
+    </message>
+    <message>
+        <source>Query</source>
+        <translation>Abfrage</translation>
+    </message>
+    <message>
+        <source>Print</source>
+        <translation>Drucken</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Spool</name>
+    <message>
+        <source>No file for the rows can be made in &quot;%1&quot; (%2): set TMPDIR to a folder that you may write to.</source>
+        <translation>In „%1“ lässt sich keine Datei für die Zeilen anlegen (%2): Setzen Sie TMPDIR auf einen Ordner, in den Sie schreiben dürfen.</translation>
+    </message>
+    <message>
+        <source>The rows would fill the disk with the folder &quot;%1&quot;: make room there, or ask for fewer rows.</source>
+        <translation>Die Zeilen würden den Datenträger mit dem Ordner „%1“ füllen: Schaffen Sie dort Platz oder verlangen Sie weniger Zeilen.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::StatementPanel</name>
+    <message>
+        <source>The dialect of SQL that the statement is written in</source>
+        <translation>Der SQL-Dialekt, in dem die Anweisung geschrieben ist</translation>
+    </message>
+    <message>
+        <source>Dialect</source>
+        <translation>Dialekt</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Kopieren</translation>
+    </message>
+    <message>
+        <source>Copy the statement to the clipboard</source>
+        <translation>Die Anweisung in die Zwischenablage kopieren</translation>
+    </message>
+    <message>
+        <source>SQL statement</source>
+        <translation>SQL-Anweisung</translation>
+    </message>
+    <message>
+        <source>Findings</source>
+        <translation>Hinweise</translation>
+    </message>
+    <message>
+        <source>Click a finding to see its place</source>
+        <translation>Klicken Sie auf einen Hinweis, um die Stelle zu sehen</translation>
+    </message>
+    <message>
+        <source>Add a table to begin: the statement appears here.</source>
+        <translation>Fügen Sie zum Anfang eine Tabelle hinzu: Hier erscheint die Anweisung.</translation>
+    </message>
+    <message>
+        <source>%1 cannot say this query:</source>
+        <translation>%1 kann diese Abfrage nicht ausdrücken:</translation>
+    </message>
+    <message>
+        <source>Error: %1</source>
+        <translation>Fehler: %1</translation>
+    </message>
+    <message>
+        <source>Warning: %1</source>
+        <translation>Warnung: %1</translation>
+    </message>
+    <message>
+        <source>%1 (as the database)</source>
+        <translation>%1 (wie die Datenbank)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::StepName</name>
+    <message>
+        <source>Change the query</source>
+        <translation>Abfrage ändern</translation>
+    </message>
+    <message>
+        <source>Delete table %1</source>
+        <translation>Tabelle %1 löschen</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n table(s)</source>
+        <translation>
+            <numerusform>%n Tabelle löschen</numerusform>
+            <numerusform>%n Tabellen löschen</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Add table %1</source>
+        <translation>Tabelle %1 hinzufügen</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n table(s)</source>
+        <translation>
+            <numerusform>%n Tabelle hinzufügen</numerusform>
+            <numerusform>%n Tabellen hinzufügen</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Rename table %1 to %2</source>
+        <translation>Tabelle %1 in %2 umbenennen</translation>
+    </message>
+    <message numerus="yes">
+        <source>Resize %n table(s)</source>
+        <translation>
+            <numerusform>Größe von %n Tabelle ändern</numerusform>
+            <numerusform>Größe von %n Tabellen ändern</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Move %n table(s)</source>
+        <translation>
+            <numerusform>%n Tabelle verschieben</numerusform>
+            <numerusform>%n Tabellen verschieben</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Resize table %1</source>
+        <translation>Größe der Tabelle %1 ändern</translation>
+    </message>
+    <message>
+        <source>Move table %1</source>
+        <translation>Tabelle %1 verschieben</translation>
+    </message>
+    <message>
+        <source>Add join %1</source>
+        <translation>Verknüpfung %1 hinzufügen</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n join(s)</source>
+        <translation>
+            <numerusform>%n Verknüpfung hinzufügen</numerusform>
+            <numerusform>%n Verknüpfungen hinzufügen</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Delete join %1</source>
+        <translation>Verknüpfung %1 löschen</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n join(s)</source>
+        <translation>
+            <numerusform>%n Verknüpfung löschen</numerusform>
+            <numerusform>%n Verknüpfungen löschen</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Change join %1</source>
+        <translation>Verknüpfung %1 ändern</translation>
+    </message>
+    <message>
+        <source>Change joins</source>
+        <translation>Verknüpfungen ändern</translation>
+    </message>
+    <message numerus="yes">
+        <source>Change %n column(s)</source>
+        <translation>
+            <numerusform>%n Spalte ändern</numerusform>
+            <numerusform>%n Spalten ändern</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Add column %1</source>
+        <translation>Spalte %1 hinzufügen</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n column(s)</source>
+        <translation>
+            <numerusform>%n Spalte hinzufügen</numerusform>
+            <numerusform>%n Spalten hinzufügen</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Delete column %1</source>
+        <translation>Spalte %1 löschen</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n column(s)</source>
+        <translation>
+            <numerusform>%n Spalte löschen</numerusform>
+            <numerusform>%n Spalten löschen</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Change columns</source>
+        <translation>Spalten ändern</translation>
+    </message>
+    <message>
+        <source>Change criterion of %1</source>
+        <translation>Kriterium von %1 ändern</translation>
+    </message>
+    <message>
+        <source>Rename column %1</source>
+        <translation>Spalte %1 umbenennen</translation>
+    </message>
+    <message>
+        <source>Change sorting by %1</source>
+        <translation>Sortierung nach %1 ändern</translation>
+    </message>
+    <message>
+        <source>Show column %1</source>
+        <translation>Spalte %1 zeigen</translation>
+    </message>
+    <message>
+        <source>Hide column %1</source>
+        <translation>Spalte %1 ausblenden</translation>
+    </message>
+    <message>
+        <source>Change column %1</source>
+        <translation>Spalte %1 ändern</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableAdding</name>
+    <message>
+        <source>Arrange tables</source>
+        <translation>Tabellen anordnen</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 tables, and has them; delete one first.</source>
+        <translation>Die Zeichnung nimmt %1 Tabellen und hat so viele; löschen Sie zuerst eine.</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 tables and has %2; choose fewer.</source>
+        <translation>Die Zeichnung nimmt %1 Tabellen und hat %2; wählen Sie weniger.</translation>
+    </message>
+    <message>
+        <source>Add table %1</source>
+        <translation>Tabelle %1 hinzufügen</translation>
+    </message>
+    <message>
+        <source>Add %1 tables</source>
+        <translation>%1 Tabellen hinzufügen</translation>
+    </message>
+    <message>
+        <source>Reading the tables…</source>
+        <translation>Tabellen werden gelesen…</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 joins, and with this there would be %2; delete tables or joins first.</source>
+        <translation>Die Zeichnung nimmt %1 Verknüpfungen, und damit wären es %2; löschen Sie zuerst Tabellen oder Verknüpfungen.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableListModel</name>
+    <message>
+        <source>%1, view</source>
+        <translation>%1, Sicht</translation>
+    </message>
+    <message>
+        <source>%1, table</source>
+        <translation>%1, Tabelle</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableTip</name>
+    <message>
+        <source>%1 (view)</source>
+        <translation>%1 (Sicht)</translation>
+    </message>
+    <message>
+        <source>and %1 more</source>
+        <translation>und %1 weitere</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TablesPanel</name>
+    <message>
+        <source>Filter tables</source>
+        <translation>Tabellen filtern</translation>
+    </message>
+    <message>
+        <source>Read the list of tables again</source>
+        <translation>Die Liste der Tabellen neu lesen</translation>
+    </message>
+    <message>
+        <source>Tables</source>
+        <translation>Tabellen</translation>
+    </message>
+    <message>
+        <source>Open a database to see its tables.</source>
+        <translation>Öffnen Sie eine Datenbank, um ihre Tabellen zu sehen.</translation>
+    </message>
+    <message>
+        <source>There are no tables in this database.</source>
+        <translation>In dieser Datenbank gibt es keine Tabellen.</translation>
+    </message>
+    <message>
+        <source>No table has all of this in its name.</source>
+        <translation>Keine Tabelle hat das alles in ihrem Namen.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 tables</source>
+        <translation>%1 von %2 Tabellen</translation>
+    </message>
+    <message>
+        <source>1 table</source>
+        <translation>1 Tabelle</translation>
+    </message>
+    <message>
+        <source>%1 tables</source>
+        <translation>%1 Tabellen</translation>
+    </message>
+    <message>
+        <source>&amp;Add to drawing</source>
+        <translation>Zur Zeichnung &amp;hinzufügen</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TextsPage</name>
+    <message>
+        <source>Where it is used</source>
+        <translation>Wo er steht</translation>
+    </message>
+    <message>
+        <source>Text</source>
+        <translation>Text</translation>
+    </message>
+    <message>
+        <source>Texts of the control</source>
+        <translation>Texte des Steuerelements</translation>
+    </message>
+    <message>
+        <source>Set of texts</source>
+        <translation>Texte einsetzen</translation>
+    </message>
+    <message>
+        <source>Texts that are left as they are follow the designer&apos;s language. Emptying one brings its text of that language back.</source>
+        <translation>Texte, die so bleiben, folgen der Sprache des Programms. Wer einen leert, bekommt den Text dieser Sprache zurück.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Waiting</name>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+</context>
+<context>
+    <name>designer::shell</name>
+    <message>
+        <source>Password for %1: </source>
+        <translation>Passwort für %1: </translation>
+    </message>
+    <message>
+        <source>The query asks for &quot;%1&quot;; give it with --set &quot;%1=VALUE&quot;.</source>
+        <translation>Die Abfrage fragt nach „%1“; geben Sie es mit --set &quot;%1=WERT&quot; an.</translation>
+    </message>
+    <message>
+        <source>The query asks for &quot;%1&quot;, which has to be %2; &quot;%3&quot; is not.</source>
+        <translation>Die Abfrage fragt nach „%1“, verlangt ist: %2; „%3“ ist es nicht.</translation>
+    </message>
+    <message>
+        <source>The query does not ask for &quot;%1&quot;; leave out its --set.</source>
+        <translation>Die Abfrage fragt nicht nach „%1“; lassen Sie dessen --set weg.</translation>
+    </message>
+    <message>
+        <source>Cancelled.</source>
+        <translation>Abgebrochen.</translation>
+    </message>
+    <message>
+        <source>The query names no database; give one with --database.</source>
+        <translation>Die Abfrage nennt keine Datenbank; geben Sie eine mit --database an.</translation>
+    </message>
+    <message>
+        <source>There is no format &quot;%1&quot;; write --format csv or --format json.</source>
+        <translation>Ein Format „%1“ gibt es nicht; schreiben Sie --format csv oder --format json.</translation>
+    </message>
+    <message>
+        <source>--limit takes a number of rows; write --limit 100.</source>
+        <translation>--limit nimmt eine Anzahl von Zeilen; schreiben Sie --limit 100.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; sets nothing; write --set NAME=VALUE.</source>
+        <translation>„%1“ setzt nichts; schreiben Sie --set NAME=WERT.</translation>
+    </message>
+    <message>
+        <source>--sql and --run go one at a time.</source>
+        <translation>--sql und --run gehen nur einzeln.</translation>
+    </message>
+    <message>
+        <source>--%1 goes with --run only.</source>
+        <translation>--%1 gilt nur mit --run.</translation>
+    </message>
+    <message>
+        <source>--dialect goes with --sql only.</source>
+        <translation>--dialect gilt nur mit --sql.</translation>
+    </message>
+    <message>
+        <source>No query is named; write --%1 query.json.</source>
+        <translation>Keine Abfrage ist genannt; schreiben Sie --%1 abfrage.json.</translation>
+    </message>
+    <message>
+        <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
+        <translation>Einen Dialekt „%1“ gibt es nicht; bekannt sind sqlite, postgresql, mysql, sqlserver und standard.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::writeAll</name>
+    <message>
+        <source>The rows cannot be written (%1): see that the disk has room and that you may write there.</source>
+        <translation>Die Zeilen können nicht geschrieben werden (%1): Sehen Sie nach, ob Platz ist und ob Sie dort schreiben dürfen.</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::Canvas</name>
+    <message>
+        <source>Tables and joins</source>
+        <translation>Tabellen und Verknüpfungen</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::CanvasScrollBar</name>
+    <message>
+        <source>Scroll across</source>
+        <translation>Waagerecht blättern</translation>
+    </message>
+    <message>
+        <source>Scroll down</source>
+        <translation>Senkrecht blättern</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::ColumnListModel</name>
+    <message>
+        <source>key column</source>
+        <translation>Schlüsselspalte</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::GridModel</name>
+    <message>
+        <source>column %1</source>
+        <translation>Spalte %1</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::GridWidget</name>
+    <message>
+        <source>Output columns</source>
+        <translation>Ausgabespalten</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::HomeButton</name>
+    <message>
+        <source>Back to the origin</source>
+        <translation>Zurück zum Anfang</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,1802 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="es" sourcelanguage="en">
+<context>
+    <name>ControlFlags</name>
+    <message>
+        <source>Show join definition</source>
+        <translation>Definir la combinación</translation>
+    </message>
+    <message>
+        <source>Delete join</source>
+        <translation>Eliminar la combinación</translation>
+    </message>
+    <message>
+        <source>Copy column</source>
+        <translation>Copiar la columna</translation>
+    </message>
+    <message>
+        <source>Create join</source>
+        <translation>Crear una combinación</translation>
+    </message>
+    <message>
+        <source>Delete table</source>
+        <translation>Eliminar la tabla</translation>
+    </message>
+    <message>
+        <source>Paste column</source>
+        <translation>Pegar la columna</translation>
+    </message>
+    <message>
+        <source>Delete output column</source>
+        <translation>Eliminar la columna de salida</translation>
+    </message>
+    <message>
+        <source>Separator below the join entries</source>
+        <translation>Separador bajo las entradas de combinaciones</translation>
+    </message>
+    <message>
+        <source>Separator below the table entries</source>
+        <translation>Separador bajo las entradas de tablas</translation>
+    </message>
+    <message>
+        <source>Type and operator of a join can be changed</source>
+        <translation>Se pueden cambiar el tipo y el operador de una combinación</translation>
+    </message>
+    <message>
+        <source>Tables and joins only, no output columns</source>
+        <translation>Solo tablas y combinaciones, sin columnas de salida</translation>
+    </message>
+    <message>
+        <source>Normal: only rows that match</source>
+        <translation>Normal: solo las filas que coinciden</translation>
+    </message>
+    <message>
+        <source>Left outer: all rows of the left table</source>
+        <translation>Externa izquierda: todas las filas de la tabla izquierda</translation>
+    </message>
+    <message>
+        <source>Right outer: all rows of the right table</source>
+        <translation>Externa derecha: todas las filas de la tabla derecha</translation>
+    </message>
+    <message>
+        <source>Both outer: all rows of both tables</source>
+        <translation>Externa por ambos lados: todas las filas de ambas tablas</translation>
+    </message>
+    <message>
+        <source>=  equal</source>
+        <translation>=  igual</translation>
+    </message>
+    <message>
+        <source>&lt;&gt;  not equal</source>
+        <translation>&lt;&gt;  distinto</translation>
+    </message>
+    <message>
+        <source>&lt;  less</source>
+        <translation>&lt;  menor</translation>
+    </message>
+    <message>
+        <source>&gt;  greater</source>
+        <translation>&gt;  mayor</translation>
+    </message>
+    <message>
+        <source>&lt;=  less or equal</source>
+        <translation>&lt;=  menor o igual</translation>
+    </message>
+    <message>
+        <source>&gt;=  greater or equal</source>
+        <translation>&gt;=  mayor o igual</translation>
+    </message>
+    <message>
+        <source>Show a box at each step of the control</source>
+        <translation>Mostrar un mensaje en cada paso del control</translation>
+    </message>
+</context>
+<context>
+    <name>ControlTextUses</name>
+    <message>
+        <source>Join dialog: title</source>
+        <translation>Ventana de combinación: título</translation>
+    </message>
+    <message>
+        <source>Join dialog: left table</source>
+        <translation>Ventana de combinación: tabla izquierda</translation>
+    </message>
+    <message>
+        <source>Join dialog: left column</source>
+        <translation>Ventana de combinación: columna izquierda</translation>
+    </message>
+    <message>
+        <source>Join dialog: right table</source>
+        <translation>Ventana de combinación: tabla derecha</translation>
+    </message>
+    <message>
+        <source>Join dialog: right column</source>
+        <translation>Ventana de combinación: columna derecha</translation>
+    </message>
+    <message>
+        <source>Join dialog: join type</source>
+        <translation>Ventana de combinación: tipo de combinación</translation>
+    </message>
+    <message>
+        <source>Join type: only rows that match</source>
+        <translation>Tipo de combinación: solo las filas que coinciden</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of the left table</source>
+        <translation>Tipo de combinación: todas las filas de la tabla izquierda</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of the right table</source>
+        <translation>Tipo de combinación: todas las filas de la tabla derecha</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of both tables</source>
+        <translation>Tipo de combinación: todas las filas de ambas tablas</translation>
+    </message>
+    <message>
+        <source>Join dialog: button that takes the changes over</source>
+        <translation>Ventana de combinación: botón que acepta los cambios</translation>
+    </message>
+    <message>
+        <source>Join dialog: button that drops the changes</source>
+        <translation>Ventana de combinación: botón que descarta los cambios</translation>
+    </message>
+    <message>
+        <source>Menu: open the join dialog</source>
+        <translation>Menú: abrir la ventana de combinación</translation>
+    </message>
+    <message>
+        <source>Menu: delete a join</source>
+        <translation>Menú: eliminar una combinación</translation>
+    </message>
+    <message>
+        <source>Menu: copy the selected columns</source>
+        <translation>Menú: copiar las columnas seleccionadas</translation>
+    </message>
+    <message>
+        <source>Menu: join the copied column to the selected one</source>
+        <translation>Menú: combinar la columna copiada con la seleccionada</translation>
+    </message>
+    <message>
+        <source>Menu: take a table out of the query</source>
+        <translation>Menú: quitar una tabla de la consulta</translation>
+    </message>
+    <message>
+        <source>Menu: make output columns of the copied columns</source>
+        <translation>Menú: convertir las columnas copiadas en columnas de salida</translation>
+    </message>
+    <message>
+        <source>Menu: delete an output column</source>
+        <translation>Menú: eliminar una columna de salida</translation>
+    </message>
+    <message>
+        <source>Grid: the column</source>
+        <translation>Cuadrícula: la columna</translation>
+    </message>
+    <message>
+        <source>Grid: the name that the column comes out under</source>
+        <translation>Cuadrícula: el nombre con el que sale la columna</translation>
+    </message>
+    <message>
+        <source>Grid: sort order</source>
+        <translation>Cuadrícula: orden</translation>
+    </message>
+    <message>
+        <source>Grid: whether the column comes out</source>
+        <translation>Cuadrícula: si la columna sale</translation>
+    </message>
+    <message>
+        <source>Grid: the first row of criteria</source>
+        <translation>Cuadrícula: la primera fila de criterios</translation>
+    </message>
+    <message>
+        <source>Grid: further rows of criteria</source>
+        <translation>Cuadrícula: las demás filas de criterios</translation>
+    </message>
+</context>
+<context>
+    <name>ControlTexts</name>
+    <message>
+        <source>Join Defintion</source>
+        <translation>Definición de la combinación</translation>
+    </message>
+    <message>
+        <source>Left Table:</source>
+        <translation>Tabla izquierda:</translation>
+    </message>
+    <message>
+        <source>Left Column:</source>
+        <translation>Columna izquierda:</translation>
+    </message>
+    <message>
+        <source>Right Table:</source>
+        <translation>Tabla derecha:</translation>
+    </message>
+    <message>
+        <source>Right Column:</source>
+        <translation>Columna derecha:</translation>
+    </message>
+    <message>
+        <source>Join Type</source>
+        <translation>Tipo de combinación</translation>
+    </message>
+    <message>
+        <source>Normal</source>
+        <translation>Normal</translation>
+    </message>
+    <message>
+        <source>Left Outer</source>
+        <translation>Externa izquierda</translation>
+    </message>
+    <message>
+        <source>Right Outer</source>
+        <translation>Externa derecha</translation>
+    </message>
+    <message>
+        <source>Both Outer</source>
+        <translation>Externa por ambos lados</translation>
+    </message>
+    <message>
+        <source>&amp;Ok</source>
+        <translation>&amp;Aceptar</translation>
+    </message>
+    <message>
+        <source>&amp;Cancel</source>
+        <translation>&amp;Cancelar</translation>
+    </message>
+    <message>
+        <source>Show Join Definition</source>
+        <translation>Definir la combinación</translation>
+    </message>
+    <message>
+        <source>Delete Join</source>
+        <translation>Eliminar la combinación</translation>
+    </message>
+    <message>
+        <source>Copy Column</source>
+        <translation>Copiar la columna</translation>
+    </message>
+    <message>
+        <source>Create Join</source>
+        <translation>Crear una combinación</translation>
+    </message>
+    <message>
+        <source>Delete Table</source>
+        <translation>Eliminar la tabla</translation>
+    </message>
+    <message>
+        <source>Paste Column</source>
+        <translation>Pegar la columna</translation>
+    </message>
+    <message>
+        <source>Delete Coumn</source>
+        <translation>Eliminar la columna</translation>
+    </message>
+    <message>
+        <source>Field:</source>
+        <translation>Campo:</translation>
+    </message>
+    <message>
+        <source>Synonym:</source>
+        <translation>Sinónimo:</translation>
+    </message>
+    <message>
+        <source>Sort:</source>
+        <translation>Orden:</translation>
+    </message>
+    <message>
+        <source>Visible:</source>
+        <translation>Visible:</translation>
+    </message>
+    <message>
+        <source>Criteria:</source>
+        <translation>Criterios:</translation>
+    </message>
+    <message>
+        <source>Or:</source>
+        <translation>O:</translation>
+    </message>
+</context>
+<context>
+    <name>Model</name>
+    <message>
+        <source>The query has no tables: add one first.</source>
+        <translation>La consulta no tiene tablas: añada primero una.</translation>
+    </message>
+    <message>
+        <source>An output column has no column of the query: delete it.</source>
+        <translation>Una columna de salida no corresponde a ninguna columna de la consulta: elimínela.</translation>
+    </message>
+    <message>
+        <source>%1.* cannot be sorted: sort one of its columns.</source>
+        <translation>%1.* no se puede ordenar: ordene por una de sus columnas.</translation>
+    </message>
+    <message>
+        <source>%1.* cannot have a criterion: give one to one of its columns.</source>
+        <translation>%1.* no puede tener un criterio: póngalo en una de sus columnas.</translation>
+    </message>
+    <message>
+        <source>Two output columns are named %1: give one of them a synonym.</source>
+        <translation>Dos columnas de salida se llaman %1: dé un sinónimo a una de ellas.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 hold different kinds of values: the join will find nothing or fail.</source>
+        <translation>%1 y %2 contienen valores de distinto tipo: la combinación no encontrará nada o fallará.</translation>
+    </message>
+    <message>
+        <source>The outer join between %1 and %2 has no effect: normal joins connect them too.</source>
+        <translation>La combinación externa entre %1 y %2 no tiene efecto: también las unen combinaciones normales.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 and %2 contradict each other: the one drawn first decides which rows are kept.</source>
+        <translation>Las combinaciones externas en torno a %1 y %2 se contradicen: la primera que se dibujó decide qué filas se conservan.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 can be read in several ways: change the type of one of them.</source>
+        <translation>Las combinaciones externas en torno a %1 se pueden leer de varias maneras: cambie el tipo de una de ellas.</translation>
+    </message>
+    <message>
+        <source>No join connects %1 with %2: every row of one comes with every row of the other.</source>
+        <translation>Ninguna combinación une %1 con %2: cada fila de una sale con cada fila de la otra.</translation>
+    </message>
+    <message>
+        <source>MySQL/MariaDB has no full outer join: make it a left or a right one.</source>
+        <translation>MySQL/MariaDB no tiene combinación externa por ambos lados: hágala izquierda o derecha.</translation>
+    </message>
+    <message>
+        <source>PostgreSQL joins both outer only on equal columns: use the operator =, or make it a left or a right outer join.</source>
+        <translation>PostgreSQL solo combina por ambos lados columnas iguales: use el operador =, o haga la combinación externa izquierda o derecha.</translation>
+    </message>
+    <message>
+        <source>SQLite takes about 900 conditions in a row: use In for a long list.</source>
+        <translation>SQLite admite unas 900 condiciones seguidas: use In para una lista larga.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry an empty name.</source>
+        <translation>%1 no admite un nombre vacío.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry a name with the character zero in it.</source>
+        <translation>%1 no admite un nombre que contenga el carácter cero.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry a name with half a character in it.</source>
+        <translation>%1 no admite un nombre que contenga medio carácter.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 bytes.</source>
+        <translation>%1 no admite el nombre «%2», tiene más de %3 bytes.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 characters.</source>
+        <translation>%1 no admite el nombre «%2», tiene más de %3 caracteres.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has a character beyond U+FFFF.</source>
+        <translation>%1 no admite el nombre «%2», contiene un carácter más allá de U+FFFF.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it ends with a blank.</source>
+        <translation>%1 no admite el nombre «%2», termina en un espacio.</translation>
+    </message>
+    <message>
+        <source>%1: At character %2: %3.</source>
+        <translation>%1: en el carácter %2: %3.</translation>
+    </message>
+    <message>
+        <source>expected And, Or or the end</source>
+        <translation>se esperaba And, Or o el final</translation>
+    </message>
+    <message>
+        <source>expected less nesting, 100 levels are the most</source>
+        <translation>se esperaban menos niveles, 100 como máximo</translation>
+    </message>
+    <message>
+        <source>expected a closing %1</source>
+        <translation>se esperaba %1 de cierre</translation>
+    </message>
+    <message>
+        <source>expected ( after In</source>
+        <translation>se esperaba ( después de In</translation>
+    </message>
+    <message>
+        <source>expected Null, a text that begins so needs quotes</source>
+        <translation>se esperaba Null, un texto que empieza así necesita comillas</translation>
+    </message>
+    <message>
+        <source>expected a comparison, Like works on columns that hold text</source>
+        <translation>se esperaba una comparación, Like sirve para columnas de texto</translation>
+    </message>
+    <message>
+        <source>expected a pattern, as in Like &apos;A*&apos;, not a column</source>
+        <translation>se esperaba un patrón, como en Like &apos;A*&apos;, no una columna</translation>
+    </message>
+    <message>
+        <source>expected a pattern, as in Like &apos;A*&apos;</source>
+        <translation>se esperaba un patrón, como en Like &apos;A*&apos;</translation>
+    </message>
+    <message>
+        <source>expected And and the upper value</source>
+        <translation>se esperaba And y el valor superior</translation>
+    </message>
+    <message>
+        <source>expected a comma or a closing )</source>
+        <translation>se esperaba una coma o )</translation>
+    </message>
+    <message>
+        <source>expected a value, write Is Null for a missing one or &apos;Null&apos; for the word</source>
+        <translation>se esperaba un valor, escriba Is Null si falta o &apos;Null&apos; para la palabra</translation>
+    </message>
+    <message>
+        <source>expected the parameter&apos;s name</source>
+        <translation>se esperaba el nombre del parámetro</translation>
+    </message>
+    <message>
+        <source>expected the column&apos;s name</source>
+        <translation>se esperaba el nombre de la columna</translation>
+    </message>
+    <message>
+        <source>expected a column of the query, there is no %1</source>
+        <translation>se esperaba una columna de la consulta, no existe %1</translation>
+    </message>
+    <message>
+        <source>expected a column of the query, the table that had this one was deleted</source>
+        <translation>se esperaba una columna de la consulta, la tabla que tenía esta se eliminó</translation>
+    </message>
+    <message>
+        <source>expected the table too, as in %1, several tables have this column</source>
+        <translation>se esperaba también la tabla, como en %1, varias tablas tienen esta columna</translation>
+    </message>
+    <message>
+        <source>expected a column that holds %1</source>
+        <translation>se esperaba una columna que contenga %1</translation>
+    </message>
+    <message>
+        <source>expected the end, a criterion has at most 10000 characters</source>
+        <translation>se esperaba el final, un criterio tiene como máximo 10000 caracteres</translation>
+    </message>
+    <message>
+        <source>expected a character, found the character zero</source>
+        <translation>se esperaba un carácter, se encontró el carácter cero</translation>
+    </message>
+    <message>
+        <source>expected a character, found half of one</source>
+        <translation>se esperaba un carácter, se encontró medio</translation>
+    </message>
+    <message>
+        <source>expected a [ before this ]</source>
+        <translation>se esperaba un [ antes de este ]</translation>
+    </message>
+    <message>
+        <source>expected an operator, write &lt;&gt; for unequal</source>
+        <translation>se esperaba un operador, escriba &lt;&gt; para distinto</translation>
+    </message>
+    <message>
+        <source>expected a name between the brackets</source>
+        <translation>se esperaba un nombre entre los corchetes</translation>
+    </message>
+    <message>
+        <source>expected a text</source>
+        <translation>se esperaba un texto</translation>
+    </message>
+    <message>
+        <source>expected a number</source>
+        <translation>se esperaba un número</translation>
+    </message>
+    <message>
+        <source>expected a date (2024-12-31)</source>
+        <translation>se esperaba una fecha (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>expected a time (23:59)</source>
+        <translation>se esperaba una hora (23:59)</translation>
+    </message>
+    <message>
+        <source>expected a date and time (2024-12-31 23:59)</source>
+        <translation>se esperaba una fecha con hora (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>expected true or false</source>
+        <translation>se esperaba true o false</translation>
+    </message>
+    <message>
+        <source>expected Is Null, a column or a parameter</source>
+        <translation>se esperaba Is Null, una columna o un parámetro</translation>
+    </message>
+    <message>
+        <source>expected a value</source>
+        <translation>se esperaba un valor</translation>
+    </message>
+    <message>
+        <source>a text</source>
+        <translation>un texto</translation>
+    </message>
+    <message>
+        <source>a number</source>
+        <translation>un número</translation>
+    </message>
+    <message>
+        <source>a date (2024-12-31)</source>
+        <translation>una fecha (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>a time (23:59)</source>
+        <translation>una hora (23:59)</translation>
+    </message>
+    <message>
+        <source>a date and time (2024-12-31 23:59)</source>
+        <translation>una fecha con hora (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>true or false</source>
+        <translation>true o false</translation>
+    </message>
+    <message>
+        <source>Is Null, a column or a parameter</source>
+        <translation>Is Null, una columna o un parámetro</translation>
+    </message>
+</context>
+<context>
+    <name>QObject</name>
+    <message>
+        <source>Remove the table</source>
+        <translation>Quitar la tabla</translation>
+    </message>
+</context>
+<context>
+    <name>ZandorWidget</name>
+    <message>
+        <source>Join %1 %2 %3</source>
+        <translation>Combinación %1 %2 %3</translation>
+    </message>
+    <message>
+        <source>Query designer</source>
+        <translation>Diseñador de consultas</translation>
+    </message>
+</context>
+<context>
+    <name>designer</name>
+    <message>
+        <source>There is nothing to draw; add a table first.</source>
+        <translation>No hay nada que dibujar; añada primero una tabla.</translation>
+    </message>
+    <message>
+        <source>A picture ends in .png, .svg or .pdf; &quot;%1&quot; does not.</source>
+        <translation>Una imagen termina en .png, .svg o .pdf; «%1» no.</translation>
+    </message>
+    <message>
+        <source>The picture &quot;%1&quot; cannot be written; check the folder and your permissions.</source>
+        <translation>No se puede escribir la imagen «%1»; compruebe la carpeta y sus permisos.</translation>
+    </message>
+    <message>
+        <source>The printer cannot be reached; choose another one.</source>
+        <translation>No se puede acceder a la impresora; elija otra.</translation>
+    </message>
+    <message>
+        <source>The page could not be printed; see the printer&apos;s own messages.</source>
+        <translation>No se pudo imprimir la página; consulte los mensajes de la impresora.</translation>
+    </message>
+    <message>
+        <source>%1 tables are too many; the canvas takes %2.</source>
+        <translation>%1 tablas son demasiadas; el lienzo admite %2.</translation>
+    </message>
+    <message>
+        <source>There is no table &quot;%1&quot; in %2.</source>
+        <translation>No hay ninguna tabla «%1» en %2.</translation>
+    </message>
+    <message>
+        <source>These tables have %1 joins, and the canvas takes %2; choose fewer tables with --tables.</source>
+        <translation>Estas tablas tienen %1 combinaciones y el lienzo admite %2; elija menos tablas con --tables.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 tables; choose others in the panel &quot;Tables&quot;</source>
+        <translation>%1 de %2 tablas; elija otras en el panel «Tablas»</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Autosave</name>
+    <message>
+        <source>the folder %1 cannot be written</source>
+        <translation>no se puede escribir en la carpeta %1</translation>
+    </message>
+    <message>
+        <source>The query could not be saved for a recovery (%1); save it yourself.</source>
+        <translation>No se pudo guardar la consulta para una recuperación (%1); guárdela usted.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::CellReader</name>
+    <message>
+        <source>(outside the calendar)</source>
+        <translation>(fuera del calendario)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ConnectionBanner</name>
+    <message>
+        <source>&amp;Reconnect</source>
+        <translation>&amp;Reconectar</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Cerrar</translation>
+    </message>
+    <message>
+        <source>The connection to %1 is lost. Your query is kept.</source>
+        <translation>Se ha perdido la conexión con %1. Su consulta se conserva.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ConnectionDialog</name>
+    <message>
+        <source>Open database</source>
+        <translation>Abrir base de datos</translation>
+    </message>
+    <message>
+        <source>usual</source>
+        <translation>habitual</translation>
+    </message>
+    <message>
+        <source>Port</source>
+        <translation>Puerto</translation>
+    </message>
+    <message>
+        <source>SQLite file</source>
+        <translation>Archivo SQLite</translation>
+    </message>
+    <message>
+        <source>PostgreSQL</source>
+        <translation>PostgreSQL</translation>
+    </message>
+    <message>
+        <source>MySQL or MariaDB</source>
+        <translation>MySQL o MariaDB</translation>
+    </message>
+    <message>
+        <source>ODBC</source>
+        <translation>ODBC</translation>
+    </message>
+    <message>
+        <source>%1 (install the package %2)</source>
+        <translation>%1 (instale el paquete %2)</translation>
+    </message>
+    <message>
+        <source>&amp;Browse…</source>
+        <translation>E&amp;xaminar…</translation>
+    </message>
+    <message>
+        <source>P&amp;ort:</source>
+        <translation>Puert&amp;o:</translation>
+    </message>
+    <message>
+        <source>&amp;Kind:</source>
+        <translation>&amp;Tipo:</translation>
+    </message>
+    <message>
+        <source>&amp;File:</source>
+        <translation>&amp;Archivo:</translation>
+    </message>
+    <message>
+        <source>&amp;Host:</source>
+        <translation>&amp;Servidor:</translation>
+    </message>
+    <message>
+        <source>Data &amp;source:</source>
+        <translation>&amp;Origen de datos:</translation>
+    </message>
+    <message>
+        <source>&amp;Database:</source>
+        <translation>&amp;Base de datos:</translation>
+    </message>
+    <message>
+        <source>&amp;User:</source>
+        <translation>&amp;Usuario:</translation>
+    </message>
+    <message>
+        <source>&amp;Password:</source>
+        <translation>&amp;Contraseña:</translation>
+    </message>
+    <message>
+        <source>&amp;Address:</source>
+        <translation>&amp;Dirección:</translation>
+    </message>
+    <message>
+        <source>SQLite databases (*.sqlite *.sqlite3 *.db *.db3);;All files (*)</source>
+        <translation>Bases de datos SQLite (*.sqlite *.sqlite3 *.db *.db3);;Todos los archivos (*)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::DatabaseCommands</name>
+    <message>
+        <source>Open SQLite &amp;file…</source>
+        <translation>Abrir &amp;archivo SQLite…</translation>
+    </message>
+    <message>
+        <source>&amp;Connect to a server…</source>
+        <translation>&amp;Conectar con un servidor…</translation>
+    </message>
+    <message>
+        <source>&amp;Reconnect</source>
+        <translation>&amp;Reconectar</translation>
+    </message>
+    <message>
+        <source>Open database</source>
+        <translation>Abrir base de datos</translation>
+    </message>
+    <message>
+        <source>The database was not opened.</source>
+        <translation>No se abrió la base de datos.</translation>
+    </message>
+    <message>
+        <source>Open SQLite file</source>
+        <translation>Abrir archivo SQLite</translation>
+    </message>
+    <message>
+        <source>SQLite databases (*.sqlite *.sqlite3 *.db *.db3);;All files (*)</source>
+        <translation>Bases de datos SQLite (*.sqlite *.sqlite3 *.db *.db3);;Todos los archivos (*)</translation>
+    </message>
+    <message>
+        <source>Reconnect</source>
+        <translation>Reconectar</translation>
+    </message>
+    <message>
+        <source>The query is open, but not its database. %1</source>
+        <translation>La consulta está abierta, pero no su base de datos. %1</translation>
+    </message>
+</context>
+<context>
+    <name>designer::DesignerWindow</name>
+    <message>
+        <source>Tables</source>
+        <translation>Tablas</translation>
+    </message>
+    <message>
+        <source>SQL</source>
+        <translation>SQL</translation>
+    </message>
+    <message>
+        <source>Rows</source>
+        <translation>Filas</translation>
+    </message>
+    <message>
+        <source>Events</source>
+        <translation>Eventos</translation>
+    </message>
+    <message>
+        <source>&amp;File</source>
+        <translation>&amp;Archivo</translation>
+    </message>
+    <message>
+        <source>&amp;Quit</source>
+        <translation>&amp;Salir</translation>
+    </message>
+    <message>
+        <source>&amp;Edit</source>
+        <translation>&amp;Editar</translation>
+    </message>
+    <message>
+        <source>Copy &amp;SQL</source>
+        <translation>Copiar &amp;SQL</translation>
+    </message>
+    <message>
+        <source>&amp;Options…</source>
+        <translation>&amp;Opciones…</translation>
+    </message>
+    <message>
+        <source>&amp;Database</source>
+        <translation>&amp;Base de datos</translation>
+    </message>
+    <message>
+        <source>&amp;Query</source>
+        <translation>&amp;Consulta</translation>
+    </message>
+    <message>
+        <source>&amp;Arrange tables</source>
+        <translation>&amp;Organizar las tablas</translation>
+    </message>
+    <message>
+        <source>Re&amp;name table…</source>
+        <translation>Cambiar el &amp;nombre de la tabla…</translation>
+    </message>
+    <message>
+        <source>&amp;View</source>
+        <translation>&amp;Ver</translation>
+    </message>
+    <message>
+        <source>&amp;Help</source>
+        <translation>Ay&amp;uda</translation>
+    </message>
+    <message>
+        <source>&amp;About</source>
+        <translation>Acerca &amp;de</translation>
+    </message>
+    <message>
+        <source>Add tables</source>
+        <translation>Añadir tablas</translation>
+    </message>
+    <message>
+        <source>Output columns</source>
+        <translation>Columnas de salida</translation>
+    </message>
+    <message>
+        <source>The grid shows %1 output columns and is full. Delete one before you add another; it would take the place of the last.</source>
+        <translation>La cuadrícula muestra %1 columnas de salida y está llena. Elimine una antes de añadir otra; ocuparía el lugar de la última.</translation>
+    </message>
+    <message>
+        <source>About Zandor Designer</source>
+        <translation>Acerca de Zandor Designer</translation>
+    </message>
+    <message>
+        <source>Zandor Designer %1
+
+Draw a query, read its SQL, run it. The database is only read.</source>
+        <translation>Zandor Designer %1
+
+Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</translation>
+    </message>
+    <message>
+        <source>&amp;New query</source>
+        <translation>&amp;Nueva consulta</translation>
+    </message>
+    <message>
+        <source>&amp;Open query…</source>
+        <translation>&amp;Abrir consulta…</translation>
+    </message>
+    <message>
+        <source>&amp;Save</source>
+        <translation>&amp;Guardar</translation>
+    </message>
+    <message>
+        <source>Save &amp;as…</source>
+        <translation>Guardar &amp;como…</translation>
+    </message>
+    <message>
+        <source>Tables: %1   Joins: %2</source>
+        <translation>Tablas: %1   Combinaciones: %2</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Document</name>
+    <message>
+        <source>&amp;Undo</source>
+        <translation>&amp;Deshacer</translation>
+    </message>
+    <message>
+        <source>&amp;Redo</source>
+        <translation>&amp;Rehacer</translation>
+    </message>
+</context>
+<context>
+    <name>designer::EventPanel</name>
+    <message>
+        <source>Time</source>
+        <translation>Hora</translation>
+    </message>
+    <message>
+        <source>No.</source>
+        <translation>N.º</translation>
+    </message>
+    <message>
+        <source>Event</source>
+        <translation>Evento</translation>
+    </message>
+    <message>
+        <source>Arguments</source>
+        <translation>Argumentos</translation>
+    </message>
+    <message>
+        <source>Events of the control</source>
+        <translation>Eventos del control</translation>
+    </message>
+    <message>
+        <source>Clear</source>
+        <translation>Vaciar</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copiar</translation>
+    </message>
+    <message>
+        <source>Copy the selected events, or all of them</source>
+        <translation>Copiar los eventos seleccionados, o todos</translation>
+    </message>
+    <message>
+        <source>DeletedTable: %1</source>
+        <translation>DeletedTable: %1</translation>
+    </message>
+    <message>
+        <source>%1 (number %2)</source>
+        <translation>%1 (número %2)</translation>
+    </message>
+    <message>
+        <source>wParam %1: the menu opens</source>
+        <translation>wParam %1: se abre el menú</translation>
+    </message>
+    <message>
+        <source>wParam %1: the menu is closed</source>
+        <translation>wParam %1: el menú está cerrado</translation>
+    </message>
+</context>
+<context>
+    <name>designer::EventWords</name>
+    <message>
+        <source>(gone)</source>
+        <translation>(eliminado)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FileDialogs</name>
+    <message>
+        <source>Zandor queries (*.json)</source>
+        <translation>Consultas de Zandor (*.json)</translation>
+    </message>
+    <message>
+        <source>All files (*)</source>
+        <translation>Todos los archivos (*)</translation>
+    </message>
+    <message>
+        <source>Open Query</source>
+        <translation>Abrir consulta</translation>
+    </message>
+    <message>
+        <source>Save Query</source>
+        <translation>Guardar consulta</translation>
+    </message>
+    <message>
+        <source>query.json</source>
+        <translation>consulta.json</translation>
+    </message>
+    <message>
+        <source>Save the changes to &quot;%1&quot;?</source>
+        <translation>¿Guardar los cambios de «%1»?</translation>
+    </message>
+    <message>
+        <source>Changes that are not saved are lost.</source>
+        <translation>Los cambios que no se guarden se perderán.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FileExport</name>
+    <message>
+        <source>The file &quot;%1&quot; cannot be written (%2): check the folder and your permissions.</source>
+        <translation>No se puede escribir el archivo «%1» (%2): compruebe la carpeta y sus permisos.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FlagsPage</name>
+    <message>
+        <source>Join types offered</source>
+        <translation>Tipos de combinación ofrecidos</translation>
+    </message>
+    <message>
+        <source>Operators offered</source>
+        <translation>Operadores ofrecidos</translation>
+    </message>
+    <message>
+        <source>The join dialog counts what it offers: with one left out, each behind it counts as the one before. Leave out only from the end.</source>
+        <translation>La ventana de combinación cuenta lo que ofrece: si falta una entrada, cada una de las siguientes vale por la anterior. Quítelas solo del final.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Opening</name>
+    <message>
+        <source>Connecting to %1…</source>
+        <translation>Conectando con %1…</translation>
+    </message>
+</context>
+<context>
+    <name>designer::OptionsDialog</name>
+    <message>
+        <source>The entries of the context menu that are shown:</source>
+        <translation>Entradas que muestra el menú contextual:</translation>
+    </message>
+    <message>
+        <source>What can be done with joins:</source>
+        <translation>Qué se puede hacer con las combinaciones:</translation>
+    </message>
+    <message>
+        <source>For developers: each box must be answered before the control goes on, and there may be hundreds when a large query is shown.</source>
+        <translation>Para desarrolladores: hay que responder a cada mensaje antes de que el control siga, y con una consulta grande puede haber cientos.</translation>
+    </message>
+    <message>
+        <source>Options</source>
+        <translation>Opciones</translation>
+    </message>
+    <message>
+        <source>Texts</source>
+        <translation>Textos</translation>
+    </message>
+    <message>
+        <source>Menu</source>
+        <translation>Menú</translation>
+    </message>
+    <message>
+        <source>Joins</source>
+        <translation>Combinaciones</translation>
+    </message>
+    <message>
+        <source>Debug</source>
+        <translation>Depuración</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ParameterDialog</name>
+    <message>
+        <source>Values for the query</source>
+        <translation>Valores para la consulta</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1:</translation>
+    </message>
+    <message>
+        <source>&amp;Run</source>
+        <translation>&amp;Ejecutar</translation>
+    </message>
+    <message>
+        <source>%1 has to be %2.</source>
+        <translation>%1 debe ser %2.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::PasswordPrompt</name>
+    <message>
+        <source>Password</source>
+        <translation>Contraseña</translation>
+    </message>
+    <message>
+        <source>The database %1 on %2 asks for a password.</source>
+        <translation>La base de datos %1 en %2 pide una contraseña.</translation>
+    </message>
+    <message>
+        <source>The database %1 on %2 asks for the password of %3.</source>
+        <translation>La base de datos %1 en %2 pide la contraseña de %3.</translation>
+    </message>
+    <message>
+        <source>&amp;Password:</source>
+        <translation>&amp;Contraseña:</translation>
+    </message>
+</context>
+<context>
+    <name>designer::QueryFile</name>
+    <message>
+        <source>Untitled</source>
+        <translation>Sin título</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Question</name>
+    <message>
+        <source>a pattern: * for any characters, ? for one</source>
+        <translation>un patrón: * para cualquier texto, ? para un carácter</translation>
+    </message>
+    <message>
+        <source>a text</source>
+        <translation>un texto</translation>
+    </message>
+    <message>
+        <source>a number</source>
+        <translation>un número</translation>
+    </message>
+    <message>
+        <source>a date such as 2024-12-31</source>
+        <translation>una fecha como 2024-12-31</translation>
+    </message>
+    <message>
+        <source>a time such as 23:59</source>
+        <translation>una hora como 23:59</translation>
+    </message>
+    <message>
+        <source>a date and time such as 2024-12-31 23:59</source>
+        <translation>una fecha con hora como 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>true or false</source>
+        <translation>true o false</translation>
+    </message>
+    <message>
+        <source>a value</source>
+        <translation>un valor</translation>
+    </message>
+</context>
+<context>
+    <name>designer::RecentMenu</name>
+    <message>
+        <source>Open &amp;Recent</source>
+        <translation>Abrir &amp;recientes</translation>
+    </message>
+    <message>
+        <source>&amp;Clear List</source>
+        <translation>&amp;Vaciar la lista</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Recovery</name>
+    <message>
+        <source>A query that was never saved</source>
+        <translation>Una consulta nunca guardada</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot;</source>
+        <translation>«%1»</translation>
+    </message>
+    <message>
+        <source>Recover Query</source>
+        <translation>Recuperar consulta</translation>
+    </message>
+    <message>
+        <source>%1 has changes that were not saved.</source>
+        <translation>%1 tiene cambios que no se guardaron.</translation>
+    </message>
+    <message>
+        <source>The designer ended unexpectedly. The changes up to %1 can be recovered.</source>
+        <translation>El programa terminó de forma inesperada. Se pueden recuperar los cambios hasta %1.</translation>
+    </message>
+    <message>
+        <source>&amp;Recover</source>
+        <translation>&amp;Recuperar</translation>
+    </message>
+    <message>
+        <source>&amp;Ask Later</source>
+        <translation>&amp;Preguntar más tarde</translation>
+    </message>
+</context>
+<context>
+    <name>designer::RenameDialog</name>
+    <message>
+        <source>Rename table</source>
+        <translation>Cambiar el nombre de la tabla</translation>
+    </message>
+    <message>
+        <source>&amp;Rename</source>
+        <translation>&amp;Cambiar</translation>
+    </message>
+    <message>
+        <source>The name is the table&apos;s in this query only; the database stays as it is.</source>
+        <translation>El nombre vale solo en esta consulta; la base de datos queda como está.</translation>
+    </message>
+    <message>
+        <source>&amp;Table:</source>
+        <translation>&amp;Tabla:</translation>
+    </message>
+    <message>
+        <source>&amp;New name:</source>
+        <translation>&amp;Nombre nuevo:</translation>
+    </message>
+    <message>
+        <source>A table needs a name; type one.</source>
+        <translation>Una tabla necesita un nombre; escriba uno.</translation>
+    </message>
+    <message>
+        <source>Another table of this query is called &quot;%1&quot;; choose another name.</source>
+        <translation>Otra tabla de esta consulta se llama «%1»; elija otro nombre.</translation>
+    </message>
+    <message>
+        <source>Rename table %1</source>
+        <translation>Cambiar el nombre de la tabla %1</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultModel</name>
+    <message>
+        <source>(blob, %1 bytes)</source>
+        <translation>(blob, %1 bytes)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultTable</name>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>&amp;Copiar</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultsPanel</name>
+    <message>
+        <source>These are too many cells to copy; export the rows instead.</source>
+        <translation>Son demasiadas celdas para copiarlas; exporte las filas.</translation>
+    </message>
+    <message>
+        <source>No database is open: open one first.</source>
+        <translation>No hay ninguna base de datos abierta: abra primero una.</translation>
+    </message>
+    <message>
+        <source>The query cannot be run yet:</source>
+        <translation>La consulta aún no se puede ejecutar:</translation>
+    </message>
+    <message>
+        <source>Cancelling…</source>
+        <translation>Cancelando…</translation>
+    </message>
+    <message>
+        <source>Exporting…</source>
+        <translation>Exportando…</translation>
+    </message>
+    <message>
+        <source>Running…</source>
+        <translation>Ejecutando…</translation>
+    </message>
+    <message>
+        <source>%1  Rows so far: %2 · %3</source>
+        <translation>%1  Filas hasta ahora: %2 · %3</translation>
+    </message>
+    <message>
+        <source>The server does not answer.</source>
+        <translation>El servidor no responde.</translation>
+    </message>
+    <message>
+        <source>Exported to %1. Rows: %2 · %3</source>
+        <translation>Exportado a %1. Filas: %2 · %3</translation>
+    </message>
+    <message>
+        <source>Rows: %1 · %2</source>
+        <translation>Filas: %1 · %2</translation>
+    </message>
+    <message>
+        <source>First %1 rows; there are more · %2</source>
+        <translation>Primeras %1 filas; hay más · %2</translation>
+    </message>
+    <message>
+        <source>Cancelled; nothing was exported · %1</source>
+        <translation>Cancelado; no se exportó nada · %1</translation>
+    </message>
+    <message>
+        <source>Cancelled. Rows that came: %1 · %2</source>
+        <translation>Cancelado. Filas recibidas: %1 · %2</translation>
+    </message>
+    <message>
+        <source>The database did not run the statement:
+%1</source>
+        <translation>La base de datos no ejecutó la instrucción:
+%1</translation>
+    </message>
+    <message>
+        <source>The connection to the database has broken down:
+%1</source>
+        <translation>Se ha roto la conexión con la base de datos:
+%1</translation>
+    </message>
+    <message>
+        <source>Export all rows</source>
+        <translation>Exportar todas las filas</translation>
+    </message>
+    <message>
+        <source>Comma-separated values (*.csv)</source>
+        <translation>Valores separados por comas (*.csv)</translation>
+    </message>
+    <message>
+        <source>Run the query to see its rows here.</source>
+        <translation>Ejecute la consulta para ver aquí sus filas.</translation>
+    </message>
+    <message>
+        <source>%1 · the drawing has changed since</source>
+        <translation>%1 · el dibujo ha cambiado desde entonces</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>&amp;Run</source>
+        <translation>&amp;Ejecutar</translation>
+    </message>
+    <message>
+        <source>Run the query and show its rows (F5)</source>
+        <translation>Ejecutar la consulta y mostrar sus filas (F5)</translation>
+    </message>
+    <message>
+        <source>&amp;Cancel</source>
+        <translation>&amp;Cancelar</translation>
+    </message>
+    <message>
+        <source>Stop what is running, on the database too</source>
+        <translation>Detener lo que se está ejecutando, también en la base de datos</translation>
+    </message>
+    <message>
+        <source>&amp;Export…</source>
+        <translation>E&amp;xportar…</translation>
+    </message>
+    <message>
+        <source>Run the query and write all its rows into a CSV file</source>
+        <translation>Ejecutar la consulta y escribir todas sus filas en un archivo CSV</translation>
+    </message>
+    <message>
+        <source>So many rows are shown at most</source>
+        <translation>Cuántas filas se muestran como máximo</translation>
+    </message>
+    <message>
+        <source>%1 rows</source>
+        <translation>%1 filas</translation>
+    </message>
+    <message>
+        <source>All rows</source>
+        <translation>Todas las filas</translation>
+    </message>
+    <message>
+        <source>Run the query again without the limit</source>
+        <translation>Ejecutar de nuevo la consulta sin el límite</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ShowCommands</name>
+    <message>
+        <source>&amp;Export drawing…</source>
+        <translation>&amp;Exportar el dibujo…</translation>
+    </message>
+    <message>
+        <source>&amp;Print…</source>
+        <translation>Im&amp;primir…</translation>
+    </message>
+    <message>
+        <source>Copy as p&amp;icture</source>
+        <translation>Copiar como &amp;imagen</translation>
+    </message>
+    <message>
+        <source>Export drawing</source>
+        <translation>Exportar el dibujo</translation>
+    </message>
+    <message>
+        <source>Picture (*.png)</source>
+        <translation>Imagen (*.png)</translation>
+    </message>
+    <message>
+        <source>Scalable drawing (*.svg)</source>
+        <translation>Dibujo vectorial (*.svg)</translation>
+    </message>
+    <message>
+        <source>Document (*.pdf)</source>
+        <translation>Documento (*.pdf)</translation>
+    </message>
+    <message>
+        <source>Query</source>
+        <translation>Consulta</translation>
+    </message>
+    <message>
+        <source>Print</source>
+        <translation>Imprimir</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Spool</name>
+    <message>
+        <source>No file for the rows can be made in &quot;%1&quot; (%2): set TMPDIR to a folder that you may write to.</source>
+        <translation>No se puede crear un archivo para las filas en «%1» (%2): ponga en TMPDIR una carpeta en la que pueda escribir.</translation>
+    </message>
+    <message>
+        <source>The rows would fill the disk with the folder &quot;%1&quot;: make room there, or ask for fewer rows.</source>
+        <translation>Las filas llenarían el disco de la carpeta «%1»: haga sitio allí, o pida menos filas.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::StatementPanel</name>
+    <message>
+        <source>The dialect of SQL that the statement is written in</source>
+        <translation>El dialecto de SQL en que está escrita la instrucción</translation>
+    </message>
+    <message>
+        <source>Dialect</source>
+        <translation>Dialecto</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copiar</translation>
+    </message>
+    <message>
+        <source>Copy the statement to the clipboard</source>
+        <translation>Copiar la instrucción al portapapeles</translation>
+    </message>
+    <message>
+        <source>SQL statement</source>
+        <translation>Instrucción SQL</translation>
+    </message>
+    <message>
+        <source>Findings</source>
+        <translation>Observaciones</translation>
+    </message>
+    <message>
+        <source>Click a finding to see its place</source>
+        <translation>Haga clic en una observación para ver el lugar</translation>
+    </message>
+    <message>
+        <source>Add a table to begin: the statement appears here.</source>
+        <translation>Añada una tabla para empezar: la instrucción aparece aquí.</translation>
+    </message>
+    <message>
+        <source>%1 cannot say this query:</source>
+        <translation>%1 no puede expresar esta consulta:</translation>
+    </message>
+    <message>
+        <source>Error: %1</source>
+        <translation>Error: %1</translation>
+    </message>
+    <message>
+        <source>Warning: %1</source>
+        <translation>Advertencia: %1</translation>
+    </message>
+    <message>
+        <source>%1 (as the database)</source>
+        <translation>%1 (como la base de datos)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::StepName</name>
+    <message>
+        <source>Change the query</source>
+        <translation>Cambiar la consulta</translation>
+    </message>
+    <message>
+        <source>Delete table %1</source>
+        <translation>Eliminar la tabla %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n table(s)</source>
+        <translation>
+            <numerusform>Eliminar %n tabla</numerusform>
+            <numerusform>Eliminar %n tablas</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Add table %1</source>
+        <translation>Añadir la tabla %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n table(s)</source>
+        <translation>
+            <numerusform>Añadir %n tabla</numerusform>
+            <numerusform>Añadir %n tablas</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Rename table %1 to %2</source>
+        <translation>Cambiar el nombre de la tabla %1 a %2</translation>
+    </message>
+    <message numerus="yes">
+        <source>Resize %n table(s)</source>
+        <translation>
+            <numerusform>Cambiar el tamaño de %n tabla</numerusform>
+            <numerusform>Cambiar el tamaño de %n tablas</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Move %n table(s)</source>
+        <translation>
+            <numerusform>Mover %n tabla</numerusform>
+            <numerusform>Mover %n tablas</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Resize table %1</source>
+        <translation>Cambiar el tamaño de la tabla %1</translation>
+    </message>
+    <message>
+        <source>Move table %1</source>
+        <translation>Mover la tabla %1</translation>
+    </message>
+    <message>
+        <source>Add join %1</source>
+        <translation>Añadir la combinación %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n join(s)</source>
+        <translation>
+            <numerusform>Añadir %n combinación</numerusform>
+            <numerusform>Añadir %n combinaciones</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Delete join %1</source>
+        <translation>Eliminar la combinación %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n join(s)</source>
+        <translation>
+            <numerusform>Eliminar %n combinación</numerusform>
+            <numerusform>Eliminar %n combinaciones</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Change join %1</source>
+        <translation>Cambiar la combinación %1</translation>
+    </message>
+    <message>
+        <source>Change joins</source>
+        <translation>Cambiar las combinaciones</translation>
+    </message>
+    <message numerus="yes">
+        <source>Change %n column(s)</source>
+        <translation>
+            <numerusform>Cambiar %n columna</numerusform>
+            <numerusform>Cambiar %n columnas</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Add column %1</source>
+        <translation>Añadir la columna %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n column(s)</source>
+        <translation>
+            <numerusform>Añadir %n columna</numerusform>
+            <numerusform>Añadir %n columnas</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Delete column %1</source>
+        <translation>Eliminar la columna %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n column(s)</source>
+        <translation>
+            <numerusform>Eliminar %n columna</numerusform>
+            <numerusform>Eliminar %n columnas</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Change columns</source>
+        <translation>Cambiar las columnas</translation>
+    </message>
+    <message>
+        <source>Change criterion of %1</source>
+        <translation>Cambiar el criterio de %1</translation>
+    </message>
+    <message>
+        <source>Rename column %1</source>
+        <translation>Cambiar el nombre de la columna %1</translation>
+    </message>
+    <message>
+        <source>Change sorting by %1</source>
+        <translation>Cambiar el orden por %1</translation>
+    </message>
+    <message>
+        <source>Show column %1</source>
+        <translation>Mostrar la columna %1</translation>
+    </message>
+    <message>
+        <source>Hide column %1</source>
+        <translation>Ocultar la columna %1</translation>
+    </message>
+    <message>
+        <source>Change column %1</source>
+        <translation>Cambiar la columna %1</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableAdding</name>
+    <message>
+        <source>Arrange tables</source>
+        <translation>Organizar las tablas</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 tables, and has them; delete one first.</source>
+        <translation>El dibujo admite %1 tablas y ya las tiene; elimine primero una.</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 tables and has %2; choose fewer.</source>
+        <translation>El dibujo admite %1 tablas y tiene %2; elija menos.</translation>
+    </message>
+    <message>
+        <source>Add table %1</source>
+        <translation>Añadir la tabla %1</translation>
+    </message>
+    <message>
+        <source>Add %1 tables</source>
+        <translation>Añadir %1 tablas</translation>
+    </message>
+    <message>
+        <source>Reading the tables…</source>
+        <translation>Leyendo las tablas…</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 joins, and with this there would be %2; delete tables or joins first.</source>
+        <translation>El dibujo admite %1 combinaciones y así habría %2; elimine primero tablas o combinaciones.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableListModel</name>
+    <message>
+        <source>%1, view</source>
+        <translation>%1, vista</translation>
+    </message>
+    <message>
+        <source>%1, table</source>
+        <translation>%1, tabla</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableTip</name>
+    <message>
+        <source>%1 (view)</source>
+        <translation>%1 (vista)</translation>
+    </message>
+    <message>
+        <source>and %1 more</source>
+        <translation>y %1 más</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TablesPanel</name>
+    <message>
+        <source>Filter tables</source>
+        <translation>Filtrar tablas</translation>
+    </message>
+    <message>
+        <source>Read the list of tables again</source>
+        <translation>Volver a leer la lista de tablas</translation>
+    </message>
+    <message>
+        <source>Tables</source>
+        <translation>Tablas</translation>
+    </message>
+    <message>
+        <source>Open a database to see its tables.</source>
+        <translation>Abra una base de datos para ver sus tablas.</translation>
+    </message>
+    <message>
+        <source>There are no tables in this database.</source>
+        <translation>No hay tablas en esta base de datos.</translation>
+    </message>
+    <message>
+        <source>No table has all of this in its name.</source>
+        <translation>Ninguna tabla tiene todo esto en su nombre.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 tables</source>
+        <translation>%1 de %2 tablas</translation>
+    </message>
+    <message>
+        <source>1 table</source>
+        <translation>1 tabla</translation>
+    </message>
+    <message>
+        <source>%1 tables</source>
+        <translation>%1 tablas</translation>
+    </message>
+    <message>
+        <source>&amp;Add to drawing</source>
+        <translation>&amp;Añadir al dibujo</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TextsPage</name>
+    <message>
+        <source>Where it is used</source>
+        <translation>Dónde se usa</translation>
+    </message>
+    <message>
+        <source>Text</source>
+        <translation>Texto</translation>
+    </message>
+    <message>
+        <source>Texts of the control</source>
+        <translation>Textos del control</translation>
+    </message>
+    <message>
+        <source>Set of texts</source>
+        <translation>Juego de textos</translation>
+    </message>
+    <message>
+        <source>Texts that are left as they are follow the designer&apos;s language. Emptying one brings its text of that language back.</source>
+        <translation>Los textos que se dejan como están siguen el idioma del programa. Al vaciar uno vuelve el texto de ese idioma.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Waiting</name>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancelar</translation>
+    </message>
+</context>
+<context>
+    <name>designer::shell</name>
+    <message>
+        <source>Password for %1: </source>
+        <translation>Contraseña para %1: </translation>
+    </message>
+    <message>
+        <source>The query asks for &quot;%1&quot;; give it with --set &quot;%1=VALUE&quot;.</source>
+        <translation>La consulta pide «%1»; indíquelo con --set &quot;%1=VALOR&quot;.</translation>
+    </message>
+    <message>
+        <source>The query asks for &quot;%1&quot;, which has to be %2; &quot;%3&quot; is not.</source>
+        <translation>La consulta pide «%1», que debe ser %2; «%3» no lo es.</translation>
+    </message>
+    <message>
+        <source>The query does not ask for &quot;%1&quot;; leave out its --set.</source>
+        <translation>La consulta no pide «%1»; quite su --set.</translation>
+    </message>
+    <message>
+        <source>Cancelled.</source>
+        <translation>Cancelado.</translation>
+    </message>
+    <message>
+        <source>The query names no database; give one with --database.</source>
+        <translation>La consulta no nombra ninguna base de datos; indique una con --database.</translation>
+    </message>
+    <message>
+        <source>There is no format &quot;%1&quot;; write --format csv or --format json.</source>
+        <translation>No existe el formato «%1»; escriba --format csv o --format json.</translation>
+    </message>
+    <message>
+        <source>--limit takes a number of rows; write --limit 100.</source>
+        <translation>--limit espera un número de filas; escriba --limit 100.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; sets nothing; write --set NAME=VALUE.</source>
+        <translation>«%1» no fija nada; escriba --set NOMBRE=VALOR.</translation>
+    </message>
+    <message>
+        <source>--sql and --run go one at a time.</source>
+        <translation>--sql y --run solo van por separado.</translation>
+    </message>
+    <message>
+        <source>--%1 goes with --run only.</source>
+        <translation>--%1 solo va con --run.</translation>
+    </message>
+    <message>
+        <source>--dialect goes with --sql only.</source>
+        <translation>--dialect solo va con --sql.</translation>
+    </message>
+    <message>
+        <source>No query is named; write --%1 query.json.</source>
+        <translation>No se nombra ninguna consulta; escriba --%1 consulta.json.</translation>
+    </message>
+    <message>
+        <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
+        <translation>No existe el dialecto «%1»; se conocen sqlite, postgresql, mysql, sqlserver y standard.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::writeAll</name>
+    <message>
+        <source>The rows cannot be written (%1): see that the disk has room and that you may write there.</source>
+        <translation>No se pueden escribir las filas (%1): compruebe que hay sitio y que puede escribir allí.</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::Canvas</name>
+    <message>
+        <source>Tables and joins</source>
+        <translation>Tablas y combinaciones</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::CanvasScrollBar</name>
+    <message>
+        <source>Scroll across</source>
+        <translation>Desplazamiento horizontal</translation>
+    </message>
+    <message>
+        <source>Scroll down</source>
+        <translation>Desplazamiento vertical</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::ColumnListModel</name>
+    <message>
+        <source>key column</source>
+        <translation>columna clave</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::GridModel</name>
+    <message>
+        <source>column %1</source>
+        <translation>columna %1</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::GridWidget</name>
+    <message>
+        <source>Output columns</source>
+        <translation>Columnas de salida</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::HomeButton</name>
+    <message>
+        <source>Back to the origin</source>
+        <translation>Volver al origen</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,1802 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="fr" sourcelanguage="en">
+<context>
+    <name>ControlFlags</name>
+    <message>
+        <source>Show join definition</source>
+        <translation>Définir la jointure</translation>
+    </message>
+    <message>
+        <source>Delete join</source>
+        <translation>Supprimer la jointure</translation>
+    </message>
+    <message>
+        <source>Copy column</source>
+        <translation>Copier la colonne</translation>
+    </message>
+    <message>
+        <source>Create join</source>
+        <translation>Créer une jointure</translation>
+    </message>
+    <message>
+        <source>Delete table</source>
+        <translation>Supprimer la table</translation>
+    </message>
+    <message>
+        <source>Paste column</source>
+        <translation>Coller la colonne</translation>
+    </message>
+    <message>
+        <source>Delete output column</source>
+        <translation>Supprimer la colonne de sortie</translation>
+    </message>
+    <message>
+        <source>Separator below the join entries</source>
+        <translation>Séparateur sous les entrées des jointures</translation>
+    </message>
+    <message>
+        <source>Separator below the table entries</source>
+        <translation>Séparateur sous les entrées des tables</translation>
+    </message>
+    <message>
+        <source>Type and operator of a join can be changed</source>
+        <translation>Le type et l’opérateur d’une jointure sont modifiables</translation>
+    </message>
+    <message>
+        <source>Tables and joins only, no output columns</source>
+        <translation>Tables et jointures seulement, sans colonnes de sortie</translation>
+    </message>
+    <message>
+        <source>Normal: only rows that match</source>
+        <translation>Normale : seulement les lignes qui correspondent</translation>
+    </message>
+    <message>
+        <source>Left outer: all rows of the left table</source>
+        <translation>Externe gauche : toutes les lignes de la table de gauche</translation>
+    </message>
+    <message>
+        <source>Right outer: all rows of the right table</source>
+        <translation>Externe droite : toutes les lignes de la table de droite</translation>
+    </message>
+    <message>
+        <source>Both outer: all rows of both tables</source>
+        <translation>Externe des deux côtés : toutes les lignes des deux tables</translation>
+    </message>
+    <message>
+        <source>=  equal</source>
+        <translation>=  égal</translation>
+    </message>
+    <message>
+        <source>&lt;&gt;  not equal</source>
+        <translation>&lt;&gt;  différent</translation>
+    </message>
+    <message>
+        <source>&lt;  less</source>
+        <translation>&lt;  inférieur</translation>
+    </message>
+    <message>
+        <source>&gt;  greater</source>
+        <translation>&gt;  supérieur</translation>
+    </message>
+    <message>
+        <source>&lt;=  less or equal</source>
+        <translation>&lt;=  inférieur ou égal</translation>
+    </message>
+    <message>
+        <source>&gt;=  greater or equal</source>
+        <translation>&gt;=  supérieur ou égal</translation>
+    </message>
+    <message>
+        <source>Show a box at each step of the control</source>
+        <translation>Afficher un message à chaque étape du contrôle</translation>
+    </message>
+</context>
+<context>
+    <name>ControlTextUses</name>
+    <message>
+        <source>Join dialog: title</source>
+        <translation>Fenêtre de jointure : titre</translation>
+    </message>
+    <message>
+        <source>Join dialog: left table</source>
+        <translation>Fenêtre de jointure : table de gauche</translation>
+    </message>
+    <message>
+        <source>Join dialog: left column</source>
+        <translation>Fenêtre de jointure : colonne de gauche</translation>
+    </message>
+    <message>
+        <source>Join dialog: right table</source>
+        <translation>Fenêtre de jointure : table de droite</translation>
+    </message>
+    <message>
+        <source>Join dialog: right column</source>
+        <translation>Fenêtre de jointure : colonne de droite</translation>
+    </message>
+    <message>
+        <source>Join dialog: join type</source>
+        <translation>Fenêtre de jointure : type de jointure</translation>
+    </message>
+    <message>
+        <source>Join type: only rows that match</source>
+        <translation>Type de jointure : seulement les lignes qui correspondent</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of the left table</source>
+        <translation>Type de jointure : toutes les lignes de la table de gauche</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of the right table</source>
+        <translation>Type de jointure : toutes les lignes de la table de droite</translation>
+    </message>
+    <message>
+        <source>Join type: all rows of both tables</source>
+        <translation>Type de jointure : toutes les lignes des deux tables</translation>
+    </message>
+    <message>
+        <source>Join dialog: button that takes the changes over</source>
+        <translation>Fenêtre de jointure : bouton qui valide les modifications</translation>
+    </message>
+    <message>
+        <source>Join dialog: button that drops the changes</source>
+        <translation>Fenêtre de jointure : bouton qui abandonne les modifications</translation>
+    </message>
+    <message>
+        <source>Menu: open the join dialog</source>
+        <translation>Menu : ouvrir la fenêtre de jointure</translation>
+    </message>
+    <message>
+        <source>Menu: delete a join</source>
+        <translation>Menu : supprimer une jointure</translation>
+    </message>
+    <message>
+        <source>Menu: copy the selected columns</source>
+        <translation>Menu : copier les colonnes sélectionnées</translation>
+    </message>
+    <message>
+        <source>Menu: join the copied column to the selected one</source>
+        <translation>Menu : joindre la colonne copiée à celle sélectionnée</translation>
+    </message>
+    <message>
+        <source>Menu: take a table out of the query</source>
+        <translation>Menu : retirer une table de la requête</translation>
+    </message>
+    <message>
+        <source>Menu: make output columns of the copied columns</source>
+        <translation>Menu : faire des colonnes copiées des colonnes de sortie</translation>
+    </message>
+    <message>
+        <source>Menu: delete an output column</source>
+        <translation>Menu : supprimer une colonne de sortie</translation>
+    </message>
+    <message>
+        <source>Grid: the column</source>
+        <translation>Grille : la colonne</translation>
+    </message>
+    <message>
+        <source>Grid: the name that the column comes out under</source>
+        <translation>Grille : le nom sous lequel la colonne est produite</translation>
+    </message>
+    <message>
+        <source>Grid: sort order</source>
+        <translation>Grille : ordre de tri</translation>
+    </message>
+    <message>
+        <source>Grid: whether the column comes out</source>
+        <translation>Grille : si la colonne est produite</translation>
+    </message>
+    <message>
+        <source>Grid: the first row of criteria</source>
+        <translation>Grille : la première ligne de critères</translation>
+    </message>
+    <message>
+        <source>Grid: further rows of criteria</source>
+        <translation>Grille : les autres lignes de critères</translation>
+    </message>
+</context>
+<context>
+    <name>ControlTexts</name>
+    <message>
+        <source>Join Defintion</source>
+        <translation>Définition de la jointure</translation>
+    </message>
+    <message>
+        <source>Left Table:</source>
+        <translation>Table de gauche :</translation>
+    </message>
+    <message>
+        <source>Left Column:</source>
+        <translation>Colonne de gauche :</translation>
+    </message>
+    <message>
+        <source>Right Table:</source>
+        <translation>Table de droite :</translation>
+    </message>
+    <message>
+        <source>Right Column:</source>
+        <translation>Colonne de droite :</translation>
+    </message>
+    <message>
+        <source>Join Type</source>
+        <translation>Type de jointure</translation>
+    </message>
+    <message>
+        <source>Normal</source>
+        <translation>Normale</translation>
+    </message>
+    <message>
+        <source>Left Outer</source>
+        <translation>Externe gauche</translation>
+    </message>
+    <message>
+        <source>Right Outer</source>
+        <translation>Externe droite</translation>
+    </message>
+    <message>
+        <source>Both Outer</source>
+        <translation>Externe des deux côtés</translation>
+    </message>
+    <message>
+        <source>&amp;Ok</source>
+        <translation>&amp;OK</translation>
+    </message>
+    <message>
+        <source>&amp;Cancel</source>
+        <translation>&amp;Annuler</translation>
+    </message>
+    <message>
+        <source>Show Join Definition</source>
+        <translation>Définir la jointure</translation>
+    </message>
+    <message>
+        <source>Delete Join</source>
+        <translation>Supprimer la jointure</translation>
+    </message>
+    <message>
+        <source>Copy Column</source>
+        <translation>Copier la colonne</translation>
+    </message>
+    <message>
+        <source>Create Join</source>
+        <translation>Créer une jointure</translation>
+    </message>
+    <message>
+        <source>Delete Table</source>
+        <translation>Supprimer la table</translation>
+    </message>
+    <message>
+        <source>Paste Column</source>
+        <translation>Coller la colonne</translation>
+    </message>
+    <message>
+        <source>Delete Coumn</source>
+        <translation>Supprimer la colonne</translation>
+    </message>
+    <message>
+        <source>Field:</source>
+        <translation>Champ :</translation>
+    </message>
+    <message>
+        <source>Synonym:</source>
+        <translation>Synonyme :</translation>
+    </message>
+    <message>
+        <source>Sort:</source>
+        <translation>Tri :</translation>
+    </message>
+    <message>
+        <source>Visible:</source>
+        <translation>Visible :</translation>
+    </message>
+    <message>
+        <source>Criteria:</source>
+        <translation>Critères :</translation>
+    </message>
+    <message>
+        <source>Or:</source>
+        <translation>Ou :</translation>
+    </message>
+</context>
+<context>
+    <name>Model</name>
+    <message>
+        <source>The query has no tables: add one first.</source>
+        <translation>La requête n’a aucune table : ajoutez-en d’abord une.</translation>
+    </message>
+    <message>
+        <source>An output column has no column of the query: delete it.</source>
+        <translation>Une colonne de sortie ne correspond à aucune colonne de la requête : supprimez-la.</translation>
+    </message>
+    <message>
+        <source>%1.* cannot be sorted: sort one of its columns.</source>
+        <translation>%1.* ne peut pas être trié : triez selon l’une de ses colonnes.</translation>
+    </message>
+    <message>
+        <source>%1.* cannot have a criterion: give one to one of its columns.</source>
+        <translation>%1.* ne peut pas avoir de critère : donnez-le à l’une de ses colonnes.</translation>
+    </message>
+    <message>
+        <source>Two output columns are named %1: give one of them a synonym.</source>
+        <translation>Deux colonnes de sortie se nomment %1 : donnez un synonyme à l’une d’elles.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 hold different kinds of values: the join will find nothing or fail.</source>
+        <translation>%1 et %2 contiennent des valeurs de types différents : la jointure ne trouvera rien ou échouera.</translation>
+    </message>
+    <message>
+        <source>The outer join between %1 and %2 has no effect: normal joins connect them too.</source>
+        <translation>La jointure externe entre %1 et %2 est sans effet : des jointures normales les relient aussi.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 and %2 contradict each other: the one drawn first decides which rows are kept.</source>
+        <translation>Les jointures externes autour de %1 et %2 se contredisent : la première dessinée décide des lignes conservées.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 can be read in several ways: change the type of one of them.</source>
+        <translation>Les jointures externes autour de %1 peuvent se lire de plusieurs façons : changez le type de l’une d’elles.</translation>
+    </message>
+    <message>
+        <source>No join connects %1 with %2: every row of one comes with every row of the other.</source>
+        <translation>Aucune jointure ne relie %1 à %2 : chaque ligne de l’une vient avec chaque ligne de l’autre.</translation>
+    </message>
+    <message>
+        <source>MySQL/MariaDB has no full outer join: make it a left or a right one.</source>
+        <translation>MySQL/MariaDB n’a pas de jointure externe des deux côtés : faites-en une jointure gauche ou droite.</translation>
+    </message>
+    <message>
+        <source>PostgreSQL joins both outer only on equal columns: use the operator =, or make it a left or a right outer join.</source>
+        <translation>PostgreSQL ne fait de jointure externe des deux côtés que sur des colonnes égales : utilisez l’opérateur =, ou faites-en une jointure externe gauche ou droite.</translation>
+    </message>
+    <message>
+        <source>SQLite takes about 900 conditions in a row: use In for a long list.</source>
+        <translation>SQLite accepte environ 900 conditions à la suite : utilisez In pour une longue liste.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry an empty name.</source>
+        <translation>%1 n’accepte pas un nom vide.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry a name with the character zero in it.</source>
+        <translation>%1 n’accepte pas un nom qui contient le caractère zéro.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry a name with half a character in it.</source>
+        <translation>%1 n’accepte pas un nom qui contient un demi-caractère.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 bytes.</source>
+        <translation>%1 n’accepte pas le nom « %2 », il compte plus de %3 octets.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 characters.</source>
+        <translation>%1 n’accepte pas le nom « %2 », il compte plus de %3 caractères.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it has a character beyond U+FFFF.</source>
+        <translation>%1 n’accepte pas le nom « %2 », il contient un caractère au-delà de U+FFFF.</translation>
+    </message>
+    <message>
+        <source>%1 cannot carry the name &quot;%2&quot;, it ends with a blank.</source>
+        <translation>%1 n’accepte pas le nom « %2 », il se termine par une espace.</translation>
+    </message>
+    <message>
+        <source>%1: At character %2: %3.</source>
+        <translation>%1 : au caractère %2 : %3.</translation>
+    </message>
+    <message>
+        <source>expected And, Or or the end</source>
+        <translation>And, Or ou la fin attendus</translation>
+    </message>
+    <message>
+        <source>expected less nesting, 100 levels are the most</source>
+        <translation>moins d’imbrications attendues, 100 niveaux au plus</translation>
+    </message>
+    <message>
+        <source>expected a closing %1</source>
+        <translation>%1 fermant attendu</translation>
+    </message>
+    <message>
+        <source>expected ( after In</source>
+        <translation>( attendue après In</translation>
+    </message>
+    <message>
+        <source>expected Null, a text that begins so needs quotes</source>
+        <translation>Null attendu, un texte qui commence ainsi doit être entre guillemets</translation>
+    </message>
+    <message>
+        <source>expected a comparison, Like works on columns that hold text</source>
+        <translation>une comparaison attendue, Like s’applique aux colonnes de texte</translation>
+    </message>
+    <message>
+        <source>expected a pattern, as in Like &apos;A*&apos;, not a column</source>
+        <translation>un motif attendu, comme dans Like &apos;A*&apos;, et non une colonne</translation>
+    </message>
+    <message>
+        <source>expected a pattern, as in Like &apos;A*&apos;</source>
+        <translation>un motif attendu, comme dans Like &apos;A*&apos;</translation>
+    </message>
+    <message>
+        <source>expected And and the upper value</source>
+        <translation>And et la valeur supérieure attendus</translation>
+    </message>
+    <message>
+        <source>expected a comma or a closing )</source>
+        <translation>une virgule ou ) attendue</translation>
+    </message>
+    <message>
+        <source>expected a value, write Is Null for a missing one or &apos;Null&apos; for the word</source>
+        <translation>une valeur attendue, écrivez Is Null si elle manque ou &apos;Null&apos; pour le mot</translation>
+    </message>
+    <message>
+        <source>expected the parameter&apos;s name</source>
+        <translation>le nom du paramètre attendu</translation>
+    </message>
+    <message>
+        <source>expected the column&apos;s name</source>
+        <translation>le nom de la colonne attendu</translation>
+    </message>
+    <message>
+        <source>expected a column of the query, there is no %1</source>
+        <translation>une colonne de la requête attendue, %1 n’existe pas</translation>
+    </message>
+    <message>
+        <source>expected a column of the query, the table that had this one was deleted</source>
+        <translation>une colonne de la requête attendue, la table qui contenait celle-ci a été supprimée</translation>
+    </message>
+    <message>
+        <source>expected the table too, as in %1, several tables have this column</source>
+        <translation>la table attendue aussi, comme dans %1, plusieurs tables ont cette colonne</translation>
+    </message>
+    <message>
+        <source>expected a column that holds %1</source>
+        <translation>une colonne de ce contenu attendue : %1</translation>
+    </message>
+    <message>
+        <source>expected the end, a criterion has at most 10000 characters</source>
+        <translation>la fin attendue, un critère compte au plus 10000 caractères</translation>
+    </message>
+    <message>
+        <source>expected a character, found the character zero</source>
+        <translation>un caractère attendu, le caractère zéro trouvé</translation>
+    </message>
+    <message>
+        <source>expected a character, found half of one</source>
+        <translation>un caractère attendu, un demi-caractère trouvé</translation>
+    </message>
+    <message>
+        <source>expected a [ before this ]</source>
+        <translation>un [ attendu avant ce ]</translation>
+    </message>
+    <message>
+        <source>expected an operator, write &lt;&gt; for unequal</source>
+        <translation>un opérateur attendu, écrivez &lt;&gt; pour différent</translation>
+    </message>
+    <message>
+        <source>expected a name between the brackets</source>
+        <translation>un nom attendu entre les crochets</translation>
+    </message>
+    <message>
+        <source>expected a text</source>
+        <translation>un texte attendu</translation>
+    </message>
+    <message>
+        <source>expected a number</source>
+        <translation>un nombre attendu</translation>
+    </message>
+    <message>
+        <source>expected a date (2024-12-31)</source>
+        <translation>date attendue (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>expected a time (23:59)</source>
+        <translation>heure attendue (23:59)</translation>
+    </message>
+    <message>
+        <source>expected a date and time (2024-12-31 23:59)</source>
+        <translation>date et heure attendues (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>expected true or false</source>
+        <translation>true ou false attendu</translation>
+    </message>
+    <message>
+        <source>expected Is Null, a column or a parameter</source>
+        <translation>Is Null, une colonne ou un paramètre attendu</translation>
+    </message>
+    <message>
+        <source>expected a value</source>
+        <translation>une valeur attendue</translation>
+    </message>
+    <message>
+        <source>a text</source>
+        <translation>un texte</translation>
+    </message>
+    <message>
+        <source>a number</source>
+        <translation>un nombre</translation>
+    </message>
+    <message>
+        <source>a date (2024-12-31)</source>
+        <translation>une date (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>a time (23:59)</source>
+        <translation>une heure (23:59)</translation>
+    </message>
+    <message>
+        <source>a date and time (2024-12-31 23:59)</source>
+        <translation>une date et une heure (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>true or false</source>
+        <translation>true ou false</translation>
+    </message>
+    <message>
+        <source>Is Null, a column or a parameter</source>
+        <translation>Is Null, une colonne ou un paramètre</translation>
+    </message>
+</context>
+<context>
+    <name>QObject</name>
+    <message>
+        <source>Remove the table</source>
+        <translation>Retirer la table</translation>
+    </message>
+</context>
+<context>
+    <name>ZandorWidget</name>
+    <message>
+        <source>Join %1 %2 %3</source>
+        <translation>Jointure %1 %2 %3</translation>
+    </message>
+    <message>
+        <source>Query designer</source>
+        <translation>Éditeur de requêtes</translation>
+    </message>
+</context>
+<context>
+    <name>designer</name>
+    <message>
+        <source>There is nothing to draw; add a table first.</source>
+        <translation>Il n’y a rien à dessiner ; ajoutez d’abord une table.</translation>
+    </message>
+    <message>
+        <source>A picture ends in .png, .svg or .pdf; &quot;%1&quot; does not.</source>
+        <translation>Une image se termine par .png, .svg ou .pdf ; ce n’est pas le cas de « %1 ».</translation>
+    </message>
+    <message>
+        <source>The picture &quot;%1&quot; cannot be written; check the folder and your permissions.</source>
+        <translation>L’image « %1 » ne peut pas être écrite ; vérifiez le dossier et vos droits.</translation>
+    </message>
+    <message>
+        <source>The printer cannot be reached; choose another one.</source>
+        <translation>L’imprimante est inaccessible ; choisissez-en une autre.</translation>
+    </message>
+    <message>
+        <source>The page could not be printed; see the printer&apos;s own messages.</source>
+        <translation>La page n’a pas pu être imprimée ; consultez les messages de l’imprimante.</translation>
+    </message>
+    <message>
+        <source>%1 tables are too many; the canvas takes %2.</source>
+        <translation>%1 tables, c’est trop ; la zone de dessin en accepte %2.</translation>
+    </message>
+    <message>
+        <source>There is no table &quot;%1&quot; in %2.</source>
+        <translation>Il n’y a pas de table « %1 » dans %2.</translation>
+    </message>
+    <message>
+        <source>These tables have %1 joins, and the canvas takes %2; choose fewer tables with --tables.</source>
+        <translation>Ces tables ont %1 jointures, la zone de dessin en accepte %2 ; choisissez moins de tables avec --tables.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 tables; choose others in the panel &quot;Tables&quot;</source>
+        <translation>%1 tables sur %2 ; choisissez-en d’autres dans le panneau « Tables »</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Autosave</name>
+    <message>
+        <source>the folder %1 cannot be written</source>
+        <translation>impossible d’écrire dans le dossier %1</translation>
+    </message>
+    <message>
+        <source>The query could not be saved for a recovery (%1); save it yourself.</source>
+        <translation>La requête n’a pas pu être sauvegardée pour une récupération (%1) ; enregistrez-la vous-même.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::CellReader</name>
+    <message>
+        <source>(outside the calendar)</source>
+        <translation>(hors calendrier)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ConnectionBanner</name>
+    <message>
+        <source>&amp;Reconnect</source>
+        <translation>&amp;Reconnecter</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Fermer</translation>
+    </message>
+    <message>
+        <source>The connection to %1 is lost. Your query is kept.</source>
+        <translation>La connexion à %1 est perdue. Votre requête est conservée.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ConnectionDialog</name>
+    <message>
+        <source>Open database</source>
+        <translation>Ouvrir une base de données</translation>
+    </message>
+    <message>
+        <source>usual</source>
+        <translation>habituel</translation>
+    </message>
+    <message>
+        <source>Port</source>
+        <translation>Port</translation>
+    </message>
+    <message>
+        <source>SQLite file</source>
+        <translation>Fichier SQLite</translation>
+    </message>
+    <message>
+        <source>PostgreSQL</source>
+        <translation>PostgreSQL</translation>
+    </message>
+    <message>
+        <source>MySQL or MariaDB</source>
+        <translation>MySQL ou MariaDB</translation>
+    </message>
+    <message>
+        <source>ODBC</source>
+        <translation>ODBC</translation>
+    </message>
+    <message>
+        <source>%1 (install the package %2)</source>
+        <translation>%1 (installez le paquet %2)</translation>
+    </message>
+    <message>
+        <source>&amp;Browse…</source>
+        <translation>Pa&amp;rcourir…</translation>
+    </message>
+    <message>
+        <source>P&amp;ort:</source>
+        <translation>P&amp;ort :</translation>
+    </message>
+    <message>
+        <source>&amp;Kind:</source>
+        <translation>T&amp;ype :</translation>
+    </message>
+    <message>
+        <source>&amp;File:</source>
+        <translation>&amp;Fichier :</translation>
+    </message>
+    <message>
+        <source>&amp;Host:</source>
+        <translation>&amp;Serveur :</translation>
+    </message>
+    <message>
+        <source>Data &amp;source:</source>
+        <translation>Sour&amp;ce de données :</translation>
+    </message>
+    <message>
+        <source>&amp;Database:</source>
+        <translation>&amp;Base de données :</translation>
+    </message>
+    <message>
+        <source>&amp;User:</source>
+        <translation>&amp;Utilisateur :</translation>
+    </message>
+    <message>
+        <source>&amp;Password:</source>
+        <translation>&amp;Mot de passe :</translation>
+    </message>
+    <message>
+        <source>&amp;Address:</source>
+        <translation>&amp;Adresse :</translation>
+    </message>
+    <message>
+        <source>SQLite databases (*.sqlite *.sqlite3 *.db *.db3);;All files (*)</source>
+        <translation>Bases de données SQLite (*.sqlite *.sqlite3 *.db *.db3);;Tous les fichiers (*)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::DatabaseCommands</name>
+    <message>
+        <source>Open SQLite &amp;file…</source>
+        <translation>Ouvrir un &amp;fichier SQLite…</translation>
+    </message>
+    <message>
+        <source>&amp;Connect to a server…</source>
+        <translation>Se &amp;connecter à un serveur…</translation>
+    </message>
+    <message>
+        <source>&amp;Reconnect</source>
+        <translation>&amp;Reconnecter</translation>
+    </message>
+    <message>
+        <source>Open database</source>
+        <translation>Ouvrir une base de données</translation>
+    </message>
+    <message>
+        <source>The database was not opened.</source>
+        <translation>La base de données n’a pas été ouverte.</translation>
+    </message>
+    <message>
+        <source>Open SQLite file</source>
+        <translation>Ouvrir un fichier SQLite</translation>
+    </message>
+    <message>
+        <source>SQLite databases (*.sqlite *.sqlite3 *.db *.db3);;All files (*)</source>
+        <translation>Bases de données SQLite (*.sqlite *.sqlite3 *.db *.db3);;Tous les fichiers (*)</translation>
+    </message>
+    <message>
+        <source>Reconnect</source>
+        <translation>Reconnecter</translation>
+    </message>
+    <message>
+        <source>The query is open, but not its database. %1</source>
+        <translation>La requête est ouverte, mais pas sa base de données. %1</translation>
+    </message>
+</context>
+<context>
+    <name>designer::DesignerWindow</name>
+    <message>
+        <source>Tables</source>
+        <translation>Tables</translation>
+    </message>
+    <message>
+        <source>SQL</source>
+        <translation>SQL</translation>
+    </message>
+    <message>
+        <source>Rows</source>
+        <translation>Lignes</translation>
+    </message>
+    <message>
+        <source>Events</source>
+        <translation>Événements</translation>
+    </message>
+    <message>
+        <source>&amp;File</source>
+        <translation>&amp;Fichier</translation>
+    </message>
+    <message>
+        <source>&amp;Quit</source>
+        <translation>&amp;Quitter</translation>
+    </message>
+    <message>
+        <source>&amp;Edit</source>
+        <translation>&amp;Édition</translation>
+    </message>
+    <message>
+        <source>Copy &amp;SQL</source>
+        <translation>Copier le &amp;SQL</translation>
+    </message>
+    <message>
+        <source>&amp;Options…</source>
+        <translation>&amp;Options…</translation>
+    </message>
+    <message>
+        <source>&amp;Database</source>
+        <translation>&amp;Base de données</translation>
+    </message>
+    <message>
+        <source>&amp;Query</source>
+        <translation>&amp;Requête</translation>
+    </message>
+    <message>
+        <source>&amp;Arrange tables</source>
+        <translation>&amp;Disposer les tables</translation>
+    </message>
+    <message>
+        <source>Re&amp;name table…</source>
+        <translation>Re&amp;nommer la table…</translation>
+    </message>
+    <message>
+        <source>&amp;View</source>
+        <translation>&amp;Affichage</translation>
+    </message>
+    <message>
+        <source>&amp;Help</source>
+        <translation>&amp;Aide</translation>
+    </message>
+    <message>
+        <source>&amp;About</source>
+        <translation>À &amp;propos</translation>
+    </message>
+    <message>
+        <source>Add tables</source>
+        <translation>Ajouter des tables</translation>
+    </message>
+    <message>
+        <source>Output columns</source>
+        <translation>Colonnes de sortie</translation>
+    </message>
+    <message>
+        <source>The grid shows %1 output columns and is full. Delete one before you add another; it would take the place of the last.</source>
+        <translation>La grille affiche %1 colonnes de sortie et est pleine. Supprimez-en une avant d’en ajouter une autre ; elle prendrait la place de la dernière.</translation>
+    </message>
+    <message>
+        <source>About Zandor Designer</source>
+        <translation>À propos de Zandor Designer</translation>
+    </message>
+    <message>
+        <source>Zandor Designer %1
+
+Draw a query, read its SQL, run it. The database is only read.</source>
+        <translation>Zandor Designer %1
+
+Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seulement lue.</translation>
+    </message>
+    <message>
+        <source>&amp;New query</source>
+        <translation>&amp;Nouvelle requête</translation>
+    </message>
+    <message>
+        <source>&amp;Open query…</source>
+        <translation>&amp;Ouvrir une requête…</translation>
+    </message>
+    <message>
+        <source>&amp;Save</source>
+        <translation>&amp;Enregistrer</translation>
+    </message>
+    <message>
+        <source>Save &amp;as…</source>
+        <translation>Enregistrer &amp;sous…</translation>
+    </message>
+    <message>
+        <source>Tables: %1   Joins: %2</source>
+        <translation>Tables : %1   Jointures : %2</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Document</name>
+    <message>
+        <source>&amp;Undo</source>
+        <translation>&amp;Annuler</translation>
+    </message>
+    <message>
+        <source>&amp;Redo</source>
+        <translation>&amp;Rétablir</translation>
+    </message>
+</context>
+<context>
+    <name>designer::EventPanel</name>
+    <message>
+        <source>Time</source>
+        <translation>Heure</translation>
+    </message>
+    <message>
+        <source>No.</source>
+        <translation>N°</translation>
+    </message>
+    <message>
+        <source>Event</source>
+        <translation>Événement</translation>
+    </message>
+    <message>
+        <source>Arguments</source>
+        <translation>Arguments</translation>
+    </message>
+    <message>
+        <source>Events of the control</source>
+        <translation>Événements du contrôle</translation>
+    </message>
+    <message>
+        <source>Clear</source>
+        <translation>Vider</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copier</translation>
+    </message>
+    <message>
+        <source>Copy the selected events, or all of them</source>
+        <translation>Copier les événements sélectionnés, ou tous</translation>
+    </message>
+    <message>
+        <source>DeletedTable: %1</source>
+        <translation>DeletedTable : %1</translation>
+    </message>
+    <message>
+        <source>%1 (number %2)</source>
+        <translation>%1 (numéro %2)</translation>
+    </message>
+    <message>
+        <source>wParam %1: the menu opens</source>
+        <translation>wParam %1 : le menu s’ouvre</translation>
+    </message>
+    <message>
+        <source>wParam %1: the menu is closed</source>
+        <translation>wParam %1 : le menu est fermé</translation>
+    </message>
+</context>
+<context>
+    <name>designer::EventWords</name>
+    <message>
+        <source>(gone)</source>
+        <translation>(supprimé)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FileDialogs</name>
+    <message>
+        <source>Zandor queries (*.json)</source>
+        <translation>Requêtes Zandor (*.json)</translation>
+    </message>
+    <message>
+        <source>All files (*)</source>
+        <translation>Tous les fichiers (*)</translation>
+    </message>
+    <message>
+        <source>Open Query</source>
+        <translation>Ouvrir une requête</translation>
+    </message>
+    <message>
+        <source>Save Query</source>
+        <translation>Enregistrer la requête</translation>
+    </message>
+    <message>
+        <source>query.json</source>
+        <translation>requete.json</translation>
+    </message>
+    <message>
+        <source>Save the changes to &quot;%1&quot;?</source>
+        <translation>Enregistrer les modifications de « %1 » ?</translation>
+    </message>
+    <message>
+        <source>Changes that are not saved are lost.</source>
+        <translation>Les modifications non enregistrées seront perdues.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FileExport</name>
+    <message>
+        <source>The file &quot;%1&quot; cannot be written (%2): check the folder and your permissions.</source>
+        <translation>Le fichier « %1 » ne peut pas être écrit (%2) : vérifiez le dossier et vos droits.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::FlagsPage</name>
+    <message>
+        <source>Join types offered</source>
+        <translation>Types de jointure proposés</translation>
+    </message>
+    <message>
+        <source>Operators offered</source>
+        <translation>Opérateurs proposés</translation>
+    </message>
+    <message>
+        <source>The join dialog counts what it offers: with one left out, each behind it counts as the one before. Leave out only from the end.</source>
+        <translation>La fenêtre de jointure compte ce qu’elle propose : s’il manque une entrée, chacune des suivantes vaut la précédente. N’en retirez qu’à la fin.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Opening</name>
+    <message>
+        <source>Connecting to %1…</source>
+        <translation>Connexion à %1…</translation>
+    </message>
+</context>
+<context>
+    <name>designer::OptionsDialog</name>
+    <message>
+        <source>The entries of the context menu that are shown:</source>
+        <translation>Entrées affichées dans le menu contextuel :</translation>
+    </message>
+    <message>
+        <source>What can be done with joins:</source>
+        <translation>Ce qui est possible avec les jointures :</translation>
+    </message>
+    <message>
+        <source>For developers: each box must be answered before the control goes on, and there may be hundreds when a large query is shown.</source>
+        <translation>Pour les développeurs : il faut répondre à chaque message avant que le contrôle continue, et une grande requête peut en produire des centaines.</translation>
+    </message>
+    <message>
+        <source>Options</source>
+        <translation>Options</translation>
+    </message>
+    <message>
+        <source>Texts</source>
+        <translation>Textes</translation>
+    </message>
+    <message>
+        <source>Menu</source>
+        <translation>Menu</translation>
+    </message>
+    <message>
+        <source>Joins</source>
+        <translation>Jointures</translation>
+    </message>
+    <message>
+        <source>Debug</source>
+        <translation>Débogage</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ParameterDialog</name>
+    <message>
+        <source>Values for the query</source>
+        <translation>Valeurs pour la requête</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1 :</translation>
+    </message>
+    <message>
+        <source>&amp;Run</source>
+        <translation>&amp;Exécuter</translation>
+    </message>
+    <message>
+        <source>%1 has to be %2.</source>
+        <translation>%1 doit être %2.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::PasswordPrompt</name>
+    <message>
+        <source>Password</source>
+        <translation>Mot de passe</translation>
+    </message>
+    <message>
+        <source>The database %1 on %2 asks for a password.</source>
+        <translation>La base de données %1 sur %2 demande un mot de passe.</translation>
+    </message>
+    <message>
+        <source>The database %1 on %2 asks for the password of %3.</source>
+        <translation>La base de données %1 sur %2 demande le mot de passe de %3.</translation>
+    </message>
+    <message>
+        <source>&amp;Password:</source>
+        <translation>&amp;Mot de passe :</translation>
+    </message>
+</context>
+<context>
+    <name>designer::QueryFile</name>
+    <message>
+        <source>Untitled</source>
+        <translation>Sans titre</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Question</name>
+    <message>
+        <source>a pattern: * for any characters, ? for one</source>
+        <translation>un motif : * pour des caractères quelconques, ? pour un seul</translation>
+    </message>
+    <message>
+        <source>a text</source>
+        <translation>un texte</translation>
+    </message>
+    <message>
+        <source>a number</source>
+        <translation>un nombre</translation>
+    </message>
+    <message>
+        <source>a date such as 2024-12-31</source>
+        <translation>une date comme 2024-12-31</translation>
+    </message>
+    <message>
+        <source>a time such as 23:59</source>
+        <translation>une heure comme 23:59</translation>
+    </message>
+    <message>
+        <source>a date and time such as 2024-12-31 23:59</source>
+        <translation>une date et une heure comme 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>true or false</source>
+        <translation>true ou false</translation>
+    </message>
+    <message>
+        <source>a value</source>
+        <translation>une valeur</translation>
+    </message>
+</context>
+<context>
+    <name>designer::RecentMenu</name>
+    <message>
+        <source>Open &amp;Recent</source>
+        <translation>&amp;Récents</translation>
+    </message>
+    <message>
+        <source>&amp;Clear List</source>
+        <translation>&amp;Vider la liste</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Recovery</name>
+    <message>
+        <source>A query that was never saved</source>
+        <translation>Une requête jamais enregistrée</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot;</source>
+        <translation>« %1 »</translation>
+    </message>
+    <message>
+        <source>Recover Query</source>
+        <translation>Récupérer la requête</translation>
+    </message>
+    <message>
+        <source>%1 has changes that were not saved.</source>
+        <translation>%1 contient des modifications non enregistrées.</translation>
+    </message>
+    <message>
+        <source>The designer ended unexpectedly. The changes up to %1 can be recovered.</source>
+        <translation>Le programme s’est terminé de façon inattendue. Les modifications jusqu’au %1 peuvent être récupérées.</translation>
+    </message>
+    <message>
+        <source>&amp;Recover</source>
+        <translation>&amp;Récupérer</translation>
+    </message>
+    <message>
+        <source>&amp;Ask Later</source>
+        <translation>&amp;Demander plus tard</translation>
+    </message>
+</context>
+<context>
+    <name>designer::RenameDialog</name>
+    <message>
+        <source>Rename table</source>
+        <translation>Renommer la table</translation>
+    </message>
+    <message>
+        <source>&amp;Rename</source>
+        <translation>&amp;Renommer</translation>
+    </message>
+    <message>
+        <source>The name is the table&apos;s in this query only; the database stays as it is.</source>
+        <translation>Ce nom ne vaut que dans cette requête ; la base de données reste telle quelle.</translation>
+    </message>
+    <message>
+        <source>&amp;Table:</source>
+        <translation>&amp;Table :</translation>
+    </message>
+    <message>
+        <source>&amp;New name:</source>
+        <translation>&amp;Nouveau nom :</translation>
+    </message>
+    <message>
+        <source>A table needs a name; type one.</source>
+        <translation>Une table a besoin d’un nom ; saisissez-en un.</translation>
+    </message>
+    <message>
+        <source>Another table of this query is called &quot;%1&quot;; choose another name.</source>
+        <translation>Une autre table de cette requête s’appelle « %1 » ; choisissez un autre nom.</translation>
+    </message>
+    <message>
+        <source>Rename table %1</source>
+        <translation>Renommer la table %1</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultModel</name>
+    <message>
+        <source>(blob, %1 bytes)</source>
+        <translation>(blob, %1 octets)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultTable</name>
+    <message>
+        <source>&amp;Copy</source>
+        <translation>&amp;Copier</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ResultsPanel</name>
+    <message>
+        <source>These are too many cells to copy; export the rows instead.</source>
+        <translation>Ces cellules sont trop nombreuses pour être copiées ; exportez plutôt les lignes.</translation>
+    </message>
+    <message>
+        <source>No database is open: open one first.</source>
+        <translation>Aucune base de données n’est ouverte : ouvrez-en d’abord une.</translation>
+    </message>
+    <message>
+        <source>The query cannot be run yet:</source>
+        <translation>La requête ne peut pas encore être exécutée :</translation>
+    </message>
+    <message>
+        <source>Cancelling…</source>
+        <translation>Annulation…</translation>
+    </message>
+    <message>
+        <source>Exporting…</source>
+        <translation>Exportation…</translation>
+    </message>
+    <message>
+        <source>Running…</source>
+        <translation>Exécution…</translation>
+    </message>
+    <message>
+        <source>%1  Rows so far: %2 · %3</source>
+        <translation>%1  Lignes jusqu’ici : %2 · %3</translation>
+    </message>
+    <message>
+        <source>The server does not answer.</source>
+        <translation>Le serveur ne répond pas.</translation>
+    </message>
+    <message>
+        <source>Exported to %1. Rows: %2 · %3</source>
+        <translation>Exporté vers %1. Lignes : %2 · %3</translation>
+    </message>
+    <message>
+        <source>Rows: %1 · %2</source>
+        <translation>Lignes : %1 · %2</translation>
+    </message>
+    <message>
+        <source>First %1 rows; there are more · %2</source>
+        <translation>%1 premières lignes ; il y en a d’autres · %2</translation>
+    </message>
+    <message>
+        <source>Cancelled; nothing was exported · %1</source>
+        <translation>Annulé ; rien n’a été exporté · %1</translation>
+    </message>
+    <message>
+        <source>Cancelled. Rows that came: %1 · %2</source>
+        <translation>Annulé. Lignes reçues : %1 · %2</translation>
+    </message>
+    <message>
+        <source>The database did not run the statement:
+%1</source>
+        <translation>La base de données n’a pas exécuté l’instruction :
+%1</translation>
+    </message>
+    <message>
+        <source>The connection to the database has broken down:
+%1</source>
+        <translation>La connexion à la base de données est rompue :
+%1</translation>
+    </message>
+    <message>
+        <source>Export all rows</source>
+        <translation>Exporter toutes les lignes</translation>
+    </message>
+    <message>
+        <source>Comma-separated values (*.csv)</source>
+        <translation>Valeurs séparées par des virgules (*.csv)</translation>
+    </message>
+    <message>
+        <source>Run the query to see its rows here.</source>
+        <translation>Exécutez la requête pour voir ses lignes ici.</translation>
+    </message>
+    <message>
+        <source>%1 · the drawing has changed since</source>
+        <translation>%1 · le dessin a changé depuis</translation>
+    </message>
+    <message>
+        <source>%1 s</source>
+        <translation>%1 s</translation>
+    </message>
+    <message>
+        <source>&amp;Run</source>
+        <translation>&amp;Exécuter</translation>
+    </message>
+    <message>
+        <source>Run the query and show its rows (F5)</source>
+        <translation>Exécuter la requête et afficher ses lignes (F5)</translation>
+    </message>
+    <message>
+        <source>&amp;Cancel</source>
+        <translation>&amp;Annuler</translation>
+    </message>
+    <message>
+        <source>Stop what is running, on the database too</source>
+        <translation>Arrêter ce qui est en cours, sur la base de données aussi</translation>
+    </message>
+    <message>
+        <source>&amp;Export…</source>
+        <translation>E&amp;xporter…</translation>
+    </message>
+    <message>
+        <source>Run the query and write all its rows into a CSV file</source>
+        <translation>Exécuter la requête et écrire toutes ses lignes dans un fichier CSV</translation>
+    </message>
+    <message>
+        <source>So many rows are shown at most</source>
+        <translation>Nombre maximal de lignes affichées</translation>
+    </message>
+    <message>
+        <source>%1 rows</source>
+        <translation>%1 lignes</translation>
+    </message>
+    <message>
+        <source>All rows</source>
+        <translation>Toutes les lignes</translation>
+    </message>
+    <message>
+        <source>Run the query again without the limit</source>
+        <translation>Exécuter à nouveau la requête sans cette limite</translation>
+    </message>
+</context>
+<context>
+    <name>designer::ShowCommands</name>
+    <message>
+        <source>&amp;Export drawing…</source>
+        <translation>&amp;Exporter le dessin…</translation>
+    </message>
+    <message>
+        <source>&amp;Print…</source>
+        <translation>&amp;Imprimer…</translation>
+    </message>
+    <message>
+        <source>Copy as p&amp;icture</source>
+        <translation>Copier comme &amp;image</translation>
+    </message>
+    <message>
+        <source>Export drawing</source>
+        <translation>Exporter le dessin</translation>
+    </message>
+    <message>
+        <source>Picture (*.png)</source>
+        <translation>Image (*.png)</translation>
+    </message>
+    <message>
+        <source>Scalable drawing (*.svg)</source>
+        <translation>Dessin vectoriel (*.svg)</translation>
+    </message>
+    <message>
+        <source>Document (*.pdf)</source>
+        <translation>Document (*.pdf)</translation>
+    </message>
+    <message>
+        <source>Query</source>
+        <translation>Requête</translation>
+    </message>
+    <message>
+        <source>Print</source>
+        <translation>Imprimer</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Spool</name>
+    <message>
+        <source>No file for the rows can be made in &quot;%1&quot; (%2): set TMPDIR to a folder that you may write to.</source>
+        <translation>Impossible de créer un fichier pour les lignes dans « %1 » (%2) : donnez à TMPDIR un dossier où vous pouvez écrire.</translation>
+    </message>
+    <message>
+        <source>The rows would fill the disk with the folder &quot;%1&quot;: make room there, or ask for fewer rows.</source>
+        <translation>Les lignes rempliraient le disque du dossier « %1 » : faites-y de la place, ou demandez moins de lignes.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::StatementPanel</name>
+    <message>
+        <source>The dialect of SQL that the statement is written in</source>
+        <translation>Le dialecte SQL dans lequel l’instruction est écrite</translation>
+    </message>
+    <message>
+        <source>Dialect</source>
+        <translation>Dialecte</translation>
+    </message>
+    <message>
+        <source>Copy</source>
+        <translation>Copier</translation>
+    </message>
+    <message>
+        <source>Copy the statement to the clipboard</source>
+        <translation>Copier l’instruction dans le presse-papiers</translation>
+    </message>
+    <message>
+        <source>SQL statement</source>
+        <translation>Instruction SQL</translation>
+    </message>
+    <message>
+        <source>Findings</source>
+        <translation>Remarques</translation>
+    </message>
+    <message>
+        <source>Click a finding to see its place</source>
+        <translation>Cliquez sur une remarque pour voir l’endroit concerné</translation>
+    </message>
+    <message>
+        <source>Add a table to begin: the statement appears here.</source>
+        <translation>Ajoutez une table pour commencer : l’instruction apparaît ici.</translation>
+    </message>
+    <message>
+        <source>%1 cannot say this query:</source>
+        <translation>%1 ne peut pas exprimer cette requête :</translation>
+    </message>
+    <message>
+        <source>Error: %1</source>
+        <translation>Erreur : %1</translation>
+    </message>
+    <message>
+        <source>Warning: %1</source>
+        <translation>Avertissement : %1</translation>
+    </message>
+    <message>
+        <source>%1 (as the database)</source>
+        <translation>%1 (comme la base de données)</translation>
+    </message>
+</context>
+<context>
+    <name>designer::StepName</name>
+    <message>
+        <source>Change the query</source>
+        <translation>Modifier la requête</translation>
+    </message>
+    <message>
+        <source>Delete table %1</source>
+        <translation>Supprimer la table %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n table(s)</source>
+        <translation>
+            <numerusform>Supprimer %n table</numerusform>
+            <numerusform>Supprimer %n tables</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Add table %1</source>
+        <translation>Ajouter la table %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n table(s)</source>
+        <translation>
+            <numerusform>Ajouter %n table</numerusform>
+            <numerusform>Ajouter %n tables</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Rename table %1 to %2</source>
+        <translation>Renommer la table %1 en %2</translation>
+    </message>
+    <message numerus="yes">
+        <source>Resize %n table(s)</source>
+        <translation>
+            <numerusform>Redimensionner %n table</numerusform>
+            <numerusform>Redimensionner %n tables</numerusform>
+        </translation>
+    </message>
+    <message numerus="yes">
+        <source>Move %n table(s)</source>
+        <translation>
+            <numerusform>Déplacer %n table</numerusform>
+            <numerusform>Déplacer %n tables</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Resize table %1</source>
+        <translation>Redimensionner la table %1</translation>
+    </message>
+    <message>
+        <source>Move table %1</source>
+        <translation>Déplacer la table %1</translation>
+    </message>
+    <message>
+        <source>Add join %1</source>
+        <translation>Ajouter la jointure %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n join(s)</source>
+        <translation>
+            <numerusform>Ajouter %n jointure</numerusform>
+            <numerusform>Ajouter %n jointures</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Delete join %1</source>
+        <translation>Supprimer la jointure %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n join(s)</source>
+        <translation>
+            <numerusform>Supprimer %n jointure</numerusform>
+            <numerusform>Supprimer %n jointures</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Change join %1</source>
+        <translation>Modifier la jointure %1</translation>
+    </message>
+    <message>
+        <source>Change joins</source>
+        <translation>Modifier les jointures</translation>
+    </message>
+    <message numerus="yes">
+        <source>Change %n column(s)</source>
+        <translation>
+            <numerusform>Modifier %n colonne</numerusform>
+            <numerusform>Modifier %n colonnes</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Add column %1</source>
+        <translation>Ajouter la colonne %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Add %n column(s)</source>
+        <translation>
+            <numerusform>Ajouter %n colonne</numerusform>
+            <numerusform>Ajouter %n colonnes</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Delete column %1</source>
+        <translation>Supprimer la colonne %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Delete %n column(s)</source>
+        <translation>
+            <numerusform>Supprimer %n colonne</numerusform>
+            <numerusform>Supprimer %n colonnes</numerusform>
+        </translation>
+    </message>
+    <message>
+        <source>Change columns</source>
+        <translation>Modifier les colonnes</translation>
+    </message>
+    <message>
+        <source>Change criterion of %1</source>
+        <translation>Modifier le critère de %1</translation>
+    </message>
+    <message>
+        <source>Rename column %1</source>
+        <translation>Renommer la colonne %1</translation>
+    </message>
+    <message>
+        <source>Change sorting by %1</source>
+        <translation>Modifier le tri selon %1</translation>
+    </message>
+    <message>
+        <source>Show column %1</source>
+        <translation>Afficher la colonne %1</translation>
+    </message>
+    <message>
+        <source>Hide column %1</source>
+        <translation>Masquer la colonne %1</translation>
+    </message>
+    <message>
+        <source>Change column %1</source>
+        <translation>Modifier la colonne %1</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableAdding</name>
+    <message>
+        <source>Arrange tables</source>
+        <translation>Disposer les tables</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 tables, and has them; delete one first.</source>
+        <translation>Le dessin accepte %1 tables et les a déjà ; supprimez-en d’abord une.</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 tables and has %2; choose fewer.</source>
+        <translation>Le dessin accepte %1 tables et en a %2 ; choisissez-en moins.</translation>
+    </message>
+    <message>
+        <source>Add table %1</source>
+        <translation>Ajouter la table %1</translation>
+    </message>
+    <message>
+        <source>Add %1 tables</source>
+        <translation>Ajouter %1 tables</translation>
+    </message>
+    <message>
+        <source>Reading the tables…</source>
+        <translation>Lecture des tables…</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 joins, and with this there would be %2; delete tables or joins first.</source>
+        <translation>Le dessin accepte %1 jointures, et il y en aurait %2 ; supprimez d’abord des tables ou des jointures.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableListModel</name>
+    <message>
+        <source>%1, view</source>
+        <translation>%1, vue</translation>
+    </message>
+    <message>
+        <source>%1, table</source>
+        <translation>%1, table</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TableTip</name>
+    <message>
+        <source>%1 (view)</source>
+        <translation>%1 (vue)</translation>
+    </message>
+    <message>
+        <source>and %1 more</source>
+        <translation>et %1 de plus</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TablesPanel</name>
+    <message>
+        <source>Filter tables</source>
+        <translation>Filtrer les tables</translation>
+    </message>
+    <message>
+        <source>Read the list of tables again</source>
+        <translation>Relire la liste des tables</translation>
+    </message>
+    <message>
+        <source>Tables</source>
+        <translation>Tables</translation>
+    </message>
+    <message>
+        <source>Open a database to see its tables.</source>
+        <translation>Ouvrez une base de données pour voir ses tables.</translation>
+    </message>
+    <message>
+        <source>There are no tables in this database.</source>
+        <translation>Il n’y a pas de tables dans cette base de données.</translation>
+    </message>
+    <message>
+        <source>No table has all of this in its name.</source>
+        <translation>Aucune table n’a tout cela dans son nom.</translation>
+    </message>
+    <message>
+        <source>%1 of %2 tables</source>
+        <translation>%1 tables sur %2</translation>
+    </message>
+    <message>
+        <source>1 table</source>
+        <translation>1 table</translation>
+    </message>
+    <message>
+        <source>%1 tables</source>
+        <translation>%1 tables</translation>
+    </message>
+    <message>
+        <source>&amp;Add to drawing</source>
+        <translation>&amp;Ajouter au dessin</translation>
+    </message>
+</context>
+<context>
+    <name>designer::TextsPage</name>
+    <message>
+        <source>Where it is used</source>
+        <translation>Où il est utilisé</translation>
+    </message>
+    <message>
+        <source>Text</source>
+        <translation>Texte</translation>
+    </message>
+    <message>
+        <source>Texts of the control</source>
+        <translation>Textes du contrôle</translation>
+    </message>
+    <message>
+        <source>Set of texts</source>
+        <translation>Jeu de textes</translation>
+    </message>
+    <message>
+        <source>Texts that are left as they are follow the designer&apos;s language. Emptying one brings its text of that language back.</source>
+        <translation>Les textes laissés tels quels suivent la langue du programme. En vider un rétablit le texte de cette langue.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Waiting</name>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+</context>
+<context>
+    <name>designer::shell</name>
+    <message>
+        <source>Password for %1: </source>
+        <translation>Mot de passe pour %1 : </translation>
+    </message>
+    <message>
+        <source>The query asks for &quot;%1&quot;; give it with --set &quot;%1=VALUE&quot;.</source>
+        <translation>La requête demande « %1 » ; donnez-le avec --set &quot;%1=VALEUR&quot;.</translation>
+    </message>
+    <message>
+        <source>The query asks for &quot;%1&quot;, which has to be %2; &quot;%3&quot; is not.</source>
+        <translation>La requête demande « %1 », qui doit être %2 ; « %3 » ne l’est pas.</translation>
+    </message>
+    <message>
+        <source>The query does not ask for &quot;%1&quot;; leave out its --set.</source>
+        <translation>La requête ne demande pas « %1 » ; retirez son --set.</translation>
+    </message>
+    <message>
+        <source>Cancelled.</source>
+        <translation>Annulé.</translation>
+    </message>
+    <message>
+        <source>The query names no database; give one with --database.</source>
+        <translation>La requête ne nomme aucune base de données ; indiquez-en une avec --database.</translation>
+    </message>
+    <message>
+        <source>There is no format &quot;%1&quot;; write --format csv or --format json.</source>
+        <translation>Il n’y a pas de format « %1 » ; écrivez --format csv ou --format json.</translation>
+    </message>
+    <message>
+        <source>--limit takes a number of rows; write --limit 100.</source>
+        <translation>--limit attend un nombre de lignes ; écrivez --limit 100.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; sets nothing; write --set NAME=VALUE.</source>
+        <translation>« %1 » ne fixe rien ; écrivez --set NOM=VALEUR.</translation>
+    </message>
+    <message>
+        <source>--sql and --run go one at a time.</source>
+        <translation>--sql et --run ne vont qu’un à la fois.</translation>
+    </message>
+    <message>
+        <source>--%1 goes with --run only.</source>
+        <translation>--%1 ne va qu’avec --run.</translation>
+    </message>
+    <message>
+        <source>--dialect goes with --sql only.</source>
+        <translation>--dialect ne va qu’avec --sql.</translation>
+    </message>
+    <message>
+        <source>No query is named; write --%1 query.json.</source>
+        <translation>Aucune requête n’est nommée ; écrivez --%1 requete.json.</translation>
+    </message>
+    <message>
+        <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
+        <translation>Il n’y a pas de dialecte « %1 » ; sont connus sqlite, postgresql, mysql, sqlserver et standard.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::writeAll</name>
+    <message>
+        <source>The rows cannot be written (%1): see that the disk has room and that you may write there.</source>
+        <translation>Les lignes ne peuvent pas être écrites (%1) : vérifiez qu’il y a de la place et que vous pouvez y écrire.</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::Canvas</name>
+    <message>
+        <source>Tables and joins</source>
+        <translation>Tables et jointures</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::CanvasScrollBar</name>
+    <message>
+        <source>Scroll across</source>
+        <translation>Défilement horizontal</translation>
+    </message>
+    <message>
+        <source>Scroll down</source>
+        <translation>Défilement vertical</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::ColumnListModel</name>
+    <message>
+        <source>key column</source>
+        <translation>colonne clé</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::GridModel</name>
+    <message>
+        <source>column %1</source>
+        <translation>colonne %1</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::GridWidget</name>
+    <message>
+        <source>Output columns</source>
+        <translation>Colonnes de sortie</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::HomeButton</name>
+    <message>
+        <source>Back to the origin</source>
+        <translation>Retour à l’origine</translation>
+    </message>
+</context>
+</TS>

@@ -1,0 +1,14 @@
+#pragma once
+
+#include "model/Layout.h"
+
+namespace model::layout {
+
+/// Boxes in columns, which is how lines that leave a table at its sides run best: joined tables
+/// come into neighbouring columns and to like heights, and lines pass neither below tables nor
+/// across each other as far as a search among the neighbours of an arrangement finds it. The same
+/// tables and links always give the same boxes.
+std::vector<Box> arrangeInColumns(const std::vector<Size>& sizes, const std::vector<Link>& links,
+                                  std::int32_t canvasWidth);
+
+} // namespace model::layout

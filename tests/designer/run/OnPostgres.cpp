@@ -1,0 +1,177 @@
+#include "Queries.h"
+#include "designer/database/Answers.h"
+#include "reader/OneServer.h"
+
+#include "designer/document/Document.h"
+#include "designer/run/ResultTable.h"
+#include "designer/run/ResultsPanel.h"
+
+#include <gmock/gmock.h>
+
+#include <QAction>
+#include <QElapsedTimer>
+#include <QLabel>
+
+#include <thread>
+
+using designer::Command;
+using designer::Database;
+using designer::Outcome;
+using model::sql::Dialect;
+using testing::HasSubstr;
+
+namespace {
+
+/// How many statements on the table "numbers" the server works on.
+int working() {
+    const reader::Connection connection(oneServer.server().connect("watching"));
+    QSqlQuery query(connection.database());
+    EXPECT_TRUE(query.exec("SELECT count(*) FROM pg_stat_activity WHERE state = 'active' AND query "
+                           "LIKE '%numbers%' AND pid <> pg_backend_pid()"));
+    EXPECT_TRUE(query.next());
+    return query.value(0).toInt();
+}
+
+class OnPostgres : public testing::Test {
+protected:
+    static void SetUpTestSuite() {
+        runOnServer({"DROP TABLE IF EXISTS numbers",
+                     "CREATE TABLE numbers AS SELECT n, 'word ' || n AS word, "
+                     "CAST(NULL AS integer) AS missing FROM generate_series(0, 2999) AS n"});
+    }
+    Outcome fetch(const Command& command) {
+        return designer::fetch(Database::connectorTo(serverAddress(), {}), command, keeper, stop);
+    }
+    Outcome fetch(const QString& statement) { return fetch(Command{statement, {}, {}}); }
+    /// Sets the flag as soon as the server works on the statement.
+    std::thread stopWhenWorking() {
+        return std::thread([this] {
+            while (working() == 0) std::this_thread::yield();
+            clock.start();
+            stop = true;
+        });
+    }
+
+    Keeper keeper;
+    std::atomic<bool> stop = false;
+    QElapsedTimer clock;
+};
+
+} // namespace
+
+TEST_F(OnPostgres, TellsKindsOfValuesApart) {
+    fetch("SELECT 1, 1.50::numeric, 12345678901234567890.123456789::numeric, 0.1::float8, true, "
+          "'a'::text, NULL, '\\x00ff'::bytea, DATE '2024-05-01', TIME '10:30', TIMESTAMP "
+          "'2024-05-01 10:30:00.25', 'NaN'::numeric, TIMESTAMP 'infinity'");
+    EXPECT_EQ(keeper.rows,
+              QStringList("n:1 | n:1.50 | n:12345678901234567890.123456789 | n:0.1 | b:true | t:a "
+                          "| 0: | B:00ff | t:2024-05-01 | t:10:30:00 | t:2024-05-01 "
+                          "10:30:00.250 | n:NaN | t:(outside the calendar)"));
+}
+
+TEST_F(OnPostgres, GivesTheFirstRowsBeforeTheLastOnesAreThere) {
+    // The whole result would take minutes and all the memory that there is.
+    keeper.refuseAfter = 1000;
+    const auto query = draw(serverAddress(), {"numbers", "numbers", "numbers"});
+    const Outcome outcome = fetch(commandFor(query, Dialect::PostgreSQL));
+    EXPECT_EQ(outcome.end, Outcome::End::refused);
+    EXPECT_EQ(outcome.rows, 1000);
+    EXPECT_EQ(working(), 0);
+}
+
+TEST_F(OnPostgres, EndsAtTheLimit) {
+    const auto query = draw(serverAddress(), {"numbers"});
+    EXPECT_EQ(fetch(commandFor(query, Dialect::PostgreSQL, 10)).end, Outcome::End::limited);
+    EXPECT_EQ(fetch(commandFor(query, Dialect::PostgreSQL, 3000)).end, Outcome::End::complete);
+}
+
+TEST_F(OnPostgres, TakesParameters) {
+    const auto query = draw(serverAddress(), {"numbers"}, {{"numbers.n", {"< :top"}}});
+    const auto text = designer::statementFor(*query, Dialect::PostgreSQL, {});
+    const auto command = makeCommand(text, Dialect::PostgreSQL, {{"top", "2.5"}}, {});
+    EXPECT_EQ(fetch(command).end, Outcome::End::complete);
+    EXPECT_EQ(keeper.rows, QStringList({"n:0", "n:1", "n:2"}));
+}
+
+TEST_F(OnPostgres, StopsAStatementThatWouldTakeMinutes) {
+    std::thread stopping = stopWhenWorking();
+    const Outcome outcome = fetch(commandFor(drawForMinutes(serverAddress()), Dialect::PostgreSQL));
+    const qint64 took = clock.elapsed();
+    stopping.join();
+    EXPECT_EQ(outcome.end, Outcome::End::cancelled);
+    EXPECT_LT(took, 3000);
+    EXPECT_EQ(working(), 0);
+}
+
+TEST_F(OnPostgres, StopsAStatementInTheMidstOfItsRows) {
+    std::thread stopping = stopWhenWorking();
+    const auto query = draw(serverAddress(), {"numbers", "numbers", "numbers"}, {{"numbers.n"}});
+    const Outcome outcome = fetch(commandFor(query, Dialect::PostgreSQL));
+    stopping.join();
+    EXPECT_EQ(outcome.end, Outcome::End::cancelled);
+    EXPECT_EQ(working(), 0);
+}
+
+TEST_F(OnPostgres, CanChangeNothing) {
+    for (const char* statement : {"DELETE FROM numbers", "INSERT INTO numbers VALUES (1, 'a', 2)",
+                                  "DROP TABLE numbers", "CREATE TABLE other (a integer)"}) {
+        const Outcome outcome = fetch(QString::fromLatin1(statement));
+        EXPECT_EQ(outcome.end, Outcome::End::failed) << statement;
+        EXPECT_THAT(outcome.message.toStdString(), HasSubstr("in a read-only transaction"));
+    }
+    keeper = {};
+    fetch("SELECT count(*) FROM numbers");
+    EXPECT_EQ(keeper.rows, QStringList("n:3000"));
+}
+
+TEST_F(OnPostgres, TellsAFailureFromALostConnection) {
+    const Outcome failed = fetch("SELECT 1 / (n - 5) FROM numbers");
+    EXPECT_EQ(failed.end, Outcome::End::failed);
+    EXPECT_THAT(failed.message.toStdString(), HasSubstr("division by zero"));
+
+    std::thread cutting([] {
+        while (working() == 0) std::this_thread::yield();
+        oneServer.server().kill();
+    });
+    const Outcome lost = fetch(commandFor(drawForMinutes(serverAddress()), Dialect::PostgreSQL));
+    cutting.join();
+    EXPECT_EQ(lost.end, Outcome::End::lost);
+    EXPECT_FALSE(lost.message.isEmpty());
+    oneServer.server().restart();
+}
+
+TEST_F(OnPostgres, CancelsFromThePanel) {
+    designer::Document document;
+    designer::Database database;
+    ASSERT_EQ(database.open(serverAddress()), std::nullopt);
+    document.setQuery(drawForMinutes(serverAddress()));
+    designer::ResultsPanel panel(document, database);
+    panel.show();
+    panel.runAction()->trigger();
+    ASSERT_TRUE(until([] { return working() == 1; }));
+    panel.cancelAction()->trigger();
+    ASSERT_TRUE(until([&] { return !panel.isRunning(); }));
+    EXPECT_EQ(working(), 0);
+}
+
+TEST_F(OnPostgres, SaysThatTheConnectionIsLost) {
+    designer::Document document;
+    designer::Database database;
+    const QString address = serverAddress();
+    ASSERT_EQ(database.open(address), std::nullopt);
+    document.setQuery(draw(address, {"numbers"}));
+    designer::ResultsPanel panel(document, database);
+    panel.show();
+    QString said;
+    QObject::connect(&database, &Database::lost, [&](const QString& message) { said = message; });
+    oneServer.server().kill();
+    panel.run();
+    ASSERT_TRUE(until([&] { return !panel.isRunning(); }));
+    EXPECT_FALSE(said.isEmpty());
+    EXPECT_TRUE(panel.findChild<QLabel*>("runMessage")->isVisible());
+    oneServer.server().restart();
+    ASSERT_EQ(database.renew(), std::nullopt);
+    panel.run();
+    ASSERT_TRUE(until([&] { return !panel.isRunning(); }));
+    EXPECT_EQ(panel.findChild<designer::ResultTable*>()->rows().rowCount(), 3000);
+}

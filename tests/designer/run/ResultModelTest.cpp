@@ -1,0 +1,150 @@
+#include "designer/run/ResultTable.h"
+
+#include "support/QtHands.h"
+
+#include <gtest/gtest.h>
+
+#include <QAction>
+#include <QApplication>
+#include <QClipboard>
+#include <QFile>
+#include <QScrollBar>
+
+using designer::ResultModel;
+using designer::ResultTable;
+using designer::Row;
+using designer::Spool;
+using Kind = designer::Cell::Kind;
+
+namespace {
+
+class ShownRows : public testing::Test {
+protected:
+    void add(const Row& row) { ASSERT_FALSE(spool->add(row)); }
+    void addNumbered(int rows) {
+        for (int n = 0; n < rows; ++n)
+            add({{Kind::number, QString::number(n)}, {Kind::text, QString("row %1").arg(n)}});
+        table.rows().refresh();
+    }
+    void SetUp() override {
+        ASSERT_FALSE(spool->begin({"n", "text"}));
+        table.rows().setSpool(spool);
+        table.rows().refresh();
+        table.resize(400, 300);
+        table.show();
+    }
+    QVariant at(int row, int column, int role = Qt::DisplayRole) {
+        return table.rows().index(row, column).data(role);
+    }
+    QString copied(const QItemSelection& selection) {
+        table.selectionModel()->select(selection, QItemSelectionModel::ClearAndSelect);
+        table.copyAction()->trigger();
+        return QApplication::clipboard()->text();
+    }
+    QItemSelection range(int top, int left, int bottom, int right) {
+        return {table.rows().index(top, left), table.rows().index(bottom, right)};
+    }
+
+    std::shared_ptr<Spool> spool = std::make_shared<Spool>();
+    ResultTable table;
+};
+
+/// In bytes, of this process.
+qint64 memory() {
+    QFile file("/proc/self/statm");
+    if (!file.open(QIODevice::ReadOnly)) return 0;
+    return file.readAll().split(' ').value(1).toLongLong() * 4096;
+}
+
+} // namespace
+
+TEST_F(ShownRows, HaveTheColumnsNames) {
+    EXPECT_EQ(table.rows().headerData(1, Qt::Horizontal), "text");
+    EXPECT_EQ(table.rows().columnCount(), 2);
+    EXPECT_EQ(table.rows().rowCount(), 0);
+}
+
+TEST_F(ShownRows, GrowAsTheyCome) {
+    addNumbered(300);
+    EXPECT_EQ(at(299, 1), "row 299");
+    addNumbered(100);
+    EXPECT_EQ(table.rows().rowCount(), 400);
+    EXPECT_EQ(at(399, 1), "row 99");
+}
+
+TEST_F(ShownRows, AreAlignedByTheirKind) {
+    addNumbered(1);
+    EXPECT_EQ(at(0, 0, Qt::TextAlignmentRole).toInt(), Qt::AlignRight | Qt::AlignVCenter);
+    EXPECT_EQ(at(0, 1, Qt::TextAlignmentRole).toInt(), Qt::AlignLeft | Qt::AlignVCenter);
+}
+
+TEST_F(ShownRows, TellNothingFromTextsAndBlobs) {
+    add({{}, {Kind::blob, {}, QByteArray(1234, 'x')}});
+    table.rows().refresh();
+    EXPECT_EQ(at(0, 0), "NULL");
+    EXPECT_EQ(at(0, 0, Qt::ForegroundRole).value<QBrush>(),
+              QApplication::palette().brush(QPalette::PlaceholderText));
+    EXPECT_EQ(at(0, 1), "(blob, 1,234 bytes)");
+}
+
+TEST_F(ShownRows, PutALongTextIntoOneLine) {
+    add({{Kind::text, "two\nlines"}, {Kind::text, QString(100'000, u'x')}});
+    table.rows().refresh();
+    EXPECT_EQ(at(0, 0), "two lines");
+    EXPECT_EQ(at(0, 0, Qt::ToolTipRole), "two\nlines");
+    EXPECT_LT(at(0, 1, Qt::ToolTipRole).toString().size(), 5000);
+    EXPECT_EQ(copied(range(0, 1, 0, 1)), QString(100'000, u'x'));
+}
+
+TEST_F(ShownRows, AreCopiedWithTabs) {
+    addNumbered(600);
+    EXPECT_EQ(copied(range(254, 0, 257, 1)),
+              "254\trow 254\n255\trow 255\n256\trow 256\n257\trow 257");
+}
+
+TEST_F(ShownRows, AreCopiedFromSeveralPlaces) {
+    addNumbered(10);
+    QItemSelection selection = range(1, 0, 1, 0);
+    selection.merge(range(8, 1, 9, 1), QItemSelectionModel::Select);
+    EXPECT_EQ(copied(selection), "1\t\n\trow 8\n\trow 9");
+}
+
+TEST_F(ShownRows, AreCopiedByTheUsualKeys) {
+    addNumbered(3);
+    table.selectAll();
+    table.activateWindow();
+    table.setFocus();
+    QCoreApplication::processEvents();
+    hands::key(table, Qt::Key_C, "c", Qt::ControlModifier);
+    EXPECT_EQ(QApplication::clipboard()->text(), "0\trow 0\n1\trow 1\n2\trow 2");
+}
+
+TEST_F(ShownRows, KeepTabsAndLinesWithinACellWhenCopied) {
+    add({{Kind::text, "a\tb"}, {Kind::text, "say \"x\"\nagain"}});
+    add({{}, {Kind::text, "plain \"y\""}});
+    table.rows().refresh();
+    EXPECT_EQ(copied(range(0, 0, 1, 1)), "\"a\tb\"\t\"say \"\"x\"\"\nagain\"\n\tplain \"y\"");
+}
+
+TEST_F(ShownRows, AreNotCopiedByTheMillion) {
+    addNumbered(300'000);
+    QApplication::clipboard()->setText("before");
+    bool told = false;
+    QObject::connect(&table, &ResultTable::tooMuchToCopy, &table, [&] { told = true; });
+    EXPECT_EQ(copied(range(0, 0, 299'999, 1)), "before");
+    EXPECT_TRUE(told);
+}
+
+TEST_F(ShownRows, DoNotFillTheMemoryWhenTheyAreScrolled) {
+    addNumbered(300'000);
+    const auto scrollTo = [&](int row) {
+        table.scrollTo(table.rows().index(row, 0));
+        table.grab();
+    };
+    scrollTo(0);
+    const qint64 before = memory();
+    for (int row = 0; row < 300'000; row += 200) scrollTo(row);
+    for (int row = 299'999; row >= 0; row -= 5000) scrollTo(row);
+    EXPECT_LT(memory() - before, 40 << 20);
+    EXPECT_EQ(at(123'456, 1), "row 123456");
+}

@@ -1,0 +1,239 @@
+#include "Databases.h"
+#include "Queries.h"
+#include "designer/database/Answers.h"
+
+#include "designer/document/Document.h"
+#include "designer/run/ParameterDialog.h"
+#include "designer/run/ResultTable.h"
+#include "designer/run/ResultsPanel.h"
+
+#include <gmock/gmock.h>
+
+#include <QAction>
+#include <QComboBox>
+#include <QElapsedTimer>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPlainTextEdit>
+#include <QToolButton>
+
+using designer::ResultsPanel;
+using testing::HasSubstr;
+using testing::MatchesRegex;
+using testing::StartsWith;
+
+namespace {
+
+class TheResultsPanel : public testing::Test {
+protected:
+    void open(const QStringList& statements) {
+        file = folder.database("panel.db", statements);
+        ASSERT_EQ(database.open(file), std::nullopt);
+        panel.resize(500, 400);
+        panel.show();
+    }
+    void show(const QStringList& tables, const std::vector<Drawn>& columns = {}) {
+        document.setQuery(draw(file, tables, columns));
+    }
+    /// Presses the tool button of an action.
+    void press(QAction* action) {
+        for (QToolButton* button : panel.findChildren<QToolButton*>())
+            if (button->defaultAction() == action)
+                return hands::click(*button, button->rect().center());
+        FAIL() << "no button for " << action->text().toStdString();
+    }
+    void pressRun() { press(panel.runAction()); }
+    bool ended() {
+        return until([&] { return !panel.isRunning(); });
+    }
+    std::string status() { return panel.findChild<QLabel*>("runStatus")->text().toStdString(); }
+    std::string message() {
+        const auto* label = panel.findChild<QLabel*>("runMessage");
+        return label->isVisible() ? label->text().toStdString() : "";
+    }
+    designer::ResultTable& table() { return *panel.findChild<designer::ResultTable*>(); }
+    QToolButton& all() { return *panel.findChild<QToolButton*>("allRows"); }
+    QString at(int row, int column) { return table().rows().index(row, column).data().toString(); }
+
+    DatabaseFolder folder;
+    QString file;
+    designer::Document document;
+    designer::Database database;
+    ResultsPanel panel{document, database};
+};
+
+} // namespace
+
+TEST_F(TheResultsPanel, ShowsTheRowsOfTheDrawnQuery) {
+    open(numbersTable(3000));
+    show({"numbers"}, {{"numbers.n", {"< 20"}, 2}, {"numbers.missing"}});
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(table().rows().rowCount(), 20);
+    EXPECT_TRUE(table().isVisible());
+    EXPECT_EQ(at(0, 0), "19");
+    EXPECT_EQ(at(19, 1), "NULL");
+    EXPECT_THAT(status(), MatchesRegex("Rows: 20 . [0-9]+\\.[0-9] s|Rows: 20 .. [0-9]+\\.[0-9] s"));
+    EXPECT_FALSE(all().isVisible());
+}
+
+TEST_F(TheResultsPanel, ShowsTheFirstRowsAndAllOnAClick) {
+    open(numbersTable(3000));
+    show({"numbers"});
+    auto* const limit = panel.findChild<QComboBox*>("rowLimit");
+    EXPECT_EQ(limit->currentText(), "10,000 rows");
+    limit->setFocus();
+    hands::key(*limit, Qt::Key_Up);
+    EXPECT_EQ(panel.limit(), 1000);
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(table().rows().rowCount(), 1000);
+    EXPECT_THAT(status(), StartsWith("First 1,000 rows; there are more"));
+    ASSERT_TRUE(all().isVisible());
+    hands::click(all(), all().rect().center());
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(table().rows().rowCount(), 3000);
+    EXPECT_THAT(status(), StartsWith("Rows: 3,000"));
+}
+
+TEST_F(TheResultsPanel, RunsNothingThatDoesNotSayWhatWasDrawn) {
+    open(numbersTable(10));
+    show({"numbers"}, {{"numbers.n", {"< abc def"}}});
+    pressRun();
+    EXPECT_FALSE(panel.isRunning());
+    EXPECT_THAT(message(), StartsWith("The query cannot be run yet:\n\u2022 numbers.n: "));
+    document.setQuery(platform::makeRef<model::Query>());
+    pressRun();
+    EXPECT_THAT(message(), HasSubstr("The query has no tables"));
+}
+
+TEST_F(TheResultsPanel, AsksForADatabaseFirst) {
+    panel.show();
+    pressRun();
+    EXPECT_EQ(message(), "No database is open: open one first.");
+}
+
+TEST_F(TheResultsPanel, ShowsTheEnginesWordsAndTheStatement) {
+    open(numbersTable(10));
+    show({"numbers"});
+    folder.database("panel.db", {"ALTER TABLE numbers RENAME TO others"});
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(message(), "The database did not run the statement:\nno such table: numbers");
+    EXPECT_THAT(panel.findChild<QPlainTextEdit*>("failedStatement")->toPlainText().toStdString(),
+                HasSubstr("FROM numbers"));
+}
+
+TEST_F(TheResultsPanel, AsksForParametersAndRemembersThem) {
+    open(numbersTable(100));
+    show({"numbers"}, {{"numbers.n", {"< :top"}}, {"numbers.word", {"<> :other"}}});
+    whenOpen<designer::ParameterDialog>([](auto& dialog) {
+        type(*dialog.template findChild<QLineEdit*>("top"), "7");
+        dialog.accept();
+    });
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(table().rows().rowCount(), 7);
+    QString remembered;
+    whenOpen<designer::ParameterDialog>([&](auto& dialog) {
+        remembered = dialog.template findChild<QLineEdit*>("top")->text();
+        dialog.reject();
+    });
+    pressRun();
+    EXPECT_EQ(remembered, "7");
+    EXPECT_FALSE(panel.isRunning());
+    EXPECT_EQ(table().rows().rowCount(), 7); // the rows of before stay
+}
+
+TEST_F(TheResultsPanel, StaysAliveWhileTheEngineWorksAndCancels) {
+    open(numbersTable(3000));
+    document.setQuery(drawForMinutes(file));
+    pressRun();
+    EXPECT_FALSE(panel.runAction()->isEnabled());
+    int beats = 0;
+    QTimer heart;
+    QObject::connect(&heart, &QTimer::timeout, [&] { ++beats; });
+    heart.start(10);
+    ASSERT_TRUE(until([&] { return beats > 20; }));
+    ASSERT_TRUE(panel.isRunning());
+    EXPECT_THAT(status(), StartsWith("Running\u2026"));
+    QElapsedTimer clock;
+    clock.start();
+    press(panel.cancelAction());
+    ASSERT_TRUE(ended());
+    EXPECT_LT(clock.elapsed(), 2000);
+    EXPECT_THAT(status(), StartsWith("Cancelled. Rows that came: 0"));
+    EXPECT_TRUE(panel.runAction()->isEnabled());
+}
+
+TEST_F(TheResultsPanel, KeepsTheRowsThatCameBeforeItWasCancelled) {
+    open(numbersTable(3000));
+    show({"numbers", "numbers", "numbers"});
+    panel.setLimit(ResultsPanel::mostRows);
+    pressRun();
+    ASSERT_TRUE(until([&] { return table().rows().rowCount() > 1000; }));
+    panel.cancel();
+    ASSERT_TRUE(ended());
+    EXPECT_GT(table().rows().rowCount(), 1000);
+    EXPECT_TRUE(table().isVisible());
+    EXPECT_EQ(at(999, 0), "0");
+}
+
+TEST_F(TheResultsPanel, MayGoWhileAStatementRuns) {
+    open(numbersTable(3000));
+    document.setQuery(drawForMinutes(file));
+    auto* const other = new ResultsPanel(document, database);
+    other->run();
+    EXPECT_TRUE(other->isRunning());
+    QElapsedTimer clock;
+    clock.start();
+    delete other;
+    EXPECT_LT(clock.elapsed(), 2000);
+}
+
+TEST_F(TheResultsPanel, ExportsAllRowsWhateverTheLimit) {
+    open(numbersTable(3000));
+    show({"numbers"}, {{"numbers.n"}});
+    panel.setLimit(1000);
+    panel.exportTo(folder.path("all.csv"));
+    ASSERT_TRUE(ended());
+    QFile exported(folder.path("all.csv"));
+    ASSERT_TRUE(exported.open(QIODevice::ReadOnly));
+    EXPECT_EQ(exported.readAll().count('\n'), 3001);
+    EXPECT_THAT(status(), StartsWith("Exported to "));
+    EXPECT_THAT(status(), HasSubstr("Rows: 3,000"));
+}
+
+TEST_F(TheResultsPanel, LeavesNoFileOfACancelledExport) {
+    open(numbersTable(3000));
+    show({"numbers", "numbers", "numbers"});
+    panel.exportTo(folder.path("half.csv"));
+    ASSERT_TRUE(until([&] { return status().find("so far: 0 ") == std::string::npos; }));
+    EXPECT_THAT(status(), StartsWith("Exporting\u2026"));
+    press(panel.cancelAction());
+    ASSERT_TRUE(ended());
+    EXPECT_THAT(status(), StartsWith("Cancelled; nothing was exported"));
+    EXPECT_FALSE(QFile::exists(folder.path("half.csv")));
+}
+
+TEST_F(TheResultsPanel, SaysThatTheDrawingHasChanged) {
+    open(numbersTable(10));
+    show({"numbers"});
+    pressRun();
+    ASSERT_TRUE(ended());
+    document.change("Add a column", [](model::Query& query) { addColumn(query, {"numbers.n"}); });
+    EXPECT_THAT(status(), HasSubstr("the drawing has changed since"));
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(status().find("changed"), std::string::npos);
+}
+
+TEST_F(TheResultsPanel, ForgetsTheRowsOfAnotherDatabase) {
+    open(numbersTable(10));
+    show({"numbers"});
+    pressRun();
+    ASSERT_TRUE(ended());
+    ASSERT_EQ(database.open(sampleDatabase()), std::nullopt);
+    EXPECT_EQ(table().rows().rowCount(), 0);
+    EXPECT_EQ(message(), "Run the query to see its rows here.");
+}

@@ -1,0 +1,83 @@
+#include "designer/run/Spool.h"
+
+#include <gtest/gtest.h>
+
+#include <limits>
+#include <thread>
+
+using designer::Row;
+using designer::Spool;
+using Kind = designer::Cell::Kind;
+
+namespace {
+
+constexpr qint64 all = std::numeric_limits<qint64>::max();
+
+Row numbered(int n) {
+    return {{Kind::number, QString::number(n)}, {Kind::text, QString("row %1").arg(n)}};
+}
+
+void fill(Spool& spool, int rows) {
+    ASSERT_FALSE(spool.begin({"n", "text"}));
+    for (int n = 0; n < rows; ++n) ASSERT_FALSE(spool.add(numbered(n)));
+}
+
+} // namespace
+
+TEST(TheSpool, GivesBackRowsPageByPage) {
+    Spool spool;
+    fill(spool, 1000);
+    EXPECT_EQ(spool.columns(), QStringList({"n", "text"}));
+    EXPECT_EQ(spool.rows(), 1000);
+    const auto second = spool.page(1, all);
+    ASSERT_EQ(second.size(), 256u);
+    EXPECT_EQ(second[0], numbered(256));
+    EXPECT_EQ(second[255], numbered(511));
+    EXPECT_EQ(spool.page(0, all)[0], numbered(0)); // and goes back
+    EXPECT_EQ(spool.page(3, all).size(), 1000u - 3 * 256);
+    EXPECT_TRUE(spool.page(4, all).empty());
+}
+
+TEST(TheSpool, GivesBackEveryKindOfCell) {
+    Spool spool;
+    ASSERT_FALSE(spool.begin({"a", "b", "c", "d", "e"}));
+    const Row row = {{},
+                     {Kind::text, ""},
+                     {Kind::boolean, "true"},
+                     {Kind::text, "\U0001F600 \u00e4"},
+                     {Kind::blob, {}, QByteArray(1234, 'x')}};
+    ASSERT_FALSE(spool.add(row));
+    const auto page = spool.page(0, all);
+    ASSERT_EQ(page.size(), 1u);
+    for (int i = 0; i < 4; ++i) EXPECT_EQ(page[0][i], row[i]) << i;
+    EXPECT_EQ(page[0][4], (designer::Cell{Kind::blob, "1234"}));
+}
+
+TEST(TheSpool, ReadsTheBeginningOfALongTextWithWholeCharacters) {
+    Spool spool;
+    ASSERT_FALSE(spool.begin({"a", "b"}));
+    ASSERT_FALSE(spool.add({{Kind::text, QString(100'000, u'\u00e4')}, {Kind::number, "7"}}));
+    const auto page = spool.page(0, 11);
+    EXPECT_EQ(page[0][0].text, QString(5, u'\u00e4') + u'\u2026');
+    EXPECT_EQ(page[0][1].text, "7");
+    EXPECT_EQ(spool.page(0, all)[0][0].text.size(), 100'000);
+}
+
+TEST(TheSpool, CanBeReadWhileRowsAreComing) {
+    Spool spool;
+    ASSERT_FALSE(spool.begin({"n", "text"}));
+    constexpr int count = 30'000;
+    std::thread writing([&] {
+        for (int n = 0; n < count; ++n) (void)spool.add(numbered(n));
+        (void)spool.finish();
+    });
+    for (qint64 seen = 0; seen < count;) {
+        seen = spool.rows();
+        if (seen == 0) continue;
+        const qint64 last = (seen - 1) / Spool::rowsInAPage;
+        const auto page = spool.page(last, all);
+        ASSERT_FALSE(page.empty());
+        ASSERT_EQ(page[0], numbered(static_cast<int>(last * Spool::rowsInAPage)));
+    }
+    writing.join();
+}

@@ -1,0 +1,92 @@
+#include "designer/statement/ModelWords.h"
+
+#include <gtest/gtest.h>
+
+#include <QCoreApplication>
+#include <QDirIterator>
+#include <QFile>
+#include <QRegularExpression>
+#include <QTranslator>
+
+using designer::inWords;
+
+namespace {
+
+/// Turns every text into one that shows where it was put together.
+class Marking final : public QTranslator {
+public:
+    Marking() { QCoreApplication::installTranslator(this); }
+    ~Marking() override { QCoreApplication::removeTranslator(this); }
+    bool isEmpty() const override { return false; }
+    QString translate(const char* context, const char* text, const char*, int) const override {
+        if (qstrcmp(context, "Model") != 0) return {};
+        return u'<' + QString::fromUtf8(text) + u'>';
+    }
+};
+
+/// What the sources of a folder say in texts of their own that begin in a certain way.
+QStringList textsOf(const QString& folder, const QString& beginning) {
+    const QRegularExpression texts("u\"(" + beginning + "[^\"\\\\]*)");
+    QStringList result;
+    QDirIterator files(QStringLiteral(SOURCE_ROOT "/src/model/") + folder, {"*.cpp"});
+    while (files.hasNext()) {
+        QFile file(files.next());
+        EXPECT_TRUE(file.open(QIODevice::ReadOnly));
+        QString source = QString::fromUtf8(file.readAll());
+        source.replace(QRegularExpression("\"\\s*u\""), ""); // a text in two pieces
+        for (auto all = texts.globalMatch(source); all.hasNext();) result << all.next().captured(1);
+    }
+    return result;
+}
+
+bool isKnown(const QString& text) {
+    for (const QString& message : designer::knownMessages())
+        if (message.contains(text) || QString(message).replace("%1", text.right(1)) == text)
+            return true;
+    return false;
+}
+
+} // namespace
+
+TEST(TheModelsWords, AreTranslatedAroundTheNamesInThem) {
+    const Marking translations;
+    EXPECT_EQ(inWords("Two output columns are named id: give one of them a synonym.").toStdString(),
+              "<Two output columns are named id: give one of them a synonym.>");
+    EXPECT_EQ(inWords("No join connects a with b: every row of one comes with every row of the "
+                      "other.")
+                  .toStdString(),
+              "<No join connects a with b: every row of one comes with every row of the other.>");
+}
+
+TEST(TheModelsWords, AreTranslatedWithinOneAnother) {
+    const Marking translations;
+    EXPECT_EQ(inWords("orders.id: At character 3: expected a number.").toStdString(),
+              "<orders.id: At character 3: <expected a number>.>");
+    EXPECT_EQ(inWords("a.b: At character 1: expected a column that holds a text.").toStdString(),
+              "<a.b: At character 1: <expected a column that holds <a text>>.>");
+}
+
+TEST(TheModelsWords, KeepNamesThatLookLikePlaceholders) {
+    EXPECT_EQ(inWords("No join connects %2 with %1: every row of one comes with every row of the "
+                      "other.")
+                  .toStdString(),
+              "No join connects %2 with %1: every row of one comes with every row of the other.");
+}
+
+TEST(TheModelsWords, LeaveWhatNobodyKnows) {
+    const Marking translations;
+    EXPECT_EQ(inWords("near \"FORM\": syntax error"), "near \"FORM\": syntax error");
+}
+
+TEST(TheModelsWords, AreAllKnown) {
+    const QStringList expected = textsOf("criteria", "expected [^\"]");
+    EXPECT_GE(expected.size(), 25);
+    for (QString text : expected) {
+        if (text.endsWith(", as in [")) text.chop(1); // the names in brackets are put in
+        EXPECT_TRUE(isKnown(text)) << text.toStdString();
+    }
+    const QStringList sentences =
+        textsOf("sql", "(The|An|Two|No|SQLite|PostgreSQL|MySQL/MariaDB) ");
+    EXPECT_GE(sentences.size(), 9);
+    for (const QString& text : sentences) EXPECT_TRUE(isKnown(text)) << text.toStdString();
+}

@@ -1,0 +1,68 @@
+#include "designer/statement/SqlView.h"
+
+#include <gtest/gtest.h>
+
+#include <QApplication>
+#include <QScrollBar>
+
+#include <random>
+
+using designer::SqlView;
+
+TEST(TheSqlView, KeepsTheSelectionWhereTheTextStaysTheSame) {
+    SqlView view;
+    view.setStatement("SELECT a\nFROM orders\nWHERE a = 1");
+    QTextCursor cursor = view.textCursor();
+    cursor.setPosition(14);
+    cursor.setPosition(20, QTextCursor::KeepAnchor);
+    view.setTextCursor(cursor);
+    ASSERT_EQ(view.textCursor().selectedText(), "orders");
+    view.setStatement("SELECT a, b\nFROM orders\nWHERE a = 1");
+    EXPECT_EQ(view.toPlainText(), "SELECT a, b\nFROM orders\nWHERE a = 1");
+    EXPECT_EQ(view.textCursor().selectedText(), "orders");
+}
+
+TEST(TheSqlView, KeepsItsPlaceWhileTheTextChanges) {
+    SqlView view;
+    view.resize(300, 120);
+    view.show();
+    QStringList lines;
+    for (int n = 0; n < 100; ++n) lines << QStringLiteral("line %1").arg(n);
+    view.setStatement(lines.join('\n'));
+    QCoreApplication::processEvents();
+    view.verticalScrollBar()->setValue(40);
+    lines.insert(1, "one more");
+    view.setStatement(lines.join('\n'));
+    QCoreApplication::processEvents();
+    EXPECT_EQ(view.verticalScrollBar()->value(), 40);
+    lines = lines.mid(10, 60);
+    view.setStatement(lines.join('\n'));
+    QCoreApplication::processEvents();
+    EXPECT_EQ(view.verticalScrollBar()->value(), 40);
+}
+
+TEST(TheSqlView, ShowsWhateverTextFollowsWhatever) {
+    SqlView view;
+    const QString parts[] = {"a",
+                             "b",
+                             "\n",
+                             "'",
+                             QString::fromUtf8("\xF0\x9F\x98\x80"),
+                             QString::fromUtf8("\xF0\x9F\x98\x81"),
+                             QString::fromUtf8("\xC3\xA9"),
+                             " ",
+                             "\r\n"};
+    std::mt19937 random(1);
+    for (int round = 0; round < 2000; ++round) {
+        QString text;
+        for (auto n = random() % 8; n > 0; --n) text += parts[random() % std::size(parts)];
+        view.setStatement(text);
+        EXPECT_EQ(view.statement(), text);
+        EXPECT_EQ(view.toPlainText(), QString(text).replace("\r\n", "\n"));
+    }
+}
+
+TEST(TheSqlView, CannotBeTypedInto) {
+    SqlView view;
+    EXPECT_TRUE(view.isReadOnly());
+}

@@ -1,0 +1,235 @@
+#include "Designer.h"
+
+#include "support/PostgresServer.h"
+
+#include <QFileInfo>
+#include <QSqlError>
+#include <QSqlQuery>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+#include <QCoreApplication>
+#include <QDir>
+
+#include <unistd.h>
+
+namespace {
+
+/// A new user's way with the designer itself, with settings and a home of its own.
+class ADesignersDay : public testing::Test {
+protected:
+    QStringList environment() {
+        return {"HOME=" + home.path(), "XDG_CONFIG_HOME=" + home.filePath("config"),
+                "XDG_DATA_HOME=" + home.filePath("data"),
+                "LC_ALL=C.UTF-8", // the words of the journey are English ones
+                "LANGUAGE=en"};
+    }
+
+    void start(const QStringList& arguments = {}) {
+        designer.reset();
+        designer = std::make_unique<Designer>(screen, QStringLiteral(ZANDOR_APPLICATION_HOST),
+                                              QStringList(home.filePath("autosave")) + arguments,
+                                              environment());
+    }
+
+    void command(const QString& menu, const QString& name) {
+        designer->click("menu " + menu);
+        designer->click("menu " + name);
+        designer->awaitGone("menu " + name);
+    }
+
+    void addTable(const QString& name) {
+        designer->click("control tableFilter");
+        screen.key("ctrl+a");
+        designer->type("tableFilter", name);
+        screen.key("Return");
+        designer->place("title " + name);
+    }
+
+    void giveCriterion(const QString& cell, const QString& text) {
+        designer->click(cell);
+        designer->type("txtValue", text);
+        screen.key("Return");
+        designer->awaitGone("control txtValue");
+    }
+
+    void quit() {
+        designer->click("menu fileMenu");
+        designer->click("menu quit");
+    }
+
+    void quitWithoutSaving() {
+        quit();
+        designer->click("button Discard");
+        EXPECT_TRUE(designer->endsWell());
+    }
+
+    QStringList awaitRows(int count) {
+        QStringList rows;
+        await(QStringLiteral("%1 rows are shown").arg(count), [&] {
+            rows = designer->ask("text resultTable");
+            return rows.size() == count;
+        });
+        return rows;
+    }
+
+    QTemporaryDir home;
+    Screen screen;
+    std::unique_ptr<Designer> designer;
+};
+
+/// The rows of a statement written by hand.
+QStringList reference(const QString& statement) {
+    QStringList rows;
+    {
+        auto database = QSqlDatabase::addDatabase("QSQLITE", "reference");
+        database.setDatabaseName(QStringLiteral(ZANDOR_SAMPLE_DATABASE));
+        EXPECT_TRUE(database.open());
+        QSqlQuery query(statement, database);
+        EXPECT_TRUE(query.isActive()) << query.lastError().text().toStdString();
+        while (query.next()) rows += query.value(0).toString() + " | " + query.value(1).toString();
+    }
+    QSqlDatabase::removeDatabase("reference");
+    return rows;
+}
+
+} // namespace
+
+TEST_F(ADesignersDay, LeadsFromAnEmptyDrawingToRowsAndAFileAndBack) {
+    start();
+    command("fileMenu", "new");
+    for (const char* table : {"suppliers", "products", "customers"}) addTable(table);
+    EXPECT_EQ(designer->query().filter("join "),
+              QStringList("join products.supplier_id = suppliers.id, type 0"));
+    designer->picture("application-1-three-tables");
+
+    designer->click("entry customers country_code");
+    designer->carry("entry customers country_code", "entry suppliers country_code");
+    designer->drop();
+    designer->place("join 2");
+
+    designer->click("entry customers name");
+    designer->carry("entry customers name", "cell 1 1");
+    designer->drop();
+    await("the column is there", [&] { return designer->query().filter("column ").size() == 1; });
+    designer->click("entry products name");
+    designer->carry("entry products name", "cell 1 2");
+    designer->drop();
+    await("the column is there", [&] { return designer->query().filter("column ").size() == 2; });
+
+    designer->click("cell 2 1");
+    designer->place("control cobSortOrder");
+    screen.key("Down");
+    await("the item is chosen",
+          [&] { return designer->ask("text cobSortOrder") == QStringList("Ascending"); });
+    screen.key("Return");
+    designer->awaitGone("control cobSortOrder");
+    giveCriterion("cell 4 1", "Like 'A*'");
+    giveCriterion("cell 4 2", "Like '*e*'");
+
+    command("queryMenu", "run");
+    const QStringList expected = reference(
+        "SELECT c.name, p.name FROM customers c JOIN suppliers s ON c.country_code = "
+        "s.country_code JOIN products p ON p.supplier_id = s.id WHERE c.name LIKE 'A%' AND p.name "
+        "LIKE '%e%' ORDER BY c.name");
+    ASSERT_GT(expected.size(), 3);
+    QStringList rows = awaitRows(static_cast<int>(expected.size()));
+    // Products of one customer come in any order.
+    EXPECT_EQ(QStringList(rows.begin(), rows.end()).filter(" | ").size(), expected.size());
+    QStringList sorted = rows;
+    QStringList sortedReference = expected;
+    sorted.sort();
+    sortedReference.sort();
+    EXPECT_EQ(sorted, sortedReference);
+    designer->picture("application-2-rows");
+
+    const QString file = home.filePath("mine.json");
+    screen.key("ctrl+s");
+    designer->type("fileNameEdit", file);
+    screen.key("Return");
+    await("the file is there", [&] { return QFileInfo::exists(file); });
+    const QStringList saved = designer->query();
+    quit();
+    EXPECT_TRUE(designer->endsWell());
+
+    start({file});
+    EXPECT_EQ(designer->query(), saved);
+    designer->click("close customers");
+    designer->awaitGone("title customers");
+    EXPECT_NE(designer->query(), saved);
+    command("editMenu", "undo");
+    designer->place("title customers");
+    EXPECT_EQ(designer->query(), saved);
+    command("queryMenu", "run");
+    rows = awaitRows(static_cast<int>(expected.size()));
+    quit();
+    EXPECT_TRUE(designer->endsWell());
+}
+
+TEST_F(ADesignersDay, GoesOnAfterAPowerFailure) {
+    start();
+    command("fileMenu", "new");
+    addTable("suppliers");
+    addTable("products");
+    const QStringList drawn = designer->query();
+    await("it is kept safe", [&] {
+        const QDir folder(home.filePath("autosave"));
+        return !folder.entryList({"*.autosave"}, QDir::Files).isEmpty();
+    });
+    designer->kill();
+
+    start();
+    designer->click("button Recover");
+    await("the query is there again", [&] { return designer->query() == drawn; });
+    quitWithoutSaving();
+}
+
+TEST_F(ADesignersDay, GoesOnWhenTheServerComesBack) {
+    PostgresServer server;
+    {
+        const QSqlDatabase database = server.connect("journey");
+        for (const char* statement :
+             {"CREATE TABLE teams (id integer PRIMARY KEY, name text)",
+              "CREATE TABLE players (id integer PRIMARY KEY, team_id integer REFERENCES teams, "
+              "name text)",
+              "INSERT INTO teams VALUES (1, 'Reds'), (2, 'Blues')",
+              "INSERT INTO players VALUES (1, 1, 'Ann'), (2, 2, 'Bob'), (3, 2, 'Cid')"}) {
+            QSqlQuery query(database);
+            ASSERT_TRUE(query.exec(statement)) << query.lastError().text().toStdString();
+        }
+    }
+    QSqlDatabase::removeDatabase("journey");
+
+    start({"--tables", "teams,players",
+           "postgresql://postgres@localhost/postgres?host=" + server.folder()});
+    EXPECT_EQ(designer->query().filter("join "),
+              QStringList("join players.team_id = teams.id, type 0"));
+    designer->click("entry players name");
+    designer->carry("entry players name", "cell 1 1");
+    designer->drop();
+    await("the column is there", [&] { return designer->query().filter("column ").size() == 1; });
+    command("queryMenu", "run");
+    awaitRows(3);
+
+    server.kill();
+    command("queryMenu", "run");
+    designer->place("control reconnect");
+    designer->picture("application-3-connection-lost");
+    const QStringList drawn = designer->query();
+    server.restart();
+    designer->click("control reconnect");
+    designer->awaitGone("control reconnect");
+    EXPECT_EQ(designer->query(), drawn);
+    command("queryMenu", "run");
+    awaitRows(3);
+    quitWithoutSaving();
+}
+
+int main(int argc, char** argv) {
+    // Whatever happens, nothing is left behind: the children die with this program.
+    alarm(240);
+    const QCoreApplication application(argc, argv);
+    testing::InitGoogleTest(&argc, argv);
+    return RUN_ALL_TESTS();
+}
