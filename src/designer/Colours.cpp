@@ -6,7 +6,23 @@
 
 namespace designer {
 
+namespace {
+
+QString& ownStyle() {
+    static QString name;
+    return name;
+}
+
+} // namespace
+
+void useOwnColours() {
+    if (ownStyle().isEmpty()) return; // nothing was changed
+    QApplication::setStyle(ownStyle());
+    QApplication::setPalette(QPalette());
+}
+
 void useDarkColours() {
+    if (ownStyle().isEmpty()) ownStyle() = QApplication::style()->name();
     // Fusion follows the palette in every part; a desktop's own style need not.
     QApplication::setStyle(QStringLiteral("Fusion"));
 

@@ -5,4 +5,7 @@ namespace designer {
 /// Gives the whole application dark colours, whatever the desktop uses.
 void useDarkColours();
 
+/// Gives it the desktop's own colours again.
+void useOwnColours();
+
 } // namespace designer

@@ -1,5 +1,6 @@
 #include "designer/DesignerWindow.h"
 
+#include "designer/Colours.h"
 #include "designer/DatabaseCommands.h"
 #include "designer/OpenedQuery.h"
 #include "designer/Screen.h"
@@ -42,6 +43,7 @@ constexpr int mostOutputColumns = 255;
 constexpr int messageTime = 10'000; // milliseconds
 
 QString geometryKey() { return QStringLiteral("window/geometry"); }
+QString darkKey() { return QStringLiteral("window/dark"); }
 QString layoutKey() { return QStringLiteral("window/layout"); }
 
 } // namespace
@@ -91,13 +93,13 @@ void DesignerWindow::makePanels() {
         dock(mResults, QStringLiteral("resultsDock"), tr("Rows"), Qt::BottomDockWidgetArea);
     QDockWidget* const events =
         dock(mEvents, QStringLiteral("eventsDock"), tr("Events"), Qt::BottomDockWidgetArea);
-    tabifyDockWidget(statement, results);
-    tabifyDockWidget(results, events);
+    // The last one lies on top.
+    tabifyDockWidget(events, results);
+    tabifyDockWidget(results, statement);
     events->hide();
-    statement->raise();
     resizeDocks({findChild<QDockWidget*>(QStringLiteral("tablesDock"))}, {220}, Qt::Horizontal);
     resizeDocks({statement}, {220}, Qt::Vertical);
-    connect(mResults, &ResultsPanel::shown, results, [results] {
+    connect(mResults->runAction(), &QAction::triggered, results, [results] {
         results->show();
         results->raise();
     });
@@ -175,6 +177,15 @@ void DesignerWindow::makeMenus() {
     command(query, tr("Re&name table\u2026"), "rename", &DesignerWindow::renameTable);
 
     QMenu* const view = add(tr("&View"), "viewMenu");
+    QAction* const dark = view->addAction(tr("&Dark colours"));
+    dark->setObjectName(QStringLiteral("dark"));
+    dark->setCheckable(true);
+    connect(dark, &QAction::toggled, this, [this](bool on) {
+        mSettings.setValue(darkKey(), on);
+        on ? useDarkColours() : useOwnColours();
+    });
+    dark->setChecked(mSettings.value(darkKey()).toBool());
+    view->addSeparator();
     for (const auto* panel : findChildren<QDockWidget*>())
         view->addAction(panel->toggleViewAction());
 

@@ -15,7 +15,7 @@ using reader::TableId;
 
 namespace {
 
-QString tr(const char* text) { return QCoreApplication::translate("designer::openQuery", text); }
+QString tr(const char* text) { return QCoreApplication::translate("designer", text); }
 
 Result<std::vector<TableId>> named(const QStringList& names, const std::vector<TableEntry>& present,
                                    const QString& file) {

@@ -56,8 +56,10 @@ Cost heightAt(const Line& line, Cost x) {
 bool runsBelow(const Line& line, const Box& box) {
     const Cost right = box.left + box.width;
     if (box.left <= line.from.x || right >= line.to.x) return false;
-    const auto [upper, lower] = std::minmax(heightAt(line, box.left), heightAt(line, right));
-    return lower > box.top && upper < box.top + box.height;
+    const Cost entering = heightAt(line, box.left);
+    const Cost leaving = heightAt(line, right);
+    return std::max(entering, leaving) > box.top &&
+           std::min(entering, leaving) < box.top + box.height;
 }
 
 class Drawing {
@@ -131,7 +133,8 @@ private:
 
     /// Of one column.
     Cost tablesBetween(const Box& a, const Box& b) const {
-        const auto [upper, lower] = std::minmax(a.top, b.top);
+        const std::int32_t upper = std::min(a.top, b.top);
+        const std::int32_t lower = std::max(a.top, b.top);
         return std::ranges::count_if(mBoxes, [&](const Box& box) {
             return box.left == a.left && box.top > upper && box.top < lower;
         });

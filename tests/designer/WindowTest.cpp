@@ -1,16 +1,27 @@
 #include "Databases.h"
 
 #include "designer/DesignerWindow.h"
+#include "designer/tables/RenameDialog.h"
 #include "platform/qt/CanvasItems.h"
 #include "platform/qt/GridModel.h"
 #include "platform/qt/GridWidget.h"
 #include "platform/qt/TabuletWidget.h"
+#include "support/QtHands.h"
 
 #include <gmock/gmock.h>
 
+#include <QAbstractButton>
+#include <QAction>
 #include <QApplication>
+#include <QComboBox>
+#include <QDockWidget>
 #include <QLabel>
+#include <QLineEdit>
+#include <QMessageBox>
+#include <QMimeData>
 #include <QStatusBar>
+#include <QTimer>
+#include <QUrl>
 
 using platform::qt::Canvas;
 using platform::qt::GridWidget;
@@ -119,4 +130,157 @@ TEST_F(TheDesignersWindow, BindsTheWholeSample) {
     open({.file = sampleDatabase()});
     EXPECT_EQ(shownTables().size(), 16U);
     EXPECT_EQ(paintedItems().size(), 3U * 19U);
+}
+
+TEST_F(TheDesignersWindow, MarksAQueryThatIsNotSaved) {
+    open();
+    EXPECT_FALSE(window->isWindowModified());
+    window->document().change(
+        "Delete", [](model::Query& query) { query.DeleteTable(query.tableNamed(u"orders")); });
+    EXPECT_TRUE(window->isWindowModified());
+    window->document().undo();
+    EXPECT_FALSE(window->isWindowModified());
+}
+
+TEST_F(TheDesignersWindow, AsksBeforeAnUnsavedQueryIsLost) {
+    open();
+    window->document().change(
+        "Delete", [](model::Query& query) { query.DeleteTable(query.tableNamed(u"orders")); });
+    bool asked = false;
+    const auto answer = [&](QMessageBox::StandardButton button) {
+        QTimer::singleShot(0, [&asked, button] {
+            auto* const box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+            ASSERT_TRUE(box);
+            asked = true;
+            box->button(button)->click();
+        });
+    };
+    answer(QMessageBox::Cancel);
+    EXPECT_FALSE(window->close());
+    EXPECT_TRUE(asked);
+    EXPECT_TRUE(window->isVisible());
+    answer(QMessageBox::Discard);
+    EXPECT_TRUE(window->close());
+}
+
+TEST_F(TheDesignersWindow, PutsItsPanelsWhereTheyWereLastTime) {
+    open();
+    auto* const tables = window->findChild<QDockWidget*>("tablesDock");
+    EXPECT_EQ(window->dockWidgetArea(tables), Qt::LeftDockWidgetArea);
+    window->addDockWidget(Qt::RightDockWidgetArea, tables);
+    window->findChild<QDockWidget*>("resultsDock")->hide();
+    window->resize(900, 700);
+    EXPECT_TRUE(window->close());
+
+    open();
+    EXPECT_EQ(window->dockWidgetArea(window->findChild<QDockWidget*>("tablesDock")),
+              Qt::RightDockWidgetArea);
+    EXPECT_FALSE(window->findChild<QDockWidget*>("resultsDock")->isVisible());
+    EXPECT_EQ(window->size(), QSize(900, 700));
+    QSettings().clear();
+}
+
+TEST_F(TheDesignersWindow, UndoesWhatWasDoneWithTheControl) {
+    open();
+    const auto before = window->document().query()->record();
+    auto& close = part<TabuletWidget>("lstTable(2)").closeButton();
+    hands::click(close, QRectF(close.rect()).center());
+    QCoreApplication::processEvents();
+    EXPECT_THAT(shownTables(),
+                UnorderedElementsAre("customers", "order_lines", "products", "categories"));
+    QAction* const undo = window->findChild<QAction*>("undo");
+    EXPECT_EQ(undo->text(), "&Undo Delete table orders");
+    undo->trigger();
+    EXPECT_EQ(window->document().query()->record(), before);
+    EXPECT_EQ(shownTables().size(), 5U);
+    EXPECT_EQ(paintedItems().size(), 12U);
+    window->findChild<QAction*>("redo")->trigger();
+    EXPECT_EQ(shownTables().size(), 4U);
+    window->document().setModified(false);
+}
+
+TEST_F(TheDesignersWindow, GivesTheControlTheOptionsThatAreChosen) {
+    open();
+    QVariantMap options = window->drawing().options();
+    options["LNGSpreadField"] = "Feld:";
+    window->drawing().setOptions(options);
+    EXPECT_EQ(gridColumn(0).front(), "Feld:");
+    // And every control that is made later.
+    emit window->document().outdated();
+    EXPECT_EQ(gridColumn(0).front(), "Feld:");
+}
+
+TEST_F(TheDesignersWindow, OpensADatabaseThatIsDroppedOnIt) {
+    DatabaseFolder folder;
+    open();
+    QMimeData data;
+    data.setUrls({QUrl::fromLocalFile(
+        folder.database("dropped.db", {"CREATE TABLE only (id INTEGER PRIMARY KEY)"}))});
+    const QPoint at(5, 5);
+    QDragEnterEvent enter(at, Qt::CopyAction, &data, Qt::LeftButton, {});
+    QCoreApplication::sendEvent(window.get(), &enter);
+    EXPECT_TRUE(enter.isAccepted());
+    QDropEvent drop(at, Qt::CopyAction, &data, Qt::NoButton, {});
+    QCoreApplication::sendEvent(window.get(), &drop);
+    QCoreApplication::processEvents();
+    EXPECT_EQ(window->database().name(), "dropped.db");
+    EXPECT_TRUE(shownTables().empty());
+    // What is no database is none to it.
+    data.setUrls({QUrl::fromLocalFile(folder.file("words.txt", "words"))});
+    QDragEnterEvent other(at, Qt::CopyAction, &data, Qt::LeftButton, {});
+    QCoreApplication::sendEvent(window.get(), &other);
+    EXPECT_FALSE(other.isAccepted());
+}
+
+TEST_F(TheDesignersWindow, WarnsWhenTheGridIsFull) {
+    open({.tables = {"orders"}});
+    const auto fill = [&](int count) {
+        window->document().change("Add", [&](model::Query& query) {
+            const auto column = query.tableNamed(u"orders")->columnNamed(u"id");
+            while (query.ColumnDefinitions().Count() < count) {
+                const auto definition = platform::makeRef<model::ColumnDefinition>();
+                definition->Column(column);
+                query.AddColumnDefinition(definition);
+            }
+        });
+    };
+    fill(254);
+    bool warned = false;
+    QTimer::singleShot(0, [&] {
+        auto* const box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+        ASSERT_TRUE(box);
+        warned = box->text().contains("255 output columns");
+        box->accept();
+    });
+    fill(255);
+    EXPECT_TRUE(warned);
+    window->document().setModified(false);
+}
+
+TEST_F(TheDesignersWindow, RenamesATableEverywhere) {
+    open();
+    designer::RenameDialog dialog(window->document(), window.get());
+    dialog.findChild<QComboBox*>("renameTable")->setCurrentText("orders");
+    auto* const name = dialog.findChild<QLineEdit*>("renameName");
+    name->setText("Customers");
+    dialog.accept();
+    EXPECT_EQ(dialog.findChild<QLabel*>("renameFault")->text(),
+              "Another table of this query is called \"Customers\"; choose another name.");
+    name->setText("sold");
+    dialog.accept();
+    EXPECT_EQ(dialog.result(), QDialog::Accepted);
+    EXPECT_THAT(shownTables(), testing::Contains("sold"));
+    EXPECT_EQ(window->document().query()->tableNamed(u"orders"), nullptr);
+    window->document().undo();
+    EXPECT_THAT(shownTables(), testing::Contains("orders"));
+}
+
+TEST_F(TheDesignersWindow, HasRoomForItsPanelsOnASmallScreen) {
+    open();
+    window->resize(1366, 720); // what a task bar leaves of 768
+    QCoreApplication::processEvents();
+    EXPECT_EQ(window->size(), QSize(1366, 720));
+    EXPECT_GE(window->drawing().height(), 400);
+    EXPECT_GE(window->drawing().width(), 1000);
+    EXPECT_LE(window->minimumSizeHint().height(), 720);
 }

@@ -5,6 +5,7 @@
 #include <QGuiApplication>
 #include <QHeaderView>
 #include <QHelpEvent>
+#include <QKeyEvent>
 #include <QStyledItemDelegate>
 #include <QTextDocument>
 #include <QToolTip>
@@ -70,6 +71,13 @@ void ResultTable::fitColumns() {
     resizeColumnsToContents();
     for (int column = 0; column < mModel->columnCount(); ++column)
         if (columnWidth(column) > widestColumn) setColumnWidth(column, widestColumn);
+}
+
+// By itself a view copies the current cell only.
+void ResultTable::keyPressEvent(QKeyEvent* event) {
+    if (!event->matches(QKeySequence::Copy)) return QTableView::keyPressEvent(event);
+    copy();
+    event->accept();
 }
 
 void ResultTable::copy() {

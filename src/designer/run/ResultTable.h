@@ -22,6 +22,9 @@ signals:
     /// More cells are selected than can be copied.
     void tooMuchToCopy();
 
+protected:
+    void keyPressEvent(QKeyEvent* event) override;
+
 private:
     void copy();
 

@@ -20,7 +20,7 @@ constexpr qreal pngScale = 2;
 constexpr int pixelsPerInch = 96; // of a logical pixel
 constexpr qreal pointsPerPixel = 72.0 / pixelsPerInch;
 
-QString tr(const char* text) { return QCoreApplication::translate("designer::savePicture", text); }
+QString tr(const char* text) { return QCoreApplication::translate("designer", text); }
 
 bool writePng(const DrawingPicture& picture, QIODevice& file) {
     return picture.image(pngScale).save(&file, "PNG");

@@ -17,6 +17,12 @@ namespace {
 using platform::qt::GridWidget;
 using platform::qt::TabuletWidget;
 
+/// The control selects the table that has the focus, which is part of no step.
+model::QueryRecord unselected(model::QueryRecord record) {
+    for (auto& table : record.tables) table.selected = 0;
+    return record;
+}
+
 class TheControl : public testing::Test {
 protected:
     TheControl() {
@@ -85,6 +91,8 @@ protected:
             menu->close();
         });
         hands::mouse(list, QEvent::MouseButtonRelease, entry(table, row), Qt::RightButton);
+        calm();
+        area.activateWindow(); // off screen nobody gives it the focus back
         calm();
     }
 
@@ -168,7 +176,7 @@ TEST_F(TheControl, DeletesATableWithAllThatHangsOnItAsOneStep) {
     EXPECT_EQ(steps(), 1);
     drawing.document.undo();
     calm();
-    EXPECT_EQ(drawing.query().record(), before);
+    EXPECT_EQ(unselected(drawing.query().record()), unselected(before));
     EXPECT_EQ(box(2).title(), "orders");
     EXPECT_EQ(part<GridWidget>(QStringLiteral("sprColumn")).model().text(0, 1), "status");
 }

@@ -51,9 +51,9 @@ TEST(TheManPage, IsFormattedWithoutAWarning) {
     const QString man = QStandardPaths::findExecutable("man");
     if (man.isEmpty()) GTEST_SKIP() << "man is not installed";
     QProcess process;
-    process.start(man, {"--warnings", "-E", "UTF-8", "-T", "utf8", "-P", "cat", "-l", page});
+    process.start(man, {"--warnings", "-E", "UTF-8", "-l", "-Tutf8", "-P", "cat", page});
     ASSERT_TRUE(process.waitForFinished(60000));
     EXPECT_EQ(process.exitCode(), 0);
-    EXPECT_EQ(process.readAllStandardError(), "");
-    EXPECT_THAT(process.readAllStandardOutput().toStdString(), HasSubstr("EXIT STATUS"));
+    EXPECT_EQ(process.readAllStandardError().toStdString(), "");
+    EXPECT_THAT(process.readAllStandardOutput().toStdString(), HasSubstr("All well."));
 }

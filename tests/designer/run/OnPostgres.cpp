@@ -88,7 +88,7 @@ TEST_F(OnPostgres, EndsAtTheLimit) {
 TEST_F(OnPostgres, TakesParameters) {
     const auto query = draw(serverAddress(), {"numbers"}, {{"numbers.n", {"< :top"}}});
     const auto text = designer::statementFor(*query, Dialect::PostgreSQL, {});
-    const auto command = makeCommand(text, Dialect::PostgreSQL, {{"top", "2.5"}}, {});
+    const auto command = designer::makeCommand(text, Dialect::PostgreSQL, {{"top", "2.5"}}, {});
     EXPECT_EQ(fetch(command).end, Outcome::End::complete);
     EXPECT_EQ(keeper.rows, QStringList({"n:0", "n:1", "n:2"}));
 }

@@ -23,7 +23,8 @@ protected:
                                 {{"stock.quantity", {"< :most"}},
                                  {"stock.reorder_level", {"> :most"}},
                                  {"products.name", {"= [Which product?]"}}});
-        dialog.emplace(designer::questions(designer::statementFor(*query, Dialect::SQLite, {})), answers);
+        dialog.emplace(designer::questions(designer::statementFor(*query, Dialect::SQLite, {})),
+                       answers);
         dialog->show();
     }
     QLineEdit& field(const QString& name) { return *dialog->findChild<QLineEdit*>(name); }
