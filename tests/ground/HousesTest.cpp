@@ -205,3 +205,18 @@ TEST(TheReaderOfSources, SeesIncludesOfBothForms) {
     EXPECT_EQ(includes[1].name, "gtest/gtest.h");
     EXPECT_TRUE(includes[1].angled);
 }
+
+TEST(ASourceWithAHeaderOfItsName, IncludesThatFirst) {
+    // So the header is compiled with nothing before it that it could lean on.
+    std::size_t pairs = 0;
+    for (const std::string& file : sources::below("src")) {
+        if (!file.ends_with(".cpp")) continue;
+        const std::string header = file.substr(0, file.size() - 3) + "h";
+        if (!std::filesystem::exists(sources::root() / header)) continue;
+        ++pairs;
+        const auto includes = sources::includesOf(file);
+        ASSERT_FALSE(includes.empty()) << file;
+        EXPECT_EQ("src/" + includes.front().name, header) << file;
+    }
+    EXPECT_GT(pairs, 100U);
+}

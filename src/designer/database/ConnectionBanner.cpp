@@ -24,7 +24,6 @@ ConnectionBanner::ConnectionBanner(Database& database, QWidget* parent)
     mText->setTextInteractionFlags(Qt::TextSelectableByMouse);
     auto* const again = new QPushButton(tr("&Reconnect"));
     again->setObjectName(QStringLiteral("reconnect"));
-    again->setPalette(parent ? parent->palette() : QPalette());
     auto* const close = new QToolButton;
     close->setObjectName(QStringLiteral("close"));
     close->setAutoRaise(true);

@@ -90,15 +90,24 @@ constexpr const char* messages[] = {
     QT_TRANSLATE_NOOP("Model", "There is no file \"%1\"; check the path."),
     QT_TRANSLATE_NOOP("Model", "\"%1\" is a folder; choose a database file in it."),
     QT_TRANSLATE_NOOP("Model", "\"%1\" is a device, not a file; choose a database file."),
-    QT_TRANSLATE_NOOP("Model", "The file \"%1\" cannot be read (%2); ask its owner for permission."),
+    QT_TRANSLATE_NOOP("Model",
+                      "The file \"%1\" cannot be read (%2); ask its owner for permission."),
     QT_TRANSLATE_NOOP("Model", "The file \"%1\" is empty; choose a file that holds a database."),
-    QT_TRANSLATE_NOOP("Model", "The file \"%1\" is not an SQLite database, or it is encrypted; choose another file."),
-    QT_TRANSLATE_NOOP("Model", "The Qt driver for %1 is missing; install it (Debian: apt install %2)."),
-    QT_TRANSLATE_NOOP("Model", "The list of tables cannot be read (the connection is closed): open the database afresh."),
-    QT_TRANSLATE_NOOP("Model", "The table \"%1\" is not in the database; read the list of tables afresh."),
+    QT_TRANSLATE_NOOP(
+        "Model",
+        "The file \"%1\" is not an SQLite database, or it is encrypted; choose another file."),
+    QT_TRANSLATE_NOOP("Model",
+                      "The Qt driver for %1 is missing; install it (Debian: apt install %2)."),
+    QT_TRANSLATE_NOOP(
+        "Model",
+        "The list of tables cannot be read (the connection is closed): open the database afresh."),
+    QT_TRANSLATE_NOOP("Model",
+                      "The table \"%1\" is not in the database; read the list of tables afresh."),
     QT_TRANSLATE_NOOP("Model", "The address has an unknown option \"%1\"; known are %2 and host."),
-    QT_TRANSLATE_NOOP("Model", "The option %1 of the address has a semicolon in it; use a value without one."),
-    QT_TRANSLATE_NOOP("Model", "The address of the database cannot be read; write it like %1, with %XX for a character that means something else there."),
+    QT_TRANSLATE_NOOP(
+        "Model", "The option %1 of the address has a semicolon in it; use a value without one."),
+    QT_TRANSLATE_NOOP("Model", "The address of the database cannot be read; write it like %1, with "
+                               "%XX for a character that means something else there."),
     QT_TRANSLATE_NOOP("Model", "There is no kind of database \"%1\"; write it like %2."),
     // what failed (what the engine said): what to do
     QT_TRANSLATE_NOOP("Model", "%1 (%2): %3."),
@@ -117,9 +126,14 @@ constexpr const char* messages[] = {
     QT_TRANSLATE_NOOP("Model", "ask the owner for permission"),
     QT_TRANSLATE_NOOP("Model", "check the user name"),
     QT_TRANSLATE_NOOP("Model", "open the database afresh"),
+    QT_TRANSLATE_NOOP("Model", "another program is writing to it; try again in a moment"),
+    QT_TRANSLATE_NOOP("Model", "see that you may read the file and its folder; a database in WAL "
+                               "mode also needs permission to write to the folder"),
+    QT_TRANSLATE_NOOP("Model", "the file is damaged; restore it from a copy"),
+    QT_TRANSLATE_NOOP("Model", "it is damaged or encrypted; choose another file"),
 };
 
-/// Whether the last of what was put into a message is a message of its own.
+/// Whether what was put into a message may be messages of their own.
 bool nests(QLatin1String english) {
     return english.endsWith(QLatin1String(": %3.")) || english.endsWith(QLatin1String("holds %1"));
 }
@@ -169,7 +183,8 @@ QString inWords(const QString& message) {
         const auto match = shape.match(message);
         if (!match.hasMatch()) continue;
         QStringList texts = match.capturedTexts().mid(1);
-        if (nests(QLatin1String(english))) texts.last() = inWords(texts.last());
+        if (nests(QLatin1String(english)))
+            for (QString& text : texts) text = inWords(text);
         return filled(QCoreApplication::translate("Model", english), texts);
     }
     return message;

@@ -536,6 +536,138 @@
         <source>Is Null, a column or a parameter</source>
         <translation>Is Null, eine Spalte oder ein Parameter</translation>
     </message>
+    <message>
+        <source>There is no file &quot;%1&quot;; check the path.</source>
+        <translation>Es gibt keine Datei „%1“; prüfen Sie den Pfad.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a folder; choose a database file in it.</source>
+        <translation>„%1“ ist ein Ordner; wählen Sie eine Datenbankdatei darin.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a device, not a file; choose a database file.</source>
+        <translation>„%1“ ist ein Gerät, keine Datei; wählen Sie eine Datenbankdatei.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read (%2); ask its owner for permission.</source>
+        <translation>Die Datei „%1“ kann nicht gelesen werden (%2); bitten Sie ihren Eigentümer um die Erlaubnis.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is empty; choose a file that holds a database.</source>
+        <translation>Die Datei „%1“ ist leer; wählen Sie eine, die eine Datenbank enthält.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is not an SQLite database, or it is encrypted; choose another file.</source>
+        <translation>Die Datei „%1“ ist keine SQLite-Datenbank oder ist verschlüsselt; wählen Sie eine andere.</translation>
+    </message>
+    <message>
+        <source>The Qt driver for %1 is missing; install it (Debian: apt install %2).</source>
+        <translation>Der Qt-Treiber für %1 fehlt; installieren Sie ihn (Debian: apt install %2).</translation>
+    </message>
+    <message>
+        <source>The list of tables cannot be read (the connection is closed): open the database afresh.</source>
+        <translation>Die Liste der Tabellen kann nicht gelesen werden (die Verbindung ist geschlossen): Öffnen Sie die Datenbank neu.</translation>
+    </message>
+    <message>
+        <source>The table &quot;%1&quot; is not in the database; read the list of tables afresh.</source>
+        <translation>Die Tabelle „%1“ ist nicht in der Datenbank; lesen Sie die Liste der Tabellen neu.</translation>
+    </message>
+    <message>
+        <source>The address has an unknown option &quot;%1&quot;; known are %2 and host.</source>
+        <translation>Die Adresse hat eine unbekannte Option „%1“; bekannt sind %2 und host.</translation>
+    </message>
+    <message>
+        <source>The option %1 of the address has a semicolon in it; use a value without one.</source>
+        <translation>Die Option %1 der Adresse enthält ein Semikolon; nehmen Sie einen Wert ohne.</translation>
+    </message>
+    <message>
+        <source>The address of the database cannot be read; write it like %1, with %XX for a character that means something else there.</source>
+        <translation>Die Adresse der Datenbank kann nicht gelesen werden; schreiben Sie sie wie %1, mit %XX für ein Zeichen, das dort etwas anderes bedeutet.</translation>
+    </message>
+    <message>
+        <source>There is no kind of database &quot;%1&quot;; write it like %2.</source>
+        <translation>Eine Art von Datenbank „%1“ gibt es nicht; schreiben Sie wie %2.</translation>
+    </message>
+    <message>
+        <source>%1 (%2): %3.</source>
+        <translation>%1 (%2): %3.</translation>
+    </message>
+    <message>
+        <source>The database %1 cannot be opened</source>
+        <translation>Die Datenbank %1 kann nicht geöffnet werden</translation>
+    </message>
+    <message>
+        <source>The list of tables cannot be read</source>
+        <translation>Die Liste der Tabellen kann nicht gelesen werden</translation>
+    </message>
+    <message>
+        <source>The table &quot;%1&quot; cannot be read</source>
+        <translation>Die Tabelle „%1“ kann nicht gelesen werden</translation>
+    </message>
+    <message>
+        <source>The primary key of &quot;%1&quot; cannot be read</source>
+        <translation>Der Primärschlüssel von „%1“ kann nicht gelesen werden</translation>
+    </message>
+    <message>
+        <source>The foreign keys of &quot;%1&quot; cannot be read</source>
+        <translation>Die Fremdschlüssel von „%1“ können nicht gelesen werden</translation>
+    </message>
+    <message>
+        <source>give a password</source>
+        <translation>geben Sie ein Passwort an</translation>
+    </message>
+    <message>
+        <source>check the user name and the password</source>
+        <translation>prüfen Sie Benutzernamen und Passwort</translation>
+    </message>
+    <message>
+        <source>ask the server&apos;s administrator to let you in</source>
+        <translation>bitten Sie den Administrator des Servers um Zugang</translation>
+    </message>
+    <message>
+        <source>check the name of the host</source>
+        <translation>prüfen Sie den Namen des Servers</translation>
+    </message>
+    <message>
+        <source>see that the server runs, and check host and port</source>
+        <translation>sehen Sie nach, ob der Server läuft, und prüfen Sie Server und Port</translation>
+    </message>
+    <message>
+        <source>see that the server can be reached, and check host and port</source>
+        <translation>sehen Sie nach, ob der Server erreichbar ist, und prüfen Sie Server und Port</translation>
+    </message>
+    <message>
+        <source>check the name of the database</source>
+        <translation>prüfen Sie den Namen der Datenbank</translation>
+    </message>
+    <message>
+        <source>ask the owner for permission</source>
+        <translation>bitten Sie den Eigentümer um die Erlaubnis</translation>
+    </message>
+    <message>
+        <source>check the user name</source>
+        <translation>prüfen Sie den Benutzernamen</translation>
+    </message>
+    <message>
+        <source>open the database afresh</source>
+        <translation>öffnen Sie die Datenbank neu</translation>
+    </message>
+    <message>
+        <source>another program is writing to it; try again in a moment</source>
+        <translation>ein anderes Programm schreibt gerade hinein; versuchen Sie es gleich noch einmal</translation>
+    </message>
+    <message>
+        <source>see that you may read the file and its folder; a database in WAL mode also needs permission to write to the folder</source>
+        <translation>sehen Sie nach, ob Sie die Datei und ihren Ordner lesen dürfen; eine Datenbank im WAL-Modus braucht auch das Recht, in den Ordner zu schreiben</translation>
+    </message>
+    <message>
+        <source>the file is damaged; restore it from a copy</source>
+        <translation>die Datei ist beschädigt; stellen Sie sie aus einer Kopie wieder her</translation>
+    </message>
+    <message>
+        <source>it is damaged or encrypted; choose another file</source>
+        <translation>sie ist beschädigt oder verschlüsselt; wählen Sie eine andere Datei</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -854,6 +986,10 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     <message>
         <source>Tables: %1   Joins: %2</source>
         <translation>Tabellen: %1   Verknüpfungen: %2</translation>
+    </message>
+    <message>
+        <source>&amp;Dark colours</source>
+        <translation>&amp;Dunkle Farben</translation>
     </message>
 </context>
 <context>

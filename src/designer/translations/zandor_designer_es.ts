@@ -536,6 +536,138 @@
         <source>Is Null, a column or a parameter</source>
         <translation>Is Null, una columna o un parámetro</translation>
     </message>
+    <message>
+        <source>There is no file &quot;%1&quot;; check the path.</source>
+        <translation>No existe el archivo «%1»; compruebe la ruta.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a folder; choose a database file in it.</source>
+        <translation>«%1» es una carpeta; elija en ella un archivo de base de datos.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a device, not a file; choose a database file.</source>
+        <translation>«%1» es un dispositivo, no un archivo; elija un archivo de base de datos.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read (%2); ask its owner for permission.</source>
+        <translation>No se puede leer el archivo «%1» (%2); pida permiso a su propietario.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is empty; choose a file that holds a database.</source>
+        <translation>El archivo «%1» está vacío; elija uno que contenga una base de datos.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is not an SQLite database, or it is encrypted; choose another file.</source>
+        <translation>El archivo «%1» no es una base de datos SQLite, o está cifrado; elija otro.</translation>
+    </message>
+    <message>
+        <source>The Qt driver for %1 is missing; install it (Debian: apt install %2).</source>
+        <translation>Falta el controlador de Qt para %1; instálelo (Debian: apt install %2).</translation>
+    </message>
+    <message>
+        <source>The list of tables cannot be read (the connection is closed): open the database afresh.</source>
+        <translation>No se puede leer la lista de tablas (la conexión está cerrada): vuelva a abrir la base de datos.</translation>
+    </message>
+    <message>
+        <source>The table &quot;%1&quot; is not in the database; read the list of tables afresh.</source>
+        <translation>La tabla «%1» no está en la base de datos; vuelva a leer la lista de tablas.</translation>
+    </message>
+    <message>
+        <source>The address has an unknown option &quot;%1&quot;; known are %2 and host.</source>
+        <translation>La dirección tiene una opción desconocida «%1»; se conocen %2 y host.</translation>
+    </message>
+    <message>
+        <source>The option %1 of the address has a semicolon in it; use a value without one.</source>
+        <translation>La opción %1 de la dirección contiene un punto y coma; use un valor sin él.</translation>
+    </message>
+    <message>
+        <source>The address of the database cannot be read; write it like %1, with %XX for a character that means something else there.</source>
+        <translation>No se puede leer la dirección de la base de datos; escríbala como %1, con %XX para un carácter que ahí significa otra cosa.</translation>
+    </message>
+    <message>
+        <source>There is no kind of database &quot;%1&quot;; write it like %2.</source>
+        <translation>No existe el tipo de base de datos «%1»; escriba como %2.</translation>
+    </message>
+    <message>
+        <source>%1 (%2): %3.</source>
+        <translation>%1 (%2): %3.</translation>
+    </message>
+    <message>
+        <source>The database %1 cannot be opened</source>
+        <translation>No se puede abrir la base de datos %1</translation>
+    </message>
+    <message>
+        <source>The list of tables cannot be read</source>
+        <translation>No se puede leer la lista de tablas</translation>
+    </message>
+    <message>
+        <source>The table &quot;%1&quot; cannot be read</source>
+        <translation>No se puede leer la tabla «%1»</translation>
+    </message>
+    <message>
+        <source>The primary key of &quot;%1&quot; cannot be read</source>
+        <translation>No se puede leer la clave primaria de «%1»</translation>
+    </message>
+    <message>
+        <source>The foreign keys of &quot;%1&quot; cannot be read</source>
+        <translation>No se pueden leer las claves externas de «%1»</translation>
+    </message>
+    <message>
+        <source>give a password</source>
+        <translation>indique una contraseña</translation>
+    </message>
+    <message>
+        <source>check the user name and the password</source>
+        <translation>compruebe el usuario y la contraseña</translation>
+    </message>
+    <message>
+        <source>ask the server&apos;s administrator to let you in</source>
+        <translation>pida acceso al administrador del servidor</translation>
+    </message>
+    <message>
+        <source>check the name of the host</source>
+        <translation>compruebe el nombre del servidor</translation>
+    </message>
+    <message>
+        <source>see that the server runs, and check host and port</source>
+        <translation>vea si el servidor está en marcha y compruebe servidor y puerto</translation>
+    </message>
+    <message>
+        <source>see that the server can be reached, and check host and port</source>
+        <translation>vea si se puede acceder al servidor y compruebe servidor y puerto</translation>
+    </message>
+    <message>
+        <source>check the name of the database</source>
+        <translation>compruebe el nombre de la base de datos</translation>
+    </message>
+    <message>
+        <source>ask the owner for permission</source>
+        <translation>pida permiso al propietario</translation>
+    </message>
+    <message>
+        <source>check the user name</source>
+        <translation>compruebe el usuario</translation>
+    </message>
+    <message>
+        <source>open the database afresh</source>
+        <translation>vuelva a abrir la base de datos</translation>
+    </message>
+    <message>
+        <source>another program is writing to it; try again in a moment</source>
+        <translation>otro programa está escribiendo en ella; inténtelo de nuevo en un momento</translation>
+    </message>
+    <message>
+        <source>see that you may read the file and its folder; a database in WAL mode also needs permission to write to the folder</source>
+        <translation>vea si puede leer el archivo y su carpeta; una base de datos en modo WAL necesita además permiso para escribir en la carpeta</translation>
+    </message>
+    <message>
+        <source>the file is damaged; restore it from a copy</source>
+        <translation>el archivo está dañado; restáurelo desde una copia</translation>
+    </message>
+    <message>
+        <source>it is damaged or encrypted; choose another file</source>
+        <translation>está dañado o cifrado; elija otro archivo</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -854,6 +986,10 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     <message>
         <source>Tables: %1   Joins: %2</source>
         <translation>Tablas: %1   Combinaciones: %2</translation>
+    </message>
+    <message>
+        <source>&amp;Dark colours</source>
+        <translation>Colores &amp;oscuros</translation>
     </message>
 </context>
 <context>

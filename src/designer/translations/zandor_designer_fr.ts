@@ -536,6 +536,138 @@
         <source>Is Null, a column or a parameter</source>
         <translation>Is Null, une colonne ou un paramètre</translation>
     </message>
+    <message>
+        <source>There is no file &quot;%1&quot;; check the path.</source>
+        <translation>Il n’y a pas de fichier « %1 » ; vérifiez le chemin.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a folder; choose a database file in it.</source>
+        <translation>« %1 » est un dossier ; choisissez-y un fichier de base de données.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a device, not a file; choose a database file.</source>
+        <translation>« %1 » est un périphérique, pas un fichier ; choisissez un fichier de base de données.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read (%2); ask its owner for permission.</source>
+        <translation>Le fichier « %1 » ne peut pas être lu (%2) ; demandez l’autorisation à son propriétaire.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is empty; choose a file that holds a database.</source>
+        <translation>Le fichier « %1 » est vide ; choisissez un fichier qui contient une base de données.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is not an SQLite database, or it is encrypted; choose another file.</source>
+        <translation>Le fichier « %1 » n’est pas une base de données SQLite, ou il est chiffré ; choisissez-en un autre.</translation>
+    </message>
+    <message>
+        <source>The Qt driver for %1 is missing; install it (Debian: apt install %2).</source>
+        <translation>Le pilote Qt pour %1 manque ; installez-le (Debian : apt install %2).</translation>
+    </message>
+    <message>
+        <source>The list of tables cannot be read (the connection is closed): open the database afresh.</source>
+        <translation>La liste des tables ne peut pas être lue (la connexion est fermée) : rouvrez la base de données.</translation>
+    </message>
+    <message>
+        <source>The table &quot;%1&quot; is not in the database; read the list of tables afresh.</source>
+        <translation>La table « %1 » n’est pas dans la base de données ; relisez la liste des tables.</translation>
+    </message>
+    <message>
+        <source>The address has an unknown option &quot;%1&quot;; known are %2 and host.</source>
+        <translation>L’adresse contient une option inconnue « %1 » ; sont connues %2 et host.</translation>
+    </message>
+    <message>
+        <source>The option %1 of the address has a semicolon in it; use a value without one.</source>
+        <translation>L’option %1 de l’adresse contient un point-virgule ; utilisez une valeur sans.</translation>
+    </message>
+    <message>
+        <source>The address of the database cannot be read; write it like %1, with %XX for a character that means something else there.</source>
+        <translation>L’adresse de la base de données est illisible ; écrivez-la comme %1, avec %XX pour un caractère qui a un autre sens à cet endroit.</translation>
+    </message>
+    <message>
+        <source>There is no kind of database &quot;%1&quot;; write it like %2.</source>
+        <translation>Il n’y a pas de type de base de données « %1 » ; écrivez comme %2.</translation>
+    </message>
+    <message>
+        <source>%1 (%2): %3.</source>
+        <translation>%1 (%2) : %3.</translation>
+    </message>
+    <message>
+        <source>The database %1 cannot be opened</source>
+        <translation>La base de données %1 ne peut pas être ouverte</translation>
+    </message>
+    <message>
+        <source>The list of tables cannot be read</source>
+        <translation>La liste des tables ne peut pas être lue</translation>
+    </message>
+    <message>
+        <source>The table &quot;%1&quot; cannot be read</source>
+        <translation>La table « %1 » ne peut pas être lue</translation>
+    </message>
+    <message>
+        <source>The primary key of &quot;%1&quot; cannot be read</source>
+        <translation>La clé primaire de « %1 » ne peut pas être lue</translation>
+    </message>
+    <message>
+        <source>The foreign keys of &quot;%1&quot; cannot be read</source>
+        <translation>Les clés étrangères de « %1 » ne peuvent pas être lues</translation>
+    </message>
+    <message>
+        <source>give a password</source>
+        <translation>donnez un mot de passe</translation>
+    </message>
+    <message>
+        <source>check the user name and the password</source>
+        <translation>vérifiez le nom d’utilisateur et le mot de passe</translation>
+    </message>
+    <message>
+        <source>ask the server&apos;s administrator to let you in</source>
+        <translation>demandez l’accès à l’administrateur du serveur</translation>
+    </message>
+    <message>
+        <source>check the name of the host</source>
+        <translation>vérifiez le nom du serveur</translation>
+    </message>
+    <message>
+        <source>see that the server runs, and check host and port</source>
+        <translation>assurez-vous que le serveur fonctionne, et vérifiez le serveur et le port</translation>
+    </message>
+    <message>
+        <source>see that the server can be reached, and check host and port</source>
+        <translation>assurez-vous que le serveur est accessible, et vérifiez le serveur et le port</translation>
+    </message>
+    <message>
+        <source>check the name of the database</source>
+        <translation>vérifiez le nom de la base de données</translation>
+    </message>
+    <message>
+        <source>ask the owner for permission</source>
+        <translation>demandez l’autorisation au propriétaire</translation>
+    </message>
+    <message>
+        <source>check the user name</source>
+        <translation>vérifiez le nom d’utilisateur</translation>
+    </message>
+    <message>
+        <source>open the database afresh</source>
+        <translation>rouvrez la base de données</translation>
+    </message>
+    <message>
+        <source>another program is writing to it; try again in a moment</source>
+        <translation>un autre programme y écrit ; réessayez dans un instant</translation>
+    </message>
+    <message>
+        <source>see that you may read the file and its folder; a database in WAL mode also needs permission to write to the folder</source>
+        <translation>assurez-vous de pouvoir lire le fichier et son dossier ; une base de données en mode WAL exige aussi le droit d’écrire dans le dossier</translation>
+    </message>
+    <message>
+        <source>the file is damaged; restore it from a copy</source>
+        <translation>le fichier est endommagé ; restaurez-le à partir d’une copie</translation>
+    </message>
+    <message>
+        <source>it is damaged or encrypted; choose another file</source>
+        <translation>il est endommagé ou chiffré ; choisissez un autre fichier</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -805,7 +937,7 @@
     </message>
     <message>
         <source>&amp;Help</source>
-        <translation>&amp;Aide</translation>
+        <translation>A&amp;ide</translation>
     </message>
     <message>
         <source>&amp;About</source>
@@ -854,6 +986,10 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <message>
         <source>Tables: %1   Joins: %2</source>
         <translation>Tables : %1   Jointures : %2</translation>
+    </message>
+    <message>
+        <source>&amp;Dark colours</source>
+        <translation>Couleurs &amp;sombres</translation>
     </message>
 </context>
 <context>
@@ -1322,7 +1458,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <name>designer::ShowCommands</name>
     <message>
         <source>&amp;Export drawing…</source>
-        <translation>&amp;Exporter le dessin…</translation>
+        <translation>E&amp;xporter le dessin…</translation>
     </message>
     <message>
         <source>&amp;Print…</source>

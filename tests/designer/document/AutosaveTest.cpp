@@ -155,7 +155,8 @@ TEST_F(AnAutosave, TellsOnceThatItCannotWrite) {
 TEST_F(AnAutosave, OfARunningDesignerIsNotTaken) {
     const auto other = designerAtWork(QStringLiteral("stock"));
     EXPECT_EQ(AutosaveSlot::abandoned(folder()).size(), 0u);
-    EXPECT_FALSE(designer::offerRecovery(file, *started(), folder(), nullptr)) << "no question";
+    const Answering noQuestion({});
+    EXPECT_FALSE(designer::offerRecovery(file, *started(), folder(), nullptr));
     kill(*other);
 }
 
@@ -213,6 +214,7 @@ TEST_F(AnAutosave, ThatCannotBeReadIsNotOffered) {
     QFile broken(QDir(folder()).filePath(QStringLiteral("x.autosave")));
     ASSERT_TRUE(broken.open(QIODevice::WriteOnly) && broken.write("{\"query\": \"") > 0);
     broken.close();
+    const Answering noQuestion({});
     EXPECT_FALSE(designer::offerRecovery(file, *started(), folder(), nullptr));
     EXPECT_EQ(saved().size(), 0);
 }

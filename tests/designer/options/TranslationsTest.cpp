@@ -69,7 +69,13 @@ QStringList sortedMatches(const QString& text, const QString& pattern) {
 
 class TheTranslations : public testing::TestWithParam<const char*> {
 protected:
-    const std::vector<Message> messages = messagesIn(pathOf(QString::fromLatin1(GetParam())));
+    TheTranslations() : messages(messagesIn(pathOf(QString::fromLatin1(GetParam())))) {
+        for (const Message& message : messages)
+            if (message.state.isEmpty()) finished.push_back(message);
+    }
+
+    const std::vector<Message> messages;
+    std::vector<Message> finished;
 };
 
 } // namespace
@@ -77,16 +83,16 @@ protected:
 TEST_P(TheTranslations, AreFinished) {
     EXPECT_FALSE(messages.empty());
     for (const Message& message : messages) {
-        EXPECT_EQ(message.state, "")
+        EXPECT_EQ(message.state.toStdString(), "")
             << message.context.toStdString() << ": " << message.source.toStdString();
         EXPECT_FALSE(message.translations.isEmpty()) << message.source.toStdString();
         for (const QString& text : message.translations)
-            EXPECT_NE(text, "") << message.source.toStdString();
+            EXPECT_FALSE(text.isEmpty()) << message.source.toStdString();
     }
 }
 
 TEST_P(TheTranslations, HaveThePlaceholdersOfTheirSource) {
-    for (const Message& message : messages)
+    for (const Message& message : finished)
         for (const QString& text : message.translations)
             EXPECT_EQ(sortedMatches(text, "%(L?\\d|n)"),
                       sortedMatches(message.source, "%(L?\\d|n)"))
@@ -95,7 +101,7 @@ TEST_P(TheTranslations, HaveThePlaceholdersOfTheirSource) {
 }
 
 TEST_P(TheTranslations, HaveTheMnemonicsOfTheirSource) {
-    for (const Message& message : messages)
+    for (const Message& message : finished)
         for (const QString& text : message.translations)
             EXPECT_EQ(sortedMatches(text, "&(?=[\\p{L}\\d])").size(),
                       sortedMatches(message.source, "&(?=[\\p{L}\\d])").size())
@@ -104,7 +110,7 @@ TEST_P(TheTranslations, HaveTheMnemonicsOfTheirSource) {
 }
 
 TEST_P(TheTranslations, EndAsTheirSourceDoes) {
-    for (const Message& message : messages) {
+    for (const Message& message : finished) {
         if (message.source.size() < 4) continue; // an abbreviation
         for (const QString& text : message.translations)
             for (const char16_t end : {u'.', u':', u'\u2026', u'\n', u'?'})

@@ -2,6 +2,7 @@
 
 #include "model/Query.h"
 
+#include <QMap>
 #include <QProcess>
 #include <QStringList>
 

@@ -26,14 +26,14 @@ public:
 
 /// What the sources of a folder say in texts of their own that begin in a certain way.
 QStringList textsOf(const QString& folder, const QString& beginning) {
-    const QRegularExpression texts("u\"(" + beginning + "[^\"\\\\]*)");
+    const QRegularExpression texts("[u({ ]\"(" + beginning + "[^\"\\\\]*)");
     QStringList result;
     QDirIterator files(QStringLiteral(SOURCE_ROOT "/src/model/") + folder, {"*.cpp"});
     while (files.hasNext()) {
         QFile file(files.next());
         EXPECT_TRUE(file.open(QIODevice::ReadOnly));
         QString source = QString::fromUtf8(file.readAll());
-        source.replace(QRegularExpression("\"\\s*u\""), ""); // a text in two pieces
+        source.replace(QRegularExpression("\"\\s*u?\""), ""); // a text in two pieces
         for (auto all = texts.globalMatch(source); all.hasNext();) result << all.next().captured(1);
     }
     return result;
@@ -66,6 +66,16 @@ TEST(TheModelsWords, AreTranslatedWithinOneAnother) {
               "<a.b: At character 1: <expected a column that holds <a text>>.>");
 }
 
+TEST(TheModelsWords, AreTranslatedAroundWhatTheEngineSays) {
+    const Marking translations;
+    EXPECT_EQ(
+        inWords("The database \"a.db\" cannot be opened (Connection refused (111)): check the "
+                "name of the host.")
+            .toStdString(),
+        "<<The database \"a.db\" cannot be opened> (Connection refused (111)): <check the name "
+        "of the host>.>");
+}
+
 TEST(TheModelsWords, KeepNamesThatLookLikePlaceholders) {
     EXPECT_EQ(inWords("No join connects %2 with %1: every row of one comes with every row of the "
                       "other.")
@@ -85,6 +95,8 @@ TEST(TheModelsWords, AreAllKnown) {
         if (text.endsWith(", as in [")) text.chop(1); // the names in brackets are put in
         EXPECT_TRUE(isKnown(text)) << text.toStdString();
     }
+    for (const QString& text : textsOf("reader", "(open|check|see that|ask|give|the file) "))
+        EXPECT_TRUE(isKnown(text)) << text.toStdString();
     const QStringList sentences =
         textsOf("sql", "(The|An|Two|No|SQLite|PostgreSQL|MySQL/MariaDB) ");
     EXPECT_GE(sentences.size(), 9);
