@@ -20,9 +20,10 @@ bool hasAny(const QStringList& arguments, const QStringList& options) {
 reader::Result<Arguments> readArguments(const QStringList& arguments) {
     QCommandLineParser parser;
     const QCommandLineOption tables(QStringLiteral("tables"), {}, QStringLiteral("names"));
-    const QCommandLineOption picture(QStringLiteral("picture"), {}, QStringLiteral("file"));
+    const QCommandLineOption screenshot(QStringLiteral("screenshot"), {}, QStringLiteral("file"));
+    const QCommandLineOption picture(QStringLiteral("picture"), {}, QStringLiteral("query"));
     const QCommandLineOption dark(QStringLiteral("dark"));
-    parser.addOptions({tables, picture, dark});
+    parser.addOptions({tables, screenshot, picture, dark});
     parser.addOptions(shell::options());
     // The parser takes the first argument for the program's name.
     if (!parser.parse(QStringList(QStringLiteral("zandor-designer")) + arguments))
@@ -41,15 +42,26 @@ reader::Result<Arguments> readArguments(const QStringList& arguments) {
     if (parser.isSet(tables) && result.tables.isEmpty())
         return reader::Error{
             QStringLiteral("--tables names no table; write --tables customers,orders.")};
-    result.picture = parser.value(picture);
-    if (parser.isSet(picture) && result.picture.isEmpty())
-        return reader::Error{QStringLiteral("--picture names no file; write --picture query.png.")};
+    result.screenshot = parser.value(screenshot);
+    if (parser.isSet(screenshot) && result.screenshot.isEmpty())
+        return reader::Error{
+            QStringLiteral("--screenshot names no file; write --screenshot window.png.")};
+    if (parser.isSet(picture)) {
+        result.drawing = parser.value(picture);
+        result.picture = std::exchange(result.file, {});
+        if (result.drawing.isEmpty() || result.picture.isEmpty())
+            return reader::Error{
+                QStringLiteral("--picture takes two files; write --picture query.json out.svg.")};
+        if (!result.tables.isEmpty() || !result.screenshot.isEmpty())
+            return reader::Error{
+                QStringLiteral("--picture opens no window; leave out what is for one.")};
+    }
     result.dark = parser.isSet(dark);
     const auto task = shell::taskOf(parser);
     if (!task) return reader::Error{task.error()};
     result.task = *task;
-    const bool window =
-        !result.file.isEmpty() || !result.tables.isEmpty() || !result.picture.isEmpty();
+    const bool window = !result.file.isEmpty() || !result.tables.isEmpty() ||
+                        !result.screenshot.isEmpty() || !result.picture.isEmpty();
     if (result.task && window)
         return reader::Error{
             QStringLiteral("--sql and --run open no window; leave out what is for one.")};
@@ -65,7 +77,7 @@ bool asksForVersion(const QStringList& arguments) {
 }
 
 bool asksForPicture(const QStringList& arguments) {
-    return hasAny(arguments, {QStringLiteral("--picture")});
+    return hasAny(arguments, {QStringLiteral("--picture"), QStringLiteral("--screenshot")});
 }
 
 bool asksForTask(const QStringList& arguments) {
@@ -73,21 +85,45 @@ bool asksForTask(const QStringList& arguments) {
 }
 
 QString helpText() {
-    return QStringLiteral(R"(Usage: zandor-designer [options] [FILE]
-Designs a query over the tables of an SQLite database, which is only read.
+    return QStringLiteral(R"(Usage: zandor-designer [options] [FILE|ADDRESS|QUERY]
+       zandor-designer --picture QUERY OUT
+       zandor-designer --sql QUERY [--dialect NAME]
+       zandor-designer --run QUERY [--format csv|json] [--database ADDRESS]
+                       [--limit N] [--set NAME=VALUE]...
+Designs a query over the tables of a database, which is only read: an SQLite
+file, an address like postgresql://user@host/database, or the file of a query.
 
-Without FILE the sample database is opened, with a small query to look at.
+Without any of them the sample database is opened, with a small query to look
+at.
 
 Options:
   --tables NAMES   the tables to show, with commas between them; otherwise
                    the first 16 in the order of their names
-  --picture FILE   draw the window into a picture (PNG) and end
+  --screenshot FILE
+                   draw the window into a picture (PNG) and end
   --dark           dark colours, whatever the desktop uses
+
+Without a window, over a file of a query:
+  --picture QUERY OUT
+                   draw its tables and joins into OUT, a picture by its name:
+                   .png, .svg or .pdf
+  --sql QUERY      print the statement
+  --dialect NAME   for sqlite, postgresql, mysql, sqlserver or standard;
+                   otherwise for the query's database
+  --run QUERY      run it and print the rows; nothing is ever changed
+  --format NAME    csv (otherwise) or json; blobs are in Base64
+  --database ADDRESS
+                   an SQLite file or postgresql://user@host:port/database,
+                   instead of the one in the file; a password comes from
+                   PGPASSWORD or is asked for on the terminal
+  --limit N        no more than N rows
+  --set NAME=VALUE the value of a parameter
+
   --help, -h       show this
   --version, -v    show the version
 
-Exit codes: 0 all well, 1 the picture could not be written, 2 the arguments
-or the database cannot be used.
+Exit codes: 0 all well, 1 the picture could not be written or the query
+not be run, 2 the arguments, a file or the database cannot be used.
 )");
 }
 

@@ -10,7 +10,9 @@ namespace designer {
 struct Arguments {
     QString file = {};       ///< empty: the sample database
     QStringList tables = {}; ///< empty: the designer chooses
-    QString picture = {}; ///< a file to draw the window into instead of staying open; may be empty
+    QString screenshot = {}; ///< a file to draw the window into instead of staying open
+    QString drawing = {};    ///< a query's file whose drawing is to be put into `picture`
+    QString picture = {};
     bool dark = false;
     std::optional<shell::Task> task = {}; ///< to be done instead of opening a window
 };
@@ -18,7 +20,7 @@ struct Arguments {
 /// Reads the arguments behind the program's name.
 reader::Result<Arguments> readArguments(const QStringList& arguments);
 
-// Known before there is an application: help, the version and a task need no screen, a picture none
+// Known before there is an application: help, the version and a task need no screen, pictures none
 // that anybody sees.
 bool asksForHelp(const QStringList& arguments);
 bool asksForVersion(const QStringList& arguments);

@@ -198,6 +198,7 @@ void DesignerWindow::connectParts() {
     connect(mTables, &TablesPanel::chosen, mAdding,
             [this](const std::vector<reader::TableId>& tables) { mAdding->add(tables); });
     connect(target, &TableDropTarget::dropped, mAdding, &TableAdding::add);
+    connect(mAdding, &TableAdding::added, this, &DesignerWindow::showTable);
     connect(mAdding, &TableAdding::refused, this,
             [this](const QString& why) { QMessageBox::warning(this, tr("Add tables"), why); });
 
@@ -270,6 +271,17 @@ void DesignerWindow::dropEvent(QDropEvent* event) {
     // After the drop, for there may be questions.
     QMetaObject::invokeMethod(
         mDatabases, [this, path] { mDatabases->openAddress(*path); }, Qt::QueuedConnection);
+}
+
+/// Brings a table into view, and leaves the keyboard where it is.
+void DesignerWindow::showTable(const QString& name) {
+    const auto table = mDocument.query()->tableNamed(name.toStdU16String());
+    if (!table) return;
+    const QPointer<QWidget> typing = focusWidget();
+    model::Finding finding{};
+    finding.table = table->Key();
+    showPlace(mDrawing->control(), *mDocument.query(), finding);
+    if (typing) typing->setFocus();
 }
 
 void DesignerWindow::showTitle() {

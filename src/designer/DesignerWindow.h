@@ -54,6 +54,7 @@ private:
     void makeMenus();
     void connectParts();
     void restoreLayout();
+    void showTable(const QString& name);
     void showTitle();
     void showCounts();
     void warnOfFullGrid();

@@ -3,8 +3,12 @@
 #include "designer/Screen.h"
 #include "designer/document/AutosaveSlot.h"
 #include "designer/options/Languages.h"
+#include "designer/show/DrawingPicture.h"
+#include "designer/show/savePicture.h"
+#include "model/files/QueryDocument.h"
 
 #include <QDir>
+#include <QFile>
 #include <QPixmap>
 
 #include <cstdio>
@@ -29,6 +33,16 @@ int refuse(const QString& why) {
     return unusable;
 }
 
+/// Draws the tables and joins of a query's file into another file.
+int drawQuery(const QString& query, const QString& file) {
+    const auto document = files::loadQuery(QFile::encodeName(query).toStdString());
+    if (!document) return refuse(QString::fromStdString(document.error()));
+    const auto error = designer::savePicture(designer::DrawingPicture(*document->query), file);
+    if (!error) return 0;
+    say(stderr, QStringLiteral("zandor-designer: %1\n").arg(*error));
+    return pictureFailed;
+}
+
 /// Draws a window that is shown into a file.
 int draw(designer::DesignerWindow& window, const QString& file) {
     QCoreApplication::processEvents();
@@ -46,17 +60,24 @@ int main(int argc, char** argv) {
     if (designer::asksForHelp(given)) return say(stdout, designer::helpText()), 0;
     if (designer::asksForVersion(given)) return say(stdout, designer::versionText()), 0;
 
+    if (designer::asksForTask(given)) {
+        const QCoreApplication application(argc, argv);
+        const auto arguments = designer::readArguments(argumentsOf(argc, argv));
+        return arguments ? designer::shell::perform(*arguments->task) : refuse(arguments.error());
+    }
+
     const auto application = designer::makeApplication(argc, argv, designer::asksForPicture(given));
+    designer::speak();
     // Qt has taken its own arguments out by now.
     const auto arguments = designer::readArguments(argumentsOf(argc, argv));
     if (!arguments) return refuse(arguments.error());
     if (arguments->dark) designer::useDarkColours();
-    designer::speak();
+    if (!arguments->drawing.isEmpty()) return drawQuery(arguments->drawing, arguments->picture);
     designer::DesignerWindow window;
     if (const auto error = window.openAtFirst(*arguments, QStringLiteral(ZANDOR_SAMPLE_DATABASE)))
         return refuse(*error);
     window.show();
-    if (!arguments->picture.isEmpty()) return draw(window, arguments->picture);
+    if (!arguments->screenshot.isEmpty()) return draw(window, arguments->screenshot);
     if (!designer::isOffscreen()) {
         window.keepSafe(designer::AutosaveSlot::standardFolder());
         return QApplication::exec();

@@ -1,5 +1,7 @@
 #include "Databases.h"
 
+#include "model/files/QueryDocument.h"
+
 #include <gmock/gmock.h>
 
 #include <QDir>
@@ -95,7 +97,7 @@ TEST(TheDesignerProgram, ShowsHelpAndVersionWithoutAScreen) {
 
 TEST(TheDesignerProgram, DrawsItsWindowIntoAPicture) {
     DatabaseFolder folder;
-    const Ended ended = run({"--picture", folder.path("window.png")});
+    const Ended ended = run({"--screenshot", folder.path("window.png")});
     EXPECT_EQ(ended.code, 0) << ended.err;
     EXPECT_EQ(ended.err, "");
     EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(1340, 800));
@@ -103,21 +105,22 @@ TEST(TheDesignerProgram, DrawsItsWindowIntoAPicture) {
 
 TEST(TheDesignerProgram, DrawsATwiceAsLargePictureOnATwiceAsFineScreen) {
     DatabaseFolder folder;
-    const Ended ended = run({"--picture", folder.path("window.png")}, {{"QT_SCALE_FACTOR", "2"}});
+    const Ended ended =
+        run({"--screenshot", folder.path("window.png")}, {{"QT_SCALE_FACTOR", "2"}});
     EXPECT_EQ(ended.code, 0) << ended.err;
     EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(2680, 1600));
 }
 
 TEST(TheDesignerProgram, DrawsDarkColoursWhenAskedTo) {
     DatabaseFolder folder;
-    ASSERT_EQ(run({"--picture", folder.path("light.png")}).code, 0);
-    ASSERT_EQ(run({"--dark", "--picture", folder.path("dark.png")}).code, 0);
+    ASSERT_EQ(run({"--screenshot", folder.path("light.png")}).code, 0);
+    ASSERT_EQ(run({"--dark", "--screenshot", folder.path("dark.png")}).code, 0);
     EXPECT_GT(qGray(cornerOf(QImage(folder.path("light.png")))), 200);
     EXPECT_LT(qGray(cornerOf(QImage(folder.path("dark.png")))), 80);
 }
 
 TEST(TheDesignerProgram, EndsWithCodeOneWhenThePictureCannotBeWritten) {
-    const Ended ended = run({"--picture", "/no/such/folder/window.png"});
+    const Ended ended = run({"--screenshot", "/no/such/folder/window.png"});
     EXPECT_EQ(ended.code, 1);
     EXPECT_EQ(ended.err, "zandor-designer: The picture \"/no/such/folder/window.png\" cannot be "
                          "written; check the folder and your permissions.\n");
@@ -140,4 +143,43 @@ TEST(TheDesignerProgram, DrawsAPictureWhenTheDisplayCannotBeReached) {
     EXPECT_EQ(ended.err, "");
     EXPECT_THAT(ended.out, StartsWith("No display can be reached"));
     EXPECT_FALSE(QImage(folder.path("zandor-designer.png")).isNull());
+}
+
+TEST(TheDesignerProgram, DrawsTheTablesOfAQueryFileIntoAPicture) {
+    DatabaseFolder folder;
+    const QString query = folder.path("query.json");
+    ASSERT_FALSE(files::saveQuery(query.toStdString(), {openedSample().query}));
+    for (const char* name : {"out.png", "out.svg", "out.pdf"}) {
+        const Ended ended = run({"--picture", query, folder.path(name)});
+        EXPECT_EQ(ended.code, 0) << ended.err;
+        EXPECT_EQ(ended.err, "");
+    }
+    QFile svg(folder.path("out.svg"));
+    ASSERT_TRUE(svg.open(QIODevice::ReadOnly));
+    EXPECT_TRUE(svg.readAll().contains(">order_lines</text>"));
+    EXPECT_GT(QImage(folder.path("out.png")).width(), 2000);
+}
+
+TEST(TheDesignerProgram, RefusesAPictureOfABrokenQueryInOneLine) {
+    DatabaseFolder folder;
+    expectRefusal({"--picture", folder.file("query.json", "{"), folder.path("out.png")},
+                  "query.json");
+    expectRefusal({"--picture", "/no/such/query.json", folder.path("out.png")}, "query.json");
+    const QString query = folder.path("good.json");
+    ASSERT_FALSE(files::saveQuery(query.toStdString(), {openedSample().query}));
+    const Ended ended = run({"--picture", query, folder.path("out.gif")});
+    EXPECT_EQ(ended.code, 1);
+    EXPECT_THAT(ended.err, HasSubstr("A picture ends in .png, .svg or .pdf"));
+}
+
+TEST(TheDesignerProgram, OpensAQueryFileWithItsDatabase) {
+    DatabaseFolder folder;
+    files::QueryDocument document{openedSample({"orders"}).query};
+    document.database = sampleDatabase().toStdU16String();
+    const QString query = folder.path("query.json");
+    ASSERT_FALSE(files::saveQuery(query.toStdString(), document));
+    const Ended ended = run({"--screenshot", folder.path("window.png"), query});
+    EXPECT_EQ(ended.code, 0) << ended.err;
+    EXPECT_EQ(QImage(folder.path("window.png")).size(), QSize(1340, 800));
+    expectRefusal({"--screenshot", folder.path("window.png"), "/no/such/query.json"}, "query.json");
 }

@@ -114,7 +114,6 @@ void ConnectionDialog::lay() {
 
     auto* const buttons = new QDialogButtonBox(QDialogButtonBox::Open | QDialogButtonBox::Cancel);
     mOpen = buttons->button(QDialogButtonBox::Open);
-    mOpen->setDefault(true);
     connect(buttons, &QDialogButtonBox::accepted, this, &ConnectionDialog::open);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
 
@@ -123,6 +122,7 @@ void ConnectionDialog::lay() {
     layout->addWidget(mError);
     layout->addStretch();
     layout->addWidget(buttons);
+    mOpen->setDefault(true); // only within the dialog does it become so again after others
     setMinimumWidth(460);
 }
 

@@ -2,6 +2,7 @@
 
 #include "designer/document/Step.h"
 #include "designer/document/StepName.h"
+#include "platform/qt/ZandorWindowMessage.h"
 
 #include <QAction>
 #include <QCoreApplication>
@@ -99,8 +100,12 @@ void Document::settle() {
 }
 
 bool Document::eventFilter(QObject*, QEvent* event) {
-    // The control has no event for a new size of a table, nor for a join from its menu.
-    if (event->type() == QEvent::MouseButtonRelease || event->type() == QEvent::KeyRelease)
+    // The control has no event for a new size of a table, nor for a join from its menu, the end of
+    // which it announces after all that was chosen is done.
+    static const QEvent::Type menu =
+        ZandorWindowMessage::typeOf(QStringLiteral("TALVIKDISABLEVELT"));
+    const QEvent::Type type = event->type();
+    if (type == QEvent::MouseButtonRelease || type == QEvent::KeyRelease || type == menu)
         changedByControl();
     return false;
 }

@@ -26,7 +26,7 @@ ParameterDialog::ParameterDialog(std::vector<Question> questions, const Answers&
         connect(field, &QLineEdit::textChanged, this, &ParameterDialog::check);
         auto* label = new QLabel(this);
         label->setTextFormat(Qt::PlainText);
-        label->setText(tr("%1:").arg(QString(question.name).replace(u'&', QStringLiteral("&&"))));
+        label->setText(QString(question.name).replace(u'&', QStringLiteral("&&")));
         label->setBuddy(field);
         layout->addRow(label, field);
         mFields.push_back(field);

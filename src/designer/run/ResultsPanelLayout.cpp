@@ -1,5 +1,6 @@
 #include "designer/run/ResultTable.h"
 #include "designer/run/ResultsPanel.h"
+#include "designer/run/shapeIcon.h"
 
 #include <QAction>
 #include <QComboBox>
@@ -10,6 +11,7 @@
 #include <QProgressBar>
 #include <QStackedWidget>
 #include <QStyle>
+#include <QTextDocument>
 #include <QToolBar>
 #include <QToolButton>
 #include <QVBoxLayout>
@@ -27,12 +29,13 @@ constexpr int busyHeight = 3; // logical pixels
 } // namespace
 
 void ResultsPanel::makeActions() {
-    mRun = new QAction(style()->standardIcon(QStyle::SP_MediaPlay), tr("&Run"), this);
+    mRun = new QAction(shapeIcon({{0.2, 0.1}, {0.9, 0.5}, {0.2, 0.9}}), tr("&Run"), this);
     mRun->setShortcut(Qt::Key_F5);
     mRun->setToolTip(tr("Run the query and show its rows (F5)"));
     connect(mRun, &QAction::triggered, this, &ResultsPanel::run);
 
-    mCancel = new QAction(style()->standardIcon(QStyle::SP_MediaStop), tr("&Cancel"), this);
+    mCancel = new QAction(shapeIcon({{0.15, 0.15}, {0.85, 0.15}, {0.85, 0.85}, {0.15, 0.85}}),
+                          tr("&Cancel"), this);
     mCancel->setToolTip(tr("Stop what is running, on the database too"));
     connect(mCancel, &QAction::triggered, this, &ResultsPanel::cancel);
 
@@ -110,6 +113,7 @@ QWidget* ResultsPanel::makeMessagePage() {
     mMessageStatement->setObjectName(QStringLiteral("failedStatement"));
     mMessageStatement->setReadOnly(true);
     mMessageStatement->setFrameShape(QFrame::NoFrame);
+    mMessageStatement->document()->setDocumentMargin(0);
     mMessageStatement->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
     auto* layout = new QVBoxLayout(page);
     layout->setContentsMargins(12, 10, 12, 10);

@@ -1,5 +1,6 @@
 #include "designer/statement/FindingPlace.h"
 
+#include "designer/canvasSize.h"
 #include "model/Layout.h"
 #include "platform/qt/Text.h"
 #include "platform/qt/ZandorWidget.h"
@@ -11,8 +12,6 @@ namespace designer {
 namespace {
 
 using platform::qt::toQt;
-
-constexpr int twipsPerPixel = 15;
 
 struct Place {
     platform::Ref<model::Table> table;

@@ -10,16 +10,6 @@
 
 namespace designer {
 
-namespace {
-
-/// Whether a place is between the two halves of a character.
-bool isWithinCharacter(const QString& text, qsizetype at) {
-    return at > 0 && at < text.size() && text[at - 1].isHighSurrogate() &&
-           text[at].isLowSurrogate();
-}
-
-} // namespace
-
 SqlView::SqlView(QWidget* parent)
     : QPlainTextEdit(parent), mHighlighter(new SqlHighlighter(document(), palette())) {
     setReadOnly(true);
@@ -48,15 +38,11 @@ void SqlView::replace(const QString& text) {
     }
     const auto unlike =
         std::mismatch(mStatement.cbegin(), mStatement.cend(), text.cbegin(), text.cend());
-    qsizetype begin = unlike.first - mStatement.cbegin();
-    if (isWithinCharacter(mStatement, begin) || isWithinCharacter(text, begin)) --begin;
+    const qsizetype begin = unlike.first - mStatement.cbegin();
     const qsizetype most = std::min(mStatement.size(), text.size()) - begin;
     qsizetype same = 0;
     while (same < most && mStatement[mStatement.size() - 1 - same] == text[text.size() - 1 - same])
         ++same;
-    if (isWithinCharacter(mStatement, mStatement.size() - same) ||
-        isWithinCharacter(text, text.size() - same))
-        --same;
 
     QTextCursor cursor(document());
     cursor.setPosition(static_cast<int>(begin));

@@ -13,6 +13,7 @@
 #include <QKeyEvent>
 #include <QListWidget>
 #include <QPushButton>
+#include <QScrollBar>
 #include <QSplitter>
 #include <QStyle>
 
@@ -38,6 +39,7 @@ StatementPanel::StatementPanel(Document& document, QWidget* parent)
     mDialects->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     mDialects->setMinimumContentsLength(8);
     mDialects->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
+    mDialects->setMaximumWidth(fontMetrics().averageCharWidth() * 50);
     mDialects->setToolTip(tr("The dialect of SQL that the statement is written in"));
     mDialects->setAccessibleName(tr("Dialect"));
     setDatabaseDialect(mDatabaseDialect);
@@ -56,6 +58,7 @@ StatementPanel::StatementPanel(Document& document, QWidget* parent)
     top->setContentsMargins(6, 4, 6, 4);
     top->setSpacing(6);
     top->addWidget(mDialects, 1);
+    top->addStretch();
     top->addWidget(mCopy);
     auto* const parts = new QSplitter(Qt::Vertical);
     parts->addWidget(mView);
@@ -91,12 +94,13 @@ Dialect StatementPanel::dialect() const {
 }
 
 void StatementPanel::copy() {
+    if (mOutdated) showNow();
     if (!mView->statement().isEmpty()) QGuiApplication::clipboard()->setText(mView->statement());
 }
 
 void StatementPanel::queue() {
     mOutdated = true;
-    if (isVisible()) mSoon.start();
+    if (isVisible() && !mSoon.isActive()) mSoon.start();
 }
 
 void StatementPanel::showEvent(QShowEvent* event) {
@@ -143,6 +147,7 @@ void StatementPanel::showNow() {
 
 void StatementPanel::showFindings(const model::Findings& findings) {
     const int current = mList->currentRow();
+    const int scrolled = mList->verticalScrollBar()->value();
     mFindings.clear();
     // That there is nothing yet is said where the statement will be.
     std::copy_if(
@@ -162,6 +167,7 @@ void StatementPanel::showFindings(const model::Findings& findings) {
     }
     mList->setCurrentRow(std::min(current, mList->count() - 1));
     mList->setVisible(!mFindings.empty());
+    mList->verticalScrollBar()->setValue(scrolled);
 }
 
 void StatementPanel::choose(int row) {

@@ -35,7 +35,7 @@ signals:
     void findingChosen(const model::Finding& finding);
 
 public slots:
-    /// Puts the statement on the clipboard, if there is one.
+    /// Puts the statement as it is now on the clipboard, if there is one.
     void copy();
 
 protected:

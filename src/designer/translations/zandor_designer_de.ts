@@ -1163,10 +1163,6 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
         <translation>Werte für die Abfrage</translation>
     </message>
     <message>
-        <source>%1:</source>
-        <translation>%1:</translation>
-    </message>
-    <message>
         <source>&amp;Run</source>
         <translation>Aus&amp;führen</translation>
     </message>

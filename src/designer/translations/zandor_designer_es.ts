@@ -1163,10 +1163,6 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <translation>Valores para la consulta</translation>
     </message>
     <message>
-        <source>%1:</source>
-        <translation>%1:</translation>
-    </message>
-    <message>
         <source>&amp;Run</source>
         <translation>&amp;Ejecutar</translation>
     </message>

@@ -49,19 +49,19 @@
     </message>
     <message>
         <source>Normal: only rows that match</source>
-        <translation>Normale : seulement les lignes qui correspondent</translation>
+        <translation>Normale&#xa0;: seulement les lignes qui correspondent</translation>
     </message>
     <message>
         <source>Left outer: all rows of the left table</source>
-        <translation>Externe gauche : toutes les lignes de la table de gauche</translation>
+        <translation>Externe gauche&#xa0;: toutes les lignes de la table de gauche</translation>
     </message>
     <message>
         <source>Right outer: all rows of the right table</source>
-        <translation>Externe droite : toutes les lignes de la table de droite</translation>
+        <translation>Externe droite&#xa0;: toutes les lignes de la table de droite</translation>
     </message>
     <message>
         <source>Both outer: all rows of both tables</source>
-        <translation>Externe des deux côtés : toutes les lignes des deux tables</translation>
+        <translation>Externe des deux côtés&#xa0;: toutes les lignes des deux tables</translation>
     </message>
     <message>
         <source>=  equal</source>
@@ -96,103 +96,103 @@
     <name>ControlTextUses</name>
     <message>
         <source>Join dialog: title</source>
-        <translation>Fenêtre de jointure : titre</translation>
+        <translation>Fenêtre de jointure&#xa0;: titre</translation>
     </message>
     <message>
         <source>Join dialog: left table</source>
-        <translation>Fenêtre de jointure : table de gauche</translation>
+        <translation>Fenêtre de jointure&#xa0;: table de gauche</translation>
     </message>
     <message>
         <source>Join dialog: left column</source>
-        <translation>Fenêtre de jointure : colonne de gauche</translation>
+        <translation>Fenêtre de jointure&#xa0;: colonne de gauche</translation>
     </message>
     <message>
         <source>Join dialog: right table</source>
-        <translation>Fenêtre de jointure : table de droite</translation>
+        <translation>Fenêtre de jointure&#xa0;: table de droite</translation>
     </message>
     <message>
         <source>Join dialog: right column</source>
-        <translation>Fenêtre de jointure : colonne de droite</translation>
+        <translation>Fenêtre de jointure&#xa0;: colonne de droite</translation>
     </message>
     <message>
         <source>Join dialog: join type</source>
-        <translation>Fenêtre de jointure : type de jointure</translation>
+        <translation>Fenêtre de jointure&#xa0;: type de jointure</translation>
     </message>
     <message>
         <source>Join type: only rows that match</source>
-        <translation>Type de jointure : seulement les lignes qui correspondent</translation>
+        <translation>Type de jointure&#xa0;: seulement les lignes qui correspondent</translation>
     </message>
     <message>
         <source>Join type: all rows of the left table</source>
-        <translation>Type de jointure : toutes les lignes de la table de gauche</translation>
+        <translation>Type de jointure&#xa0;: toutes les lignes de la table de gauche</translation>
     </message>
     <message>
         <source>Join type: all rows of the right table</source>
-        <translation>Type de jointure : toutes les lignes de la table de droite</translation>
+        <translation>Type de jointure&#xa0;: toutes les lignes de la table de droite</translation>
     </message>
     <message>
         <source>Join type: all rows of both tables</source>
-        <translation>Type de jointure : toutes les lignes des deux tables</translation>
+        <translation>Type de jointure&#xa0;: toutes les lignes des deux tables</translation>
     </message>
     <message>
         <source>Join dialog: button that takes the changes over</source>
-        <translation>Fenêtre de jointure : bouton qui valide les modifications</translation>
+        <translation>Fenêtre de jointure&#xa0;: bouton qui valide les modifications</translation>
     </message>
     <message>
         <source>Join dialog: button that drops the changes</source>
-        <translation>Fenêtre de jointure : bouton qui abandonne les modifications</translation>
+        <translation>Fenêtre de jointure&#xa0;: bouton qui abandonne les modifications</translation>
     </message>
     <message>
         <source>Menu: open the join dialog</source>
-        <translation>Menu : ouvrir la fenêtre de jointure</translation>
+        <translation>Menu&#xa0;: ouvrir la fenêtre de jointure</translation>
     </message>
     <message>
         <source>Menu: delete a join</source>
-        <translation>Menu : supprimer une jointure</translation>
+        <translation>Menu&#xa0;: supprimer une jointure</translation>
     </message>
     <message>
         <source>Menu: copy the selected columns</source>
-        <translation>Menu : copier les colonnes sélectionnées</translation>
+        <translation>Menu&#xa0;: copier les colonnes sélectionnées</translation>
     </message>
     <message>
         <source>Menu: join the copied column to the selected one</source>
-        <translation>Menu : joindre la colonne copiée à celle sélectionnée</translation>
+        <translation>Menu&#xa0;: joindre la colonne copiée à celle sélectionnée</translation>
     </message>
     <message>
         <source>Menu: take a table out of the query</source>
-        <translation>Menu : retirer une table de la requête</translation>
+        <translation>Menu&#xa0;: retirer une table de la requête</translation>
     </message>
     <message>
         <source>Menu: make output columns of the copied columns</source>
-        <translation>Menu : faire des colonnes copiées des colonnes de sortie</translation>
+        <translation>Menu&#xa0;: faire des colonnes copiées des colonnes de sortie</translation>
     </message>
     <message>
         <source>Menu: delete an output column</source>
-        <translation>Menu : supprimer une colonne de sortie</translation>
+        <translation>Menu&#xa0;: supprimer une colonne de sortie</translation>
     </message>
     <message>
         <source>Grid: the column</source>
-        <translation>Grille : la colonne</translation>
+        <translation>Grille&#xa0;: la colonne</translation>
     </message>
     <message>
         <source>Grid: the name that the column comes out under</source>
-        <translation>Grille : le nom sous lequel la colonne est produite</translation>
+        <translation>Grille&#xa0;: le nom sous lequel la colonne est produite</translation>
     </message>
     <message>
         <source>Grid: sort order</source>
-        <translation>Grille : ordre de tri</translation>
+        <translation>Grille&#xa0;: ordre de tri</translation>
     </message>
     <message>
         <source>Grid: whether the column comes out</source>
-        <translation>Grille : si la colonne est produite</translation>
+        <translation>Grille&#xa0;: si la colonne est produite</translation>
     </message>
     <message>
         <source>Grid: the first row of criteria</source>
-        <translation>Grille : la première ligne de critères</translation>
+        <translation>Grille&#xa0;: la première ligne de critères</translation>
     </message>
     <message>
         <source>Grid: further rows of criteria</source>
-        <translation>Grille : les autres lignes de critères</translation>
+        <translation>Grille&#xa0;: les autres lignes de critères</translation>
     </message>
 </context>
 <context>
@@ -203,19 +203,19 @@
     </message>
     <message>
         <source>Left Table:</source>
-        <translation>Table de gauche :</translation>
+        <translation>Table de gauche&#xa0;:</translation>
     </message>
     <message>
         <source>Left Column:</source>
-        <translation>Colonne de gauche :</translation>
+        <translation>Colonne de gauche&#xa0;:</translation>
     </message>
     <message>
         <source>Right Table:</source>
-        <translation>Table de droite :</translation>
+        <translation>Table de droite&#xa0;:</translation>
     </message>
     <message>
         <source>Right Column:</source>
-        <translation>Colonne de droite :</translation>
+        <translation>Colonne de droite&#xa0;:</translation>
     </message>
     <message>
         <source>Join Type</source>
@@ -275,82 +275,82 @@
     </message>
     <message>
         <source>Field:</source>
-        <translation>Champ :</translation>
+        <translation>Champ&#xa0;:</translation>
     </message>
     <message>
         <source>Synonym:</source>
-        <translation>Synonyme :</translation>
+        <translation>Synonyme&#xa0;:</translation>
     </message>
     <message>
         <source>Sort:</source>
-        <translation>Tri :</translation>
+        <translation>Tri&#xa0;:</translation>
     </message>
     <message>
         <source>Visible:</source>
-        <translation>Visible :</translation>
+        <translation>Visible&#xa0;:</translation>
     </message>
     <message>
         <source>Criteria:</source>
-        <translation>Critères :</translation>
+        <translation>Critères&#xa0;:</translation>
     </message>
     <message>
         <source>Or:</source>
-        <translation>Ou :</translation>
+        <translation>Ou&#xa0;:</translation>
     </message>
 </context>
 <context>
     <name>Model</name>
     <message>
         <source>The query has no tables: add one first.</source>
-        <translation>La requête n’a aucune table : ajoutez-en d’abord une.</translation>
+        <translation>La requête n’a aucune table&#xa0;: ajoutez-en d’abord une.</translation>
     </message>
     <message>
         <source>An output column has no column of the query: delete it.</source>
-        <translation>Une colonne de sortie ne correspond à aucune colonne de la requête : supprimez-la.</translation>
+        <translation>Une colonne de sortie ne correspond à aucune colonne de la requête&#xa0;: supprimez-la.</translation>
     </message>
     <message>
         <source>%1.* cannot be sorted: sort one of its columns.</source>
-        <translation>%1.* ne peut pas être trié : triez selon l’une de ses colonnes.</translation>
+        <translation>%1.* ne peut pas être trié&#xa0;: triez selon l’une de ses colonnes.</translation>
     </message>
     <message>
         <source>%1.* cannot have a criterion: give one to one of its columns.</source>
-        <translation>%1.* ne peut pas avoir de critère : donnez-le à l’une de ses colonnes.</translation>
+        <translation>%1.* ne peut pas avoir de critère&#xa0;: donnez-le à l’une de ses colonnes.</translation>
     </message>
     <message>
         <source>Two output columns are named %1: give one of them a synonym.</source>
-        <translation>Deux colonnes de sortie se nomment %1 : donnez un synonyme à l’une d’elles.</translation>
+        <translation>Deux colonnes de sortie se nomment %1&#xa0;: donnez un synonyme à l’une d’elles.</translation>
     </message>
     <message>
         <source>%1 and %2 hold different kinds of values: the join will find nothing or fail.</source>
-        <translation>%1 et %2 contiennent des valeurs de types différents : la jointure ne trouvera rien ou échouera.</translation>
+        <translation>%1 et %2 contiennent des valeurs de types différents&#xa0;: la jointure ne trouvera rien ou échouera.</translation>
     </message>
     <message>
         <source>The outer join between %1 and %2 has no effect: normal joins connect them too.</source>
-        <translation>La jointure externe entre %1 et %2 est sans effet : des jointures normales les relient aussi.</translation>
+        <translation>La jointure externe entre %1 et %2 est sans effet&#xa0;: des jointures normales les relient aussi.</translation>
     </message>
     <message>
         <source>The outer joins around %1 and %2 contradict each other: the one drawn first decides which rows are kept.</source>
-        <translation>Les jointures externes autour de %1 et %2 se contredisent : la première dessinée décide des lignes conservées.</translation>
+        <translation>Les jointures externes autour de %1 et %2 se contredisent&#xa0;: la première dessinée décide des lignes conservées.</translation>
     </message>
     <message>
         <source>The outer joins around %1 can be read in several ways: change the type of one of them.</source>
-        <translation>Les jointures externes autour de %1 peuvent se lire de plusieurs façons : changez le type de l’une d’elles.</translation>
+        <translation>Les jointures externes autour de %1 peuvent se lire de plusieurs façons&#xa0;: changez le type de l’une d’elles.</translation>
     </message>
     <message>
         <source>No join connects %1 with %2: every row of one comes with every row of the other.</source>
-        <translation>Aucune jointure ne relie %1 à %2 : chaque ligne de l’une vient avec chaque ligne de l’autre.</translation>
+        <translation>Aucune jointure ne relie %1 à %2&#xa0;: chaque ligne de l’une vient avec chaque ligne de l’autre.</translation>
     </message>
     <message>
         <source>MySQL/MariaDB has no full outer join: make it a left or a right one.</source>
-        <translation>MySQL/MariaDB n’a pas de jointure externe des deux côtés : faites-en une jointure gauche ou droite.</translation>
+        <translation>MySQL/MariaDB n’a pas de jointure externe des deux côtés&#xa0;: faites-en une jointure gauche ou droite.</translation>
     </message>
     <message>
         <source>PostgreSQL joins both outer only on equal columns: use the operator =, or make it a left or a right outer join.</source>
-        <translation>PostgreSQL ne fait de jointure externe des deux côtés que sur des colonnes égales : utilisez l’opérateur =, ou faites-en une jointure externe gauche ou droite.</translation>
+        <translation>PostgreSQL ne fait de jointure externe des deux côtés que sur des colonnes égales&#xa0;: utilisez l’opérateur =, ou faites-en une jointure externe gauche ou droite.</translation>
     </message>
     <message>
         <source>SQLite takes about 900 conditions in a row: use In for a long list.</source>
-        <translation>SQLite accepte environ 900 conditions à la suite : utilisez In pour une longue liste.</translation>
+        <translation>SQLite accepte environ 900 conditions à la suite&#xa0;: utilisez In pour une longue liste.</translation>
     </message>
     <message>
         <source>%1 cannot carry an empty name.</source>
@@ -366,23 +366,23 @@
     </message>
     <message>
         <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 bytes.</source>
-        <translation>%1 n’accepte pas le nom « %2 », il compte plus de %3 octets.</translation>
+        <translation>%1 n’accepte pas le nom «&#xa0;%2&#xa0;», il compte plus de %3 octets.</translation>
     </message>
     <message>
         <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 characters.</source>
-        <translation>%1 n’accepte pas le nom « %2 », il compte plus de %3 caractères.</translation>
+        <translation>%1 n’accepte pas le nom «&#xa0;%2&#xa0;», il compte plus de %3 caractères.</translation>
     </message>
     <message>
         <source>%1 cannot carry the name &quot;%2&quot;, it has a character beyond U+FFFF.</source>
-        <translation>%1 n’accepte pas le nom « %2 », il contient un caractère au-delà de U+FFFF.</translation>
+        <translation>%1 n’accepte pas le nom «&#xa0;%2&#xa0;», il contient un caractère au-delà de U+FFFF.</translation>
     </message>
     <message>
         <source>%1 cannot carry the name &quot;%2&quot;, it ends with a blank.</source>
-        <translation>%1 n’accepte pas le nom « %2 », il se termine par une espace.</translation>
+        <translation>%1 n’accepte pas le nom «&#xa0;%2&#xa0;», il se termine par une espace.</translation>
     </message>
     <message>
         <source>%1: At character %2: %3.</source>
-        <translation>%1 : au caractère %2 : %3.</translation>
+        <translation>%1&#xa0;: au caractère %2&#xa0;: %3.</translation>
     </message>
     <message>
         <source>expected And, Or or the end</source>
@@ -450,7 +450,7 @@
     </message>
     <message>
         <source>expected a column that holds %1</source>
-        <translation>une colonne de ce contenu attendue : %1</translation>
+        <translation>une colonne de ce contenu attendue&#xa0;: %1</translation>
     </message>
     <message>
         <source>expected the end, a criterion has at most 10000 characters</source>
@@ -538,59 +538,59 @@
     </message>
     <message>
         <source>There is no file &quot;%1&quot;; check the path.</source>
-        <translation>Il n’y a pas de fichier « %1 » ; vérifiez le chemin.</translation>
+        <translation>Il n’y a pas de fichier «&#xa0;%1&#xa0;»&#xa0;; vérifiez le chemin.</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is a folder; choose a database file in it.</source>
-        <translation>« %1 » est un dossier ; choisissez-y un fichier de base de données.</translation>
+        <translation>«&#xa0;%1&#xa0;» est un dossier&#xa0;; choisissez-y un fichier de base de données.</translation>
     </message>
     <message>
         <source>&quot;%1&quot; is a device, not a file; choose a database file.</source>
-        <translation>« %1 » est un périphérique, pas un fichier ; choisissez un fichier de base de données.</translation>
+        <translation>«&#xa0;%1&#xa0;» est un périphérique, pas un fichier&#xa0;; choisissez un fichier de base de données.</translation>
     </message>
     <message>
         <source>The file &quot;%1&quot; cannot be read (%2); ask its owner for permission.</source>
-        <translation>Le fichier « %1 » ne peut pas être lu (%2) ; demandez l’autorisation à son propriétaire.</translation>
+        <translation>Le fichier «&#xa0;%1&#xa0;» ne peut pas être lu (%2)&#xa0;; demandez l’autorisation à son propriétaire.</translation>
     </message>
     <message>
         <source>The file &quot;%1&quot; is empty; choose a file that holds a database.</source>
-        <translation>Le fichier « %1 » est vide ; choisissez un fichier qui contient une base de données.</translation>
+        <translation>Le fichier «&#xa0;%1&#xa0;» est vide&#xa0;; choisissez un fichier qui contient une base de données.</translation>
     </message>
     <message>
         <source>The file &quot;%1&quot; is not an SQLite database, or it is encrypted; choose another file.</source>
-        <translation>Le fichier « %1 » n’est pas une base de données SQLite, ou il est chiffré ; choisissez-en un autre.</translation>
+        <translation>Le fichier «&#xa0;%1&#xa0;» n’est pas une base de données SQLite, ou il est chiffré&#xa0;; choisissez-en un autre.</translation>
     </message>
     <message>
         <source>The Qt driver for %1 is missing; install it (Debian: apt install %2).</source>
-        <translation>Le pilote Qt pour %1 manque ; installez-le (Debian : apt install %2).</translation>
+        <translation>Le pilote Qt pour %1 manque&#xa0;; installez-le (Debian&#xa0;: apt install %2).</translation>
     </message>
     <message>
         <source>The list of tables cannot be read (the connection is closed): open the database afresh.</source>
-        <translation>La liste des tables ne peut pas être lue (la connexion est fermée) : rouvrez la base de données.</translation>
+        <translation>La liste des tables ne peut pas être lue (la connexion est fermée)&#xa0;: rouvrez la base de données.</translation>
     </message>
     <message>
         <source>The table &quot;%1&quot; is not in the database; read the list of tables afresh.</source>
-        <translation>La table « %1 » n’est pas dans la base de données ; relisez la liste des tables.</translation>
+        <translation>La table «&#xa0;%1&#xa0;» n’est pas dans la base de données&#xa0;; relisez la liste des tables.</translation>
     </message>
     <message>
         <source>The address has an unknown option &quot;%1&quot;; known are %2 and host.</source>
-        <translation>L’adresse contient une option inconnue « %1 » ; sont connues %2 et host.</translation>
+        <translation>L’adresse contient une option inconnue «&#xa0;%1&#xa0;»&#xa0;; sont connues %2 et host.</translation>
     </message>
     <message>
         <source>The option %1 of the address has a semicolon in it; use a value without one.</source>
-        <translation>L’option %1 de l’adresse contient un point-virgule ; utilisez une valeur sans.</translation>
+        <translation>L’option %1 de l’adresse contient un point-virgule&#xa0;; utilisez une valeur sans.</translation>
     </message>
     <message>
         <source>The address of the database cannot be read; write it like %1, with %XX for a character that means something else there.</source>
-        <translation>L’adresse de la base de données est illisible ; écrivez-la comme %1, avec %XX pour un caractère qui a un autre sens à cet endroit.</translation>
+        <translation>L’adresse de la base de données est illisible&#xa0;; écrivez-la comme %1, avec %XX pour un caractère qui a un autre sens à cet endroit.</translation>
     </message>
     <message>
         <source>There is no kind of database &quot;%1&quot;; write it like %2.</source>
-        <translation>Il n’y a pas de type de base de données « %1 » ; écrivez comme %2.</translation>
+        <translation>Il n’y a pas de type de base de données «&#xa0;%1&#xa0;»&#xa0;; écrivez comme %2.</translation>
     </message>
     <message>
         <source>%1 (%2): %3.</source>
-        <translation>%1 (%2) : %3.</translation>
+        <translation>%1 (%2)&#xa0;: %3.</translation>
     </message>
     <message>
         <source>The database %1 cannot be opened</source>
@@ -602,15 +602,15 @@
     </message>
     <message>
         <source>The table &quot;%1&quot; cannot be read</source>
-        <translation>La table « %1 » ne peut pas être lue</translation>
+        <translation>La table «&#xa0;%1&#xa0;» ne peut pas être lue</translation>
     </message>
     <message>
         <source>The primary key of &quot;%1&quot; cannot be read</source>
-        <translation>La clé primaire de « %1 » ne peut pas être lue</translation>
+        <translation>La clé primaire de «&#xa0;%1&#xa0;» ne peut pas être lue</translation>
     </message>
     <message>
         <source>The foreign keys of &quot;%1&quot; cannot be read</source>
-        <translation>Les clés étrangères de « %1 » ne peuvent pas être lues</translation>
+        <translation>Les clés étrangères de «&#xa0;%1&#xa0;» ne peuvent pas être lues</translation>
     </message>
     <message>
         <source>give a password</source>
@@ -654,19 +654,19 @@
     </message>
     <message>
         <source>another program is writing to it; try again in a moment</source>
-        <translation>un autre programme y écrit ; réessayez dans un instant</translation>
+        <translation>un autre programme y écrit&#xa0;; réessayez dans un instant</translation>
     </message>
     <message>
         <source>see that you may read the file and its folder; a database in WAL mode also needs permission to write to the folder</source>
-        <translation>assurez-vous de pouvoir lire le fichier et son dossier ; une base de données en mode WAL exige aussi le droit d’écrire dans le dossier</translation>
+        <translation>assurez-vous de pouvoir lire le fichier et son dossier&#xa0;; une base de données en mode WAL exige aussi le droit d’écrire dans le dossier</translation>
     </message>
     <message>
         <source>the file is damaged; restore it from a copy</source>
-        <translation>le fichier est endommagé ; restaurez-le à partir d’une copie</translation>
+        <translation>le fichier est endommagé&#xa0;; restaurez-le à partir d’une copie</translation>
     </message>
     <message>
         <source>it is damaged or encrypted; choose another file</source>
-        <translation>il est endommagé ou chiffré ; choisissez un autre fichier</translation>
+        <translation>il est endommagé ou chiffré&#xa0;; choisissez un autre fichier</translation>
     </message>
 </context>
 <context>
@@ -691,39 +691,39 @@
     <name>designer</name>
     <message>
         <source>There is nothing to draw; add a table first.</source>
-        <translation>Il n’y a rien à dessiner ; ajoutez d’abord une table.</translation>
+        <translation>Il n’y a rien à dessiner&#xa0;; ajoutez d’abord une table.</translation>
     </message>
     <message>
         <source>A picture ends in .png, .svg or .pdf; &quot;%1&quot; does not.</source>
-        <translation>Une image se termine par .png, .svg ou .pdf ; ce n’est pas le cas de « %1 ».</translation>
+        <translation>Une image se termine par .png, .svg ou .pdf&#xa0;; ce n’est pas le cas de «&#xa0;%1&#xa0;».</translation>
     </message>
     <message>
         <source>The picture &quot;%1&quot; cannot be written; check the folder and your permissions.</source>
-        <translation>L’image « %1 » ne peut pas être écrite ; vérifiez le dossier et vos droits.</translation>
+        <translation>L’image «&#xa0;%1&#xa0;» ne peut pas être écrite&#xa0;; vérifiez le dossier et vos droits.</translation>
     </message>
     <message>
         <source>The printer cannot be reached; choose another one.</source>
-        <translation>L’imprimante est inaccessible ; choisissez-en une autre.</translation>
+        <translation>L’imprimante est inaccessible&#xa0;; choisissez-en une autre.</translation>
     </message>
     <message>
         <source>The page could not be printed; see the printer&apos;s own messages.</source>
-        <translation>La page n’a pas pu être imprimée ; consultez les messages de l’imprimante.</translation>
+        <translation>La page n’a pas pu être imprimée&#xa0;; consultez les messages de l’imprimante.</translation>
     </message>
     <message>
         <source>%1 tables are too many; the canvas takes %2.</source>
-        <translation>%1 tables, c’est trop ; la zone de dessin en accepte %2.</translation>
+        <translation>%1 tables, c’est trop&#xa0;; la zone de dessin en accepte %2.</translation>
     </message>
     <message>
         <source>There is no table &quot;%1&quot; in %2.</source>
-        <translation>Il n’y a pas de table « %1 » dans %2.</translation>
+        <translation>Il n’y a pas de table «&#xa0;%1&#xa0;» dans %2.</translation>
     </message>
     <message>
         <source>These tables have %1 joins, and the canvas takes %2; choose fewer tables with --tables.</source>
-        <translation>Ces tables ont %1 jointures, la zone de dessin en accepte %2 ; choisissez moins de tables avec --tables.</translation>
+        <translation>Ces tables ont %1 jointures, la zone de dessin en accepte %2&#xa0;; choisissez moins de tables avec --tables.</translation>
     </message>
     <message>
         <source>%1 of %2 tables; choose others in the panel &quot;Tables&quot;</source>
-        <translation>%1 tables sur %2 ; choisissez-en d’autres dans le panneau « Tables »</translation>
+        <translation>%1 tables sur %2&#xa0;; choisissez-en d’autres dans le panneau «&#xa0;Tables&#xa0;»</translation>
     </message>
 </context>
 <context>
@@ -734,7 +734,7 @@
     </message>
     <message>
         <source>The query could not be saved for a recovery (%1); save it yourself.</source>
-        <translation>La requête n’a pas pu être sauvegardée pour une récupération (%1) ; enregistrez-la vous-même.</translation>
+        <translation>La requête n’a pas pu être sauvegardée pour une récupération (%1)&#xa0;; enregistrez-la vous-même.</translation>
     </message>
 </context>
 <context>
@@ -799,39 +799,39 @@
     </message>
     <message>
         <source>P&amp;ort:</source>
-        <translation>P&amp;ort :</translation>
+        <translation>P&amp;ort&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;Kind:</source>
-        <translation>T&amp;ype :</translation>
+        <translation>T&amp;ype&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;File:</source>
-        <translation>&amp;Fichier :</translation>
+        <translation>&amp;Fichier&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;Host:</source>
-        <translation>&amp;Serveur :</translation>
+        <translation>&amp;Serveur&#xa0;:</translation>
     </message>
     <message>
         <source>Data &amp;source:</source>
-        <translation>Sour&amp;ce de données :</translation>
+        <translation>Sour&amp;ce de données&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;Database:</source>
-        <translation>&amp;Base de données :</translation>
+        <translation>&amp;Base de données&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;User:</source>
-        <translation>&amp;Utilisateur :</translation>
+        <translation>&amp;Utilisateur&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;Password:</source>
-        <translation>&amp;Mot de passe :</translation>
+        <translation>&amp;Mot de passe&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;Address:</source>
-        <translation>&amp;Adresse :</translation>
+        <translation>&amp;Adresse&#xa0;:</translation>
     </message>
     <message>
         <source>SQLite databases (*.sqlite *.sqlite3 *.db *.db3);;All files (*)</source>
@@ -953,7 +953,7 @@
     </message>
     <message>
         <source>The grid shows %1 output columns and is full. Delete one before you add another; it would take the place of the last.</source>
-        <translation>La grille affiche %1 colonnes de sortie et est pleine. Supprimez-en une avant d’en ajouter une autre ; elle prendrait la place de la dernière.</translation>
+        <translation>La grille affiche %1 colonnes de sortie et est pleine. Supprimez-en une avant d’en ajouter une autre&#xa0;; elle prendrait la place de la dernière.</translation>
     </message>
     <message>
         <source>About Zandor Designer</source>
@@ -985,7 +985,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>Tables: %1   Joins: %2</source>
-        <translation>Tables : %1   Jointures : %2</translation>
+        <translation>Tables&#xa0;: %1   Jointures&#xa0;: %2</translation>
     </message>
     <message>
         <source>&amp;Dark colours</source>
@@ -1039,7 +1039,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>DeletedTable: %1</source>
-        <translation>DeletedTable : %1</translation>
+        <translation>DeletedTable&#xa0;: %1</translation>
     </message>
     <message>
         <source>%1 (number %2)</source>
@@ -1047,11 +1047,11 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>wParam %1: the menu opens</source>
-        <translation>wParam %1 : le menu s’ouvre</translation>
+        <translation>wParam %1&#xa0;: le menu s’ouvre</translation>
     </message>
     <message>
         <source>wParam %1: the menu is closed</source>
-        <translation>wParam %1 : le menu est fermé</translation>
+        <translation>wParam %1&#xa0;: le menu est fermé</translation>
     </message>
 </context>
 <context>
@@ -1085,7 +1085,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>Save the changes to &quot;%1&quot;?</source>
-        <translation>Enregistrer les modifications de « %1 » ?</translation>
+        <translation>Enregistrer les modifications de «&#xa0;%1&#xa0;»&#xa0;?</translation>
     </message>
     <message>
         <source>Changes that are not saved are lost.</source>
@@ -1096,7 +1096,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <name>designer::FileExport</name>
     <message>
         <source>The file &quot;%1&quot; cannot be written (%2): check the folder and your permissions.</source>
-        <translation>Le fichier « %1 » ne peut pas être écrit (%2) : vérifiez le dossier et vos droits.</translation>
+        <translation>Le fichier «&#xa0;%1&#xa0;» ne peut pas être écrit (%2)&#xa0;: vérifiez le dossier et vos droits.</translation>
     </message>
 </context>
 <context>
@@ -1111,7 +1111,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>The join dialog counts what it offers: with one left out, each behind it counts as the one before. Leave out only from the end.</source>
-        <translation>La fenêtre de jointure compte ce qu’elle propose : s’il manque une entrée, chacune des suivantes vaut la précédente. N’en retirez qu’à la fin.</translation>
+        <translation>La fenêtre de jointure compte ce qu’elle propose&#xa0;: s’il manque une entrée, chacune des suivantes vaut la précédente. N’en retirez qu’à la fin.</translation>
     </message>
 </context>
 <context>
@@ -1125,15 +1125,15 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <name>designer::OptionsDialog</name>
     <message>
         <source>The entries of the context menu that are shown:</source>
-        <translation>Entrées affichées dans le menu contextuel :</translation>
+        <translation>Entrées affichées dans le menu contextuel&#xa0;:</translation>
     </message>
     <message>
         <source>What can be done with joins:</source>
-        <translation>Ce qui est possible avec les jointures :</translation>
+        <translation>Ce qui est possible avec les jointures&#xa0;:</translation>
     </message>
     <message>
         <source>For developers: each box must be answered before the control goes on, and there may be hundreds when a large query is shown.</source>
-        <translation>Pour les développeurs : il faut répondre à chaque message avant que le contrôle continue, et une grande requête peut en produire des centaines.</translation>
+        <translation>Pour les développeurs&#xa0;: il faut répondre à chaque message avant que le contrôle continue, et une grande requête peut en produire des centaines.</translation>
     </message>
     <message>
         <source>Options</source>
@@ -1163,10 +1163,6 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <translation>Valeurs pour la requête</translation>
     </message>
     <message>
-        <source>%1:</source>
-        <translation>%1 :</translation>
-    </message>
-    <message>
         <source>&amp;Run</source>
         <translation>&amp;Exécuter</translation>
     </message>
@@ -1191,7 +1187,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>&amp;Password:</source>
-        <translation>&amp;Mot de passe :</translation>
+        <translation>&amp;Mot de passe&#xa0;:</translation>
     </message>
 </context>
 <context>
@@ -1205,7 +1201,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <name>designer::Question</name>
     <message>
         <source>a pattern: * for any characters, ? for one</source>
-        <translation>un motif : * pour des caractères quelconques, ? pour un seul</translation>
+        <translation>un motif&#xa0;: * pour des caractères quelconques,&#xa0;? pour un seul</translation>
     </message>
     <message>
         <source>a text</source>
@@ -1255,7 +1251,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>&quot;%1&quot;</source>
-        <translation>« %1 »</translation>
+        <translation>«&#xa0;%1&#xa0;»</translation>
     </message>
     <message>
         <source>Recover Query</source>
@@ -1290,23 +1286,23 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>The name is the table&apos;s in this query only; the database stays as it is.</source>
-        <translation>Ce nom ne vaut que dans cette requête ; la base de données reste telle quelle.</translation>
+        <translation>Ce nom ne vaut que dans cette requête&#xa0;; la base de données reste telle quelle.</translation>
     </message>
     <message>
         <source>&amp;Table:</source>
-        <translation>&amp;Table :</translation>
+        <translation>&amp;Table&#xa0;:</translation>
     </message>
     <message>
         <source>&amp;New name:</source>
-        <translation>&amp;Nouveau nom :</translation>
+        <translation>&amp;Nouveau nom&#xa0;:</translation>
     </message>
     <message>
         <source>A table needs a name; type one.</source>
-        <translation>Une table a besoin d’un nom ; saisissez-en un.</translation>
+        <translation>Une table a besoin d’un nom&#xa0;; saisissez-en un.</translation>
     </message>
     <message>
         <source>Another table of this query is called &quot;%1&quot;; choose another name.</source>
-        <translation>Une autre table de cette requête s’appelle « %1 » ; choisissez un autre nom.</translation>
+        <translation>Une autre table de cette requête s’appelle «&#xa0;%1&#xa0;»&#xa0;; choisissez un autre nom.</translation>
     </message>
     <message>
         <source>Rename table %1</source>
@@ -1331,15 +1327,15 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <name>designer::ResultsPanel</name>
     <message>
         <source>These are too many cells to copy; export the rows instead.</source>
-        <translation>Ces cellules sont trop nombreuses pour être copiées ; exportez plutôt les lignes.</translation>
+        <translation>Ces cellules sont trop nombreuses pour être copiées&#xa0;; exportez plutôt les lignes.</translation>
     </message>
     <message>
         <source>No database is open: open one first.</source>
-        <translation>Aucune base de données n’est ouverte : ouvrez-en d’abord une.</translation>
+        <translation>Aucune base de données n’est ouverte&#xa0;: ouvrez-en d’abord une.</translation>
     </message>
     <message>
         <source>The query cannot be run yet:</source>
-        <translation>La requête ne peut pas encore être exécutée :</translation>
+        <translation>La requête ne peut pas encore être exécutée&#xa0;:</translation>
     </message>
     <message>
         <source>Cancelling…</source>
@@ -1355,7 +1351,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>%1  Rows so far: %2 · %3</source>
-        <translation>%1  Lignes jusqu’ici : %2 · %3</translation>
+        <translation>%1  Lignes jusqu’ici&#xa0;: %2 · %3</translation>
     </message>
     <message>
         <source>The server does not answer.</source>
@@ -1363,34 +1359,34 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>Exported to %1. Rows: %2 · %3</source>
-        <translation>Exporté vers %1. Lignes : %2 · %3</translation>
+        <translation>Exporté vers %1. Lignes&#xa0;: %2 · %3</translation>
     </message>
     <message>
         <source>Rows: %1 · %2</source>
-        <translation>Lignes : %1 · %2</translation>
+        <translation>Lignes&#xa0;: %1 · %2</translation>
     </message>
     <message>
         <source>First %1 rows; there are more · %2</source>
-        <translation>%1 premières lignes ; il y en a d’autres · %2</translation>
+        <translation>%1 premières lignes&#xa0;; il y en a d’autres · %2</translation>
     </message>
     <message>
         <source>Cancelled; nothing was exported · %1</source>
-        <translation>Annulé ; rien n’a été exporté · %1</translation>
+        <translation>Annulé&#xa0;; rien n’a été exporté · %1</translation>
     </message>
     <message>
         <source>Cancelled. Rows that came: %1 · %2</source>
-        <translation>Annulé. Lignes reçues : %1 · %2</translation>
+        <translation>Annulé. Lignes reçues&#xa0;: %1 · %2</translation>
     </message>
     <message>
         <source>The database did not run the statement:
 %1</source>
-        <translation>La base de données n’a pas exécuté l’instruction :
+        <translation>La base de données n’a pas exécuté l’instruction&#xa0;:
 %1</translation>
     </message>
     <message>
         <source>The connection to the database has broken down:
 %1</source>
-        <translation>La connexion à la base de données est rompue :
+        <translation>La connexion à la base de données est rompue&#xa0;:
 %1</translation>
     </message>
     <message>
@@ -1497,11 +1493,11 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <name>designer::Spool</name>
     <message>
         <source>No file for the rows can be made in &quot;%1&quot; (%2): set TMPDIR to a folder that you may write to.</source>
-        <translation>Impossible de créer un fichier pour les lignes dans « %1 » (%2) : donnez à TMPDIR un dossier où vous pouvez écrire.</translation>
+        <translation>Impossible de créer un fichier pour les lignes dans «&#xa0;%1&#xa0;» (%2)&#xa0;: donnez à TMPDIR un dossier où vous pouvez écrire.</translation>
     </message>
     <message>
         <source>The rows would fill the disk with the folder &quot;%1&quot;: make room there, or ask for fewer rows.</source>
-        <translation>Les lignes rempliraient le disque du dossier « %1 » : faites-y de la place, ou demandez moins de lignes.</translation>
+        <translation>Les lignes rempliraient le disque du dossier «&#xa0;%1&#xa0;»&#xa0;: faites-y de la place, ou demandez moins de lignes.</translation>
     </message>
 </context>
 <context>
@@ -1536,19 +1532,19 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>Add a table to begin: the statement appears here.</source>
-        <translation>Ajoutez une table pour commencer : l’instruction apparaît ici.</translation>
+        <translation>Ajoutez une table pour commencer&#xa0;: l’instruction apparaît ici.</translation>
     </message>
     <message>
         <source>%1 cannot say this query:</source>
-        <translation>%1 ne peut pas exprimer cette requête :</translation>
+        <translation>%1 ne peut pas exprimer cette requête&#xa0;:</translation>
     </message>
     <message>
         <source>Error: %1</source>
-        <translation>Erreur : %1</translation>
+        <translation>Erreur&#xa0;: %1</translation>
     </message>
     <message>
         <source>Warning: %1</source>
-        <translation>Avertissement : %1</translation>
+        <translation>Avertissement&#xa0;: %1</translation>
     </message>
     <message>
         <source>%1 (as the database)</source>
@@ -1705,11 +1701,11 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>The drawing takes %1 tables, and has them; delete one first.</source>
-        <translation>Le dessin accepte %1 tables et les a déjà ; supprimez-en d’abord une.</translation>
+        <translation>Le dessin accepte %1 tables et les a déjà&#xa0;; supprimez-en d’abord une.</translation>
     </message>
     <message>
         <source>The drawing takes %1 tables and has %2; choose fewer.</source>
-        <translation>Le dessin accepte %1 tables et en a %2 ; choisissez-en moins.</translation>
+        <translation>Le dessin accepte %1 tables et en a %2&#xa0;; choisissez-en moins.</translation>
     </message>
     <message>
         <source>Add table %1</source>
@@ -1725,7 +1721,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>The drawing takes %1 joins, and with this there would be %2; delete tables or joins first.</source>
-        <translation>Le dessin accepte %1 jointures, et il y en aurait %2 ; supprimez d’abord des tables ou des jointures.</translation>
+        <translation>Le dessin accepte %1 jointures, et il y en aurait %2&#xa0;; supprimez d’abord des tables ou des jointures.</translation>
     </message>
 </context>
 <context>
@@ -1827,19 +1823,19 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <name>designer::shell</name>
     <message>
         <source>Password for %1: </source>
-        <translation>Mot de passe pour %1 : </translation>
+        <translation>Mot de passe pour %1&#xa0;: </translation>
     </message>
     <message>
         <source>The query asks for &quot;%1&quot;; give it with --set &quot;%1=VALUE&quot;.</source>
-        <translation>La requête demande « %1 » ; donnez-le avec --set &quot;%1=VALEUR&quot;.</translation>
+        <translation>La requête demande «&#xa0;%1&#xa0;»&#xa0;; donnez-le avec --set &quot;%1=VALEUR&quot;.</translation>
     </message>
     <message>
         <source>The query asks for &quot;%1&quot;, which has to be %2; &quot;%3&quot; is not.</source>
-        <translation>La requête demande « %1 », qui doit être %2 ; « %3 » ne l’est pas.</translation>
+        <translation>La requête demande «&#xa0;%1&#xa0;», qui doit être %2&#xa0;; «&#xa0;%3&#xa0;» ne l’est pas.</translation>
     </message>
     <message>
         <source>The query does not ask for &quot;%1&quot;; leave out its --set.</source>
-        <translation>La requête ne demande pas « %1 » ; retirez son --set.</translation>
+        <translation>La requête ne demande pas «&#xa0;%1&#xa0;»&#xa0;; retirez son --set.</translation>
     </message>
     <message>
         <source>Cancelled.</source>
@@ -1847,19 +1843,19 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>The query names no database; give one with --database.</source>
-        <translation>La requête ne nomme aucune base de données ; indiquez-en une avec --database.</translation>
+        <translation>La requête ne nomme aucune base de données&#xa0;; indiquez-en une avec --database.</translation>
     </message>
     <message>
         <source>There is no format &quot;%1&quot;; write --format csv or --format json.</source>
-        <translation>Il n’y a pas de format « %1 » ; écrivez --format csv ou --format json.</translation>
+        <translation>Il n’y a pas de format «&#xa0;%1&#xa0;»&#xa0;; écrivez --format csv ou --format json.</translation>
     </message>
     <message>
         <source>--limit takes a number of rows; write --limit 100.</source>
-        <translation>--limit attend un nombre de lignes ; écrivez --limit 100.</translation>
+        <translation>--limit attend un nombre de lignes&#xa0;; écrivez --limit 100.</translation>
     </message>
     <message>
         <source>&quot;%1&quot; sets nothing; write --set NAME=VALUE.</source>
-        <translation>« %1 » ne fixe rien ; écrivez --set NOM=VALEUR.</translation>
+        <translation>«&#xa0;%1&#xa0;» ne fixe rien&#xa0;; écrivez --set NOM=VALEUR.</translation>
     </message>
     <message>
         <source>--sql and --run go one at a time.</source>
@@ -1875,18 +1871,18 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
     <message>
         <source>No query is named; write --%1 query.json.</source>
-        <translation>Aucune requête n’est nommée ; écrivez --%1 requete.json.</translation>
+        <translation>Aucune requête n’est nommée&#xa0;; écrivez --%1 requete.json.</translation>
     </message>
     <message>
         <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
-        <translation>Il n’y a pas de dialecte « %1 » ; sont connus sqlite, postgresql, mysql, sqlserver et standard.</translation>
+        <translation>Il n’y a pas de dialecte «&#xa0;%1&#xa0;»&#xa0;; sont connus sqlite, postgresql, mysql, sqlserver et standard.</translation>
     </message>
 </context>
 <context>
     <name>designer::writeAll</name>
     <message>
         <source>The rows cannot be written (%1): see that the disk has room and that you may write there.</source>
-        <translation>Les lignes ne peuvent pas être écrites (%1) : vérifiez qu’il y a de la place et que vous pouvez y écrire.</translation>
+        <translation>Les lignes ne peuvent pas être écrites (%1)&#xa0;: vérifiez qu’il y a de la place et que vous pouvez y écrire.</translation>
     </message>
 </context>
 <context>

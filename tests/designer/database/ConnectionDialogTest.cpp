@@ -141,6 +141,16 @@ TEST_F(TheConnectionDialog, SaysWhatWentWrongAndStaysUntilSomethingIsChanged) {
     EXPECT_EQ(error(), "");
 }
 
+TEST_F(TheConnectionDialog, OpensWithEnterAlsoAfterAnotherButtonHadTheFocus) {
+    dialog.activateWindow();
+    ASSERT_TRUE(until([&] { return dialog.isActiveWindow(); }));
+    for (auto* button : dialog.findChildren<QPushButton*>())
+        if (button->isVisible() && !button->isDefault()) button->setFocus();
+    write(field("File:"), QStringLiteral("/nowhere/a.sqlite"));
+    hands::key(field("File:"), Qt::Key_Return);
+    EXPECT_EQ(error(), "There is no file \"/nowhere/a.sqlite\"; check the path.");
+}
+
 TEST_F(TheConnectionDialog, CannotOpenNothing) {
     for (const auto* button : dialog.findChildren<QPushButton*>())
         EXPECT_NE(button->isDefault(), button->isEnabled()) << button->text().toStdString();

@@ -96,7 +96,7 @@ protected:
         calm();
     }
 
-    int steps() { return drawing.document.steps().count(); }
+    int steps() { return drawing.steps.count(); }
     std::string step() { return drawing.lastStep().toStdString(); }
 
     Drawing drawing;

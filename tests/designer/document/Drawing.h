@@ -45,13 +45,14 @@ struct Drawing {
         return query().AddColumnDefinition(definition);
     }
 
-    QString lastStep() {
-        QUndoStack& steps = document.steps();
+    /// Name of the newest step that there is already: asking does not make one.
+    QString lastStep() const {
         return steps.index() == 0 ? QString() : steps.command(steps.index() - 1)->text();
     }
 
     model::Library library;
     designer::Document document;
+    QUndoStack& steps = document.steps();
 };
 
 inline void returnToTheEventLoop() { QCoreApplication::processEvents(); }

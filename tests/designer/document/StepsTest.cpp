@@ -251,6 +251,7 @@ TEST(AStep, IsNamedAfterWhatChanged) {
     Drawing drawing(3);
     const auto named = [&](auto&& change) {
         change();
+        drawing.document.settle();
         return text(drawing.lastStep());
     };
     auto& query = drawing.query();

@@ -125,6 +125,14 @@ TEST_F(TheStatementPanel, CopiesTheStatement) {
     EXPECT_THAT(QGuiApplication::clipboard()->text().toStdString(), StartsWith("SELECT"));
 }
 
+TEST_F(TheStatementPanel, CopiesTheStatementOfTheMomentEvenWhileItCannotBeSeen) {
+    panel.hide();
+    drawn.table(u"orders");
+    drawn.finish();
+    panel.copy();
+    EXPECT_THAT(QGuiApplication::clipboard()->text().toStdString(), HasSubstr("FROM orders"));
+}
+
 TEST_F(TheStatementPanel, SaysWhyThereIsNoStatement) {
     const auto orders = drawn.table(u"orders");
     drawn.join(orders, drawn.table(u"customers", 3000), 3);
@@ -141,10 +149,18 @@ TEST_F(TheStatementPanel, SaysWhyThereIsNoStatement) {
 TEST_F(TheStatementPanel, ListsErrorsBeforeWarningsEachWithItsMark) {
     drawFaults();
     EXPECT_TRUE(list().isVisible());
+    drawn.document.change("Add", [this](model::Query& query) {
+        const auto all = drawn.library.NewZDColumnDefinition();
+        all->Column(query.tableNamed(u"orders")->Columns().Item(1));
+        all->SortOrder(1);
+        query.AddColumnDefinition(all);
+    });
+    ASSERT_TRUE(soon([&] { return list().count() == 3; }));
     EXPECT_EQ(list().item(0)->text(),
               "orders.name: At character 5: expected a pattern, as in Like 'A*'.");
     EXPECT_EQ(list().item(1)->text(), "No join connects customers with orders: every row of one "
                                       "comes with every row of the other.");
+    EXPECT_EQ(list().item(2)->text(), "orders.* cannot be sorted: sort one of its columns.");
     EXPECT_THAT(list().item(0)->data(Qt::AccessibleTextRole).toString().toStdString(),
                 StartsWith("Error: orders.name"));
     EXPECT_THAT(list().item(1)->data(Qt::AccessibleTextRole).toString().toStdString(),
