@@ -64,7 +64,7 @@ struct ListChange {
     };
     std::vector<Placed> gone = {}; ///< by position in the list before
     std::vector<Placed> come = {}; ///< by position in the list after
-    std::vector<Pair> changed = {};
+    std::vector<Pair> changed = {}; ///< in the order of the list
 
     bool empty() const { return gone.empty() && come.empty() && changed.empty(); }
     ListChange reversed() const {

@@ -4,13 +4,14 @@
 
 namespace model {
 
-Ref<TalvikZandorLib::ZDColumn> ColumnDefinition::Column() const { return mPlace.column(); }
+Ref<TalvikZandorLib::ZDColumn> ColumnDefinition::Column() const { return mPlace->column(); }
 
 void ColumnDefinition::Column(const Ref<TalvikZandorLib::ZDColumn>& value) {
     const ColumnPlace place = placeOf(value);
     if (!mKey.empty()) {
         if (place.empty()) throw platform::errors::objectNotSet();
-        if (!place.table().sameHome(mPlace.table())) throw platform::errors::invalidProcedureCall();
+        if (!place.table().sameHome(mPlace->table()))
+            throw platform::errors::invalidProcedureCall();
     }
     mPlace = place;
 }

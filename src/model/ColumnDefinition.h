@@ -32,16 +32,20 @@ public:
 
     const class Criteria& criteria() const { return mCriteria; }
     const ColumnPlace& place() const { return mPlace; }
+    /// Raised by its criteria too.
+    Revision& revision() { return *mRevision; }
 
 private:
     friend class Query; ///< gives the key
 
-    ColumnPlace mPlace;
-    String mSynonym;
-    std::int16_t mSortOrder = 0;
-    bool mVisible = true;
+    // Shared with the criteria, which may be held longer.
+    const std::shared_ptr<Revision> mRevision = std::make_shared<Revision>();
+    Revised<ColumnPlace> mPlace{*mRevision};
+    Revised<String> mSynonym{*mRevision};
+    Revised<std::int16_t> mSortOrder{*mRevision};
+    Revised<bool> mVisible{*mRevision, true};
     String mKey;
-    class Criteria mCriteria;
+    model::Criteria mCriteria{mRevision};
 };
 
 } // namespace model

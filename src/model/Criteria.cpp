@@ -28,7 +28,7 @@ std::int32_t Criteria::Count() const {
 Ref<TalvikZandorLib::ZDCriterium> Criteria::Item(std::int32_t position) const {
     if (position < 1 || position > Count()) throw platform::errors::subscriptOutOfRange();
     const auto at = mRows.find(static_cast<std::int16_t>(position - 1 + firstRow));
-    if (at == mRows.end()) return platform::makeRef<RowCriterium>();
+    if (at == mRows.end()) return platform::makeRef<RowCriterium>(std::make_shared<Revision>());
     return at->second;
 }
 
@@ -40,6 +40,7 @@ Ref<TalvikZandorLib::ZDCriterium> Criteria::Item(const String& key) const {
 void Criteria::Remove(const String& key) {
     if (!Contains(key)) throw platform::errors::invalidProcedureCall();
     mRows.erase(*rowOf(key));
+    mRevision->raise();
 }
 
 bool Criteria::Contains(const String& key) const {
@@ -50,8 +51,14 @@ bool Criteria::Contains(const String& key) const {
 void Criteria::Add(const String& text, const String& key) {
     const auto row = rowOf(key);
     if (!row) throw platform::errors::invalidProcedureCall();
-    if (!mRows.emplace(*row, platform::makeRef<RowCriterium>(text)).second)
+    if (!mRows.emplace(*row, platform::makeRef<RowCriterium>(mRevision, text)).second)
         throw platform::errors::duplicateKey();
+    mRevision->raise();
+}
+
+void Criteria::clear() {
+    mRows.clear();
+    mRevision->raise();
 }
 
 } // namespace model

@@ -12,7 +12,9 @@ using platform::String;
 /// The criterion of one row.
 class RowCriterium final : public TalvikZandorLib::ZDCriterium {
 public:
-    explicit RowCriterium(String text = {}) : mText(std::move(text)) {}
+    /// `revision` is that of the definition, raised also after the criterium was removed from it.
+    explicit RowCriterium(std::shared_ptr<Revision> revision, String text = {})
+        : mRevision(std::move(revision)), mText(*mRevision, std::move(text)) {}
     String Criterium() const override { return mText; }
     /// The names in a new text mean what they name when the query is next read or changed.
     void Criterium(const String& value) override { tie(value, {}); }
@@ -26,8 +28,9 @@ public:
     }
 
 private:
-    String mText;
-    criteria::References mReferences;
+    const std::shared_ptr<Revision> mRevision;
+    Revised<String> mText;
+    Revised<criteria::References> mReferences{*mRevision};
 };
 
 /// The criteria of one definition by grid row, 4 to 32767. Keys are rows in decimal: "4", "5".
@@ -37,6 +40,9 @@ private:
 class Criteria final : public TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDCriterium> {
 public:
     static constexpr std::int16_t firstRow = 4;
+
+    /// `revision` is that of the definition.
+    explicit Criteria(std::shared_ptr<Revision> revision) : mRevision(std::move(revision)) {}
 
     /// Rows from the first to the last one that has a criterium.
     std::int32_t Count() const override;
@@ -48,11 +54,13 @@ public:
     /// Error 457 when the row has a criterium, error 5 when the key is no row; nothing is added
     /// then.
     void Add(const String& text, const String& key);
+    void clear();
 
     /// The criteria that there are, in the order of their rows.
     const std::map<std::int16_t, Ref<RowCriterium>>& rows() const { return mRows; }
 
 private:
+    const std::shared_ptr<Revision> mRevision;
     std::map<std::int16_t, Ref<RowCriterium>> mRows;
 };
 

@@ -7,10 +7,10 @@ namespace model {
 using TalvikZandorLib::ZDColumn;
 using TalvikZandorLib::ZDTable;
 
-Ref<ZDTable> Join::LeftTable() const { return mLeft.table().table(); }
-Ref<ZDTable> Join::RightTable() const { return mRight.table().table(); }
-Ref<ZDColumn> Join::LeftColumn() const { return mLeft.column(); }
-Ref<ZDColumn> Join::RightColumn() const { return mRight.column(); }
+Ref<ZDTable> Join::LeftTable() const { return mLeft->table().table(); }
+Ref<ZDTable> Join::RightTable() const { return mRight->table().table(); }
+Ref<ZDColumn> Join::LeftColumn() const { return mLeft->column(); }
+Ref<ZDColumn> Join::RightColumn() const { return mRight->column(); }
 
 void Join::LeftTable(const Ref<ZDTable>& value) { setTable(mLeft, value); }
 void Join::RightTable(const Ref<ZDTable>& value) { setTable(mRight, value); }
@@ -27,20 +27,20 @@ void Join::CompareOperator(std::int16_t value) {
     mCompareOperator = value;
 }
 
-void Join::setTable(ColumnPlace& end, const Ref<ZDTable>& value) {
+void Join::setTable(Revised<ColumnPlace>& end, const Ref<ZDTable>& value) {
     const TablePlace place = placeOf(value);
-    requireHome(end.table(), place);
-    if (!(place == end.table())) end = ColumnPlace(place, {});
+    requireHome(end->table(), place);
+    if (!(place == end->table())) end = ColumnPlace(place, {});
 }
 
-void Join::setColumn(ColumnPlace& end, const Ref<ZDColumn>& value) {
+void Join::setColumn(Revised<ColumnPlace>& end, const Ref<ZDColumn>& value) {
     const ColumnPlace place = placeOf(value);
-    requireHome(end.table(), place.table());
+    requireHome(end->table(), place.table());
     if (place.empty()) {
-        end = ColumnPlace(end.table(), {});
+        end = ColumnPlace(end->table(), {});
         return;
     }
-    if (!end.table().empty() && !(end.table() == place.table()))
+    if (!end->table().empty() && !(end->table() == place.table()))
         throw platform::errors::invalidProcedureCall();
     end = place;
 }

@@ -36,18 +36,20 @@ public:
     /// The ends by key. Their columns are empty as long as none is set.
     const ColumnPlace& left() const { return mLeft; }
     const ColumnPlace& right() const { return mRight; }
+    Revision& revision() { return mRevision; }
 
 private:
     friend class Query; ///< gives the key
 
-    void setTable(ColumnPlace& end, const Ref<TalvikZandorLib::ZDTable>& value);
-    void setColumn(ColumnPlace& end, const Ref<TalvikZandorLib::ZDColumn>& value);
+    void setTable(Revised<ColumnPlace>& end, const Ref<TalvikZandorLib::ZDTable>& value);
+    void setColumn(Revised<ColumnPlace>& end, const Ref<TalvikZandorLib::ZDColumn>& value);
     void requireHome(const TablePlace& end, const TablePlace& value) const;
 
-    ColumnPlace mLeft;
-    ColumnPlace mRight;
-    std::int16_t mJoinType = 0;
-    std::int16_t mCompareOperator = 0;
+    Revision mRevision;
+    Revised<ColumnPlace> mLeft{mRevision};
+    Revised<ColumnPlace> mRight{mRevision};
+    Revised<std::int16_t> mJoinType{mRevision};
+    Revised<std::int16_t> mCompareOperator{mRevision};
     String mKey;
 };
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/KeyedCollection.h"
+#include "model/Items.h"
 
 /// How joins and definitions name their tables and columns: by key within one query's tables. A
 /// place holds no table, so nothing owns in a circle, and it may outlive the query.
@@ -12,8 +12,8 @@ using platform::String;
 class Column;
 class Table;
 
-/// The tables of one query; every item is a model::Table.
-using Tables = platform::KeyedCollection<TalvikZandorLib::ZDTable>;
+/// The tables of one query.
+using Tables = Items<Table, TalvikZandorLib::ZDTable>;
 
 class TablePlace {
 public:

@@ -37,18 +37,18 @@ void removeIf(TalvikZandorLib::EditableCollection<Interface>& items, Test hangs)
 
 Ref<ZDJoin> Query::AddJoin(const Ref<ZDJoin>& join) {
     const auto added = own<Join>(join);
-    added->mLeft.require(mTables);
-    added->mRight.require(mTables);
+    added->mLeft->require(mTables);
+    added->mRight->require(mTables);
     if (added->mKey.empty()) added->mKey = nextKey(u'j', mLastJoin);
-    mJoins.Add(added, added->mKey);
+    mJoins.Add(added);
     return added;
 }
 
 Ref<ZDColumnDefinition> Query::AddColumnDefinition(const Ref<ZDColumnDefinition>& definition) {
     const auto added = own<ColumnDefinition>(definition);
-    added->mPlace.require(mTables);
+    added->mPlace->require(mTables);
     if (added->mKey.empty()) added->mKey = nextKey(u'x', mLastDefinition);
-    mDefinitions.Add(added, added->mKey);
+    mDefinitions.Add(added);
     // One that comes back may have missed that a table was renamed.
     criteria::followNames(*added);
     return added;
@@ -85,7 +85,7 @@ Ref<Table> Query::addTable(const TableDescription& source) {
 
     const auto table =
         makeRef<Table>(place, std::move(name), source.schema, source.name, std::move(columns));
-    mTables->Add(table, place.key());
+    mTables->Add(table);
     return table;
 }
 

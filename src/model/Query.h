@@ -13,8 +13,8 @@ namespace model {
 /// held longer than the query, and then know nothing of each other.
 ///
 /// Keys are a letter and a number ("t1" tables, "c1" columns, "j1" joins, "x1" definitions) and are
-/// never given twice in a query, not even after the object was deleted. Only a change that is undone
-/// takes the keys back that it gave.
+/// never given twice in a query, not even after the object was deleted. Only a change that is
+/// undone takes the keys back that it gave.
 class Query final : public TalvikZandorLib::Zandor {
 public:
     Query() = default;
@@ -66,6 +66,8 @@ public:
     void apply(const Change& change);
 
 private:
+    friend class Snapshot; ///< reads the log
+
     void set(const TableState& state);
     void set(const JoinState& state);
     void set(const DefinitionState& state);
@@ -77,10 +79,12 @@ private:
     void tieCriteria();
     void requireOwn(const Ref<TalvikZandorLib::ZDTable>& table) const;
 
+    // Shared with the objects, which may be held longer than the query.
+    const std::shared_ptr<ChangeLog> mLog = std::make_shared<ChangeLog>();
     // Shared so that joins and definitions can tell whether the query is still there.
-    const std::shared_ptr<model::Tables> mTables = std::make_shared<model::Tables>();
-    platform::KeyedCollection<TalvikZandorLib::ZDJoin> mJoins;
-    platform::KeyedCollection<TalvikZandorLib::ZDColumnDefinition> mDefinitions;
+    const std::shared_ptr<model::Tables> mTables = std::make_shared<model::Tables>(mLog);
+    Items<Join, TalvikZandorLib::ZDJoin> mJoins{mLog};
+    Items<ColumnDefinition, TalvikZandorLib::ZDColumnDefinition> mDefinitions{mLog};
     std::int32_t mLastTable = 0;
     std::int32_t mLastColumn = 0;
     std::int32_t mLastJoin = 0;

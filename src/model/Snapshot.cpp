@@ -3,7 +3,7 @@
 #include "model/Query.h"
 
 #include <algorithm>
-#include <unordered_map>
+#include <iterator>
 
 namespace model {
 
@@ -29,60 +29,85 @@ DefinitionState stateOf(Ref<ColumnDefinition> definition) {
     return state;
 }
 
-template <class Object, class State, class Interface>
-std::vector<State> statesOf(const TalvikZandorLib::Collection<Interface>& items) {
-    std::vector<State> states;
-    states.reserve(static_cast<std::size_t>(items.Count()));
-    for (const auto& item : platform::Each<Interface>(items))
-        states.push_back(stateOf(std::static_pointer_cast<Object>(item)));
-    return states;
-}
+} // namespace
 
 template <class State>
-ListChange<State> difference(const std::vector<State>& before, const std::vector<State>& after) {
+template <class Object, class Interface>
+ListChange<State> Snapshot::List<State>::update(const Items<Object, Interface>& items,
+                                                const std::vector<const Revision*>& revised) {
     ListChange<State> change;
-    const auto compare = [&](const State& old, const State& now) {
-        if (!(old == now)) change.changed.push_back({old, now});
-    };
-    const auto same = [](const State& old, const State& now) { return old.object == now.object; };
-    // Nearly always all that there is; what it leaves is where something has come or gone.
-    const auto [begin, nowBegin] =
-        std::mismatch(before.begin(), before.end(), after.begin(), after.end(), same);
-    for (auto old = before.begin(), now = after.begin(); old != begin;) compare(*old++, *now++);
-
-    std::unordered_map<const void*, std::size_t> places;
-    const auto first = static_cast<std::size_t>(nowBegin - after.begin());
-    for (std::size_t at = first; at < after.size(); ++at) places[after[at].object.get()] = at;
-    std::vector<bool> stayed(after.size(), false);
-    std::size_t next = first;
-    for (auto old = begin; old != before.end(); ++old) {
-        const auto place = places.find(old->object.get());
-        if (place == places.end() || place->second < next) {
-            change.gone.push_back({static_cast<std::int32_t>(old - before.begin()) + 1, *old});
-            continue;
-        }
-        compare(*old, after[place->second]);
-        stayed[place->second] = true;
-        next = place->second + 1;
+    if (std::find(revised.begin(), revised.end(), &items.revision()) != revised.end())
+        updateOrder(items, change);
+    for (const Revision* revision : revised) {
+        const auto known = mStates.find(revision);
+        if (known == mStates.end()) continue;
+        State& state = known->second;
+        State now = stateOf(state.object);
+        if (state == now) continue;
+        change.changed.push_back({std::exchange(state, now), now});
     }
-    for (std::size_t at = first; at < after.size(); ++at)
-        if (!stayed[at]) change.come.push_back({static_cast<std::int32_t>(at) + 1, after[at]});
+    if (change.changed.size() > 1) sort(change.changed);
     return change;
 }
 
-} // namespace
+template <class State>
+template <class Object, class Interface>
+void Snapshot::List<State>::updateOrder(const Items<Object, Interface>& items,
+                                        ListChange<State>& change) {
+    const std::vector<const Revision*> before = std::move(mOrder);
+    mOrder.clear();
+    for (std::int32_t position = 1; position <= items.Count(); ++position)
+        mOrder.push_back(&items.own(position)->revision());
+    const auto& after = mOrder;
+
+    // What is between the ends that are alike has come, gone or moved.
+    const auto [begin, nowBegin] =
+        std::mismatch(before.begin(), before.end(), after.begin(), after.end());
+    const auto [end, nowEnd] = std::mismatch(before.rbegin(), std::make_reverse_iterator(begin),
+                                             after.rbegin(), std::make_reverse_iterator(nowBegin));
+    const auto positionOf = [](const auto& list, auto at) {
+        return static_cast<std::int32_t>(at - list.begin()) + 1;
+    };
+    std::unordered_map<const Revision*, std::int32_t> moved;
+    for (auto now = nowBegin; now != nowEnd.base(); ++now)
+        moved.emplace(*now, positionOf(after, now));
+    std::int32_t last = 0;
+    for (auto old = begin; old != end.base(); ++old) {
+        const auto at = moved.find(*old);
+        if (at != moved.end() && at->second > last) {
+            last = at->second;
+            moved.erase(at);
+            continue;
+        }
+        auto state = mStates.extract(*old);
+        change.gone.push_back({positionOf(before, old), std::move(state.mapped())});
+    }
+    for (auto now = nowBegin; now != nowEnd.base(); ++now) {
+        if (!moved.contains(*now)) continue;
+        const std::int32_t position = positionOf(after, now);
+        const State& state = mStates.emplace(*now, stateOf(items.own(position))).first->second;
+        change.come.push_back({position, state});
+    }
+}
+
+/// Into the order of the list.
+template <class State>
+void Snapshot::List<State>::sort(std::vector<typename ListChange<State>::Pair>& changed) const {
+    std::unordered_map<const Revision*, std::size_t> positions;
+    for (std::size_t position = 0; position < mOrder.size(); ++position)
+        positions[mOrder[position]] = position;
+    const auto at = [&](const auto& pair) { return positions.at(&pair.after.object->revision()); };
+    std::sort(changed.begin(), changed.end(),
+              [&](const auto& left, const auto& right) { return at(left) < at(right); });
+}
 
 Change Snapshot::update(Query& query) {
-    const LastKeys last = query.lastKeys();
-    auto tables = statesOf<Table, TableState>(query.Tables());
-    auto joins = statesOf<Join, JoinState>(query.Joins());
-    auto definitions = statesOf<ColumnDefinition, DefinitionState>(query.ColumnDefinitions());
-    Change change{mLastKeys, last, difference(mTables, tables), difference(mJoins, joins),
-                  difference(mDefinitions, definitions)};
-    mLastKeys = last;
-    mTables = std::move(tables);
-    mJoins = std::move(joins);
-    mDefinitions = std::move(definitions);
+    const auto revised = query.mLog->since(mMoment);
+    Change change{mLastKeys, query.lastKeys(), mTables.update(*query.mTables, revised),
+                  mJoins.update(query.mJoins, revised),
+                  mDefinitions.update(query.mDefinitions, revised)};
+    mMoment = query.mLog->now();
+    mLastKeys = change.lastAfter;
     return change;
 }
 

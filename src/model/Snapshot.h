@@ -1,6 +1,9 @@
 #pragma once
 
 #include "model/Change.h"
+#include "model/Items.h"
+
+#include <unordered_map>
 
 namespace model {
 
@@ -13,14 +16,35 @@ public:
     explicit Snapshot(Query& query) { update(query); }
 
     /// What came about since the last time; from now on the query is remembered as it is. Always of
-    /// the same query.
+    /// the same query. Takes as long as there were changes; only when a list has got or lost items
+    /// is its order gone through.
     Change update(Query& query);
 
 private:
+    /// One list of the query.
+    template <class State>
+    class List {
+    public:
+        /// `revised` is what the query's log has written since the last time.
+        template <class Object, class Interface>
+        ListChange<State> update(const Items<Object, Interface>& items,
+                                 const std::vector<const Revision*>& revised);
+
+    private:
+        template <class Object, class Interface>
+        void updateOrder(const Items<Object, Interface>& items, ListChange<State>& change);
+        void sort(std::vector<typename ListChange<State>::Pair>& changed) const;
+
+        // Objects go by their revisions, and none is gone as long as a state holds its object.
+        std::vector<const Revision*> mOrder;
+        std::unordered_map<const Revision*, State> mStates;
+    };
+
+    ChangeLog::Moment mMoment = 0;
     LastKeys mLastKeys;
-    std::vector<TableState> mTables;
-    std::vector<JoinState> mJoins;
-    std::vector<DefinitionState> mDefinitions;
+    List<TableState> mTables;
+    List<JoinState> mJoins;
+    List<DefinitionState> mDefinitions;
 };
 
 } // namespace model

@@ -7,7 +7,7 @@ namespace model {
 
 Table::Table(TablePlace place, String name, String schema, String sourceName,
              platform::KeyedCollection<TalvikZandorLib::ZDColumn> columns)
-    : mPlace(std::move(place)), mName(std::move(name)), mSchema(std::move(schema)),
+    : mPlace(std::move(place)), mName(mRevision, std::move(name)), mSchema(std::move(schema)),
       mSourceName(std::move(sourceName)), mColumns(std::move(columns)) {}
 
 void Table::Left(float value) { mLeft = platform::toLong(value); }

@@ -37,6 +37,8 @@ public:
     const String& sourceName() const { return mSourceName; }
     const String& schema() const { return mSchema; }
     const TablePlace& place() const { return mPlace; }
+    /// Raised by everything but selections.
+    Revision& revision() { return mRevision; }
     /// The column with a key, or nothing.
     Ref<Column> column(const String& key) const;
     /// The column of exactly this name, else one whose name differs in case only, else nothing;
@@ -49,14 +51,15 @@ private:
     friend class Query; ///< renames, for only the query knows which names are free
 
     const TablePlace mPlace;
-    String mName;
+    Revision mRevision;
+    Revised<String> mName;
     const String mSchema;
     const String mSourceName;
     platform::KeyedCollection<TalvikZandorLib::ZDColumn> mColumns;
-    std::int32_t mLeft = -1;
-    std::int32_t mTop = -1;
-    std::int32_t mWidth = 0;
-    std::int32_t mHeight = 0;
+    Revised<std::int32_t> mLeft{mRevision, -1};
+    Revised<std::int32_t> mTop{mRevision, -1};
+    Revised<std::int32_t> mWidth{mRevision};
+    Revised<std::int32_t> mHeight{mRevision};
     std::int16_t mSelected = 0;
 };
 

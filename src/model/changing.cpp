@@ -34,7 +34,7 @@ void apply(Items& items, const ListChange<State>& change, Set set) {
     for (const auto& gone : change.gone) items.Remove(gone.state.object->Key());
     for (const auto& come : change.come) {
         set(come.state);
-        items.Insert(come.position, come.state.object, come.state.object->Key());
+        items.Insert(come.position, come.state.object);
     }
     for (const auto& pair : change.changed) set(pair.after);
 }
@@ -81,7 +81,7 @@ void Query::set(const DefinitionState& state) {
     definition.mSynonym = state.synonym;
     definition.mSortOrder = state.sortOrder;
     definition.mVisible = state.visible;
-    definition.mCriteria = {};
+    definition.mCriteria.clear();
     for (const CriterionState& criterion : state.criteria) {
         definition.mCriteria.Add(criterion.text, platform::decimal(criterion.row));
         definition.mCriteria.rows().at(criterion.row)->tie(criterion.text, criterion.references);

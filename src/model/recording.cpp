@@ -91,7 +91,7 @@ Ref<Query> Query::restored(const QueryRecord& record) {
         join->mJoinType = from.type;
         join->mCompareOperator = from.comparison;
         join->mKey = from.key;
-        query->mJoins.Add(join, from.key);
+        query->mJoins.Add(join);
     }
     std::map<String, ColumnPlace> places;
     for (const TableRecord& table : record.tables)
@@ -114,7 +114,7 @@ Ref<Query> Query::restored(const QueryRecord& record) {
                                          : query->restoredEnd({name.table, name.column})});
             definition->criteria().rows().at(criterion.row)->tie(criterion.text, references);
         }
-        query->mDefinitions.Add(definition, from.key);
+        query->mDefinitions.Add(definition);
     }
     return query;
 }
@@ -135,7 +135,7 @@ void Query::restoreTable(const TableRecord& record) {
     table->mWidth = record.width;
     table->mHeight = record.height;
     table->mSelected = record.selected;
-    mTables->Add(table, record.key);
+    mTables->Add(table);
 }
 
 // Also an end that reads as nothing is of this query, so that it can be set again.

@@ -30,8 +30,8 @@ struct QueryDocument {
     QueryDocument(platform::Ref<model::Query> query) : query(std::move(query)) {}
 
     platform::Ref<model::Query> query = platform::makeRef<model::Query>();
-    /// Address of the database that the query asks, for the program that opens the file; empty: none
-    /// is known. Written as it stands, so it must not have a password in it.
+    /// Address of the database that the query asks, for the program that opens the file; empty:
+    /// none is known. Written as it stands, so it must not have a password in it.
     platform::String database = {};
     std::shared_ptr<const Unknown> unknown = {};
 };

@@ -1,0 +1,43 @@
+#pragma once
+
+#include "model/Revision.h"
+#include "platform/KeyedCollection.h"
+
+namespace model {
+
+/// What a query consists of: its tables, its joins or its definitions, which write their changes
+/// into the query's log from their adding on. So does the list, when something comes or goes.
+///
+/// Every item is an Own, which has a Key() and a revision().
+template <class Own, class Interface>
+class Items final : public platform::KeyedCollection<Interface> {
+    using Base = platform::KeyedCollection<Interface>;
+
+public:
+    explicit Items(std::shared_ptr<ChangeLog> log) : mLog(std::move(log)) { mRevision.enter(mLog); }
+
+    /// Error 457 when an item has the same key; nothing is added then.
+    void Add(const platform::Ref<Own>& item) { Insert(this->Count() + 1, item); }
+    /// As KeyedCollection::Insert.
+    void Insert(std::int32_t position, const platform::Ref<Own>& item) {
+        Base::Insert(position, item, item->Key());
+        item->revision().enter(mLog);
+        mRevision.raise();
+    }
+    void Remove(const platform::String& key) override {
+        Base::Remove(key);
+        mRevision.raise();
+    }
+
+    platform::Ref<Own> own(std::int32_t position) const {
+        return std::static_pointer_cast<Own>(this->Item(position));
+    }
+    /// Of which items there are, and in which order.
+    const Revision& revision() const { return mRevision; }
+
+private:
+    const std::shared_ptr<ChangeLog> mLog;
+    Revision mRevision;
+};
+
+} // namespace model
