@@ -80,7 +80,8 @@ public:
         return mServer ? model::sql::Dialect::PostgreSQL : model::sql::Dialect::SQLite;
     }
     designer::Command command(std::optional<qint64> limit = {}) const {
-        return makeCommand(designer::statementFor(*query, dialect(), limit), dialect(), {}, limit);
+        return designer::makeCommand(designer::statementFor(*query, dialect(), limit), dialect(),
+                                     {}, limit);
     }
 
     QString address;
@@ -184,8 +185,8 @@ void scrolling(benchmark::State& state) {
     const auto show = [&](designer::ResultTable& table, qint64 limit) {
         const auto spool = std::make_shared<designer::Spool>();
         const std::atomic<bool> stop = false;
-        const auto outcome = fetch(designer::Database::connectorTo(rows.address, {}),
-                                   rows.command(limit), *spool, stop);
+        const auto outcome = designer::fetch(designer::Database::connectorTo(rows.address, {}),
+                                             rows.command(limit), *spool, stop);
         if (outcome.rows != limit) qFatal("%s", qPrintable(outcome.message));
         table.rows().setSpool(spool);
         table.rows().refresh();

@@ -21,6 +21,11 @@ void useOwnColours() {
     QApplication::setPalette(QPalette());
 }
 
+bool areColoursDark() {
+    constexpr int middle = 128;
+    return QGuiApplication::palette().color(QPalette::Window).lightness() < middle;
+}
+
 void useDarkColours() {
     if (ownStyle().isEmpty()) ownStyle() = QApplication::style()->name();
     // Fusion follows the palette in every part; a desktop's own style need not.

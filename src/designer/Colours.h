@@ -8,4 +8,7 @@ void useDarkColours();
 /// Gives it the desktop's own colours again.
 void useOwnColours();
 
+/// Whether the application's colours of the moment are dark.
+bool areColoursDark();
+
 } // namespace designer

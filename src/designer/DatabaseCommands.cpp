@@ -6,10 +6,12 @@
 #include "designer/document/QueryFile.h"
 #include "designer/document/RecentFiles.h"
 #include "designer/document/RecentMenu.h"
+#include "designer/statement/ModelWords.h"
 
 #include <QFileDialog>
 #include <QMenu>
 #include <QMessageBox>
+#include <QPushButton>
 
 namespace designer {
 
@@ -17,7 +19,7 @@ DatabaseCommands::DatabaseCommands(Database& database, QueryFile& file, FileDial
                                    RecentFiles& recent, QWidget& window)
     : QObject(&window), mDatabase(database), mFile(file), mFiles(files), mRecent(recent),
       mWindow(window), mOpenFile(tr("Open SQLite &file\u2026")),
-      mConnect(tr("&Connect to a server\u2026")), mReconnect(tr("&Reconnect")) {
+      mConnect(tr("&Connect to a server\u2026")), mReconnect(tr("Reco&nnect")) {
     mOpenFile.setObjectName(QStringLiteral("openDatabaseFile"));
     mConnect.setObjectName(QStringLiteral("connect"));
     mReconnect.setObjectName(QStringLiteral("reconnect"));
@@ -54,7 +56,7 @@ void DatabaseCommands::openAddress(const QString& address) {
     if (!mFiles.mayLose()) return;
     const Opening opening = openAskingForPassword(mDatabase, address, &mWindow);
     if (!opening.error.isEmpty())
-        QMessageBox::warning(&mWindow, tr("Open database"), opening.error);
+        QMessageBox::warning(&mWindow, tr("Open database"), inWords(opening.error));
     if (opening.opened) begin();
 }
 
@@ -69,9 +71,17 @@ void DatabaseCommands::followFile() {
     if (!address || (mDatabase.isOpen() && *address == mDatabase.address())) return;
     const Opening opening = openAskingForPassword(mDatabase, *address, &mWindow);
     if (opening.opened) return;
-    QMessageBox::warning(
-        &mWindow, tr("Open database"),
-        tr("The query is open, but not its database. %1").arg(opening.error).trimmed());
+    QMessageBox box(
+        QMessageBox::Warning, tr("Open database"),
+        tr("The query is open, but not its database. %1").arg(inWords(opening.error)).trimmed(),
+        QMessageBox::Close, &mWindow);
+    const auto* another = box.addButton(tr("&Choose database\u2026"), QMessageBox::AcceptRole);
+    box.exec();
+    if (box.clickedButton() != another) return;
+    // The query keeps what it has; it may have moved.
+    ConnectionDialog dialog(mDatabase, &mWindow);
+    dialog.setAddress(*address);
+    dialog.exec();
 }
 
 void DatabaseCommands::askForFile() {
@@ -84,12 +94,16 @@ void DatabaseCommands::askForFile() {
 void DatabaseCommands::askForConnection() {
     if (!mFiles.mayLose()) return;
     ConnectionDialog dialog(mDatabase, &mWindow);
+    // It is a server that is asked for; most often another database of the same one.
+    dialog.setAddress(mDatabase.isServer() ? mDatabase.address()
+                                           : QStringLiteral("postgresql://localhost"));
     if (dialog.exec() == QDialog::Accepted) begin();
 }
 
 void DatabaseCommands::reconnect() {
     const Opening opening = renewPatiently(mDatabase, &mWindow);
-    if (!opening.error.isEmpty()) QMessageBox::warning(&mWindow, tr("Reconnect"), opening.error);
+    if (!opening.error.isEmpty())
+        QMessageBox::warning(&mWindow, tr("Reconnect"), inWords(opening.error));
 }
 
 } // namespace designer

@@ -30,7 +30,8 @@ public:
     void openAddress(const QString& address);
     /// The same for the program's start, with nothing to lose yet. Returns what went wrong.
     QString openAtFirst(const QString& address);
-    /// Opens the database that the query's file names, if it is another than the open one.
+    /// Opens the database that the query's file names, if it is another than the open one; offers
+    /// to choose where it is now when that fails.
     void followFile();
 
 private:

@@ -2,6 +2,7 @@
 
 #include "designer/Colours.h"
 #include "designer/DatabaseCommands.h"
+#include "designer/Invitation.h"
 #include "designer/OpenedQuery.h"
 #include "designer/Screen.h"
 #include "designer/canvasSize.h"
@@ -26,11 +27,13 @@
 #include <QCloseEvent>
 #include <QDockWidget>
 #include <QLabel>
+#include <QLineEdit>
 #include <QMenuBar>
 #include <QMessageBox>
 #include <QMimeData>
 #include <QScreen>
 #include <QStatusBar>
+#include <QToolButton>
 #include <QVBoxLayout>
 
 namespace designer {
@@ -70,6 +73,7 @@ DesignerWindow::DesignerWindow()
     restoreLayout();
     showTitle();
     showCounts();
+    offerCommands();
 }
 
 DesignerWindow::~DesignerWindow() {
@@ -99,10 +103,11 @@ void DesignerWindow::makePanels() {
     events->hide();
     resizeDocks({findChild<QDockWidget*>(QStringLiteral("tablesDock"))}, {220}, Qt::Horizontal);
     resizeDocks({statement}, {220}, Qt::Vertical);
-    connect(mResults->runAction(), &QAction::triggered, results, [results] {
-        results->show();
-        results->raise();
-    });
+    for (const QAction* action : {mResults->runAction(), mResults->exportAction()})
+        connect(action, &QAction::triggered, results, [results] {
+            results->show();
+            results->raise();
+        });
 }
 
 QDockWidget* DesignerWindow::dock(QWidget* panel, const QString& name, const QString& title,
@@ -157,7 +162,8 @@ void DesignerWindow::makeMenus() {
     edit->addActions({undo, redo});
     edit->addSeparator();
     edit->addAction(&mShow->copyPicture);
-    command(edit, tr("Copy &SQL"), "copySql", [this] { mStatement->copy(); });
+    mTableCommands.push_back(
+        command(edit, tr("Copy &SQL"), "copySql", [this] { mStatement->copy(); }));
     edit->addSeparator();
     command(edit, tr("&Options\u2026"), "options", &DesignerWindow::showOptions);
 
@@ -171,10 +177,21 @@ void DesignerWindow::makeMenus() {
     query->addAction(mResults->cancelAction());
     query->addAction(mResults->exportAction());
     query->addSeparator();
-    command(query, tr("&Arrange tables"), "arrange", [this] {
+    QAction* const arrange = command(query, tr("&Arrange tables"), "arrange", [this] {
         arrangeTables(mDocument, mDrawing->width() * twipsPerPixel);
-    })->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_A);
-    command(query, tr("Re&name table\u2026"), "rename", &DesignerWindow::renameTable);
+    });
+    arrange->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_A);
+    mTableCommands.push_back(arrange);
+    mTableCommands.push_back(
+        command(query, tr("Re&name table\u2026"), "rename", &DesignerWindow::renameTable));
+    // In sight whatever panel is in front.
+    auto* const run = new QToolButton;
+    run->setDefaultAction(mResults->runAction());
+    run->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
+    run->setAutoRaise(true);
+    run->setFocusPolicy(Qt::TabFocus); // a click leaves the keyboard where it is
+    run->setMaximumHeight(menuBar()->sizeHint().height() - 2);
+    menuBar()->setCornerWidget(run);
 
     QMenu* const view = add(tr("&View"), "viewMenu");
     QAction* const dark = view->addAction(tr("&Dark colours"));
@@ -186,8 +203,22 @@ void DesignerWindow::makeMenus() {
     });
     dark->setChecked(mSettings.value(darkKey()).toBool());
     view->addSeparator();
-    for (const auto* panel : findChildren<QDockWidget*>())
-        view->addAction(panel->toggleViewAction());
+    command(view, tr("&Find table"), "findTable", [this] {
+        mTables->parentWidget()->show();
+        mTables->filterBox().setFocus();
+        mTables->filterBox().selectAll();
+    })->setShortcut(QKeySequence::Find);
+    view->addSeparator();
+    const auto panel = [&](const QString& text, const char* name) {
+        QAction* const action = findChild<QDockWidget*>(QLatin1String(name))->toggleViewAction();
+        action->setText(text);
+        action->setObjectName(QLatin1String(name) + QStringLiteral("Shown"));
+        view->addAction(action);
+    };
+    panel(tr("&Tables"), "tablesDock");
+    panel(tr("&SQL"), "statementDock");
+    panel(tr("&Rows"), "resultsDock");
+    panel(tr("&Events"), "eventsDock");
 
     command(add(tr("&Help"), "helpMenu"), tr("&About"), "about", &DesignerWindow::about);
 }
@@ -195,6 +226,7 @@ void DesignerWindow::makeMenus() {
 void DesignerWindow::connectParts() {
     mAdding = new TableAdding(mDocument, mDatabase, *mDrawing);
     auto* const target = new TableDropTarget(*mDrawing);
+    new Invitation(mDocument, mDatabase, *mDrawing);
     connect(mTables, &TablesPanel::chosen, mAdding,
             [this](const std::vector<reader::TableId>& tables) { mAdding->add(tables); });
     connect(target, &TableDropTarget::dropped, mAdding, &TableAdding::add);
@@ -216,6 +248,7 @@ void DesignerWindow::connectParts() {
     connect(&mFile, &QueryFile::changed, this, &DesignerWindow::showTitle);
     connect(mFiles, &FileDialogs::opened, mDatabases, &DatabaseCommands::followFile);
     connect(&mDocument, &Document::changed, this, &DesignerWindow::showCounts);
+    connect(&mDocument, &Document::changed, this, &DesignerWindow::offerCommands);
     connect(&mDocument, &Document::changed, this, &DesignerWindow::warnOfFullGrid);
 }
 
@@ -303,6 +336,11 @@ void DesignerWindow::showCounts() {
         tr("Tables: %1   Joins: %2").arg(query.Tables().Count()).arg(query.Joins().Count()));
 }
 
+void DesignerWindow::offerCommands() {
+    const bool drawn = mDocument.query()->Tables().Count() > 0;
+    for (QAction* command : mTableCommands) command->setEnabled(drawn);
+}
+
 /// What is added to a full grid takes the place of its last column.
 void DesignerWindow::warnOfFullGrid() {
     const bool full = mDocument.query()->ColumnDefinitions().Count() >= mostOutputColumns;
@@ -322,9 +360,7 @@ void DesignerWindow::showOptions() {
     dialog.exec();
 }
 
-void DesignerWindow::renameTable() {
-    if (mDocument.query()->Tables().Count() > 0) RenameDialog(mDocument, this).exec();
-}
+void DesignerWindow::renameTable() { RenameDialog(mDocument, this).exec(); }
 
 void DesignerWindow::about() {
     QMessageBox::about(

@@ -57,6 +57,7 @@ private:
     void showTable(const QString& name);
     void showTitle();
     void showCounts();
+    void offerCommands();
     void warnOfFullGrid();
     void showOptions();
     void renameTable();
@@ -76,6 +77,7 @@ private:
     ResultsPanel* mResults;
     EventPanel* mEvents;
     TableAdding* mAdding;
+    std::vector<QAction*> mTableCommands; ///< that need a table
     FileDialogs* mFiles;
     DatabaseCommands* mDatabases;
     ShowCommands* mShow;

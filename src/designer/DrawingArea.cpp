@@ -44,8 +44,11 @@ void DrawingArea::showAnew() {
     mControl->setModel(mDocument.query());
     mControl->show();
     if (before) {
-        mControl->setHorizontalScrollbarPos(before->HorizontalScrollbarPos());
-        mControl->setVerticalScrollbarPos(before->VerticalScrollbarPos());
+        // The canvas may be smaller now than it was.
+        mControl->setHorizontalScrollbarPos(
+            std::min(before->HorizontalScrollbarPos(), mControl->HorizMaxScrollPos()));
+        mControl->setVerticalScrollbarPos(
+            std::min(before->VerticalScrollbarPos(), mControl->VertMaxScrollPos()));
         if (before->hasFocus() || before->isAncestorOf(focusWidget())) mControl->setFocus();
         before->hide();
         // This may run within a signal of its own.

@@ -3,6 +3,7 @@
 #include "designer/Arguments.h"
 #include "designer/DesignerWindow.h"
 #include "designer/Screen.h"
+#include "designer/options/Languages.h"
 
 #include <QApplication>
 
@@ -10,6 +11,7 @@
 
 int main(int argc, char** argv) {
     const auto application = designer::makeApplication(argc, argv, false);
+    designer::speak();
     QStringList given;
     for (int n = 2; n < argc; ++n) given += QString::fromLocal8Bit(argv[n]);
     const auto arguments = designer::readArguments(given);

@@ -185,6 +185,35 @@ TEST_F(ADesignersDay, GoesOnAfterAPowerFailure) {
     quitWithoutSaving();
 }
 
+TEST_F(ADesignersDay, ShowsWhereAFindingIs) {
+    start();
+    command("fileMenu", "new");
+    designer->place("control invitation");
+    designer->picture("application-4-empty");
+    designer->carry("row tables orders", "canvas 40 20");
+    designer->drop();
+    designer->place("title orders");
+    designer->carry("row tables customers", "canvas 400 20");
+    designer->drop();
+    designer->place("join 1");
+    EXPECT_FALSE(designer->isShown("control invitation"));
+    int column = 0;
+    for (const char* table : {"customers", "orders"}) {
+        const QString id = QStringLiteral("entry %1 id").arg(QLatin1String(table));
+        designer->click(id);
+        designer->carry(id, QStringLiteral("cell 1 %1").arg(++column));
+        designer->drop();
+        await("the column is there",
+              [&] { return designer->query().filter("column ").size() == column; });
+    }
+    designer->click("entry customers name");
+    designer->click("row findings Two output columns are named id: give one of them a synonym.");
+    await("its column is selected",
+          [&] { return designer->ask("selected orders") == QStringList("id"); });
+    designer->picture("application-5-finding");
+    quitWithoutSaving();
+}
+
 TEST_F(ADesignersDay, GoesOnWhenTheServerComesBack) {
     PostgresServer server;
     {
@@ -228,7 +257,7 @@ TEST_F(ADesignersDay, GoesOnWhenTheServerComesBack) {
 
 int main(int argc, char** argv) {
     // Whatever happens, nothing is left behind: the children die with this program.
-    alarm(240);
+    alarm(300);
     const QCoreApplication application(argc, argv);
     testing::InitGoogleTest(&argc, argv);
     return RUN_ALL_TESTS();

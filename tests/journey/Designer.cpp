@@ -83,6 +83,9 @@ void Designer::carry(const QString& thing, const QString& to) {
     mScreen.move(start);
     mScreen.press(1);
     mScreen.move(start + QPoint(3, 2));
+    // Lists of Qt's own want to see it move on.
+    mScreen.move(start + QPoint(14, 8));
+    mScreen.move(start + QPoint(16, 9));
     await(QStringLiteral("the drag has begun"),
           [this] { return !ask(QStringLiteral("dragged")).isEmpty(); });
     const QPoint end = place(to);

@@ -1,7 +1,10 @@
 #include "designer/database/ConnectionBanner.h"
 
+#include "designer/Colours.h"
 #include "designer/database/opening.h"
+#include "designer/statement/ModelWords.h"
 
+#include <QEvent>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QPushButton>
@@ -12,11 +15,7 @@ namespace designer {
 
 ConnectionBanner::ConnectionBanner(Database& database, QWidget* parent)
     : QFrame(parent), mDatabase(database), mText(new QLabel) {
-    const bool dark = palette().color(QPalette::Window).lightness() < 128;
-    QPalette own = palette();
-    own.setColor(QPalette::Window, dark ? QColor(0x5c, 0x4a, 0x1e) : QColor(0xff, 0xf0, 0xc2));
-    own.setColor(QPalette::WindowText, dark ? QColor(0xff, 0xee, 0xc8) : QColor(0x3c, 0x2f, 0x08));
-    setPalette(own);
+    colour();
     setAutoFillBackground(true);
 
     mText->setTextFormat(Qt::PlainText);
@@ -44,16 +43,31 @@ ConnectionBanner::ConnectionBanner(Database& database, QWidget* parent)
     connect(close, &QToolButton::clicked, this, &QWidget::hide);
 }
 
+void ConnectionBanner::colour() {
+    const bool dark = areColoursDark();
+    const QColor amber = dark ? QColor(0x5c, 0x4a, 0x1e) : QColor(0xff, 0xf0, 0xc2);
+    if (palette().color(QPalette::Window) == amber) return; // it is this that has changed it
+    QPalette own;
+    own.setColor(QPalette::Window, amber);
+    own.setColor(QPalette::WindowText, dark ? QColor(0xff, 0xee, 0xc8) : QColor(0x3c, 0x2f, 0x08));
+    setPalette(own);
+}
+
+void ConnectionBanner::changeEvent(QEvent* event) {
+    QFrame::changeEvent(event);
+    if (event->type() == QEvent::PaletteChange) colour();
+}
+
 void ConnectionBanner::showLoss(const QString& message) {
     mText->setText(tr("The connection to %1 is lost. Your query is kept.").arg(mDatabase.name()));
-    mText->setToolTip(message);
+    mText->setToolTip(inWords(message));
     show();
 }
 
 void ConnectionBanner::reconnect() {
     const Opening opening = renewPatiently(mDatabase, window());
     if (opening.error.isEmpty()) return;
-    mText->setText(opening.error);
+    mText->setText(inWords(opening.error));
     mText->setToolTip({});
 }
 

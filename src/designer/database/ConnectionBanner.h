@@ -15,7 +15,11 @@ class ConnectionBanner final : public QFrame {
 public:
     explicit ConnectionBanner(Database& database, QWidget* parent = nullptr);
 
+protected:
+    void changeEvent(QEvent* event) override;
+
 private:
+    void colour();
     void showLoss(const QString& message);
     void reconnect();
 

@@ -18,6 +18,8 @@
 #include <QSqlDatabase>
 #include <QStandardItemModel>
 
+#include <algorithm>
+
 namespace designer {
 
 namespace {
@@ -138,6 +140,15 @@ void ConnectionDialog::showFieldsOf(Engine engine) {
     mForm->setRowVisible(mName, server);
     mForm->setRowVisible(mUser, engine != Engine::SQLite);
     mForm->setRowVisible(mPassword, engine != Engine::SQLite);
+    growToContent();
+}
+
+/// A layout with wrapped lines leaves that to the window, and would squeeze the fields.
+void ConnectionDialog::growToContent() {
+    if (!isVisible()) return; // it gets its size when it is shown
+    layout()->activate();
+    const int needed = std::max(layout()->totalHeightForWidth(width()), sizeHint().height());
+    if (needed > height()) resize(width(), needed);
 }
 
 void ConnectionDialog::setAddress(const QString& address) { mAddress->setText(address); }
@@ -204,6 +215,7 @@ void ConnectionDialog::open() {
     const Opening opening = openPatiently(mDatabase, address(), password, this);
     if (opening.opened) return accept();
     mError->say(opening.error);
+    growToContent();
 }
 
 } // namespace designer

@@ -32,6 +32,7 @@ private:
     void addKinds();
     void lay();
     void showFieldsOf(Engine engine);
+    void growToContent();
     Engine engine() const;
 
     void takeAddress();

@@ -1,5 +1,10 @@
 #include "designer/database/ErrorLine.h"
 
+#include "designer/Colours.h"
+#include "designer/statement/ModelWords.h"
+
+#include <QEvent>
+
 namespace designer {
 
 ErrorLine::ErrorLine(QWidget* parent) : QLabel(parent) {
@@ -7,14 +12,24 @@ ErrorLine::ErrorLine(QWidget* parent) : QLabel(parent) {
     setWordWrap(true);
     setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
     setVisible(false);
-    const bool dark = palette().color(QPalette::Window).lightness() < 128;
+    colour();
+}
+
+void ErrorLine::colour() {
+    const QColor red = areColoursDark() ? QColor(0xff, 0x8a, 0x80) : QColor(0xb0, 0x1e, 0x1e);
+    if (palette().color(QPalette::WindowText) == red) return; // it is this that has changed it
     QPalette own;
-    own.setColor(QPalette::WindowText, dark ? QColor(0xff, 0x8a, 0x80) : QColor(0xb0, 0x1e, 0x1e));
+    own.setColor(QPalette::WindowText, red);
     setPalette(own);
 }
 
+void ErrorLine::changeEvent(QEvent* event) {
+    QLabel::changeEvent(event);
+    if (event->type() == QEvent::PaletteChange) colour();
+}
+
 void ErrorLine::say(const QString& error) {
-    setText(error);
+    setText(inWords(error));
     setVisible(!error.isEmpty());
 }
 

@@ -45,7 +45,7 @@ bool FileDialogs::startNew() {
 
 bool FileDialogs::open() {
     if (!mayLose()) return false;
-    QFileDialog dialog(&mWindow, tr("Open Query"));
+    QFileDialog dialog(&mWindow, tr("Open query"));
     prepare(dialog, mFile);
     dialog.setFileMode(QFileDialog::ExistingFile);
     const QString path = chosen(dialog);
@@ -56,7 +56,7 @@ bool FileDialogs::open(const QString& path) { return mayLose() && openFrom(path)
 
 bool FileDialogs::openFrom(const QString& path) {
     if (const auto error = mFile.open(path)) {
-        tell(tr("Open Query"), *error);
+        tell(tr("Open query"), *error);
         return false;
     }
     mRecent.add(mFile.path());
@@ -67,7 +67,7 @@ bool FileDialogs::openFrom(const QString& path) {
 bool FileDialogs::save() { return mFile.path().isEmpty() ? saveAs() : saveTo(mFile.path()); }
 
 bool FileDialogs::saveAs() {
-    QFileDialog dialog(&mWindow, tr("Save Query"));
+    QFileDialog dialog(&mWindow, tr("Save query"));
     prepare(dialog, mFile);
     dialog.setAcceptMode(QFileDialog::AcceptSave);
     dialog.selectFile(mFile.path().isEmpty() ? tr("query.json") : mFile.name());
@@ -77,7 +77,7 @@ bool FileDialogs::saveAs() {
 
 bool FileDialogs::mayLose() {
     if (!mDocument.isModified()) return true;
-    QMessageBox box(QMessageBox::Warning, tr("Save Query"),
+    QMessageBox box(QMessageBox::Warning, tr("Save query"),
                     tr("Save the changes to \"%1\"?").arg(mFile.name()),
                     QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel, &mWindow);
     box.setInformativeText(tr("Changes that are not saved are lost."));
@@ -91,7 +91,7 @@ bool FileDialogs::mayLose() {
 
 bool FileDialogs::saveTo(const QString& path) {
     if (const auto error = mFile.saveAs(path)) {
-        tell(tr("Save Query"), *error);
+        tell(tr("Save query"), *error);
         return false;
     }
     mRecent.add(mFile.path());

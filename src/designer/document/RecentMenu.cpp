@@ -22,7 +22,7 @@ QString shown(const QString& fileOrAddress, const QFontMetrics& metrics) {
 } // namespace
 
 RecentMenu::RecentMenu(RecentFiles& recent, QWidget* parent)
-    : QMenu(tr("Open &Recent"), parent), mRecent(recent) {
+    : QMenu(tr("Open &recent"), parent), mRecent(recent) {
     setToolTipsVisible(true);
     // Files come and go while nobody looks.
     connect(this, &QMenu::aboutToShow, this, &RecentMenu::fill);
@@ -43,7 +43,7 @@ void RecentMenu::fill() {
         connect(action, &QAction::triggered, this, [this, entry] { emit chosen(entry); });
     }
     addSeparator();
-    connect(addAction(tr("&Clear List")), &QAction::triggered, &mRecent, &RecentFiles::clear);
+    connect(addAction(tr("&Clear list")), &QAction::triggered, &mRecent, &RecentFiles::clear);
 }
 
 } // namespace designer

@@ -6,7 +6,7 @@ namespace designer {
 
 class RecentFiles;
 
-/// "Open Recent": an entry for each file or database, greyed when it is gone, and "Clear List".
+/// "Open recent": an entry for each file or database, greyed when it is gone, and "Clear list".
 class RecentMenu final : public QMenu {
     Q_OBJECT
 

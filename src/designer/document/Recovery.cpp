@@ -20,17 +20,18 @@ public:
     enum class Answer { recover, discard, later };
 
     static Answer ask(const QString& path, const QDateTime& saved, QWidget* window) {
-        const QString name = path.isEmpty() ? tr("A query that was never saved")
-                                            : tr("\"%1\"").arg(QFileInfo(path).fileName());
-        QMessageBox box(QMessageBox::Question, tr("Recover Query"),
-                        tr("%1 has changes that were not saved.").arg(name), QMessageBox::NoButton,
+        const QString text =
+            path.isEmpty()
+                ? tr("A query was drawn and never saved.")
+                : tr("\"%1\" has changes that were not saved.").arg(QFileInfo(path).fileName());
+        QMessageBox box(QMessageBox::Question, tr("Recover query"), text, QMessageBox::NoButton,
                         window);
         box.setInformativeText(
             tr("The designer ended unexpectedly. The changes up to %1 can be recovered.")
                 .arg(QLocale().toString(saved, QLocale::ShortFormat)));
         const auto* recover = box.addButton(tr("&Recover"), QMessageBox::AcceptRole);
         const auto* discard = box.addButton(QMessageBox::Discard);
-        box.addButton(tr("&Ask Later"), QMessageBox::RejectRole);
+        box.addButton(tr("&Ask later"), QMessageBox::RejectRole);
         box.exec();
         if (box.clickedButton() == recover) return Answer::recover;
         return box.clickedButton() == discard ? Answer::discard : Answer::later;

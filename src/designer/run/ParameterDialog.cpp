@@ -39,6 +39,16 @@ ParameterDialog::ParameterDialog(std::vector<Question> questions, const Answers&
     mButtons->button(QDialogButtonBox::Ok)->setText(tr("&Run"));
     connect(mButtons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(mButtons, &QDialogButtonBox::rejected, this, &QDialog::reject);
+    // The buttons were there before the fields.
+    QWidget* before = this;
+    for (QWidget* field : mFields) {
+        if (before != this) setTabOrder(before, field);
+        before = field;
+    }
+    if (!mFields.empty()) {
+        setTabOrder(before, mButtons);
+        mFields.front()->setFocus();
+    }
     check();
 }
 

@@ -5,6 +5,7 @@
 #include "designer/run/FileExport.h"
 #include "designer/run/ParameterDialog.h"
 #include "designer/run/ResultTable.h"
+#include "designer/statement/ModelWords.h"
 
 #include <QAction>
 #include <QComboBox>
@@ -87,7 +88,7 @@ std::optional<Command> ResultsPanel::command(std::optional<qint64> limit) {
         QStringList lines(tr("The query cannot be run yet:"));
         for (const model::Finding& finding : text.findings)
             if (finding.isError())
-                lines << QStringLiteral("\u2022 ") + QString::fromStdU16String(finding.text);
+                lines << QStringLiteral("\u2022 ") + inWords(QString::fromStdU16String(finding.text));
         showMessage(lines.join(u'\n'));
         return {};
     }
@@ -190,7 +191,7 @@ void ResultsPanel::finish(const Outcome& outcome) {
                             : tr("Cancelled. Rows that came: %1 \u00b7 %2").arg(rows, seconds()));
         break;
     case Outcome::End::unreachable:
-        showMessage(outcome.message);
+        showMessage(inWords(outcome.message));
         mDatabase.sayLost(outcome.message);
         break;
     case Outcome::End::refused: showMessage(outcome.message); break;

@@ -40,7 +40,8 @@ void ResultsPanel::makeActions() {
     connect(mCancel, &QAction::triggered, this, &ResultsPanel::cancel);
 
     mExport =
-        new QAction(style()->standardIcon(QStyle::SP_DialogSaveButton), tr("&Export\u2026"), this);
+        new QAction(style()->standardIcon(QStyle::SP_DialogSaveButton), tr("&Export rows\u2026"), this);
+    mExport->setIconText(tr("Export\u2026")); // beside the rows
     mExport->setToolTip(tr("Run the query and write all its rows into a CSV file"));
     connect(mExport, &QAction::triggered, this, &ResultsPanel::askForFile);
 }

@@ -36,9 +36,9 @@ private:
     mutable std::mutex mMutex;
     QStringList mColumns;
     QTemporaryFile mFile;
-    QByteArray mPending;  ///< not in the file yet
-    qint64 mEnd = 0;      ///< of the file and what is pending
-    qint64 mNextLook = 0; ///< at the room on the disk
+    QByteArray mPending;        ///< not in the file yet
+    qint64 mEnd = 0;            ///< of the file and what is pending
+    qint64 mNextLook = 1 << 26; ///< at the room on the disk: when so much is written
     qint64 mRows = 0;
     qint64 mReadable = 0;       ///< those in the file
     std::vector<qint64> mPages; ///< where they begin

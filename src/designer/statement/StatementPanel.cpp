@@ -46,6 +46,7 @@ StatementPanel::StatementPanel(Document& document, QWidget* parent)
     mCopy->setToolTip(tr("Copy the statement to the clipboard"));
     mView->setAccessibleName(tr("SQL statement"));
     mView->setFrameShape(QFrame::NoFrame);
+    mList->setObjectName(QStringLiteral("findings"));
     mList->setAccessibleName(tr("Findings"));
     mList->setWordWrap(true);
     mList->setIconSize({16, 16});

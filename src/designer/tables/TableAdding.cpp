@@ -6,6 +6,7 @@
 #include "designer/database/patiently.h"
 #include "designer/database/readTables.h"
 #include "designer/document/Document.h"
+#include "designer/statement/ModelWords.h"
 #include "designer/tables/placeTables.h"
 #include "model/reader/addTables.h"
 
@@ -74,7 +75,7 @@ bool TableAdding::readBefore(const std::vector<TableId>& tables) {
         [connect = mDatabase.connector(), wanted] { return readTables(connect, wanted); });
     if (!read) return false;
     const auto error = takeTables(mDatabase, *read);
-    if (error) emit refused(*error);
+    if (error) emit refused(inWords(*error));
     return !error;
 }
 
@@ -83,7 +84,7 @@ bool TableAdding::fits(const std::vector<TableId>& tables) {
     const auto copy = model::Query::restored(mDocument.query()->record());
     const auto added = reader::addTables(*copy, mDatabase.reader(), tables, canvasWidth());
     if (!added) {
-        emit refused(added.error());
+        emit refused(inWords(added.error()));
         return false;
     }
     if (copy->Joins().Count() <= mostJoins) return true;

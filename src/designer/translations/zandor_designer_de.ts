@@ -849,10 +849,6 @@
         <translation>Mit einem &amp;Server verbinden…</translation>
     </message>
     <message>
-        <source>&amp;Reconnect</source>
-        <translation>&amp;Neu verbinden</translation>
-    </message>
-    <message>
         <source>Open database</source>
         <translation>Datenbank öffnen</translation>
     </message>
@@ -875,6 +871,14 @@
     <message>
         <source>The query is open, but not its database. %1</source>
         <translation>Die Abfrage ist geöffnet, ihre Datenbank aber nicht. %1</translation>
+    </message>
+    <message>
+        <source>&amp;Choose database…</source>
+        <translation>Datenbank &amp;wählen…</translation>
+    </message>
+    <message>
+        <source>Reco&amp;nnect</source>
+        <translation>&amp;Neu verbinden</translation>
     </message>
 </context>
 <context>
@@ -925,7 +929,7 @@
     </message>
     <message>
         <source>&amp;Arrange tables</source>
-        <translation>Tabellen &amp;anordnen</translation>
+        <translation>Tabellen an&amp;ordnen</translation>
     </message>
     <message>
         <source>Re&amp;name table…</source>
@@ -990,6 +994,26 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     <message>
         <source>&amp;Dark colours</source>
         <translation>&amp;Dunkle Farben</translation>
+    </message>
+    <message>
+        <source>&amp;Find table</source>
+        <translation>Tabelle s&amp;uchen</translation>
+    </message>
+    <message>
+        <source>&amp;Tables</source>
+        <translation>&amp;Tabellen</translation>
+    </message>
+    <message>
+        <source>&amp;SQL</source>
+        <translation>&amp;SQL</translation>
+    </message>
+    <message>
+        <source>&amp;Rows</source>
+        <translation>&amp;Zeilen</translation>
+    </message>
+    <message>
+        <source>&amp;Events</source>
+        <translation>&amp;Ereignisse</translation>
     </message>
 </context>
 <context>
@@ -1072,11 +1096,11 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
         <translation>Alle Dateien (*)</translation>
     </message>
     <message>
-        <source>Open Query</source>
+        <source>Open query</source>
         <translation>Abfrage öffnen</translation>
     </message>
     <message>
-        <source>Save Query</source>
+        <source>Save query</source>
         <translation>Abfrage speichern</translation>
     </message>
     <message>
@@ -1112,6 +1136,19 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     <message>
         <source>The join dialog counts what it offers: with one left out, each behind it counts as the one before. Leave out only from the end.</source>
         <translation>Das Verknüpfungsfenster zählt, was es anbietet: Fehlt ein Eintrag, so gilt jeder dahinter als der davor. Lassen Sie nur am Ende welche weg.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Invitation</name>
+    <message>
+        <source>Drag a table here from the list of tables, or double-click it there.
+Then drag its columns into the grid below.</source>
+        <translation>Ziehen Sie eine Tabelle aus der Liste der Tabellen hierher, oder klicken Sie dort doppelt auf sie.
+Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
+    </message>
+    <message>
+        <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
+        <translation>Öffnen Sie zuerst eine Datenbank: siehe das Menü „Datenbank“.</translation>
     </message>
 </context>
 <context>
@@ -1235,31 +1272,27 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
 <context>
     <name>designer::RecentMenu</name>
     <message>
-        <source>Open &amp;Recent</source>
+        <source>Open &amp;recent</source>
         <translation>&amp;Zuletzt geöffnet</translation>
     </message>
     <message>
-        <source>&amp;Clear List</source>
+        <source>&amp;Clear list</source>
         <translation>Liste &amp;leeren</translation>
     </message>
 </context>
 <context>
     <name>designer::Recovery</name>
     <message>
-        <source>A query that was never saved</source>
-        <translation>Eine nie gespeicherte Abfrage</translation>
+        <source>A query was drawn and never saved.</source>
+        <translation>Eine Abfrage wurde gezeichnet und nie gespeichert.</translation>
     </message>
     <message>
-        <source>&quot;%1&quot;</source>
-        <translation>„%1“</translation>
-    </message>
-    <message>
-        <source>Recover Query</source>
+        <source>Recover query</source>
         <translation>Abfrage wiederherstellen</translation>
     </message>
     <message>
-        <source>%1 has changes that were not saved.</source>
-        <translation>%1 hat Änderungen, die nicht gespeichert wurden.</translation>
+        <source>&quot;%1&quot; has changes that were not saved.</source>
+        <translation>„%1“ hat Änderungen, die nicht gespeichert wurden.</translation>
     </message>
     <message>
         <source>The designer ended unexpectedly. The changes up to %1 can be recovered.</source>
@@ -1270,7 +1303,7 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
         <translation>&amp;Wiederherstellen</translation>
     </message>
     <message>
-        <source>&amp;Ask Later</source>
+        <source>&amp;Ask later</source>
         <translation>&amp;Später fragen</translation>
     </message>
 </context>
@@ -1426,10 +1459,6 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
         <translation>Anhalten, was läuft, auch auf der Datenbank</translation>
     </message>
     <message>
-        <source>&amp;Export…</source>
-        <translation>E&amp;xportieren…</translation>
-    </message>
-    <message>
         <source>Run the query and write all its rows into a CSV file</source>
         <translation>Die Abfrage ausführen und alle Zeilen in eine CSV-Datei schreiben</translation>
     </message>
@@ -1448,6 +1477,14 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     <message>
         <source>Run the query again without the limit</source>
         <translation>Die Abfrage ohne diese Grenze noch einmal ausführen</translation>
+    </message>
+    <message>
+        <source>&amp;Export rows…</source>
+        <translation>Zeilen e&amp;xportieren…</translation>
+    </message>
+    <message>
+        <source>Export…</source>
+        <translation>Exportieren…</translation>
     </message>
 </context>
 <context>

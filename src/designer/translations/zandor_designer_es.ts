@@ -849,10 +849,6 @@
         <translation>&amp;Conectar con un servidor…</translation>
     </message>
     <message>
-        <source>&amp;Reconnect</source>
-        <translation>&amp;Reconectar</translation>
-    </message>
-    <message>
         <source>Open database</source>
         <translation>Abrir base de datos</translation>
     </message>
@@ -875,6 +871,14 @@
     <message>
         <source>The query is open, but not its database. %1</source>
         <translation>La consulta está abierta, pero no su base de datos. %1</translation>
+    </message>
+    <message>
+        <source>&amp;Choose database…</source>
+        <translation>&amp;Elegir base de datos…</translation>
+    </message>
+    <message>
+        <source>Reco&amp;nnect</source>
+        <translation>Reco&amp;nectar</translation>
     </message>
 </context>
 <context>
@@ -991,6 +995,26 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <source>&amp;Dark colours</source>
         <translation>Colores &amp;oscuros</translation>
     </message>
+    <message>
+        <source>&amp;Find table</source>
+        <translation>&amp;Buscar tabla</translation>
+    </message>
+    <message>
+        <source>&amp;Tables</source>
+        <translation>&amp;Tablas</translation>
+    </message>
+    <message>
+        <source>&amp;SQL</source>
+        <translation>&amp;SQL</translation>
+    </message>
+    <message>
+        <source>&amp;Rows</source>
+        <translation>&amp;Filas</translation>
+    </message>
+    <message>
+        <source>&amp;Events</source>
+        <translation>&amp;Eventos</translation>
+    </message>
 </context>
 <context>
     <name>designer::Document</name>
@@ -1072,11 +1096,11 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <translation>Todos los archivos (*)</translation>
     </message>
     <message>
-        <source>Open Query</source>
+        <source>Open query</source>
         <translation>Abrir consulta</translation>
     </message>
     <message>
-        <source>Save Query</source>
+        <source>Save query</source>
         <translation>Guardar consulta</translation>
     </message>
     <message>
@@ -1112,6 +1136,19 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     <message>
         <source>The join dialog counts what it offers: with one left out, each behind it counts as the one before. Leave out only from the end.</source>
         <translation>La ventana de combinación cuenta lo que ofrece: si falta una entrada, cada una de las siguientes vale por la anterior. Quítelas solo del final.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Invitation</name>
+    <message>
+        <source>Drag a table here from the list of tables, or double-click it there.
+Then drag its columns into the grid below.</source>
+        <translation>Arrastre aquí una tabla desde la lista de tablas, o haga doble clic en ella en la lista.
+Después arrastre sus columnas a la cuadrícula de abajo.</translation>
+    </message>
+    <message>
+        <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
+        <translation>Abra una base de datos para empezar: vea el menú «Base de datos».</translation>
     </message>
 </context>
 <context>
@@ -1235,31 +1272,27 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
 <context>
     <name>designer::RecentMenu</name>
     <message>
-        <source>Open &amp;Recent</source>
+        <source>Open &amp;recent</source>
         <translation>Abrir &amp;recientes</translation>
     </message>
     <message>
-        <source>&amp;Clear List</source>
+        <source>&amp;Clear list</source>
         <translation>&amp;Vaciar la lista</translation>
     </message>
 </context>
 <context>
     <name>designer::Recovery</name>
     <message>
-        <source>A query that was never saved</source>
-        <translation>Una consulta nunca guardada</translation>
+        <source>A query was drawn and never saved.</source>
+        <translation>Se dibujó una consulta y nunca se guardó.</translation>
     </message>
     <message>
-        <source>&quot;%1&quot;</source>
-        <translation>«%1»</translation>
-    </message>
-    <message>
-        <source>Recover Query</source>
+        <source>Recover query</source>
         <translation>Recuperar consulta</translation>
     </message>
     <message>
-        <source>%1 has changes that were not saved.</source>
-        <translation>%1 tiene cambios que no se guardaron.</translation>
+        <source>&quot;%1&quot; has changes that were not saved.</source>
+        <translation>«%1» tiene cambios que no se guardaron.</translation>
     </message>
     <message>
         <source>The designer ended unexpectedly. The changes up to %1 can be recovered.</source>
@@ -1270,7 +1303,7 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <translation>&amp;Recuperar</translation>
     </message>
     <message>
-        <source>&amp;Ask Later</source>
+        <source>&amp;Ask later</source>
         <translation>&amp;Preguntar más tarde</translation>
     </message>
 </context>
@@ -1426,10 +1459,6 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <translation>Detener lo que se está ejecutando, también en la base de datos</translation>
     </message>
     <message>
-        <source>&amp;Export…</source>
-        <translation>E&amp;xportar…</translation>
-    </message>
-    <message>
         <source>Run the query and write all its rows into a CSV file</source>
         <translation>Ejecutar la consulta y escribir todas sus filas en un archivo CSV</translation>
     </message>
@@ -1448,6 +1477,14 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     <message>
         <source>Run the query again without the limit</source>
         <translation>Ejecutar de nuevo la consulta sin el límite</translation>
+    </message>
+    <message>
+        <source>&amp;Export rows…</source>
+        <translation>E&amp;xportar las filas…</translation>
+    </message>
+    <message>
+        <source>Export…</source>
+        <translation>Exportar…</translation>
     </message>
 </context>
 <context>

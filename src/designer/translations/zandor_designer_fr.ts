@@ -849,10 +849,6 @@
         <translation>Se &amp;connecter à un serveur…</translation>
     </message>
     <message>
-        <source>&amp;Reconnect</source>
-        <translation>&amp;Reconnecter</translation>
-    </message>
-    <message>
         <source>Open database</source>
         <translation>Ouvrir une base de données</translation>
     </message>
@@ -875,6 +871,14 @@
     <message>
         <source>The query is open, but not its database. %1</source>
         <translation>La requête est ouverte, mais pas sa base de données. %1</translation>
+    </message>
+    <message>
+        <source>&amp;Choose database…</source>
+        <translation>&amp;Choisir une base de données…</translation>
+    </message>
+    <message>
+        <source>Reco&amp;nnect</source>
+        <translation>Reco&amp;nnecter</translation>
     </message>
 </context>
 <context>
@@ -991,6 +995,26 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <source>&amp;Dark colours</source>
         <translation>Couleurs &amp;sombres</translation>
     </message>
+    <message>
+        <source>&amp;Find table</source>
+        <translation>&amp;Chercher une table</translation>
+    </message>
+    <message>
+        <source>&amp;Tables</source>
+        <translation>&amp;Tables</translation>
+    </message>
+    <message>
+        <source>&amp;SQL</source>
+        <translation>S&amp;QL</translation>
+    </message>
+    <message>
+        <source>&amp;Rows</source>
+        <translation>&amp;Lignes</translation>
+    </message>
+    <message>
+        <source>&amp;Events</source>
+        <translation>&amp;Événements</translation>
+    </message>
 </context>
 <context>
     <name>designer::Document</name>
@@ -1072,11 +1096,11 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <translation>Tous les fichiers (*)</translation>
     </message>
     <message>
-        <source>Open Query</source>
+        <source>Open query</source>
         <translation>Ouvrir une requête</translation>
     </message>
     <message>
-        <source>Save Query</source>
+        <source>Save query</source>
         <translation>Enregistrer la requête</translation>
     </message>
     <message>
@@ -1112,6 +1136,19 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <message>
         <source>The join dialog counts what it offers: with one left out, each behind it counts as the one before. Leave out only from the end.</source>
         <translation>La fenêtre de jointure compte ce qu’elle propose&#xa0;: s’il manque une entrée, chacune des suivantes vaut la précédente. N’en retirez qu’à la fin.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::Invitation</name>
+    <message>
+        <source>Drag a table here from the list of tables, or double-click it there.
+Then drag its columns into the grid below.</source>
+        <translation>Faites glisser ici une table depuis la liste des tables, ou double-cliquez dessus dans la liste.
+Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
+    </message>
+    <message>
+        <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
+        <translation>Ouvrez une base de données pour commencer : voir le menu « Base de données ».</translation>
     </message>
 </context>
 <context>
@@ -1235,31 +1272,27 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
 <context>
     <name>designer::RecentMenu</name>
     <message>
-        <source>Open &amp;Recent</source>
+        <source>Open &amp;recent</source>
         <translation>&amp;Récents</translation>
     </message>
     <message>
-        <source>&amp;Clear List</source>
+        <source>&amp;Clear list</source>
         <translation>&amp;Vider la liste</translation>
     </message>
 </context>
 <context>
     <name>designer::Recovery</name>
     <message>
-        <source>A query that was never saved</source>
-        <translation>Une requête jamais enregistrée</translation>
+        <source>A query was drawn and never saved.</source>
+        <translation>Une requête a été dessinée et jamais enregistrée.</translation>
     </message>
     <message>
-        <source>&quot;%1&quot;</source>
-        <translation>«&#xa0;%1&#xa0;»</translation>
-    </message>
-    <message>
-        <source>Recover Query</source>
+        <source>Recover query</source>
         <translation>Récupérer la requête</translation>
     </message>
     <message>
-        <source>%1 has changes that were not saved.</source>
-        <translation>%1 contient des modifications non enregistrées.</translation>
+        <source>&quot;%1&quot; has changes that were not saved.</source>
+        <translation>«&#xa0;%1&#xa0;» contient des modifications non enregistrées.</translation>
     </message>
     <message>
         <source>The designer ended unexpectedly. The changes up to %1 can be recovered.</source>
@@ -1270,7 +1303,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <translation>&amp;Récupérer</translation>
     </message>
     <message>
-        <source>&amp;Ask Later</source>
+        <source>&amp;Ask later</source>
         <translation>&amp;Demander plus tard</translation>
     </message>
 </context>
@@ -1426,10 +1459,6 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <translation>Arrêter ce qui est en cours, sur la base de données aussi</translation>
     </message>
     <message>
-        <source>&amp;Export…</source>
-        <translation>E&amp;xporter…</translation>
-    </message>
-    <message>
         <source>Run the query and write all its rows into a CSV file</source>
         <translation>Exécuter la requête et écrire toutes ses lignes dans un fichier CSV</translation>
     </message>
@@ -1448,6 +1477,14 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <message>
         <source>Run the query again without the limit</source>
         <translation>Exécuter à nouveau la requête sans cette limite</translation>
+    </message>
+    <message>
+        <source>&amp;Export rows…</source>
+        <translation>E&amp;xporter les lignes…</translation>
+    </message>
+    <message>
+        <source>Export…</source>
+        <translation>Exporter…</translation>
     </message>
 </context>
 <context>

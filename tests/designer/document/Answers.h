@@ -17,7 +17,7 @@
 /// The text of a button as it stands there, mnemonics and all.
 inline void press(QDialog& dialog, const char* text) {
     for (QAbstractButton* button : dialog.findChildren<QAbstractButton*>()) {
-        if (button->text() != QLatin1String(text)) continue;
+        if (button->text() != QString::fromUtf8(text)) continue;
         hands::click(*button, QRectF(button->rect()).center());
         return;
     }

@@ -202,7 +202,7 @@ TEST_F(AnAutosave, IsDeletedWhenTheUserDiscardsItAndKeptForLater) {
             [&](QMessageBox& box) { press(box, button); },
             [&] { EXPECT_FALSE(designer::offerRecovery(file, *autosave, folder(), nullptr)); });
     };
-    offer("&Ask Later");
+    offer("&Ask later");
     EXPECT_EQ(saved().size(), 1);
     offer("Discard");
     EXPECT_EQ(saved().size(), 0);

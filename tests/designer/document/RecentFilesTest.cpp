@@ -85,7 +85,7 @@ TEST_F(RecentlyUsed, AreForgottenOnRequest) {
     files.add(path(QStringLiteral("a")));
     OpenedMenu opened(files);
     EXPECT_TRUE(opened.menu.menuAction()->isEnabled());
-    EXPECT_EQ(opened.entries.last()->text(), "&Clear List");
+    EXPECT_EQ(opened.entries.last()->text(), "&Clear list");
     opened.entries.last()->trigger();
     EXPECT_EQ(files.list(), QStringList());
     EXPECT_FALSE(opened.menu.menuAction()->isEnabled());
