@@ -45,7 +45,7 @@ double contrast(const QColor& one, const QColor& other) {
         return 0.2126 * part(colour.redF()) + 0.7152 * part(colour.greenF()) +
                0.0722 * part(colour.blueF());
     };
-    const auto [least, most] = std::minmax(light(one), light(other));
+    const auto [least, most] = std::minmax({light(one), light(other)});
     return (most + 0.05) / (least + 0.05);
 }
 
