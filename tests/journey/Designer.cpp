@@ -74,6 +74,8 @@ void Designer::pick(const QString& combo, int item, const QString& text) {
 
 void Designer::type(const QString& input, const QString& text) {
     place("control " + input);
+    // Keys that come before the input has the keyboard are lost.
+    await(input + " has the keyboard", [&] { return !ask("focused " + input).isEmpty(); });
     mScreen.type(text);
     await(input + " reads " + text, [&] { return ask("text " + input) == QStringList(text); });
 }

@@ -104,10 +104,18 @@ QString Host::answer(const QString& question) {
     }
     if (asked == "selected") return selected(words.value(1));
     if (asked == "text") return shownText(words.value(1));
+    if (asked == "focused") return isFocused(words.value(1)) ? QStringLiteral("yes") : QString();
     if (asked == "active") return QApplication::activeWindow() ? QStringLiteral("yes") : QString();
     if (asked == "picture") return QString::number(savePicture(question.mid(8)));
     if (asked == "quit") QApplication::quit();
     return {};
+}
+
+bool Host::isFocused(const QString& name) {
+    const QWidget* const control = shownControl(mWindow, name);
+    const QWidget* const focus =
+        QApplication::activeWindow() ? QApplication::focusWidget() : nullptr;
+    return control && focus && (focus == control || control->isAncestorOf(focus));
 }
 
 QString Host::selected(const QString& title) {

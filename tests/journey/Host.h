@@ -18,6 +18,7 @@
 ///     selected TABLE      the selected entries of a table
 ///     text NAME           what an input, a label or a table of results reads
 ///     dragged             where the drag that is on was seen last, "nowhere" or nothing
+///     focused NAME        "yes" when keys go to a control
 ///     active              "yes" when the window or a dialog of it has the keyboard
 ///     picture FILE        saves what the window shows; "1" when that worked
 ///     quit                ends the program
@@ -36,6 +37,7 @@ public:
 private:
     void read();
     QString answer(const QString& question);
+    bool isFocused(const QString& name);
     QString selected(const QString& title);
     QString shownText(const QString& name);
     bool savePicture(const QString& file);
