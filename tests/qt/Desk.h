@@ -8,6 +8,7 @@
 #include "support/FakeModel.h"
 #include "support/QtHands.h"
 
+#include <QDeadlineTimer>
 #include <QMessageBox>
 #include <QScrollBar>
 #include <QTimer>
@@ -31,6 +32,10 @@ protected:
 
     void show() {
         widget->show();
+        // A display gives the keyboard when it finds the time.
+        const QDeadlineTimer end(5'000);
+        while (widget->isVisible() && !widget->isActiveWindow() && !end.hasExpired())
+            qApp->processEvents(QEventLoop::AllEvents, 10);
         settle();
     }
 
