@@ -1,7 +1,6 @@
 #include "control/Zandor.h"
 
 #include "control/KeyNumber.h"
-#include "control/canvas/focus.h"
 
 namespace TalvikDBxZandor {
 
@@ -179,7 +178,13 @@ void Zandor::SetCurrentTable(const String& TabName) {
 }
 
 void Zandor::MakeCurrent(Tabulet& table) {
-    if (table.Visible()) offerFocus(table);
+    if (table.Visible()) {
+        try {
+            table.SetFocus();
+        } catch (...) {
+            // A control that is not on the screen yet cannot take the focus, and need not.
+        }
+    }
     table.Activated(true);
     Trace(u"Table found.");
     table.Complete();

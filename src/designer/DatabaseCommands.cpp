@@ -42,7 +42,8 @@ void DatabaseCommands::addTo(QMenu& menu) {
 }
 
 void DatabaseCommands::remember() {
-    mReconnect.setEnabled(true);
+    mReconnect.setEnabled(mDatabase.isOpen());
+    if (!mDatabase.isOpen()) return;
     mRecent.add(mDatabase.address());
     mFile.setDatabaseAddress(mDatabase.address());
 }
@@ -71,6 +72,7 @@ void DatabaseCommands::followFile() {
     if (!address || (mDatabase.isOpen() && *address == mDatabase.address())) return;
     const Opening opening = openAskingForPassword(mDatabase, *address, &mWindow);
     if (opening.opened) return;
+    if (mDatabase.isOpen()) mDatabase.close(); // the query is not to run on another one
     QMessageBox box(
         QMessageBox::Warning, tr("Open database"),
         tr("The query is open, but not its database. %1").arg(inWords(opening.error)).trimmed(),

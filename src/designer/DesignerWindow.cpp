@@ -52,7 +52,7 @@ QString layoutKey() { return QStringLiteral("window/layout"); }
 } // namespace
 
 DesignerWindow::DesignerWindow()
-    : mDrawing(new DrawingArea(mDocument)),
+    : mCounts(new QLabel), mDrawing(new DrawingArea(mDocument)),
       mFiles(new FileDialogs(mDocument, mFile, mRecentQueries, *this)),
       mDatabases(new DatabaseCommands(mDatabase, mFile, *mFiles, mRecentDatabases, *this)),
       mShow(new ShowCommands(mDocument, *mDrawing, *this)) {
@@ -64,6 +64,8 @@ DesignerWindow::DesignerWindow()
     layout->addWidget(new ConnectionBanner(mDatabase));
     layout->addWidget(mDrawing, 1);
     setCentralWidget(middle);
+    mCounts->setObjectName(QStringLiteral("counts"));
+    statusBar()->addWidget(mCounts);
     setAcceptDrops(true);
     makePanels();
     makeMenus();
@@ -325,14 +327,8 @@ void DesignerWindow::showTitle() {
 }
 
 void DesignerWindow::showCounts() {
-    auto* label = statusBar()->findChild<QLabel*>(QStringLiteral("counts"));
-    if (!label) {
-        label = new QLabel;
-        label->setObjectName(QStringLiteral("counts"));
-        statusBar()->addWidget(label);
-    }
     model::Query& query = *mDocument.query();
-    label->setText(
+    mCounts->setText(
         tr("Tables: %1   Joins: %2").arg(query.Tables().Count()).arg(query.Joins().Count()));
 }
 

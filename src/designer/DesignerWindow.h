@@ -10,6 +10,8 @@
 #include <QMainWindow>
 #include <QSettings>
 
+class QLabel;
+
 namespace designer {
 
 class Autosave;
@@ -71,6 +73,7 @@ private:
     RecentFiles mRecentDatabases{mSettings, QStringLiteral("databases")};
     Database mDatabase;
     // Children of the window.
+    QLabel* mCounts;
     DrawingArea* mDrawing;
     TablesPanel* mTables;
     StatementPanel* mStatement;

@@ -50,19 +50,18 @@ void DrawingArea::showAnew() {
         mControl->setVerticalScrollbarPos(
             std::min(before->VerticalScrollbarPos(), mControl->VertMaxScrollPos()));
         if (before->hasFocus() || before->isAncestorOf(focusWidget())) mControl->setFocus();
+        before->setDebugSwitch(0); // it does not end: another one shows the same
         before->hide();
         // This may run within a signal of its own.
         before->deleteLater();
     }
-    for (const auto signal :
-         {&ZandorWidget::TableDeleted, &ZandorWidget::TableMoved, &ZandorWidget::Activate})
-        connect(mControl, signal, &mDocument, &Document::changedByControl);
-    for (const auto signal : {&ZandorWidget::ColumnCreated, &ZandorWidget::ColumnModified,
-                              &ZandorWidget::ColumnRemoved})
-        connect(mControl, signal, &mDocument, &Document::changedByControl);
-    for (const auto signal :
-         {&ZandorWidget::JoinCreated, &ZandorWidget::JoinModified, &ZandorWidget::JoinRemoved})
-        connect(mControl, signal, &mDocument, &Document::changedByControl);
+    const auto tell = [this](auto... events) {
+        (connect(mControl, events, &mDocument, &Document::changedByControl), ...);
+    };
+    using Control = ZandorWidget;
+    tell(&Control::TableDeleted, &Control::TableMoved, &Control::Activate, &Control::ColumnCreated,
+         &Control::ColumnModified, &Control::ColumnRemoved, &Control::JoinCreated,
+         &Control::JoinModified, &Control::JoinRemoved);
 }
 
 void DrawingArea::resizeEvent(QResizeEvent* event) {

@@ -113,11 +113,13 @@ TEST_F(SettingTheFocusBack, GivesTheFocusToAShownGridAndKeepsTheActiveTable) {
     EXPECT_TRUE(stage->look("sprColumn").focused);
 }
 
-TEST_F(SettingTheFocusBack, IsSilentWhenTheGridIsNotOnTheScreenToTakeTheFocus) {
+TEST_F(SettingTheFocusBack, ReportsAGridThatCannotTakeTheFocus) {
     control().OnlyJoin(false);
     Back::sprColumn(control())->Visible(false);
     activate(0);
-    EXPECT_EQ(activeAfterwards(), 0);
+    Back::SetFocusBack(control());
+    EXPECT_EQ(told(), Texts{noKey("SetFocusBack")});
+    EXPECT_EQ(Back::mActiveTableIndex(control()), 0);
     EXPECT_FALSE(stage->look("sprColumn").focused);
 }
 

@@ -3,7 +3,9 @@
 
 #include <gtest/gtest.h>
 
-#include <QCoreApplication>
+#include <QApplication>
+#include <QMessageBox>
+#include <QTimer>
 
 namespace {
 
@@ -68,4 +70,26 @@ TEST_F(TheDesignersCanvas, StaysWhereItIsScrolledToWhenTheDrawingIsShownAnew) {
     EXPECT_EQ(control().HorizontalScrollbarPos(), 3000);
     EXPECT_EQ(control().VerticalScrollbarPos(), 2000);
     EXPECT_EQ(area.canvasPlace({10, 20}), QPoint(3000 + 150, 2000 + 300));
+}
+
+TEST_F(TheDesignersCanvas, ShowsNoFarewellOfAControlWhoseDrawingIsShownAnew) {
+    class Boxes final : public QObject {
+    public:
+        Boxes() { qApp->installEventFilter(this); }
+        bool eventFilter(QObject* watched, QEvent* event) override {
+            auto* box = qobject_cast<QMessageBox*>(watched);
+            if (!box || event->type() != QEvent::Show) return false;
+            texts += box->text();
+            QTimer::singleShot(0, box, &QMessageBox::accept);
+            return false;
+        }
+        QStringList texts;
+    } boxes;
+    show(300, 300, {1200, 800});
+    area.setOptions({{"DebugSwitch", 1}});
+    EXPECT_TRUE(boxes.texts.contains("SetZandor"));
+    emit document.outdated();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    EXPECT_FALSE(boxes.texts.contains("UserControl_Terminate"));
+    area.setOptions({});
 }

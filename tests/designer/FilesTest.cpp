@@ -109,6 +109,9 @@ TEST_F(TheWindowsFiles, AreShownWhenTheirDatabaseIsGone) {
         command("open");
     }
     EXPECT_THAT(text, StartsWith("The query is open, but not its database. There is no file"));
+    // Nor is the one before, which the query does not ask.
+    EXPECT_FALSE(window->database().isOpen());
+    EXPECT_EQ(title(), "lonely.json[*] \u2014 Zandor Designer");
     EXPECT_THAT(text, EndsWith("check the path."));
     EXPECT_THAT(shownTables(), UnorderedElementsAre("orders", "customers"));
     EXPECT_THAT(title(), StartsWith("lonely.json[*]"));

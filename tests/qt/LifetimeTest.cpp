@@ -70,6 +70,14 @@ TEST_F(Lifetime, EndsQuietlyWithoutDebugging) {
     EXPECT_EQ(boxes.texts, QStringList());
 }
 
+TEST_F(Lifetime, EndsQuietlyAfterItsWindowWasClosed) {
+    show();
+    bind();
+    widget->close(); // from now on there is no focus to be had
+    widget.reset();
+    EXPECT_EQ(boxes.texts, QStringList());
+}
+
 TEST_F(Lifetime, OfATableEndsInTheMiddleOfTheClickOnItsCloseButton) {
     show();
     bind();

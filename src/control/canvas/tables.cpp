@@ -1,7 +1,5 @@
 #include "control/Zandor.h"
 
-#include "control/canvas/focus.h"
-
 namespace TalvikDBxZandor {
 
 using platform::Each;
@@ -181,7 +179,7 @@ void Zandor::SetFocusBack() {
                                 lstTable(mActiveTableIndex)->Left() < 0;
         if (!outOfReach) return;
         if (!mOnlyJoin) {
-            offerFocus(*sprColumn);
+            sprColumn->SetFocus();
             return;
         }
         for (std::int16_t i = 1; i <= lastTableSlot; ++i) {

@@ -62,6 +62,19 @@ std::optional<QString> Database::take(const QString& address, const QString& pas
     return {};
 }
 
+void Database::close() {
+    mReader.reset(); // before the connection that it reads over
+    mConnection.reset();
+    mTables.clear();
+    {
+        const QMutexLocker lock(&mTarget);
+        mAddress.clear();
+        mPassword.clear();
+    }
+    mLost = false;
+    emit opened();
+}
+
 QString Database::name() const { return nameOfDatabase(mAddress); }
 
 model::sql::Dialect Database::dialect() const {

@@ -39,6 +39,8 @@ public:
     std::optional<QString> renew();
     std::optional<QString> renew(Tables tables);
     bool isOpen() const { return mConnection.has_value(); }
+    /// From now on there is none; emits opened().
+    void close();
 
     /// Path or URL, never with a password; empty before the first open().
     const QString& address() const { return mAddress; }
@@ -65,7 +67,7 @@ public:
     bool isLost() const { return mLost; }
 
 signals:
-    /// Another database, or the same one afresh.
+    /// Another database, the same one afresh, or none.
     void opened();
     void lost(const QString& message);
 

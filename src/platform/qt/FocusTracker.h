@@ -25,6 +25,10 @@ public:
     /// active one (a message box has just closed) gets the notice all the same, and at once.
     void take(QWidget* widget);
 
+    /// Whether there is a focus to be had: not before the control's window is shown, nor after it
+    /// was closed.
+    bool onScreen() const { return mSurface.isVisible(); }
+
     /// If the focus is inside the widget, moves it to the fallback, or else to the control's own
     /// surface; nobody is told.
     void release(QWidget* widget);

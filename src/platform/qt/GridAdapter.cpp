@@ -50,7 +50,10 @@ void GridAdapter::mustBeCell(std::int32_t row, std::int32_t col) const {
 
 void GridAdapter::Font(const platform::Font& value) { grid().setFont(toQt(value, grid().font())); }
 
-void GridAdapter::SetFocus() { mFocus.take(&grid().view()); }
+void GridAdapter::SetFocus() {
+    // Tables that go together with their closed window ask for it.
+    if (mFocus.onScreen()) mFocus.take(&grid().view());
+}
 
 void GridAdapter::Row(std::int32_t value) {
     mustBeRow(value);

@@ -29,7 +29,8 @@ class QtToolkit;
 /// Do not delete the widget from a slot of its signals: use deleteLater().
 class ZandorWidget : public QWidget {
     Q_OBJECT
-    // clang-format off: one property a line
+    // One property a line.
+    // clang-format off
     Q_PROPERTY(QString LNGJoinForm READ LNGJoinForm WRITE setLNGJoinForm)
     Q_PROPERTY(QString LNGJoinLeftTable READ LNGJoinLeftTable WRITE setLNGJoinLeftTable)
     Q_PROPERTY(QString LNGJoinLeftColumn READ LNGJoinLeftColumn WRITE setLNGJoinLeftColumn)
@@ -38,8 +39,7 @@ class ZandorWidget : public QWidget {
     Q_PROPERTY(QString LNGJoinType READ LNGJoinType WRITE setLNGJoinType)
     Q_PROPERTY(QString LNGJoinTypeNormal READ LNGJoinTypeNormal WRITE setLNGJoinTypeNormal)
     Q_PROPERTY(QString LNGJoinTypeLeftOuter READ LNGJoinTypeLeftOuter WRITE setLNGJoinTypeLeftOuter)
-    Q_PROPERTY(
-        QString LNGJoinTypeRightOuter READ LNGJoinTypeRightOuter WRITE setLNGJoinTypeRightOuter)
+    Q_PROPERTY(QString LNGJoinTypeRightOuter READ LNGJoinTypeRightOuter WRITE setLNGJoinTypeRightOuter)
     Q_PROPERTY(QString LNGJoinTypeBothOuter READ LNGJoinTypeBothOuter WRITE setLNGJoinTypeBothOuter)
     Q_PROPERTY(QString LNGJoinOk READ LNGJoinOk WRITE setLNGJoinOk)
     Q_PROPERTY(QString LNGJoinCancel READ LNGJoinCancel WRITE setLNGJoinCancel)
@@ -75,30 +75,21 @@ class ZandorWidget : public QWidget {
     Q_PROPERTY(ZandorModel Zandor READ model WRITE setModel)
     Q_PROPERTY(int HorizMaxScrollPos READ HorizMaxScrollPos WRITE setHorizMaxScrollPos)
     Q_PROPERTY(int VertMaxScrollPos READ VertMaxScrollPos WRITE setVertMaxScrollPos)
-    Q_PROPERTY(
-        int HorizontalScrollbarPos READ HorizontalScrollbarPos WRITE setHorizontalScrollbarPos)
+    Q_PROPERTY(int HorizontalScrollbarPos READ HorizontalScrollbarPos WRITE setHorizontalScrollbarPos)
     Q_PROPERTY(int VerticalScrollbarPos READ VerticalScrollbarPos WRITE setVerticalScrollbarPos)
     Q_PROPERTY(bool OnlyJoin READ OnlyJoin WRITE setOnlyJoin)
     Q_PROPERTY(bool UseJoinTypeNormal READ UseJoinTypeNormal WRITE setUseJoinTypeNormal)
     Q_PROPERTY(bool UseJoinTypeLeft READ UseJoinTypeLeft WRITE setUseJoinTypeLeft)
     Q_PROPERTY(bool UseJoinTypeRight READ UseJoinTypeRight WRITE setUseJoinTypeRight)
     Q_PROPERTY(bool UseJoinTypeBoth READ UseJoinTypeBoth WRITE setUseJoinTypeBoth)
-    Q_PROPERTY(bool UseJoinCompareOperatorEquals READ UseJoinCompareOperatorEquals WRITE
-                   setUseJoinCompareOperatorEquals)
-    Q_PROPERTY(bool UseJoinCompareOperatorNotEquals READ UseJoinCompareOperatorNotEquals WRITE
-                   setUseJoinCompareOperatorNotEquals)
-    Q_PROPERTY(bool UseJoinCompareOperatorLess READ UseJoinCompareOperatorLess WRITE
-                   setUseJoinCompareOperatorLess)
-    Q_PROPERTY(bool UseJoinCompareOperatorGreater READ UseJoinCompareOperatorGreater WRITE
-                   setUseJoinCompareOperatorGreater)
-    Q_PROPERTY(bool UseJoinCompareOperatorLessEquals READ UseJoinCompareOperatorLessEquals WRITE
-                   setUseJoinCompareOperatorLessEquals)
-    Q_PROPERTY(bool UseJoinCompareOperatorGreaterEquals READ UseJoinCompareOperatorGreaterEquals
-                   WRITE setUseJoinCompareOperatorGreaterEquals)
-    Q_PROPERTY(bool UseJoinCompareOperatorLE READ UseJoinCompareOperatorLE WRITE
-                   setUseJoinCompareOperatorLE)
-    Q_PROPERTY(bool UseJoinCompareOperatorGE READ UseJoinCompareOperatorGE WRITE
-                   setUseJoinCompareOperatorGE)
+    Q_PROPERTY(bool UseJoinCompareOperatorEquals READ UseJoinCompareOperatorEquals WRITE setUseJoinCompareOperatorEquals)
+    Q_PROPERTY(bool UseJoinCompareOperatorNotEquals READ UseJoinCompareOperatorNotEquals WRITE setUseJoinCompareOperatorNotEquals)
+    Q_PROPERTY(bool UseJoinCompareOperatorLess READ UseJoinCompareOperatorLess WRITE setUseJoinCompareOperatorLess)
+    Q_PROPERTY(bool UseJoinCompareOperatorGreater READ UseJoinCompareOperatorGreater WRITE setUseJoinCompareOperatorGreater)
+    Q_PROPERTY(bool UseJoinCompareOperatorLessEquals READ UseJoinCompareOperatorLessEquals WRITE setUseJoinCompareOperatorLessEquals)
+    Q_PROPERTY(bool UseJoinCompareOperatorGreaterEquals READ UseJoinCompareOperatorGreaterEquals WRITE setUseJoinCompareOperatorGreaterEquals)
+    Q_PROPERTY(bool UseJoinCompareOperatorLE READ UseJoinCompareOperatorLE WRITE setUseJoinCompareOperatorLE)
+    Q_PROPERTY(bool UseJoinCompareOperatorGE READ UseJoinCompareOperatorGE WRITE setUseJoinCompareOperatorGE)
     Q_PROPERTY(ZDJoin lastjoin READ lastjoin)
     Q_PROPERTY(ZDTable activetable READ activetable)
     Q_PROPERTY(ZDColumn ActiveColumn READ ActiveColumn)
