@@ -1,5 +1,7 @@
 #include "platform/qt/ColumnListModel.h"
 
+#include "platform/qt/ShownText.h"
+
 namespace platform::qt {
 
 int ColumnListModel::rowCount(const QModelIndex& parent) const {
@@ -8,7 +10,7 @@ int ColumnListModel::rowCount(const QModelIndex& parent) const {
 
 QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid() || index.row() >= rowCount()) return {};
-    if (role == Qt::DisplayRole) return text(index.row());
+    if (role == Qt::DisplayRole) return mRows[static_cast<std::size_t>(index.row())].shown;
     if (role == markedRole) return marked(index.row());
     if (role == Qt::AccessibleDescriptionRole && marked(index.row())) return tr("key column");
     return {};
@@ -17,7 +19,7 @@ QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
 void ColumnListModel::append(const QString& text) {
     const int row = rowCount();
     beginInsertRows({}, row, row);
-    mRows.push_back({text, false});
+    mRows.push_back({text, asSigns(text), false});
     endInsertRows();
 }
 

@@ -29,6 +29,7 @@ public:
 private:
     struct Row {
         QString text;
+        QString shown;
         bool marked = false;
     };
 

@@ -1,5 +1,7 @@
 #include "platform/qt/DragSession.h"
 
+#include "platform/qt/ShownText.h"
+
 #include <QDrag>
 #include <QGuiApplication>
 #include <QMetaObject>
@@ -102,7 +104,7 @@ QPixmap DragSession::picture(const QWidget& widget, const QStringList& names) {
     const QFontMetrics metrics = widget.fontMetrics();
     int width = 0;
     for (QString& line : lines) {
-        line = metrics.elidedText(line, Qt::ElideRight, widest);
+        line = metrics.elidedText(asSigns(line), Qt::ElideRight, widest);
         width = std::max(width, metrics.horizontalAdvance(line));
     }
     const QSize size(width + 2 * margin,

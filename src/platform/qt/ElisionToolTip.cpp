@@ -1,5 +1,7 @@
 #include "platform/qt/ElisionToolTip.h"
 
+#include "platform/qt/ShownText.h"
+
 #include <QFontMetrics>
 #include <QHelpEvent>
 #include <QToolTip>
@@ -9,10 +11,11 @@ namespace platform::qt {
 
 void showElisionToolTip(const QHelpEvent& event, QWidget& widget, const QString& text,
                         const QFont& font, const QRect& place) {
-    if (QFontMetrics(font).horizontalAdvance(text) <= place.width())
+    const QString shown = asSigns(text);
+    if (QFontMetrics(font).horizontalAdvance(shown) <= place.width())
         QToolTip::hideText();
     else
-        QToolTip::showText(event.globalPos(), text.toHtmlEscaped(), &widget, place);
+        QToolTip::showText(event.globalPos(), asToolTip(shown), &widget, place);
 }
 
 } // namespace platform::qt

@@ -9,8 +9,8 @@ class QWidget;
 
 namespace platform::qt {
 
-/// Shows the whole text as a tooltip where it is too wide for its place, and no tooltip where it
-/// fits. Place is in the widget's coordinates.
+/// Shows the whole of a name as a tooltip where it is too wide for its place, and no tooltip where
+/// it fits. Place is in the widget's coordinates.
 void showElisionToolTip(const QHelpEvent& event, QWidget& widget, const QString& text,
                         const QFont& font, const QRect& place);
 

@@ -2,6 +2,7 @@
 
 #include "platform/qt/GridCells.h"
 #include "platform/qt/GridModel.h"
+#include "platform/qt/ShownText.h"
 
 #include <QStyleOptionHeader>
 #include <QStylePainter>
@@ -19,7 +20,7 @@ void GridCorner::paintEvent(QPaintEvent*) {
     option.state |= QStyle::State_Raised;
     option.orientation = Qt::Horizontal;
     option.position = QStyleOptionHeader::Beginning; // column headers follow
-    option.text = mModel.text(0, 0);
+    option.text = asSigns(mModel.text(0, 0));
     option.textAlignment = Qt::AlignLeft | Qt::AlignVCenter;
     paintFixedCell(painter, option, *this);
 }

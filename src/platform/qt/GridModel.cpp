@@ -1,5 +1,7 @@
 #include "platform/qt/GridModel.h"
 
+#include "platform/qt/ShownText.h"
+
 #include <algorithm>
 #include <array>
 
@@ -43,7 +45,7 @@ int GridModel::columnCount(const QModelIndex& parent) const {
 }
 
 QVariant GridModel::valueOf(const Cell& cell, int role) {
-    if (role == Qt::DisplayRole) return cell.text;
+    if (role == Qt::DisplayRole) return asSigns(cell.text);
     if (role == Qt::TextAlignmentRole) return static_cast<int>(cell.alignment);
     return {};
 }
@@ -55,7 +57,8 @@ QString GridModel::titleOf(int row, int col) const {
     QString title = text(titled, 0);
     if (title.endsWith(u':')) title.chop(1);
     const QString& field = text(0, col);
-    return title + QStringLiteral(", ") + (field.isEmpty() ? tr("column %1").arg(col) : field);
+    return asSigns(title + QStringLiteral(", ") +
+                   (field.isEmpty() ? tr("column %1").arg(col) : field));
 }
 
 QVariant GridModel::data(const QModelIndex& index, int role) const {
@@ -63,7 +66,7 @@ QVariant GridModel::data(const QModelIndex& index, int role) const {
     if (role == Qt::AccessibleTextRole) {
         const QString& written = text(index.row() + 1, index.column() + 1);
         const QString title = titleOf(index.row() + 1, index.column() + 1);
-        return written.isEmpty() ? title : title + QStringLiteral(": ") + written;
+        return written.isEmpty() ? title : title + QStringLiteral(": ") + asSigns(written);
     }
     return valueOf(cell(index.row() + 1, index.column() + 1), role);
 }

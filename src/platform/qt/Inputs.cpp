@@ -3,6 +3,7 @@
 #include "platform/RuntimeError.h"
 #include "platform/qt/Fonts.h"
 #include "platform/qt/KeyCodes.h"
+#include "platform/qt/ShownText.h"
 #include "platform/qt/Text.h"
 
 #include <QDialog>
@@ -123,10 +124,16 @@ TextBoxAdapter::TextBoxAdapter(QLineEdit* widget, FocusTracker& focus, KeyEvent 
     new InputKeys(widget, std::move(KeyDown));
 }
 
-String TextBoxAdapter::Text() const { return mWidget ? fromQt(mWidget->text()) : String(); }
+String TextBoxAdapter::Text() const {
+    if (!mWidget) return {};
+    return mWidget->isReadOnly() ? mText : fromQt(mWidget->text());
+}
 
 void TextBoxAdapter::Text(const String& value) {
-    if (mWidget) mWidget->setText(toQt(value));
+    if (!mWidget) return;
+    // What nobody edits is a name to be looked at.
+    mText = value;
+    mWidget->setText(mWidget->isReadOnly() ? asSigns(toQt(value)) : toQt(value));
 }
 
 void TextBoxAdapter::SetFocus() {

@@ -42,6 +42,9 @@ public:
     String Text() const override;
     void Text(const String& value) override;
     void SetFocus() override;
+
+private:
+    String mText; ///< of a box that is only read
 };
 
 class LabelAdapter final : public Adapter<platform::Label, QLabel> {

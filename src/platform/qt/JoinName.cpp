@@ -3,6 +3,7 @@
 #include "control/Zandor.h"
 #include "platform/KeyedCollection.h"
 #include "platform/qt/LineEnds.h"
+#include "platform/qt/ShownText.h"
 #include "platform/qt/Text.h"
 
 #include <QCoreApplication>
@@ -19,7 +20,7 @@ QString phrase(const QString& left, StringView symbol, const QString& right) {
 }
 
 QString field(const String& table, const String& column) {
-    return toQt(table) + u'.' + toQt(column);
+    return asSigns(toQt(table) + u'.' + toQt(column));
 }
 
 /// Empty for a type or an operator that there is none of.

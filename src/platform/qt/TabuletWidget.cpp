@@ -5,6 +5,7 @@
 #include "platform/qt/ColumnListModel.h"
 #include "platform/qt/ElisionToolTip.h"
 #include "platform/qt/KeyCodes.h"
+#include "platform/qt/ShownText.h"
 
 #include <QDropEvent>
 #include <QHelpEvent>
@@ -117,9 +118,9 @@ void TabuletWidget::setListener(TabuletListener* listener) {
 }
 
 void TabuletWidget::setTitle(const QString& title) {
-    mTitle = title;
-    setAccessibleName(title);
-    mList->setAccessibleName(title);
+    mTitle = asSigns(title);
+    setAccessibleName(mTitle);
+    mList->setAccessibleName(mTitle);
     update(titleBar());
 }
 

@@ -40,6 +40,7 @@ public:
     QAbstractButton& closeButton() const { return *mClose; }
 
     void setTitle(const QString& title);
+    /// As it is shown.
     const QString& title() const { return mTitle; }
     void setCurrent(bool current);
     bool isCurrent() const { return mCurrent; }
