@@ -10,6 +10,10 @@
 #include "platform/TalvikZandorLib.h"
 #include "platform/Toolkit.h"
 
+namespace comforts {
+class Door;
+}
+
 namespace TalvikDBxZandor {
 
 class frmJoinDefinition;
@@ -146,6 +150,7 @@ public:
 
 private:
     friend struct ZandorBackstage; ///< tests reach the procedures below through it
+    friend class comforts::Door;   ///< what is built above the control acts through it
 
     using Tabulet = TalvikTabulet::Tabulet;
     using ColumnItem = TalvikTabulet::ColumnItem;
@@ -238,6 +243,8 @@ private:
                            std::int16_t State);
     void lstTable_DragDrop(std::int16_t Index, platform::Control* Source, float X, float Y);
     bool GetDragColumns(std::int16_t Index);
+    Ref<clsDragColumn> DragRecord(std::int16_t Index, const Ref<Tabulet>& element,
+                                  const Ref<ColumnItem>& entry);
     ZDTableRef TableOf(std::int16_t Index);
     static bool IsAllColumns(const ColumnItem& entry);
     static Ref<ColumnItem> FirstSelected(Tabulet& table);
@@ -292,6 +299,7 @@ private:
     void mnuTableDefinitionDelete_Click();
     void mnuTableDefinitionPaste_Click();
     void InsertDragColumns(float X, float Y);
+    void InsertRecords(const std::vector<Ref<clsDragColumn>>& records, std::int32_t column);
     bool InsertColumnDefinition(const String& fieldName, std::int32_t column);
     bool RemoveColumn(std::int32_t column);
     void FitColumn(std::int32_t column, const String& fieldName);

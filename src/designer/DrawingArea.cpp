@@ -34,6 +34,7 @@ void DrawingArea::showAnew() {
     ZandorWidget* const before = mControl;
     mControl = new ZandorWidget(mLibrary, this);
     mControl->setDebugSwitch(0);
+    mControl->setComforts(comforts::Flags::all());
     for (auto option = mOptions.begin(); option != mOptions.end(); ++option)
         mControl->setProperty(option.key().toLatin1().constData(), option.value());
     emit controlMade(mControl);

@@ -18,6 +18,7 @@ std::string houseOf(const std::string& file) {
     if (startsWith("platform/headless/")) return "headless";
     if (startsWith("platform/qt/")) return "qt";
     if (startsWith("platform/")) return "platform";
+    if (startsWith("comforts/")) return "comforts";
     if (startsWith("model/reader/")) return "reader";
     if (startsWith("model/files/")) return "files";
     if (startsWith("model/")) return "model";
@@ -28,16 +29,17 @@ std::string houseOf(const std::string& file) {
 const std::map<std::string, Houses> mayInclude = {
     {"platform", {"platform"}},
     {"control", {"control", "platform"}},
-    {"headless", {"headless", "platform"}},
-    {"qt", {"qt", "control", "platform"}},
+    {"comforts", {"comforts", "control", "platform"}},
+    {"headless", {"headless", "comforts", "platform"}},
+    {"qt", {"qt", "comforts", "control", "platform"}},
     {"model", {"model", "platform"}},
     {"reader", {"reader", "model", "platform"}},
     {"files", {"files", "model", "platform"}},
-    {"designer", {"designer", "files", "reader", "model", "qt", "control", "platform"}},
+    {"designer", {"designer", "files", "reader", "model", "qt", "comforts", "control", "platform"}},
 };
 
 /// The houses that use the standard library and nothing else.
-const Houses toolkitFree = {"platform", "control", "headless", "model"};
+const Houses toolkitFree = {"platform", "control", "comforts", "headless", "model"};
 
 const std::set<std::string> standardHeaders = {"algorithm",
                                                "any",

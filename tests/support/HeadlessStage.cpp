@@ -28,6 +28,7 @@ public:
             if (onDialog) onDialog();
         };
         mControl = std::make_unique<TalvikDBxZandor::Zandor>(mToolkit, library, mEvents);
+        mToolkit.comforts.attach(*mControl);
         mToolkit.onPaint = [this] { mControl->UserControl_Paint(); };
         mToolkit.onResize = [this] { mControl->UserControl_Resize(); };
         mToolkit.onResize();
@@ -38,9 +39,11 @@ public:
 
     TalvikDBxZandor::Zandor& control() override { return *mControl; }
     platform::Toolkit& toolkit() override { return mToolkit; }
+    comforts::Comforts& comforts() override { return mToolkit.comforts; }
     void closeControl() override {
         mToolkit.onPaint = nullptr;
         mToolkit.onResize = nullptr;
+        mToolkit.comforts.detach();
         mControl.reset();
     }
 
@@ -98,6 +101,9 @@ public:
     }
     void moveOverEntry(std::int16_t index, std::int32_t entry, std::int16_t button) override {
         mUser.moveOverEntry(tableName(index), entry, button);
+    }
+    void doubleClickEntry(std::int16_t index, std::int32_t entry) override {
+        mUser.doubleClickEntry(tableName(index), entry);
     }
     void dragToEntry(std::int16_t from, std::int32_t entry, std::int16_t to,
                      std::int32_t target) override {

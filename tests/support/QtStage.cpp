@@ -80,6 +80,7 @@ public:
 
     TalvikDBxZandor::Zandor& control() override { return mWidget->control(); }
     platform::Toolkit& toolkit() override { return mWidget->toolkit(); }
+    comforts::Comforts& comforts() override { return mWidget->toolkit().comforts(); }
     void closeControl() override {
         mWidget.reset();
         qApp->processEvents();
@@ -160,6 +161,13 @@ public:
     }
     void moveOverEntry(std::int16_t index, std::int32_t entry, std::int16_t button) override {
         send(entrySpot(index, entry), QEvent::MouseMove, 0, buttonsOf(button));
+    }
+    void doubleClickEntry(std::int16_t index, std::int32_t entry) override {
+        const Spot spot = entrySpot(index, entry);
+        send(spot, QEvent::MouseButtonPress, 1, Qt::LeftButton);
+        send(spot, QEvent::MouseButtonRelease, 1, Qt::NoButton);
+        send(spot, QEvent::MouseButtonDblClick, 1, Qt::LeftButton);
+        send(spot, QEvent::MouseButtonRelease, 1, Qt::NoButton);
     }
     void dragToEntry(std::int16_t from, std::int32_t entry, std::int16_t to,
                      std::int32_t target) override {

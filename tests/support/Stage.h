@@ -1,5 +1,6 @@
 #pragma once
 
+#include "comforts/Comforts.h"
 #include "control/Zandor.h"
 
 #include <functional>
@@ -64,6 +65,8 @@ public:
 
     virtual TalvikDBxZandor::Zandor& control() = 0;
     virtual platform::Toolkit& toolkit() = 0;
+    /// All off at first.
+    virtual comforts::Comforts& comforts() = 0;
     /// Destroys the control (its closing boxes are recorded).
     virtual void closeControl() = 0;
 
@@ -106,6 +109,8 @@ public:
     virtual void releaseEntry(std::int16_t index, std::int32_t entry, std::int16_t button) = 0;
     /// Button is the sum of the buttons held.
     virtual void moveOverEntry(std::int16_t index, std::int32_t entry, std::int16_t button) = 0;
+    /// Press, release and press again within the time of a double click.
+    virtual void doubleClickEntry(std::int16_t index, std::int32_t entry) = 0;
     /// A whole drag of the selected entries from an entry to an entry of another or the same table
     /// (0: an empty place of the list).
     virtual void dragToEntry(std::int16_t from, std::int32_t entry, std::int16_t to,

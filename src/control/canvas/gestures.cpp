@@ -65,19 +65,23 @@ bool Zandor::GetDragColumns(std::int16_t Index) {
         auto& entries = element->ColumnItems();
         for (std::int32_t n = 1; n <= entries.Count(); ++n) {
             const Ref<ColumnItem> entry = entries.Item(n);
-            if (!entry->Selected()) continue;
-            auto record = platform::makeRef<clsDragColumn>(mToolkit);
-            record->TableIndex(Index);
-            record->Table(element);
-            record->Column(entry);
-            record->ZDTable(TableOf(Index));
-            record->ZDColumn(record->ZDTable()->Columns().Item(entry->Key()));
-            records.push_back(std::move(record));
+            if (entry->Selected()) records.push_back(DragRecord(Index, element, entry));
         }
         mDragColumns = std::move(records);
         result = true;
     });
     return result;
+}
+
+platform::Ref<clsDragColumn> Zandor::DragRecord(std::int16_t Index, const Ref<Tabulet>& element,
+                                                const Ref<ColumnItem>& entry) {
+    auto record = platform::makeRef<clsDragColumn>(mToolkit);
+    record->TableIndex(Index);
+    record->Table(element);
+    record->Column(entry);
+    record->ZDTable(TableOf(Index));
+    record->ZDColumn(record->ZDTable()->Columns().Item(entry->Key()));
+    return record;
 }
 
 void Zandor::lstTable_DragOver(std::int16_t Index, platform::Control*, float X, float Y,

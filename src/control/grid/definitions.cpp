@@ -26,8 +26,12 @@ void Zandor::InsertDragColumns(float X, float Y) {
     std::int32_t column = 0;
     std::int32_t row = 0;
     basZandor::SpreadHitTest(mToolkit, column, row, *sprColumn, X, Y);
-    column = std::max(column, 1);
-    for (const auto& record : std::vector(mDragColumns)) {
+    // By value: what is inserted is told to the host, which may begin another drag.
+    InsertRecords(std::vector(mDragColumns), std::max(column, 1));
+}
+
+void Zandor::InsertRecords(const std::vector<Ref<clsDragColumn>>& records, std::int32_t column) {
+    for (const auto& record : records) {
         String fieldName = record->Table()->Text() + u".";
         fieldName += record->Column()->Text();
         InsertColumnDefinition(fieldName, column);

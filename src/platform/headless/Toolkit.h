@@ -1,5 +1,6 @@
 #pragma once
 
+#include "comforts/Comforts.h"
 #include "platform/Toolkit.h"
 #include "platform/headless/Dialog.h"
 #include "platform/headless/Faults.h"
@@ -43,6 +44,8 @@ public:
     ~Toolkit() override;
 
     Faults faults;
+    /// What the user does passes here first. A test attaches it to its control.
+    comforts::Comforts comforts{*this};
 
     // The surroundings, which a test may change.
     platform::Font ambientFont{u"Segoe UI", 9};

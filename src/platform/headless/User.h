@@ -46,6 +46,9 @@ public:
     void moveOverEntry(const std::string& name, std::int32_t entry, std::int16_t button,
                        std::int16_t shift = 0);
 
+    /// The second press of a double click with the left button; the first has been released.
+    void doubleClickEntry(const std::string& name, std::int32_t entry);
+
     /// Moves a drag that is on over a place of a table list; nothing without a drag.
     void dragOver(const std::string& table, float X, float Y);
     /// Ends a drag over a place of a table list or the grid; nothing without a drag.

@@ -71,6 +71,14 @@ void User::releaseEntry(const std::string& name, std::int32_t entry, std::int16_
                                    shift);
 }
 
+void User::doubleClickEntry(const std::string& name, std::int32_t entry) {
+    pressEntry(name, entry, leftButton);
+    releaseEntry(name, entry, leftButton);
+    pressEntry(name, entry, leftButton);
+    mToolkit.comforts.entryDoubleClicked(reachEntry(name, entry).index, entry);
+    if (mToolkit.exists(name)) releaseEntry(name, entry, leftButton);
+}
+
 void User::leaveDragTarget() {
     const std::string left = std::exchange(mDragTarget, {});
     if (left.empty() || !mToolkit.exists(left)) return;

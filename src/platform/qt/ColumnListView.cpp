@@ -88,12 +88,21 @@ void ColumnListView::mouseReleaseEvent(QMouseEvent* event) {
                                  shiftState(event->modifiers()));
 }
 
-void ColumnListView::mouseDoubleClickEvent(QMouseEvent* event) { mousePressEvent(event); }
+void ColumnListView::mouseDoubleClickEvent(QMouseEvent* event) {
+    const QPointer<ColumnListView> alive = this;
+    mousePressEvent(event);
+    if (!alive) return;
+    const QModelIndex index = indexAt(event->position().toPoint());
+    if (mListener && index.isValid() && event->button() == Qt::LeftButton)
+        mListener->entryDoubleClicked(index.row());
+}
 
 void ColumnListView::keyPressEvent(QKeyEvent* event) {
     if (isMenuKey(*event)) return openMenu();
     if (mListener && event->key() == Qt::Key_Delete && modifiersOf(*event) == Qt::NoModifier)
         return mListener->deleteKey(currentIndex().row());
+    if (mListener && isEnter(*event) && currentIndex().isValid())
+        return mListener->entryDoubleClicked(currentIndex().row());
     const QPointer<ColumnListView> alive = this;
     const QItemSelection before = selectionModel()->selection();
     if (event->key() == Qt::Key_Space && currentIndex().isValid())

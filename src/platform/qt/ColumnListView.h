@@ -13,6 +13,8 @@ public:
     virtual void entryPressed(int row, std::int16_t button, std::int16_t shift) = 0;
     virtual void entryMoved(int row, std::int16_t buttons, std::int16_t shift) = 0;
     virtual void entryReleased(int row, std::int16_t button, std::int16_t shift) = 0;
+    /// After the press that makes the click a double one; or by Enter.
+    virtual void entryDoubleClicked(int row) = 0;
     virtual void listScrolled() = 0;
     /// A key asks for the menu at a place of the screen; the row is -1 in a list without entries.
     virtual void menuKey(int row, QPoint at) = 0;

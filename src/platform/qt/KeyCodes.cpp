@@ -32,6 +32,10 @@ std::int16_t keyCode(const QKeyEvent& event) {
     }
 }
 
+bool isEnter(const QKeyEvent& event) {
+    return event.key() == Qt::Key_Return || event.key() == Qt::Key_Enter;
+}
+
 bool isMenuKey(const QKeyEvent& event) {
     return event.key() == Qt::Key_F10 && modifiersOf(event) == Qt::ShiftModifier;
 }

@@ -15,6 +15,9 @@ std::int16_t keyCode(const QKeyEvent& event);
 /// The keys that open the context menu where the window system does not say so itself.
 bool isMenuKey(const QKeyEvent& event);
 
+/// Return, and Enter on the numeric pad.
+bool isEnter(const QKeyEvent& event);
+
 /// The modifiers held, without the mark of the numeric pad's keys.
 Qt::KeyboardModifiers modifiersOf(const QKeyEvent& event);
 

@@ -27,10 +27,6 @@ bool takesTab(const QWidget& widget) {
 
 Qt::FocusReason reason(bool next) { return next ? Qt::TabFocusReason : Qt::BacktabFocusReason; }
 
-bool isEnter(const QKeyEvent& event) {
-    return event.key() == Qt::Key_Return || event.key() == Qt::Key_Enter;
-}
-
 } // namespace
 
 void Navigation::setGrid(GridWidget* grid) { mGrid = grid; }

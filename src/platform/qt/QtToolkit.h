@@ -1,5 +1,6 @@
 #pragma once
 
+#include "comforts/Comforts.h"
 #include "platform/Toolkit.h"
 #include "platform/qt/CanvasView.h"
 #include "platform/qt/DragSession.h"
@@ -26,6 +27,7 @@ public:
     DragSession& drags() { return mDrags; }
     CanvasView& view() { return mView; }
     Navigation& navigation() { return mNavigation; }
+    comforts::Comforts& comforts() { return mComforts; }
 
     void MsgBox(const String& prompt, std::int32_t style, const String& title) override;
     std::unique_ptr<Frame> makeFrame(const Design& design, FrameEvents events) override;
@@ -68,7 +70,8 @@ private:
     DragSession mDrags;
     KeyboardMenu mMenu;
     LineEnds mAsked;
-    TabuletSurroundings mTables{mDrags, mMenu, mAsked};
+    comforts::Comforts mComforts{*this};
+    TabuletSurroundings mTables{mDrags, mMenu, mAsked, mComforts};
     CanvasView mView{mMenu, mDrags};
     Navigation mNavigation{mSurface, mView};
     QPointer<QWidget> mGrid;

@@ -213,6 +213,10 @@ void TabuletAdapter::entryReleased(int row, std::int16_t button, std::int16_t sh
     report(mEvents.ColumnMouseUp, row, button, shift);
 }
 
+void TabuletAdapter::entryDoubleClicked(int row) {
+    mSurroundings.comforts.entryDoubleClicked(mIndex, row + 1);
+}
+
 void TabuletAdapter::menuKey(int row, QPoint at) {
     mSurroundings.menu.openAt(at, [&] { entryReleased(row, buttonState(Qt::RightButton), 0); });
 }

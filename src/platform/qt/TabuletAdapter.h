@@ -1,5 +1,6 @@
 #pragma once
 
+#include "comforts/Comforts.h"
 #include "platform/Tabulet.h"
 #include "platform/qt/Adapter.h"
 #include "platform/qt/LineEnds.h"
@@ -17,7 +18,8 @@ class TabuletAdapter;
 struct TabuletSurroundings {
     DragSession& drags;
     KeyboardMenu& menu;
-    LineEnds& asked;                   ///< told when an entry is asked for an edge
+    LineEnds& asked; ///< told when an entry is asked for an edge
+    comforts::Comforts& comforts;
     TabuletAdapter* current = nullptr; ///< the activated one
 };
 
@@ -63,6 +65,7 @@ private:
     void entryPressed(int row, std::int16_t button, std::int16_t shift) override;
     void entryMoved(int row, std::int16_t buttons, std::int16_t shift) override;
     void entryReleased(int row, std::int16_t button, std::int16_t shift) override;
+    void entryDoubleClicked(int row) override;
     void listScrolled() override;
     void menuKey(int row, QPoint at) override;
     void deleteKey(int row) override;

@@ -49,6 +49,7 @@ ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
     setAccessibleName(tr("Query designer"));
     resize(sizeHint());
     mControl = std::make_unique<Zandor>(*mToolkit, library, *mEvents);
+    mToolkit->comforts().attach(*mControl);
     mToolkit->view().setNamer([this](const platform::qt::CanvasLine& line) {
         return mControl ? joinName(*mControl, line.ends()) : QString();
     });
@@ -58,7 +59,14 @@ ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
 ZandorWidget::~ZandorWidget() {
     // The window around may be in the middle of its own destruction.
     mToolkit->close();
+    mToolkit->comforts().detach();
     mControl.reset();
+}
+
+const comforts::Flags& ZandorWidget::comforts() const { return mToolkit->comforts().flags(); }
+
+void ZandorWidget::setComforts(const comforts::Flags& flags) {
+    mToolkit->comforts().setFlags(flags);
 }
 
 QSize ZandorWidget::sizeHint() const { return {900, 600}; }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "comforts/Flags.h"
 #include "control/Zandor.h"
 
 #include <QWidget>
@@ -108,6 +109,10 @@ public:
     /// The control behind the widget, for hosts that prefer its C++ interface.
     TalvikDBxZandor::Zandor& control() { return *mControl; }
     platform::qt::QtToolkit& toolkit() { return *mToolkit; }
+
+    /// What people expect beyond the bare control; all off at first.
+    const comforts::Flags& comforts() const;
+    void setComforts(const comforts::Flags& flags);
 
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override;
