@@ -25,7 +25,7 @@ void ColumnListModel::append(const QString& text) {
 
 void ColumnListModel::setMarked(int row, bool marked) {
     mRows[static_cast<std::size_t>(row)].marked = marked;
-    emit dataChanged(index(row), index(row), {markedRole, Qt::AccessibleDescriptionRole});
+    Q_EMIT dataChanged(index(row), index(row), {markedRole, Qt::AccessibleDescriptionRole});
 }
 
 void ColumnListModel::clear() {

@@ -31,9 +31,9 @@ void GridModel::move(int from, int to) {
 }
 
 void GridModel::announce() {
-    emit dataChanged(index(0, 0), index(rowCount() - 1, columnCount() - 1));
-    emit headerDataChanged(Qt::Horizontal, 0, columnCount() - 1);
-    emit headerDataChanged(Qt::Vertical, 0, rowCount() - 1);
+    Q_EMIT dataChanged(index(0, 0), index(rowCount() - 1, columnCount() - 1));
+    Q_EMIT headerDataChanged(Qt::Horizontal, 0, columnCount() - 1);
+    Q_EMIT headerDataChanged(Qt::Vertical, 0, rowCount() - 1);
 }
 
 int GridModel::rowCount(const QModelIndex& parent) const {

@@ -22,16 +22,16 @@ public:
                const TalvikDBxZandor::EventArguments& arguments) override {
         using TalvikDBxZandor::Event;
         switch (event) {
-        case Event::TableDeleted: emit mWidget.TableDeleted(); break;
-        case Event::TableMoved: emit mWidget.TableMoved(); break;
-        case Event::Activate: emit mWidget.Activate(); break;
-        case Event::ColumnCreated: emit mWidget.ColumnCreated(arguments.Definition); break;
-        case Event::ColumnModified: emit mWidget.ColumnModified(arguments.Definition); break;
-        case Event::ColumnRemoved: emit mWidget.ColumnRemoved(arguments.Definition); break;
-        case Event::Error: emit mWidget.Error(toQt(arguments.Text), arguments.Number); break;
-        case Event::JoinCreated: emit mWidget.JoinCreated(arguments.Join); break;
-        case Event::JoinModified: emit mWidget.JoinModified(arguments.Join); break;
-        case Event::JoinRemoved: emit mWidget.JoinRemoved(arguments.Join); break;
+        case Event::TableDeleted: Q_EMIT mWidget.TableDeleted(); break;
+        case Event::TableMoved: Q_EMIT mWidget.TableMoved(); break;
+        case Event::Activate: Q_EMIT mWidget.Activate(); break;
+        case Event::ColumnCreated: Q_EMIT mWidget.ColumnCreated(arguments.Definition); break;
+        case Event::ColumnModified: Q_EMIT mWidget.ColumnModified(arguments.Definition); break;
+        case Event::ColumnRemoved: Q_EMIT mWidget.ColumnRemoved(arguments.Definition); break;
+        case Event::Error: Q_EMIT mWidget.Error(toQt(arguments.Text), arguments.Number); break;
+        case Event::JoinCreated: Q_EMIT mWidget.JoinCreated(arguments.Join); break;
+        case Event::JoinModified: Q_EMIT mWidget.JoinModified(arguments.Join); break;
+        case Event::JoinRemoved: Q_EMIT mWidget.JoinRemoved(arguments.Join); break;
         }
     }
 

@@ -245,7 +245,7 @@ public:
     Q_INVOKABLE void SelectColumnNames(const QString& TabName, const QString& ColName);
     Q_INVOKABLE void SetCurrentTable(const QString& TabName);
 
-signals:
+Q_SIGNALS:
     /// DeletedTable has the name.
     void TableDeleted();
     void TableMoved();
