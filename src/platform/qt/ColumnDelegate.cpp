@@ -2,6 +2,7 @@
 
 #include "platform/qt/ColumnListModel.h"
 #include "platform/qt/KeyMarker.h"
+#include "platform/qt/ShownText.h"
 
 #include <QApplication>
 #include <QPainter>
@@ -43,8 +44,9 @@ void ColumnDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option
     const QRect place = textPlace(item.rect, item.fontMetrics);
     painter->setFont(item.font);
     painter->setPen(colour);
+    painter->setLayoutDirection(asItReads);
     painter->drawText(
-        place, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextSingleLine,
+        place, static_cast<int>(atTheLeft) | Qt::TextSingleLine,
         item.fontMetrics.elidedText(index.data().toString(), Qt::ElideRight, place.width()));
     if (item.state & QStyle::State_HasFocus) {
         QStyleOptionFocusRect focus;

@@ -1,6 +1,7 @@
 #include "platform/qt/GridCells.h"
 
 #include "platform/qt/FocusFrame.h"
+#include "platform/qt/ShownText.h"
 
 #include <QPainter>
 #include <QTableView>
@@ -28,6 +29,8 @@ void GridCellDelegate::paint(QPainter* painter, const QStyleOptionViewItem& opti
 void paintFixedCell(QPainter& painter, QStyleOptionHeader option, const QWidget& widget) {
     const QStyle& style = *widget.style();
     style.drawControl(QStyle::CE_HeaderSection, &option, &painter, &widget);
+    option.textAlignment |= Qt::AlignAbsolute;
+    painter.setLayoutDirection(asItReads);
     option.rect.adjust(cellMargin, 0, -cellMargin, 0);
     option.text = option.fontMetrics.elidedText(option.text, Qt::ElideRight, option.rect.width());
     style.drawControl(QStyle::CE_HeaderLabel, &option, &painter, &widget);
@@ -39,7 +42,7 @@ void RowTitles::paintSection(QPainter* painter, const QRect& place, int section)
     option.rect = place;
     option.section = section;
     option.text = model()->headerData(section, orientation(), Qt::DisplayRole).toString();
-    option.textAlignment = Qt::AlignLeft | Qt::AlignVCenter;
+    option.textAlignment = atTheLeft;
     option.position = count() == 1            ? QStyleOptionHeader::OnlyOneSection
                       : section == 0          ? QStyleOptionHeader::Beginning
                       : section + 1 < count() ? QStyleOptionHeader::Middle

@@ -21,7 +21,7 @@ void GridCorner::paintEvent(QPaintEvent*) {
     option.orientation = Qt::Horizontal;
     option.position = QStyleOptionHeader::Beginning; // column headers follow
     option.text = asSigns(mModel.text(0, 0));
-    option.textAlignment = Qt::AlignLeft | Qt::AlignVCenter;
+    option.textAlignment = atTheLeft;
     paintFixedCell(painter, option, *this);
 }
 

@@ -58,6 +58,7 @@ QAction* PopupMenuAdapter::chosenByUser(std::optional<QPoint> at) {
     // The menu has no parent, so it does not follow the widget's looks by itself.
     mMenu.setPalette(mSurface.palette());
     mMenu.setFont(mSurface.font());
+    mMenu.setLayoutDirection(mSurface.layoutDirection());
     return mMenu.exec(at.value_or(QCursor::pos()));
 }
 

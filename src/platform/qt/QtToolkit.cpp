@@ -55,6 +55,8 @@ template <class AdapterType, class W, class... Arguments>
 std::unique_ptr<AdapterType> QtToolkit::adapt(const Design& design, Role role, W* widget,
                                               Arguments&&... arguments) {
     widget->setObjectName(toQt(design.Name));
+    // Places are counted from the left, whichever way the host's texts run.
+    if (!design.Container) widget->setLayoutDirection(Qt::LeftToRight);
     // Within the control, Tab goes the way of the navigation; to the window it is a single stop.
     if (mSurface.isAncestorOf(widget) && widget->focusPolicy() & Qt::TabFocus)
         widget->setFocusPolicy(Qt::ClickFocus);
@@ -146,6 +148,7 @@ std::unique_ptr<Dialog> QtToolkit::makeDialog(const Design& design, DialogEvents
     auto* dialog = new FormDialog(window(), std::move(events.Close));
     dialog->setPalette(mSurface.palette());
     dialog->setFont(mSurface.font());
+    dialog->setLayoutDirection(mSurface.layoutDirection());
     dialog->setWindowTitle(toQt(design.Caption));
     dialog->setObjectName(toQt(design.Name));
     return std::make_unique<DialogAdapter>(dialog, mFocus);

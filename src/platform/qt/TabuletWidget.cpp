@@ -167,7 +167,8 @@ void TabuletWidget::paintEvent(QPaintEvent*) {
     painter.setFont(bold);
     painter.setPen(colours.text);
     const QRect place = titleBar().adjusted(border + 4, 0, -mTitleHeight, 0);
-    painter.drawText(place, Qt::AlignVCenter | Qt::AlignLeft | Qt::TextSingleLine,
+    painter.setLayoutDirection(asItReads);
+    painter.drawText(place, static_cast<int>(atTheLeft) | Qt::TextSingleLine,
                      QFontMetrics(bold).elidedText(mTitle, Qt::ElideRight, place.width()));
 
     painter.setPen(colours.frame);
