@@ -147,13 +147,52 @@ TEST_F(Looks, OfAnOpenEditorStayUntilSomethingClosesIt) {
 TEST_F(Looks, OfAnOpenEditorEndWhenTheControlPaintsItself) {
     show();
     bind();
-    press(4, 1);
-    ASSERT_TRUE(child<QWidget>("fraValue").isVisible());
     QPaintEvent paint(widget->rect());
-    QCoreApplication::sendEvent(widget.get(), &paint);
-    EXPECT_TRUE(child<QWidget>("fraValue").isVisible()) << "not while Qt is painting";
-    settle();
-    EXPECT_FALSE(child<QWidget>("fraValue").isVisible());
+    const std::function<void()> ways[] = {
+        [&] { QCoreApplication::sendEvent(widget.get(), &paint); },
+        [this] { widget->update(); },
+        [this] { widget->repaint(); },
+        [this] {
+            widget->hide();
+            widget->show();
+        },
+    };
+    int way = 0;
+    for (const auto& ask : ways) {
+        press(4, 1);
+        ASSERT_TRUE(child<QWidget>("fraValue").isVisible()) << way;
+        ask();
+        EXPECT_TRUE(child<QWidget>("fraValue").isVisible()) << way << ", while Qt is painting";
+        settle();
+        EXPECT_FALSE(child<QWidget>("fraValue").isVisible()) << way;
+        ++way;
+    }
+}
+
+TEST_F(Looks, OfAnOpenEditorStayWhateverTheControlDoesBesides) {
+    widget->setMXHorzFrameSize(6000);
+    widget->setMXVertFrameSize(6000); // a canvas that leaves much of the surface uncovered
+    show();
+    bind();
+    const std::function<void()> works[] = {
+        [this] { table(1).move(table(1).pos() + QPoint(40, 10)); },
+        [this] { table(1).raise(); },
+        [this] { child<QWidget>("fraTable").raise(); },
+        [this] { child<QWidget>("fraTable").move(-30, -30); },
+        [this] { child<QWidget>("vsbTable").hide(); },
+        [this] { child<QWidget>("vsbTable").show(); },
+        [this] { grid().model().setWidth(1, 3000); },
+        [this] { widget->grab(); },
+        [this] { widget->control().UserControl_Resize(); },
+    };
+    press(4, 1);
+    int work = 0;
+    for (const auto& go : works) {
+        go();
+        for (QWidget* part : widget->findChildren<QWidget*>()) part->update();
+        settle();
+        EXPECT_TRUE(child<QWidget>("fraValue").isVisible()) << work++;
+    }
 }
 
 TEST_F(Looks, OfAClosedEditorLeaveTheFocusInTheGrid) {

@@ -7,6 +7,7 @@
 #include "platform/qt/Text.h"
 
 #include <QKeyEvent>
+#include <QPaintEvent>
 #include <QWheelEvent>
 
 using platform::qt::fromQt;
@@ -73,7 +74,21 @@ QSize ZandorWidget::sizeHint() const { return {900, 600}; }
 
 QSize ZandorWidget::minimumSizeHint() const { return {240, 160}; }
 
-void ZandorWidget::paintEvent(QPaintEvent*) { queuePaint(); }
+void ZandorWidget::paintEvent(QPaintEvent* event) {
+    // Qt's own paint events come whenever a part of the surface is uncovered: a table that moves,
+    // the canvas that scrolls, an editor that opens. What a host sends is a wish of its own.
+    if (!event->spontaneous()) queuePaint();
+}
+
+void ZandorWidget::update() {
+    QWidget::update();
+    queuePaint();
+}
+
+void ZandorWidget::repaint() {
+    QWidget::repaint();
+    queuePaint();
+}
 
 void ZandorWidget::resizeEvent(QResizeEvent*) {
     if (mControl) mControl->UserControl_Resize();

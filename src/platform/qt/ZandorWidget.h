@@ -117,6 +117,9 @@ public:
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override;
 
+    using QWidget::repaint;
+    using QWidget::update;
+
     QString LNGJoinForm() const;
     void setLNGJoinForm(const QString& value);
     QString LNGJoinLeftTable() const;
@@ -244,6 +247,11 @@ public:
     Q_INVOKABLE void Terminate();
     Q_INVOKABLE void SelectColumnNames(const QString& TabName, const QString& ColName);
     Q_INVOKABLE void SetCurrentTable(const QString& TabName);
+
+    /// Painting anew is for the control to lay itself out and close an open editor, as when it is
+    /// first shown. Painting that its own work causes is not, nor is the painting of a part.
+    void update();
+    void repaint();
 
 Q_SIGNALS:
     /// DeletedTable has the name.
