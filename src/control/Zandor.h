@@ -148,6 +148,16 @@ public:
     /// Makes the first shown table of a name the current one; an unknown name changes nothing.
     void SetCurrentTable(const String& TabName);
 
+    // Beyond the public interface: for front ends and what stands between them and the control.
+
+    /// Moves a column of the grid to another position, both from 1 to the last column, and its
+    /// definition in the model with it; raises ColumnModified when it stands elsewhere then. A
+    /// position behind the last definition is that of the last. Closes an open editor; the current
+    /// cell stays the same cell. False, and nothing happens, for a column without a definition, a
+    /// position below 1, and a model that keeps no order (OrderedDefinitions); error 30010 beyond
+    /// the last column, 5 for a definition that the model has no longer.
+    bool MoveColumn(std::int32_t column, std::int32_t position);
+
 private:
     friend struct ZandorBackstage; ///< tests reach the procedures below through it
     friend class comforts::Door;   ///< what is built above the control acts through it
@@ -300,6 +310,8 @@ private:
     void mnuTableDefinitionPaste_Click();
     void InsertDragColumns(float X, float Y);
     void InsertRecords(const std::vector<Ref<clsDragColumn>>& records, std::int32_t column);
+    Ref<TalvikZandorLib::OrderedDefinitions> Ordered();
+    Ref<TalvikZandorLib::ZDColumnDefinition> DefinitionBefore(std::int32_t column);
     bool InsertColumnDefinition(const String& fieldName, std::int32_t column);
     bool RemoveColumn(std::int32_t column);
     void FitColumn(std::int32_t column, const String& fieldName);

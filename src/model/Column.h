@@ -1,6 +1,7 @@
 #pragma once
 
 #include "model/Description.h"
+#include "model/FieldColumn.h"
 #include "model/Place.h"
 
 namespace model {
@@ -25,12 +26,17 @@ public:
     std::int16_t activated() const { return mActivated; }
     const ColumnDescription& description() const { return mDescription; }
     const ColumnPlace& place() const { return mPlace; }
+    /// The column as an output column shows it; always the same object.
+    static Ref<FieldColumn> field(const Ref<Column>& column) {
+        return column ? Ref<FieldColumn>(column, &column->mField) : Ref<FieldColumn>();
+    }
 
 private:
     const ColumnPlace mPlace;
     const ColumnDescription mDescription;
     bool mSelected = false;
     std::int16_t mActivated = 0;
+    FieldColumn mField{*this};
 };
 
 } // namespace model

@@ -4,7 +4,9 @@
 
 namespace model {
 
-Ref<TalvikZandorLib::ZDColumn> ColumnDefinition::Column() const { return mPlace->column(); }
+Ref<TalvikZandorLib::ZDColumn> ColumnDefinition::Column() const {
+    return model::Column::field(mPlace->column());
+}
 
 void ColumnDefinition::Column(const Ref<TalvikZandorLib::ZDColumn>& value) {
     const ColumnPlace place = placeOf(value);

@@ -11,9 +11,12 @@ class Query;
 /// deleted or the query is gone.
 class ColumnDefinition final : public TalvikZandorLib::ZDColumnDefinition {
 public:
+    /// The column under its name in the grid, "table.column" (see FieldColumn); place() leads to
+    /// the column itself.
     Ref<TalvikZandorLib::ZDColumn> Column() const override;
-    /// Any column as long as the definition is new. Once it has its key it stays with its query:
-    /// a column of another query is error 5, and nothing is error 91.
+    /// Any column, by itself or by its name in the grid, as long as the definition is new. Once it
+    /// has its key it stays with its query: a column of another query is error 5, and nothing is
+    /// error 91.
     void Column(const Ref<TalvikZandorLib::ZDColumn>& value) override;
     String Synonym() const override { return mSynonym; }
     void Synonym(const String& value) override { mSynonym = value; }

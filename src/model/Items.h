@@ -29,6 +29,21 @@ public:
         mRevision.raise();
     }
 
+    /// Error 5 for an item that is not in the list.
+    std::int32_t positionOf(const Own& item) const {
+        for (std::int32_t position = 1; position <= this->Count(); ++position)
+            if (this->Item(position).get() == &item) return position;
+        throw platform::errors::invalidProcedureCall();
+    }
+    /// The item at one position then has another; both are from 1 to Count.
+    void Move(std::int32_t from, std::int32_t to) {
+        if (from == to) return;
+        const auto item = this->Item(from);
+        Base::Remove(item->Key());
+        Base::Insert(to, item, item->Key());
+        mRevision.raise();
+    }
+
     platform::Ref<Own> own(std::int32_t position) const {
         return std::static_pointer_cast<Own>(this->Item(position));
     }

@@ -37,9 +37,10 @@ TablePlace placeOf(const Ref<TalvikZandorLib::ZDTable>& table) {
 
 ColumnPlace placeOf(const Ref<TalvikZandorLib::ZDColumn>& column) {
     if (!column) return {};
-    const auto own = std::dynamic_pointer_cast<const Column>(column);
-    if (!own) throw platform::errors::invalidProcedureCall();
-    return own->place();
+    if (const auto own = std::dynamic_pointer_cast<const Column>(column)) return own->place();
+    if (const auto field = std::dynamic_pointer_cast<const FieldColumn>(column))
+        return field->column().place();
+    throw platform::errors::invalidProcedureCall();
 }
 
 } // namespace model

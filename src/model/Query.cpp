@@ -54,6 +54,17 @@ Ref<ZDColumnDefinition> Query::AddColumnDefinition(const Ref<ZDColumnDefinition>
     return added;
 }
 
+void Query::StandsBehind(const Ref<ZDColumnDefinition>& definition,
+                         const Ref<ZDColumnDefinition>& predecessor) {
+    const auto moved = own<ColumnDefinition>(definition);
+    const std::int32_t from = mDefinitions.positionOf(*moved);
+    std::int32_t to =
+        predecessor ? mDefinitions.positionOf(*own<ColumnDefinition>(predecessor)) + 1 : 1;
+    if (to == from + 1 && predecessor) throw platform::errors::invalidProcedureCall();
+    if (to > from) --to; // its own place closes before it
+    mDefinitions.Move(from, to);
+}
+
 void Query::DeleteTable(const Ref<ZDTable>& table) {
     requireOwn(table);
     tieCriteria();

@@ -15,7 +15,7 @@ namespace model {
 /// Keys are a letter and a number ("t1" tables, "c1" columns, "j1" joins, "x1" definitions) and are
 /// never given twice in a query, not even after the object was deleted. Only a change that is
 /// undone takes the keys back that it gave.
-class Query final : public TalvikZandorLib::Zandor {
+class Query final : public TalvikZandorLib::Zandor, public TalvikZandorLib::OrderedDefinitions {
 public:
     Query() = default;
     Query(const Query&) = delete;
@@ -37,6 +37,11 @@ public:
     /// The same rules for the definition's column.
     Ref<TalvikZandorLib::ZDColumnDefinition>
     AddColumnDefinition(const Ref<TalvikZandorLib::ZDColumnDefinition>& definition) override;
+    /// Both must be definitions of this query: error 91 when the first is nothing, error 5 for one
+    /// that is not in the query and for two that are one; nothing changes then. The statement's
+    /// columns, and the order of its sorting, follow.
+    void StandsBehind(const Ref<TalvikZandorLib::ZDColumnDefinition>& definition,
+                      const Ref<TalvikZandorLib::ZDColumnDefinition>& predecessor) override;
     /// Takes the joins and definitions that hang on the table along; criteria of others that name
     /// it name nothing from then on. Error 91 for nothing, error 5
     /// for a table that does not stand in this query.

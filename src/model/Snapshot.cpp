@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <unordered_set>
 
 namespace model {
 
@@ -27,6 +28,31 @@ DefinitionState stateOf(Ref<ColumnDefinition> definition) {
     for (const auto& [row, criterium] : definition->criteria().rows())
         state.criteria.push_back({row, criterium->Criterium(), criterium->references()});
     return state;
+}
+
+using Revisions = std::vector<const Revision*>;
+using Places = std::unordered_map<const Revision*, std::int32_t>;
+
+/// The most items whose places rise in the order given: those that stand where they stood if all
+/// others have moved. So one item that a user moves is one that has moved, however far it went.
+std::unordered_set<const Revision*> longestRising(const Revisions& items, const Places& places) {
+    // Of all rising sequences of a length, the one that ends lowest.
+    std::vector<std::size_t> ends;
+    std::vector<std::size_t> before(items.size());
+    const auto place = [&](std::size_t n) { return places.at(items[n]); };
+    for (std::size_t n = 0; n < items.size(); ++n) {
+        const auto at = std::partition_point(
+            ends.begin(), ends.end(), [&](std::size_t end) { return place(end) < place(n); });
+        before[n] = at == ends.begin() ? items.size() : *std::prev(at);
+        if (at == ends.end())
+            ends.push_back(n);
+        else
+            *at = n;
+    }
+    std::unordered_set<const Revision*> longest;
+    for (std::size_t n = ends.empty() ? items.size() : ends.back(); n < items.size(); n = before[n])
+        longest.insert(items[n]);
+    return longest;
 }
 
 } // namespace
@@ -68,22 +94,20 @@ void Snapshot::List<State>::updateOrder(const Items<Object, Interface>& items,
     const auto positionOf = [](const auto& list, auto at) {
         return static_cast<std::int32_t>(at - list.begin()) + 1;
     };
-    std::unordered_map<const Revision*, std::int32_t> moved;
+    std::unordered_map<const Revision*, std::int32_t> places;
     for (auto now = nowBegin; now != nowEnd.base(); ++now)
-        moved.emplace(*now, positionOf(after, now));
-    std::int32_t last = 0;
+        places.emplace(*now, positionOf(after, now));
+    std::vector<const Revision*> stayed;
+    for (auto old = begin; old != end.base(); ++old)
+        if (places.contains(*old)) stayed.push_back(*old);
+    const auto still = longestRising(stayed, places);
     for (auto old = begin; old != end.base(); ++old) {
-        const auto at = moved.find(*old);
-        if (at != moved.end() && at->second > last) {
-            last = at->second;
-            moved.erase(at);
-            continue;
-        }
+        if (still.contains(*old)) continue;
         auto state = mStates.extract(*old);
         change.gone.push_back({positionOf(before, old), std::move(state.mapped())});
     }
     for (auto now = nowBegin; now != nowEnd.base(); ++now) {
-        if (!moved.contains(*now)) continue;
+        if (still.contains(*now)) continue;
         const std::int32_t position = positionOf(after, now);
         const State& state = mStates.emplace(*now, stateOf(items.own(position))).first->second;
         change.come.push_back({position, state});

@@ -123,6 +123,18 @@ public:
     virtual void DeleteTable(const Ref<ZDTable>& table) = 0;
 };
 
+/// What a query may be besides: one whose definitions have an order, which is to be that of the
+/// grid's columns. The control asks for it by a cast of the query and never requires it; where it
+/// is missing, columns stand where they were dropped and cannot be moved.
+class OrderedDefinitions {
+public:
+    virtual ~OrderedDefinitions() = default;
+    /// A definition of the query now stands right behind another one of it, or before all others
+    /// when that is nothing.
+    virtual void StandsBehind(const Ref<ZDColumnDefinition>& definition,
+                              const Ref<ZDColumnDefinition>& predecessor) = 0;
+};
+
 /// Makes the model objects that the control needs of its own accord.
 class Library {
 public:

@@ -45,7 +45,9 @@ TEST(ASavedQuery, LoadsWithObjectsThatWorkTogether) {
     EXPECT_EQ(join->LeftTable(), loaded->tableNamed(u"orders"));
     EXPECT_EQ(join->RightColumn(), loaded->tableNamed(u"customers")->columnNamed(u"id"));
     const auto restored = loaded->ColumnDefinitions().Item(u"x1");
-    EXPECT_EQ(restored->Column(), loaded->tableNamed(u"customers")->columnNamed(u"id"));
+    EXPECT_EQ(restored->Column()->Key(),
+              loaded->tableNamed(u"customers")->columnNamed(u"id")->Key());
+    EXPECT_EQ(restored->Column()->Name(), u"customers.id");
     EXPECT_EQ(restored->Criteria().Item(u"7")->Criterium(), u"> 5");
     loaded->DeleteTable(loaded->tableNamed(u"customers"));
     EXPECT_EQ(loaded->Joins().Count(), 0);

@@ -12,8 +12,8 @@ QString columnName(model::Query& query, const TalvikZandorLib::ZDColumn* column)
     for (std::int32_t i = 1; i <= query.Tables().Count(); ++i) {
         const auto table = query.Tables().Item(i);
         for (std::int32_t n = 1; n <= table->Columns().Count(); ++n)
-            if (table->Columns().Item(n).get() == column)
-                return toQt(table->Name() + u"." + column->Name());
+            if (column && table->Columns().Item(n)->Key() == column->Key())
+                return toQt(table->Name() + u"." + table->Columns().Item(n)->Name());
     }
     return QStringLiteral("(none)");
 }

@@ -156,3 +156,24 @@ TEST_F(ASnapshot, DoesNothingToAQueryThatIsNotAsItWas) {
     EXPECT_EQ(query.record(), other);
     EXPECT_NE(before, other);
 }
+
+TEST_F(ASnapshot, FindsThatOneItemMovedHoweverFar) {
+    for (int n = 0; n < 4; ++n) query.AddColumnDefinition(small.newDefinition(small.orders));
+    known = model::Snapshot(query);
+    const std::int32_t count = query.ColumnDefinitions().Count();
+    for (std::int32_t from = 1; from <= count; ++from)
+        for (std::int32_t to = 1; to <= count; ++to) {
+            if (from == to) continue;
+            const auto moved = definition(from);
+            const auto predecessor = to == 1 ? Ref<TalvikZandorLib::ZDColumnDefinition>()
+                                             : definition(to > from ? to : to - 1);
+            const auto change = changed([&] { query.StandsBehind(moved, predecessor); });
+            ASSERT_EQ(definition(to), moved);
+            ASSERT_EQ(change.definitions.gone.size(), 1u) << from << " to " << to;
+            ASSERT_EQ(change.definitions.come.size(), 1u);
+            if (std::abs(from - to) == 1) continue; // either of the two may be said to have moved
+            EXPECT_EQ(change.definitions.come[0].state.object, moved);
+            EXPECT_EQ(change.definitions.gone[0].position, from);
+            EXPECT_EQ(change.definitions.come[0].position, to);
+        }
+}

@@ -181,7 +181,7 @@ private:
     Calls mCalls;
 };
 
-class Model final : public TalvikZandorLib::Zandor, private Part {
+class Model : public TalvikZandorLib::Zandor, private Part {
 public:
     explicit Model(Calls calls = std::make_shared<platform::headless::Faults>());
     TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& Tables() override;

@@ -1,5 +1,7 @@
 #include "control/Zandor.h"
 
+#include "control/KeyNumber.h"
+
 #include <algorithm>
 
 namespace TalvikDBxZandor {
@@ -36,7 +38,10 @@ void Zandor::InsertRecords(const std::vector<Ref<clsDragColumn>>& records, std::
         fieldName += record->Column()->Text();
         InsertColumnDefinition(fieldName, column);
         AddNewAndCriterium(record->ZDColumn(), column);
-        mEvents.Raise(Event::ColumnCreated, {.Definition = DefinitionOf(column)});
+        const auto definition = DefinitionOf(column);
+        if (const auto ordered = Ordered())
+            ordered->StandsBehind(definition, DefinitionBefore(column));
+        mEvents.Raise(Event::ColumnCreated, {.Definition = definition});
         ++column;
     }
 }
@@ -56,6 +61,55 @@ bool Zandor::InsertColumnDefinition(const String& fieldName, std::int32_t column
         SetCell(fieldName, alignCenterCenter);
         FitColumn(column, fieldName);
         result = true;
+    });
+    return result;
+}
+
+/// The query, where it keeps the order of its definitions.
+platform::Ref<TalvikZandorLib::OrderedDefinitions> Zandor::Ordered() {
+    return std::dynamic_pointer_cast<TalvikZandorLib::OrderedDefinitions>(Model());
+}
+
+/// The definition of the nearest grid column to the left that has one; nothing where none has.
+/// Not by its position in the model, of which the grid may show less than there is.
+platform::Ref<TalvikZandorLib::ZDColumnDefinition> Zandor::DefinitionBefore(std::int32_t column) {
+    const auto model = Model();
+    while (--column >= 1) {
+        const std::int32_t number = sprColumn->ColData(column);
+        if (number == 0) continue;
+        const String key = keyOfNumber(number);
+        for (const auto& definition : platform::Each(model->ColumnDefinitions()))
+            if (definition->Key() == key) return definition;
+    }
+    return {};
+}
+
+bool Zandor::MoveColumn(std::int32_t column, std::int32_t position) {
+    bool result = false;
+    Guard(u"MoveColumn", [&] {
+        const auto ordered = Ordered();
+        if (!ordered || column < 1 || position < 1 || sprColumn->ColData(column) == 0) return;
+        // No blank column comes between.
+        std::int32_t last = sprColumn->Cols() - 1;
+        while (sprColumn->ColData(last) == 0) --last;
+        position = std::min(position, last);
+        const auto definition = DefinitionOf(column);
+        result = position == column;
+        if (result) return;
+        ordered->StandsBehind(definition,
+                              DefinitionBefore(position < column ? position : position + 1));
+        MakeGetValueFieldsInvisible();
+        const std::int32_t current = sprColumn->Col();
+        sprColumn->ColPosition(column, position);
+        // The current cell goes with its column.
+        if (current == column)
+            sprColumn->Col(position);
+        else if (current > column && current <= position)
+            sprColumn->Col(current - 1);
+        else if (current < column && current >= position)
+            sprColumn->Col(current + 1);
+        result = true;
+        mEvents.Raise(Event::ColumnModified, {.Definition = definition});
     });
     return result;
 }

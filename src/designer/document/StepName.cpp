@@ -47,6 +47,14 @@ bool alike(DefinitionState before, DefinitionState after) {
     return before == after;
 }
 
+/// Whether what has gone from one position has come back to another as it was.
+template <class Placed>
+bool sameObjects(const std::vector<Placed>& gone, const std::vector<Placed>& come) {
+    return std::is_permutation(
+        gone.begin(), gone.end(), come.begin(), come.end(),
+        [](const Placed& before, const Placed& after) { return alike(before.state, after.state); });
+}
+
 class StepName {
     Q_DECLARE_TR_FUNCTIONS(designer::StepName)
 
@@ -128,6 +136,9 @@ QString StepName::definitions(const model::ListChange<DefinitionState>& change,
         if (changed.size() == 1) return definition(changed.front().before, changed.front().after);
         return tr("Change %n column(s)", nullptr, static_cast<int>(changed.size()));
     }
+    if (changed.empty() && sameObjects(gone, come))
+        return come.size() == 1 ? tr("Move column %1").arg(nameOf(come.front().state))
+                                : tr("Move %n column(s)", nullptr, static_cast<int>(come.size()));
     if (gone.empty() && changed.empty())
         return come.size() == 1 ? tr("Add column %1").arg(nameOf(come.front().state))
                                 : tr("Add %n column(s)", nullptr, static_cast<int>(come.size()));

@@ -26,7 +26,7 @@ QString named(const auto& table, const auto& column) {
 QString wordsFor(const platform::Ref<TalvikZandorLib::ZDColumnDefinition>& definition) {
     const auto own = std::dynamic_pointer_cast<model::ColumnDefinition>(definition);
     if (!own) return gone();
-    return named(own->place().table().table(), own->Column());
+    return named(own->place().table().table(), own->place().column());
 }
 
 QString wordsFor(const platform::Ref<TalvikZandorLib::ZDJoin>& join) {

@@ -38,7 +38,7 @@ Findings uncarriedNames(Query& query, Dialect dialect) {
         }
     }
     for (const auto& definition : platform::Each<ZDColumnDefinition>(query.ColumnDefinitions())) {
-        const auto column = definition->Column();
+        const auto column = static_cast<const ColumnDefinition&>(*definition).place().column();
         if (!column) continue;
         const String name = column->Name();
         const String synonym = definition->Synonym();

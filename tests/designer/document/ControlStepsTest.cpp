@@ -178,5 +178,5 @@ TEST_F(TheControl, DeletesATableWithAllThatHangsOnItAsOneStep) {
     calm();
     EXPECT_EQ(unselected(drawing.query().record()), unselected(before));
     EXPECT_EQ(box(2).title(), "orders");
-    EXPECT_EQ(part<GridWidget>(QStringLiteral("sprColumn")).model().text(0, 1), "status");
+    EXPECT_EQ(part<GridWidget>(QStringLiteral("sprColumn")).model().text(0, 1), "orders.status");
 }

@@ -48,7 +48,7 @@ private:
 
     void act() {
         model::Query& query = mDrawing.query();
-        switch (upTo(11)) {
+        switch (upTo(12)) {
         case 0:
         case 1:
             if (query.Tables().Count() < 16) query.addTable(Drawing::described(name()));
@@ -64,6 +64,7 @@ private:
         case 8:
         case 9: return changeDefinition();
         case 10: return putAside();
+        case 11: return moveDefinition();
         default:
             if (const auto moved = table()) {
                 moved->Left(place());
@@ -107,6 +108,12 @@ private:
             changed->Criteria().Item(row)->Criterium(text);
         else
             changed->Criteria().Remove(row);
+    }
+
+    void moveDefinition() {
+        const auto moved = definition();
+        const auto predecessor = chance(20) ? decltype(moved)() : definition();
+        if (moved && moved != predecessor) mDrawing.query().StandsBehind(moved, predecessor);
     }
 
     /// What was removed may come back, and then stands last.

@@ -277,6 +277,17 @@ TEST(AStep, IsNamedAfterWhatChanged) {
     drawing.define(u"orders", u"status");
     drawing.define(u"orders", u"id");
     EXPECT_EQ(named([&] { drawing.join(u"customers", u"orders"); }), "Change the query");
+    const auto last = drawing.define(u"customers", u"id");
+    drawing.document.settle();
+    EXPECT_EQ(named([&] { query.StandsBehind(last, {}); }), "Move column id");
+    EXPECT_EQ(named([&] {
+                  query.StandsBehind(query.ColumnDefinitions().Item(3), {});
+                  query.StandsBehind(query.ColumnDefinitions().Item(3),
+                                     query.ColumnDefinitions().Item(1));
+              }),
+              "Move 2 column(s)");
+    EXPECT_EQ(named([&] { query.StandsBehind(last, {}), last->Synonym(u"first"); }),
+              "Change columns");
     EXPECT_EQ(named([&] { query.DeleteTable(orders); }), "Delete table orders")
         << "not what hangs on it";
     EXPECT_EQ(
