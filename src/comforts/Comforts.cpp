@@ -8,16 +8,26 @@ Comforts::Comforts(platform::Toolkit& toolkit) : mToolkit(toolkit) {}
 
 Comforts::~Comforts() = default;
 
-void Comforts::attach(TalvikDBxZandor::Zandor& control) { mDoor = std::make_unique<Door>(control); }
+void Comforts::attach(TalvikDBxZandor::Zandor& control) {
+    mDoor = std::make_shared<Door>(control);
+    // These run within the control's procedures, which report what goes wrong in them.
+    mDoor->listen({.EditorOpened = [this] { editorOpened(*std::shared_ptr(mDoor)); },
+                   .EditorsClosing = [this] { editorsClosing(*std::shared_ptr(mDoor)); }});
+}
 
-void Comforts::detach() { mDoor.reset(); }
+void Comforts::detach() {
+    if (mDoor) mDoor->shut();
+    mDoor.reset();
+    mTyping.reset();
+}
 
-template <class Body>
-bool Comforts::act(platform::StringView procedure, Body&& body) {
-    if (!mDoor) return false;
+bool Comforts::act(platform::StringView procedure, const std::function<bool(Door&)>& body) {
+    // Held, because what the body tells the host may end the control.
+    const std::shared_ptr<Door> door = mDoor;
+    if (!door) return false;
     bool dealtWith = true;
     TalvikDBxZandor::basZandor::Guard(mToolkit, ModuleName, procedure,
-                                      [&] { dealtWith = body(*mDoor); });
+                                      [&] { dealtWith = body(*door); });
     return dealtWith;
 }
 

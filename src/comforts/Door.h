@@ -2,27 +2,77 @@
 
 #include "control/Zandor.h"
 
+#include <optional>
+
 namespace comforts {
 
+/// The editors that stand over a cell.
+enum class Editor { none, text, sortOrder, visibility };
+
+/// The rows of the grid that mean something of their own; criteria fill all from the first on.
+namespace row {
+inline constexpr std::int32_t field = 0;
+inline constexpr std::int32_t synonym = 1;
+inline constexpr std::int32_t visible = 3;
+} // namespace row
+
 /// The way from the comforts into the control: all of its procedures that they act by, and no more.
-/// Its members throw what the control's parts and the host's model throw.
+///
+/// Its members throw what the control's parts and the host's model throw. Whoever calls one that
+/// tells the host something asks `isOpen` before the next one, for the host may end the control.
 class Door {
 public:
-    explicit Door(TalvikDBxZandor::Zandor& control) : mControl(control) {}
+    using String = platform::String;
+    template <class T>
+    using Ref = platform::Ref<T>;
+
+    explicit Door(TalvikDBxZandor::Zandor& control) : mControl(&control) {}
+    Door(const Door&) = delete;
+    Door& operator=(const Door&) = delete;
+    /// The control stays as it is; nobody listens to it any more.
+    ~Door() { shut(); }
+
+    void listen(TalvikDBxZandor::Hooks hooks) { mControl->mHooks = std::move(hooks); }
+    void shut();
+    bool isOpen() const { return mControl != nullptr; }
 
     /// Whether the grid is on the control at all.
-    bool hasGrid() const { return !mControl.mOnlyJoin; }
-    const MSFlexGridLib::MSFlexGrid& grid() const { return *mControl.sprColumn; }
+    bool hasGrid() const { return !mControl->mOnlyJoin; }
+    const MSFlexGridLib::MSFlexGrid& grid() const { return *mControl->sprColumn; }
+    Ref<TalvikZandorLib::Zandor> model() { return mControl->Model(); }
 
-    /// The last grid column with a field in it; 0 when there is none.
+    // Columns of the grid
+    /// The last one with a field in it; 0 when there is none.
     std::int32_t lastColumn() const;
-
+    bool isUsed(std::int32_t column) const;
+    /// The one with a key number, `first` when it has it; 0 when none has.
+    std::int32_t columnWith(std::int32_t keyNumber, std::int32_t first) const;
+    /// Nothing for a column that is tied to none.
+    Ref<TalvikZandorLib::ZDColumnDefinition> definitionOf(std::int32_t column);
     /// Makes an output column of an entry (1-based) of the table in a slot, as dropping it on a
     /// grid column does. What was copied for a later "Paste Column" stays.
     void drop(std::int16_t table, std::int32_t entry, std::int32_t column);
 
+    // The current cell
+    void goTo(std::int32_t row, std::int32_t column);
+    void showCurrentCell() { mControl->sprColumn->EnsureVisible(); }
+    void focusGrid() { mControl->sprColumn->SetFocus(); }
+
+    // Editors
+    Editor editor() const;
+    void openEditor() { mControl->EditCell(); }
+    void closeEditors() { mControl->MakeGetValueFieldsInvisible(); }
+    /// What stands in the open editor: its text, or the number of the item chosen.
+    String editorValue() const;
+    /// The same of what the model holds for a cell; nothing where the column has no definition.
+    std::optional<String> storedValue(std::int32_t row, std::int32_t column);
+    void type(const String& text) { mControl->txtValue->Text(text); }
+    void chooseVisibility(bool visible) { mControl->cobVisibility->ListIndex(visible ? 0 : 1); }
+    /// Presses the "&Set" of an editor, for the current cell.
+    void set(Editor editor);
+
 private:
-    TalvikDBxZandor::Zandor& mControl;
+    TalvikDBxZandor::Zandor* mControl;
 };
 
 } // namespace comforts

@@ -6,6 +6,7 @@
 #include "clsJoinLine.h"
 #include "control/ControlArray.h"
 #include "control/Events.h"
+#include "control/Hooks.h"
 #include "platform/KeyedCollection.h"
 #include "platform/TalvikZandorLib.h"
 #include "platform/Toolkit.h"
@@ -288,6 +289,7 @@ private:
     void GetTextValue(const String& cellText);
     void GetSortOrder(const String& cellText);
     void GetVisibility(const String& cellText);
+    void EditCell();
     void OpenEditor(platform::Frame& frame, platform::CommandButton& set);
     Ref<TalvikZandorLib::ZDColumnDefinition> DefinitionOf(std::int32_t column);
     void sprColumn_MouseDown(std::int16_t Button, std::int16_t Shift, float X, float Y);
@@ -325,6 +327,7 @@ private:
     platform::Toolkit& mToolkit;
     TalvikZandorLib::Library& mLibrary;
     ZandorEvents& mEvents;
+    Hooks mHooks;
 
     std::int16_t mDebugSwitch = 1;
     std::int16_t mJoinModifyDisabled = 0;

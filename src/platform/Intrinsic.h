@@ -26,6 +26,8 @@ struct FrameEvents {
 
 class Frame : public Control {
 public:
+    /// As set last, whatever is true of the containers.
+    virtual bool Visible() const = 0;
     virtual void Visible(bool value) = 0;
     /// Brings the frame before its siblings.
     virtual void ZOrder() = 0;

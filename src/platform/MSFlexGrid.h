@@ -36,6 +36,8 @@ public:
     virtual float CellTop() const = 0;
     virtual float CellWidth() const = 0;
     virtual float CellHeight() const = 0;
+    /// Scrolls as little as brings the current cell into view.
+    virtual void EnsureVisible() = 0;
 
     virtual String TextMatrix(std::int32_t row, std::int32_t col) const = 0;
     virtual void TextMatrix(std::int32_t row, std::int32_t col, const String& value) = 0;

@@ -129,7 +129,14 @@ public:
     void choose(const std::string& name, std::int16_t listIndex) override {
         mUser.choose(name, listIndex);
     }
-    void key(const std::string& name, std::int16_t keyCode) override { mUser.key(name, keyCode); }
+    void pick(const std::string& name, std::int16_t listIndex) override {
+        mUser.pick(name, listIndex);
+    }
+    void key(const std::string& name, std::int16_t keyCode, std::int16_t shift) override {
+        mUser.key(name, keyCode, shift);
+    }
+    void typeInGrid(const String& text) override { mUser.typeInGrid("sprColumn", text); }
+    void leaveControl() override { mUser.leaveControl(); }
 
 private:
     std::string chooseFrom(const headless::PopupMenu& menu) {

@@ -13,6 +13,7 @@
 #include "support/Stage.h"
 #include "support/StageEvents.h"
 
+#include <QAbstractItemView>
 #include <QApplication>
 #include <QComboBox>
 #include <QDialog>
@@ -24,6 +25,8 @@
 #include <QPushButton>
 #include <QScrollBar>
 #include <QTimer>
+
+#include <QtCore/qtestsupport_core.h>
 
 #include <gtest/gtest.h>
 
@@ -71,6 +74,7 @@ public:
         mWidget->toolkit().drags().setCarrier([this](QDrag& drag) {
             if (mDropAt.widget) hands::carry(drag, *mDropAt.widget, mDropAt.at);
         });
+        mHostField.move(-1000, -1000); // out of the way
         mWidget->resize(800, 600);
         mWidget->show();
         settle();
@@ -207,13 +211,42 @@ public:
         for (std::int16_t i = 0; i < listIndex; ++i) hands::key(combo, Qt::Key_Down);
         settle();
     }
-    void key(const std::string& name, std::int16_t keyCode) override {
+    void pick(const std::string& name, std::int16_t listIndex) override {
+        auto& combo = widget<QComboBox>(name);
+        // A list that has just opened takes no click for as long as a double click may last.
+        QApplication::setDoubleClickInterval(1);
+        hands::click(combo, QRectF(combo.rect()).center());
+        QTest::qWait(10);
+        QAbstractItemView& list = *combo.view();
+        const QPointF at = QRectF(list.visualRect(list.model()->index(listIndex, 0))).center();
+        hands::mouse(*list.viewport(), QEvent::MouseMove, at, Qt::NoButton);
+        hands::click(*list.viewport(), at);
+        settle();
+    }
+    void typeInGrid(const String& text) override {
+        QWidget& view = grid().view();
+        view.setFocus(Qt::TabFocusReason);
+        for (const QChar letter : toQt(text)) hands::key(*view.window()->focusWidget(), 0, letter);
+        settle();
+    }
+    void leaveControl() override {
+        mHostField.setFocus(Qt::MouseFocusReason);
+        settle();
+    }
+    void key(const std::string& name, std::int16_t keyCode, std::int16_t shift) override {
         QWidget& input = focusable(widget<QWidget>(name));
         input.setFocus(Qt::MouseFocusReason);
         int key = keyCode;
         if (keyCode == 27) key = Qt::Key_Escape;
         if (keyCode == 13) key = Qt::Key_Return;
-        hands::key(input, key);
+        if (keyCode == 9) key = shift == 1 ? Qt::Key_Backtab : Qt::Key_Tab;
+        if (keyCode >= 37 && keyCode <= 40) key = Qt::Key_Left + keyCode - 37;
+        if (keyCode == 35 || keyCode == 36) key = keyCode == 36 ? Qt::Key_Home : Qt::Key_End;
+        Qt::KeyboardModifiers held;
+        held.setFlag(Qt::ShiftModifier, shift & 1);
+        held.setFlag(Qt::ControlModifier, shift & 2);
+        held.setFlag(Qt::AltModifier, shift & 4);
+        hands::key(input, key, {}, held);
         settle();
     }
 
@@ -260,6 +293,7 @@ private:
     StageEvents mEvents;
     Spot mDropAt; ///< where a drag that begins now ends; no widget: it is given up at once
     std::unique_ptr<ZandorWidget> mWidget;
+    QLineEdit& mHostField = *new QLineEdit(mWidget.get());
 };
 
 void QtStage::listen() {

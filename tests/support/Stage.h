@@ -124,7 +124,13 @@ public:
     virtual void releaseCell(std::int16_t button, std::int32_t row, std::int32_t col) = 0;
     virtual void type(const std::string& name, const String& text) = 0;
     virtual void choose(const std::string& name, std::int16_t listIndex) = 0;
-    virtual void key(const std::string& name, std::int16_t keyCode) = 0;
+    /// Chooses an item from a list by the mouse, where `choose` walks to it by keys.
+    virtual void pick(const std::string& name, std::int16_t listIndex) = 0;
+    virtual void key(const std::string& name, std::int16_t keyCode, std::int16_t shift = 0) = 0;
+    /// Types into the grid, with no editor open.
+    virtual void typeInGrid(const String& text) = 0;
+    /// The focus goes to a field of the host's beside the control.
+    virtual void leaveControl() = 0;
 };
 
 /// A failed comparison of boxes reads as their texts.

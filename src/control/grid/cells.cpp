@@ -35,6 +35,8 @@ void Zandor::AddNewAndCriterium(const ZDColumnRef& sourceColumn, std::int32_t co
 
 void Zandor::MakeGetValueFieldsInvisible() {
     Guard(u"MakeGetValueFieldsInvisible", [&] {
+        // A copy, as the one above: what it does may end the control.
+        if (const auto closing = mHooks.EditorsClosing) closing();
         fraValue->Visible(false);
         fraSortOrder->Visible(false);
         fraVisibility->Visible(false);
@@ -89,6 +91,7 @@ void Zandor::OpenEditor(platform::Frame& frame, platform::CommandButton& set) {
     frame.Visible(true);
     frame.ZOrder();
     set.Default(true);
+    if (const auto opened = mHooks.EditorOpened) opened();
 }
 
 } // namespace TalvikDBxZandor

@@ -40,14 +40,20 @@ void Zandor::sprColumn_MouseDown(std::int16_t Button, std::int16_t, float X, flo
         if (column == 0 || row == 0) return;
         sprColumn->Row(row);
         sprColumn->Col(column);
-        const String text = sprColumn->Text();
-        if (row == sortRow)
-            GetSortOrder(text);
-        else if (row == visibleRow)
-            GetVisibility(text);
-        else
-            GetTextValue(text);
+        EditCell();
     });
+}
+
+/// Opens the editor of the current cell.
+void Zandor::EditCell() {
+    const std::int32_t row = sprColumn->Row();
+    const String text = sprColumn->Text();
+    if (row == sortRow)
+        GetSortOrder(text);
+    else if (row == visibleRow)
+        GetVisibility(text);
+    else
+        GetTextValue(text);
 }
 
 void Zandor::sprColumn_MouseUp(std::int16_t Button, std::int16_t, float X, float Y) {

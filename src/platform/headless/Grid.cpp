@@ -107,6 +107,20 @@ float Grid::CellHeight() const {
     return gridRowHeight;
 }
 
+void Grid::EnsureVisible() {
+    called("EnsureVisible");
+    std::int32_t top = mRow == 0 ? mTopRow : std::min(mTopRow, mRow);
+    std::int32_t left = mCol == 0 ? mLeftCol : std::min(mLeftCol, mCol);
+    const auto hidden = [](float edge, float size) { return edge > size; };
+    for (float bottom = topOf(mRow) + gridRowHeight;
+         top < mRow && hidden(bottom, placement().Height); ++top)
+        bottom -= gridRowHeight;
+    for (float right = leftOf(mCol) + column(mCol).width;
+         left < mCol && hidden(right, placement().Width); ++left)
+        right -= column(left).width;
+    scrollTo(top, left);
+}
+
 String Grid::TextMatrix(std::int32_t row, std::int32_t col) const {
     called("TextMatrix");
     return cell(row, col).text;

@@ -32,6 +32,7 @@ public:
     float CellTop() const override;
     float CellWidth() const override;
     float CellHeight() const override;
+    void EnsureVisible() override;
     String TextMatrix(std::int32_t row, std::int32_t col) const override;
     void TextMatrix(std::int32_t row, std::int32_t col, const String& value) override;
     float ColPos(std::int32_t col) const override;

@@ -11,6 +11,11 @@ Frame::Frame(Toolkit& toolkit, const Design& design, Element* container, FrameEv
     place({0, 0, frameWidth, frameHeight});
 }
 
+bool Frame::Visible() const {
+    called("Visible?");
+    return mLook.visible;
+}
+
 void Frame::Visible(bool value) {
     called("Visible");
     setVisible(value);
@@ -144,12 +149,18 @@ String TextBox::Text() const {
 
 void TextBox::Text(const String& value) {
     called("Text=");
-    mLook.text = value;
+    type(value);
+}
+
+void TextBox::type(const String& text) {
+    mLook.text = text;
+    mAllSelected = false;
 }
 
 void TextBox::SetFocus() {
     called("SetFocus");
     takeFocus();
+    mAllSelected = true;
 }
 
 void TextBox::keyDown(std::int16_t keyCode, std::int16_t shift) {

@@ -18,6 +18,7 @@ inline constexpr float labelHeight = 255;
 class Frame final : public Placed<platform::Frame> {
 public:
     Frame(Toolkit& toolkit, const Design& design, Element* container, FrameEvents events);
+    bool Visible() const override;
     void Visible(bool value) override;
     void ZOrder() override;
 
@@ -91,10 +92,13 @@ public:
     void SetFocus() override;
 
     void keyDown(std::int16_t keyCode, std::int16_t shift) override;
-    void type(const String& text) { mLook.text = text; }
+    void type(const String& text);
+    /// Whether the whole text is selected, so that typing replaces it.
+    bool allSelected() const { return mAllSelected; }
 
 private:
     KeyEvent mKeyDown;
+    bool mAllSelected = false;
 };
 
 class ScrollBar final : public Placed<platform::ScrollBar> {

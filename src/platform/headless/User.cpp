@@ -77,11 +77,31 @@ void User::choose(const std::string& name, std::int16_t listIndex) {
     combo.choose(listIndex);
 }
 
+void User::pick(const std::string& name, std::int16_t listIndex) {
+    choose(name, listIndex);
+    mToolkit.comforts.choiceMade();
+}
+
+void User::typeInGrid(const std::string& name, const String& text) {
+    reach<Grid>(name).takeFocus();
+    mToolkit.comforts.cellTyped(text);
+}
+
+void User::leaveControl() {
+    mToolkit.moveFocus(nullptr);
+    mToolkit.comforts.editorLeft();
+}
+
 void User::key(const std::string& name, std::int16_t keyCode, std::int16_t shift) {
     auto& element = reach<Element>(name);
     auto& input = mToolkit.find<Input>(name);
     if (!element.usable()) return;
     element.takeFocus();
+    // In a dialog the keys are the dialog's.
+    const auto* box = dynamic_cast<const TextBox*>(&element);
+    const bool atEnd = !box || !box->allSelected();
+    const bool atStart = !box || (atEnd && box->look().text.empty());
+    if (!mToolkit.dialog() && mToolkit.comforts.editorKey(keyCode, shift, atStart, atEnd)) return;
     if (CommandButton* button = keyCode == keyEnter ? defaultButtonFor(element) : nullptr) {
         press(*button);
         return;

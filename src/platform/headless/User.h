@@ -20,6 +20,12 @@ public:
     /// Replaces the text of a text box.
     void type(const std::string& name, const String& text);
     void choose(const std::string& name, std::int16_t listIndex);
+    /// Chooses an item from an open list, as a click on it does.
+    void pick(const std::string& name, std::int16_t listIndex);
+    /// Types a text into a grid, with no editor open.
+    void typeInGrid(const std::string& name, const String& text);
+    /// The focus goes to something of the host's in the same window.
+    void leaveControl();
     /// A key in an input. Enter presses the nearest default button; Escape closes a dialog once the
     /// input has had it.
     void key(const std::string& name, std::int16_t keyCode, std::int16_t shift = 0);

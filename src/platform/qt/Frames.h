@@ -14,6 +14,7 @@ public:
     CanvasAdapter(Canvas* widget, FocusTracker& focus, FrameEvents events);
     ~CanvasAdapter() override;
 
+    bool Visible() const override { return mWidget && !mWidget->isHidden(); }
     void Visible(bool value) override { show(value); }
     void ZOrder() override;
 };
@@ -28,6 +29,9 @@ public:
     RowFrame(QWidget* parent, bool outermost);
 
     void setTitle(Title title) { mTitle = std::move(title); }
+    /// Called when the focus goes from inside to something else in the window. A menu, a list that
+    /// drops down or another window in front takes no focus away.
+    void setLeft(std::function<void()> left);
 
 protected:
     bool event(QEvent* event) override;
@@ -46,6 +50,7 @@ public:
     Bounds bounds() const override;
     void setBounds(const Bounds& bounds) override;
     void place(QWidget* child, Role role) override;
+    bool Visible() const override { return mWidget && !mWidget->isHidden(); }
     void Visible(bool value) override;
     void ZOrder() override;
 

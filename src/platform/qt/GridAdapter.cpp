@@ -8,6 +8,10 @@
 #include "platform/qt/KeyboardMenu.h"
 #include "platform/qt/Text.h"
 
+#include <QComboBox>
+#include <QCoreApplication>
+#include <QKeyEvent>
+
 namespace platform::qt {
 
 namespace {
@@ -20,8 +24,10 @@ QRect currentCell(const GridWidget& grid) {
 } // namespace
 
 GridAdapter::GridAdapter(GridWidget* widget, FocusTracker& focus, DragSession& drags,
-                         KeyboardMenu& menu, MSFlexGridLib::GridEvents events)
-    : Adapter(widget, focus), mDrags(drags), mMenu(menu), mEvents(std::move(events)) {
+                         KeyboardMenu& menu, comforts::Comforts& comforts,
+                         MSFlexGridLib::GridEvents events)
+    : Adapter(widget, focus), mDrags(drags), mMenu(menu), mComforts(comforts),
+      mEvents(std::move(events)) {
     widget->setListener(this);
     widget->hide();
 }
@@ -163,6 +169,15 @@ void GridAdapter::menuKey(QPointF at, QPoint screen) {
 
 void GridAdapter::deleteKey(QPointF at) {
     mMenu.choose(menuentry::deleteColumn, [&] { clickWithRightButton(at); });
+}
+
+bool GridAdapter::typed(QKeyEvent& event) {
+    const QPointer<GridWidget> alive = mWidget;
+    if (!mComforts.cellTyped(fromQt(event.text()))) return false;
+    // A list that has opened looks for an item that begins so.
+    auto* const list = alive ? qobject_cast<QComboBox*>(alive->window()->focusWidget()) : nullptr;
+    if (list) QCoreApplication::sendEvent(list, &event);
+    return true;
 }
 
 void GridAdapter::clickWithRightButton(QPointF at) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "comforts/Comforts.h"
 #include "platform/MSFlexGrid.h"
 #include "platform/qt/Adapter.h"
 #include "platform/qt/GridWidget.h"
@@ -13,7 +14,7 @@ class GridAdapter final : public Adapter<MSFlexGridLib::MSFlexGrid, GridWidget>,
                           private GridListener {
 public:
     GridAdapter(GridWidget* widget, FocusTracker& focus, DragSession& drags, KeyboardMenu& menu,
-                MSFlexGridLib::GridEvents events);
+                comforts::Comforts& comforts, MSFlexGridLib::GridEvents events);
     ~GridAdapter() override;
 
     void Visible(bool value) override { show(value); }
@@ -35,6 +36,7 @@ public:
     float CellTop() const override;
     float CellWidth() const override;
     float CellHeight() const override;
+    void EnsureVisible() override { grid().showCurrentCell(); }
 
     String TextMatrix(std::int32_t row, std::int32_t col) const override;
     void TextMatrix(std::int32_t row, std::int32_t col, const String& value) override;
@@ -52,6 +54,7 @@ private:
     void scrolled() override;
     void menuKey(QPointF at, QPoint screen) override;
     void deleteKey(QPointF at) override;
+    bool typed(QKeyEvent& event) override;
     void clickWithRightButton(QPointF at);
     bool dragAccepted(const QMimeData* data) override;
     bool dropped(const QMimeData* data, QPointF at) override;
@@ -64,6 +67,7 @@ private:
 
     DragSession& mDrags;
     KeyboardMenu& mMenu;
+    comforts::Comforts& mComforts;
     const MSFlexGridLib::GridEvents mEvents;
 };
 

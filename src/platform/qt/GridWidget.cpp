@@ -223,13 +223,18 @@ bool GridWidget::mouse(QWidget* part, QMouseEvent* event) {
     return body;
 }
 
-QPointF GridWidget::middleOfCurrentCell() {
+void GridWidget::showCurrentCell() {
     bringUpToDate();
-    if (mView->currentIndex().isValid()) mView->scrollTo(mView->currentIndex());
+    const QModelIndex shown = mModel->index(std::max(mRow, 1) - 1, std::max(mCol, 1) - 1);
+    mView->scrollTo(shown);
+}
+
+QPointF GridWidget::middleOfCurrentCell() {
+    showCurrentCell();
     return QRectF(cellRect(mRow, mCol)).center();
 }
 
-bool GridWidget::keyPressed(const QKeyEvent& event) {
+bool GridWidget::keyPressed(QKeyEvent& event) {
     if (!mListener) return false;
     const bool plain = modifiersOf(event) == Qt::NoModifier;
     if (isMenuKey(event)) {
@@ -240,9 +245,8 @@ bool GridWidget::keyPressed(const QKeyEvent& event) {
         mListener->deleteKey(middleOfCurrentCell());
         return true;
     }
-    const bool opens =
-        event.key() == Qt::Key_F2 || event.key() == Qt::Key_Return || event.key() == Qt::Key_Enter;
-    if (!opens) return false;
+    if (isTyping(event)) return mListener->typed(event);
+    if (event.key() != Qt::Key_F2 && !isEnter(event)) return false;
     // For the keyboard, what a click on the current cell is for the mouse.
     const QPointF middle = middleOfCurrentCell();
     const QPointer<GridWidget> alive = this;

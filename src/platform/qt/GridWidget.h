@@ -20,6 +20,8 @@ public:
     /// A key asks for the menu of the cell around `at`; it is to open at a place of the screen.
     virtual void menuKey(QPointF at, QPoint screen) = 0;
     virtual void deleteKey(QPointF at) = 0;
+    /// A key with a printable text, for the current cell. False when it means nothing there.
+    virtual bool typed(QKeyEvent& event) = 0;
     virtual bool dragAccepted(const QMimeData* data) = 0;
     virtual bool dropped(const QMimeData* data, QPointF at) = 0;
 };
@@ -45,6 +47,8 @@ public:
     int currentCol() const { return mCol; }
 
     void bringUpToDate() const;
+    /// Scrolls as little as brings the current cell into view.
+    void showCurrentCell();
     int firstRow() const;
     int firstCol() const;
     int columnWidth(int col) const;
@@ -67,9 +71,9 @@ private:
     void refresh();
     void fitLabels();
     bool mouse(QWidget* part, QMouseEvent* event);
-    bool keyPressed(const QKeyEvent& event);
+    bool keyPressed(QKeyEvent& event);
     void openMenu();
-    /// Brings the current cell into view.
+    /// After bringing it into view.
     QPointF middleOfCurrentCell();
     bool toolTip(QWidget* part, const QHelpEvent& help);
 

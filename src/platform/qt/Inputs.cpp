@@ -9,6 +9,7 @@
 #include <QDialog>
 #include <QKeyEvent>
 #include <QPushButton>
+#include <QScopedValueRollback>
 
 namespace platform::qt {
 
@@ -20,8 +21,8 @@ constexpr char defaultProperty[] = "zandorDefault";
 /// The keys of an input: reports them, and has Enter press the default button beside it.
 class InputKeys : public QObject {
 public:
-    InputKeys(QWidget* input, KeyEvent KeyDown)
-        : QObject(input), mInput(*input), mKeyDown(std::move(KeyDown)) {
+    InputKeys(QWidget* input, KeyEvent KeyDown, comforts::Comforts& comforts)
+        : QObject(input), mInput(*input), mKeyDown(std::move(KeyDown)), mComforts(comforts) {
         input->installEventFilter(this);
     }
 
@@ -33,19 +34,30 @@ public:
         if (!override && event->type() != QEvent::KeyPress)
             return QObject::eventFilter(watched, event);
         auto& key = *static_cast<QKeyEvent*>(event);
-        const bool enter = key.key() == Qt::Key_Return || key.key() == Qt::Key_Enter;
+        const bool enter = isEnter(key);
         const bool ours = enter || key.key() == Qt::Key_Escape;
         if (override) {
             // The host's shortcuts on these keys have to wait while an editor is open.
             if (ours) key.accept();
             return ours;
         }
+        const auto [atStart, atEnd] = caret();
+        if (mComforts.editorKey(keyCode(key), shiftState(key.modifiers()), atStart, atEnd))
+            return true;
         if (mKeyDown && keyCode(key) != 0) mKeyDown(keyCode(key), shiftState(key.modifiers()));
         if (enter) pressDefault();
         return ours;
     }
 
 private:
+    /// Whether it stands at the start, and at the end, of the text.
+    std::pair<bool, bool> caret() const {
+        const auto* line = qobject_cast<const QLineEdit*>(&mInput);
+        if (!line) return {true, true};
+        const int at = line->hasSelectedText() ? -1 : line->cursorPosition();
+        return {at == 0, at == line->text().size()};
+    }
+
     void pressDefault() {
         for (auto* button : mInput.parentWidget()->findChildren<QAbstractButton*>())
             if (button->property(defaultProperty).toBool() && button->isEnabled())
@@ -54,6 +66,7 @@ private:
 
     QWidget& mInput;
     KeyEvent mKeyDown;
+    comforts::Comforts& mComforts;
 };
 
 } // namespace
@@ -81,13 +94,27 @@ void ButtonAdapter::Font(const platform::Font& value) {
     if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
 }
 
-ComboBoxAdapter::ComboBoxAdapter(QComboBox* widget, FocusTracker& focus,
-                                 const std::vector<String>& items, KeyEvent KeyDown)
+void ChoiceBox::keyPressEvent(QKeyEvent* event) {
+    const QScopedValueRollback walking(mWalking, true);
+    QComboBox::keyPressEvent(event);
+}
+
+void ChoiceBox::wheelEvent(QWheelEvent* event) {
+    const QScopedValueRollback walking(mWalking, true);
+    QComboBox::wheelEvent(event);
+}
+
+ComboBoxAdapter::ComboBoxAdapter(ChoiceBox* widget, FocusTracker& focus,
+                                 const std::vector<String>& items, KeyEvent KeyDown,
+                                 comforts::Comforts& comforts)
     : Adapter(widget, focus) {
     for (const String& item : items) widget->addItem(toQt(item));
     widget->setCurrentIndex(-1);
     widget->setSizeAdjustPolicy(QComboBox::AdjustToContents);
-    new InputKeys(widget, std::move(KeyDown));
+    new InputKeys(widget, std::move(KeyDown), comforts);
+    QObject::connect(widget, &QComboBox::activated, widget, [widget, &comforts] {
+        if (!widget->isWalking()) comforts.choiceMade();
+    });
 }
 
 std::int16_t ComboBoxAdapter::ListIndex() const {
@@ -118,10 +145,11 @@ void ComboBoxAdapter::Font(const platform::Font& value) {
     if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
 }
 
-TextBoxAdapter::TextBoxAdapter(QLineEdit* widget, FocusTracker& focus, KeyEvent KeyDown)
+TextBoxAdapter::TextBoxAdapter(QLineEdit* widget, FocusTracker& focus, KeyEvent KeyDown,
+                               comforts::Comforts& comforts)
     : Adapter(widget, focus) {
     widget->setMinimumWidth(180);
-    new InputKeys(widget, std::move(KeyDown));
+    new InputKeys(widget, std::move(KeyDown), comforts);
 }
 
 String TextBoxAdapter::Text() const {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "comforts/Comforts.h"
 #include "platform/Intrinsic.h"
 #include "platform/qt/Adapter.h"
 
@@ -20,10 +21,25 @@ public:
     void Font(const platform::Font& value) override;
 };
 
-class ComboBoxAdapter final : public Adapter<platform::ComboBox, QComboBox> {
+/// A list that tells an item picked from it from one that a key or the wheel has walked to.
+class ChoiceBox : public QComboBox {
 public:
-    ComboBoxAdapter(QComboBox* widget, FocusTracker& focus, const std::vector<String>& items,
-                    KeyEvent KeyDown);
+    explicit ChoiceBox(QWidget* parent) : QComboBox(parent) {}
+
+    bool isWalking() const { return mWalking; }
+
+protected:
+    void keyPressEvent(QKeyEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+
+private:
+    bool mWalking = false;
+};
+
+class ComboBoxAdapter final : public Adapter<platform::ComboBox, ChoiceBox> {
+public:
+    ComboBoxAdapter(ChoiceBox* widget, FocusTracker& focus, const std::vector<String>& items,
+                    KeyEvent KeyDown, comforts::Comforts& comforts);
 
     std::int16_t ListIndex() const override;
     void ListIndex(std::int16_t value) override;
@@ -37,7 +53,8 @@ public:
 
 class TextBoxAdapter final : public Adapter<platform::TextBox, QLineEdit> {
 public:
-    TextBoxAdapter(QLineEdit* widget, FocusTracker& focus, KeyEvent KeyDown);
+    TextBoxAdapter(QLineEdit* widget, FocusTracker& focus, KeyEvent KeyDown,
+                   comforts::Comforts& comforts);
 
     String Text() const override;
     void Text(const String& value) override;

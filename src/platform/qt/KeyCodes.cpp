@@ -14,7 +14,8 @@ std::int16_t keyCode(const QKeyEvent& event) {
         return static_cast<std::int16_t>(112 + key - Qt::Key_F1);
     switch (key) {
     case Qt::Key_Backspace: return 8;
-    case Qt::Key_Tab: return 9;
+    case Qt::Key_Tab:
+    case Qt::Key_Backtab: return 9;
     case Qt::Key_Return:
     case Qt::Key_Enter: return 13;
     case Qt::Key_Escape: return 27;
@@ -34,6 +35,14 @@ std::int16_t keyCode(const QKeyEvent& event) {
 
 bool isEnter(const QKeyEvent& event) {
     return event.key() == Qt::Key_Return || event.key() == Qt::Key_Enter;
+}
+
+bool isTyping(const QKeyEvent& event) {
+    // Both together are AltGr.
+    const Qt::KeyboardModifiers commands = Qt::ControlModifier | Qt::AltModifier;
+    const Qt::KeyboardModifiers held = event.modifiers() & (commands | Qt::MetaModifier);
+    return (held == Qt::NoModifier || held == commands) && !event.text().isEmpty() &&
+           event.text().at(0).isPrint();
 }
 
 bool isMenuKey(const QKeyEvent& event) {

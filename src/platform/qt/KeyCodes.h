@@ -18,6 +18,9 @@ bool isMenuKey(const QKeyEvent& event);
 /// Return, and Enter on the numeric pad.
 bool isEnter(const QKeyEvent& event);
 
+/// Whether the key writes a text rather than giving a command.
+bool isTyping(const QKeyEvent& event);
+
 /// The modifiers held, without the mark of the numeric pad's keys.
 Qt::KeyboardModifiers modifiersOf(const QKeyEvent& event);
 

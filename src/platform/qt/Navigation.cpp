@@ -191,6 +191,7 @@ bool Navigation::claims(const QKeyEvent& event) const {
     const Qt::KeyboardModifiers held = modifiersOf(event);
     if (isMenuKey(event)) return true;
     if (!arrowOf(event).isNull()) return inTable && held & (Qt::AltModifier | Qt::ShiftModifier);
+    if (inGrid && mComforts.flags().KeepsTyping && isTyping(event)) return true;
     if (held != Qt::NoModifier) return false;
     return event.key() == Qt::Key_Delete || (isEnter(event) && (inGrid || onLine)) ||
            (event.key() == Qt::Key_F2 && inGrid);

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "comforts/Comforts.h"
+
 #include <QPointer>
 #include <QWidget>
 
@@ -18,7 +20,8 @@ class GridWidget;
 /// around it the control is a single stop.
 class Navigation {
 public:
-    Navigation(QWidget& surface, CanvasView& view) : mSurface(surface), mView(view) {}
+    Navigation(QWidget& surface, CanvasView& view, const comforts::Comforts& comforts)
+        : mSurface(surface), mView(view), mComforts(comforts) {}
 
     void setGrid(GridWidget* grid);
     void setHomeButton(QWidget* button) { mHome = button; }
@@ -56,6 +59,7 @@ private:
 
     QWidget& mSurface;
     CanvasView& mView;
+    const comforts::Comforts& mComforts;
     QPointer<QWidget> mGrid;
     QPointer<QWidget> mHome;
     QPointer<QWidget> mLastTable; ///< that had the focus when F6 went to the grid

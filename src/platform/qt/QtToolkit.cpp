@@ -85,6 +85,7 @@ std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents ev
             const auto* grid = static_cast<const GridWidget*>(mGrid.data());
             return grid ? grid->model().titleOf(grid->currentRow(), grid->currentCol()) : QString();
         });
+    if (!design.Container) frame->setLeft([this] { mComforts.editorLeft(); });
     return adapt<RowFrameAdapter>(design, Role::frame, frame);
 }
 
@@ -102,15 +103,15 @@ std::unique_ptr<CommandButton> QtToolkit::makeCommandButton(const Design& design
 
 std::unique_ptr<ComboBox>
 QtToolkit::makeComboBox(const Design& design, const std::vector<String>& items, KeyEvent KeyDown) {
-    auto* combo = new QComboBox(parentOf(design));
+    auto* combo = new ChoiceBox(parentOf(design));
     combo->show();
-    return adapt<ComboBoxAdapter>(design, Role::field, combo, items, std::move(KeyDown));
+    return adapt<ComboBoxAdapter>(design, Role::field, combo, items, std::move(KeyDown), mComforts);
 }
 
 std::unique_ptr<TextBox> QtToolkit::makeTextBox(const Design& design, KeyEvent KeyDown) {
     auto* text = new QLineEdit(parentOf(design));
     text->show();
-    return adapt<TextBoxAdapter>(design, Role::field, text, std::move(KeyDown));
+    return adapt<TextBoxAdapter>(design, Role::field, text, std::move(KeyDown), mComforts);
 }
 
 std::unique_ptr<Label> QtToolkit::makeLabel(const Design& design) {
@@ -137,7 +138,8 @@ std::unique_ptr<MSFlexGridLib::MSFlexGrid> QtToolkit::makeGrid(const Design& des
     mGrid = grid;
     mFocus.setFallback(&grid->view());
     mNavigation.setGrid(grid);
-    return adapt<GridAdapter>(design, Role::field, grid, mDrags, mMenu, std::move(events));
+    return adapt<GridAdapter>(design, Role::field, grid, mDrags, mMenu, mComforts,
+                              std::move(events));
 }
 
 std::unique_ptr<PopupMenu> QtToolkit::makePopupMenu(const Design& design, PlainEvent Click) {

@@ -73,7 +73,7 @@ private:
     comforts::Comforts mComforts{*this};
     TabuletSurroundings mTables{mDrags, mMenu, mAsked, mComforts};
     CanvasView mView{mMenu, mDrags};
-    Navigation mNavigation{mSurface, mView};
+    Navigation mNavigation{mSurface, mView, mComforts};
     QPointer<QWidget> mGrid;
     bool mClosing = false;
 };

@@ -70,6 +70,8 @@ void ZandorWidget::setComforts(const comforts::Flags& flags) {
     mToolkit->comforts().setFlags(flags);
 }
 
+void ZandorWidget::takeOver() { mToolkit->comforts().takeOver(); }
+
 QSize ZandorWidget::sizeHint() const { return {900, 600}; }
 
 QSize ZandorWidget::minimumSizeHint() const { return {240, 160}; }

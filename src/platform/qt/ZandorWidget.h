@@ -114,6 +114,11 @@ public:
     const comforts::Flags& comforts() const;
     void setComforts(const comforts::Flags& flags);
 
+    /// With the comfort of typing kept, what stands in an open editor goes into its cell, and the
+    /// editor closes; ColumnModified is emitted when that changes anything. For hosts that are
+    /// about to run, save or close the query by something that does not take the focus.
+    void takeOver();
+
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override;
 
