@@ -3,6 +3,7 @@
 #include "platform/qt/Text.h"
 
 #include <QFontInfo>
+#include <QWidget>
 
 namespace platform::qt {
 
@@ -16,6 +17,14 @@ QFont toQt(const Font& font, const QFont& base) {
     if (!font.Name.empty() && toQt(font.Name) != base.family()) result.setFamily(toQt(font.Name));
     if (font.Size > 0) result.setPointSizeF(static_cast<qreal>(font.Size));
     return result;
+}
+
+void setFont(QWidget& widget, const Font& font) {
+    const QWidget* around = widget.isWindow() ? nullptr : widget.parentWidget();
+    if (around && fromQt(around->font()) == font)
+        widget.setFont(QFont());
+    else
+        widget.setFont(toQt(font, widget.font()));
 }
 
 } // namespace platform::qt

@@ -12,4 +12,8 @@ Font fromQt(const QFont& font);
 /// families) stays as the widget has it.
 QFont toQt(const Font& font, const QFont& base);
 
+/// Gives a widget a font. One that its surroundings have anyway it has from them, so that it
+/// follows when theirs changes.
+void setFont(QWidget& widget, const Font& font);
+
 } // namespace platform::qt

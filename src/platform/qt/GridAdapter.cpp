@@ -54,7 +54,7 @@ void GridAdapter::mustBeCell(std::int32_t row, std::int32_t col) const {
         throw errors::invalidPropertyArrayIndex();
 }
 
-void GridAdapter::Font(const platform::Font& value) { grid().setFont(toQt(value, grid().font())); }
+void GridAdapter::Font(const platform::Font& value) { setFont(grid(), value); }
 
 void GridAdapter::SetFocus() {
     // Tables that go together with their closed window ask for it.

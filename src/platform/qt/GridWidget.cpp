@@ -60,6 +60,7 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     prepareHeader(*mView->verticalHeader());
     mView->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     for (int col = 0; col < cols; ++col) mModel->setWidth(col, designWidth);
+    fitColumnsToFont();
 
     mView->installEventFilter(this);
     for (QWidget* part : {mView->viewport(), mView->horizontalHeader()->viewport(),
@@ -87,6 +88,20 @@ void GridWidget::measure() {
     mRowHeight = fontMetrics().height() + 8;
     mView->verticalHeader()->setDefaultSectionSize(mRowHeight);
     mView->horizontalHeader()->setFixedHeight(mRowHeight);
+    touch();
+}
+
+void GridWidget::fitColumnsToFont() {
+    // Roughly what the columns are born wide enough for.
+    const int now = mView->fontMetrics().horizontalAdvance(QStringLiteral("Descending"));
+    const int before = std::exchange(mTextWidth, now);
+    const float design = toPixels(designWidth);
+    const float share = before > 0
+                            ? static_cast<float>(now) / static_cast<float>(before)
+                            : std::max(1.0F, static_cast<float>(now + 3 * textMargin) / design);
+    if (share == 1) return;
+    for (int col = 1; col < mModel->cols(); ++col)
+        mModel->setWidth(col, share * mModel->width(col));
     touch();
 }
 
@@ -174,7 +189,9 @@ void GridWidget::resizeEvent(QResizeEvent*) { mView->setGeometry(rect()); }
 
 void GridWidget::changeEvent(QEvent* event) {
     QWidget::changeEvent(event);
-    if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) measure();
+    if (event->type() != QEvent::FontChange && event->type() != QEvent::StyleChange) return;
+    measure();
+    fitColumnsToFont();
 }
 
 bool GridWidget::eventFilter(QObject* watched, QEvent* event) {

@@ -68,6 +68,8 @@ protected:
 
 private:
     void measure();
+    /// Columns keep the share of their texts that they show.
+    void fitColumnsToFont();
     void refresh();
     void fitLabels();
     bool mouse(QWidget* part, QMouseEvent* event);
@@ -84,6 +86,7 @@ private:
     int mRow = 1;
     int mCol = 1;
     int mRowHeight = 0;
+    int mTextWidth = 0; ///< of a sample in the font that the columns were last fitted to
     bool mStale = false;
     bool mRefreshing = false;
     bool mLabelWidthSet = false;

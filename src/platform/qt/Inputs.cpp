@@ -91,7 +91,7 @@ void ButtonAdapter::Default(bool value) {
 }
 
 void ButtonAdapter::Font(const platform::Font& value) {
-    if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
+    if (mWidget) setFont(*mWidget, value);
 }
 
 void ChoiceBox::keyPressEvent(QKeyEvent* event) {
@@ -142,7 +142,7 @@ void ComboBoxAdapter::AddItem(const String& text) {
 }
 
 void ComboBoxAdapter::Font(const platform::Font& value) {
-    if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
+    if (mWidget) setFont(*mWidget, value);
 }
 
 TextBoxAdapter::TextBoxAdapter(QLineEdit* widget, FocusTracker& focus, KeyEvent KeyDown,
@@ -174,7 +174,7 @@ void LabelAdapter::Caption(const String& value) {
 }
 
 void LabelAdapter::Font(const platform::Font& value) {
-    if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
+    if (mWidget) setFont(*mWidget, value);
 }
 
 } // namespace platform::qt

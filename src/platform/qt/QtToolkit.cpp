@@ -163,7 +163,8 @@ Ref<TalvikTabulet::Tabulet> QtToolkit::makeTabulet(const Design& design, std::in
     auto* box = new TabuletWidget(index, canvas);
     box->hide();
     box->setObjectName(elementName(design.Name, index));
-    if (const auto* holder = dynamic_cast<const WidgetHolder*>(pattern); holder && holder->widget())
+    if (const auto* holder = dynamic_cast<const WidgetHolder*>(pattern);
+        holder && holder->widget() && holder->widget()->testAttribute(Qt::WA_SetFont))
         box->setFont(holder->widget()->font());
     return std::make_shared<TabuletAdapter>(box, mFocus, mTables, index, events);
 }
@@ -177,10 +178,8 @@ Ref<Shape> QtToolkit::makeShape(const Design& design, std::int16_t index) {
     return std::make_shared<CanvasShape>(canvasOf(design), elementName(design.Name, index));
 }
 
-Font QtToolkit::AmbientFont() const {
-    const QWidget* host = mSurface.parentWidget();
-    return fromQt(host ? host->font() : QApplication::font(&mSurface));
-}
+// A widget has its host's font unless it was given one, which then is what its host wants for it.
+Font QtToolkit::AmbientFont() const { return ControlFont(); }
 
 Font QtToolkit::ControlFont() const { return fromQt(mSurface.font()); }
 

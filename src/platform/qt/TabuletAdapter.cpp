@@ -150,7 +150,7 @@ void TabuletAdapter::Activated(bool value) {
 }
 
 void TabuletAdapter::Font(const platform::Font& value) {
-    if (mWidget) mWidget->setFont(toQt(value, mWidget->font()));
+    if (mWidget) setFont(*mWidget, value);
 }
 
 Ref<TalvikTabulet::ColumnItem> TabuletAdapter::ColumnAt(float X, float Y) const {

@@ -1,0 +1,141 @@
+#include "qt/Desk.h"
+
+#include <QApplication>
+#include <QComboBox>
+#include <QDialog>
+#include <QHeaderView>
+#include <QLabel>
+#include <QLineEdit>
+
+namespace {
+
+enum class Where { application, window, widget };
+enum class When { beforeBinding, afterBinding };
+
+struct Case {
+    Where where;
+    When when;
+};
+
+void PrintTo(const Case& c, std::ostream* out) {
+    *out << (c.where == Where::application ? "the application"
+             : c.where == Where::window    ? "the window"
+                                           : "the widget")
+         << (c.when == When::beforeBinding ? " before binding" : " after binding");
+}
+
+/// A font that is set somewhere around the control, at some time.
+class AFont : public Desk, public testing::WithParamInterface<Case> {
+protected:
+    AFont() { open(&host); }
+    ~AFont() override {
+        widget.reset();
+        QApplication::setFont(before);
+    }
+
+    void set(qreal points) {
+        QFont font = before;
+        font.setPointSizeF(points);
+        switch (GetParam().where) {
+        case Where::application: QApplication::setFont(font); break;
+        case Where::window: host.setFont(font); break;
+        case Where::widget: widget->setFont(font); break;
+        }
+        settle();
+    }
+
+    void lay(qreal points) {
+        host.resize(widget->size());
+        host.show();
+        if (GetParam().when == When::beforeBinding) set(points);
+        bind();
+        if (GetParam().when == When::afterBinding) set(points);
+    }
+
+    int textWidth(const char* text) {
+        return QFontMetrics(grid().view().font()).horizontalAdvance(QString::fromLatin1(text));
+    }
+
+    const QFont before = QApplication::font();
+    QWidget host;
+};
+
+} // namespace
+
+TEST_P(AFont, ReachesEveryPartOfTheControl) {
+    lay(19);
+    for (const QWidget* part : std::initializer_list<const QWidget*>{
+             &table(1), &table(1).list(), &grid(), &grid().view(), grid().view().horizontalHeader(),
+             grid().view().verticalHeader(), &child<QWidget>("cobSortOrder"),
+             &child<QWidget>("txtValue"), &child<QWidget>("cmdSetTextValue")})
+        EXPECT_EQ(part->font().pointSizeF(), 19) << part->metaObject()->className();
+    bind(); // a table made later has it, too
+    EXPECT_EQ(table(2).list().font().pointSizeF(), 19);
+}
+
+TEST_P(AFont, IsThatOfTheDialog) {
+    lay(19);
+    qreal label = 0, input = 0;
+    QTimer::singleShot(0, [&] {
+        if (auto* open = qobject_cast<QDialog*>(QApplication::activeModalWidget())) {
+            label = open->findChild<QLabel*>()->font().pointSizeF();
+            input = open->findChild<QLineEdit*>()->font().pointSizeF();
+            open->reject();
+        }
+    });
+    auto& canvas = child<platform::qt::Canvas>("fraTable");
+    canvas.focusOn(canvas.lines().front(), Qt::TabFocusReason);
+    canvas.openCurrentLine();
+    EXPECT_EQ(label, 19);
+    EXPECT_EQ(input, 19);
+}
+
+TEST_P(AFont, FindsRowsAndColumnsThatItFitsInto) {
+    lay(24);
+    const int height = QFontMetrics(grid().view().font()).height();
+    EXPECT_GE(grid().cellRect(0, 1).height(), height);
+    EXPECT_GE(grid().cellRect(4, 1).height(), height);
+    EXPECT_GE(table(1).list().visualRect(table(1).list().model()->index(0, 0)).height(), height);
+    EXPECT_GE(table(1).listTop(), height);
+    for (const char* word : {"Ascending", "Descending", "Not Visible"})
+        EXPECT_GE(grid().cellRect(2, 9).width(), textWidth(word)) << "in a blank column: " << word;
+    EXPECT_GE(grid().cellRect(0, 1).width(), textWidth("ORDER_ID"));
+    EXPECT_GE(grid().cellRect(0, 0).width(), textWidth("Synonym:"));
+}
+
+TEST_P(AFont, FitsIntoTheEditors) {
+    lay(24);
+    for (const auto& [row, name] :
+         {std::pair{2, "fraSortOrder"}, std::pair{3, "fraVisibility"}, std::pair{4, "fraValue"}}) {
+        press(row, 1);
+        const auto& editor = child<QWidget>(name);
+        ASSERT_TRUE(editor.isVisible()) << name;
+        for (const QWidget* part : editor.findChildren<QWidget*>()) {
+            if (part->window() != editor.window()) continue; // of a list that is not open
+            EXPECT_GE(part->width(), part->minimumSizeHint().width()) << name;
+            EXPECT_GE(part->height(), part->sizeHint().height()) << name;
+        }
+    }
+}
+
+TEST_P(AFont, LeavesWhatIsAskedForInTwipsTrue) {
+    lay(24);
+    for (int row = 0; row < 6; ++row)
+        for (int col = 1; col < 4; ++col) {
+            const QPoint middle = grid().cellRect(row, col).center();
+            QWidget* part = grid().childAt(middle);
+            hands::mouse(*part, QEvent::MouseButtonPress, part->mapFrom(&grid(), middle),
+                         Qt::LeftButton, Qt::LeftButton);
+            if (row == 0 || !grid().rect().contains(middle)) continue;
+            EXPECT_EQ(grid().currentRow(), row);
+            EXPECT_EQ(grid().currentCol(), col);
+        }
+}
+
+INSTANTIATE_TEST_SUITE_P(Of, AFont,
+                         testing::Values(Case{Where::application, When::beforeBinding},
+                                         Case{Where::application, When::afterBinding},
+                                         Case{Where::window, When::beforeBinding},
+                                         Case{Where::window, When::afterBinding},
+                                         Case{Where::widget, When::beforeBinding},
+                                         Case{Where::widget, When::afterBinding}));
