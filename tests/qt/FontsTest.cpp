@@ -68,7 +68,7 @@ TEST_P(AFont, ReachesEveryPartOfTheControl) {
              &table(1), &table(1).list(), &grid(), &grid().view(), grid().view().horizontalHeader(),
              grid().view().verticalHeader(), &child<QWidget>("cobSortOrder"),
              &child<QWidget>("txtValue"), &child<QWidget>("cmdSetTextValue")})
-        EXPECT_EQ(part->font().pointSizeF(), 19) << part->metaObject()->className();
+        EXPECT_EQ(part->font().pointSizeF(), 19) << part->metaObject()->className() << (part == grid().view().horizontalHeader());
     bind(); // a table made later has it, too
     EXPECT_EQ(table(2).list().font().pointSizeF(), 19);
 }
@@ -124,9 +124,10 @@ TEST_P(AFont, LeavesWhatIsAskedForInTwipsTrue) {
         for (int col = 1; col < 4; ++col) {
             const QPoint middle = grid().cellRect(row, col).center();
             QWidget* part = grid().childAt(middle);
+            if (!part) continue; // beyond the window
             hands::mouse(*part, QEvent::MouseButtonPress, part->mapFrom(&grid(), middle),
                          Qt::LeftButton, Qt::LeftButton);
-            if (row == 0 || !grid().rect().contains(middle)) continue;
+            if (row == 0) continue;
             EXPECT_EQ(grid().currentRow(), row);
             EXPECT_EQ(grid().currentCol(), col);
         }

@@ -33,8 +33,25 @@ ColumnListView::ColumnListView(QWidget* parent) : QListView(parent) {
 }
 
 void ColumnListView::measure() {
-    mRowHeight = ColumnDelegate::rowHeight(fontMetrics());
+    const int before = std::exchange(mRowHeight, ColumnDelegate::rowHeight(fontMetrics()));
+    const int inset = std::exchange(mInset, contentsRect().top());
     verticalScrollBar()->setSingleStep(mRowHeight);
+    if (before == 0 || (before == mRowHeight && inset == mInset)) return;
+    // Joins end at entries, and those stand elsewhere once they are laid out.
+    QMetaObject::invokeMethod(
+        this,
+        [this] {
+            doItemsLayout();
+            if (mListener) mListener->listScrolled();
+        },
+        Qt::QueuedConnection);
+}
+
+void ColumnListView::doItemsLayout() {
+    // A list that was never shown knows nothing of the host's style sheet.
+    ensurePolished();
+    measure();
+    QListView::doItemsLayout();
 }
 
 void ColumnListView::changeEvent(QEvent* event) {

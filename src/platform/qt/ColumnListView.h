@@ -29,7 +29,10 @@ public:
 
     void setListener(EntryListener* listener) { mListener = listener; }
     int rowHeight() const { return mRowHeight; }
-    int scrolledBy() const { return mScrolledBy; }
+    /// Where the first entry begins, above the list when it is scrolled.
+    int firstEntry() const { return mInset - mScrolledBy; }
+
+    void doItemsLayout() override;
 
 protected:
     void keyPressEvent(QKeyEvent* event) override;
@@ -50,6 +53,7 @@ private:
     EntryListener* mListener = nullptr;
     QPersistentModelIndex mClickPending; ///< to be selected alone when the button comes up
     int mRowHeight = 0;
+    int mInset = 0; ///< of the entries, by a style sheet
     int mScrolledBy = 0;
 };
 

@@ -3,6 +3,7 @@
 #include "platform/qt/FocusFrame.h"
 #include "platform/qt/ShownText.h"
 
+#include <QEvent>
 #include <QPainter>
 #include <QTableView>
 
@@ -34,6 +35,22 @@ void paintFixedCell(QPainter& painter, QStyleOptionHeader option, const QWidget&
     option.rect.adjust(cellMargin, 0, -cellMargin, 0);
     option.text = option.fontMetrics.elidedText(option.text, Qt::ElideRight, option.rect.width());
     style.drawControl(QStyle::CE_HeaderLabel, &option, &painter, &widget);
+}
+
+QSize GridHeader::sizeFor(const QString& text) const {
+    ensurePolished();
+    QStyleOptionHeader option;
+    initStyleOption(&option);
+    option.section = 0;
+    option.text = text;
+    return style()->sizeFromContents(QStyle::CT_HeaderSection, &option, {}, this);
+}
+
+void GridHeader::changeEvent(QEvent* event) {
+    QHeaderView::changeEvent(event);
+    if (event->type() != QEvent::StyleChange || !testAttribute(Qt::WA_StyleSheet)) return;
+    if (styleSheet().isEmpty())
+        setStyleSheet(QStringLiteral("QHeaderView { border: 0; padding: 0; margin: 0 }"));
 }
 
 void RowTitles::paintSection(QPainter* painter, const QRect& place, int section) const {

@@ -25,10 +25,23 @@ private:
 /// Paints a fixed cell, its text a margin away from its frame.
 void paintFixedCell(QPainter& painter, QStyleOptionHeader option, const QWidget& widget);
 
-/// The titles of the grid's rows.
-class RowTitles : public QHeaderView {
+/// A header whose sections stand level with the cells, whatever border and padding a style sheet
+/// gives it.
+class GridHeader : public QHeaderView {
 public:
-    explicit RowTitles(QWidget* parent) : QHeaderView(Qt::Vertical, parent) {}
+    using QHeaderView::QHeaderView;
+
+    /// What a section needs for a text, in logical pixels.
+    QSize sizeFor(const QString& text) const;
+
+protected:
+    void changeEvent(QEvent* event) override;
+};
+
+/// The titles of the grid's rows.
+class RowTitles : public GridHeader {
+public:
+    explicit RowTitles(QWidget* parent) : GridHeader(Qt::Vertical, parent) {}
 
 protected:
     void paintSection(QPainter* painter, const QRect& place, int section) const override;

@@ -43,7 +43,9 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     setFocusProxy(mView);
     mView->setFocusPolicy(Qt::ClickFocus);
     mView->setAccessibleName(tr("Output columns"));
+    mView->setHorizontalHeader(new GridHeader(Qt::Horizontal, mView));
     mView->setVerticalHeader(new RowTitles(mView));
+    mCorner->raise();
     mView->setItemDelegate(new GridCellDelegate(*mView));
     mView->setModel(mModel);
     mView->setFrameShape(QFrame::NoFrame);
@@ -84,24 +86,52 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     measure();
 }
 
+GridHeader& GridWidget::fields() const {
+    return static_cast<GridHeader&>(*mView->horizontalHeader());
+}
+
+GridHeader& GridWidget::titles() const {
+    return static_cast<GridHeader&>(*mView->verticalHeader());
+}
+
 void GridWidget::measure() {
-    mRowHeight = fontMetrics().height() + 8;
-    mView->verticalHeader()->setDefaultSectionSize(mRowHeight);
-    mView->horizontalHeader()->setFixedHeight(mRowHeight);
+    const QString sample = QStringLiteral("Xg");
+    mView->ensurePolished();
+    QStyleOptionViewItem cell;
+    cell.initFrom(mView);
+    cell.features = QStyleOptionViewItem::HasDisplay;
+    cell.text = sample;
+    const QSize inCell = style()->sizeFromContents(QStyle::CT_ItemViewItem, &cell, {}, mView);
+    mRowHeight =
+        std::max({fontMetrics().height() + 8, mView->fontMetrics().height() + 8, inCell.height(),
+                  fields().sizeFor(sample).height(), titles().sizeFor(sample).height()});
+    titles().setDefaultSectionSize(mRowHeight);
+    fields().setFixedHeight(mRowHeight);
     touch();
 }
 
+qreal GridWidget::textWidth(const QString& text) const {
+    const qreal plain = QFontMetricsF(font()).horizontalAdvance(text);
+    const bool styled = fields().testAttribute(Qt::WA_StyleSheet);
+    return styled ? std::max<qreal>(plain, fields().sizeFor(text).width()) : plain;
+}
+
 void GridWidget::fitColumnsToFont() {
-    // Roughly what the columns are born wide enough for.
-    const int now = mView->fontMetrics().horizontalAdvance(QStringLiteral("Descending"));
-    const int before = std::exchange(mTextWidth, now);
-    const float design = toPixels(designWidth);
-    const float share = before > 0
-                            ? static_cast<float>(now) / static_cast<float>(before)
-                            : std::max(1.0F, static_cast<float>(now + 3 * textMargin) / design);
-    if (share == 1) return;
-    for (int col = 1; col < mModel->cols(); ++col)
-        mModel->setWidth(col, share * mModel->width(col));
+    // The longest word that the control itself writes, roughly.
+    const QString word = QStringLiteral("Descending");
+    const Sample before = std::exchange(mSample, {});
+    mSample.text = std::max({fontMetrics().horizontalAdvance(word),
+                             mView->fontMetrics().horizontalAdvance(word),
+                             fields().fontMetrics().horizontalAdvance(word)});
+    mSample.around = std::max<qreal>(0, textWidth(word) - mSample.text);
+    const qreal design = toPixels(designWidth);
+    for (int col = 1; col < mModel->cols(); ++col) {
+        const qreal width = mModel->width(col) / twipsPerPixel;
+        const qreal fitted =
+            before.text > 0 ? (width - before.around) * mSample.text / before.text + mSample.around
+                            : std::max(design, mSample.text + mSample.around + 3 * textMargin);
+        if (std::abs(fitted - width) >= 0.5) mModel->setWidth(col, toTwips(std::max(0.0, fitted)));
+    }
     touch();
 }
 
@@ -153,13 +183,14 @@ void GridWidget::fitLabels() {
     if (!mLabelWidthSet) {
         int widest = 0;
         for (int row = 0; row < mModel->rows(); ++row)
-            widest = std::max(widest, fontMetrics().horizontalAdvance(mModel->text(row, 0)));
+            widest =
+                std::max({widest, titles().fontMetrics().horizontalAdvance(mModel->text(row, 0)),
+                          static_cast<int>(textWidth(mModel->text(row, 0)))});
         mModel->setWidth(0, toTwips(std::max(widest + 2 * textMargin + 4, 70)));
     }
     const int width = columnWidth(0);
     mView->verticalHeader()->setFixedWidth(width);
-    mCorner->setGeometry(0, 0, width, mRowHeight);
-    mCorner->raise();
+    mCorner->setGeometry({mView->contentsRect().topLeft(), QSize(width, mRowHeight)});
 }
 
 int GridWidget::firstRow() const {
@@ -177,12 +208,10 @@ int GridWidget::columnWidth(int col) const { return toPixels(mModel->width(col))
 QRect GridWidget::cellRect(int row, int col) const {
     bringUpToDate();
     QRect cell(0, 0, columnWidth(col), mRowHeight);
-    if (col > 0) {
-        const QHeaderView& header = *mView->horizontalHeader();
-        cell.moveLeft(columnWidth(0) + header.sectionPosition(col - 1) - header.offset());
-    }
-    if (row > 0) cell.moveTop(mRowHeight * row - mView->verticalHeader()->offset());
-    return cell;
+    if (col > 0)
+        cell.moveLeft(columnWidth(0) + fields().sectionPosition(col - 1) - fields().offset());
+    if (row > 0) cell.moveTop(mRowHeight * row - titles().offset());
+    return cell.translated(mView->pos() + mView->contentsRect().topLeft());
 }
 
 void GridWidget::resizeEvent(QResizeEvent*) { mView->setGeometry(rect()); }
@@ -190,6 +219,10 @@ void GridWidget::resizeEvent(QResizeEvent*) { mView->setGeometry(rect()); }
 void GridWidget::changeEvent(QEvent* event) {
     QWidget::changeEvent(event);
     if (event->type() != QEvent::FontChange && event->type() != QEvent::StyleChange) return;
+    // Qt hands a font down a list of children in which a view moves its scroll bars meanwhile, and
+    // so may miss a header.
+    for (GridHeader* header : {&fields(), &titles()})
+        if (!header->testAttribute(Qt::WA_StyleSheet)) header->setFont(QFont());
     measure();
     fitColumnsToFont();
 }
@@ -283,8 +316,8 @@ bool GridWidget::toolTip(QWidget* part, const QHelpEvent& help) {
     for (int row = 0; row < mModel->rows(); ++row) {
         for (int col = 0; col < mModel->cols(); ++col) {
             // The fixed cells lie over those that have been scrolled below them.
-            const bool fixedRow = at.y() < mRowHeight;
-            const bool fixedCol = at.x() < columnWidth(0);
+            const bool fixedRow = at.y() <= mCorner->geometry().bottom();
+            const bool fixedCol = at.x() <= mCorner->geometry().right();
             if (fixedRow != (row == 0) || fixedCol != (col == 0)) continue;
             const QRect cell = cellRect(row, col);
             if (!cell.contains(at)) continue;

@@ -8,6 +8,7 @@
 namespace platform::qt {
 
 class GridCorner;
+class GridHeader;
 class GridModel;
 
 class GridListener {
@@ -53,6 +54,8 @@ public:
     int firstCol() const;
     int columnWidth(int col) const;
     int rowHeight() const { return mRowHeight; }
+    /// The width that a text takes in a column, without the margins of every column.
+    qreal textWidth(const QString& text) const;
     /// The rectangle of a cell in the grid's own coordinates, in logical pixels.
     QRect cellRect(int row, int col) const;
     void setLabelWidth(float twips);
@@ -67,6 +70,14 @@ protected:
     void dropEvent(QDropEvent* event) override;
 
 private:
+    /// How wide a sample is in the font that the columns were last fitted to.
+    struct Sample {
+        qreal text = 0;
+        qreal around = 0; ///< what a style sheet adds
+    };
+
+    GridHeader& fields() const;
+    GridHeader& titles() const;
     void measure();
     /// Columns keep the share of their texts that they show.
     void fitColumnsToFont();
@@ -86,7 +97,7 @@ private:
     int mRow = 1;
     int mCol = 1;
     int mRowHeight = 0;
-    int mTextWidth = 0; ///< of a sample in the font that the columns were last fitted to
+    Sample mSample;
     bool mStale = false;
     bool mRefreshing = false;
     bool mLabelWidthSet = false;

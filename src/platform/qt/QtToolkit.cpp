@@ -184,7 +184,9 @@ Font QtToolkit::AmbientFont() const { return ControlFont(); }
 Font QtToolkit::ControlFont() const { return fromQt(mSurface.font()); }
 
 float QtToolkit::TextWidth(const String& text) const {
-    return toTwips(QFontMetricsF(mSurface.font()).horizontalAdvance(toQt(text)));
+    const auto* grid = static_cast<const GridWidget*>(mGrid.data());
+    return toTwips(grid ? grid->textWidth(toQt(text))
+                        : QFontMetricsF(mSurface.font()).horizontalAdvance(toQt(text)));
 }
 
 float QtToolkit::ScaleWidth() const { return toTwips(mSurface.width()); }

@@ -52,13 +52,22 @@ ScrollBarAdapter::ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, Scro
     : Adapter(widget, focus) {
     widget->setRange(0, 0);
     widget->setSingleStep(singleStep);
-    const int extent = widget->style()->pixelMetric(QStyle::PM_ScrollBarExtent, nullptr, widget);
-    widget->resize(widget->orientation() == Qt::Horizontal ? QSize(4 * extent, extent)
-                                                           : QSize(extent, 4 * extent));
+    widget->resize(widget->sizeHint());
     QObject::connect(widget, &QScrollBar::valueChanged, widget, [change = events.Change] {
         if (change) change();
     });
     mFocus.watch(widget, events.GotFocus);
+}
+
+Bounds ScrollBarAdapter::bounds() const {
+    Bounds result = Adapter::bounds();
+    if (!mWidget) return result;
+    const QSize wanted = mWidget->sizeHint();
+    if (mWidget->orientation() == Qt::Horizontal)
+        result.Height = toTwips(wanted.height());
+    else
+        result.Width = toTwips(wanted.width());
+    return result;
 }
 
 std::int16_t ScrollBarAdapter::Max() const {

@@ -27,6 +27,9 @@ class ScrollBarAdapter final : public Adapter<platform::ScrollBar, QScrollBar> {
 public:
     ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, ScrollBarEvents events);
 
+    /// As thick as the style has it at the moment.
+    Bounds bounds() const override;
+
     std::int16_t Max() const override;
     void Max(std::int16_t value) override;
     std::int16_t Value() const override;

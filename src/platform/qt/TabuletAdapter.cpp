@@ -81,7 +81,7 @@ private:
         const Bounds box = mTable->bounds();
         const ColumnListView& view = list();
         const float row = static_cast<float>(view.rowHeight());
-        const float middle = static_cast<float>(mTable->mWidget->listTop() - view.scrolledBy()) +
+        const float middle = static_cast<float>(view.y() + view.firstEntry()) +
                              row * (static_cast<float>(mRow) + 0.5F);
         return {box.Left + side * box.Width, box.Top + middle * twipsPerPixel};
     }

@@ -120,6 +120,18 @@ void ZandorWidget::keyPressEvent(QKeyEvent* event) {
     if (!mToolkit->navigation().keyPressed(*event)) QWidget::keyPressEvent(event);
 }
 
+void ZandorWidget::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() != QEvent::StyleChange) return;
+    // Its bars may be of another thickness once they have the new style, too.
+    QMetaObject::invokeMethod(
+        this,
+        [this] {
+            if (mControl) mControl->UserControl_Resize();
+        },
+        Qt::QueuedConnection);
+}
+
 void ZandorWidget::queuePaint() {
     // The control's paint may open message boxes, which must never happen while Qt paints.
     if (std::exchange(mPaintQueued, true)) return;
