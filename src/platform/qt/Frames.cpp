@@ -77,6 +77,7 @@ void RowFrame::showEvent(QShowEvent* event) {
 void RowFrame::paintEvent(QPaintEvent*) {
     if (!mOutermost) return;
     QPainter painter(this);
+    painter.fillRect(rect(), palette().window()); // a style sheet leaves it to the widget
     painter.setPen(QPen(palette().color(QPalette::Highlight), 1));
     painter.setRenderHint(QPainter::Antialiasing);
     painter.drawRect(QRectF(rect()).adjusted(0.5, 0.5, -0.5, -0.5));
