@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/Toolkit.h"
+#include "control/Life.h"
 
 namespace TalvikDBxZandor::basZandor {
 
@@ -19,12 +19,14 @@ void ReportCurrentError(platform::MessageBoxes& boxes, platform::StringView modu
                         platform::StringView procedureName) noexcept;
 
 /// Runs the body of a procedure. Whatever it throws is reported once under the procedure's name,
-/// and the rest of the body is skipped; the caller is not told.
+/// and the rest of the body is skipped; the caller is not told. What the body works for being gone
+/// is nothing to report.
 template <class Body>
 void Guard(platform::MessageBoxes& boxes, platform::StringView moduleName,
            platform::StringView procedureName, Body&& body) noexcept {
     try {
         body();
+    } catch (const Gone&) {
     } catch (...) {
         ReportCurrentError(boxes, moduleName, procedureName);
     }

@@ -9,13 +9,6 @@ void clsDragColumn::Guard(platform::StringView procedure, Body&& body) const {
     basZandor::Guard(mBoxes, ModuleName, procedure, std::forward<Body>(body));
 }
 
-template <class T>
-Ref<T> clsDragColumn::Follow(const Loose<T>& reference) const {
-    Ref<T> target = reference.target.lock();
-    if (reference.set && !target) throw platform::errors::noSuchElement(mTableIndex);
-    return target;
-}
-
 std::int16_t clsDragColumn::TableIndex() const {
     std::int16_t result = 0;
     Guard(u"P_GET TableIndex", [&] { result = mTableIndex; });
@@ -28,22 +21,22 @@ void clsDragColumn::TableIndex(std::int16_t value) {
 
 Ref<TalvikTabulet::Tabulet> clsDragColumn::Table() const {
     Ref<TalvikTabulet::Tabulet> result;
-    Guard(u"P_GET Table", [&] { result = Follow(mTable); });
+    Guard(u"P_GET Table", [&] { result = mTable; });
     return result;
 }
 
 void clsDragColumn::Table(const Ref<TalvikTabulet::Tabulet>& value) {
-    Guard(u"P_SET Table", [&] { mTable = {value, value != nullptr}; });
+    Guard(u"P_SET Table", [&] { mTable = value; });
 }
 
 Ref<TalvikTabulet::ColumnItem> clsDragColumn::Column() const {
     Ref<TalvikTabulet::ColumnItem> result;
-    Guard(u"P_GET Column", [&] { result = Follow(mColumn); });
+    Guard(u"P_GET Column", [&] { result = mColumn; });
     return result;
 }
 
 void clsDragColumn::Column(const Ref<TalvikTabulet::ColumnItem>& value) {
-    Guard(u"P_SET Column", [&] { mColumn = {value, value != nullptr}; });
+    Guard(u"P_SET Column", [&] { mColumn = value; });
 }
 
 Ref<TalvikZandorLib::ZDTable> clsDragColumn::ZDTable() const {
@@ -68,8 +61,8 @@ void clsDragColumn::ZDColumn(const Ref<TalvikZandorLib::ZDColumn>& value) {
 
 void clsDragColumn::Class_Terminate() {
     Guard(u"Class_Terminate", [&] {
-        mTable = {};
-        mColumn = {};
+        mTable = nullptr;
+        mColumn = nullptr;
         mZDTable = nullptr;
         mZDColumn = nullptr;
     });

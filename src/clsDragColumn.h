@@ -5,9 +5,8 @@
 
 namespace TalvikDBxZandor {
 
-/// One dragged or copied column. The model objects are held; the table list and its entry are only
-/// referred to, so that a record never keeps the element of a removed table alive: asking for one
-/// that has gone is reported as error 340 and yields nothing.
+/// One dragged or copied column. It holds its four objects until it ends, whatever became of the
+/// table: a table list that has been unloaded, and its entries, still say their texts.
 class clsDragColumn {
 public:
     static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.clsDragColumn";
@@ -29,23 +28,14 @@ public:
     void ZDColumn(const platform::Ref<TalvikZandorLib::ZDColumn>& value);
 
 private:
-    /// A reference to a part of a control array's element.
-    template <class T>
-    struct Loose {
-        std::weak_ptr<T> target;
-        bool set = false;
-    };
-
     template <class Body>
     void Guard(platform::StringView procedure, Body&& body) const;
-    template <class T>
-    platform::Ref<T> Follow(const Loose<T>& reference) const;
     void Class_Terminate();
 
     platform::MessageBoxes& mBoxes;
     std::int16_t mTableIndex = 0;
-    Loose<TalvikTabulet::Tabulet> mTable;
-    Loose<TalvikTabulet::ColumnItem> mColumn;
+    platform::Ref<TalvikTabulet::Tabulet> mTable;
+    platform::Ref<TalvikTabulet::ColumnItem> mColumn;
     platform::Ref<TalvikZandorLib::ZDTable> mZDTable;
     platform::Ref<TalvikZandorLib::ZDColumn> mZDColumn;
 };

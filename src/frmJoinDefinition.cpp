@@ -18,38 +18,40 @@ std::unique_ptr<platform::TextBox> textBox(platform::Toolkit& toolkit, platform:
 
 } // namespace
 
-frmJoinDefinition::frmJoinDefinition(platform::Toolkit& toolkit, bool debug)
-    : form(toolkit.makeDialog({.Name = u"frmJoinDefinition", .Caption = u"Join Definition"},
-                              {.Close = [this] { cmdCancel_Click(); }})),
-      lblLeftTable(label(toolkit, form.get(), u"lblLeftTable", u"Left Table:")),
-      txtLeftTable(textBox(toolkit, form.get(), u"txtLeftTable")),
-      lblLeftColumn(label(toolkit, form.get(), u"lblLeftColumn", u"Left Column:")),
-      txtLeftColumn(textBox(toolkit, form.get(), u"txtLeftColumn")),
-      lblRightTable(label(toolkit, form.get(), u"lblRightTable", u"Right Table:")),
-      txtRightTable(textBox(toolkit, form.get(), u"txtRightTable")),
-      lblRightColumn(label(toolkit, form.get(), u"lblRightColumn", u"Right Column:")),
-      txtRightColumn(textBox(toolkit, form.get(), u"txtRightColumn")),
-      lblJoinType(label(toolkit, form.get(), u"lblJoinType", u"Join Type")),
-      cboJoinType(toolkit.makeComboBox({.Name = u"cboJoinType", .Container = form.get()},
-                                       {u"Normal", u"Left Outer", u"Right Outer", u"Both Outer"},
-                                       {})),
+frmJoinDefinition::frmJoinDefinition(Life& life, platform::Toolkit& toolkit, bool debug)
+    : form(life, toolkit.makeDialog({.Name = u"frmJoinDefinition", .Caption = u"Join Definition"},
+                                    {.Close = [this] { cmdCancel_Click(); }})),
+      lblLeftTable(life, label(toolkit, form.get(), u"lblLeftTable", u"Left Table:")),
+      txtLeftTable(life, textBox(toolkit, form.get(), u"txtLeftTable")),
+      lblLeftColumn(life, label(toolkit, form.get(), u"lblLeftColumn", u"Left Column:")),
+      txtLeftColumn(life, textBox(toolkit, form.get(), u"txtLeftColumn")),
+      lblRightTable(life, label(toolkit, form.get(), u"lblRightTable", u"Right Table:")),
+      txtRightTable(life, textBox(toolkit, form.get(), u"txtRightTable")),
+      lblRightColumn(life, label(toolkit, form.get(), u"lblRightColumn", u"Right Column:")),
+      txtRightColumn(life, textBox(toolkit, form.get(), u"txtRightColumn")),
+      lblJoinType(life, label(toolkit, form.get(), u"lblJoinType", u"Join Type")),
+      cboJoinType(life, toolkit.makeComboBox(
+                            {.Name = u"cboJoinType", .Container = form.get()},
+                            {u"Normal", u"Left Outer", u"Right Outer", u"Both Outer"}, {})),
       lblJoinCompareOperator(
-          label(toolkit, form.get(), u"lblJoinCompareOperator", u"Join Compare Operator")),
-      cboJoinCompareOperator(toolkit.makeComboBox(
-          {.Name = u"cboJoinCompareOperator", .Container = form.get()}, {}, {})),
-      cmdOk(
-          toolkit.makeCommandButton({.Name = u"cmdOk", .Caption = u"&Ok", .Container = form.get()},
-                                    {.Click = [this] { cmdOk_Click(); }, .GotFocus = {}})),
-      cmdCancel(toolkit.makeCommandButton(
-          {.Name = u"cmdCancel", .Caption = u"&Cancel", .Container = form.get()},
-          {.Click = [this] { cmdCancel_Click(); }, .GotFocus = {}})),
-      mToolkit(toolkit), mDebug(debug) {
+          life, label(toolkit, form.get(), u"lblJoinCompareOperator", u"Join Compare Operator")),
+      cboJoinCompareOperator(
+          life, toolkit.makeComboBox({.Name = u"cboJoinCompareOperator", .Container = form.get()},
+                                     {}, {})),
+      cmdOk(life, toolkit.makeCommandButton(
+                      {.Name = u"cmdOk", .Caption = u"&Ok", .Container = form.get()},
+                      {.Click = [this] { cmdOk_Click(); }, .GotFocus = {}})),
+      cmdCancel(life, toolkit.makeCommandButton(
+                          {.Name = u"cmdCancel", .Caption = u"&Cancel", .Container = form.get()},
+                          {.Click = [this] { cmdCancel_Click(); }, .GotFocus = {}})),
+      mLife(life), mDebug(debug) {
     Form_Initialize();
 }
 
 template <class Body>
 void frmJoinDefinition::Guard(StringView procedure, Body&& body) const {
-    basZandor::Guard(mToolkit, ModuleName, procedure, std::forward<Body>(body));
+    if (mLife.ended()) return;
+    basZandor::Guard(mLife, ModuleName, procedure, std::forward<Body>(body));
 }
 
 void frmJoinDefinition::Form_Initialize() {
@@ -57,27 +59,29 @@ void frmJoinDefinition::Form_Initialize() {
 }
 
 clsJoinLine& frmJoinDefinition::SavedLine() {
-    if (!mSavedLine) mSavedLine = platform::makeRef<clsJoinLine>(mToolkit);
+    if (!mSavedLine) mSavedLine = platform::makeRef<clsJoinLine>(mLife);
     return *mSavedLine;
 }
 
-void frmJoinDefinition::ShowName(platform::TextBox& box, StringView labelText,
+void frmJoinDefinition::ShowName(const Part<platform::TextBox>& box, StringView labelText,
                                  const platform::String& name) {
     if (mDebug)
-        basZandor::DebugMessage(mToolkit, platform::String(labelText) + name, ModuleName,
+        basZandor::DebugMessage(mLife, platform::String(labelText) + name, ModuleName,
                                 u"P_SET Join");
-    box.Text(name);
+    box->Text(name);
 }
 
 void frmJoinDefinition::Join(const platform::Ref<TalvikZandorLib::ZDJoin>& value) {
     Guard(u"P_SET Join", [&] {
-        mJoin = value;
-        ShowName(*txtLeftTable, u"Left Table Name: ", mJoin->LeftTable()->Name());
-        ShowName(*txtLeftColumn, u"Left Column Name: ", mJoin->LeftColumn()->Name());
-        ShowName(*txtRightTable, u"Right Table Name: ", mJoin->RightTable()->Name());
-        ShowName(*txtRightColumn, u"Right Column Name: ", mJoin->RightColumn()->Name());
-        cboJoinType->ListIndex(mJoin->JoinType());
-        cboJoinCompareOperator->ListIndex(mJoin->CompareOperator());
+        mJoin = hold(mLife, value);
+        ShowName(txtLeftTable, u"Left Table Name: ", hold(mLife, mJoin->LeftTable())->Name());
+        ShowName(txtLeftColumn, u"Left Column Name: ", hold(mLife, mJoin->LeftColumn())->Name());
+        ShowName(txtRightTable, u"Right Table Name: ", hold(mLife, mJoin->RightTable())->Name());
+        ShowName(txtRightColumn, u"Right Column Name: ", hold(mLife, mJoin->RightColumn())->Name());
+        const std::int16_t joinType = mJoin->JoinType();
+        cboJoinType->ListIndex(joinType);
+        const std::int16_t compareOperator = mJoin->CompareOperator();
+        cboJoinCompareOperator->ListIndex(compareOperator);
     });
 }
 

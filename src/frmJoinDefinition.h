@@ -2,6 +2,7 @@
 
 #include "basZandor.h"
 #include "clsJoinLine.h"
+#include "control/Reached.h"
 #include "platform/TalvikZandorLib.h"
 
 namespace TalvikDBxZandor {
@@ -14,8 +15,9 @@ class frmJoinDefinition {
 public:
     static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.frmJoinDefinition";
 
-    /// `debug`: whether the names set through Join are shown in debug boxes first.
-    frmJoinDefinition(platform::Toolkit& toolkit, bool debug);
+    /// `debug`: whether the names set through Join are shown in debug boxes first. The life is that
+    /// of the control that opens the dialog: once it has ended, the dialog does nothing more.
+    frmJoinDefinition(Life& life, platform::Toolkit& toolkit, bool debug);
 
     /// Shows a join. A code beyond the end of its list is reported, and what was filled before it
     /// stays.
@@ -29,34 +31,35 @@ public:
     void JoinModifyDisabled(std::int16_t value);
 
     // The control dresses and fills these before the dialog is shown.
-    std::unique_ptr<platform::Dialog> form;
-    std::unique_ptr<platform::Label> lblLeftTable;
-    std::unique_ptr<platform::TextBox> txtLeftTable;
-    std::unique_ptr<platform::Label> lblLeftColumn;
-    std::unique_ptr<platform::TextBox> txtLeftColumn;
-    std::unique_ptr<platform::Label> lblRightTable;
-    std::unique_ptr<platform::TextBox> txtRightTable;
-    std::unique_ptr<platform::Label> lblRightColumn;
-    std::unique_ptr<platform::TextBox> txtRightColumn;
-    std::unique_ptr<platform::Label> lblJoinType;
-    std::unique_ptr<platform::ComboBox> cboJoinType;
-    std::unique_ptr<platform::Label> lblJoinCompareOperator;
-    std::unique_ptr<platform::ComboBox> cboJoinCompareOperator;
-    std::unique_ptr<platform::CommandButton> cmdOk;
-    std::unique_ptr<platform::CommandButton> cmdCancel;
+    Part<platform::Dialog> form;
+    Part<platform::Label> lblLeftTable;
+    Part<platform::TextBox> txtLeftTable;
+    Part<platform::Label> lblLeftColumn;
+    Part<platform::TextBox> txtLeftColumn;
+    Part<platform::Label> lblRightTable;
+    Part<platform::TextBox> txtRightTable;
+    Part<platform::Label> lblRightColumn;
+    Part<platform::TextBox> txtRightColumn;
+    Part<platform::Label> lblJoinType;
+    Part<platform::ComboBox> cboJoinType;
+    Part<platform::Label> lblJoinCompareOperator;
+    Part<platform::ComboBox> cboJoinCompareOperator;
+    Part<platform::CommandButton> cmdOk;
+    Part<platform::CommandButton> cmdCancel;
 
 private:
     template <class Body>
     void Guard(platform::StringView procedure, Body&& body) const;
     void Form_Initialize();
     clsJoinLine& SavedLine();
-    void ShowName(platform::TextBox& box, platform::StringView label, const platform::String& name);
+    void ShowName(const Part<platform::TextBox>& box, platform::StringView label,
+                  const platform::String& name);
     void cmdOk_Click();
     void cmdCancel_Click();
 
-    platform::Toolkit& mToolkit;
+    Life& mLife;
     const bool mDebug;
-    platform::Ref<TalvikZandorLib::ZDJoin> mJoin;
+    Held<TalvikZandorLib::ZDJoin> mJoin;
     platform::Ref<clsJoinLine> mJoinLine;
     platform::Ref<clsJoinLine> mSavedLine;
     bool mJoinIsModified = false;

@@ -24,9 +24,11 @@ void Comforts::detach() {
 bool Comforts::act(platform::StringView procedure, const std::function<bool(Door&)>& body) {
     // Held, because what the body tells the host may end the control.
     const std::shared_ptr<Door> door = mDoor;
-    if (!door) return false;
+    if (!door || !door->isOpen()) return false;
+    TalvikDBxZandor::Life& life = door->life();
+    const TalvikDBxZandor::Life::Procedure running(life);
     bool dealtWith = true;
-    TalvikDBxZandor::basZandor::Guard(mToolkit, ModuleName, procedure,
+    TalvikDBxZandor::basZandor::Guard(life, ModuleName, procedure,
                                       [&] { dealtWith = body(*door); });
     return dealtWith;
 }

@@ -28,36 +28,36 @@ std::int32_t Door::columnWith(std::int32_t keyNumber, std::int32_t first) const 
 
 platform::Ref<TalvikZandorLib::ZDColumnDefinition> Door::definitionOf(std::int32_t column) {
     try {
-        return mControl->DefinitionOf(column);
+        return control().DefinitionOf(column);
     } catch (const platform::RuntimeError&) {
         return {};
     }
 }
 
 void Door::drop(std::int16_t table, std::int32_t entry, std::int32_t column) {
-    const auto element = mControl->lstTable(table);
+    const auto element = control().lstTable(table);
     const auto item = element->ColumnItems().Item(entry);
-    mControl->InsertRecords({mControl->DragRecord(table, element, item)}, column);
-    if (isOpen()) mControl->mEvents.Raise(Event::Activate, {});
+    control().InsertRecords({control().DragRecord(table, element, item)}, column);
+    control().Raise(Event::Activate);
 }
 
 void Door::goTo(std::int32_t row, std::int32_t column) {
-    mControl->sprColumn->Row(row);
-    mControl->sprColumn->Col(column);
+    control().sprColumn->Row(row);
+    control().sprColumn->Col(column);
 }
 
 Editor Door::editor() const {
-    if (mControl->fraValue->Visible()) return Editor::text;
-    if (mControl->fraSortOrder->Visible()) return Editor::sortOrder;
-    if (mControl->fraVisibility->Visible()) return Editor::visibility;
+    if (control().fraValue->Visible()) return Editor::text;
+    if (control().fraSortOrder->Visible()) return Editor::sortOrder;
+    if (control().fraVisibility->Visible()) return Editor::visibility;
     return Editor::none;
 }
 
 platform::String Door::editorValue() const {
     switch (editor()) {
-    case Editor::text: return mControl->txtValue->Text();
-    case Editor::sortOrder: return platform::decimal(mControl->cobSortOrder->ListIndex());
-    case Editor::visibility: return platform::decimal(mControl->cobVisibility->ListIndex());
+    case Editor::text: return control().txtValue->Text();
+    case Editor::sortOrder: return platform::decimal(control().cobSortOrder->ListIndex());
+    case Editor::visibility: return platform::decimal(control().cobVisibility->ListIndex());
     case Editor::none: break;
     }
     return {};
@@ -78,9 +78,9 @@ std::optional<platform::String> Door::storedValue(std::int32_t row, std::int32_t
 
 void Door::set(Editor editor) {
     switch (editor) {
-    case Editor::text: return mControl->cmdSetTextValue_Click();
-    case Editor::sortOrder: return mControl->cmdSetSortOrder_Click();
-    case Editor::visibility: return mControl->cmdSetVisibility_Click();
+    case Editor::text: return control().cmdSetTextValue_Click();
+    case Editor::sortOrder: return control().cmdSetSortOrder_Click();
+    case Editor::visibility: return control().cmdSetVisibility_Click();
     case Editor::none: break;
     }
 }

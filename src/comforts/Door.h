@@ -18,8 +18,9 @@ inline constexpr std::int32_t visible = 3;
 
 /// The way from the comforts into the control: all of its procedures that they act by, and no more.
 ///
-/// Its members throw what the control's parts and the host's model throw. Whoever calls one that
-/// tells the host something asks `isOpen` before the next one, for the host may end the control.
+/// Its members throw what the control's parts and the host's model throw, and end the procedure at
+/// hand in quiet once the control has ended: `act` is a procedure of the control like any other,
+/// and the rules that are written at `Life` are its rules.
 class Door {
 public:
     using String = platform::String;
@@ -32,14 +33,16 @@ public:
     /// The control stays as it is; nobody listens to it any more.
     ~Door() { shut(); }
 
-    void listen(TalvikDBxZandor::Hooks hooks) { mControl->mHooks = std::move(hooks); }
+    void listen(TalvikDBxZandor::Hooks hooks) { control().mHooks = std::move(hooks); }
     void shut();
-    bool isOpen() const { return mControl != nullptr; }
+    bool isOpen() const { return mControl && !mControl->mLife.ended(); }
+
+    TalvikDBxZandor::Life& life() const { return control().mLife; }
 
     /// Whether the grid is on the control at all.
-    bool hasGrid() const { return !mControl->mOnlyJoin; }
-    const MSFlexGridLib::MSFlexGrid& grid() const { return *mControl->sprColumn; }
-    Ref<TalvikZandorLib::Zandor> model() { return mControl->Model(); }
+    bool hasGrid() const { return !control().mOnlyJoin; }
+    const MSFlexGridLib::MSFlexGrid& grid() const { return *control().sprColumn; }
+    Ref<TalvikZandorLib::Zandor> model() { return control().Model(); }
 
     // Columns of the grid
     /// The last one with a field in it; 0 when there is none.
@@ -55,23 +58,28 @@ public:
 
     // The current cell
     void goTo(std::int32_t row, std::int32_t column);
-    void showCurrentCell() { mControl->sprColumn->EnsureVisible(); }
-    void focusGrid() { mControl->sprColumn->SetFocus(); }
+    void showCurrentCell() { control().sprColumn->EnsureVisible(); }
+    void focusGrid() { control().sprColumn->SetFocus(); }
 
     // Editors
     Editor editor() const;
-    void openEditor() { mControl->EditCell(); }
-    void closeEditors() { mControl->MakeGetValueFieldsInvisible(); }
+    void openEditor() { control().EditCell(); }
+    void closeEditors() { control().MakeGetValueFieldsInvisible(); }
     /// What stands in the open editor: its text, or the number of the item chosen.
     String editorValue() const;
     /// The same of what the model holds for a cell; nothing where the column has no definition.
     std::optional<String> storedValue(std::int32_t row, std::int32_t column);
-    void type(const String& text) { mControl->txtValue->Text(text); }
-    void chooseVisibility(bool visible) { mControl->cobVisibility->ListIndex(visible ? 0 : 1); }
+    void type(const String& text) { control().txtValue->Text(text); }
+    void chooseVisibility(bool visible) { control().cobVisibility->ListIndex(visible ? 0 : 1); }
     /// Presses the "&Set" of an editor, for the current cell.
     void set(Editor editor);
 
 private:
+    TalvikDBxZandor::Zandor& control() const {
+        TalvikDBxZandor::require(isOpen());
+        return *mControl;
+    }
+
     TalvikDBxZandor::Zandor* mControl;
 };
 

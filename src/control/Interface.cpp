@@ -12,6 +12,21 @@ const T& valueOf(const Variant& value) {
     throw platform::errors::typeMismatch();
 }
 
+/// The model in a value. Nothing of whatever type is no model, which the control has words for.
+platform::Ref<TalvikZandorLib::Zandor> modelOf(const Variant& value) {
+    if (const auto* object = std::get_if<std::shared_ptr<void>>(&value); object && !*object)
+        return {};
+    return valueOf<platform::Ref<TalvikZandorLib::Zandor>>(value);
+}
+
+using Arguments = std::span<const Variant>;
+
+/// The text at a place among exactly so many arguments.
+const platform::String& textAt(Arguments arguments, std::size_t place, std::size_t count) {
+    if (arguments.size() != count) throw platform::errors::wrongNumberOfArguments();
+    return valueOf<platform::String>(arguments[place]);
+}
+
 template <class T>
 constexpr Type typeOf() {
     if constexpr (std::is_same_v<T, bool>)
@@ -51,7 +66,10 @@ using Integer = std::int16_t;
            [](Zandor& zandor, const Variant& value) { zandor.name(valueOf<type>(value)); }}
 #define GETTER(id, name, type, getterReport) \
     Member{id, u"" #name, Kind::property, Type::type, Setter::none, getterReport, {}, \
-           [](Zandor& zandor) -> Variant { return std::shared_ptr<void>(zandor.name()); }}
+           [](Zandor& zandor) -> Variant { return zandor.name(); }}
+#define METHOD(id, name, parameters, ...) \
+    Member{id, u"" #name, Kind::method, Type::none, Setter::none, {}, {}, nullptr, nullptr, parameters, \
+           [](Zandor& zandor, Arguments arguments) __VA_ARGS__}
 
 const Member table[] = {
     field<&Zandor::LNGJoinForm>(0x4003000E, u"LNGJoinForm"),
@@ -96,8 +114,8 @@ const Member table[] = {
     ACCESSORS(0x68030016, VisibleFrameLeft, Integer, byValue, u"P_GET VisibleFrameLeft", u"P_LET VisibleFrameLeft"),
     ACCESSORS(0x68030015, VisibleFrameTop, Integer, byReference, u"P_GET VisibleFrameTop", u"P_LET VisibleFrameTop"),
     Member{0x68030014, u"Zandor", Kind::property, Type::Zandor, Setter::object, u"P_GET Zandor", u"P_SET Zandor",
-           [](Zandor& z) -> Variant { return std::shared_ptr<void>(z.P_GET_Zandor()); },
-           [](Zandor& z, const Variant& v) { z.P_SET_Zandor(std::static_pointer_cast<TalvikZandorLib::Zandor>(valueOf<std::shared_ptr<void>>(v))); }},
+           [](Zandor& zandor) -> Variant { return zandor.P_GET_Zandor(); },
+           [](Zandor& zandor, const Variant& value) { zandor.P_SET_Zandor(modelOf(value)); }},
     ACCESSORS(0x68030013, HorizMaxScrollPos, Integer, byValue, u"P_GET HorizMaxScrollPos", u"P_LET HorizMaxScrollPos"),
     ACCESSORS(0x68030012, VertMaxScrollPos, Integer, byValue, u"P_GET VertMaxScrollPos", u"P_LET VertMaxScrollPos"),
     ACCESSORS(0x68030011, HorizontalScrollbarPos, Integer, byValue, u"P_GET HorizontalScrollbarPos", u"P_LET HorizontalScrollbarPos"),
@@ -118,13 +136,14 @@ const Member table[] = {
     GETTER(0x68030002, lastjoin, ZDJoin, u"P_GET lastjoin"),
     GETTER(0x68030001, activetable, ZDTable, u"P_GET activetable"),
     GETTER(0x68030000, ActiveColumn, ZDColumn, u"P_GET activecolumn"),
-    Member{0x6003005F, u"Terminate", Kind::method, Type::none},
-    Member{0x60030061, u"SelectColumnNames", Kind::method, Type::none, Setter::none, {}, {}, nullptr, nullptr, selectColumnNames},
-    Member{0x60030062, u"SetCurrentTable", Kind::method, Type::none, Setter::none, {}, {}, nullptr, nullptr, setCurrentTable},
+    METHOD(0x6003005F, Terminate, {}, { if (!arguments.empty()) throw platform::errors::wrongNumberOfArguments(); zandor.Terminate(); }),
+    METHOD(0x60030061, SelectColumnNames, selectColumnNames, { zandor.SelectColumnNames(textAt(arguments, 0, 2), textAt(arguments, 1, 2)); }),
+    METHOD(0x60030062, SetCurrentTable, setCurrentTable, { zandor.SetCurrentTable(textAt(arguments, 0, 1)); }),
 };
 
 #undef ACCESSORS
 #undef GETTER
+#undef METHOD
 // clang-format on
 
 constexpr EventMember eventTable[] = {

@@ -32,6 +32,9 @@ struct Member {
     /// Throws error 13 when the value is not of the member's type, and sets nothing then.
     void (*set)(Zandor&, const platform::Variant&) = nullptr;
     std::span<const Parameter> parameters = {}; ///< of a method; all are strings
+    /// Calls a method. Throws error 450 for another number of arguments than it has parameters,
+    /// 13 when one is no string, and calls nothing then.
+    void (*invoke)(Zandor&, std::span<const platform::Variant> arguments) = nullptr;
 };
 
 enum class Carries { nothing, definition, join, textAndNumber };

@@ -7,6 +7,8 @@
 #include "control/ControlArray.h"
 #include "control/Events.h"
 #include "control/Hooks.h"
+#include "control/ModelList.h"
+#include "control/Reached.h"
 #include "platform/KeyedCollection.h"
 #include "platform/TalvikZandorLib.h"
 #include "platform/Toolkit.h"
@@ -24,6 +26,12 @@ class frmJoinDefinition;
 /// No procedure throws. A failure is reported in a message box under the procedure's name; what
 /// was done before it stays done, and a getter returns its result as it stood. All coordinates are
 /// twips. The toolkit, the library and the event sink outlive the control.
+///
+/// A host may do anything at any time, in a message box or an event as well as in a call of its
+/// model; what it bound last is what is shown. A front end whose host may destroy the control then,
+/// too, keeps toolkit, events and control in one house, and hands the control a weak reference to
+/// it: it calls `End`, lets go of the house, and the house stays until the last procedure has
+/// returned. Without such a keeper the control is destroyed while no procedure runs.
 class Zandor {
 public:
     static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.Zandor";
@@ -32,15 +40,23 @@ public:
     template <class T>
     using Ref = platform::Ref<T>;
 
-    Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, ZandorEvents& events);
+    Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, ZandorEvents& events,
+           std::weak_ptr<void> keeper = {});
     Zandor(const Zandor&) = delete;
     Zandor& operator=(const Zandor&) = delete;
+    /// Ends the control, unless `End` has.
     ~Zandor();
 
-    // What a front end notifies; UserControl_Initialize and UserControl_Terminate run within
-    // construction and destruction.
+    // What a front end notifies; UserControl_Initialize runs within construction.
     void UserControl_Paint();
     void UserControl_Resize();
+
+    /// Runs UserControl_Terminate, the first time. From then on no procedure does anything, and
+    /// those that run, further down the stack, return without another call of toolkit, host or
+    /// model.
+    void End();
+    /// Whether a procedure runs: what it stands on must stay until it has returned.
+    bool Busy() const { return mLife.busy(); }
 
     // Texts and flags: plain values, read where they take effect.
     String LNGJoinForm = u"Join Defintion";
@@ -174,7 +190,18 @@ private:
     // Errors and traces
     template <class Body>
     void Guard(platform::StringView procedure, Body&& body) const noexcept {
-        basZandor::Guard(mToolkit, ModuleName, procedure, std::forward<Body>(body));
+        if (mLife.ended()) return;
+        const Life::Procedure running(mLife);
+        basZandor::Guard(mLife, ModuleName, procedure, std::forward<Body>(body));
+    }
+    void Raise(Event event, const EventArguments& arguments = {});
+    template <class T>
+    Held<T> Hold(const Ref<T>& reference) const {
+        return hold(mLife, reference);
+    }
+    template <class Owner, class Collection>
+    auto List(const Held<Owner>& owner, Collection& (Owner::*collection)()) const {
+        return ModelList<Owner, Collection>(mLife, owner, collection);
     }
     template <class T>
     T Get(platform::StringView procedure, const T& member) const {
@@ -203,20 +230,29 @@ private:
     void MakeMenu();
 
     // Binding
-    Ref<TalvikZandorLib::Zandor> Model();
+    Held<TalvikZandorLib::Zandor> Model();
+    auto Tables() { return List(Model(), &TalvikZandorLib::Zandor::Tables); }
+    auto Joins() { return List(Model(), &TalvikZandorLib::Zandor::Joins); }
+    auto Definitions() { return List(Model(), &TalvikZandorLib::Zandor::ColumnDefinitions); }
+    void TakeModel(const Ref<TalvikZandorLib::Zandor>& model);
     void SetZandor();
     bool ShowTables();
     void ShowJoins();
     void ShowDefinitions();
-    void ShowDefinition(std::int32_t column, TalvikZandorLib::ZDColumnDefinition& definition);
+    void ShowDefinition(std::int32_t column,
+                        const Held<TalvikZandorLib::ZDColumnDefinition>& definition);
     void TieBoundColumns();
     bool RemoveAllTables();
     void ShowMenuEntries();
-    void MakeCurrent(Tabulet& table);
+    void MakeCurrent(const Held<Tabulet>& table);
+    void SelectColumn(const Held<Tabulet>& table, const String& name);
 
     // Canvas: tables
-    void ShowTable(std::int16_t slot, TalvikZandorLib::ZDTable& table, std::int32_t& cascade);
-    void FillTable(Tabulet& element, TalvikZandorLib::ZDTable& table);
+    bool Shows(std::int16_t slot, const Held<Tabulet>& element) const;
+    bool Shows(const Held<Tabulet>& element) const;
+    Held<Tabulet> ShowTable(std::int16_t slot, const Held<TalvikZandorLib::ZDTable>& table,
+                            std::int32_t& cascade);
+    void FillTable(const Held<Tabulet>& element, const Held<TalvikZandorLib::ZDTable>& table);
     bool FindTable(const String& TableName, Ref<Tabulet>& Table);
     bool FindColumn(const Ref<Tabulet>& Table, const String& ColumnName, Ref<ColumnItem>& Column);
     bool SetSelectedTable(const String& TableName);
@@ -256,7 +292,8 @@ private:
     bool GetDragColumns(std::int16_t Index);
     Ref<clsDragColumn> DragRecord(std::int16_t Index, const Ref<Tabulet>& element,
                                   const Ref<ColumnItem>& entry);
-    ZDTableRef TableOf(std::int16_t Index);
+    Held<TalvikZandorLib::ZDTable> TableOf(const Held<Tabulet>& element);
+    void EmptyDragColumns();
     static bool IsAllColumns(const ColumnItem& entry);
     static Ref<ColumnItem> FirstSelected(Tabulet& table);
 
@@ -272,16 +309,20 @@ private:
                      const Ref<ColumnItem>& leftColumn, const Ref<Tabulet>& rightTable,
                      const Ref<ColumnItem>& rightColumn, std::int16_t joinType,
                      std::int16_t compareOperator);
-    void AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTable,
+    bool AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTable,
                     const ZDColumnRef& leftColumn, const ZDTableRef& rightTable,
                     const ZDColumnRef& rightColumn);
-    bool RemoveJoin(const Ref<clsJoinLine>& record);
+    Ref<clsJoinLine> JoinTo(const clsDragColumn& source, const Held<Tabulet>& table,
+                            const Ref<ColumnItem>& target);
+    bool RemoveJoin(Ref<clsJoinLine> record);
+    bool Draws(const Ref<clsJoinLine>& record) const;
+    static bool HasTag(const clsJoinLine& record);
     void SetLanguageOfJoinDefinition(frmJoinDefinition& dialog);
     void SetEnabledJoinTypes(frmJoinDefinition& dialog);
     void SetEnabledJoinOperators(frmJoinDefinition& dialog);
     void mnuJoinDelete_Click();
     void mnuJoinShowDefinition_Click();
-    Ref<TalvikZandorLib::ZDJoin> ModelJoin(const clsJoinLine& record);
+    Held<TalvikZandorLib::ZDJoin> ModelJoin(const clsJoinLine& record);
 
     // Grid: cells and editors
     void AddNewAndCriterium(const ZDColumnRef& sourceColumn, std::int32_t column);
@@ -290,8 +331,8 @@ private:
     void GetSortOrder(const String& cellText);
     void GetVisibility(const String& cellText);
     void EditCell();
-    void OpenEditor(platform::Frame& frame, platform::CommandButton& set);
-    Ref<TalvikZandorLib::ZDColumnDefinition> DefinitionOf(std::int32_t column);
+    void OpenEditor(const Part<platform::Frame>& frame, const Part<platform::CommandButton>& set);
+    Held<TalvikZandorLib::ZDColumnDefinition> DefinitionOf(std::int32_t column);
     void sprColumn_MouseDown(std::int16_t Button, std::int16_t Shift, float X, float Y);
     void sprColumn_MouseUp(std::int16_t Button, std::int16_t Shift, float X, float Y);
     void sprColumn_Scroll();
@@ -301,7 +342,10 @@ private:
     void cobSortOrder_KeyDown(std::int16_t KeyCode, std::int16_t Shift);
     void cobVisibility_KeyDown(std::int16_t KeyCode, std::int16_t Shift);
     void txtValue_KeyDown(std::int16_t KeyCode, std::int16_t Shift);
-    void SetCell(const String& text, std::int16_t alignment);
+    void SetCell(const String& text, std::int16_t alignment) const;
+    class EditedCell;
+    bool StoreText(const Held<TalvikZandorLib::ZDColumnDefinition>& definition, std::int32_t row,
+                   const String& text);
 
     // Grid: definitions
     void sprColumn_DragDrop(platform::Control* Source, float X, float Y);
@@ -312,8 +356,8 @@ private:
     void mnuTableDefinitionPaste_Click();
     void InsertDragColumns(float X, float Y);
     void InsertRecords(const std::vector<Ref<clsDragColumn>>& records, std::int32_t column);
-    Ref<TalvikZandorLib::OrderedDefinitions> Ordered();
-    Ref<TalvikZandorLib::ZDColumnDefinition> DefinitionBefore(std::int32_t column);
+    Held<TalvikZandorLib::OrderedDefinitions> Ordered();
+    Held<TalvikZandorLib::ZDColumnDefinition> DefinitionBefore(std::int32_t column);
     bool InsertColumnDefinition(const String& fieldName, std::int32_t column);
     bool RemoveColumn(std::int32_t column);
     void FitColumn(std::int32_t column, const String& fieldName);
@@ -324,9 +368,11 @@ private:
     void SwitchSpecialMenusOff();
     void mnuZandor_Click();
 
-    platform::Toolkit& mToolkit;
-    TalvikZandorLib::Library& mLibrary;
-    ZandorEvents& mEvents;
+    mutable Life mLife; ///< first, so that it is there until the last of the others has gone
+    bool mEnding = false;
+    const Given<platform::Toolkit> mToolkit;
+    const Given<TalvikZandorLib::Library> mLibrary;
+    const Given<ZandorEvents> mEvents;
     Hooks mHooks;
 
     std::int16_t mDebugSwitch = 1;
@@ -342,6 +388,7 @@ private:
     std::vector<Ref<clsDragColumn>> mDragColumns;
     std::int16_t mDragTableIndex = 0;
     std::int16_t mActiveTableIndex = 0;
+    std::int32_t mBinding = 0;      ///< which one it is, counted: the last one is what is shown
     std::int32_t mBoundColumns = 0; ///< grid columns filled by the last binding
     Ref<clsJoinLine> mLastJoin;
     float mPopupX = 0;
@@ -350,33 +397,33 @@ private:
 
     // Constituent controls, in stacking order
     const TalvikTabulet::TabuletEvents mTableEvents;
-    std::unique_ptr<platform::Frame> fraTable;
+    Part<platform::Frame> fraTable;
     ControlArray<platform::Line> linJoin;
     ControlArray<platform::Shape> shpJoin;
     ControlArray<Tabulet> lstTable;
-    std::unique_ptr<MSFlexGridLib::MSFlexGrid> sprColumn;
-    std::unique_ptr<platform::ScrollBar> hsbTable;
-    std::unique_ptr<platform::ScrollBar> vsbTable;
-    std::unique_ptr<platform::CommandButton> cmdHome;
-    std::unique_ptr<platform::Frame> fraSortOrder, fraSortOrder2;
-    std::unique_ptr<platform::ComboBox> cobSortOrder;
-    std::unique_ptr<platform::CommandButton> cmdSetSortOrder;
-    std::unique_ptr<platform::Frame> fraVisibility, fraVisibility2;
-    std::unique_ptr<platform::ComboBox> cobVisibility;
-    std::unique_ptr<platform::CommandButton> cmdSetVisibility;
-    std::unique_ptr<platform::Frame> fraValue, fraValue2;
-    std::unique_ptr<platform::TextBox> txtValue;
-    std::unique_ptr<platform::CommandButton> cmdSetTextValue;
-    std::unique_ptr<platform::PopupMenu> mnuZandor;
-    std::unique_ptr<platform::MenuEntry> mnuJoinShowDefinition;
-    std::unique_ptr<platform::MenuEntry> mnuJoinDelete;
-    std::unique_ptr<platform::MenuEntry> mnuJoinSep;
-    std::unique_ptr<platform::MenuEntry> mnuTableDefinitionCopy;
-    std::unique_ptr<platform::MenuEntry> mnuTableDefinitionPaste;
-    std::unique_ptr<platform::MenuEntry> mnuTableDefinitionDelete;
-    std::unique_ptr<platform::MenuEntry> mnuTableDefinitionSep;
-    std::unique_ptr<platform::MenuEntry> mnuColumnDefinitionPaste;
-    std::unique_ptr<platform::MenuEntry> mnuColumnDefinitionDelete;
+    Part<MSFlexGridLib::MSFlexGrid> sprColumn;
+    Part<platform::ScrollBar> hsbTable;
+    Part<platform::ScrollBar> vsbTable;
+    Part<platform::CommandButton> cmdHome;
+    Part<platform::Frame> fraSortOrder, fraSortOrder2;
+    Part<platform::ComboBox> cobSortOrder;
+    Part<platform::CommandButton> cmdSetSortOrder;
+    Part<platform::Frame> fraVisibility, fraVisibility2;
+    Part<platform::ComboBox> cobVisibility;
+    Part<platform::CommandButton> cmdSetVisibility;
+    Part<platform::Frame> fraValue, fraValue2;
+    Part<platform::TextBox> txtValue;
+    Part<platform::CommandButton> cmdSetTextValue;
+    Part<platform::PopupMenu> mnuZandor;
+    Part<platform::MenuEntry> mnuJoinShowDefinition;
+    Part<platform::MenuEntry> mnuJoinDelete;
+    Part<platform::MenuEntry> mnuJoinSep;
+    Part<platform::MenuEntry> mnuTableDefinitionCopy;
+    Part<platform::MenuEntry> mnuTableDefinitionPaste;
+    Part<platform::MenuEntry> mnuTableDefinitionDelete;
+    Part<platform::MenuEntry> mnuTableDefinitionSep;
+    Part<platform::MenuEntry> mnuColumnDefinitionPaste;
+    Part<platform::MenuEntry> mnuColumnDefinitionDelete;
 };
 
 } // namespace TalvikDBxZandor

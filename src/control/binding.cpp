@@ -2,15 +2,17 @@
 
 #include "control/KeyNumber.h"
 
+#include <algorithm>
+
 namespace TalvikDBxZandor {
 
-using platform::Each;
-
-/// The model held; an empty one is made where none is. A walk over it keeps the reference, because
-/// a host asked for a table may bind another model.
-platform::Ref<TalvikZandorLib::Zandor> Zandor::Model() {
-    if (!mModel) mModel = mLibrary.NewZandor();
-    return mModel;
+/// The model held; an empty one is made where none is.
+Held<TalvikZandorLib::Zandor> Zandor::Model() {
+    if (!mModel) {
+        const Ref<TalvikZandorLib::Zandor> made = mLibrary->NewZandor();
+        if (!mModel) mModel = made;
+    }
+    return Hold(mModel);
 }
 
 platform::Ref<TalvikZandorLib::Zandor> Zandor::P_GET_Zandor() {
@@ -19,22 +21,33 @@ platform::Ref<TalvikZandorLib::Zandor> Zandor::P_GET_Zandor() {
     return result;
 }
 
-void Zandor::P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& model) {
-    Guard(u"P_SET Zandor", [&] {
+void Zandor::P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& given) {
+    Guard(u"P_SET Zandor", [this, model = given] {
         if (!model) {
-            mEvents.Raise(Event::Error, {.Text = u"New Zanodr is nothing!", .Number = -1});
+            Raise(Event::Error, {.Text = u"New Zanodr is nothing!", .Number = -1});
             return;
         }
+        const std::int32_t binding = ++mBinding;
         RemoveAllTables();
-        mModel = model;
-        lstTable(0)->Font(mToolkit.AmbientFont());
-        sprColumn->Font(mToolkit.AmbientFont());
+        require(binding == mBinding);
+        TakeModel(model);
+        lstTable(0)->Font(mToolkit->AmbientFont());
+        sprColumn->Font(mToolkit->AmbientFont());
         SetZandor();
+        require(binding == mBinding);
         OrganizeTables();
         ShowMenuEntries();
+        require(binding == mBinding);
         // Last, so that a model whose keys cannot be read is bound all the same.
         TieBoundColumns();
     });
+}
+
+/// No grid column keeps a number that would name a stranger among the new model's definitions.
+void Zandor::TakeModel(const Ref<TalvikZandorLib::Zandor>& model) {
+    mModel = model;
+    for (std::int32_t column = 1; column < sprColumn->Cols(); ++column)
+        sprColumn->ColData(column, 0);
 }
 
 void Zandor::ShowMenuEntries() {
@@ -61,83 +74,109 @@ void Zandor::SetZandor() {
 
 /// False when no slot could be had although one was counted free.
 bool Zandor::ShowTables() {
-    Ref<Tabulet> first;
-    Ref<Tabulet> selected;
+    Held<Tabulet> first;
+    Held<Tabulet> selected;
     std::int32_t cascade = 0;
-    for (const auto model = Model(); const auto& table : Each(model->Tables())) {
+    const std::int32_t binding = mBinding;
+    for (const auto& table : Tables()) {
         if (mTableFreeList->FreeCount() == 0) continue;
         std::int32_t slot = 0;
         if (!mTableFreeList->GetNextFreeIndex(slot)) return false;
         const auto index = static_cast<std::int16_t>(slot);
-        ShowTable(index, *table, cascade);
-        if (!first) first = lstTable(index);
-        if (table->Selected() != 0) selected = lstTable(index);
-        mActiveTableIndex = index;
+        const Held<Tabulet> element = ShowTable(index, table, cascade);
+        require(binding == mBinding);
+        if (!first) first = element;
+        if (table->Selected() != 0) selected = element;
+        require(binding == mBinding);
+        if (Shows(index, element)) mActiveTableIndex = index;
     }
+    require(binding == mBinding);
     if (selected)
         SetCurrentTable(selected->Text());
     else if (first)
         SetCurrentTable(first->Text());
+    require(binding == mBinding);
     return true;
 }
 
 void Zandor::ShowJoins() {
-    for (const auto model = Model(); const auto& join : Each(model->Joins())) {
+    const std::int32_t binding = mBinding;
+    for (const auto& join : Joins()) {
         Ref<Tabulet> leftTable, rightTable;
         Ref<ColumnItem> leftColumn, rightColumn;
-        FindTable(join->LeftTable()->Name(), leftTable);
-        FindColumn(leftTable, join->LeftColumn()->Name(), leftColumn);
-        FindTable(join->RightTable()->Name(), rightTable);
-        FindColumn(rightTable, join->RightColumn()->Name(), rightColumn);
+        FindTable(Hold(join->LeftTable())->Name(), leftTable);
+        FindColumn(leftTable, Hold(join->LeftColumn())->Name(), leftColumn);
+        FindTable(Hold(join->RightTable())->Name(), rightTable);
+        FindColumn(rightTable, Hold(join->RightColumn())->Name(), rightColumn);
+        const std::int16_t joinType = join->JoinType();
+        const std::int16_t compareOperator = join->CompareOperator();
+        require(binding == mBinding);
+        const auto gone = [this](const auto& table) { return table && !Shows(Hold(table)); };
+        if (gone(leftTable) || gone(rightTable)) continue;
         Ref<clsJoinLine> record;
-        DrawNewJoin(record, leftTable, leftColumn, rightTable, rightColumn, join->JoinType(),
-                    join->CompareOperator());
+        DrawNewJoin(record, leftTable, leftColumn, rightTable, rightColumn, joinType,
+                    compareOperator);
+        require(binding == mBinding);
         record->Tag(join->Key());
+        require(binding == mBinding);
     }
 }
 
 void Zandor::ShowDefinitions() {
     std::int32_t column = 1;
-    for (const auto model = Model(); const auto& definition : Each(model->ColumnDefinitions()))
-        ShowDefinition(column++, *definition);
+    for (const auto& definition : Definitions()) ShowDefinition(column++, definition);
 }
 
-void Zandor::ShowDefinition(std::int32_t column, TalvikZandorLib::ZDColumnDefinition& definition) {
-    sprColumn->Col(column);
-    sprColumn->Row(0);
-    const String name = definition.Column()->Name();
+void Zandor::ShowDefinition(std::int32_t column,
+                            const Held<TalvikZandorLib::ZDColumnDefinition>& definition) {
+    const std::int32_t binding = mBinding;
+    const auto goTo = [&](std::int32_t row) {
+        sprColumn->Col(column);
+        sprColumn->Row(row);
+    };
+    // Whatever the host did when it was asked, the answer goes into its own cell.
+    const auto answer = [&](std::int32_t row, const auto& ask) {
+        goTo(row);
+        const auto value = ask();
+        require(binding == mBinding);
+        goTo(row);
+        return value;
+    };
+
+    const String name = answer(0, [&] { return Hold(definition->Column())->Name(); });
     sprColumn->Text(name);
     mBoundColumns = column;
     FitColumn(column, name);
     sprColumn->CellAlignment(MSFlexGridLib::alignCenterCenter);
 
-    sprColumn->Row(1);
-    SetCell(definition.Synonym(), MSFlexGridLib::alignLeftCenter);
+    SetCell(answer(1, [&] { return definition->Synonym(); }), MSFlexGridLib::alignLeftCenter);
 
-    sprColumn->Row(2);
-    const std::int16_t sortOrder = definition.SortOrder();
+    const std::int16_t sortOrder = answer(2, [&] { return definition->SortOrder(); });
     if (sortOrder == 1) sprColumn->Text(u"Ascending");
     if (sortOrder == 2) sprColumn->Text(u"Descending");
     sprColumn->CellAlignment(MSFlexGridLib::alignCenterCenter);
 
     // "Invisible" here and "Not Visible" in the editor mean the same; both texts are settled.
-    sprColumn->Row(3);
-    SetCell(definition.Visible() ? u"Visible" : u"Invisible", MSFlexGridLib::alignCenterCenter);
+    const bool visible = answer(3, [&] { return definition->Visible(); });
+    SetCell(visible ? u"Visible" : u"Invisible", MSFlexGridLib::alignCenterCenter);
 
     std::int32_t row = 4;
-    sprColumn->Row(row);
-    for (const auto& criterium : Each(definition.Criteria())) {
-        SetCell(criterium->Criterium(), MSFlexGridLib::alignLeftCenter);
+    goTo(row);
+    for (const auto& criterium : List(definition, &TalvikZandorLib::ZDColumnDefinition::Criteria)) {
+        SetCell(answer(row, [&] { return criterium->Criterium(); }),
+                MSFlexGridLib::alignLeftCenter);
         if (++row >= sprColumn->Rows()) break;
-        sprColumn->Row(row);
+        goTo(row);
     }
 }
 
 /// Gives each column that the binding filled its definition's key number, so that it can be edited
 /// and deleted like one dropped by the user. A key of another form leaves the column untied.
 void Zandor::TieBoundColumns() {
+    const std::int32_t binding = mBinding;
     for (std::int32_t column = 1; column <= mBoundColumns; ++column) {
-        const String key = Model()->ColumnDefinitions().Item(column)->Key();
+        const String key = Definitions().Item(column)->Key();
+        require(binding == mBinding);
         sprColumn->ColData(column, isKeyOfNumber(key) ? numberOfKey(key) : 0);
     }
 }
@@ -145,10 +184,10 @@ void Zandor::TieBoundColumns() {
 bool Zandor::RemoveAllTables() {
     bool result = false;
     Guard(u"RemoveAllTables", [&] {
-        std::vector<std::int16_t> shown;
-        for (const auto& [index, table] : lstTable)
-            if (index != 0) shown.push_back(index);
-        for (const std::int16_t index : shown) RemoveTable(index);
+        // The host may show others in the slots meanwhile; those stay.
+        const std::vector shown(lstTable.begin(), lstTable.end());
+        for (const auto& [index, table] : shown)
+            if (index != 0 && Shows(index, Hold(table))) RemoveTable(index);
         result = true;
     });
     return result;
@@ -157,68 +196,80 @@ bool Zandor::RemoveAllTables() {
 void Zandor::Terminate() {
     Guard(u"Terminate", [&] {
         Trace(u"Terminate");
+        const std::int32_t binding = ++mBinding;
         RemoveAllTables();
+        require(binding == mBinding);
         TerminateTable(0);
         for (std::int16_t i = 1; i <= lastTableSlot; ++i)
             if (!mTableFreeList->IsFree(i)) TerminateTable(i);
-        mModel = mLibrary.NewZandor();
+        const Ref<TalvikZandorLib::Zandor> empty = mLibrary->NewZandor();
+        require(binding == mBinding);
+        TakeModel(empty);
     });
 }
 
-void Zandor::SetCurrentTable(const String& TabName) {
-    Guard(u"SetCurrentTable", [&] {
+void Zandor::SetCurrentTable(const String& given) {
+    Guard(u"SetCurrentTable", [this, TabName = given] {
         Trace(u"SetCurrentTable");
         Trace(u"Looking for Table: " + TabName);
-        for (const auto& [index, table] : lstTable) {
-            if (table->Text() != TabName) continue;
-            MakeCurrent(*Ref<Tabulet>(table));
-            break;
-        }
+        const auto found = std::find_if(lstTable.begin(), lstTable.end(), [&](const auto& element) {
+            return element.second->Text() == TabName;
+        });
+        if (found != lstTable.end()) MakeCurrent(Hold(found->second));
     });
 }
 
-void Zandor::MakeCurrent(Tabulet& table) {
-    if (table.Visible()) {
-        try {
-            table.SetFocus();
-        } catch (...) {
-            // A control that is not on the screen yet cannot take the focus, and need not.
-        }
-    }
-    table.Activated(true);
-    Trace(u"Table found.");
-    table.Complete();
-    Trace(u"Table refreshed.");
-    SetSelectedTable(table.Tag());
+void Zandor::MakeCurrent(const Held<Tabulet>& table) {
+    const auto trace = [&](platform::StringView text) {
+        Trace(text);
+        require(Shows(table));
+    };
+    // A control that is not on the screen yet cannot take the focus, and need not.
+    if (table->Visible()) quietly([&] { table->SetFocus(); });
+    require(Shows(table));
+    table->Activated(true);
+    trace(u"Table found.");
+    table->Complete();
+    trace(u"Table refreshed.");
+    SetSelectedTable(table->Tag());
 }
 
-void Zandor::SelectColumnNames(const String& TabName, const String& ColName) {
-    Guard(u"SelectColumnNames", [&] {
+void Zandor::SelectColumnNames(const String& givenTable, const String& givenColumn) {
+    Guard(u"SelectColumnNames", [this, TabName = givenTable, ColName = givenColumn] {
         Trace(u"SelectColumnNames");
-        for (const auto& [index, table] : lstTable) {
-            if (table->Text() != TabName) continue;
-            auto& entries = table->ColumnItems();
-            for (std::int32_t n = 1; n <= entries.Count(); ++n) {
-                const auto& entry = entries.Item(n);
-                if (entry->Text() != ColName) {
-                    entry->Selected(false);
-                    entry->Refresh();
-                    continue;
-                }
-                if (mDebugSwitch != 0)
-                    mToolkit.MsgBox(u"Column found., vbSystemModal, FUNCTION_NAME",
-                                    platform::styleOkOnly, String(ModuleName));
-                entry->Selected(true);
-                entry->Refresh();
-                entry->EnsureVisible();
+        const std::int32_t binding = mBinding;
+        const std::vector shown(lstTable.begin(), lstTable.end());
+        for (const auto& [index, element] : shown) {
+            const auto held = Hold(element);
+            if (Shows(index, held) && held->Text() == TabName) SelectColumn(held, ColName);
+        }
+        require(binding == mBinding);
+        for (const auto& table : Tables()) {
+            if (table->Name() != TabName) continue;
+            for (const auto& column : List(table, &TalvikZandorLib::ZDTable::Columns)) {
+                const bool match = column->Name() == ColName;
+                column->Selected(match);
             }
         }
-        for (const auto model = Model(); const auto& table : Each(model->Tables())) {
-            if (table->Name() != TabName) continue;
-            for (const auto& column : Each(table->Columns()))
-                column->Selected(column->Name() == ColName);
-        }
     });
+}
+
+void Zandor::SelectColumn(const Held<Tabulet>& table, const String& name) {
+    for (std::int32_t n = 1; n <= table->ColumnItems().Count(); ++n) {
+        const auto entry = Hold(table->ColumnItems().Item(n));
+        if (entry->Text() != name) {
+            entry->Selected(false);
+            entry->Refresh();
+            continue;
+        }
+        if (mDebugSwitch != 0)
+            mLife.MsgBox(u"Column found., vbSystemModal, FUNCTION_NAME", platform::styleOkOnly,
+                         String(ModuleName));
+        if (!Shows(table)) return;
+        entry->Selected(true);
+        entry->Refresh();
+        entry->EnsureVisible();
+    }
 }
 
 } // namespace TalvikDBxZandor

@@ -19,79 +19,98 @@ constexpr std::int32_t gridCols = 256;
 
 } // namespace
 
-Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, ZandorEvents& events)
-    : mToolkit(toolkit), mLibrary(library), mEvents(events), mTableEvents(TableEvents()),
-      fraTable(toolkit.makeFrame({.Name = u"fraTable", .FontName = arial, .Caption = u"Frame1"},
+Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, ZandorEvents& events,
+               std::weak_ptr<void> keeper)
+    : mLife(toolkit, std::move(keeper)), mToolkit(mLife, &toolkit), mLibrary(mLife, &library),
+      mEvents(mLife, &events), mTableEvents(TableEvents()),
+      fraTable(mLife,
+               toolkit.makeFrame({.Name = u"fraTable", .FontName = arial, .Caption = u"Frame1"},
                                  {.MouseDown = [this](auto... a) { fraTable_MouseDown(a...); },
                                   .MouseUp = [this](auto... a) { fraTable_MouseUp(a...); }})),
-      linJoin([this](std::int16_t index, const platform::Line*) {
-          return mToolkit.makeLine({.Name = u"linJoin", .Container = fraTable.get()}, index);
-      }),
-      shpJoin([this](std::int16_t index, const platform::Shape*) {
-          return mToolkit.makeShape({.Name = u"shpJoin", .Container = fraTable.get()}, index);
-      }),
-      lstTable([this](std::int16_t index, const Tabulet* pattern) {
-          return mToolkit.makeTabulet(
-              {.Name = u"lstTable", .FontName = sansSerif, .Container = fraTable.get()}, index,
-              pattern, mTableEvents);
-      }),
-      sprColumn(toolkit.makeGrid({.Name = u"sprColumn", .FontName = comicSans}, gridRows, gridCols,
+      linJoin(mLife,
+              [this](std::int16_t index, const platform::Line*) {
+                  return mToolkit->makeLine({.Name = u"linJoin", .Container = fraTable.get()},
+                                            index);
+              }),
+      shpJoin(mLife,
+              [this](std::int16_t index, const platform::Shape*) {
+                  return mToolkit->makeShape({.Name = u"shpJoin", .Container = fraTable.get()},
+                                             index);
+              }),
+      lstTable(mLife,
+               [this](std::int16_t index, const Tabulet* pattern) {
+                   return mToolkit->makeTabulet(
+                       {.Name = u"lstTable", .FontName = sansSerif, .Container = fraTable.get()},
+                       index, pattern, mTableEvents);
+               }),
+      sprColumn(mLife,
+                toolkit.makeGrid({.Name = u"sprColumn", .FontName = comicSans}, gridRows, gridCols,
                                  {.MouseDown = [this](auto... a) { sprColumn_MouseDown(a...); },
                                   .MouseUp = [this](auto... a) { sprColumn_MouseUp(a...); },
                                   .DragDrop = [this](auto... a) { sprColumn_DragDrop(a...); },
                                   .Scroll = [this] { sprColumn_Scroll(); }})),
-      hsbTable(toolkit.makeScrollBar(
-          {.Name = u"hsbTable"}, Orientation::horizontal,
-          {.Change = [this] { hsbTable_Change(); }, .GotFocus = [this] { hsbTable_GotFocus(); }})),
-      vsbTable(toolkit.makeScrollBar(
-          {.Name = u"vsbTable"}, Orientation::vertical,
-          {.Change = [this] { vsbTable_Change(); }, .GotFocus = [this] { vsbTable_GotFocus(); }})),
-      cmdHome(toolkit.makeCommandButton(
-          {.Name = u"cmdHome", .FontName = sansSerif},
-          {.Click = [this] { cmdHome_Click(); }, .GotFocus = [this] { cmdHome_GotFocus(); }})),
-      fraSortOrder(toolkit.makeFrame({.Name = u"fraSortOrder", .FontName = sansSerif}, {})),
-      fraSortOrder2(toolkit.makeFrame(
-          {.Name = u"fraSortOrder2", .FontName = arial, .Container = fraSortOrder.get()}, {})),
-      cobSortOrder(toolkit.makeComboBox(
-          {.Name = u"cobSortOrder", .FontName = arial, .Container = fraSortOrder2.get()},
-          {u"(None)", u"Ascending", u"Descending"},
-          [this](auto... a) { cobSortOrder_KeyDown(a...); })),
-      cmdSetSortOrder(toolkit.makeCommandButton(
-          {.Name = u"cmdSetSortOrder",
-           .FontName = arial,
-           .Caption = setCaption,
-           .Container = fraSortOrder2.get()},
-          {.Click = [this] { cmdSetSortOrder_Click(); }, .GotFocus = {}})),
-      fraVisibility(toolkit.makeFrame({.Name = u"fraVisibility", .FontName = sansSerif}, {})),
-      fraVisibility2(toolkit.makeFrame(
-          {.Name = u"fraVisibility2", .FontName = arial, .Container = fraVisibility.get()}, {})),
-      cobVisibility(toolkit.makeComboBox(
-          {.Name = u"cobVisibility", .FontName = arial, .Container = fraVisibility2.get()},
-          {u"Visible", u"Not Visible"}, [this](auto... a) { cobVisibility_KeyDown(a...); })),
-      cmdSetVisibility(toolkit.makeCommandButton(
-          {.Name = u"cmdSetVisibility",
-           .FontName = arial,
-           .Caption = setCaption,
-           .Container = fraVisibility2.get()},
-          {.Click = [this] { cmdSetVisibility_Click(); }, .GotFocus = {}})),
-      fraValue(toolkit.makeFrame({.Name = u"fraValue", .FontName = sansSerif}, {})),
-      fraValue2(toolkit.makeFrame(
-          {.Name = u"fraValue2", .FontName = arial, .Container = fraValue.get()}, {})),
-      txtValue(toolkit.makeTextBox(
-          {.Name = u"txtValue", .FontName = arial, .Container = fraValue2.get()},
-          [this](auto... a) { txtValue_KeyDown(a...); })),
-      cmdSetTextValue(toolkit.makeCommandButton(
-          {.Name = u"cmdSetTextValue",
-           .FontName = sansSerif,
-           .Caption = setCaption,
-           .Container = fraValue2.get()},
-          {.Click = [this] { cmdSetTextValue_Click(); }, .GotFocus = {}})),
-      mnuZandor(toolkit.makePopupMenu({.Name = u"mnuZandor"}, [this] { mnuZandor_Click(); })) {
+      hsbTable(mLife, toolkit.makeScrollBar({.Name = u"hsbTable"}, Orientation::horizontal,
+                                            {.Change = [this] { hsbTable_Change(); },
+                                             .GotFocus = [this] { hsbTable_GotFocus(); }})),
+      vsbTable(mLife, toolkit.makeScrollBar({.Name = u"vsbTable"}, Orientation::vertical,
+                                            {.Change = [this] { vsbTable_Change(); },
+                                             .GotFocus = [this] { vsbTable_GotFocus(); }})),
+      cmdHome(mLife, toolkit.makeCommandButton({.Name = u"cmdHome", .FontName = sansSerif},
+                                               {.Click = [this] { cmdHome_Click(); },
+                                                .GotFocus = [this] { cmdHome_GotFocus(); }})),
+      fraSortOrder(mLife, toolkit.makeFrame({.Name = u"fraSortOrder", .FontName = sansSerif}, {})),
+      fraSortOrder2(
+          mLife,
+          toolkit.makeFrame(
+              {.Name = u"fraSortOrder2", .FontName = arial, .Container = fraSortOrder.get()}, {})),
+      cobSortOrder(
+          mLife, toolkit.makeComboBox(
+                     {.Name = u"cobSortOrder", .FontName = arial, .Container = fraSortOrder2.get()},
+                     {u"(None)", u"Ascending", u"Descending"},
+                     [this](auto... a) { cobSortOrder_KeyDown(a...); })),
+      cmdSetSortOrder(mLife, toolkit.makeCommandButton(
+                                 {.Name = u"cmdSetSortOrder",
+                                  .FontName = arial,
+                                  .Caption = setCaption,
+                                  .Container = fraSortOrder2.get()},
+                                 {.Click = [this] { cmdSetSortOrder_Click(); }, .GotFocus = {}})),
+      fraVisibility(mLife,
+                    toolkit.makeFrame({.Name = u"fraVisibility", .FontName = sansSerif}, {})),
+      fraVisibility2(mLife, toolkit.makeFrame({.Name = u"fraVisibility2",
+                                               .FontName = arial,
+                                               .Container = fraVisibility.get()},
+                                              {})),
+      cobVisibility(
+          mLife,
+          toolkit.makeComboBox(
+              {.Name = u"cobVisibility", .FontName = arial, .Container = fraVisibility2.get()},
+              {u"Visible", u"Not Visible"}, [this](auto... a) { cobVisibility_KeyDown(a...); })),
+      cmdSetVisibility(mLife, toolkit.makeCommandButton(
+                                  {.Name = u"cmdSetVisibility",
+                                   .FontName = arial,
+                                   .Caption = setCaption,
+                                   .Container = fraVisibility2.get()},
+                                  {.Click = [this] { cmdSetVisibility_Click(); }, .GotFocus = {}})),
+      fraValue(mLife, toolkit.makeFrame({.Name = u"fraValue", .FontName = sansSerif}, {})),
+      fraValue2(mLife,
+                toolkit.makeFrame(
+                    {.Name = u"fraValue2", .FontName = arial, .Container = fraValue.get()}, {})),
+      txtValue(mLife, toolkit.makeTextBox(
+                          {.Name = u"txtValue", .FontName = arial, .Container = fraValue2.get()},
+                          [this](auto... a) { txtValue_KeyDown(a...); })),
+      cmdSetTextValue(mLife, toolkit.makeCommandButton(
+                                 {.Name = u"cmdSetTextValue",
+                                  .FontName = sansSerif,
+                                  .Caption = setCaption,
+                                  .Container = fraValue2.get()},
+                                 {.Click = [this] { cmdSetTextValue_Click(); }, .GotFocus = {}})),
+      mnuZandor(mLife,
+                toolkit.makePopupMenu({.Name = u"mnuZandor"}, [this] { mnuZandor_Click(); })) {
     MakeMenu();
     UserControl_Initialize();
 }
 
-Zandor::~Zandor() { UserControl_Terminate(); }
+Zandor::~Zandor() { End(); }
 
 TalvikTabulet::TabuletEvents Zandor::TableEvents() {
     return {.CloseClick = [this](auto... a) { lstTable_CloseClick(a...); },
@@ -110,9 +129,10 @@ TalvikTabulet::TabuletEvents Zandor::TableEvents() {
 void Zandor::MakeMenu() {
     const auto entry = [this](platform::StringView name, platform::StringView caption,
                               void (Zandor::*click)()) {
-        return mnuZandor->makeEntry({.Name = name, .Caption = caption}, [this, click] {
-            if (click) (this->*click)();
-        });
+        return Part<platform::MenuEntry>(
+            mLife, mnuZandor->makeEntry({.Name = name, .Caption = caption}, [this, click] {
+                if (click) (this->*click)();
+            }));
     };
     mnuJoinShowDefinition = entry(u"mnuJoinShowDefinition", u"Show &Join Definition",
                                   &Zandor::mnuJoinShowDefinition_Click);

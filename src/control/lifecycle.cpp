@@ -8,13 +8,17 @@ using platform::single;
 using platform::toInteger;
 
 void Zandor::Trace(platform::StringView text, platform::StringView title) const {
-    if (mDebugSwitch != 0) mToolkit.MsgBox(String(text), platform::styleSystemModal, String(title));
+    if (mDebugSwitch != 0) mLife.MsgBox(String(text), platform::styleSystemModal, String(title));
+}
+
+void Zandor::Raise(Event event, const EventArguments& arguments) {
+    mEvents->Raise(event, arguments);
 }
 
 // Texts and flags have their defaults as initialisers.
 void Zandor::UserControl_Initialize() {
     Guard(u"UserControl_Initialize", [&] {
-        const clsFreeList factory(mToolkit);
+        const clsFreeList factory(mLife);
         mTableFreeList = factory.CreateFreeList(1, lastTableSlot);
         mJoinFreeList = factory.CreateFreeList(1, lastJoinSlot);
         WriteRowTitles();
@@ -47,19 +51,25 @@ void Zandor::UserControl_Terminate() {
     });
 }
 
+void Zandor::End() {
+    if (std::exchange(mEnding, true)) return;
+    UserControl_Terminate();
+    mLife.end();
+}
+
 float Zandor::UpperPaneHeight() const {
-    const float height = mToolkit.ScaleHeight();
+    const float height = mToolkit->ScaleHeight();
     return mOnlyJoin ? height : single(height / 2);
 }
 
 void Zandor::ResizeControls() {
     Guard(u"ResizeControls", [&] {
-        if (mToolkit.ScaleWidth() > 120) {
-            const float hidden = single(MXHorzFrameSize - mToolkit.ScaleWidth());
+        if (mToolkit->ScaleWidth() > 120) {
+            const float hidden = single(MXHorzFrameSize - mToolkit->ScaleWidth());
             hsbTable->Max(hidden >= 1 ? toInteger(hidden) : std::int16_t{0});
             fraTable->Width(MXHorzFrameSize);
-            sprColumn->Width(mToolkit.ScaleWidth());
-            vsbTable->Left(single(mToolkit.ScaleWidth() - vsbTable->Width()));
+            sprColumn->Width(mToolkit->ScaleWidth());
+            vsbTable->Left(single(mToolkit->ScaleWidth() - vsbTable->Width()));
             hsbTable->Width(vsbTable->Left());
             cmdHome->Left(vsbTable->Left());
             cmdHome->Width(vsbTable->Width());
@@ -76,7 +86,7 @@ void Zandor::ResizeControls() {
         cmdHome->Top(vsbTable->Height());
         cmdHome->Height(hsbTable->Height());
         // The test uses the whole height, the value the upper pane's: hosts rely on both.
-        const bool scrolls = single(MXVertFrameSize - mToolkit.ScaleHeight()) >= 1;
+        const bool scrolls = single(MXVertFrameSize - mToolkit->ScaleHeight()) >= 1;
         vsbTable->Max(scrolls ? toInteger(single(MXVertFrameSize - height)) : std::int16_t{0});
         fraTable->Height(MXVertFrameSize);
     });

@@ -10,14 +10,17 @@ using platform::toInteger;
 namespace {
 
 /// Scrolls so that `value` is the first visible twip of a canvas of `extent`, of which `visible`
-/// can be seen; past the end of the range, to its end.
-void scrollTo(platform::ScrollBar& bar, std::int16_t value, float visible, float extent) {
-    if (single(value + visible) < extent) {
-        bar.Value(value);
+/// can be seen; past the end of the range, to its end. Both are read afresh at each use.
+template <class Visible, class Extent>
+void scrollTo(const Part<platform::ScrollBar>& bar, std::int16_t value, const Visible& visible,
+              const Extent& extent) {
+    if (single(value + visible()) < extent()) {
+        bar->Value(value);
         return;
     }
-    const float end = single(extent - visible);
-    bar.Value(end >= 1 ? toInteger(end) : std::int16_t{0});
+    const float whole = extent();
+    const float end = single(whole - visible());
+    bar->Value(end >= 1 ? toInteger(end) : std::int16_t{0});
 }
 
 } // namespace
@@ -29,8 +32,10 @@ std::int16_t Zandor::VisibleFrameLeft() const {
 }
 
 void Zandor::VisibleFrameLeft(std::int16_t v) {
-    Guard(u"P_LET VisibleFrameLeft",
-          [&] { scrollTo(*hsbTable, v, mToolkit.ScaleWidth(), fraTable->Width()); });
+    Guard(u"P_LET VisibleFrameLeft", [&] {
+        scrollTo(
+            hsbTable, v, [&] { return mToolkit->ScaleWidth(); }, [&] { return fraTable->Width(); });
+    });
 }
 
 std::int16_t Zandor::VisibleFrameTop() const {
@@ -40,8 +45,10 @@ std::int16_t Zandor::VisibleFrameTop() const {
 }
 
 void Zandor::VisibleFrameTop(std::int16_t v) {
-    Guard(u"P_LET VisibleFrameTop",
-          [&] { scrollTo(*vsbTable, v, UpperPaneHeight(), fraTable->Height()); });
+    Guard(u"P_LET VisibleFrameTop", [&] {
+        scrollTo(
+            vsbTable, v, [&] { return UpperPaneHeight(); }, [&] { return fraTable->Height(); });
+    });
 }
 
 std::int16_t Zandor::HorizMaxScrollPos() const {

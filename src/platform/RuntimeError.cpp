@@ -27,6 +27,9 @@ RuntimeError unsupportedMember() {
     return {438, u"Object doesn't support this property or method"};
 }
 RuntimeError automation(StringView description) { return {440, String(description)}; }
+RuntimeError wrongNumberOfArguments() {
+    return {450, u"Wrong number of arguments or invalid property assignment"};
+}
 RuntimeError duplicateKey() {
     return {457, u"This key is already associated with an element of this collection"};
 }

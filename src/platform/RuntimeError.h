@@ -26,6 +26,7 @@ RuntimeError invalidPropertyValue();             ///< 380
 RuntimeError invalidPropertyArrayIndex();        ///< 381
 RuntimeError unsupportedMember();                ///< 438
 RuntimeError automation(StringView description); ///< 440, a host's own exception
+RuntimeError wrongNumberOfArguments();           ///< 450
 RuntimeError duplicateKey();                     ///< 457
 RuntimeError invalidRow();                       ///< 30009
 RuntimeError invalidCol();                       ///< 30010

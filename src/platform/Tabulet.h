@@ -73,6 +73,9 @@ public:
     virtual void Complete() = 0;
     /// Releases what the table list holds: its entries.
     virtual void Terminate() = 0;
+    /// The element has been unloaded: the table list leaves the canvas for good and reports nothing
+    /// more. Whoever still holds it, or one of its entries, can read its texts.
+    virtual void Unload() = 0;
 };
 
 /// What a table list tells; every event carries the element's index first.

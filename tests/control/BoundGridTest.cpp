@@ -64,6 +64,29 @@ TEST_F(ABoundGrid, LeavesAColumnUntiedWhoseKeyHasAnotherForm) {
     EXPECT_EQ(grid().ColData(3), 0);
 }
 
+TEST_F(ABoundGrid, TiesNoColumnThatTheLastBindingDidNotFill) {
+    for (const char16_t* const column : {u"ID", u"CUSTOMER", u"TOTAL"})
+        model->definition(orders, column);
+    bind();
+    model->definitions.items.Remove(u"x1");
+    bind();
+    ASSERT_EQ(fields(4), (Texts{u"CUSTOMER", u"TOTAL", u"TOTAL", u""}));
+    EXPECT_EQ(grid().ColData(2), 3);
+    EXPECT_EQ(grid().ColData(3), 0);
+
+    menuOverCell(synonymRow, 3, "mnuColumnDefinitionDelete");
+    EXPECT_EQ(model->definitionCount(), 2) << "a stranger's definition stays";
+    EXPECT_EQ(stage->boxes.size(), 1U);
+}
+
+TEST_F(ABoundGrid, TiesNoColumnToTheModelThatTerminateLeaves) {
+    model->definition(orders, u"ID");
+    bind();
+    control().Terminate();
+    ASSERT_EQ(fields(1), Texts{u"ID"});
+    EXPECT_EQ(grid().ColData(1), 0);
+}
+
 TEST_F(ABoundGrid, LetsTheUserEditADefinitionFilledByBinding) {
     auto first = model->definition(orders, u"ID");
     auto second = model->definition(orders, u"TOTAL");

@@ -4,8 +4,6 @@ namespace {
 
 using TalvikDBxZandor::clsDragColumn;
 
-constexpr auto dragModule = "TalvikDBxZandor.clsDragColumn";
-
 /// Two tables; drags start at the first.
 class DraggingColumns : public CanvasTest {
 protected:
@@ -116,21 +114,24 @@ TEST_F(DraggingColumns, ReportsAMoveOverASlotWithoutATable) {
     EXPECT_EQ(Back::mDragTableIndex(control()), 8);
 }
 
-TEST_F(DraggingColumns, NeverKeepsTheElementOfARemovedTable) {
+TEST_F(DraggingColumns, HoldsItsObjectsWhateverBecomesOfTheTable) {
     stage->selectEntries(1, {1});
     collect(1);
-    const std::weak_ptr<Tabulet> gone = element(1);
+    const std::weak_ptr<Tabulet> held = element(1);
     Back::RemoveTable(control(), std::int16_t{1});
     forget();
 
-    EXPECT_TRUE(gone.expired());
+    EXPECT_FALSE(stage->exists("lstTable(1)")) << "it leaves the canvas all the same";
     const auto& record = records().front();
-    EXPECT_FALSE(record->Table());
-    EXPECT_FALSE(record->Column());
-    EXPECT_EQ(told(), (Texts{noElement("P_GET Table", 1, dragModule),
-                             noElement("P_GET Column", 1, dragModule)}));
-    EXPECT_EQ(record->ZDTable().get(), first.get()) << "the model's objects are held";
+    EXPECT_EQ(recorded(), std::vector<String>{u"A.ID"});
+    EXPECT_EQ(record->Table()->Tag(), u"tA");
+    EXPECT_EQ(record->Column()->Key(), u"kID");
+    EXPECT_EQ(record->ZDTable().get(), first.get());
     EXPECT_EQ(record->ZDColumn().get(), &first->column(u"ID"));
+    EXPECT_EQ(told(), Texts{});
+
+    collect(2);
+    EXPECT_TRUE(held.expired()) << "and is let go with its record";
 }
 
 using ADragRecord = DraggingColumns;

@@ -174,7 +174,8 @@ TEST_F(AJoinDialogInTrouble, IsNotShownForACodeThatNoIntegerHolds) {
 // The dialog by itself.
 
 struct TheDialogByItself : JoinScene {
-    frmJoinDefinition dialog{stage->toolkit(), false};
+    TalvikDBxZandor::Life life{stage->toolkit(), {}};
+    frmJoinDefinition dialog{life, stage->toolkit(), false};
 };
 
 TEST_F(TheDialogByItself, HasItsTextsOfDesignTime) {

@@ -173,8 +173,20 @@ TEST_F(ARemovedJoin, StaysWhenTheModelHoldsNoJoinUnderItsTag) {
     EXPECT_EQ(events(), std::vector<Event>());
 }
 
-TEST_F(ARemovedJoin, StaysWhenItHasNoTag) {
+TEST_F(ARemovedJoin, GoesFromTheDrawingAloneWhenTheModelNeverTookIt) {
     record()->Tag({});
+    pointAt();
+    Back::mnuJoinDelete_Click(control);
+    EXPECT_EQ(stage->boxes, Boxes());
+    EXPECT_EQ(joinCount(), 0);
+    EXPECT_FALSE(stage->exists("linJoin(1)"));
+    EXPECT_TRUE(isFree(1));
+    EXPECT_EQ(model->joinCount(), 1);
+    EXPECT_EQ(events(), std::vector<Event>());
+}
+
+TEST_F(ARemovedJoin, StaysWhenItsTagIsNoText) {
+    record()->Tag(std::int32_t{1});
     pointAt();
     Back::mnuJoinDelete_Click(control);
     EXPECT_EQ(stage->boxes, Boxes{controlErrorBox(u"mnuJoinDelete_Click", 13, u"Type mismatch")});

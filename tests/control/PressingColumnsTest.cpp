@@ -1,5 +1,6 @@
 #include "CanvasTest.h"
 
+#include <algorithm>
 #include <functional>
 
 namespace {
@@ -41,6 +42,22 @@ TEST_F(PressingColumns, CopiesTheSelectionForEveryButton) {
         press(button);
         EXPECT_EQ(activated(), (std::vector<int>{0, 1, 0, 0})) << button;
     }
+}
+
+TEST_F(PressingColumns, LooksTheModelTableUpOnceForEachEntry) {
+    library.calls->remember(true);
+    press();
+    const auto& calls = library.calls->calls();
+    EXPECT_EQ(std::count(calls.begin(), calls.end(), "Tables.Item(key)"), 4);
+}
+
+TEST_F(PressingColumns, LooksNothingUpInAListWithoutEntries) {
+    element(1)->Terminate();
+    model->tables.items.Remove(u"tA");
+    library.calls->remember(true);
+    press();
+    EXPECT_EQ(library.calls->calls(), Texts{});
+    EXPECT_EQ(told(), Texts{});
 }
 
 TEST_F(PressingColumns, TracesEachSelectedColumnUnderItsName) {

@@ -146,17 +146,80 @@ TEST_F(ThePlainProperties, ShareTheFlagOfGreaterOrEqualUnderTwoNames) {
 }
 
 TEST_F(ThePlainProperties, GiveNothingForTheObjectsOfTheEvents) {
-    for (const platform::StringView name : {u"lastjoin", u"activetable", u"ActiveColumn"})
-        EXPECT_FALSE(std::get<std::shared_ptr<void>>(get(name))) << platform::toUtf8(name);
+    EXPECT_EQ(get(u"lastjoin"), Variant(platform::Ref<TalvikZandorLib::ZDJoin>()));
+    EXPECT_EQ(get(u"activetable"), Variant(platform::Ref<TalvikZandorLib::ZDTable>()));
+    EXPECT_EQ(get(u"ActiveColumn"), Variant(platform::Ref<TalvikZandorLib::ZDColumn>()));
 }
 
 TEST_F(ThePlainProperties, HandTheModelOverAndBackThroughTheTable) {
     const auto model = library.newModel();
     model->table(u"ORDERS", {u"ID"});
-    const std::shared_ptr<TalvikZandorLib::Zandor> given = model;
-    set(u"Zandor", std::shared_ptr<void>(given));
+    const platform::Ref<TalvikZandorLib::Zandor> given = model;
+    set(u"Zandor", given);
     EXPECT_TRUE(stage->exists("lstTable(1)"));
-    EXPECT_EQ(std::get<std::shared_ptr<void>>(get(u"Zandor")).get(), given.get());
+    EXPECT_EQ(get(u"Zandor"), Variant(given));
+}
+
+TEST_F(ThePlainProperties, RefuseAModelThatIsNoneThroughTheTable) {
+    const auto model = library.newModel();
+    const auto table = model->table(u"ORDERS", {u"ID"});
+    const platform::Ref<TalvikZandorLib::Zandor> given = model;
+    set(u"Zandor", given);
+    const Variant strangers[] = {platform::Ref<TalvikZandorLib::ZDTable>(table),
+                                 std::shared_ptr<void>(std::make_shared<int>(3)), true,
+                                 platform::String(u"ORDERS"), Variant()};
+    for (const Variant& stranger : strangers) {
+        try {
+            set(u"Zandor", stranger);
+            ADD_FAILURE() << stranger.index();
+        } catch (const platform::RuntimeError& error) {
+            EXPECT_EQ(error.Number, 13) << stranger.index();
+        }
+    }
+    EXPECT_EQ(get(u"Zandor"), Variant(given));
+}
+
+TEST_F(ThePlainProperties, HaveTheMethodsBesideThemInTheTable) {
+    const auto model = library.newModel();
+    const auto orders = model->table(u"ORDERS", {u"ID", u"TOTAL"});
+    const auto parts = model->table(u"PARTS", {u"ID"});
+    bind(model);
+    const auto call = [&](platform::StringView name, std::vector<Variant> arguments) {
+        memberNamed(name).invoke(zandor(), arguments);
+    };
+    call(u"SetCurrentTable", {platform::String(u"PARTS")});
+    EXPECT_EQ(parts->selected, 1);
+    call(u"SelectColumnNames", {platform::String(u"ORDERS"), platform::String(u"TOTAL")});
+    EXPECT_TRUE(orders->column(u"TOTAL").selected);
+    call(u"Terminate", {});
+    EXPECT_FALSE(stage->exists("lstTable(1)"));
+    for (const Member& member : members())
+        EXPECT_EQ(member.invoke != nullptr,
+                  member.kind == TalvikDBxZandor::automation::Kind::method)
+            << platform::toUtf8(member.name);
+}
+
+TEST_F(ThePlainProperties, HaveMethodsBesideThemThatRefuseOtherArguments) {
+    const auto model = library.newModel();
+    model->table(u"ORDERS", {u"ID"});
+    bind(model);
+    for (const Member& member : members()) {
+        if (!member.invoke) continue;
+        const auto errorWith = [&](const std::vector<Variant>& arguments) {
+            try {
+                member.invoke(zandor(), arguments);
+            } catch (const platform::RuntimeError& error) {
+                return error.Number;
+            }
+            return 0;
+        };
+        const std::size_t count = member.parameters.size();
+        EXPECT_EQ(errorWith(std::vector<Variant>(count + 1, platform::String())), 450);
+        if (count == 0) continue;
+        EXPECT_EQ(errorWith(std::vector<Variant>(count - 1, platform::String())), 450);
+        EXPECT_EQ(errorWith(std::vector<Variant>(count, true)), 13);
+    }
+    EXPECT_TRUE(stage->exists("lstTable(1)")) << "and nothing is called then";
 }
 
 TEST_F(ThePlainProperties, RaiseErrorForNoModelThroughTheTable) {

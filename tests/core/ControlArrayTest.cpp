@@ -1,5 +1,7 @@
 #include "control/ControlArray.h"
 
+#include "RecordingBoxes.h"
+
 #include <gtest/gtest.h>
 
 #include <vector>
@@ -16,7 +18,7 @@ struct Element {
 class AControlArray : public testing::Test {
 protected:
     AControlArray()
-        : elements([this](std::int16_t index, const Element* pattern) {
+        : elements(life, [this](std::int16_t index, const Element* pattern) {
               if (index == failing) throw platform::errors::outOfMemory();
               return platform::makeRef<Element>(Element{index, pattern});
           }) {}
@@ -37,6 +39,8 @@ protected:
         return result;
     }
 
+    RecordingBoxes boxes;
+    TalvikDBxZandor::Life life{boxes, {}};
     std::int16_t failing = -1;
     ControlArray<Element> elements;
 };

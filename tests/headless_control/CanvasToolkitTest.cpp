@@ -277,4 +277,25 @@ TEST_F(DraggingOnAToolkit, FollowsAMoveWithTheJoinsAtEveryStep) {
     EXPECT_EQ(events(), Texts{"TableMoved"});
 }
 
+TEST_F(DraggingOnAToolkit, FollowsAMoveWithTheJoinsOfTheTableThatMovesAlone) {
+    const auto third = table(u"C", {u"ID"}, 9000);
+    model->join(first, u"ID", second, u"ID");
+    model->join(second, u"ID", third, u"ID");
+    bind();
+    toolkit().faults.remember(true);
+    Back::lstTable_Moving(control(), std::int16_t{1});
+    const auto& calls = toolkit().faults.calls();
+    EXPECT_EQ(std::count(calls.begin(), calls.end(), "linJoin(1).setEnds"), 1);
+    EXPECT_EQ(std::count(calls.begin(), calls.end(), "linJoin(2).setEnds"), 0);
+}
+
+TEST_F(DraggingOnAToolkit, FollowsAMoveInSilenceWhateverAJoinFailsWith) {
+    model->join(first, u"ID", second, u"ID");
+    bind();
+    toolkit().faults.failNext("linJoin(1).setEnds", std::bad_alloc());
+    Back::lstTable_Moving(control(), std::int16_t{1});
+    EXPECT_FALSE(toolkit().faults.isArmed("linJoin(1).setEnds"));
+    EXPECT_EQ(told(), Texts{});
+}
+
 } // namespace

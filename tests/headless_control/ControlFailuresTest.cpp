@@ -1,6 +1,7 @@
 #include "control/ShellFixture.h"
 #include "platform/headless/Toolkit.h"
 
+#include <algorithm>
 #include <new>
 
 namespace {
@@ -89,6 +90,15 @@ TEST_F(AToolkitThatFails, AtTheLaterReadingOfAVisibleFrameStaysAsItWas) {
     zandor().VisibleFrameLeft(32767);
     expectReport(u"P_LET VisibleFrameLeft");
     EXPECT_EQ(zandor().VisibleFrameLeft(), 300);
+}
+
+TEST_F(AToolkitThatFails, AtItsSizeIsAskedForItAfreshAtEachUseByAVisibleFrame) {
+    faults().remember(true);
+    zandor().VisibleFrameLeft(32767);
+    zandor().VisibleFrameTop(32767);
+    const auto& calls = faults().calls();
+    EXPECT_EQ(std::count(calls.begin(), calls.end(), "ScaleWidth"), 2);
+    EXPECT_EQ(std::count(calls.begin(), calls.end(), "ScaleHeight"), 2);
 }
 
 TEST_F(AToolkitThatFails, AtTheCanvasReportsTheScrollingAndNotTheProperty) {

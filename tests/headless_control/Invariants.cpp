@@ -166,9 +166,13 @@ void Invariants::eachElement(const Action& action) {
     for (const auto& [index, mark] : Backstage::shpJoin(mControl)) action("mark ", index, mark);
 }
 
-/// Nothing keeps an element that the control has unloaded.
+/// Nothing but a drag record keeps an element that the control has unloaded.
 void Invariants::checkSurvivors() {
     std::vector<const void*> loaded;
+    for (const auto& record : Backstage::mDragColumns(mControl)) {
+        loaded.push_back(record->Table().get());
+        loaded.push_back(record->Column().get());
+    }
     eachElement([&loaded](const char*, std::int32_t, const auto& element) {
         loaded.push_back(element.get());
     });

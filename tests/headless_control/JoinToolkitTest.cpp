@@ -92,6 +92,15 @@ TEST_F(AJoinOnAFailingToolkit, LeavesTheMarkAtTheTopOfATableWhoseBottomIsBeyondA
     EXPECT_EQ(stage->look("shpJoin(2)").bounds.Top, 3e38F);
 }
 
+TEST_F(AJoinOnAFailingToolkit, HasItsMarkAtTheEdgeOfATableWhoseTopCannotBeRead) {
+    const float top = stage->look("shpJoin(2)").bounds.Top;
+    table(1).setBounds({1500, 900, 2000, 2000});
+    toolkit.faults.failNext("lstTable(1).bounds", invalidPropertyValue(), 2);
+    EXPECT_FALSE(Back::DrawJoin(control, *record()));
+    EXPECT_EQ(stage->look("shpJoin(2)").bounds.Left, 3500);
+    EXPECT_EQ(stage->look("shpJoin(2)").bounds.Top, top);
+}
+
 TEST_F(AJoinOnAFailingToolkit, ReportsALineThatCannotBeReadWhileSearching) {
     Record hit;
     toolkit.faults.failNext("linJoin(1).Y2", invalidPropertyValue());

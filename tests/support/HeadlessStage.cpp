@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <optional>
+
 namespace {
 
 namespace headless = platform::headless;
@@ -27,7 +29,9 @@ public:
             transcript.push_back("dialog");
             if (onDialog) onDialog();
         };
-        mControl = std::make_unique<TalvikDBxZandor::Zandor>(mToolkit, library, mEvents);
+        mHouse = std::make_shared<House>();
+        mHouse->control.emplace(mToolkit, library, mEvents, mHouse);
+        mControl = &*mHouse->control;
         mToolkit.comforts.attach(*mControl);
         mToolkit.onPaint = [this] { mControl->UserControl_Paint(); };
         mToolkit.onResize = [this] { mControl->UserControl_Resize(); };
@@ -43,8 +47,12 @@ public:
     void closeControl() override {
         mToolkit.onPaint = nullptr;
         mToolkit.onResize = nullptr;
+        if (!mControl) return;
+        mControl->End();
+        mControl = nullptr;
+        mToolkit.close();
         mToolkit.comforts.detach();
-        mControl.reset();
+        mHouse.reset();
     }
 
     bool exists(const std::string& name) override { return mToolkit.exists(name); }
@@ -185,7 +193,13 @@ private:
     headless::Toolkit mToolkit;
     headless::User mUser;
     StageEvents mEvents;
-    std::unique_ptr<TalvikDBxZandor::Zandor> mControl;
+
+    /// What a procedure of the control keeps while it runs.
+    struct House {
+        std::optional<TalvikDBxZandor::Zandor> control;
+    };
+    std::shared_ptr<House> mHouse;
+    TalvikDBxZandor::Zandor* mControl = nullptr;
 };
 
 } // namespace

@@ -11,11 +11,11 @@ using platform::single;
 void Zandor::OrganizeTables() {
     Guard(u"OrganizeTables", [&] {
         Trace(u"OrganizeTables");
-        const auto step = [](const platform::ScrollBar& bar) {
-            return std::max<std::int16_t>(1, static_cast<std::int16_t>(bar.Max() / 5));
+        const auto step = [](const Part<platform::ScrollBar>& bar) {
+            return std::max<std::int16_t>(1, static_cast<std::int16_t>(bar->Max() / 5));
         };
-        vsbTable->LargeChange(step(*vsbTable));
-        hsbTable->LargeChange(step(*hsbTable));
+        vsbTable->LargeChange(step(vsbTable));
+        hsbTable->LargeChange(step(hsbTable));
         const bool anyShown = lstTable.Count() >= 2;
         vsbTable->Enabled(anyShown);
         hsbTable->Enabled(anyShown);
@@ -24,47 +24,46 @@ void Zandor::OrganizeTables() {
     });
 }
 
-void Zandor::lstTable_Moving(std::int16_t) {
+void Zandor::lstTable_Moving(std::int16_t Index) {
     Guard(u"lstTable_Moving", [&] {
+        const std::int32_t table = lstTable(Index)->TableHandle();
         for (const auto& record : platform::Each<clsJoinLine>(mJoinLines)) {
-            try {
-                PlaceJoin(*record);
-            } catch (const platform::RuntimeError&) {
-                // Reported once, where the move ends, not at every step of the mouse.
-            }
+            if (record->LeftTablehwnd() != table && record->RightTablehwnd() != table) continue;
+            // What fails is reported once, where the move ends, not at every step of the mouse.
+            quietly([&] { PlaceJoin(*record); });
         }
     });
 }
 
 void Zandor::lstTable_Moved(std::int16_t Index) {
     Guard(u"lstTable_Moved", [&] {
-        const Ref<Tabulet> table = lstTable(Index);
+        const auto table = Hold(lstTable(Index));
         // Not negated, which would hand a host -0 as the place of the edge.
         const float visibleTop = 0 - fraTable->Top();
         const float visibleLeft = 0 - fraTable->Left();
         if (table->Top() < visibleTop) table->Top(visibleTop);
         if (table->Left() < visibleLeft) table->Left(visibleLeft);
         // The lower limit reckons with the grid's top, not its height; it comes last and wins.
-        float bottom = single(mToolkit.ScaleHeight() - sprColumn->Top());
+        float bottom = single(mToolkit->ScaleHeight() - sprColumn->Top());
         bottom = single(single(bottom - fraTable->Top()) - 600);
         if (table->Top() > bottom) table->Top(bottom);
-        const float right = single(single(mToolkit.ScaleWidth() - fraTable->Left()) - 600);
+        const float right = single(single(mToolkit->ScaleWidth() - fraTable->Left()) - 600);
         if (table->Left() > right) table->Left(right);
 
-        const ZDTableRef model = TableOf(Index);
+        const auto model = TableOf(table);
         model->Left(table->Left());
         model->Top(table->Top());
-        mEvents.Raise(Event::TableMoved, {});
+        Raise(Event::TableMoved);
         OrganizeTables();
     });
 }
 
 void Zandor::lstTable_Resized(std::int16_t Index) {
     Guard(u"lstTable_Resized", [&] {
-        const Ref<Tabulet> table = lstTable(Index);
+        const auto table = Hold(lstTable(Index));
         if (table->Width() < 0) table->Width(0);
         if (table->Height() < 0) table->Height(0);
-        const ZDTableRef model = TableOf(Index);
+        const auto model = TableOf(table);
         model->Width(table->Width());
         model->Height(table->Height());
         OrganizeTables();

@@ -13,8 +13,9 @@ platform::Ref<TalvikTabulet::ColumnItem> Zandor::FirstSelected(Tabulet& table) {
 }
 
 /// The model table behind a shown one. Error 5 when the model holds none under its key.
-Zandor::ZDTableRef Zandor::TableOf(std::int16_t Index) {
-    return Model()->Tables().Item(lstTable(Index)->Tag());
+Held<TalvikZandorLib::ZDTable> Zandor::TableOf(const Held<Tabulet>& element) {
+    const String key = element->Tag();
+    return Tables().Item(key);
 }
 
 void Zandor::lstTable_ColumnMouseDown(std::int16_t Index, const Ref<ColumnItem>&, std::int16_t,
@@ -22,18 +23,18 @@ void Zandor::lstTable_ColumnMouseDown(std::int16_t Index, const Ref<ColumnItem>&
     constexpr platform::StringView procedure = u"lstTable_ColumnMouseDown";
     Guard(procedure, [&] {
         Trace(procedure);
-        // Held, because a host told of a column may unload the element.
-        const Ref<Tabulet> element = lstTable(Index);
-        auto& entries = element->ColumnItems();
-        const ZDTableRef table = TableOf(Index);
-        for (std::int32_t n = 1; n <= entries.Count(); ++n) {
-            const Ref<ColumnItem> entry = entries.Item(n);
-            const ZDColumnRef column = table->Columns().Item(entry->Key());
+        const auto element = Hold(lstTable(Index));
+        for (std::int32_t n = 1; n <= element->ColumnItems().Count(); ++n) {
+            const auto entry = Hold(element->ColumnItems().Item(n));
+            const auto table = TableOf(element);
+            const auto column = List(table, &TalvikZandorLib::ZDTable::Columns).Item(entry->Key());
             const bool selected = entry->Selected();
             if (selected) Trace(u"Selected column found: " + entry->Text(), procedure);
             column->activated(selected ? std::int16_t{1} : std::int16_t{0});
             if (selected && mDebugSwitch != 0)
                 Trace(u"Tabulet Column selected: " + column->Name(), procedure);
+            // A table that the host has closed has no further entries that matter.
+            require(Shows(Index, element));
         }
     });
 }
@@ -43,9 +44,11 @@ void Zandor::lstTable_ColumnMouseMove(std::int16_t Index, const Ref<ColumnItem>&
     Guard(u"lstTable_ColumnMouseMove", [&] {
         if (Button != platform::leftButton) return;
         mDragTableIndex = Index;
-        GetDragColumns(Index);
         // Held, because the drop may come while Drag still runs and unload the element.
-        const Ref<Tabulet> table = lstTable(Index);
+        const auto before = Hold(lstTable.Find(Index));
+        GetDragColumns(Index);
+        const auto table = Hold(lstTable(Index));
+        require(table.pointer() == before.pointer());
         table->Drag(1);
     });
 }
@@ -61,13 +64,14 @@ bool Zandor::GetDragColumns(std::int16_t Index) {
     bool result = false;
     Guard(u"GetDragColumns", [&] {
         std::vector<Ref<clsDragColumn>> records;
-        const Ref<Tabulet> element = lstTable(Index);
-        auto& entries = element->ColumnItems();
-        for (std::int32_t n = 1; n <= entries.Count(); ++n) {
-            const Ref<ColumnItem> entry = entries.Item(n);
+        const auto element = Hold(lstTable(Index));
+        for (std::int32_t n = 1; n <= element->ColumnItems().Count(); ++n) {
+            const auto entry = Hold(element->ColumnItems().Item(n));
             if (entry->Selected()) records.push_back(DragRecord(Index, element, entry));
+            require(Shows(Index, element));
         }
-        mDragColumns = std::move(records);
+        // The records before go at the end, when nothing is in between any more.
+        mDragColumns.swap(records);
         result = true;
     });
     return result;
@@ -75,24 +79,30 @@ bool Zandor::GetDragColumns(std::int16_t Index) {
 
 platform::Ref<clsDragColumn> Zandor::DragRecord(std::int16_t Index, const Ref<Tabulet>& element,
                                                 const Ref<ColumnItem>& entry) {
-    auto record = platform::makeRef<clsDragColumn>(mToolkit);
+    auto record = platform::makeRef<clsDragColumn>(mLife);
     record->TableIndex(Index);
     record->Table(element);
     record->Column(entry);
-    record->ZDTable(TableOf(Index));
-    record->ZDColumn(record->ZDTable()->Columns().Item(entry->Key()));
+    const auto table = TableOf(Hold(element));
+    record->ZDTable(table);
+    record->ZDColumn(List(table, &TalvikZandorLib::ZDTable::Columns).Item(entry->Key()));
     return record;
+}
+
+void Zandor::EmptyDragColumns() {
+    // Out of the control first: what the records held may be the last of something of the host's.
+    const auto gone = std::exchange(mDragColumns, {});
 }
 
 void Zandor::lstTable_DragOver(std::int16_t Index, platform::Control*, float X, float Y,
                                std::int16_t) {
     Guard(u"lstTable_DragOver", [&] {
-        const Ref<ColumnItem> target = lstTable(Index)->ColumnAt(X, Y);
+        const auto table = Hold(lstTable(Index));
+        const Ref<ColumnItem> target = table->ColumnAt(X, Y);
         if (!target || Index == mDragTableIndex || IsAllColumns(*target)) return;
-        auto& entries = lstTable(Index)->ColumnItems();
-        for (std::int32_t n = 1; n <= entries.Count(); ++n) {
-            const auto& entry = entries.Item(n);
-            entry->Selected(entry == target);
+        for (std::int32_t n = 1; n <= table->ColumnItems().Count(); ++n) {
+            const auto entry = Hold(table->ColumnItems().Item(n));
+            entry->Selected(entry.pointer() == target);
             entry->Refresh();
         }
     });
@@ -100,29 +110,28 @@ void Zandor::lstTable_DragOver(std::int16_t Index, platform::Control*, float X, 
 
 void Zandor::lstTable_DragDrop(std::int16_t Index, platform::Control*, float X, float Y) {
     Guard(u"lstTable_DragDrop", [&] {
-        const Ref<ColumnItem> target = lstTable(Index)->ColumnAt(X, Y);
+        const auto table = Hold(lstTable(Index));
+        const Ref<ColumnItem> target = table->ColumnAt(X, Y);
         if (!target || IsAllColumns(*target) || mDragColumns.empty()) {
-            mDragColumns.clear();
+            EmptyDragColumns();
             return;
         }
         // However many columns were dragged, one join is made, from the first of them.
         const Ref<clsDragColumn> source = mDragColumns.front();
         if (IsAllColumns(*source->Column())) {
-            mDragColumns.clear();
+            EmptyDragColumns();
             return;
         }
         if (source->TableIndex() != Index) {
-            Ref<clsJoinLine> record;
-            if (DrawNewJoin(record, source->Table(), source->Column(), lstTable(Index), target, 0,
-                            0)) {
-                const ZDTableRef rightTable = TableOf(Index);
-                AddNewJoin(record, source->ZDTable(), source->ZDColumn(), rightTable,
-                           rightTable->Columns().Item(target->Key()));
-                mEvents.Raise(Event::JoinCreated, {.Join = ModelJoin(*record)});
+            const auto model = Model();
+            const Ref<clsJoinLine> record = JoinTo(*source, table, target);
+            if (record && mModel == model.pointer()) {
+                const auto join = ModelJoin(*record);
+                Raise(Event::JoinCreated, {.Join = join});
             }
         }
-        mDragColumns.clear();
-        mEvents.Raise(Event::Activate, {});
+        EmptyDragColumns();
+        Raise(Event::Activate);
     });
 }
 

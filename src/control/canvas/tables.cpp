@@ -1,50 +1,68 @@
 #include "control/Zandor.h"
 
+#include <algorithm>
+
 namespace TalvikDBxZandor {
 
-using platform::Each;
+using TalvikZandorLib::ZDTable;
 
-void Zandor::ShowTable(std::int16_t slot, TalvikZandorLib::ZDTable& table, std::int32_t& cascade) {
+/// Whether an element still stands in its slot; the host may have closed it, and shown another
+/// there.
+bool Zandor::Shows(std::int16_t slot, const Held<Tabulet>& element) const {
+    return element && lstTable.Find(slot) == element.pointer();
+}
+
+bool Zandor::Shows(const Held<Tabulet>& element) const {
+    return std::any_of(lstTable.begin(), lstTable.end(),
+                       [&](const auto& shown) { return shown.second == element.pointer(); });
+}
+
+Held<TalvikTabulet::Tabulet> Zandor::ShowTable(std::int16_t slot, const Held<ZDTable>& table,
+                                               std::int32_t& cascade) {
     lstTable.Load(slot);
-    // Held, because a host asked for a column may unload the element.
-    const Ref<Tabulet> held = lstTable(slot);
-    Tabulet& element = *held;
-    element.Text(table.Name());
-    element.Tag(table.Key());
+    const auto element = Hold(lstTable(slot));
+    element->Text(table->Name());
+    element->Tag(table->Key());
 
     // A table without place and size of its own takes two steps of the cascade.
-    if (table.Left() >= 0 && table.Top() >= 0) {
-        element.Left(static_cast<float>(table.Left()));
-        element.Top(static_cast<float>(table.Top()));
+    const auto asked = [&](std::int32_t (ZDTable::*side)() const) { return ((*table).*side)(); };
+    if (asked(&ZDTable::Left) >= 0 && asked(&ZDTable::Top) >= 0) {
+        element->Left(static_cast<float>(asked(&ZDTable::Left)));
+        element->Top(static_cast<float>(asked(&ZDTable::Top)));
     } else {
         ++cascade;
-        element.Left(static_cast<float>(cascade * 120));
-        element.Top(static_cast<float>(cascade * 120));
+        element->Left(static_cast<float>(cascade * 120));
+        element->Top(static_cast<float>(cascade * 120));
     }
-    if (table.Width() > 0 && table.Height() > 0) {
-        element.Width(static_cast<float>(table.Width()));
-        element.Height(static_cast<float>(table.Height()));
+    if (asked(&ZDTable::Width) > 0 && asked(&ZDTable::Height) > 0) {
+        element->Width(static_cast<float>(asked(&ZDTable::Width)));
+        element->Height(static_cast<float>(asked(&ZDTable::Height)));
     } else {
         ++cascade;
-        element.Width(2000);
-        element.Height(2000);
+        element->Width(2000);
+        element->Height(2000);
     }
 
     FillTable(element, table);
-    element.Activated(true);
-    element.Visible(true);
-    element.ZOrder();
-    element.Complete();
+    if (!Shows(element)) return element;
+    element->Activated(true);
+    element->Visible(true);
+    element->ZOrder();
+    element->Complete();
     Trace(u"Table visible.", u"SetZandor");
+    return element;
 }
 
-void Zandor::FillTable(Tabulet& element, TalvikZandorLib::ZDTable& table) {
-    for (const auto& column : Each(table.Columns())) {
+void Zandor::FillTable(const Held<Tabulet>& element, const Held<ZDTable>& table) {
+    for (const auto& column : List(table, &ZDTable::Columns)) {
         const String name = column->Name();
-        const auto entry = element.ColumnItems().Add(column->Key(), name);
+        const String key = column->Key();
+        if (!Shows(element)) return;
+        const auto entry = Hold(element->ColumnItems().Add(key, name));
         if (column->Marker()) entry->Image(1);
         if (!column->Selected()) continue;
         Trace(u"Select column: " + name, u"SetZandor");
+        if (!Shows(element)) return;
         entry->Selected(true);
         entry->Refresh();
         entry->EnsureVisible();
@@ -80,12 +98,12 @@ bool Zandor::FindColumn(const Ref<Tabulet>& Table, const String& ColumnName,
     return result;
 }
 
-bool Zandor::SetSelectedTable(const String& TableName) {
+bool Zandor::SetSelectedTable(const String& given) {
     bool result = false;
-    Guard(u"SetSelectedTable", [&] {
+    Guard(u"SetSelectedTable", [&, TableName = given] {
         Trace(u"SetSelectedTable");
         bool found = false;
-        for (const auto model = Model(); const auto& table : Each(model->Tables())) {
+        for (const auto& table : Tables()) {
             const bool match = !found && table->Key() == TableName;
             table->Selected(match ? std::int16_t{1} : std::int16_t{0});
             found = found || match;
@@ -98,8 +116,8 @@ bool Zandor::SetSelectedTable(const String& TableName) {
 bool Zandor::ShowSelectedTable() {
     bool result = false;
     Guard(u"ShowSelectedTable", [&] {
-        ZDTableRef current;
-        for (const auto model = Model(); const auto& table : Each(model->Tables())) {
+        Held<ZDTable> current;
+        for (const auto& table : Tables()) {
             if (!current) current = table;
             if (table->Selected() == 0) continue;
             current = table;
@@ -114,19 +132,25 @@ bool Zandor::ShowSelectedTable() {
 bool Zandor::RemoveTable(std::int16_t Index) {
     bool result = false;
     Guard(u"RemoveTable", [&] {
-        const String name = lstTable(Index)->Text();
+        const auto table = Hold(lstTable(Index));
+        const String name = table->Text();
         DeletedTable = name;
         RemoveColumnsOf(name);
 
         std::vector<Ref<clsJoinLine>> joins;
-        for (const auto& record : Each<clsJoinLine>(mJoinLines))
+        for (const auto& record : platform::Each<clsJoinLine>(mJoinLines))
             if (record->LeftTableName() == name || record->RightTableName() == name)
                 joins.push_back(record);
-        for (const auto& record : joins) RemoveJoin(record);
+        for (const auto& record : joins)
+            if (Draws(record)) RemoveJoin(record);
 
+        require(Shows(Index, table));
         TerminateTable(Index);
+        require(Shows(Index, table));
         lstTable.Unload(Index);
         mTableFreeList->FreeIndex(Index);
+        // A drag record may hold the element for longer; it leaves the screen all the same.
+        table->Unload();
         OrganizeTables();
         SetFocusBack();
         result = true;
@@ -151,24 +175,33 @@ void Zandor::RemoveColumnsOf(const String& tableName) {
 
 void Zandor::TerminateTable(std::int16_t Index) {
     Guard(u"TerminateTable", [&] {
-        if (lstTable(Index)) lstTable(Index)->Terminate();
+        if (const auto table = Hold(lstTable.Find(Index))) table->Terminate();
     });
 }
 
 void Zandor::lstTable_CloseClick(std::int16_t Index) {
     Guard(u"lstTable_CloseClick", [&] {
-        Model()->DeleteTable(TableOf(Index));
-        RemoveTable(Index);
-        mEvents.Raise(Event::TableDeleted, {});
+        const auto model = Model();
+        const auto element = Hold(lstTable(Index));
+        const String name = element->Text();
+        const auto table = TableOf(element);
+        model->DeleteTable(table);
+        // A host may have shown what is left of its model already.
+        if (Shows(Index, element))
+            RemoveTable(Index);
+        else
+            DeletedTable = name;
+        Raise(Event::TableDeleted);
     });
 }
 
 void Zandor::lstTable_GotFocus(std::int16_t Index) {
     // The report's capital O is as hosts know it.
     Guard(u"lstTable_GotFOcus", [&] {
-        SetCurrentTable(lstTable(Index)->Text());
+        const auto table = Hold(lstTable(Index));
+        SetCurrentTable(table->Text());
         MakeGetValueFieldsInvisible();
-        mActiveTableIndex = Index;
+        if (Shows(Index, table)) mActiveTableIndex = Index;
     });
 }
 

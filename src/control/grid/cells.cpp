@@ -8,28 +8,32 @@ namespace TalvikDBxZandor {
 using platform::single;
 
 /// The definition tied to a grid column. Error 5 when the model holds none under its key.
-platform::Ref<TalvikZandorLib::ZDColumnDefinition> Zandor::DefinitionOf(std::int32_t column) {
-    return Model()->ColumnDefinitions().Item(keyOfNumber(sprColumn->ColData(column)));
+Held<TalvikZandorLib::ZDColumnDefinition> Zandor::DefinitionOf(std::int32_t column) {
+    const String key = keyOfNumber(sprColumn->ColData(column));
+    return Definitions().Item(key);
 }
 
-void Zandor::SetCell(const String& text, std::int16_t alignment) {
+void Zandor::SetCell(const String& text, std::int16_t alignment) const {
     sprColumn->Text(text);
     sprColumn->CellAlignment(alignment);
 }
 
 void Zandor::FitColumn(std::int32_t column, const String& fieldName) {
-    sprColumn->ColWidth(column, single(mToolkit.TextWidth(fieldName) + 120));
+    sprColumn->ColWidth(column, single(mToolkit->TextWidth(fieldName) + 120));
 }
 
 void Zandor::AddNewAndCriterium(const ZDColumnRef& sourceColumn, std::int32_t column) {
     Guard(u"AddNewAndCriterium", [&] {
-        const auto definition = mLibrary.NewZDColumnDefinition();
+        const auto definition = Hold(mLibrary->NewZDColumnDefinition());
         definition->Column(sourceColumn);
         definition->Visible(true);
         definition->SortOrder(0);
         definition->Synonym({});
-        const auto stored = Model()->AddColumnDefinition(definition);
-        sprColumn->ColData(column, numberOfKey(stored->Key()));
+        const std::int32_t binding = mBinding;
+        const auto stored = Hold(Model()->AddColumnDefinition(definition));
+        const std::int32_t number = numberOfKey(stored->Key());
+        require(binding == mBinding);
+        sprColumn->ColData(column, number);
     });
 }
 
@@ -48,7 +52,7 @@ void Zandor::MakeGetValueFieldsInvisible() {
 void Zandor::GetTextValue(const String& cellText) {
     Guard(u"GetTextValue", [&] {
         txtValue->Text(cellText);
-        OpenEditor(*fraValue, *cmdSetTextValue);
+        OpenEditor(fraValue, cmdSetTextValue);
         txtValue->SetFocus();
     });
 }
@@ -56,7 +60,7 @@ void Zandor::GetTextValue(const String& cellText) {
 void Zandor::GetSortOrder(const String& cellText) {
     Guard(u"GetSortOrder", [&] {
         cobSortOrder->ListIndex(cellText == u"Ascending" ? 1 : cellText == u"Descending" ? 2 : 0);
-        OpenEditor(*fraSortOrder, *cmdSetSortOrder);
+        OpenEditor(fraSortOrder, cmdSetSortOrder);
         cobSortOrder->SetFocus();
     });
 }
@@ -64,33 +68,34 @@ void Zandor::GetSortOrder(const String& cellText) {
 void Zandor::GetVisibility(const String& cellText) {
     Guard(u"GetVisibility", [&] {
         cobVisibility->ListIndex(cellText == u"Not Visible" ? 1 : 0);
-        OpenEditor(*fraVisibility, *cmdSetVisibility);
+        OpenEditor(fraVisibility, cmdSetVisibility);
         cobVisibility->SetFocus();
     });
 }
 
 /// Centres an editor over the current cell, inside the control but for its upper edge, and shows
 /// it. The grid's top is added, its left is not; nor is there a lower bound for the top.
-void Zandor::OpenEditor(platform::Frame& frame, platform::CommandButton& set) {
+void Zandor::OpenEditor(const Part<platform::Frame>& frame,
+                        const Part<platform::CommandButton>& set) {
     constexpr float margin = 30;
-    const float width = frame.Width();
-    const float height = frame.Height();
+    const float width = frame->Width();
+    const float height = frame->Height();
 
     float left = single(sprColumn->CellLeft() + sprColumn->CellWidth() / 2 - width / 2);
-    if (single(left + width) <= mToolkit.ScaleWidth()) {
+    if (single(left + width) <= mToolkit->ScaleWidth()) {
         if (left < margin) left = margin;
     } else {
-        left = single(mToolkit.ScaleWidth() - width - margin);
+        left = single(mToolkit->ScaleWidth() - width - margin);
     }
     float top =
         single(sprColumn->Top() + sprColumn->CellTop() + sprColumn->CellHeight() / 2 - height / 2);
-    if (single(top + height) > mToolkit.ScaleHeight())
-        top = single(mToolkit.ScaleHeight() - height - margin);
+    if (single(top + height) > mToolkit->ScaleHeight())
+        top = single(mToolkit->ScaleHeight() - height - margin);
 
-    frame.setBounds({left, top, width, height});
-    frame.Visible(true);
-    frame.ZOrder();
-    set.Default(true);
+    frame->setBounds({left, top, width, height});
+    frame->Visible(true);
+    frame->ZOrder();
+    set->Default(true);
     if (const auto opened = mHooks.EditorOpened) opened();
 }
 

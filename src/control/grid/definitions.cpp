@@ -12,8 +12,8 @@ void Zandor::sprColumn_DragDrop(platform::Control*, float X, float Y) {
     Guard(u"sprColumn_DragDrop", [&] {
         if (mDragColumns.empty()) return;
         InsertDragColumns(X, Y);
-        mDragColumns.clear();
-        mEvents.Raise(Event::Activate, {});
+        EmptyDragColumns();
+        Raise(Event::Activate);
     });
 }
 
@@ -27,21 +27,28 @@ void Zandor::InsertDragColumns(float X, float Y) {
     if (mDragColumns.empty()) return;
     std::int32_t column = 0;
     std::int32_t row = 0;
-    basZandor::SpreadHitTest(mToolkit, column, row, *sprColumn, X, Y);
+    basZandor::SpreadHitTest(mLife, column, row, *sprColumn, X, Y);
     // By value: what is inserted is told to the host, which may begin another drag.
     InsertRecords(std::vector(mDragColumns), std::max(column, 1));
 }
 
 void Zandor::InsertRecords(const std::vector<Ref<clsDragColumn>>& records, std::int32_t column) {
+    const auto model = Model();
     for (const auto& record : records) {
-        String fieldName = record->Table()->Text() + u".";
-        fieldName += record->Column()->Text();
+        String fieldName = Hold(record->Table())->Text() + u".";
+        fieldName += Hold(record->Column())->Text();
+        const std::int32_t binding = mBinding;
         InsertColumnDefinition(fieldName, column);
         AddNewAndCriterium(record->ZDColumn(), column);
+        require(binding == mBinding);
         const auto definition = DefinitionOf(column);
-        if (const auto ordered = Ordered())
-            ordered->StandsBehind(definition, DefinitionBefore(column));
-        mEvents.Raise(Event::ColumnCreated, {.Definition = definition});
+        if (const auto ordered = Ordered()) {
+            const auto before = DefinitionBefore(column);
+            ordered->StandsBehind(definition, before);
+        }
+        Raise(Event::ColumnCreated, {.Definition = definition});
+        // The host may have bound another model; its columns are none of these.
+        require(mModel == model.pointer());
         ++column;
     }
 }
@@ -65,21 +72,26 @@ bool Zandor::InsertColumnDefinition(const String& fieldName, std::int32_t column
     return result;
 }
 
-/// The query, where it keeps the order of its definitions.
-platform::Ref<TalvikZandorLib::OrderedDefinitions> Zandor::Ordered() {
-    return std::dynamic_pointer_cast<TalvikZandorLib::OrderedDefinitions>(Model());
+/// Nothing where the query keeps no order of its definitions.
+Held<TalvikZandorLib::OrderedDefinitions> Zandor::Ordered() {
+    const Ref<TalvikZandorLib::Zandor> model = Model();
+    const Ref<TalvikZandorLib::OrderedDefinitions> ordered =
+        std::dynamic_pointer_cast<TalvikZandorLib::OrderedDefinitions>(model);
+    return Hold(ordered);
 }
 
 /// The definition of the nearest grid column to the left that has one; nothing where none has.
 /// Not by its position in the model, of which the grid may show less than there is.
-platform::Ref<TalvikZandorLib::ZDColumnDefinition> Zandor::DefinitionBefore(std::int32_t column) {
-    const auto model = Model();
+Held<TalvikZandorLib::ZDColumnDefinition> Zandor::DefinitionBefore(std::int32_t column) {
+    const std::int32_t binding = mBinding;
+    const auto definitions = Definitions();
     while (--column >= 1) {
         const std::int32_t number = sprColumn->ColData(column);
         if (number == 0) continue;
         const String key = keyOfNumber(number);
-        for (const auto& definition : platform::Each(model->ColumnDefinitions()))
+        for (const auto& definition : definitions)
             if (definition->Key() == key) return definition;
+        require(binding == mBinding);
     }
     return {};
 }
@@ -93,12 +105,15 @@ bool Zandor::MoveColumn(std::int32_t column, std::int32_t position) {
         std::int32_t last = sprColumn->Cols() - 1;
         while (sprColumn->ColData(last) == 0) --last;
         position = std::min(position, last);
+        const std::int32_t binding = mBinding;
         const auto definition = DefinitionOf(column);
         result = position == column;
         if (result) return;
-        ordered->StandsBehind(definition,
-                              DefinitionBefore(position < column ? position : position + 1));
+        const auto before = DefinitionBefore(position < column ? position : position + 1);
+        require(binding == mBinding);
+        ordered->StandsBehind(definition, before);
         MakeGetValueFieldsInvisible();
+        require(binding == mBinding);
         const std::int32_t current = sprColumn->Col();
         sprColumn->ColPosition(column, position);
         // The current cell goes with its column.
@@ -109,7 +124,7 @@ bool Zandor::MoveColumn(std::int32_t column, std::int32_t position) {
         else if (current < column && current >= position)
             sprColumn->Col(current + 1);
         result = true;
-        mEvents.Raise(Event::ColumnModified, {.Definition = definition});
+        Raise(Event::ColumnModified, {.Definition = definition});
     });
     return result;
 }
@@ -136,12 +151,17 @@ void Zandor::mnuColumnDefinitionDelete_Click() {
     Guard(u"mnuColumnDefinitionDelete_Click", [&] {
         std::int32_t column = 0;
         std::int32_t row = 0;
-        basZandor::SpreadHitTest(mToolkit, column, row, *sprColumn, mPopupX, mPopupY);
+        basZandor::SpreadHitTest(mLife, column, row, *sprColumn, mPopupX, mPopupY);
         if (column < 1) return;
+        const auto model = Model();
+        const std::int32_t number = sprColumn->ColData(column);
         const auto definition = DefinitionOf(column);
+        // The host may have shown its model anew when it was asked.
+        require(mModel == model.pointer() && sprColumn->ColData(column) == number);
         RemoveColumn(column);
-        Model()->ColumnDefinitions().Remove(definition->Key());
-        mEvents.Raise(Event::ColumnRemoved, {.Definition = definition});
+        const String key = definition->Key();
+        List(model, &TalvikZandorLib::Zandor::ColumnDefinitions).Remove(key);
+        Raise(Event::ColumnRemoved, {.Definition = definition});
     });
 }
 

@@ -2,31 +2,14 @@
 
 namespace TalvikDBxZandor {
 
+using TalvikZandorLib::ZDColumnDefinition;
+
 namespace {
 
 constexpr std::int32_t synonymRow = 1;
 constexpr std::int32_t sortRow = 2;
 constexpr std::int32_t visibleRow = 3;
 constexpr std::int32_t firstCriteriaRow = 4;
-
-/// Writes the text of a synonym or criteria row. False when there was nothing to change.
-bool storeText(TalvikZandorLib::ZDColumnDefinition& definition, std::int32_t row,
-               const platform::String& text) {
-    if (row == synonymRow) {
-        definition.Synonym(text);
-        return true;
-    }
-    const platform::String key = platform::decimal(row);
-    if (!definition.HasCriterium(key)) {
-        if (text.empty()) return false;
-        definition.AddCriterium(text, key);
-    } else if (text.empty()) {
-        definition.Criteria().Remove(key);
-    } else {
-        definition.Criteria().Item(key)->Criterium(text);
-    }
-    return true;
-}
 
 } // namespace
 
@@ -36,7 +19,7 @@ void Zandor::sprColumn_MouseDown(std::int16_t Button, std::int16_t, float X, flo
         if (Button != platform::leftButton) return;
         std::int32_t column = 0;
         std::int32_t row = 0;
-        basZandor::SpreadHitTest(mToolkit, column, row, *sprColumn, X, Y);
+        basZandor::SpreadHitTest(mLife, column, row, *sprColumn, X, Y);
         if (column == 0 || row == 0) return;
         sprColumn->Row(row);
         sprColumn->Col(column);
@@ -66,13 +49,42 @@ void Zandor::sprColumn_Scroll() {
     Guard(u"sprColumn_Scroll", [&] { MakeGetValueFieldsInvisible(); });
 }
 
+/// The cell that an editor was opened over, for what is written into it after the host has been
+/// told: a host that shows its model anew then makes another cell the current one.
+class Zandor::EditedCell {
+public:
+    explicit EditedCell(const Zandor& control)
+        : mControl(control), mRow(control.sprColumn->Row()), mColumn(control.sprColumn->Col()),
+          mNumber(control.sprColumn->ColData(mColumn)), mModel(control.mModel) {}
+
+    std::int32_t row() const { return mRow; }
+    std::int32_t column() const { return mColumn; }
+
+    /// Writes nothing where the column has become another definition's.
+    void set(const String& text, std::int16_t alignment) const {
+        const auto& grid = mControl.sprColumn;
+        if (mControl.mModel != mModel || grid->ColData(mColumn) != mNumber) return;
+        grid->Col(mColumn);
+        grid->Row(mRow);
+        mControl.SetCell(text, alignment);
+    }
+
+private:
+    const Zandor& mControl;
+    const std::int32_t mRow;
+    const std::int32_t mColumn;
+    const std::int32_t mNumber;
+    const Ref<TalvikZandorLib::Zandor> mModel;
+};
+
 void Zandor::cmdSetSortOrder_Click() {
     Guard(u"cmdSetSortOrder_Click", [&] {
-        if (Model()->ColumnDefinitions().Count() != 0) {
-            const auto definition = DefinitionOf(sprColumn->Col());
+        if (Definitions().Count() != 0) {
+            const EditedCell cell(*this);
+            const auto definition = DefinitionOf(cell.column());
             definition->SortOrder(cobSortOrder->ListIndex());
-            mEvents.Raise(Event::ColumnModified, {.Definition = definition});
-            SetCell(cobSortOrder->Text(), MSFlexGridLib::alignCenterCenter);
+            Raise(Event::ColumnModified, {.Definition = definition});
+            cell.set(cobSortOrder->Text(), MSFlexGridLib::alignCenterCenter);
         }
         fraSortOrder->Visible(false);
     });
@@ -80,11 +92,12 @@ void Zandor::cmdSetSortOrder_Click() {
 
 void Zandor::cmdSetVisibility_Click() {
     Guard(u"cmdSetVisibility_Click", [&] {
-        if (Model()->ColumnDefinitions().Count() != 0) {
-            const auto definition = DefinitionOf(sprColumn->Col());
+        if (Definitions().Count() != 0) {
+            const EditedCell cell(*this);
+            const auto definition = DefinitionOf(cell.column());
             definition->Visible(cobVisibility->ListIndex() == 0);
-            mEvents.Raise(Event::ColumnModified, {.Definition = definition});
-            SetCell(cobVisibility->Text(), MSFlexGridLib::alignCenterCenter);
+            Raise(Event::ColumnModified, {.Definition = definition});
+            cell.set(cobVisibility->Text(), MSFlexGridLib::alignCenterCenter);
         }
         fraVisibility->Visible(false);
     });
@@ -92,19 +105,40 @@ void Zandor::cmdSetVisibility_Click() {
 
 void Zandor::cmdSetTextValue_Click() {
     Guard(u"cmdSetTextValue_Click", [&] {
-        if (Model()->ColumnDefinitions().Count() != 0) {
-            const std::int32_t row = sprColumn->Row();
-            const auto definition = DefinitionOf(sprColumn->Col());
+        if (Definitions().Count() != 0) {
+            const EditedCell cell(*this);
+            const auto definition = DefinitionOf(cell.column());
             const String text = txtValue->Text();
             // A drop under an open editor makes the new column's field current: nothing to write.
-            if (row == synonymRow || row >= firstCriteriaRow) {
-                if (storeText(*definition, row, text))
-                    mEvents.Raise(Event::ColumnModified, {.Definition = definition});
-                SetCell(text, MSFlexGridLib::alignLeftCenter);
+            if (cell.row() == synonymRow || cell.row() >= firstCriteriaRow) {
+                if (StoreText(definition, cell.row(), text))
+                    Raise(Event::ColumnModified, {.Definition = definition});
+                cell.set(text, MSFlexGridLib::alignLeftCenter);
             }
         }
         fraValue->Visible(false);
     });
+}
+
+/// Writes the text of a synonym or criteria row. False when there was nothing to change.
+bool Zandor::StoreText(const Held<ZDColumnDefinition>& definition, std::int32_t row,
+                       const String& text) {
+    if (row == synonymRow) {
+        definition->Synonym(text);
+        return true;
+    }
+    const String key = platform::decimal(row);
+    if (!definition->HasCriterium(key)) {
+        if (text.empty()) return false;
+        definition->AddCriterium(text, key);
+        return true;
+    }
+    const auto criteria = List(definition, &ZDColumnDefinition::Criteria);
+    if (text.empty())
+        criteria.Remove(key);
+    else
+        criteria.Item(key)->Criterium(text);
+    return true;
 }
 
 void Zandor::cobSortOrder_KeyDown(std::int16_t KeyCode, std::int16_t) {

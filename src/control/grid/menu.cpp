@@ -4,14 +4,14 @@ namespace TalvikDBxZandor {
 
 void Zandor::PopupZandorMenu(std::int16_t source, float X, float Y) {
     Guard(u"PopupZandorMenu", [&] {
-        mEvents.Raise(Event::Activate, {});
+        Raise(Event::Activate);
         CheckMenus(source, X, Y);
         // Window frameworks that watch the control's window learn that a menu is open.
-        const std::uint32_t message = mToolkit.RegisterWindowMessage(u"TALVIKDISABLEVELT");
+        const std::uint32_t message = mToolkit->RegisterWindowMessage(u"TALVIKDISABLEVELT");
         std::int32_t scratch = 0;
-        if (message > 0) mToolkit.SendMessage(message, 0, &scratch);
+        if (message > 0) mToolkit->SendMessage(message, 0, &scratch);
         mnuZandor->PopupMenuAtMouse();
-        if (message > 0) mToolkit.SendMessage(message, 1, &scratch);
+        if (message > 0) mToolkit->SendMessage(message, 1, &scratch);
     });
 }
 
@@ -40,7 +40,7 @@ void Zandor::CheckMenus(std::int16_t source, float X, float Y) {
             mnuColumnDefinitionPaste->Enabled(!mDragColumns.empty());
             std::int32_t column = 0;
             std::int32_t row = 0;
-            basZandor::SpreadHitTest(mToolkit, column, row, *sprColumn, mPopupX, mPopupY);
+            basZandor::SpreadHitTest(mLife, column, row, *sprColumn, mPopupX, mPopupY);
             if (column >= 1 && !sprColumn->TextMatrix(0, column).empty())
                 mnuColumnDefinitionDelete->Enabled(true);
         }

@@ -11,17 +11,17 @@ using platform::toInteger;
 
 void Zandor::SetLanguageOfJoinDefinition(frmJoinDefinition& dialog) {
     Guard(u"SetLanguageOfJoinDefinition", [&] {
-        const auto dress = [this](auto& control, const String& caption) {
-            control.Font(mToolkit.ControlFont());
-            control.Caption(caption);
+        const auto dress = [this](const auto& control, const String& caption) {
+            control->Font(mToolkit->ControlFont());
+            control->Caption(caption);
         };
-        dress(*dialog.lblLeftTable, LNGJoinLeftTable);
-        dress(*dialog.lblLeftColumn, LNGJoinLeftColumn);
-        dress(*dialog.lblRightTable, LNGJoinRightTable);
-        dress(*dialog.lblRightColumn, LNGJoinRightColumn);
-        dress(*dialog.lblJoinType, LNGJoinType);
-        dress(*dialog.cmdOk, LNGJoinOk);
-        dress(*dialog.cmdCancel, LNGJoinCancel);
+        dress(dialog.lblLeftTable, LNGJoinLeftTable);
+        dress(dialog.lblLeftColumn, LNGJoinLeftColumn);
+        dress(dialog.lblRightTable, LNGJoinRightTable);
+        dress(dialog.lblRightColumn, LNGJoinRightColumn);
+        dress(dialog.lblJoinType, LNGJoinType);
+        dress(dialog.cmdOk, LNGJoinOk);
+        dress(dialog.cmdCancel, LNGJoinCancel);
     });
 }
 
@@ -29,11 +29,11 @@ void Zandor::SetEnabledJoinTypes(frmJoinDefinition& dialog) {
     Guard(u"SetEnabledJoinTypes", [&] {
         const String* const texts[] = {&LNGJoinTypeNormal, &LNGJoinTypeLeftOuter,
                                        &LNGJoinTypeRightOuter, &LNGJoinTypeBothOuter};
-        auto& list = *dialog.cboJoinType;
-        list.Font(mToolkit.ControlFont());
-        list.Clear();
+        const auto& list = dialog.cboJoinType;
+        list->Font(mToolkit->ControlFont());
+        list->Clear();
         for (std::size_t code = 0; code < std::size(texts); ++code)
-            if (mUseJoinType[code]) list.AddItem(*texts[code]);
+            if (mUseJoinType[code]) list->AddItem(*texts[code]);
     });
 }
 
@@ -41,10 +41,10 @@ void Zandor::SetEnabledJoinOperators(frmJoinDefinition& dialog) {
     // Shares its report name with the list of types.
     Guard(u"SetEnabledJoinTypes", [&] {
         const platform::StringView symbols[] = {u"=", u"<>", u"<", u">", u"<=", u">="};
-        auto& list = *dialog.cboJoinCompareOperator;
-        list.Clear();
+        const auto& list = dialog.cboJoinCompareOperator;
+        list->Clear();
         for (std::size_t code = 0; code < std::size(symbols); ++code)
-            if (mUseOperator[code]) list.AddItem(String(symbols[code]));
+            if (mUseOperator[code]) list->AddItem(String(symbols[code]));
     });
 }
 
@@ -52,8 +52,9 @@ void Zandor::mnuJoinShowDefinition_Click() {
     Guard(u"mnuJoinShowDefinition_Click", [&] {
         Ref<clsJoinLine> record;
         if (!JoinHitTest(record, mPopupX, mPopupY)) return;
-        frmJoinDefinition dialog(mToolkit, mDebugSwitch != 0);
+        frmJoinDefinition dialog(mLife, *mToolkit, mDebugSwitch != 0);
         dialog.form->Caption(LNGJoinForm);
+        const auto model = Model();
         const auto join = ModelJoin(*record);
         join->CompareOperator(toInteger(record->CompareOperator()));
         join->JoinType(toInteger(record->JoinType()));
@@ -68,11 +69,18 @@ void Zandor::mnuJoinShowDefinition_Click() {
         if (!dialog.JoinIsModified()) return;
 
         // The record follows the model: the mark of an outer join changes at once, and the dialog
-        // opens on the new values the next time.
-        record->CompareOperator(join->CompareOperator());
-        record->JoinType(join->JoinType());
-        DrawJoin(*record);
-        mEvents.Raise(Event::JoinModified, {.Join = join});
+        // opens on the new values the next time. It may be another one: while the dialog stood
+        // open, the host may have shown its model anew.
+        const std::int16_t compareOperator = join->CompareOperator();
+        const std::int16_t joinType = join->JoinType();
+        require(mModel == model.pointer());
+        for (const auto& drawn : platform::Each<clsJoinLine>(mJoinLines)) {
+            if (drawn->Tag() != record->Tag()) continue;
+            drawn->CompareOperator(compareOperator);
+            drawn->JoinType(joinType);
+            DrawJoin(*drawn);
+        }
+        Raise(Event::JoinModified, {.Join = join});
     });
 }
 

@@ -29,6 +29,19 @@ void sizeMark(platform::Shape& mark) {
     mark.setBounds({mark.Left(), mark.Top(), connectorSize, connectorSize});
 }
 
+/// Its left edge is in place even where its top cannot be told.
+void placeMark(platform::Shape& mark, float left, float rowMiddle,
+               const TalvikTabulet::Tabulet& table) {
+    platform::Bounds place{left, mark.Top(), connectorSize, connectorSize};
+    try {
+        place.Top = clampedTop(rowMiddle, connectorSize, table);
+    } catch (...) {
+        mark.setBounds(place);
+        throw;
+    }
+    mark.setBounds(place);
+}
+
 } // namespace
 
 bool Zandor::DrawJoin(clsJoinLine& JoinLine) {
@@ -40,6 +53,8 @@ bool Zandor::DrawJoin(clsJoinLine& JoinLine) {
     return result;
 }
 
+// Nothing on this way reaches the host, so it holds nothing: it is gone for every join at each step
+// of a table that moves.
 void Zandor::PlaceJoin(const clsJoinLine& JoinLine) {
     Ref<Tabulet> leftTable, rightTable;
     Ref<ColumnItem> leftItem, rightItem;
@@ -69,10 +84,8 @@ void Zandor::PlaceJoin(const clsJoinLine& JoinLine) {
     const auto westPoint = (leftIsWest ? leftItem : rightItem)->RightEdgePoint();
     const auto eastPoint = (leftIsWest ? rightItem : leftItem)->LeftEdgePoint();
 
-    markA.setBounds(
-        {westPoint.X, clampedTop(westPoint.Y, connectorSize, west), connectorSize, connectorSize});
-    markB.setBounds({single(eastPoint.X - connectorSize),
-                     clampedTop(eastPoint.Y, connectorSize, east), connectorSize, connectorSize});
+    placeMark(markA, westPoint.X, westPoint.Y, west);
+    placeMark(markB, single(eastPoint.X - connectorSize), eastPoint.Y, east);
 
     // The circle stands at the eastern end whichever side of the join that is; only with both
     // tables at the same place does it stand at the western one.

@@ -9,11 +9,11 @@ using platform::toInteger;
 
 /// The model's counterpart of a join on the canvas. Error 13 when the record's Tag is no text,
 /// 5 when the model holds no join under it.
-platform::Ref<TalvikZandorLib::ZDJoin> Zandor::ModelJoin(const clsJoinLine& record) {
+Held<TalvikZandorLib::ZDJoin> Zandor::ModelJoin(const clsJoinLine& record) {
     const platform::Variant tag = record.Tag();
     const String* const key = std::get_if<String>(&tag);
     if (!key) throw platform::errors::typeMismatch();
-    return Model()->Joins().Item(*key);
+    return Joins().Item(*key);
 }
 
 // The test reads the records' column texts, which a join made on the canvas leaves empty: such a
@@ -43,6 +43,9 @@ bool Zandor::DrawNewJoin(Ref<clsJoinLine>& NewJoinLine, const Ref<Tabulet>& left
     bool result = false;
     Guard(u"DrawNewJoin", [&] {
         if (JoinAllreadyExists(leftTable, leftColumn, rightTable, rightColumn)) return;
+        // A table that has been closed since its column was copied is joined to nothing.
+        const auto gone = [this](const auto& table) { return table && !Shows(Hold(table)); };
+        if (gone(leftTable) || gone(rightTable)) return;
         std::int32_t n = 0;
         if (!mJoinFreeList->GetNextFreeIndex(n)) return;
 
@@ -50,7 +53,7 @@ bool Zandor::DrawNewJoin(Ref<clsJoinLine>& NewJoinLine, const Ref<Tabulet>& left
         shpJoin.Load(toInteger(2.0 * n));
         shpJoin.Load(toInteger(2.0 * n - 1));
 
-        auto record = platform::makeRef<clsJoinLine>(mToolkit);
+        auto record = platform::makeRef<clsJoinLine>(mLife);
         record->LeftTablehwnd(leftTable->TableHandle());
         record->RightTablehwnd(rightTable->TableHandle());
         record->JoinLineIndex(n);
@@ -66,17 +69,21 @@ bool Zandor::DrawNewJoin(Ref<clsJoinLine>& NewJoinLine, const Ref<Tabulet>& left
         mJoinLines.Add(record, decimal(n));
 
         DrawJoin(*record);
+        // Where the drawing failed, the host may have answered the report by closing a table.
+        require(Draws(record));
         NewJoinLine = record;
         result = true;
     });
     return result;
 }
 
-void Zandor::AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTable,
+/// False when the model has not taken the join.
+bool Zandor::AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTable,
                         const ZDColumnRef& leftColumn, const ZDTableRef& rightTable,
                         const ZDColumnRef& rightColumn) {
+    bool result = false;
     Guard(u"AddNewJoin", [&] {
-        const Ref<TalvikZandorLib::ZDJoin> join = mLibrary.NewZDJoin();
+        const auto join = Hold(mLibrary->NewZDJoin());
         join->LeftTable(leftTable);
         join->LeftColumn(leftColumn);
         join->RightTable(rightTable);
@@ -84,12 +91,40 @@ void Zandor::AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTa
         // A join drawn by the user always enters the model as a normal one with "=".
         join->JoinType(0);
         join->CompareOperator(0);
-        const auto stored = Model()->AddJoin(join);
+        const auto stored = Hold(Model()->AddJoin(join));
+        result = true;
         record->Tag(stored->Key());
     });
+    return result;
 }
 
-bool Zandor::RemoveJoin(const Ref<clsJoinLine>& record) {
+/// Draws a join of a dragged or copied column and hands it to the model. Nothing when none was made
+/// or it cannot be told from others; a join that the model refuses does not stay drawn.
+platform::Ref<clsJoinLine> Zandor::JoinTo(const clsDragColumn& source, const Held<Tabulet>& table,
+                                          const Ref<ColumnItem>& target) {
+    Ref<clsJoinLine> record;
+    if (!DrawNewJoin(record, source.Table(), source.Column(), table, target, 0, 0)) return {};
+    const auto rightTable = TableOf(table);
+    const auto columns = List(rightTable, &TalvikZandorLib::ZDTable::Columns);
+    const auto rightColumn = columns.Item(Hold(target)->Key());
+    if (!Draws(record)) return {};
+    const bool taken =
+        AddNewJoin(record, source.ZDTable(), source.ZDColumn(), rightTable, rightColumn);
+    if (!taken && Draws(record)) RemoveJoin(record);
+    return HasTag(*record) ? record : nullptr;
+}
+
+bool Zandor::HasTag(const clsJoinLine& record) {
+    return !std::holds_alternative<std::monostate>(record.Tag());
+}
+
+/// Whether a join is still drawn; the host may have removed it.
+bool Zandor::Draws(const Ref<clsJoinLine>& record) const {
+    const String key = decimal(record->Index());
+    return mJoinLines.Contains(key) && mJoinLines.Item(key) == record;
+}
+
+bool Zandor::RemoveJoin(const Ref<clsJoinLine> record) {
     bool result = false;
     Guard(u"RemoveJoin", [&] {
         const std::int16_t n = record->Index();
@@ -111,14 +146,10 @@ void Zandor::mnuTableDefinitionPaste_Click() {
         if (mDragColumns.empty()) return;
         const Ref<clsDragColumn> source = mDragColumns.front();
         if (source->TableIndex() == mActiveTableIndex) return;
-        const Ref<Tabulet> table = lstTable(mActiveTableIndex);
+        const auto table = Hold(lstTable(mActiveTableIndex));
         const Ref<ColumnItem> target = FirstSelected(*table);
         if (!target || IsAllColumns(*target) || IsAllColumns(*source->Column())) return;
-        Ref<clsJoinLine> record;
-        if (!DrawNewJoin(record, source->Table(), source->Column(), table, target, 0, 0)) return;
-        const ZDTableRef rightTable = TableOf(mActiveTableIndex);
-        AddNewJoin(record, source->ZDTable(), source->ZDColumn(), rightTable,
-                   rightTable->Columns().Item(target->Key()));
+        JoinTo(*source, table, target);
     });
 }
 
@@ -126,10 +157,18 @@ void Zandor::mnuJoinDelete_Click() {
     Guard(u"mnuJoinDelete_Click", [&] {
         Ref<clsJoinLine> record;
         if (!JoinHitTest(record, mPopupX, mPopupY)) return;
+        if (!HasTag(*record)) {
+            // Drawn, but never taken by the model: there is nothing else to remove.
+            RemoveJoin(record);
+            return;
+        }
+        const auto model = Model();
         const auto join = ModelJoin(*record);
+        require(Draws(record));
         RemoveJoin(record);
-        Model()->Joins().Remove(join->Key());
-        mEvents.Raise(Event::JoinRemoved, {.Join = join});
+        const String key = join->Key();
+        List(model, &TalvikZandorLib::Zandor::Joins).Remove(key);
+        Raise(Event::JoinRemoved, {.Join = join});
     });
 }
 

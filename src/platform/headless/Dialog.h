@@ -12,7 +12,10 @@ public:
     void ShowModal() override;
     void Hide() override;
 
+    /// As its user closes it by the frame.
     void close();
+    /// It is gone, and nobody is told.
+    void dismiss() { setVisible(false); }
 
 private:
     DialogEvents mEvents;

@@ -31,9 +31,16 @@ Element::Element(Toolkit& toolkit, const Design& design, Element* container)
 }
 
 Element::~Element() {
-    giveUpFocus();
     for (Element* child : mChildren) child->mContainer = nullptr;
+    leave();
+}
+
+void Element::leave() {
+    giveUpFocus();
+    mLook.visible = false;
     if (mContainer) std::erase(mContainer->mChildren, this);
+    mContainer = nullptr;
+    mToolkit.strike(*this);
 }
 
 const Element& Element::window() const {

@@ -66,6 +66,8 @@ protected:
     void setEnabled(bool value);
     void place(const Bounds& bounds) { mBounds = bounds; }
     void bringToFront();
+    /// Out of its container and out of what the toolkit finds, for good.
+    void leave();
 
 private:
     virtual void gotFocus() {}

@@ -186,6 +186,13 @@ void Tabulet::Terminate() {
     dropEntries();
 }
 
+void Tabulet::Unload() {
+    called("Unload");
+    dropEntries();
+    mToolkit.endDragOf(this);
+    leave();
+}
+
 ColumnItem& Tabulet::entry(std::int32_t position) const {
     if (position < 1 || position > static_cast<std::int32_t>(mItems.size()))
         throw errors::subscriptOutOfRange();

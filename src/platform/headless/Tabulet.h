@@ -70,6 +70,7 @@ public:
     void Drag(std::int16_t action) override;
     void Complete() override;
     void Terminate() override;
+    void Unload() override;
 
     const std::vector<Ref<TalvikTabulet::ColumnItem>>& entries() const { return mItems; }
     /// Error 9 outside 1 to the number of entries.

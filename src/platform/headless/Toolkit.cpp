@@ -186,6 +186,11 @@ void Toolkit::endDragOf(const Tabulet* table) {
     if (mDragged == table) mDragged = nullptr;
 }
 
+void Toolkit::close() {
+    for (Dialog* dialog : mDialogs) dialog->dismiss();
+    mSurface.hide();
+}
+
 std::string Toolkit::openMenu(const PopupMenu& menu) {
     struct Open {
         explicit Open(bool& flag) : flag(flag) { flag = true; }

@@ -34,6 +34,7 @@ class Surface final : public Element {
 public:
     explicit Surface(Toolkit& toolkit);
     void resize(float width, float height) { place({0, 0, width, height}); }
+    void hide() { setVisible(false); }
 };
 
 /// A toolkit without a screen. It keeps everything that a user could see, for tests to look at; the
@@ -64,6 +65,9 @@ public:
     std::function<std::string(const PopupMenu&)> onMenu;
     /// Called while a dialog stands open. Unset: the user closes it.
     std::function<void(Dialog&)> onDialog;
+
+    /// The control has ended: what stands open closes, and its user can reach nothing of it.
+    void close();
 
     const std::vector<MessageBox>& boxes() const { return mBoxes; }
     const std::vector<WindowMessage>& messages() const { return mMessages; }

@@ -40,17 +40,7 @@ public:
                             QVariant::fromValue(static_cast<void*>(static_cast<Control*>(this))));
     }
 
-    ~Adapter() override {
-        if (!mWidget) return;
-        mFocus.release(mWidget);
-        mFocus.forget(mWidget);
-        mWidget->setProperty(controlProperty, QVariant());
-        mWidget->setObjectName(QString());
-        mWidget->hide();
-        mWidget->blockSignals(true);
-        // The widget may be in the middle of the very event that ends it.
-        mWidget->deleteLater();
-    }
+    ~Adapter() override { dropWidget(); }
 
     QWidget* widget() const override { return mWidget; }
 
@@ -65,6 +55,21 @@ public:
     }
 
 protected:
+    /// Lets the widget go.
+    void dropWidget() {
+        const QPointer<W> widget = std::exchange(mWidget, nullptr);
+        if (!widget) return;
+        widget->setProperty(controlProperty, QVariant());
+        widget->setObjectName(QString());
+        mFocus.forget(widget);
+        mFocus.release(widget);
+        if (!widget) return;
+        widget->hide();
+        widget->blockSignals(true);
+        // The widget may be in the middle of the very event that ends it.
+        widget->deleteLater();
+    }
+
     /// The container's layout places the widget, not the control.
     bool laidOut() const {
         const QWidget* parent = mWidget ? mWidget->parentWidget() : nullptr;

@@ -119,15 +119,19 @@ TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus,
     });
 }
 
-TabuletAdapter::~TabuletAdapter() {
+TabuletAdapter::~TabuletAdapter() { leave(); }
+
+void TabuletAdapter::leave() {
     Terminate();
     mDrags.forget(this);
     if (mSurroundings.current == this) mSurroundings.current = nullptr;
     if (!mWidget) return;
-    mFocus.release(mWidget);
-    mFocus.forget(&mWidget->list());
     mWidget->setListener(nullptr);
+    mFocus.forget(&mWidget->list());
+    dropWidget();
 }
+
+void TabuletAdapter::Unload() { leave(); }
 
 void TabuletAdapter::Text(const String& value) {
     mText = value;

@@ -46,6 +46,7 @@ public:
     void Drag(std::int16_t action) override;
     void Complete() override;
     void Terminate() override;
+    void Unload() override;
 
 private:
     class Entry;
@@ -75,6 +76,7 @@ private:
     void gestureEnded(Qt::Edges edges) override;
     bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) override;
     bool dropped(const QMimeData* data, QPointF at) override;
+    void leave();
     void report(const TalvikTabulet::TabuletEvents::Mouse& handler, int row, std::int16_t button,
                 std::int16_t shift);
 
