@@ -66,6 +66,7 @@ void DragSession::runRequested() {
     QWidget* const widget = std::exchange(mRequestedBy, nullptr);
     if (!mSource) return;
 
+    const std::shared_ptr<void> kept = mKeeper.lock();
     const QPointer<DragSession> alive = this;
     mRunning = true;
     const QPointer<QDrag> drag = new QDrag(widget);
@@ -81,6 +82,12 @@ void DragSession::runRequested() {
     mRunning = false;
     if (const auto deliver = std::exchange(mDrop, nullptr); deliver && mSource) deliver();
     if (alive) mSource = nullptr;
+}
+
+void DragSession::cancel() {
+    mSource = nullptr;
+    mRequestedBy = nullptr;
+    if (mDrag) QDrag::cancel();
 }
 
 void DragSession::forget(const Control* source) {

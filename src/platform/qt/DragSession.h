@@ -9,6 +9,7 @@
 #include <QStringList>
 
 #include <functional>
+#include <memory>
 
 class QDrag;
 class QMimeData;
@@ -28,6 +29,11 @@ public:
     /// For platforms that carry no drags themselves, such as those without a screen. The default
     /// is Qt's own modal loop.
     void setCarrier(Carrier carrier) { mCarrier = std::move(carrier); }
+
+    /// What a running drag stands on, which the host may take away while it runs.
+    void setKeeper(std::weak_ptr<void> keeper) { mKeeper = std::move(keeper); }
+    /// The control has ended: a drag that runs ends, and drops nothing.
+    void cancel();
 
     /// Asks for a drag with `source` as its source. It begins as soon as the event at hand has
     /// been dealt with; while a drag runs, requests are ignored.
@@ -56,6 +62,7 @@ private:
     QPointer<QDrag> mDrag;
     Carrier mCarrier;
     std::function<void()> mDrop;
+    std::weak_ptr<void> mKeeper;
 };
 
 } // namespace platform::qt

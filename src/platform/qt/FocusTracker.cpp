@@ -7,7 +7,7 @@
 
 namespace platform::qt {
 
-FocusTracker::FocusTracker(QWidget& surface) : mSurface(surface) {}
+FocusTracker::FocusTracker(QWidget& surface) : mSurface(&surface) {}
 
 void FocusTracker::watch(QWidget* widget, std::function<void()> gotFocus) {
     mNotices.insert(widget, std::move(gotFocus));
@@ -31,11 +31,12 @@ void FocusTracker::take(QWidget* widget) {
 }
 
 void FocusTracker::release(QWidget* widget) {
-    const QWidget* focused = mSurface.window()->focusWidget();
+    if (!mSurface) return;
+    const QWidget* focused = mSurface->window()->focusWidget();
     if (!focused || (focused != widget && !widget->isAncestorOf(focused))) return;
     const bool toFallback = mFallback && mFallback->isVisible() && mFallback != widget &&
                             !widget->isAncestorOf(mFallback);
-    (toFallback ? mFallback.data() : &mSurface)->setFocus(Qt::OtherFocusReason);
+    (toFallback ? mFallback : mSurface)->setFocus(Qt::OtherFocusReason);
 }
 
 bool FocusTracker::eventFilter(QObject* watched, QEvent* event) {

@@ -27,7 +27,7 @@ public:
 
     /// Whether there is a focus to be had: not before the control's window is shown, nor after it
     /// was closed.
-    bool onScreen() const { return mSurface.isVisible(); }
+    bool onScreen() const { return mSurface && mSurface->isVisible(); }
 
     /// If the focus is inside the widget, moves it to the fallback, or else to the control's own
     /// surface; nobody is told.
@@ -41,7 +41,7 @@ public:
 private:
     void enter(QWidget* widget);
 
-    QWidget& mSurface;
+    const QPointer<QWidget> mSurface;
     QPointer<QWidget> mFallback;
     QPointer<QWidget> mOwner;
     QHash<QObject*, std::function<void()>> mNotices;

@@ -11,7 +11,12 @@ namespace platform::qt {
 inline constexpr char promptProperty[] = "prompt";
 inline constexpr char styleProperty[] = "style";
 
-/// Shows a box and returns when the user has closed it. Does nothing without an application.
-void showMessageBox(QWidget* parent, const String& prompt, std::int32_t style, const String& title);
+/// Whose box, dialog or menu it is: a control that ends closes its own.
+inline constexpr char ownerProperty[] = "zandorOwner";
+
+/// Shows a box and returns when it has closed, be it by its user or because its parent or its owner
+/// has gone. Does nothing without an application.
+void showMessageBox(QWidget* parent, const String& prompt, std::int32_t style, const String& title,
+                    const void* owner = nullptr);
 
 } // namespace platform::qt

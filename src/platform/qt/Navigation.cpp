@@ -32,14 +32,14 @@ Qt::FocusReason reason(bool next) { return next ? Qt::TabFocusReason : Qt::Backt
 void Navigation::setGrid(GridWidget* grid) { mGrid = grid; }
 
 QWidget* Navigation::focused() const {
-    QWidget* const widget = mSurface.window()->focusWidget();
-    return holds(&mSurface, widget) ? widget : nullptr;
+    QWidget* const widget = mSurface ? mSurface->window()->focusWidget() : nullptr;
+    return holds(mSurface, widget) ? widget : nullptr;
 }
 
 QWidget* Navigation::grid() const { return mGrid && mGrid->isVisible() ? mGrid.data() : nullptr; }
 
 QWidget* Navigation::editorAround(QWidget* widget) const {
-    while (widget && widget->parentWidget() != &mSurface) widget = widget->parentWidget();
+    while (widget && widget->parentWidget() != mSurface) widget = widget->parentWidget();
     return dynamic_cast<RowFrame*>(widget);
 }
 
@@ -122,8 +122,9 @@ bool Navigation::leave(bool next) {
     const auto step = [next](QWidget* widget) {
         return next ? widget->nextInFocusChain() : widget->previousInFocusChain();
     };
-    for (QWidget* widget = step(&mSurface); widget != &mSurface; widget = step(widget)) {
-        if (mSurface.isAncestorOf(widget) || !takesTab(*widget)) continue;
+    if (!mSurface) return false;
+    for (QWidget* widget = step(mSurface); widget != mSurface; widget = step(widget)) {
+        if (mSurface->isAncestorOf(widget) || !takesTab(*widget)) continue;
         widget->setFocus(reason(next));
         return true;
     }
@@ -159,7 +160,7 @@ bool Navigation::changePane() {
 
 bool Navigation::keyPressed(const QKeyEvent& event) {
     if (event.key() == Qt::Key_F6 && modifiersOf(event) == Qt::NoModifier) return changePane();
-    const bool onCanvas = focused() && (focused() == mView.canvas() || focused() == &mSurface);
+    const bool onCanvas = focused() && (focused() == mView.canvas() || focused() == mSurface);
     return onCanvas && scroll(event);
 }
 

@@ -21,7 +21,7 @@ class GridWidget;
 class Navigation {
 public:
     Navigation(QWidget& surface, CanvasView& view, const comforts::Comforts& comforts)
-        : mSurface(surface), mView(view), mComforts(comforts) {}
+        : mSurface(&surface), mView(view), mComforts(comforts) {}
 
     void setGrid(GridWidget* grid);
     void setHomeButton(QWidget* button) { mHome = button; }
@@ -57,7 +57,7 @@ private:
     bool changePane();
     bool scroll(const QKeyEvent& event);
 
-    QWidget& mSurface;
+    const QPointer<QWidget> mSurface; ///< goes before the rest, where the host takes it away
     CanvasView& mView;
     const comforts::Comforts& mComforts;
     QPointer<QWidget> mGrid;

@@ -1,9 +1,11 @@
 #include "platform/qt/PopupMenu.h"
 
+#include "platform/qt/MessageBox.h"
 #include "platform/qt/Text.h"
 
 #include <QCursor>
 #include <QPointer>
+#include <QVariant>
 
 namespace platform::qt {
 
@@ -33,9 +35,10 @@ private:
 } // namespace
 
 PopupMenuAdapter::PopupMenuAdapter(QWidget& surface, KeyboardMenu& keys, const Design& design,
-                                   PlainEvent Click)
+                                   PlainEvent Click, const void* owner)
     : mSurface(surface), mKeys(keys), mClick(std::move(Click)) {
     mMenu.setObjectName(toQt(design.Name));
+    mMenu.setProperty(ownerProperty, QVariant::fromValue(const_cast<void*>(owner)));
 }
 
 std::unique_ptr<MenuEntry> PopupMenuAdapter::makeEntry(const Design& design, PlainEvent Click) {

@@ -9,7 +9,8 @@ namespace platform::qt {
 
 class PopupMenuAdapter final : public platform::PopupMenu {
 public:
-    PopupMenuAdapter(QWidget& surface, KeyboardMenu& keys, const Design& design, PlainEvent Click);
+    PopupMenuAdapter(QWidget& surface, KeyboardMenu& keys, const Design& design, PlainEvent Click,
+                     const void* owner);
 
     std::unique_ptr<MenuEntry> makeEntry(const Design& design, PlainEvent Click) override;
     void PopupMenuAtMouse() override;

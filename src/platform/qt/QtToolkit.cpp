@@ -66,9 +66,17 @@ std::unique_ptr<AdapterType> QtToolkit::adapt(const Design& design, Role role, W
     return adapter;
 }
 
+void QtToolkit::dismiss() {
+    mDrags.cancel();
+    mView.setNamer({});
+    // What is open closes from the top down; none of it tells the control anything any more.
+    for (QWidget* window : QApplication::topLevelWidgets())
+        if (window->property(ownerProperty).value<void*>() == this) window->close();
+}
+
 void QtToolkit::MsgBox(const String& prompt, std::int32_t style, const String& title) {
     QWidget* const parent = window();
-    showMessageBox(parent && parent->isVisible() ? parent : nullptr, prompt, style, title);
+    showMessageBox(parent && parent->isVisible() ? parent : nullptr, prompt, style, title, this);
 }
 
 std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents events) {
@@ -143,7 +151,7 @@ std::unique_ptr<MSFlexGridLib::MSFlexGrid> QtToolkit::makeGrid(const Design& des
 }
 
 std::unique_ptr<PopupMenu> QtToolkit::makePopupMenu(const Design& design, PlainEvent Click) {
-    return std::make_unique<PopupMenuAdapter>(mSurface, mMenu, design, std::move(Click));
+    return std::make_unique<PopupMenuAdapter>(mSurface, mMenu, design, std::move(Click), this);
 }
 
 std::unique_ptr<Dialog> QtToolkit::makeDialog(const Design& design, DialogEvents events) {
@@ -153,6 +161,7 @@ std::unique_ptr<Dialog> QtToolkit::makeDialog(const Design& design, DialogEvents
     dialog->setLayoutDirection(mSurface.layoutDirection());
     dialog->setWindowTitle(toQt(design.Caption));
     dialog->setObjectName(toQt(design.Name));
+    dialog->setProperty(ownerProperty, QVariant::fromValue(static_cast<void*>(this)));
     return std::make_unique<DialogAdapter>(dialog, mFocus);
 }
 

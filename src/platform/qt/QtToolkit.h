@@ -24,6 +24,8 @@ public:
 
     /// The surface is about to go: boxes shown from now on stand on their own.
     void close() { mClosing = true; }
+    /// The control has ended: its boxes, its dialog, its menu and its drag end too, untold.
+    void dismiss();
     DragSession& drags() { return mDrags; }
     CanvasView& view() { return mView; }
     Navigation& navigation() { return mNavigation; }

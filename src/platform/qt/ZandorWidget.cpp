@@ -8,7 +8,10 @@
 
 #include <QKeyEvent>
 #include <QPaintEvent>
+#include <QPointer>
 #include <QWheelEvent>
+
+#include <optional>
 
 using platform::qt::fromQt;
 using platform::qt::toQt;
@@ -40,16 +43,49 @@ private:
     ZandorWidget& mWidget;
 };
 
+/// What the control stands on. When the widget goes while something of it is further down the
+/// stack, the house takes in the widget's children, whose handlers may be there too, and goes
+/// itself when control is back in the event loop that called them.
+class ZandorWidget::House : public QObject {
+public:
+    explicit House(ZandorWidget& widget) : toolkit(widget), events(widget) {}
+
+    static std::shared_ptr<House> build(ZandorWidget& widget) {
+        return {new House(widget), [](House* house) {
+                    if (house->mChildren)
+                        house->deleteLater();
+                    else
+                        delete house;
+                }};
+    }
+
+    void takeIn(const QWidget& widget) {
+        mChildren = std::make_unique<QWidget>();
+        const QObjectList children = widget.children();
+        for (QObject* child : children)
+            if (auto* part = qobject_cast<QWidget*>(child)) part->setParent(mChildren.get());
+    }
+
+private:
+    std::unique_ptr<QWidget> mChildren; // goes last
+
+public:
+    platform::qt::QtToolkit toolkit;
+    Events events;
+    std::optional<Zandor> control;
+};
+
 ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
-    : QWidget(parent), mToolkit(std::make_unique<platform::qt::QtToolkit>(*this)),
-      mEvents(std::make_unique<Events>(*this)) {
+    : QWidget(parent), mHouse(House::build(*this)), mToolkit(&mHouse->toolkit) {
     // The canvas has the same background, so that none sees where it ends.
     setAutoFillBackground(true);
     setBackgroundRole(QPalette::Window);
     setFocusPolicy(Qt::TabFocus);
     setAccessibleName(tr("Query designer"));
     resize(sizeHint());
-    mControl = std::make_unique<Zandor>(*mToolkit, library, *mEvents);
+    mToolkit->drags().setKeeper(mHouse);
+    mHouse->control.emplace(*mToolkit, library, mHouse->events, mHouse);
+    mControl = &*mHouse->control;
     mToolkit->comforts().attach(*mControl);
     mToolkit->view().setNamer([this](const platform::qt::CanvasLine& line) {
         return mControl ? joinName(*mControl, line.ends()) : QString();
@@ -61,7 +97,10 @@ ZandorWidget::~ZandorWidget() {
     // The window around may be in the middle of its own destruction.
     mToolkit->close();
     mToolkit->comforts().detach();
-    mControl.reset();
+    mControl->End();
+    mControl = nullptr;
+    mToolkit->dismiss();
+    if (mHouse.use_count() > 1) mHouse->takeIn(*this);
 }
 
 const comforts::Flags& ZandorWidget::comforts() const { return mToolkit->comforts().flags(); }
@@ -117,7 +156,9 @@ void ZandorWidget::focusInEvent(QFocusEvent* event) {
 }
 
 void ZandorWidget::keyPressEvent(QKeyEvent* event) {
-    if (!mToolkit->navigation().keyPressed(*event)) QWidget::keyPressEvent(event);
+    const QPointer<ZandorWidget> alive = this;
+    const bool used = mToolkit->navigation().keyPressed(*event);
+    if (alive && !used) QWidget::keyPressEvent(event);
 }
 
 void ZandorWidget::changeEvent(QEvent* event) {

@@ -27,7 +27,10 @@ class QtToolkit;
 /// The library outlives the widget. With DebugSwitch nonzero (its default) the widget shows trace
 /// boxes, one of them while it is destroyed.
 ///
-/// Do not delete the widget from a slot of its signals: use deleteLater().
+/// The widget may be deleted at any time, by `delete` and by deleteLater(): in a slot of any of its
+/// signals, in a call of the model, while a message box, the join dialog, the menu or a drag of it
+/// stands open, which then close. The one exception is the widget's own resizing, in which Qt does
+/// not let any widget be deleted.
 class ZandorWidget : public QWidget {
     Q_OBJECT
     // One property a line.
@@ -284,13 +287,14 @@ protected:
 
 private:
     class Events;
+    class House;
 
     void queuePaint();
     void setInteger(platform::StringView procedure, int value,
                     void (*set)(TalvikDBxZandor::Zandor&, std::int16_t));
 
-    std::unique_ptr<platform::qt::QtToolkit> mToolkit;
-    std::unique_ptr<Events> mEvents;
-    std::unique_ptr<TalvikDBxZandor::Zandor> mControl;
+    std::shared_ptr<House> mHouse;
+    platform::qt::QtToolkit* mToolkit;
+    TalvikDBxZandor::Zandor* mControl = nullptr;
     bool mPaintQueued = false;
 };
