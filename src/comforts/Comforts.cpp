@@ -11,14 +11,22 @@ Comforts::~Comforts() = default;
 void Comforts::attach(TalvikDBxZandor::Zandor& control) {
     mDoor = std::make_shared<Door>(control);
     // These run within the control's procedures, which report what goes wrong in them.
-    mDoor->listen({.EditorOpened = [this] { editorOpened(*std::shared_ptr(mDoor)); },
-                   .EditorsClosing = [this] { editorsClosing(*std::shared_ptr(mDoor)); }});
+    mDoor->listen(
+        {.EditorOpened = [this] { editorOpened(*std::shared_ptr(mDoor)); },
+         .EditorsClosing = [this] { editorsClosing(*std::shared_ptr(mDoor)); },
+         .Bound = [this] { act(u"bound", [this](Door& door) { return bound(door), true; }); },
+         .CellWritten =
+             [this](auto column) {
+                 if (mDoor->grid().ColData(column) != 0) fit(*mDoor, column);
+             }});
 }
 
 void Comforts::detach() {
     if (mDoor) mDoor->shut();
     mDoor.reset();
     mTyping.reset();
+    mOffer.reset();
+    mFields.reset();
 }
 
 bool Comforts::act(platform::StringView procedure, const std::function<bool(Door&)>& body) {
@@ -33,13 +41,28 @@ bool Comforts::act(platform::StringView procedure, const std::function<bool(Door
     return dealtWith;
 }
 
-/// The entry comes behind the last output column. A full grid has no place for it, and takes none.
-bool Comforts::entryDoubleClicked(std::int16_t table, std::int32_t entry) {
-    if (!mFlags.AddsOnDoubleClick) return false;
-    return act(u"entryDoubleClicked", [&](Door& door) {
-        if (!door.hasGrid()) return false;
-        const std::int32_t last = door.lastColumn();
-        if (last + 1 < door.grid().Cols()) door.drop(table, entry, last + 1);
+void Comforts::setFlags(const Flags& flags) {
+    mFlags = flags;
+    act(u"setFlags", [this](Door& door) { return bound(door), true; });
+}
+
+/// What follows from the model, shown afresh.
+void Comforts::bound(Door& door) {
+    door.markOutput(mFlags.MarksOutput);
+    fitAll(door);
+    markFindings(door);
+}
+
+void Comforts::raised(TalvikDBxZandor::Event event,
+                      const TalvikDBxZandor::EventArguments& arguments) {
+    using TalvikDBxZandor::Event;
+    const bool columns = event == Event::ColumnCreated || event == Event::ColumnModified ||
+                         event == Event::ColumnRemoved || event == Event::TableDeleted;
+    if (!columns) return;
+    act(u"raised", [&](Door& door) {
+        if (mFlags.MarksOutput) door.markOutput(true);
+        if (event == Event::ColumnCreated || event == Event::ColumnModified)
+            fit(door, door.columnOfKey(arguments.Definition->Key()));
         return true;
     });
 }

@@ -1,9 +1,11 @@
 #pragma once
 
+#include "comforts/Field.h"
 #include "comforts/Flags.h"
-#include "platform/TalvikZandorLib.h"
+#include "control/Events.h"
 #include "platform/Toolkit.h"
 
+#include <map>
 #include <memory>
 #include <optional>
 
@@ -41,10 +43,39 @@ public:
     void detach();
 
     const Flags& flags() const { return mFlags; }
-    void setFlags(const Flags& flags) { mFlags = flags; }
+    void setFlags(const Flags& flags);
 
+    /// An event of the control, on its way to the host.
+    void raised(TalvikDBxZandor::Event event, const TalvikDBxZandor::EventArguments& arguments);
+
+    // Entries of tables
     /// On an entry (1-based) of the table in a slot.
     bool entryDoubleClicked(std::int16_t table, std::int32_t entry);
+
+    // Fields: the first cells of the grid's columns
+    /// A press anywhere in the grid.
+    bool gridPressed(std::int16_t button, float X, float Y);
+    /// A click with the left button that was no drag.
+    bool fieldClicked(std::int32_t column);
+    /// A key asks for the current cell's editor.
+    bool cellOpened();
+
+    // Columns of the grid
+    /// Whether a drag of the column's field would move it.
+    bool columnMovable(std::int32_t column);
+    bool columnMoved(std::int32_t column, std::int32_t position);
+    /// By a key: the current cell's column, by some places to the right.
+    bool currentColumnMoved(std::int32_t step);
+    /// The user has left a column's border so that it has this width.
+    bool borderDragged(std::int32_t column, float width);
+    bool borderDoubleClicked(std::int32_t column);
+
+    // Findings
+    /// Marks the cells that they are about, and no others.
+    void setFindings(std::vector<Finding> findings);
+    /// Goes to a cell as a click on it does, without opening its editor. False when it is not in
+    /// the grid.
+    bool showCell(const String& definition, std::int32_t row);
 
     // Editors of cells
     /// What is being typed goes into its cell, and the editor closes. For hosts that are about to
@@ -70,17 +101,36 @@ private:
         String value; ///< as it was opened
     };
 
+    /// The fields that the open list offers, and the column that is to get one.
+    struct Offer {
+        platform::Ref<TalvikZandorLib::Zandor> model;
+        std::int32_t column = 0;
+        std::int32_t keyNumber = 0; ///< 0: a blank column
+        std::vector<Field> fields;
+    };
+
     /// Runs the body with the door to the control; false without a control.
     bool act(platform::StringView procedure, const std::function<bool(Door&)>& body);
 
     void editorOpened(Door& door);
     void editorsClosing(Door& door);
+    void bound(Door& door);
+    bool offerFields(Door& door, std::int32_t column, const String& typed);
+    void fieldPicked(std::int32_t position);
+    float fitting(Door& door, std::int32_t column) const;
+    void fit(Door& door, std::int32_t column);
+    void fitAll(Door& door);
+    void markFindings(Door& door);
     static bool goOn(Door& door, std::int32_t rows, std::int32_t columns, bool edits);
 
     platform::Toolkit& mToolkit;
     Flags mFlags;
     std::shared_ptr<Door> mDoor;
     std::optional<Typing> mTyping;
+    std::optional<Offer> mOffer;
+    std::unique_ptr<platform::PickList> mFields; ///< made when it is first needed
+    std::vector<Finding> mFindings;
+    std::map<std::int32_t, float> mWidths; ///< set by hand, by key number
 };
 
 } // namespace comforts

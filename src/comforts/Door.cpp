@@ -1,5 +1,10 @@
 #include "comforts/Door.h"
 
+#include "control/KeyNumber.h"
+
+#include <algorithm>
+#include <set>
+
 namespace comforts {
 
 using TalvikDBxZandor::Event;
@@ -20,13 +25,13 @@ bool Door::isUsed(std::int32_t column) const {
 }
 
 std::int32_t Door::columnWith(std::int32_t keyNumber, std::int32_t first) const {
-    if (grid().ColData(first) == keyNumber) return first;
+    if (first > 0 && grid().ColData(first) == keyNumber) return first;
     for (std::int32_t column = 1; column < grid().Cols(); ++column)
         if (grid().ColData(column) == keyNumber) return column;
     return 0;
 }
 
-platform::Ref<TalvikZandorLib::ZDColumnDefinition> Door::definitionOf(std::int32_t column) {
+TalvikDBxZandor::Held<TalvikZandorLib::ZDColumnDefinition> Door::definitionOf(std::int32_t column) {
     try {
         return control().DefinitionOf(column);
     } catch (const platform::RuntimeError&) {
@@ -39,6 +44,90 @@ void Door::drop(std::int16_t table, std::int32_t entry, std::int32_t column) {
     const auto item = element->ColumnItems().Item(entry);
     control().InsertRecords({control().DragRecord(table, element, item)}, column);
     control().Raise(Event::Activate);
+}
+
+std::int32_t Door::columnOfKey(const String& key) const {
+    if (key.empty() || !TalvikDBxZandor::isKeyOfNumber(key)) return 0;
+    const std::int32_t number = TalvikDBxZandor::numberOfKey(key);
+    return number == 0 ? 0 : columnWith(number, 0);
+}
+
+std::vector<std::pair<std::int16_t, platform::Ref<TalvikTabulet::Tabulet>>> Door::tables() const {
+    std::vector<std::pair<std::int16_t, Ref<TalvikTabulet::Tabulet>>> shown;
+    for (const auto& [slot, table] : control().lstTable)
+        if (slot != 0) shown.emplace_back(slot, table);
+    return shown;
+}
+
+std::vector<Field> Door::fields() const {
+    std::vector<Field> all;
+    for (const auto& [slot, table] : tables()) {
+        const auto& entries = table->ColumnItems();
+        for (std::int32_t n = 1; n <= entries.Count(); ++n)
+            all.push_back({slot, n, table->Text() + u'.' + entries.Item(n)->Text()});
+    }
+    return all;
+}
+
+bool Door::has(const Field& field) const {
+    const auto all = fields();
+    return std::find(all.begin(), all.end(), field) != all.end();
+}
+
+void Door::changeField(std::int32_t column, const Field& field) {
+    const auto definition = definitionOf(column);
+    if (!definition || grid().TextMatrix(row::field, column) == field.name) return;
+    const Ref<TalvikTabulet::Tabulet> element = control().lstTable(field.table);
+    const auto record =
+        control().DragRecord(field.table, element, element->ColumnItems().Item(field.entry));
+    const auto chosen = record->ZDColumn();
+    definition->Column(chosen);
+    // A host asked for its columns may have moved this one.
+    const std::int32_t now = columnOfKey(definition->Key());
+    if (now == 0) return;
+    control().sprColumn->TextMatrix(row::field, now, field.name);
+    control().FitColumn(now, field.name);
+    control().Raise(Event::ColumnModified, {.Definition = definition});
+}
+
+platform::Ref<TalvikZandorLib::ZDTable> Door::tableOf(const TalvikTabulet::Tabulet& element) {
+    try {
+        return control().Tables().Item(element.Tag());
+    } catch (const platform::RuntimeError&) {
+        return {};
+    }
+}
+
+void Door::markOutput(bool marks) {
+    // A model may hand out the table's own column, or one that reads "table.column".
+    std::set<const void*> columns;
+    std::set<String> names;
+    if (marks)
+        for (const auto& definition : control().Definitions()) {
+            if (!definition->Visible()) continue;
+            const auto column = control().Hold(definition->Column());
+            if (!column) continue;
+            columns.insert(column.get());
+            names.insert(column->Name());
+        }
+    for (const auto& [slot, table] : tables()) {
+        const auto held = control().Hold(tableOf(*table));
+        if (!held) continue;
+        const auto own = control().List(held, &TalvikZandorLib::ZDTable::Columns);
+        for (std::int32_t n = 1; n <= own.Count(); ++n) {
+            const auto column = own.Item(n);
+            const auto& entries = table->ColumnItems();
+            if (n > entries.Count()) break;
+            const auto entry = entries.Item(n);
+            entry->ComesOut(columns.contains(column.get()) ||
+                            names.contains(table->Text() + u'.' + entry->Text()));
+        }
+    }
+}
+
+void Door::clearNotes() {
+    for (std::int32_t column = 0; column < grid().Cols(); ++column)
+        for (std::int32_t row = 0; row < grid().Rows(); ++row) note(row, column, {});
 }
 
 void Door::goTo(std::int32_t row, std::int32_t column) {

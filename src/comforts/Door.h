@@ -1,5 +1,6 @@
 #pragma once
 
+#include "comforts/Field.h"
 #include "control/Zandor.h"
 
 #include <optional>
@@ -51,7 +52,30 @@ public:
     /// The one with a key number, `first` when it has it; 0 when none has.
     std::int32_t columnWith(std::int32_t keyNumber, std::int32_t first) const;
     /// Nothing for a column that is tied to none.
-    Ref<TalvikZandorLib::ZDColumnDefinition> definitionOf(std::int32_t column);
+    TalvikDBxZandor::Held<TalvikZandorLib::ZDColumnDefinition> definitionOf(std::int32_t column);
+    /// The one tied to a definition's key; 0 when none is.
+    std::int32_t columnOfKey(const String& key) const;
+    /// Of all tables on the canvas, by their slots.
+    std::vector<Field> fields() const;
+    bool has(const Field& field) const;
+    /// Nothing where the model has dropped the table behind an element.
+    Ref<TalvikZandorLib::ZDTable> tableOf(const TalvikTabulet::Tabulet& element);
+    /// Whether the model keeps the order of its definitions, so that columns can be moved.
+    bool keepsOrder() { return static_cast<bool>(control().Ordered()); }
+    bool moveColumn(std::int32_t column, std::int32_t position) {
+        return control().MoveColumn(column, position);
+    }
+    void setWidth(std::int32_t column, float width) {
+        control().sprColumn->ColWidth(column, width);
+    }
+    /// Gives a column's definition another field, unless it has that already.
+    void changeField(std::int32_t column, const Field& field);
+    /// Marks the entries whose columns come out in the rows, or none.
+    void markOutput(bool marks);
+    void clearNotes();
+    void note(std::int32_t row, std::int32_t column, const String& text) {
+        control().sprColumn->CellNote(row, column, text);
+    }
     /// Makes an output column of an entry (1-based) of the table in a slot, as dropping it on a
     /// grid column does. What was copied for a later "Paste Column" stays.
     void drop(std::int16_t table, std::int32_t entry, std::int32_t column);
@@ -75,6 +99,9 @@ public:
     void set(Editor editor);
 
 private:
+    /// The elements on the canvas and their slots; held, for a host may unload them meanwhile.
+    std::vector<std::pair<std::int16_t, Ref<TalvikTabulet::Tabulet>>> tables() const;
+
     TalvikDBxZandor::Zandor& control() const {
         TalvikDBxZandor::require(isOpen());
         return *mControl;

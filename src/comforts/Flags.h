@@ -11,7 +11,25 @@ struct Flags {
     /// Escape; typing in a cell opens its editor; a choice in a list needs no "&Set".
     bool KeepsTyping = false;
 
-    static constexpr Flags all() { return {.AddsOnDoubleClick = true, .KeepsTyping = true}; }
+    /// Entries whose columns come out in the rows are marked in their tables.
+    bool MarksOutput = false;
+    /// The first cell of a column offers all fields of all tables; a blank column's other cells
+    /// open nothing.
+    bool OffersFields = false;
+    /// Columns are moved by dragging their field and by Alt and an arrow, where the model keeps an
+    /// order.
+    bool MovesColumns = false;
+    /// Columns are as wide as what they hold, within limits, until somebody sets their width.
+    bool FitsColumns = false;
+
+    static constexpr Flags all() {
+        return {.AddsOnDoubleClick = true,
+                .KeepsTyping = true,
+                .MarksOutput = true,
+                .OffersFields = true,
+                .MovesColumns = true,
+                .FitsColumns = true};
+    }
 
     friend bool operator==(const Flags&, const Flags&) = default;
 };

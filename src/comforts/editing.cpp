@@ -64,11 +64,13 @@ void Comforts::takeOver() {
 }
 
 bool Comforts::cellTyped(const String& text) {
-    if (!mFlags.KeepsTyping) return false;
     return act(u"cellTyped", [&](Door& door) {
         const std::int32_t row = door.grid().Row();
         const std::int32_t column = door.grid().Col();
-        if (!door.hasGrid() || row == row::field || !door.isUsed(column)) return false;
+        if (!door.hasGrid() || column == 0) return false;
+        if (mFlags.OffersFields && row == row::field) return offerFields(door, column, text);
+        if (mFlags.OffersFields && !door.isUsed(column)) return true;
+        if (!mFlags.KeepsTyping || row == row::field || !door.isUsed(column)) return false;
         if (row == row::visible && text == u" ") {
             const auto definition = door.definitionOf(column);
             if (!definition) return false;

@@ -40,6 +40,7 @@ void Zandor::P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& given) {
         require(binding == mBinding);
         // Last, so that a model whose keys cannot be read is bound all the same.
         TieBoundColumns();
+        if (const auto bound = mHooks.Bound) bound();
     });
 }
 

@@ -240,6 +240,7 @@ void DesignerWindow::connectParts() {
             [this](const model::Finding& finding) {
                 showPlace(mDrawing->control(), *mDocument.query(), finding);
             });
+    connect(mStatement, &StatementPanel::findingsChanged, mDrawing, &DrawingArea::showFindings);
     mEvents->watch(&mDrawing->control());
     connect(mDrawing, &DrawingArea::controlMade, mEvents, &EventPanel::watch);
 

@@ -2,12 +2,17 @@
 
 #include "designer/canvasSize.h"
 #include "designer/document/Document.h"
+#include "designer/statement/ModelWords.h"
+#include "platform/qt/Text.h"
 
 #include <QResizeEvent>
 
 #include <algorithm>
 
 namespace designer {
+
+using platform::qt::fromQt;
+using platform::qt::toQt;
 
 DrawingArea::DrawingArea(Document& document, QWidget* parent)
     : QWidget(parent), mDocument(document) {
@@ -24,6 +29,15 @@ DrawingArea::~DrawingArea() {
 void DrawingArea::setOptions(const QVariantMap& options) {
     mOptions = options;
     showAnew();
+}
+
+void DrawingArea::showFindings(const model::Findings& findings) {
+    mFindings.clear();
+    for (const model::Finding& finding : findings)
+        if (finding.kind == model::Finding::Kind::badCriterion)
+            mFindings.push_back(
+                {finding.definition, finding.row, fromQt(inWords(toQt(finding.text)))});
+    mControl->setFindings(mFindings);
 }
 
 QPoint DrawingArea::canvasPlace(QPoint at) const {
@@ -43,6 +57,7 @@ void DrawingArea::showAnew() {
     // After the texts, for it shows the grid's row titles.
     mControl->setOnlyJoin(mOptions.value(QStringLiteral("OnlyJoin"), false).toBool());
     mControl->setModel(mDocument.query());
+    mControl->setFindings(mFindings);
     mControl->show();
     if (before) {
         // The canvas may be smaller now than it was.

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "model/Finding.h"
 #include "model/Library.h"
 #include "platform/qt/ZandorWidget.h"
 
@@ -27,6 +28,9 @@ public:
     void setOptions(const QVariantMap& options);
     const QVariantMap& options() const { return mOptions; }
 
+    /// Marks the cells of the grid that the findings are about.
+    void showFindings(const model::Findings& findings);
+
     /// The place on the canvas, in twips, that is seen at a place of this widget.
     QPoint canvasPlace(QPoint at) const;
 
@@ -44,6 +48,7 @@ private:
     Document& mDocument;
     model::Library mLibrary; ///< outlives every control
     QVariantMap mOptions;
+    std::vector<comforts::Finding> mFindings;
     ZandorWidget* mControl = nullptr;
 };
 

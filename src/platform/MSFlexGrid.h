@@ -41,6 +41,9 @@ public:
 
     virtual String TextMatrix(std::int32_t row, std::int32_t col) const = 0;
     virtual void TextMatrix(std::int32_t row, std::int32_t col, const String& value) = 0;
+    /// What there is to say about a cell, which is marked then; empty: nothing. It goes with the
+    /// cell's column.
+    virtual void CellNote(std::int32_t row, std::int32_t col, const String& value) = 0;
     virtual float ColPos(std::int32_t col) const = 0;
     virtual float RowPos(std::int32_t row) const = 0;
     virtual float ColWidth(std::int32_t col) const = 0;

@@ -29,6 +29,8 @@ public:
     virtual void Selected(bool value) = 0;
     /// 1 marks the column, 0 does not.
     virtual void Image(std::int16_t value) = 0;
+    /// Whether the column is shown as one that comes out in the query's rows.
+    virtual void ComesOut(bool value) = 0;
     /// First follow-up of a changed selection: shows the entry as it now is.
     virtual void Refresh() = 0;
     /// Second follow-up: scrolls the list so that the entry is in view.

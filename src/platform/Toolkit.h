@@ -2,6 +2,7 @@
 
 #include "platform/Intrinsic.h"
 #include "platform/MSFlexGrid.h"
+#include "platform/PickList.h"
 #include "platform/Tabulet.h"
 
 namespace platform {
@@ -36,6 +37,9 @@ public:
     /// Click is the menu's own, fired as it opens.
     virtual std::unique_ptr<PopupMenu> makePopupMenu(const Design& design, PlainEvent Click) = 0;
     virtual std::unique_ptr<Dialog> makeDialog(const Design& design, DialogEvents events) = 0;
+
+    /// Closed at first.
+    virtual std::unique_ptr<PickList> makePickList(const Design& design, PickListEvents events) = 0;
 
     /// Elements of control arrays stand inside design.Container. A table list takes its font from
     /// the pattern, the array's element 0 (nullptr when element 0 itself is made), and starts

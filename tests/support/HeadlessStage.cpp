@@ -12,6 +12,22 @@ namespace headless = platform::headless;
 
 std::string tableName(std::int16_t index) { return headless::elementName(u"lstTable", index); }
 
+/// The control's events on their way to the host.
+class Passing final : public TalvikDBxZandor::ZandorEvents {
+public:
+    Passing(headless::Toolkit& toolkit, TalvikDBxZandor::ZandorEvents& host)
+        : mToolkit(toolkit), mHost(host) {}
+    void Raise(TalvikDBxZandor::Event event,
+               const TalvikDBxZandor::EventArguments& arguments) override {
+        mToolkit.comforts.raised(event, arguments);
+        mHost.Raise(event, arguments);
+    }
+
+private:
+    headless::Toolkit& mToolkit;
+    TalvikDBxZandor::ZandorEvents& mHost;
+};
+
 class HeadlessStage final : public Stage {
 public:
     explicit HeadlessStage(TalvikZandorLib::Library& library) : mUser(mToolkit), mEvents(*this) {
@@ -30,7 +46,7 @@ public:
             if (onDialog) onDialog();
         };
         mHouse = std::make_shared<House>();
-        mHouse->control.emplace(mToolkit, library, mEvents, mHouse);
+        mHouse->control.emplace(mToolkit, library, mPassing, mHouse);
         mControl = &*mHouse->control;
         mToolkit.comforts.attach(*mControl);
         mToolkit.onPaint = [this] { mControl->UserControl_Paint(); };
@@ -144,6 +160,21 @@ public:
         mUser.key(name, keyCode, shift);
     }
     void typeInGrid(const String& text) override { mUser.typeInGrid("sprColumn", text); }
+    void pickField(const String& text) override { mUser.pickItem("lstFields", text); }
+    void clickField(std::int32_t col) override { mUser.clickField("sprColumn", col); }
+    void dragField(std::int32_t col, std::int32_t to) override {
+        mUser.dragField("sprColumn", col, to);
+    }
+    void dragBorder(std::int32_t col, float width) override {
+        mUser.dragBorder("sprColumn", col, width);
+    }
+    void editCell() override { mUser.editCell("sprColumn"); }
+    void moveCurrentColumn(std::int32_t step) override {
+        mUser.moveCurrentColumn("sprColumn", step);
+    }
+    String note(std::int32_t row, std::int32_t col) override {
+        return mToolkit.find<headless::Grid>("sprColumn").cell(row, col).note;
+    }
     void leaveControl() override { mUser.leaveControl(); }
 
 private:
@@ -181,11 +212,14 @@ private:
             seen.borderWidth = line->borderWidth();
         } else if (const auto* shape = dynamic_cast<const headless::Shape*>(&object)) {
             seen.shape = shape->style();
+        } else if (const auto* list = dynamic_cast<const headless::PickList*>(&object)) {
+            seen.items = list->items();
         } else if (const auto* table = dynamic_cast<const headless::Tabulet*>(&object)) {
             for (std::size_t i = 1; i <= table->entries().size(); ++i) {
                 const auto& entry = table->entry(static_cast<std::int32_t>(i));
                 seen.items.push_back(entry.text());
                 if (entry.selected()) seen.selected.push_back(entry.text());
+                if (entry.comesOut()) seen.output.push_back(entry.text());
             }
         }
     }
@@ -193,6 +227,7 @@ private:
     headless::Toolkit mToolkit;
     headless::User mUser;
     StageEvents mEvents;
+    Passing mPassing{mToolkit, mEvents};
 
     /// What a procedure of the control keeps while it runs.
     struct House {

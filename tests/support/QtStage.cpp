@@ -4,6 +4,7 @@
 #include "platform/qt/GridModel.h"
 #include "platform/qt/GridWidget.h"
 #include "platform/qt/MessageBox.h"
+#include "platform/qt/PickListWidget.h"
 #include "platform/qt/QtToolkit.h"
 #include "platform/qt/TabuletWidget.h"
 #include "platform/qt/Text.h"
@@ -19,6 +20,7 @@
 #include <QDialog>
 #include <QLabel>
 #include <QLineEdit>
+#include <QListView>
 #include <QMenu>
 #include <QMessageBox>
 #include <QPaintEvent>
@@ -229,6 +231,52 @@ public:
         for (const QChar letter : toQt(text)) hands::key(*view.window()->focusWidget(), 0, letter);
         settle();
     }
+    void pickField(const String& text) override {
+        auto& list = widget<platform::qt::PickListWidget>("lstFields");
+        for (const QChar letter : toQt(text)) hands::key(list.box(), 0, letter);
+        hands::key(list.box(), Qt::Key_Return);
+        settle();
+    }
+    void clickField(std::int32_t col) override {
+        pressCell(1, 0, col);
+        releaseCell(1, 0, col);
+    }
+    void dragField(std::int32_t col, std::int32_t to) override {
+        const Spot from = cellSpot(0, col);
+        // Past the middle of the other column, so that this one takes its place.
+        const QRect target = grid().cellRect(0, to);
+        const int x = to > col ? target.right() - 6 : target.left() + 6;
+        const Spot end{from.widget, from.widget->mapFrom(&grid(), QPointF(x, target.center().y()))};
+        send(from, QEvent::MouseButtonPress, 1, Qt::LeftButton);
+        send(end, QEvent::MouseMove, 0, Qt::LeftButton);
+        send(end, QEvent::MouseButtonRelease, 1, Qt::NoButton);
+    }
+    void dragBorder(std::int32_t col, float width) override {
+        const QRect cell = grid().cellRect(0, col);
+        Spot border = cellSpot(0, col);
+        border.at = border.widget->mapFrom(&grid(), QPointF(cell.right(), cell.center().y()));
+        Spot end = border;
+        if (width > 0) end.at += QPointF(width / twipsPerPixel - cell.width(), 0);
+        send(border, width > 0 ? QEvent::MouseButtonPress : QEvent::MouseButtonDblClick, 1,
+             Qt::LeftButton);
+        if (width > 0) send(end, QEvent::MouseMove, 0, Qt::LeftButton);
+        send(end, QEvent::MouseButtonRelease, 1, Qt::NoButton);
+    }
+    void editCell() override {
+        QWidget& view = grid().view();
+        view.setFocus(Qt::TabFocusReason);
+        hands::key(view, Qt::Key_F2);
+        settle();
+    }
+    void moveCurrentColumn(std::int32_t step) override {
+        QWidget& view = grid().view();
+        view.setFocus(Qt::TabFocusReason);
+        hands::key(view, step < 0 ? Qt::Key_Left : Qt::Key_Right, {}, Qt::AltModifier);
+        settle();
+    }
+    String note(std::int32_t row, std::int32_t col) override {
+        return fromQt(grid().model().note(row, col));
+    }
     void leaveControl() override {
         mHostField.setFocus(Qt::MouseFocusReason);
         settle();
@@ -410,10 +458,18 @@ void QtStage::lookAtKind(QWidget& widget, Seen& seen) {
         seen.value = static_cast<std::int16_t>(bar->value());
         seen.max = static_cast<std::int16_t>(bar->maximum());
         seen.largeChange = static_cast<std::int16_t>(bar->pageStep());
+    } else if (const auto* list = dynamic_cast<platform::qt::PickListWidget*>(&widget)) {
+        seen.text = fromQt(list->box().text());
+        const QAbstractItemModel& left = *list->list().model();
+        for (int row = 0; row < left.rowCount(); ++row)
+            seen.items.push_back(fromQt(left.index(row, 0).data().toString()));
     } else if (const auto* table = dynamic_cast<TabuletWidget*>(&widget)) {
         seen.text = fromQt(table->title());
         for (int row = 0; row < table->model().rowCount(); ++row) {
             seen.items.push_back(fromQt(table->model().text(row)));
+            using platform::qt::ColumnListModel;
+            if (table->model().index(row).data(ColumnListModel::outputRole).toBool())
+                seen.output.push_back(seen.items.back());
             if (table->list().selectionModel()->isRowSelected(row))
                 seen.selected.push_back(seen.items.back());
         }

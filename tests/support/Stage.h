@@ -45,8 +45,9 @@ public:
         float X1 = 0, Y1 = 0, X2 = 0, Y2 = 0;             ///< lines
         std::int16_t borderWidth = 0;                     ///< lines
         std::int16_t shape = 0;                           ///< marks
-        std::vector<String> items;                        ///< combo boxes, table lists
+        std::vector<String> items;                        ///< combo boxes, table lists, "lstFields"
         std::vector<String> selected; ///< table lists: texts of selected entries
+        std::vector<String> output;   ///< table lists: texts of entries marked as coming out
     };
 
     /// A menu entry at the moment the menu stands open.
@@ -89,6 +90,8 @@ public:
     virtual bool exists(const std::string& name) = 0;
     /// Text of a grid cell as shown.
     virtual String cell(std::int32_t row, std::int32_t col) = 0;
+    /// What is said about a grid cell, in its tooltip.
+    virtual String note(std::int32_t row, std::int32_t col) = 0;
 
     // The user's hands.
     virtual void resizeControl(float width, float height) = 0;
@@ -129,6 +132,18 @@ public:
     virtual void key(const std::string& name, std::int16_t keyCode, std::int16_t shift = 0) = 0;
     /// Types into the grid, with no editor open.
     virtual void typeInGrid(const String& text) = 0;
+    /// Types into the open list of fields and takes the first that is left by Enter.
+    virtual void pickField(const String& text) = 0;
+    /// A click on the field of a grid column.
+    virtual void clickField(std::int32_t col) = 0;
+    /// Drags a grid column by its field to the place of another column.
+    virtual void dragField(std::int32_t col, std::int32_t to) = 0;
+    /// Drags the right border of a grid column until it has a width; 0: double-clicks it.
+    virtual void dragBorder(std::int32_t col, float width) = 0;
+    /// F2 in the grid.
+    virtual void editCell() = 0;
+    /// Alt and an arrow in the grid: -1 to the left, 1 to the right.
+    virtual void moveCurrentColumn(std::int32_t step) = 0;
     /// The focus goes to a field of the host's beside the control.
     virtual void leaveControl() = 0;
 };

@@ -16,6 +16,7 @@ Held<TalvikZandorLib::ZDColumnDefinition> Zandor::DefinitionOf(std::int32_t colu
 void Zandor::SetCell(const String& text, std::int16_t alignment) const {
     sprColumn->Text(text);
     sprColumn->CellAlignment(alignment);
+    if (const auto written = mHooks.CellWritten) written(sprColumn->Col());
 }
 
 void Zandor::FitColumn(std::int32_t column, const String& fieldName) {

@@ -73,6 +73,9 @@ void showPlace(ZandorWidget& control, model::Query& query, const model::Finding&
         if (column) control.SelectColumnNames(toQt(table->Name()), toQt(column->Name()));
         control.SetCurrentTable(toQt(table->Name()));
     }
+    // The cell comes last, for it is where one goes on typing.
+    if (finding.kind == model::Finding::Kind::badCriterion)
+        control.showCell(toQt(finding.definition), finding.row);
 }
 
 } // namespace designer

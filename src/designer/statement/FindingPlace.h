@@ -8,8 +8,8 @@ class ZandorWidget;
 namespace designer {
 
 /// Brings what a finding is about into view: the table, the columns of the join, or the column of
-/// the output column, selected in its table, which becomes the current one. Nothing happens when it
-/// is no longer in the query.
+/// the output column, selected in its table, which becomes the current one; the cell of a criterion
+/// becomes the grid's current one. Nothing happens when it is no longer in the query.
 void showPlace(ZandorWidget& control, model::Query& query, const model::Finding& finding);
 
 } // namespace designer

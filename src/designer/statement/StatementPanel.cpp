@@ -101,7 +101,7 @@ void StatementPanel::copy() {
 
 void StatementPanel::queue() {
     mOutdated = true;
-    if (isVisible() && !mSoon.isActive()) mSoon.start();
+    if (!mSoon.isActive()) mSoon.start();
 }
 
 void StatementPanel::showEvent(QShowEvent* event) {
@@ -169,6 +169,7 @@ void StatementPanel::showFindings(const model::Findings& findings) {
     mList->setCurrentRow(std::min(current, mList->count() - 1));
     mList->setVisible(!mFindings.empty());
     mList->verticalScrollBar()->setValue(scrolled);
+    emit findingsChanged(mFindings);
 }
 
 void StatementPanel::choose(int row) {

@@ -16,7 +16,7 @@ class Document;
 class SqlView;
 
 /// The statement that the document's query draws, always as it is now, and what there is to say
-/// about it. It is made when control returns to the event loop, and only while it can be seen.
+/// about it. It is made when control returns to the event loop.
 class StatementPanel final : public QWidget {
     Q_OBJECT
 
@@ -33,6 +33,8 @@ public:
 signals:
     /// Somebody wants to see what a finding is about.
     void findingChosen(const model::Finding& finding);
+    /// What there is to say now, errors first.
+    void findingsChanged(const model::Findings& findings);
 
 public slots:
     /// Puts the statement as it is now on the clipboard, if there is one.

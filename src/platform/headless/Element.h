@@ -70,7 +70,10 @@ protected:
     void leave();
 
 private:
+    friend class Toolkit;
+
     virtual void gotFocus() {}
+    virtual void lostFocus() {}
     void giveUpFocus();
 
     Element* mContainer;

@@ -131,6 +131,11 @@ void Grid::TextMatrix(std::int32_t row, std::int32_t col, const String& value) {
     cellAt(row, col).text = value;
 }
 
+void Grid::CellNote(std::int32_t row, std::int32_t col, const String& value) {
+    called("CellNote");
+    cellAt(row, col).note = value;
+}
+
 float Grid::ColPos(std::int32_t col) const {
     called("ColPos");
     return leftOf(col);

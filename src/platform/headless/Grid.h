@@ -35,6 +35,7 @@ public:
     void EnsureVisible() override;
     String TextMatrix(std::int32_t row, std::int32_t col) const override;
     void TextMatrix(std::int32_t row, std::int32_t col, const String& value) override;
+    void CellNote(std::int32_t row, std::int32_t col, const String& value) override;
     float ColPos(std::int32_t col) const override;
     float RowPos(std::int32_t row) const override;
     float ColWidth(std::int32_t col) const override;
@@ -47,9 +48,13 @@ public:
     struct Cell {
         String text;
         std::int16_t alignment = MSFlexGridLib::alignLeftCenter;
+        String note;
     };
     const Cell& cell(std::int32_t row, std::int32_t col) const;
     Bounds cellBounds(std::int32_t row, std::int32_t col) const;
+    Bounds currentCell() const { return cellBounds(mRow, mCol); }
+    /// As the user leaves a column's border with the mouse.
+    void resizeColumn(std::int32_t col, float width) { column(col).width = width; }
     /// Whether the cell has not been scrolled out of view to the top or the left.
     bool inView(std::int32_t row, std::int32_t col) const;
     /// As the user scrolls: the fixed cells stay, and the last cell is the furthest.

@@ -54,6 +54,11 @@ void ColumnItem::Image(std::int16_t value) {
     mImage = value;
 }
 
+void ColumnItem::ComesOut(bool value) {
+    called("ColumnItem.ComesOut");
+    mComesOut = value;
+}
+
 void ColumnItem::Refresh() {
     called("ColumnItem.Refresh");
     draw();

@@ -19,6 +19,7 @@ public:
     bool Selected() const override;
     void Selected(bool value) override;
     void Image(std::int16_t value) override;
+    void ComesOut(bool value) override;
     void Refresh() override;
     void EnsureVisible() override;
     /// Error 91 for an entry that its list has dropped.
@@ -27,6 +28,7 @@ public:
 
     const String& text() const { return mText; }
     std::int16_t image() const { return mImage; }
+    bool comesOut() const { return mComesOut; }
     bool selected() const { return mSelected; }
     /// What the list shows: the selection as it was when the entry was last drawn.
     bool drawnSelected() const { return mDrawnSelected; }
@@ -44,6 +46,7 @@ private:
     String mKey;
     String mText;
     std::int16_t mImage = 0;
+    bool mComesOut = false;
     bool mSelected = false;
     bool mDrawnSelected = false;
 };

@@ -1,6 +1,7 @@
 #include "platform/headless/Toolkit.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace platform::headless {
 
@@ -107,6 +108,12 @@ std::unique_ptr<platform::Dialog> Toolkit::makeDialog(const Design& design, Dial
     return std::make_unique<Dialog>(*this, design, std::move(events));
 }
 
+std::unique_ptr<platform::PickList> Toolkit::makePickList(const Design& design,
+                                                          PickListEvents events) {
+    called("makePickList");
+    return std::make_unique<PickList>(*this, design, containerOf(design), std::move(events));
+}
+
 Ref<TalvikTabulet::Tabulet> Toolkit::makeTabulet(const Design& design, std::int16_t index,
                                                  const TalvikTabulet::Tabulet* pattern,
                                                  const TalvikTabulet::TabuletEvents& events) {
@@ -180,6 +187,11 @@ void Toolkit::enrol(Object& object) { mObjects[object.name()] = &object; }
 void Toolkit::strike(Object& object) {
     const auto at = mObjects.find(object.name());
     if (at != mObjects.end() && at->second == &object) mObjects.erase(at);
+}
+
+void Toolkit::moveFocus(Element* element) {
+    Element* const before = std::exchange(mFocus, element);
+    if (before && before != element) before->lostFocus();
 }
 
 void Toolkit::endDragOf(const Tabulet* table) {

@@ -7,6 +7,7 @@
 #include "platform/headless/Grid.h"
 #include "platform/headless/Intrinsic.h"
 #include "platform/headless/Menu.h"
+#include "platform/headless/PickList.h"
 #include "platform/headless/Tabulet.h"
 
 #include <map>
@@ -106,6 +107,8 @@ public:
                                                        PlainEvent Click) override;
     std::unique_ptr<platform::Dialog> makeDialog(const Design& design,
                                                  DialogEvents events) override;
+    std::unique_ptr<platform::PickList> makePickList(const Design& design,
+                                                     PickListEvents events) override;
     Ref<TalvikTabulet::Tabulet> makeTabulet(const Design& design, std::int16_t index,
                                             const TalvikTabulet::Tabulet* pattern,
                                             const TalvikTabulet::TabuletEvents& events) override;
@@ -122,7 +125,7 @@ public:
     // For the toolkit's own parts.
     void enrol(Object& object);
     void strike(Object& object);
-    void moveFocus(Element* element) { mFocus = element; }
+    void moveFocus(Element* element);
     void beginDrag(Tabulet& table) { mDragged = &table; }
     void endDragOf(const Tabulet* table);
     std::string openMenu(const PopupMenu& menu);

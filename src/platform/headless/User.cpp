@@ -1,5 +1,7 @@
 #include "platform/headless/User.h"
 
+#include <algorithm>
+
 namespace platform::headless {
 
 namespace {
@@ -80,6 +82,51 @@ void User::choose(const std::string& name, std::int16_t listIndex) {
 void User::pick(const std::string& name, std::int16_t listIndex) {
     choose(name, listIndex);
     mToolkit.comforts.choiceMade();
+}
+
+void User::pickItem(const std::string& name, const String& text) {
+    auto& list = reach<PickList>(name);
+    const auto& items = list.items();
+    const auto at = std::find_if(items.begin(), items.end(), [&](const String& item) {
+        return item.find(text) != String::npos;
+    });
+    if (at == items.end()) throw std::logic_error(name + " has no such item");
+    list.pick(static_cast<std::int32_t>(at - items.begin()));
+}
+
+void User::clickField(const std::string& name, std::int32_t col) {
+    pressCell(name, leftButton, 0, col);
+    releaseCell(name, leftButton, 0, col);
+    mToolkit.comforts.fieldClicked(col);
+}
+
+void User::dragField(const std::string& name, std::int32_t col, std::int32_t to) {
+    pressCell(name, leftButton, 0, col);
+    const bool moves = mToolkit.comforts.columnMovable(col);
+    releaseCell(name, leftButton, 0, to);
+    if (moves) mToolkit.comforts.columnMoved(col, to);
+}
+
+void User::dragBorder(const std::string& name, std::int32_t col, float width) {
+    if (width == 0) {
+        mToolkit.comforts.borderDoubleClicked(col);
+        return;
+    }
+    reach<Grid>(name).resizeColumn(col, width);
+    mToolkit.comforts.borderDragged(col, width);
+}
+
+void User::editCell(const std::string& name) {
+    auto& grid = reach<Grid>(name);
+    grid.takeFocus();
+    if (mToolkit.comforts.cellOpened()) return;
+    const Bounds at = grid.currentCell();
+    pressGrid(name, leftButton, at.Left + at.Width / 2, at.Top + at.Height / 2);
+}
+
+void User::moveCurrentColumn(const std::string& name, std::int32_t step) {
+    reach<Grid>(name).takeFocus();
+    mToolkit.comforts.currentColumnMoved(step);
 }
 
 void User::typeInGrid(const std::string& name, const String& text) {
@@ -177,6 +224,7 @@ void User::releaseFrame(const std::string& name, std::int16_t button, float X, f
 void User::pressGrid(const std::string& name, std::int16_t button, float X, float Y) {
     auto& grid = reach<Grid>(name);
     grid.takeFocus();
+    if (mToolkit.comforts.gridPressed(button, X, Y)) return;
     if (grid.events.MouseDown) grid.events.MouseDown(button, 0, X, Y);
 }
 

@@ -22,6 +22,18 @@ public:
     void choose(const std::string& name, std::int16_t listIndex);
     /// Chooses an item from an open list, as a click on it does.
     void pick(const std::string& name, std::int16_t listIndex);
+    /// Takes the first item of an open pick list that holds a text, as typing it and Enter do.
+    void pickItem(const std::string& name, const String& text);
+    /// A click with the left button on the field at the head of a grid's column.
+    void clickField(const std::string& name, std::int32_t col);
+    /// Drags a column by its field to the place of another one.
+    void dragField(const std::string& name, std::int32_t col, std::int32_t to);
+    /// Drags the right border of a column so that it has a width; 0: double-clicks the border.
+    void dragBorder(const std::string& name, std::int32_t col, float width);
+    /// F2 in a grid.
+    void editCell(const std::string& name);
+    /// Alt and an arrow in a grid: -1 to the left, 1 to the right.
+    void moveCurrentColumn(const std::string& name, std::int32_t step);
     /// Types a text into a grid, with no editor open.
     void typeInGrid(const std::string& name, const String& text);
     /// The focus goes to something of the host's in the same window.

@@ -2,6 +2,7 @@
 
 #include "platform/qt/ColumnListModel.h"
 #include "platform/qt/KeyMarker.h"
+#include "platform/qt/OutputMarker.h"
 #include "platform/qt/ShownText.h"
 
 #include <QApplication>
@@ -15,8 +16,8 @@ int gutter(const QFontMetrics& metrics) { return metrics.height() + 4; }
 
 } // namespace
 
-QRect ColumnDelegate::textPlace(const QRect& entry, const QFontMetrics& metrics) {
-    return entry.adjusted(gutter(metrics), 0, -3, 0);
+QRect ColumnDelegate::textPlace(const QRect& entry, const QFontMetrics& metrics, bool comesOut) {
+    return entry.adjusted(gutter(metrics), 0, comesOut ? -gutter(metrics) : -3, 0);
 }
 
 void ColumnDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
@@ -34,14 +35,17 @@ void ColumnDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option
                                                                              : QPalette::Inactive;
     const QColor colour =
         item.palette.color(group, selected ? QPalette::HighlightedText : QPalette::Text);
+    const qreal side = item.fontMetrics.height() - 2;
+    const qreal top = item.rect.center().y() + 0.5 - side / 2;
     if (index.data(ColumnListModel::markedRole).toBool()) {
-        const qreal side = item.fontMetrics.height() - 2;
-        const QPointF corner(item.rect.left() + 3.0, item.rect.center().y() + 0.5 - side / 2);
         QColor key = colour;
         if (!selected) key.setAlphaF(0.75F);
-        paintKeyMarker(*painter, QRectF(corner, QSizeF(side, side)), key);
+        paintKeyMarker(*painter, {item.rect.left() + 3.0, top, side, side}, key);
     }
-    const QRect place = textPlace(item.rect, item.fontMetrics);
+    const bool comesOut = index.data(ColumnListModel::outputRole).toBool();
+    if (comesOut)
+        paintOutputMarker(*painter, {item.rect.right() - side - 1, top, side, side}, colour);
+    const QRect place = textPlace(item.rect, item.fontMetrics, comesOut);
     painter->setFont(item.font);
     painter->setPen(colour);
     painter->setLayoutDirection(asItReads);

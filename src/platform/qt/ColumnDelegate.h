@@ -15,7 +15,7 @@ public:
 
     static int rowHeight(const QFontMetrics& metrics) { return metrics.height() + 4; }
     /// The part of an entry's rectangle that its name has.
-    static QRect textPlace(const QRect& entry, const QFontMetrics& metrics);
+    static QRect textPlace(const QRect& entry, const QFontMetrics& metrics, bool comesOut);
 };
 
 } // namespace platform::qt

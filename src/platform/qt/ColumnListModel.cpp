@@ -2,6 +2,8 @@
 
 #include "platform/qt/ShownText.h"
 
+#include <utility>
+
 namespace platform::qt {
 
 int ColumnListModel::rowCount(const QModelIndex& parent) const {
@@ -12,8 +14,16 @@ QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid() || index.row() >= rowCount()) return {};
     if (role == Qt::DisplayRole) return mRows[static_cast<std::size_t>(index.row())].shown;
     if (role == markedRole) return marked(index.row());
-    if (role == Qt::AccessibleDescriptionRole && marked(index.row())) return tr("key column");
+    if (role == outputRole) return at(index.row()).comesOut;
+    if (role == Qt::AccessibleDescriptionRole) return description(at(index.row()));
     return {};
+}
+
+QVariant ColumnListModel::description(const Row& row) {
+    QStringList parts;
+    if (row.marked) parts += tr("key column");
+    if (row.comesOut) parts += tr("comes out");
+    return parts.isEmpty() ? QVariant() : parts.join(QStringLiteral(", "));
 }
 
 void ColumnListModel::append(const QString& text) {
@@ -26,6 +36,11 @@ void ColumnListModel::append(const QString& text) {
 void ColumnListModel::setMarked(int row, bool marked) {
     mRows[static_cast<std::size_t>(row)].marked = marked;
     Q_EMIT dataChanged(index(row), index(row), {markedRole, Qt::AccessibleDescriptionRole});
+}
+
+void ColumnListModel::setComesOut(int row, bool comesOut) {
+    if (std::exchange(at(row).comesOut, comesOut) == comesOut) return;
+    Q_EMIT dataChanged(index(row), index(row), {outputRole, Qt::AccessibleDescriptionRole});
 }
 
 void ColumnListModel::clear() {

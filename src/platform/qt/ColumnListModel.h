@@ -14,6 +14,8 @@ class ColumnListModel : public QAbstractListModel {
 public:
     /// Whether the column is marked.
     static constexpr int markedRole = Qt::UserRole;
+    /// Whether the column comes out in the query's rows.
+    static constexpr int outputRole = Qt::UserRole + 1;
 
     using QAbstractListModel::QAbstractListModel;
 
@@ -24,6 +26,7 @@ public:
     bool marked(int row) const { return mRows[static_cast<std::size_t>(row)].marked; }
     void append(const QString& text);
     void setMarked(int row, bool marked);
+    void setComesOut(int row, bool comesOut);
     void clear();
 
 private:
@@ -31,7 +34,12 @@ private:
         QString text;
         QString shown;
         bool marked = false;
+        bool comesOut = false;
     };
+
+    static QVariant description(const Row& row);
+    Row& at(int row) { return mRows[static_cast<std::size_t>(row)]; }
+    const Row& at(int row) const { return mRows[static_cast<std::size_t>(row)]; }
 
     std::vector<Row> mRows;
 };

@@ -1,6 +1,7 @@
 #include "platform/qt/ColumnListView.h"
 
 #include "platform/qt/ColumnDelegate.h"
+#include "platform/qt/ColumnListModel.h"
 #include "platform/qt/ElisionToolTip.h"
 #include "platform/qt/KeyCodes.h"
 
@@ -159,8 +160,10 @@ bool ColumnListView::viewportEvent(QEvent* event) {
     const auto& help = *static_cast<QHelpEvent*>(event);
     const QModelIndex index = indexAt(help.pos());
     if (index.isValid())
-        showElisionToolTip(help, *viewport(), index.data().toString(), font(),
-                           ColumnDelegate::textPlace(visualRect(index), fontMetrics()));
+        showElisionToolTip(
+            help, *viewport(), index.data().toString(), font(),
+            ColumnDelegate::textPlace(visualRect(index), fontMetrics(),
+                                      index.data(ColumnListModel::outputRole).toBool()));
     return true;
 }
 

@@ -1,6 +1,5 @@
 #include "platform/qt/Frames.h"
 
-#include <QApplication>
 #include <QComboBox>
 #include <QCoreApplication>
 #include <QHBoxLayout>
@@ -33,16 +32,6 @@ RowFrame::RowFrame(QWidget* parent, bool outermost) : QFrame(parent), mOutermost
     row->setContentsMargins(margin, margin, margin, margin);
     row->setSpacing(5);
     if (outermost) hide();
-}
-
-void RowFrame::setLeft(std::function<void()> left) {
-    connect(qApp, &QApplication::focusChanged, this,
-            [this, left = std::move(left)](const QWidget* from, const QWidget* to) {
-                const auto inside = [this](const QWidget* at) {
-                    return at && (at == this || isAncestorOf(at));
-                };
-                if (inside(from) && to && !inside(to) && to->window() == window()) left();
-            });
 }
 
 bool RowFrame::event(QEvent* event) {

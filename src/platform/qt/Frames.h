@@ -29,9 +29,6 @@ public:
     RowFrame(QWidget* parent, bool outermost);
 
     void setTitle(Title title) { mTitle = std::move(title); }
-    /// Called when the focus goes from inside to something else in the window. A menu, a list that
-    /// drops down or another window in front takes no focus away.
-    void setLeft(std::function<void()> left);
 
 protected:
     bool event(QEvent* event) override;

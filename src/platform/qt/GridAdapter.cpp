@@ -100,6 +100,14 @@ void GridAdapter::TextMatrix(std::int32_t row, std::int32_t col, const String& v
     grid().touch();
 }
 
+void GridAdapter::CellNote(std::int32_t row, std::int32_t col, const String& value) {
+    mustBeCell(row, col);
+    const QString note = toQt(value);
+    if (grid().model().note(row, col) == note) return;
+    grid().model().setNote(row, col, note);
+    grid().touch();
+}
+
 float GridAdapter::ColPos(std::int32_t col) const {
     mustBeCol(col);
     return toTwips(grid().cellRect(0, col).left());
@@ -147,7 +155,12 @@ void GridAdapter::ColData(std::int32_t col, std::int32_t value) {
     grid().model().setColumnData(col, value);
 }
 
+void GridAdapter::borderDragged(int col) {
+    mComforts.borderDragged(col, grid().model().width(col));
+}
+
 void GridAdapter::pressed(Qt::MouseButton button, Qt::KeyboardModifiers modifiers, QPointF at) {
+    if (mComforts.gridPressed(buttonState(button), toTwips(at.x()), toTwips(at.y()))) return;
     if (mEvents.MouseDown)
         mEvents.MouseDown(buttonState(button), shiftState(modifiers), toTwips(at.x()),
                           toTwips(at.y()));

@@ -40,6 +40,7 @@ public:
 
     String TextMatrix(std::int32_t row, std::int32_t col) const override;
     void TextMatrix(std::int32_t row, std::int32_t col, const String& value) override;
+    void CellNote(std::int32_t row, std::int32_t col, const String& value) override;
     float ColPos(std::int32_t col) const override;
     float RowPos(std::int32_t row) const override;
     float ColWidth(std::int32_t col) const override;
@@ -55,6 +56,14 @@ private:
     void menuKey(QPointF at, QPoint screen) override;
     void deleteKey(QPointF at) override;
     bool typed(QKeyEvent& event) override;
+    bool editKey() override { return mComforts.cellOpened(); }
+    bool offersFields() const override { return mComforts.flags().OffersFields; }
+    void fieldClicked(int col) override { mComforts.fieldClicked(col); }
+    bool columnMovable(int col) override { return mComforts.columnMovable(col); }
+    void columnMoved(int col, int position) override { mComforts.columnMoved(col, position); }
+    bool moveKey(int step) override { return mComforts.currentColumnMoved(step); }
+    void borderDragged(int col) override;
+    void borderDoubleClicked(int col) override { mComforts.borderDoubleClicked(col); }
     void clickWithRightButton(QPointF at);
     bool dragAccepted(const QMimeData* data) override;
     bool dropped(const QMimeData* data, QPointF at) override;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QCoreApplication>
 #include <QHeaderView>
 #include <QStyledItemDelegate>
 
@@ -7,18 +8,21 @@ class QTableView;
 
 namespace platform::qt {
 
+class GridWidget;
+
 /// The margin of a text in a cell of the grid, in logical pixels.
 inline constexpr int cellMargin = 4;
 
 /// Cells of the grid: the current one has a frame, thin while the grid is without the focus.
 class GridCellDelegate : public QStyledItemDelegate {
 public:
-    explicit GridCellDelegate(QTableView& view);
+    GridCellDelegate(const GridWidget& grid, QTableView& view);
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option,
                const QModelIndex& index) const override;
 
 private:
+    const GridWidget& mGrid;
     const QTableView& mView;
 };
 
@@ -36,6 +40,30 @@ public:
 
 protected:
     void changeEvent(QEvent* event) override;
+};
+
+/// The fields at the head of the grid's columns. The current one has a frame as cells have; the
+/// first blank one says what it is for; a column that is being dragged shows where it would come.
+class FieldTitles : public GridHeader {
+    Q_DECLARE_TR_FUNCTIONS(platform::qt::FieldTitles)
+
+public:
+    FieldTitles(const GridWidget& grid, QWidget* parent)
+        : GridHeader(Qt::Horizontal, parent), mGrid(grid) {}
+
+    /// Whether a place belongs to the border of a column, which is there for its width.
+    bool isOnBorder(int x) const;
+    /// Shows the gap before a column, counted from 1; 0 shows none.
+    void setGap(int column);
+    int gap() const { return mGap; }
+
+protected:
+    void paintEvent(QPaintEvent* event) override;
+    void paintSection(QPainter* painter, const QRect& place, int section) const override;
+
+private:
+    const GridWidget& mGrid;
+    int mGap = 0;
 };
 
 /// The titles of the grid's rows.

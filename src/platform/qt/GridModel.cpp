@@ -47,6 +47,8 @@ int GridModel::columnCount(const QModelIndex& parent) const {
 QVariant GridModel::valueOf(const Cell& cell, int role) {
     if (role == Qt::DisplayRole) return asSigns(cell.text);
     if (role == Qt::TextAlignmentRole) return static_cast<int>(cell.alignment);
+    if (role == noteRole) return cell.note;
+    if (role == Qt::AccessibleDescriptionRole && !cell.note.isEmpty()) return cell.note;
     return {};
 }
 

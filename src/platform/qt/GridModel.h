@@ -14,6 +14,8 @@ class GridModel : public QAbstractTableModel {
     Q_DECLARE_TR_FUNCTIONS(platform::qt::GridModel)
 
 public:
+    static constexpr int noteRole = Qt::UserRole;
+
     GridModel(int rows, int cols, QObject* parent);
 
     int rows() const { return mRows; }
@@ -22,6 +24,9 @@ public:
     const QString& text(int row, int col) const { return cell(row, col).text; }
     void setText(int row, int col, const QString& text) { cell(row, col).text = text; }
     void setAlignment(int row, int col, std::int16_t alignment);
+    /// What there is to say about a cell; empty: nothing.
+    const QString& note(int row, int col) const { return cell(row, col).note; }
+    void setNote(int row, int col, const QString& note) { cell(row, col).note = note; }
     /// Twips.
     float width(int col) const { return column(col).width; }
     void setWidth(int col, float width) { column(col).width = width; }
@@ -44,6 +49,7 @@ public:
 private:
     struct Cell {
         QString text;
+        QString note;
         Qt::Alignment alignment = Qt::AlignLeft | Qt::AlignVCenter;
     };
 

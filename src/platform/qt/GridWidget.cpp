@@ -5,13 +5,17 @@
 #include "platform/qt/GridCorner.h"
 #include "platform/qt/GridModel.h"
 #include "platform/qt/KeyCodes.h"
+#include "platform/qt/ShownText.h"
 #include "platform/qt/Twips.h"
 
+#include <QAccessible>
 #include <QContextMenuEvent>
 #include <QDropEvent>
 #include <QHeaderView>
 #include <QHelpEvent>
+#include <QPointer>
 #include <QScrollBar>
+#include <QToolTip>
 
 namespace platform::qt {
 
@@ -38,15 +42,16 @@ void prepareHeader(QHeaderView& header) {
 
 GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     : QWidget(parent), mModel(new GridModel(rows, cols, this)), mView(new TableView(this)),
+      mTitles(new FieldTitles(*this, mView)), mGestures(*mTitles),
       mCorner(new GridCorner(*mModel, mView)) {
     setAcceptDrops(true);
     setFocusProxy(mView);
     mView->setFocusPolicy(Qt::ClickFocus);
     mView->setAccessibleName(tr("Output columns"));
-    mView->setHorizontalHeader(new GridHeader(Qt::Horizontal, mView));
+    mView->setHorizontalHeader(mTitles);
     mView->setVerticalHeader(new RowTitles(mView));
     mCorner->raise();
-    mView->setItemDelegate(new GridCellDelegate(*mView));
+    mView->setItemDelegate(new GridCellDelegate(*this, *mView));
     mView->setModel(mModel);
     mView->setFrameShape(QFrame::NoFrame);
     mView->setEditTriggers(QTableView::NoEditTriggers);
@@ -75,8 +80,14 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     connect(mView->verticalScrollBar(), &QScrollBar::valueChanged, this, scrolled);
     connect(mView->horizontalHeader(), &QHeaderView::sectionResized, this,
             [this](int section, int, int size) {
-                if (!mRefreshing) mModel->setWidth(section + 1, toTwips(size));
+                if (mRefreshing) return;
+                mModel->setWidth(section + 1, toTwips(size));
+                mResized = section + 1;
             });
+    connect(mTitles, &QHeaderView::sectionHandleDoubleClicked, this, [this](int section) {
+        mResized = 0;
+        if (mListener) mListener->borderDoubleClicked(section + 1);
+    });
     connect(mView->selectionModel(), &QItemSelectionModel::currentChanged, this,
             [this](const QModelIndex& current) {
                 if (mRefreshing || !current.isValid()) return;
@@ -92,6 +103,11 @@ GridHeader& GridWidget::fields() const {
 
 GridHeader& GridWidget::titles() const {
     return static_cast<GridHeader&>(*mView->verticalHeader());
+}
+
+void GridWidget::setListener(GridListener* listener) {
+    mListener = listener;
+    mGestures.setListener(listener);
 }
 
 void GridWidget::measure() {
@@ -164,8 +180,9 @@ void GridWidget::refresh() {
         resized = true;
     }
     if (resized) static_cast<TableView*>(mView)->updateGeometries();
-    if (mRow > 0 && mCol > 0)
-        mView->setCurrentIndex(mModel->index(mRow - 1, mCol - 1));
+    // A field is in none of the view's rows; the one below keeps its column for the view.
+    if (mCol > 0)
+        mView->setCurrentIndex(mModel->index(std::max(mRow, 1) - 1, mCol - 1));
     else
         mView->selectionModel()->clear();
     mModel->announce();
@@ -235,7 +252,12 @@ bool GridWidget::eventFilter(QObject* watched, QEvent* event) {
     case QEvent::MouseButtonRelease:
         if (part != mView) return mouse(part, static_cast<QMouseEvent*>(event));
         break;
+    case QEvent::FocusIn:
+    case QEvent::FocusOut:
+        if (part == mView) mTitles->viewport()->update();
+        break;
     case QEvent::MouseMove:
+        if (part == mTitles->viewport()) mGestures.moved(static_cast<QMouseEvent&>(*event));
         // No selecting along the way of a held button; headers need it for their widths.
         if (part == mView->viewport()) return true;
         break;
@@ -266,11 +288,53 @@ bool GridWidget::mouse(QWidget* part, QMouseEvent* event) {
         mView->setCurrentIndex(index);
     }
     const QPointF at = part->mapTo(this, event->position());
+    const bool field = part == mTitles->viewport();
+    if (field && pressed) mGestures.pressed(*event);
+    const QPointer<GridWidget> alive = this;
     if (mListener && pressed)
         mListener->pressed(event->button(), event->modifiers(), at);
     else if (mListener)
         mListener->released(event->button(), event->modifiers(), at);
-    return body;
+    if (!alive || !field || pressed) return body;
+    if (const int resized = std::exchange(mResized, 0); resized > 0 && mListener)
+        mListener->borderDragged(resized);
+    if (alive) mGestures.released(*event);
+    return false;
+}
+
+int GridWidget::offeredColumn() const {
+    if (!mListener || !mListener->offersFields()) return 0;
+    int last = mModel->cols() - 1;
+    if (!mModel->text(0, last).isEmpty()) return 0;
+    while (last > 0 && mModel->text(0, last).isEmpty()) --last;
+    return last + 1;
+}
+
+void GridWidget::walkTo(int row, int col) {
+    setCurrentCell(row, std::clamp(col, 1, mModel->cols() - 1));
+    showCurrentCell();
+    if (row > 0) return;
+    // To the view this is no change of its current cell, so nobody else tells.
+    QAccessibleEvent focus(mView, QAccessible::Focus);
+    focus.setChild(mCol); // after the corner, the head of each column
+    QAccessible::updateAccessibility(&focus);
+}
+
+/// The keys that lead to the fields, along them and back.
+bool GridWidget::walkFields(const QKeyEvent& event) {
+    if (modifiersOf(event) != Qt::NoModifier) return false;
+    if (mRow == 1 && event.key() == Qt::Key_Up && mListener->offersFields())
+        return walkTo(0, mCol), true;
+    if (mRow != 0 || mCol == 0) return false;
+    switch (event.key()) {
+    case Qt::Key_Up: return true;
+    case Qt::Key_Down: return walkTo(1, mCol), true;
+    case Qt::Key_Left: return walkTo(0, mCol - 1), true;
+    case Qt::Key_Right: return walkTo(0, mCol + 1), true;
+    case Qt::Key_Home: return walkTo(0, 1), true;
+    case Qt::Key_End: return walkTo(0, mModel->cols() - 1), true;
+    default: return false;
+    }
 }
 
 void GridWidget::showCurrentCell() {
@@ -295,8 +359,13 @@ bool GridWidget::keyPressed(QKeyEvent& event) {
         mListener->deleteKey(middleOfCurrentCell());
         return true;
     }
+    if (event.key() == Qt::Key_Escape && mGestures.cancel()) return true;
+    if (walkFields(event)) return true;
+    if (modifiersOf(event) == Qt::AltModifier && arrowOf(event).x() != 0)
+        return mListener->moveKey(arrowOf(event).x());
     if (isTyping(event)) return mListener->typed(event);
     if (event.key() != Qt::Key_F2 && !isEnter(event)) return false;
+    if (mListener->editKey()) return true;
     // For the keyboard, what a click on the current cell is for the mouse.
     const QPointF middle = middleOfCurrentCell();
     const QPointer<GridWidget> alive = this;
@@ -322,6 +391,8 @@ bool GridWidget::toolTip(QWidget* part, const QHelpEvent& help) {
             const QRect cell = cellRect(row, col);
             if (!cell.contains(at)) continue;
             const QRect place(part->mapFrom(this, cell.topLeft()), cell.size());
+            if (const QString& note = mModel->note(row, col); !note.isEmpty())
+                return QToolTip::showText(help.globalPos(), asToolTip(note), part, place), true;
             showElisionToolTip(help, *part, mModel->text(row, col), font(),
                                place.adjusted(textMargin / 2, 0, -textMargin / 2, 0));
             return true;

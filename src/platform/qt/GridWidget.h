@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/qt/FieldGestures.h"
+
 #include <QCoreApplication>
 #include <QTableView>
 
@@ -7,6 +9,7 @@
 
 namespace platform::qt {
 
+class FieldTitles;
 class GridCorner;
 class GridHeader;
 class GridModel;
@@ -23,6 +26,19 @@ public:
     virtual void deleteKey(QPointF at) = 0;
     /// A key with a printable text, for the current cell. False when it means nothing there.
     virtual bool typed(QKeyEvent& event) = 0;
+    /// A key asks for the current cell's editor. False when a press on the cell is to open it.
+    virtual bool editKey() = 0;
+    /// Whether fields can be chosen, so that they are cells to walk to as the others.
+    virtual bool offersFields() const = 0;
+    /// A click with the left button on a column's field that was no drag.
+    virtual void fieldClicked(int col) = 0;
+    virtual bool columnMovable(int col) = 0;
+    virtual void columnMoved(int col, int position) = 0;
+    /// A key moves the current column by some places. False when it means nothing.
+    virtual bool moveKey(int step) = 0;
+    /// The user has given a column another width.
+    virtual void borderDragged(int col) = 0;
+    virtual void borderDoubleClicked(int col) = 0;
     virtual bool dragAccepted(const QMimeData* data) = 0;
     virtual bool dropped(const QMimeData* data, QPointF at) = 0;
 };
@@ -36,7 +52,7 @@ class GridWidget : public QWidget {
 public:
     GridWidget(int rows, int cols, QWidget* parent);
 
-    void setListener(GridListener* listener) { mListener = listener; }
+    void setListener(GridListener* listener);
     GridModel& model() const { return *mModel; }
     QTableView& view() const { return *mView; }
 
@@ -46,6 +62,8 @@ public:
     void setCurrentCell(int row, int col);
     int currentRow() const { return mRow; }
     int currentCol() const { return mCol; }
+    /// The first blank column where fields can be chosen; 0 where they cannot.
+    int offeredColumn() const;
 
     void bringUpToDate() const;
     /// Scrolls as little as brings the current cell into view.
@@ -85,6 +103,8 @@ private:
     void fitLabels();
     bool mouse(QWidget* part, QMouseEvent* event);
     bool keyPressed(QKeyEvent& event);
+    bool walkFields(const QKeyEvent& event);
+    void walkTo(int row, int col);
     void openMenu();
     /// After bringing it into view.
     QPointF middleOfCurrentCell();
@@ -93,11 +113,14 @@ private:
     GridListener* mListener = nullptr;
     GridModel* mModel;
     QTableView* mView;
+    FieldTitles* mTitles;
+    FieldGestures mGestures;
     GridCorner* mCorner;
     int mRow = 1;
     int mCol = 1;
     int mRowHeight = 0;
     Sample mSample;
+    int mResized = 0; ///< the column whose border the mouse drags
     bool mStale = false;
     bool mRefreshing = false;
     bool mLabelWidthSet = false;

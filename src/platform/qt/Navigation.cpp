@@ -191,8 +191,12 @@ bool Navigation::claims(const QKeyEvent& event) const {
     if (!inGrid && !onLine && !inTable) return false;
     const Qt::KeyboardModifiers held = modifiersOf(event);
     if (isMenuKey(event)) return true;
+    if (inGrid && held == Qt::AltModifier && arrowOf(event).x() != 0)
+        return mComforts.flags().MovesColumns;
     if (!arrowOf(event).isNull()) return inTable && held & (Qt::AltModifier | Qt::ShiftModifier);
-    if (inGrid && mComforts.flags().KeepsTyping && isTyping(event)) return true;
+    if (inGrid && isTyping(event) &&
+        (mComforts.flags().KeepsTyping || mComforts.flags().OffersFields))
+        return true;
     if (held != Qt::NoModifier) return false;
     return event.key() == Qt::Key_Delete || (isEnter(event) && (inGrid || onLine)) ||
            (event.key() == Qt::Key_F2 && inGrid);

@@ -4,6 +4,7 @@
 #include "platform/qt/CanvasAccessible.h"
 #include "platform/qt/CanvasItems.h"
 #include "platform/qt/Dialog.h"
+#include "platform/qt/EditorWatch.h"
 #include "platform/qt/Fonts.h"
 #include "platform/qt/Frames.h"
 #include "platform/qt/GridAdapter.h"
@@ -11,6 +12,7 @@
 #include "platform/qt/HomeButton.h"
 #include "platform/qt/Inputs.h"
 #include "platform/qt/MessageBox.h"
+#include "platform/qt/PickListWidget.h"
 #include "platform/qt/PopupMenu.h"
 #include "platform/qt/ScrollBar.h"
 #include "platform/qt/Text.h"
@@ -93,7 +95,7 @@ std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents ev
             const auto* grid = static_cast<const GridWidget*>(mGrid.data());
             return grid ? grid->model().titleOf(grid->currentRow(), grid->currentCol()) : QString();
         });
-    if (!design.Container) frame->setLeft([this] { mComforts.editorLeft(); });
+    if (!design.Container) new EditorWatch(*frame, [this] { mComforts.editorLeft(); });
     return adapt<RowFrameAdapter>(design, Role::frame, frame);
 }
 
@@ -163,6 +165,11 @@ std::unique_ptr<Dialog> QtToolkit::makeDialog(const Design& design, DialogEvents
     dialog->setObjectName(toQt(design.Name));
     dialog->setProperty(ownerProperty, QVariant::fromValue(static_cast<void*>(this)));
     return std::make_unique<DialogAdapter>(dialog, mFocus);
+}
+
+std::unique_ptr<PickList> QtToolkit::makePickList(const Design& design, PickListEvents events) {
+    auto* list = new PickListWidget(parentOf(design), std::move(events.Picked));
+    return adapt<PickListAdapter>(design, Role::frame, list);
 }
 
 Ref<TalvikTabulet::Tabulet> QtToolkit::makeTabulet(const Design& design, std::int16_t index,

@@ -46,6 +46,7 @@ public:
                                                         MSFlexGridLib::GridEvents events) override;
     std::unique_ptr<PopupMenu> makePopupMenu(const Design& design, PlainEvent Click) override;
     std::unique_ptr<Dialog> makeDialog(const Design& design, DialogEvents events) override;
+    std::unique_ptr<PickList> makePickList(const Design& design, PickListEvents events) override;
     Ref<TalvikTabulet::Tabulet> makeTabulet(const Design& design, std::int16_t index,
                                             const TalvikTabulet::Tabulet* pattern,
                                             const TalvikTabulet::TabuletEvents& events) override;

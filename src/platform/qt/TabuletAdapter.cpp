@@ -52,6 +52,10 @@ public:
         if (live()) mTable->mWidget->model().setMarked(mRow, value == 1);
     }
 
+    void ComesOut(bool value) override {
+        if (live()) mTable->mWidget->model().setComesOut(mRow, value);
+    }
+
     void Refresh() override {
         if (live()) list().update(index());
     }

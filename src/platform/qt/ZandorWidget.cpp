@@ -25,6 +25,7 @@ public:
     void Raise(TalvikDBxZandor::Event event,
                const TalvikDBxZandor::EventArguments& arguments) override {
         using TalvikDBxZandor::Event;
+        mWidget.mToolkit->comforts().raised(event, arguments);
         switch (event) {
         case Event::TableDeleted: Q_EMIT mWidget.TableDeleted(); break;
         case Event::TableMoved: Q_EMIT mWidget.TableMoved(); break;
@@ -107,6 +108,14 @@ const comforts::Flags& ZandorWidget::comforts() const { return mToolkit->comfort
 
 void ZandorWidget::setComforts(const comforts::Flags& flags) {
     mToolkit->comforts().setFlags(flags);
+}
+
+void ZandorWidget::setFindings(std::vector<comforts::Finding> findings) {
+    mToolkit->comforts().setFindings(std::move(findings));
+}
+
+bool ZandorWidget::showCell(const QString& definition, int row) {
+    return mToolkit->comforts().showCell(fromQt(definition), row);
 }
 
 void ZandorWidget::takeOver() { mToolkit->comforts().takeOver(); }

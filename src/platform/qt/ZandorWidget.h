@@ -1,11 +1,13 @@
 #pragma once
 
+#include "comforts/Field.h"
 #include "comforts/Flags.h"
 #include "control/Zandor.h"
 
 #include <QWidget>
 
 #include <memory>
+#include <vector>
 
 Q_DECLARE_METATYPE(platform::Ref<TalvikZandorLib::Zandor>)
 Q_DECLARE_METATYPE(platform::Ref<TalvikZandorLib::ZDJoin>)
@@ -118,9 +120,18 @@ public:
     void setComforts(const comforts::Flags& flags);
 
     /// With the comfort of typing kept, what stands in an open editor goes into its cell, and the
-    /// editor closes; ColumnModified is emitted when that changes anything. For hosts that are
-    /// about to run, save or close the query by something that does not take the focus.
+    /// editor closes; ColumnModified is emitted when that changes anything. The widget does so
+    /// by itself when the user turns to something else in its window, shortcuts included; hosts
+    /// that are about to run, save or close the query for another reason call it first.
     void takeOver();
+
+    /// What there is to say about cells of the grid, each shown at its cell, as a mark and in the
+    /// tooltip; cells that are not named have nothing. Stays until it is set anew, and goes with
+    /// the cells when their columns move.
+    void setFindings(std::vector<comforts::Finding> findings);
+    /// Makes a cell of the grid the current one, in view and with the focus: the row of the grid,
+    /// and the column of the definition with a key. False when it is not there.
+    bool showCell(const QString& definition, int row);
 
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override;

@@ -2,6 +2,8 @@
 
 #include "designer/DrawingArea.h"
 #include "designer/statement/FindingPlace.h"
+#include "platform/qt/GridModel.h"
+#include "platform/qt/GridWidget.h"
 
 #include <gmock/gmock.h>
 
@@ -30,6 +32,11 @@ protected:
         ZandorWidget& control = area->control();
         const QRect seen(control.VisibleFrameLeft(), control.VisibleFrameTop(), 800 * 15, 300 * 15);
         return seen.contains(QRect(table->Left(), table->Top(), table->Width(), table->Height()));
+    }
+
+    platform::qt::GridWidget& grid() {
+        return dynamic_cast<platform::qt::GridWidget&>(
+            *area->control().findChild<QWidget*>("sprColumn"));
     }
 
     static bool isSelected(const platform::Ref<model::Table>& table, const char16_t* column) {
@@ -71,6 +78,28 @@ TEST_F(ThePlaceOfAFinding, IsTheColumnOfAnOutputColumn) {
     EXPECT_TRUE(isInView(far));
     EXPECT_TRUE(isSelected(far, u"name"));
     EXPECT_FALSE(isSelected(far, u"id"));
+}
+
+TEST_F(ThePlaceOfAFinding, IsTheCellOfACriterion) {
+    model::Finding finding = at(u"", u"", output->Key());
+    finding.row = 5;
+    show(finding);
+    EXPECT_EQ(grid().currentRow(), 5);
+    EXPECT_EQ(grid().currentCol(), 1);
+}
+
+TEST_F(ThePlaceOfAFinding, IsMarkedInItsCell) {
+    model::Finding finding = at(u"", u"", output->Key());
+    finding.row = 4;
+    finding.text = u"There is no end.";
+    model::Finding other{model::Finding::Kind::cartesianProduct, u"Too many rows."};
+    area->showFindings({other, finding});
+    EXPECT_EQ(grid().model().note(4, 1), "There is no end.");
+    // The mark outlives the control that is made when the query is changed from elsewhere.
+    drawn.document.setQuery(drawn.query);
+    EXPECT_EQ(grid().model().note(4, 1), "There is no end.");
+    area->showFindings({});
+    EXPECT_EQ(grid().model().note(4, 1), "");
 }
 
 TEST_F(ThePlaceOfAFinding, IsBothColumnsOfAJoinWithTheLeftOneInView) {

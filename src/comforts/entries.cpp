@@ -1,0 +1,19 @@
+#include "comforts/Comforts.h"
+#include "comforts/Door.h"
+
+// The entries of the tables on the canvas.
+
+namespace comforts {
+
+/// The entry comes behind the last output column. A full grid has no place for it, and takes none.
+bool Comforts::entryDoubleClicked(std::int16_t table, std::int32_t entry) {
+    if (!mFlags.AddsOnDoubleClick) return false;
+    return act(u"entryDoubleClicked", [&](Door& door) {
+        if (!door.hasGrid()) return false;
+        const std::int32_t last = door.lastColumn();
+        if (last + 1 < door.grid().Cols()) door.drop(table, entry, last + 1);
+        return true;
+    });
+}
+
+} // namespace comforts
