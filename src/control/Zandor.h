@@ -286,6 +286,8 @@ private:
                                   std::int16_t Button, std::int16_t Shift);
     void lstTable_ColumnMouseUp(std::int16_t Index, const Ref<ColumnItem>& Column,
                                 std::int16_t Button, std::int16_t Shift);
+    void lstTable_SelectionChanged(std::int16_t Index);
+    void CopySelection(std::int16_t Index, platform::StringView traceTitle);
     void lstTable_DragOver(std::int16_t Index, platform::Control* Source, float X, float Y,
                            std::int16_t State);
     void lstTable_DragDrop(std::int16_t Index, platform::Control* Source, float X, float Y);

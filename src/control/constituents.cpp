@@ -118,6 +118,7 @@ TalvikTabulet::TabuletEvents Zandor::TableEvents() {
             .ColumnMouseDown = [this](auto&&... a) { lstTable_ColumnMouseDown(a...); },
             .ColumnMouseMove = [this](auto&&... a) { lstTable_ColumnMouseMove(a...); },
             .ColumnMouseUp = [this](auto&&... a) { lstTable_ColumnMouseUp(a...); },
+            .SelectionChanged = [this](auto... a) { lstTable_SelectionChanged(a...); },
             .DragOver = [this](auto... a) { lstTable_DragOver(a...); },
             .DragDrop = [this](auto... a) { lstTable_DragDrop(a...); },
             .Moving = [this](auto... a) { lstTable_Moving(a...); },

@@ -91,6 +91,8 @@ struct TabuletEvents {
     Mouse ColumnMouseDown;
     Mouse ColumnMouseMove;
     Mouse ColumnMouseUp;
+    /// The user has changed the selection otherwise than by pressing an entry.
+    Plain SelectionChanged;
     std::function<void(std::int16_t Index, platform::Control* Source, float X, float Y,
                        std::int16_t State)>
         DragOver;

@@ -35,6 +35,48 @@ TEST_F(PressingColumns, CopiesTheSelectionIntoTheModelAsOnesAndZeros) {
     EXPECT_EQ(events(), Texts{});
 }
 
+TEST_F(PressingColumns, CopiesTheSelectionThatTheReleaseLeaves) {
+    stage->selectEntries(1, {1, 3, 4});
+    control().DebugSwitch(1);
+    stage->pressEntry(1, 3, 1);
+    EXPECT_EQ(activated(), (std::vector<int>{1, 0, 1, 1}));
+    forget();
+    stage->releaseEntry(1, 3, 1);
+    control().DebugSwitch(0);
+    EXPECT_EQ(selectedIn(1), std::vector<String>{u"CITY"});
+    EXPECT_EQ(activated(), (std::vector<int>{0, 0, 1, 0}));
+    EXPECT_EQ(stage->transcript, Texts{}) << "no trace";
+}
+
+TEST_F(PressingColumns, SaysNothingOfAReleaseThatLeavesTheSelectionAsItWas) {
+    stage->pressEntry(1, 2, 1);
+    pressed->column(u"NAME").activatedValue = 7;
+    stage->releaseEntry(1, 2, 1);
+    EXPECT_EQ(pressed->column(u"NAME").activatedValue, 7);
+}
+
+TEST_F(PressingColumns, DeselectsAllOnAnEmptyPlaceOfTheList) {
+    stage->selectEntries(1, {1, 3});
+    stage->pressEntry(1, 1, 1);
+    stage->releaseEntry(1, 1, 1);
+    stage->pressEntry(1, 0, 1);
+    EXPECT_EQ(selectedIn(1), std::vector<String>{});
+    EXPECT_EQ(activated(), (std::vector<int>{0, 0, 0, 0}));
+    stage->moveOverEntry(1, 2, 1);
+    EXPECT_EQ(Back::mDragTableIndex(control()), 0) << "nothing was picked up";
+    stage->releaseEntry(1, 0, 1);
+    EXPECT_EQ(stage->transcript, Texts{});
+}
+
+TEST_F(PressingColumns, ReportsASelectionThatCannotBeCopied) {
+    stage->selectEntries(1, {1, 3});
+    stage->pressEntry(1, 3, 1);
+    pressed->columns.items.Remove(u"kNAME");
+    stage->releaseEntry(1, 3, 1);
+    EXPECT_EQ(told(), Texts{noKey("lstTable_SelectionChanged")});
+    EXPECT_EQ(pressed->column(u"ID").activatedValue, 0) << "those before it are copied";
+}
+
 TEST_F(PressingColumns, CopiesTheSelectionForEveryButton) {
     for (const std::int16_t button : {1, 2, 4, 3}) {
         stage->selectEntries(1, {2});

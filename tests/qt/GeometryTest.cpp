@@ -16,7 +16,17 @@ Bounds boundsOf(const QWidget& widget) {
         ->bounds();
 }
 
-class Geometry : public Desk {};
+class Geometry : public Desk {
+protected:
+    /// Pulls a box at a place of it.
+    static void drag(QWidget& box, QPointF grip, QPointF way) {
+        const QPointF start = box.mapToGlobal(grip);
+        const auto end = [&] { return box.mapFromGlobal(start + way); };
+        hands::mouse(box, QEvent::MouseButtonPress, grip, Qt::LeftButton, Qt::LeftButton);
+        hands::mouse(box, QEvent::MouseMove, end(), Qt::NoButton, Qt::LeftButton);
+        hands::mouse(box, QEvent::MouseButtonRelease, end(), Qt::LeftButton);
+    }
+};
 
 } // namespace
 
@@ -106,6 +116,62 @@ TEST_F(Geometry, GrownByTheLeftEdgeKeepsTheRightOne) {
     EXPECT_EQ(box.geometry(), QRect(300, 30, 200, 120));
     EXPECT_EQ(customers->left, 4500);
     EXPECT_EQ(customers->width, 3000);
+}
+
+TEST_F(Geometry, ResizedNearACornerIsReportedAsMovedWhenTheCornerMoves) {
+    show();
+    bind();
+    int moved = 0;
+    QObject::connect(widget.get(), &ZandorWidget::TableMoved, [&moved] { ++moved; });
+    auto& box = table(2);
+    const auto at = [&box](double x, double y) {
+        return QPointF(x < 0 ? box.width() + x : x, y < 0 ? box.height() + y : y);
+    };
+    const struct {
+        QPointF grip, way;
+        int moved;
+    } pulls[] = {
+        {at(6, -2), {0, 30}, 0},   // near the lower left corner, downwards
+        {at(2, -6), {0, 20}, 0},   //
+        {at(2, -6), {10, 0}, 1},   // its left edge
+        {at(-2, 6), {20, 0}, 0},   // near the upper right corner, to the right
+        {at(-6, 2), {0, 10}, 1},   // its top edge
+        {at(2, 2), {0, 0.25}, 1},  // the upper left corner
+        {at(-2, -2), {15, 15}, 0}, // the lower right one
+        {at(-2, 50), {15, 7}, 0},  // an edge
+        {at(50, -2), {15, 7}, 0},  //
+        {at(2, 50), {-15, 0}, 1},  //
+        {at(50, 2), {15, -7}, 1},  //
+    };
+    int pull = 0;
+    for (const auto& [grip, way, expected] : pulls) {
+        moved = 0;
+        // The grips were reckoned with the box as it was at first.
+        customers->place(5100, 450, 2400, 1800);
+        widget->setModel(std::shared_ptr<TalvikZandorLib::Zandor>(model));
+        settle();
+        drag(table(2), grip, way);
+        EXPECT_EQ(moved, expected) << pull++;
+        EXPECT_EQ(
+            toPixels(Bounds{customers->left, customers->top, customers->width, customers->height}),
+            table(2).geometry());
+    }
+}
+
+TEST_F(Geometry, GrownBeyondTheVisibleEdgeKeepsTheOppositeOne) {
+    show();
+    bind();
+    widget->setHorizontalScrollbarPos(300);
+    widget->setVerticalScrollbarPos(150);
+    settle();
+    auto& box = table(1);
+    const QPoint corner = box.geometry().bottomRight();
+    drag(box, QPointF(1, 1), QPointF(-200, -200));
+    EXPECT_EQ(box.geometry(), QRect(QPoint(20, 10), corner));
+    EXPECT_EQ(orders->left, 300);
+    EXPECT_EQ(orders->width, 600 + 2400 - 300);
+    EXPECT_EQ(orders->top, 150);
+    EXPECT_EQ(orders->height, 600 + 2700 - 150);
 }
 
 TEST_F(Geometry, OfAJoinEndsAtTheRowsOfItsColumns) {

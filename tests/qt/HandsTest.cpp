@@ -126,6 +126,53 @@ TEST_F(Hands, ThatDragStartOneDragHoweverOftenTheMouseMoves) {
     EXPECT_EQ(started, 1);
 }
 
+TEST_F(Hands, ThatAreQuickDragTheEntryThatTheyPressed) {
+    show();
+    bind();
+    QWidget& viewport = *table(2).list().viewport();
+    int started = 0;
+    widget->toolkit().drags().setCarrier([&](QDrag&) { ++started; });
+    // The last entry, and the first move is reported from below it; then from beside the table.
+    for (const QPointF way : {QPointF(0, 15), QPointF(0, 90), QPointF(-200, 0), QPointF(900, 9)}) {
+        const QPointF start = entry(2, 3);
+        hands::mouse(viewport, QEvent::MouseButtonPress, start, Qt::LeftButton, Qt::LeftButton);
+        hands::mouse(viewport, QEvent::MouseMove, start + way, Qt::NoButton, Qt::LeftButton);
+        hands::mouse(viewport, QEvent::MouseButtonRelease, start + way, Qt::LeftButton);
+        EXPECT_EQ(selected(2), QStringList("TOWN"));
+    }
+    EXPECT_EQ(started, 4);
+}
+
+TEST_F(Hands, ThatPressAnEmptyPlaceOfAListDragNothing) {
+    show();
+    bind();
+    QWidget& viewport = *table(2).list().viewport();
+    int started = 0;
+    widget->toolkit().drags().setCarrier([&](QDrag&) { ++started; });
+    hands::click(viewport, entry(2, 1));
+    const QPointF below(30, viewport.height() - 3.0);
+    hands::mouse(viewport, QEvent::MouseButtonPress, below, Qt::LeftButton, Qt::LeftButton);
+    EXPECT_EQ(selected(2), QStringList());
+    hands::mouse(viewport, QEvent::MouseMove, entry(2, 1), Qt::NoButton, Qt::LeftButton);
+    EXPECT_EQ(started, 0);
+}
+
+TEST_F(Hands, ThatHoldShiftSelectFromTheEntryClickedLast) {
+    show();
+    bind();
+    QWidget& viewport = *table(1).list().viewport();
+    const auto click = [&](int row, Qt::KeyboardModifiers held = {}) {
+        for (const auto type : {QEvent::MouseButtonPress, QEvent::MouseButtonRelease})
+            hands::mouse(viewport, type, entry(1, row), Qt::LeftButton,
+                         type == QEvent::MouseButtonPress ? Qt::LeftButton : Qt::NoButton, held);
+    };
+    click(2);
+    click(5, Qt::ControlModifier);
+    click(2); // was selected already
+    click(4, Qt::ShiftModifier);
+    EXPECT_EQ(selected(1), QStringList({"CUSTOMER_ID", "EMPLOYEE_ID", "ORDERED_ON"}));
+}
+
 TEST_F(Hands, ThatDragShowThePickedNames) {
     show();
     bind();

@@ -47,6 +47,7 @@ struct ZandorBackstage {
     ZANDOR_PROCEDURE(fraTable_MouseUp)
     ZANDOR_PROCEDURE(lstTable_ColumnMouseDown)
     ZANDOR_PROCEDURE(lstTable_ColumnMouseMove)
+    ZANDOR_PROCEDURE(lstTable_SelectionChanged)
     ZANDOR_PROCEDURE(lstTable_ColumnMouseUp)
     ZANDOR_PROCEDURE(lstTable_DragOver)
     ZANDOR_PROCEDURE(lstTable_DragDrop)

@@ -108,6 +108,7 @@ public:
     virtual void scrollGrid(std::int32_t topRow, std::int32_t leftCol) = 0;
     /// Selects entries (1-based) as clicks with Ctrl do, without the button events.
     virtual void selectEntries(std::int16_t index, const std::vector<std::int32_t>& entries) = 0;
+    /// 0: an empty place of the list.
     virtual void pressEntry(std::int16_t index, std::int32_t entry, std::int16_t button) = 0;
     virtual void releaseEntry(std::int16_t index, std::int32_t entry, std::int16_t button) = 0;
     /// Button is the sum of the buttons held.

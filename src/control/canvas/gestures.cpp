@@ -18,25 +18,36 @@ Held<TalvikZandorLib::ZDTable> Zandor::TableOf(const Held<Tabulet>& element) {
     return Tables().Item(key);
 }
 
+/// Makes the model's columns active as far as their entries are selected. Without a title nothing
+/// is traced.
+void Zandor::CopySelection(std::int16_t Index, platform::StringView traceTitle) {
+    const auto element = Hold(lstTable(Index));
+    for (std::int32_t n = 1; n <= element->ColumnItems().Count(); ++n) {
+        const auto entry = Hold(element->ColumnItems().Item(n));
+        const auto table = TableOf(element);
+        const auto column = List(table, &TalvikZandorLib::ZDTable::Columns).Item(entry->Key());
+        const bool selected = entry->Selected();
+        const bool traced = selected && !traceTitle.empty();
+        if (traced) Trace(u"Selected column found: " + entry->Text(), traceTitle);
+        column->activated(selected ? std::int16_t{1} : std::int16_t{0});
+        if (traced && mDebugSwitch != 0)
+            Trace(u"Tabulet Column selected: " + column->Name(), traceTitle);
+        // A table that the host has closed has no further entries that matter.
+        require(Shows(Index, element));
+    }
+}
+
 void Zandor::lstTable_ColumnMouseDown(std::int16_t Index, const Ref<ColumnItem>&, std::int16_t,
                                       std::int16_t) {
     constexpr platform::StringView procedure = u"lstTable_ColumnMouseDown";
     Guard(procedure, [&] {
         Trace(procedure);
-        const auto element = Hold(lstTable(Index));
-        for (std::int32_t n = 1; n <= element->ColumnItems().Count(); ++n) {
-            const auto entry = Hold(element->ColumnItems().Item(n));
-            const auto table = TableOf(element);
-            const auto column = List(table, &TalvikZandorLib::ZDTable::Columns).Item(entry->Key());
-            const bool selected = entry->Selected();
-            if (selected) Trace(u"Selected column found: " + entry->Text(), procedure);
-            column->activated(selected ? std::int16_t{1} : std::int16_t{0});
-            if (selected && mDebugSwitch != 0)
-                Trace(u"Tabulet Column selected: " + column->Name(), procedure);
-            // A table that the host has closed has no further entries that matter.
-            require(Shows(Index, element));
-        }
+        CopySelection(Index, procedure);
     });
+}
+
+void Zandor::lstTable_SelectionChanged(std::int16_t Index) {
+    Guard(u"lstTable_SelectionChanged", [&] { CopySelection(Index, {}); });
 }
 
 void Zandor::lstTable_ColumnMouseMove(std::int16_t Index, const Ref<ColumnItem>&,

@@ -52,6 +52,7 @@ public:
     /// As clicks with Ctrl do, without the button events.
     void selectEntries(const std::string& name, const std::vector<std::int32_t>& entries);
 
+    /// Entry 0 is an empty place of the list, where the left button without Ctrl deselects all.
     /// A press on an entry that is not selected selects it alone; with Ctrl it turns the entry's
     /// selection over.
     void pressEntry(const std::string& name, std::int32_t entry, std::int16_t button,
@@ -60,7 +61,7 @@ public:
     /// one selected. While a drag is on it is a drop.
     void releaseEntry(const std::string& name, std::int32_t entry, std::int16_t button,
                       std::int16_t shift = 0);
-    /// Button is the sum of the buttons held.
+    /// Button is the sum of the buttons held. Told is the entry that was pressed.
     void moveOverEntry(const std::string& name, std::int32_t entry, std::int16_t button,
                        std::int16_t shift = 0);
 
@@ -110,7 +111,12 @@ private:
     Toolkit& mToolkit;
     std::string mDragTarget; ///< the table list that a drag is over
     TalvikTabulet::Point mDragPoint;
-    bool mPressedSelected = false; ///< whether the last left press met a selected entry
+    /// The last press on a table list.
+    struct Press {
+        std::string table;
+        std::int32_t entry = 0;
+        bool selected = false; ///< whether the entry was selected already
+    } mPress;
 };
 
 } // namespace platform::headless

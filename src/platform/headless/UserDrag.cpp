@@ -13,20 +13,35 @@ constexpr std::int16_t enter = 0;
 constexpr std::int16_t leave = 1;
 constexpr std::int16_t over = 2;
 
-void selectOnly(const Tabulet& table, std::int32_t chosen) {
-    for (std::size_t i = 1; i <= table.entries().size(); ++i)
-        table.entry(static_cast<std::int32_t>(i)).select(static_cast<std::int32_t>(i) == chosen);
-}
-
 TalvikTabulet::Point placeOf(const Tabulet& table, std::int32_t entry) {
     if (entry == 0) return table.emptyPlace();
     return {table.placement().Width / 2, table.rowMiddle(entry)};
+}
+
+/// True when that changes anything.
+bool selectOnly(const Tabulet& table, std::int32_t chosen) {
+    bool changed = false;
+    for (std::size_t i = 1; i <= table.entries().size(); ++i) {
+        const auto position = static_cast<std::int32_t>(i);
+        ColumnItem& entry = table.entry(position);
+        changed = changed || entry.selected() != (position == chosen);
+        entry.select(position == chosen);
+    }
+    return changed;
+}
+
+void tellOfSelection(const Tabulet& table) {
+    if (table.events.SelectionChanged) table.events.SelectionChanged(table.index);
 }
 
 } // namespace
 
 Tabulet& User::reachEntry(const std::string& name, std::int32_t entry) const {
     auto& table = reach<Tabulet>(name);
+    if (entry == 0) {
+        table.emptyPlace();
+        return table;
+    }
     table.entry(entry);
     if (!table.inView(entry))
         throw std::logic_error("the entry of " + name + " is scrolled out of view");
@@ -37,12 +52,15 @@ void User::pressEntry(const std::string& name, std::int32_t entry, std::int16_t 
                       std::int16_t shift) {
     if (auto& table = reachEntry(name, entry); table.usable()) table.takeFocus();
     auto& table = reachEntry(name, entry);
-    ColumnItem& pressed = table.entry(entry);
-    mPressedSelected = pressed.selected();
     mDragTarget.clear();
+    mPress = {name, entry, entry != 0 && table.entry(entry).selected()};
+    if (entry == 0) {
+        if (button == leftButton && !(shift & ctrl) && selectOnly(table, 0)) tellOfSelection(table);
+        return;
+    }
     if (shift & ctrl)
-        pressed.select(!pressed.selected());
-    else if (!pressed.selected())
+        table.entry(entry).select(!mPress.selected);
+    else if (!mPress.selected)
         selectOnly(table, entry);
     if (table.events.ColumnMouseDown)
         table.events.ColumnMouseDown(table.index, table.entries()[std::size_t(entry) - 1], button,
@@ -52,23 +70,34 @@ void User::pressEntry(const std::string& name, std::int32_t entry, std::int16_t 
 void User::moveOverEntry(const std::string& name, std::int32_t entry, std::int16_t button,
                          std::int16_t shift) {
     auto& table = reachEntry(name, entry);
+    const std::int32_t told = mPress.table == name ? mPress.entry : entry;
+    if (told < 1 || std::size_t(told) > table.entries().size()) return;
     if (table.events.ColumnMouseMove)
-        table.events.ColumnMouseMove(table.index, table.entries()[std::size_t(entry) - 1], button,
+        table.events.ColumnMouseMove(table.index, table.entries()[std::size_t(told) - 1], button,
                                      shift);
 }
 
 void User::releaseEntry(const std::string& name, std::int32_t entry, std::int16_t button,
                         std::int16_t shift) {
-    auto& table = reachEntry(name, entry);
+    auto* table = &reachEntry(name, entry);
+    const Press press = std::exchange(mPress, {});
     if (mToolkit.dragged()) {
-        const TalvikTabulet::Point at = placeOf(table, entry);
+        const TalvikTabulet::Point at = placeOf(*table, entry);
         dropOn(name, at.X, at.Y);
         return;
     }
-    if (button == leftButton && mPressedSelected && !(shift & ctrl)) selectOnly(table, entry);
-    if (table.events.ColumnMouseUp)
-        table.events.ColumnMouseUp(table.index, table.entries()[std::size_t(entry) - 1], button,
-                                   shift);
+    if (entry == 0) return;
+    const bool again = press.selected && press.table == name && press.entry == entry;
+    if (button == leftButton && again && !(shift & ctrl) && selectOnly(*table, entry)) {
+        tellOfSelection(*table);
+        // Whoever was told may have taken the table away.
+        if (!mToolkit.exists(name)) return;
+        table = &mToolkit.find<Tabulet>(name);
+        if (std::size_t(entry) > table->entries().size()) return;
+    }
+    if (table->events.ColumnMouseUp)
+        table->events.ColumnMouseUp(table->index, table->entries()[std::size_t(entry) - 1], button,
+                                    shift);
 }
 
 void User::doubleClickEntry(const std::string& name, std::int32_t entry) {

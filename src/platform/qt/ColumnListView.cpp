@@ -60,25 +60,32 @@ void ColumnListView::changeEvent(QEvent* event) {
     if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) measure();
 }
 
-void ColumnListView::selectFor(QMouseEvent& event, const QModelIndex& index) {
-    mClickPending = QPersistentModelIndex();
+/// The base class knows where ranges begin, and leaves the selection alone for a press on one of
+/// several selected entries.
+void ColumnListView::selectFor(const QMouseEvent& event, const QModelIndex& index) {
     const bool left = event.button() == Qt::LeftButton;
-    if (!left) {
-        if (!index.isValid()) return;
-        selectionModel()->setCurrentIndex(index, selectionModel()->isSelected(index)
-                                                     ? QItemSelectionModel::NoUpdate
-                                                     : QItemSelectionModel::ClearAndSelect);
-        return;
-    }
     const bool plain = event.modifiers() == Qt::NoModifier;
-    if (plain && index.isValid() && selectionModel()->isSelected(index)) {
-        selectionModel()->setCurrentIndex(index, QItemSelectionModel::NoUpdate);
-        mClickPending = index;
-        return;
-    }
-    QListView::mousePressEvent(&event);
+    mPressed = index;
+    mClickPending = QPersistentModelIndex();
+    if (left && plain && selectionModel()->isSelected(index)) mClickPending = index;
+    if (!left && !index.isValid()) return;
+    // Of the buttons, the left one alone extends.
+    QMouseEvent press(event.type(), event.position(), event.scenePosition(), event.globalPosition(),
+                      event.button(), event.buttons(),
+                      left ? event.modifiers() : Qt::KeyboardModifiers());
+    QListView::mousePressEvent(&press);
     // The base class would go on to select along the way of the mouse.
     setState(NoState);
+    if (left && plain && !index.isValid()) selectAlone(index);
+}
+
+void ColumnListView::selectAlone(const QModelIndex& index) {
+    const QItemSelection before = selectionModel()->selection();
+    if (index.isValid())
+        selectionModel()->setCurrentIndex(index, QItemSelectionModel::ClearAndSelect);
+    else
+        selectionModel()->clearSelection();
+    if (mListener && selectionModel()->selection() != before) mListener->selectionChanged();
 }
 
 void ColumnListView::mousePressEvent(QMouseEvent* event) {
@@ -90,18 +97,18 @@ void ColumnListView::mousePressEvent(QMouseEvent* event) {
 }
 
 void ColumnListView::mouseMoveEvent(QMouseEvent* event) {
-    const QModelIndex index = indexAt(event->position().toPoint());
-    if (!mListener || !index.isValid() || event->buttons() == Qt::NoButton) return;
-    mListener->entryMoved(index.row(), buttonState(event->buttons()),
+    if (!mListener || !mPressed.isValid() || event->buttons() == Qt::NoButton) return;
+    mListener->entryMoved(mPressed.row(), buttonState(event->buttons()),
                           shiftState(event->modifiers()));
 }
 
 void ColumnListView::mouseReleaseEvent(QMouseEvent* event) {
-    const QModelIndex index = indexAt(event->position().toPoint());
-    if (event->button() == Qt::LeftButton && mClickPending.isValid() && mClickPending == index)
-        selectionModel()->setCurrentIndex(index, QItemSelectionModel::ClearAndSelect);
-    mClickPending = QPersistentModelIndex();
-    if (mListener && index.isValid())
+    const QPointer<ColumnListView> alive = this;
+    const QPersistentModelIndex index = indexAt(event->position().toPoint());
+    const bool again = event->button() == Qt::LeftButton && mClickPending == index;
+    mPressed = mClickPending = QPersistentModelIndex();
+    if (again && index.isValid()) selectAlone(index);
+    if (alive && mListener && index.isValid())
         mListener->entryReleased(index.row(), buttonState(event->button()),
                                  shiftState(event->modifiers()));
 }

@@ -11,10 +11,13 @@ class EntryListener {
 public:
     virtual ~EntryListener() = default;
     virtual void entryPressed(int row, std::int16_t button, std::int16_t shift) = 0;
+    /// The mouse moves with a button held; told is the entry that was pressed, wherever it is now.
     virtual void entryMoved(int row, std::int16_t buttons, std::int16_t shift) = 0;
     virtual void entryReleased(int row, std::int16_t button, std::int16_t shift) = 0;
     /// After the press that makes the click a double one; or by Enter.
     virtual void entryDoubleClicked(int row) = 0;
+    /// The selection has changed otherwise than by a press on an entry.
+    virtual void selectionChanged() = 0;
     virtual void listScrolled() = 0;
     /// A key asks for the menu at a place of the screen; the row is -1 in a list without entries.
     virtual void menuKey(int row, QPoint at) = 0;
@@ -46,11 +49,13 @@ protected:
     void changeEvent(QEvent* event) override;
 
 private:
-    void selectFor(QMouseEvent& event, const QModelIndex& index);
+    void selectFor(const QMouseEvent& event, const QModelIndex& index);
+    void selectAlone(const QModelIndex& index);
     void openMenu();
     void measure();
 
     EntryListener* mListener = nullptr;
+    QPersistentModelIndex mPressed;
     QPersistentModelIndex mClickPending; ///< to be selected alone when the button comes up
     int mRowHeight = 0;
     int mInset = 0; ///< of the entries, by a style sheet

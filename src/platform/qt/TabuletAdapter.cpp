@@ -234,6 +234,10 @@ void TabuletAdapter::deleteKey(int row) {
                               [&] { entryReleased(row, buttonState(Qt::RightButton), 0); });
 }
 
+void TabuletAdapter::selectionChanged() {
+    if (mEvents.SelectionChanged) mEvents.SelectionChanged(mIndex);
+}
+
 void TabuletAdapter::listScrolled() {
     if (mEvents.Scroll) mEvents.Scroll(mIndex);
 }
@@ -278,9 +282,21 @@ void TabuletAdapter::gestureEnded(Qt::Edges edges) {
     const TalvikTabulet::TabuletEvents& events = mEvents;
     const std::int16_t index = mIndex;
     const QPointer<TabuletWidget> alive = mWidget;
-    const bool movesCorner = !edges || edges & (Qt::LeftEdge | Qt::TopEdge);
-    if (movesCorner && events.Moved) events.Moved(index);
-    if (edges && alive && events.Resized) events.Resized(index);
+    const Bounds left = bounds();
+    // Near a corner an edge takes its neighbour along, which may have stayed where it was.
+    const bool cornerMoved = left.Left != mGestureStart.Left || left.Top != mGestureStart.Top;
+    if ((!edges || cornerMoved) && events.Moved) events.Moved(index);
+    if (!edges || !alive || !alive->property(controlProperty).isValid()) return;
+    if (cornerMoved) keepOppositeEdges(left);
+    if (events.Resized) events.Resized(index);
+}
+
+/// The control brings a corner that was pulled out of sight back; the other edges are to stay.
+void TabuletAdapter::keepOppositeEdges(const Bounds& left) {
+    Bounds box = bounds();
+    if (box.Left != left.Left) box.Width = std::max(left.Left + left.Width - box.Left, 0.0F);
+    if (box.Top != left.Top) box.Height = std::max(left.Top + left.Height - box.Top, 0.0F);
+    if (box != bounds()) setBounds(box);
 }
 
 bool TabuletAdapter::draggedOver(const QMimeData* data, QPointF at, std::int16_t state) {

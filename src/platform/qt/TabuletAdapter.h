@@ -67,6 +67,7 @@ private:
     void entryMoved(int row, std::int16_t buttons, std::int16_t shift) override;
     void entryReleased(int row, std::int16_t button, std::int16_t shift) override;
     void entryDoubleClicked(int row) override;
+    void selectionChanged() override;
     void listScrolled() override;
     void menuKey(int row, QPoint at) override;
     void deleteKey(int row) override;
@@ -74,6 +75,7 @@ private:
     void gestureBegan() override;
     void gestureMoved(Qt::Edges edges, QPointF way) override;
     void gestureEnded(Qt::Edges edges) override;
+    void keepOppositeEdges(const Bounds& left);
     bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) override;
     bool dropped(const QMimeData* data, QPointF at) override;
     void leave();
