@@ -136,7 +136,7 @@ TEST_F(Geometry, ResizedNearACornerIsReportedAsMovedWhenTheCornerMoves) {
         {at(2, -6), {10, 0}, 1},   // its left edge
         {at(-2, 6), {20, 0}, 0},   // near the upper right corner, to the right
         {at(-6, 2), {0, 10}, 1},   // its top edge
-        {at(2, 2), {0, 0.25}, 1},  // the upper left corner
+        {at(2, 2), {0, 2}, 1},     // the upper left corner
         {at(-2, -2), {15, 15}, 0}, // the lower right one
         {at(-2, 50), {15, 7}, 0},  // an edge
         {at(50, -2), {15, 7}, 0},  //
@@ -151,7 +151,8 @@ TEST_F(Geometry, ResizedNearACornerIsReportedAsMovedWhenTheCornerMoves) {
         widget->setModel(std::shared_ptr<TalvikZandorLib::Zandor>(model));
         settle();
         drag(table(2), grip, way);
-        EXPECT_EQ(moved, expected) << pull++;
+        EXPECT_EQ(moved, expected) << pull;
+        ++pull;
         EXPECT_EQ(
             toPixels(Bounds{customers->left, customers->top, customers->width, customers->height}),
             table(2).geometry());

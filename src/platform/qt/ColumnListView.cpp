@@ -91,7 +91,8 @@ void ColumnListView::selectAlone(const QModelIndex& index) {
 void ColumnListView::mousePressEvent(QMouseEvent* event) {
     const QModelIndex index = indexAt(event->position().toPoint());
     selectFor(*event, index);
-    if (mListener && index.isValid())
+    // Whoever was told of an emptied selection may have ended all this.
+    if (index.isValid() && mListener)
         mListener->entryPressed(index.row(), buttonState(event->button()),
                                 shiftState(event->modifiers()));
 }

@@ -2,31 +2,42 @@
 
 #include "platform/qt/Text.h"
 
+#include <QComboBox>
 #include <QFormLayout>
 #include <QHBoxLayout>
 #include <QLabel>
-#include <QLineEdit>
 #include <QPushButton>
+#include <QStyleOptionFrame>
 #include <QVBoxLayout>
+
+#include <algorithm>
 
 namespace platform::qt {
 
-namespace {
-
-void showReadOnly(QLineEdit& text) {
-    text.setReadOnly(true);
-    text.setFocusPolicy(Qt::ClickFocus);
-    QPalette palette = text.palette();
-    palette.setBrush(QPalette::Base, palette.window());
-    text.setPalette(palette);
+NameBox::NameBox(QWidget* parent) : QLineEdit(parent) {
+    setReadOnly(true);
+    QPalette shown = palette();
+    shown.setBrush(QPalette::Base, shown.window());
+    setPalette(shown);
+    connect(this, &QLineEdit::textChanged, this, [this] { updateGeometry(); });
 }
 
-} // namespace
+QSize NameBox::minimumSizeHint() const {
+    constexpr int margin = 4;   // around the text inside the frame
+    constexpr int longest = 40; // in letters; what is longer scrolls
+    const QFontMetrics metrics = fontMetrics();
+    const int width =
+        std::min(metrics.horizontalAdvance(text()), longest * metrics.averageCharWidth());
+    QStyleOptionFrame option;
+    initStyleOption(&option);
+    const QSize content(width + 2 * margin, metrics.height());
+    return QLineEdit::minimumSizeHint().expandedTo(
+        style()->sizeFromContents(QStyle::CT_LineEdit, &option, content, this));
+}
 
 FormDialog::FormDialog(QWidget* parent, PlainEvent Close)
     : QDialog(parent), mForm(new QFormLayout), mButtons(new QHBoxLayout), mClose(std::move(Close)) {
     setModal(true);
-    setMinimumWidth(380);
     mForm->setFieldGrowthPolicy(QFormLayout::AllNonFixedFieldsGrow);
     mButtons->addStretch();
     auto* column = new QVBoxLayout(this);
@@ -42,13 +53,22 @@ void FormDialog::place(QWidget* child, Role role) {
     case Role::button: mButtons->addWidget(child); break;
     case Role::field:
     case Role::frame:
-        if (auto* text = qobject_cast<QLineEdit*>(child)) showReadOnly(*text);
         if (mFields < mLabels)
             if (auto* item = mForm->itemAt(mFields, QFormLayout::LabelRole))
                 if (auto* label = qobject_cast<QLabel*>(item->widget())) label->setBuddy(child);
         mForm->setWidget(mFields++, QFormLayout::FieldRole, child);
         break;
     }
+}
+
+// No minimum: that of the layout would be off, and texts could be cut.
+QSize FormDialog::sizeHint() const { return QDialog::sizeHint().expandedTo({380, 0}); }
+
+void FormDialog::focusFirst() {
+    for (auto* list : findChildren<QComboBox*>())
+        if (list->isEnabled()) return list->setFocus();
+    for (auto* button : findChildren<QPushButton*>())
+        if (button->isDefault()) return button->setFocus();
 }
 
 void FormDialog::reject() {
@@ -70,7 +90,9 @@ void DialogAdapter::Caption(const String& value) {
 }
 
 void DialogAdapter::ShowModal() {
-    if (mWidget) mWidget->exec();
+    if (!mWidget) return;
+    mWidget->focusFirst();
+    mWidget->exec();
 }
 
 void DialogAdapter::Hide() {

@@ -4,11 +4,20 @@
 #include "platform/qt/Adapter.h"
 
 #include <QDialog>
+#include <QLineEdit>
 
 class QFormLayout;
 class QHBoxLayout;
 
 namespace platform::qt {
+
+/// A text to be looked at, with room for all of it within reason.
+class NameBox : public QLineEdit {
+public:
+    explicit NameBox(QWidget* parent);
+
+    QSize minimumSizeHint() const override;
+};
 
 /// A form: labels and fields pair up in the order of their making, buttons stand in a row below.
 class FormDialog : public QDialog {
@@ -16,8 +25,11 @@ public:
     FormDialog(QWidget* parent, PlainEvent Close);
 
     void place(QWidget* child, Role role);
+    /// Gives the focus to what can be changed, or else to the button that Enter presses.
+    void focusFirst();
     void setCloseEvent(PlainEvent Close) { mClose = std::move(Close); }
 
+    QSize sizeHint() const override;
     /// Escape and the close button of the frame both come here.
     void reject() override;
 

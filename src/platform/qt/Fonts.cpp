@@ -15,7 +15,9 @@ Font fromQt(const QFont& font) {
 QFont toQt(const Font& font, const QFont& base) {
     QFont result = base;
     if (!font.Name.empty() && toQt(font.Name) != base.family()) result.setFamily(toQt(font.Name));
-    if (font.Size > 0) result.setPointSizeF(static_cast<qreal>(font.Size));
+    // A size in pixels stays one: in points and back it would be another.
+    if (font.Size > 0 && font.Size != fromQt(base).Size)
+        result.setPointSizeF(static_cast<qreal>(font.Size));
     return result;
 }
 

@@ -265,10 +265,11 @@ bool GridWidget::eventFilter(QObject* watched, QEvent* event) {
         if (part == mView) return keyPressed(*static_cast<QKeyEvent*>(event));
         break;
     case QEvent::ContextMenu:
-        // The mouse opens the menu on release; the menu key has no release of its own.
-        if (part != mView ||
-            static_cast<QContextMenuEvent*>(event)->reason() != QContextMenuEvent::Keyboard)
-            break;
+        // The mouse opens the control's menu on release, and the host is to open none of its own.
+        if (static_cast<QContextMenuEvent*>(event)->reason() == QContextMenuEvent::Mouse)
+            return true;
+        // The menu key has no release.
+        if (part != mView) break;
         openMenu();
         return true;
     case QEvent::ToolTip:

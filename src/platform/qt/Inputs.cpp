@@ -8,15 +8,14 @@
 
 #include <QDialog>
 #include <QKeyEvent>
-#include <QPushButton>
 #include <QScopedValueRollback>
+#include <QStyleOptionButton>
+
+#include <limits>
 
 namespace platform::qt {
 
 namespace {
-
-/// Marks the button that Enter presses.
-constexpr char defaultProperty[] = "zandorDefault";
 
 /// The keys of an input: reports them, and has Enter press the default button beside it.
 class InputKeys : public QObject {
@@ -59,8 +58,9 @@ private:
     }
 
     void pressDefault() {
-        for (auto* button : mInput.parentWidget()->findChildren<QAbstractButton*>())
-            if (button->property(defaultProperty).toBool() && button->isEnabled())
+        for (QWidget* child : mInput.parentWidget()->findChildren<QWidget*>())
+            if (auto* button = dynamic_cast<SetButton*>(child);
+                button && button->isPressedByEnter() && button->isEnabled())
                 return button->click();
     }
 
@@ -70,6 +70,25 @@ private:
 };
 
 } // namespace
+
+SetButton::SetButton(QWidget* parent) : QPushButton(parent) { setAutoDefault(false); }
+
+void SetButton::setPressedByEnter(bool value) {
+    mPressedByEnter = value;
+    update();
+}
+
+void SetButton::initStyleOption(QStyleOptionButton* option) const {
+    QPushButton::initStyleOption(option);
+    if (mPressedByEnter) option->features |= QStyleOptionButton::DefaultButton;
+}
+
+void SetButton::keyPressEvent(QKeyEvent* event) {
+    if (isEnter(*event))
+        click();
+    else
+        QPushButton::keyPressEvent(event);
+}
 
 ButtonAdapter::ButtonAdapter(QAbstractButton* widget, FocusTracker& focus,
                              CommandButtonEvents events)
@@ -86,8 +105,10 @@ void ButtonAdapter::Caption(const String& value) {
 
 void ButtonAdapter::Default(bool value) {
     if (!mWidget) return;
-    mWidget->setProperty(defaultProperty, value);
-    if (auto* button = qobject_cast<QPushButton*>(mWidget.data())) button->setDefault(value);
+    if (auto* set = dynamic_cast<SetButton*>(mWidget.data()))
+        set->setPressedByEnter(value);
+    else if (auto* button = qobject_cast<QPushButton*>(mWidget.data()))
+        button->setDefault(value);
 }
 
 void ButtonAdapter::Font(const platform::Font& value) {
@@ -148,7 +169,9 @@ void ComboBoxAdapter::Font(const platform::Font& value) {
 TextBoxAdapter::TextBoxAdapter(QLineEdit* widget, FocusTracker& focus, KeyEvent KeyDown,
                                comforts::Comforts& comforts)
     : Adapter(widget, focus) {
-    widget->setMinimumWidth(180);
+    // A text ends where the user ends it, and what is looked at has the room that it needs.
+    widget->setMaxLength(std::numeric_limits<int>::max());
+    if (!widget->isReadOnly()) widget->setMinimumWidth(180);
     new InputKeys(widget, std::move(KeyDown), comforts);
 }
 

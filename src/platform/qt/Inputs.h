@@ -8,8 +8,26 @@
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QPushButton>
 
 namespace platform::qt {
+
+/// The button of an editor, which Enter presses. It is never the default button of a dialog around:
+/// that one is the host's.
+class SetButton : public QPushButton {
+public:
+    explicit SetButton(QWidget* parent);
+
+    void setPressedByEnter(bool value);
+    bool isPressedByEnter() const { return mPressedByEnter; }
+
+protected:
+    void initStyleOption(QStyleOptionButton* option) const override;
+    void keyPressEvent(QKeyEvent* event) override;
+
+private:
+    bool mPressedByEnter = false;
+};
 
 class ButtonAdapter final : public Adapter<platform::CommandButton, QAbstractButton> {
 public:

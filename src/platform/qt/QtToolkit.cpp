@@ -102,8 +102,10 @@ std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents ev
 std::unique_ptr<CommandButton> QtToolkit::makeCommandButton(const Design& design,
                                                             CommandButtonEvents events) {
     QAbstractButton* button = nullptr;
-    if (design.Container)
-        button = new QPushButton(parentOf(design));
+    if (auto* dialog = qobject_cast<QDialog*>(design.Container ? parentOf(design) : nullptr))
+        button = new QPushButton(dialog);
+    else if (design.Container)
+        button = new SetButton(parentOf(design));
     else
         mNavigation.setHomeButton(button = new HomeButton(parentOf(design)));
     button->setText(toQt(design.Caption));
@@ -119,7 +121,8 @@ QtToolkit::makeComboBox(const Design& design, const std::vector<String>& items, 
 }
 
 std::unique_ptr<TextBox> QtToolkit::makeTextBox(const Design& design, KeyEvent KeyDown) {
-    auto* text = new QLineEdit(parentOf(design));
+    auto* const dialog = qobject_cast<QDialog*>(parentOf(design));
+    QLineEdit* const text = dialog ? new NameBox(dialog) : new QLineEdit(parentOf(design));
     text->show();
     return adapt<TextBoxAdapter>(design, Role::field, text, std::move(KeyDown), mComforts);
 }
