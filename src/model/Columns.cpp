@@ -11,6 +11,7 @@ namespace {
 
 using Cost = std::int64_t;
 using Columns = std::vector<std::vector<std::size_t>>;
+using Standing = std::vector<std::optional<Place>>;
 
 // What spoils a drawing, in twips of a line that is longer for it.
 constexpr Cost sameColumn = 9000;    // the line bends around its own tables
@@ -18,6 +19,8 @@ constexpr Cost columnBetween = 3000; // the line passes other tables
 constexpr Cost belowTable = 6000;    // the line is hidden
 constexpr Cost crossing = 2500;
 constexpr Cost tooWide = 1'000'000;
+/// The part of a table's way from where it stood that counts.
+constexpr Cost wayWeight = 4;
 
 /// Pairs of lines and tables to look at, some tenths of a second. Beyond it, what was found by then
 /// is taken.
@@ -65,9 +68,9 @@ bool runsBelow(const Line& line, const Box& box) {
 class Drawing {
 public:
     Drawing(const std::vector<Size>& sizes, const std::vector<Link>& links,
-            std::int32_t canvasWidth)
-        : mSizes(sizes), mLinks(links), mCanvasWidth(canvasWidth), mBoxes(sizes.size()),
-          mColumnOf(sizes.size()), mJoined(sizes.size()) {
+            std::int32_t canvasWidth, const Standing& standing)
+        : mSizes(sizes), mLinks(links), mCanvasWidth(canvasWidth), mStanding(standing),
+          mBoxes(sizes.size()), mColumnOf(sizes.size()), mJoined(sizes.size()) {
         for (const auto& [a, b] : links) mJoined[a] = mJoined[b] = true;
     }
 
@@ -79,6 +82,7 @@ public:
         Cost sum = right > mCanvasWidth ? tooWide + right : 0;
         for (const Box& box : mBoxes) sum += (box.top + box.height) / 4; // nobody likes to scroll
         mLines.clear();
+        for (std::size_t table = 0; table < mStanding.size(); ++table) sum += costOfWay(table);
         for (const auto& [a, b] : mLinks) sum += costOfLink(a, b);
         for (std::size_t n = 0; n < mLines.size(); ++n)
             for (std::size_t m = 0; m < n; ++m)
@@ -87,14 +91,19 @@ public:
     }
 
 private:
-    /// The joined tables of each column in the middle of the height of the tallest. Returns where
-    /// the columns end.
+    /// Columns begin at the top; those of fewer joined tables than another has stand in the middle
+    /// of the height of the tallest. Returns where the columns end.
     std::int32_t place(const Columns& columns) {
         std::int32_t tallest = 0;
-        for (const auto& column : columns) tallest = std::max(tallest, heightOf(column));
+        std::size_t most = 0;
+        for (const auto& column : columns) {
+            tallest = std::max(tallest, heightOf(column));
+            most = std::max(most, joinedOf(column));
+        }
         std::int32_t left = margin;
         for (std::size_t n = 0; n < columns.size(); ++n) {
-            std::int32_t top = margin + (tallest - heightOf(columns[n])) / 2;
+            const bool fewer = joinedOf(columns[n]) < most;
+            std::int32_t top = margin + (fewer ? (tallest - heightOf(columns[n])) / 2 : 0);
             std::int32_t width = 0;
             for (const std::size_t table : columns[n]) {
                 const auto& [own, height] = mSizes[table];
@@ -108,11 +117,23 @@ private:
         return left - betweenColumns + margin;
     }
 
+    std::size_t joinedOf(const std::vector<std::size_t>& column) const {
+        return static_cast<std::size_t>(
+            std::ranges::count_if(column, [this](std::size_t table) { return mJoined[table]; }));
+    }
+
     std::int32_t heightOf(const std::vector<std::size_t>& column) const {
         std::int32_t height = -betweenRows;
         for (const std::size_t table : column)
             if (mJoined[table]) height += mSizes[table].height + betweenRows;
         return std::max(height, 0);
+    }
+
+    Cost costOfWay(std::size_t table) const {
+        const auto& stood = mStanding[table];
+        if (!stood) return 0;
+        const Box& box = mBoxes[table];
+        return (std::abs(box.left - stood->left) + std::abs(box.top - stood->top)) / wayWeight;
     }
 
     Cost costOfLink(std::size_t a, std::size_t b) {
@@ -143,6 +164,7 @@ private:
     const std::vector<Size>& mSizes;
     const std::vector<Link>& mLinks;
     const std::int32_t mCanvasWidth;
+    const Standing& mStanding;
     std::vector<Box> mBoxes;
     std::vector<std::size_t> mColumnOf;
     std::vector<bool> mJoined;
@@ -261,20 +283,61 @@ std::size_t columnsFitting(const std::vector<Size>& sizes, std::int32_t canvasWi
         std::clamp(fitting, 1, static_cast<std::int32_t>(sizes.size())));
 }
 
-/// The joined tables, from several arrangements by distance.
+/// The tables in the columns where they stood, each new one right of what it is joined to.
+Columns asTheyStood(const std::vector<std::size_t>& tables, const std::vector<Link>& links,
+                    const Standing& standing, std::size_t columnCount) {
+    std::vector<std::size_t> stood;
+    std::vector<std::int32_t> lefts;
+    for (const std::size_t table : tables)
+        if (table < standing.size() && standing[table]) stood.push_back(table);
+    for (const auto& place : standing)
+        if (place) lefts.push_back(place->left);
+    std::ranges::sort(lefts);
+    lefts.erase(std::unique(lefts.begin(), lefts.end()), lefts.end());
+    std::ranges::sort(stood, {}, [&](std::size_t table) { return standing[table]->top; });
+
+    Columns columns(columnCount);
+    std::vector<std::optional<std::size_t>> columnOf(
+        tables.empty() ? 0 : *std::ranges::max_element(tables) + 1);
+    const auto put = [&](std::size_t table, std::size_t column) {
+        columnOf[table] = std::min(column, columnCount - 1);
+        columns[*columnOf[table]].push_back(table);
+    };
+    for (const std::size_t table : stood) {
+        const auto rank = std::ranges::lower_bound(lefts, standing[table]->left) - lefts.begin();
+        put(table, static_cast<std::size_t>(rank));
+    }
+    for (const std::size_t table : tables) {
+        if (columnOf[table]) continue;
+        std::size_t column = 0;
+        for (const auto& [a, b] : links)
+            if (a == table || b == table)
+                if (const auto& of = columnOf[a == table ? b : a])
+                    column = std::max(column, *of + 1);
+        put(table, column);
+    }
+    return columns;
+}
+
+/// The joined tables, from how they stood, if they did, and from several arrangements by distance.
 Columns joinedInColumns(Drawing& drawing, const std::vector<std::size_t>& tables,
-                        const std::vector<Link>& links, std::size_t columnCount) {
+                        const std::vector<Link>& links, std::size_t columnCount,
+                        const Standing& standing) {
     Columns best(columnCount);
     std::optional<Cost> least;
     const std::size_t perTrial = (links.size() + 1) * (links.size() + tables.size() + 1);
     auto trials = static_cast<int>(mostWork / perTrial);
-    for (const std::size_t first : tables) {
-        if (trials <= 0 && least) break;
-        Search search(drawing, layered(tables, links, first, columnCount), trials);
+    const auto tryFrom = [&](Columns columns) {
+        Search search(drawing, std::move(columns), trials);
         search.run();
-        if (least && search.cost() >= *least) continue;
+        if (least && search.cost() >= *least) return;
         least = search.cost();
         best = search.columns();
+    };
+    if (!standing.empty()) tryFrom(asTheyStood(tables, links, standing, columnCount));
+    for (const std::size_t first : tables) {
+        if (trials <= 0 && least) break;
+        tryFrom(layered(tables, links, first, columnCount));
     }
     return best;
 }
@@ -297,13 +360,13 @@ void addBelow(Drawing& drawing, Columns& columns, std::size_t table) {
 } // namespace
 
 std::vector<Box> arrangeInColumns(const std::vector<Size>& sizes, const std::vector<Link>& links,
-                                  std::int32_t canvasWidth) {
+                                  std::int32_t canvasWidth, const Standing& standing) {
     std::vector<Link> proper; // of several joins between two tables one counts
     for (const auto& [a, b] : links) {
         const Link link(std::min(a, b), std::max(a, b));
         if (a != b && std::ranges::find(proper, link) == proper.end()) proper.push_back(link);
     }
-    Drawing drawing(sizes, proper, canvasWidth);
+    Drawing drawing(sizes, proper, canvasWidth, standing);
     std::vector<std::size_t> joined;
     for (std::size_t table = 0; table < sizes.size(); ++table)
         if (drawing.isJoined(table)) joined.push_back(table);
@@ -313,7 +376,7 @@ std::vector<Box> arrangeInColumns(const std::vector<Size>& sizes, const std::vec
     std::vector<Box> best;
     // One more may fit, for not every column has a table of the largest width.
     for (const std::size_t count : {fitting, fitting + 1}) {
-        Columns columns = joinedInColumns(drawing, joined, proper, count);
+        Columns columns = joinedInColumns(drawing, joined, proper, count, standing);
         for (std::size_t table = 0; table < sizes.size(); ++table)
             if (!drawing.isJoined(table)) addBelow(drawing, columns, table);
         const Cost cost = drawing.cost(columns);

@@ -27,7 +27,7 @@ std::int64_t distance(const Box& a, const Box& b) {
 class Grid {
 public:
     Grid(const std::vector<Size>& sizes, const std::vector<Box>& taken, std::int32_t canvasWidth)
-        : mTaken(taken) {
+        : mTaken(taken), mCanvasWidth(canvasWidth) {
         for (const Size& size : sizes) {
             mCell.width = std::max(mCell.width, size.width);
             mCell.height = std::max(mCell.height, size.height);
@@ -36,6 +36,22 @@ public:
         const std::int32_t pitch = mCell.width + betweenColumns;
         mColumns = std::clamp((canvasWidth - 2 * margin + betweenColumns) / pitch, 1, count);
         mRows = (count + mColumns - 1) / mColumns;
+    }
+
+    /// A free place for a table of this size beside one of `neighbours`, rather to its right. Takes
+    /// it.
+    std::optional<Box> takeBeside(const std::vector<Box>& neighbours, const Size& size) {
+        for (const bool right : {true, false})
+            for (const Box& each : neighbours) {
+                const std::int32_t left = right ? each.left + each.width + betweenColumns
+                                                : each.left - betweenColumns - size.width;
+                const Box box{left, each.top, size.width, size.height};
+                if (left < margin || left + size.width + margin > mCanvasWidth || !isFree(box))
+                    continue;
+                mGiven.push_back(box);
+                return box;
+            }
+        return {};
     }
 
     /// The free cell with the least sum of distances to `neighbours`; without any, the one nearest
@@ -76,6 +92,7 @@ private:
     }
 
     const std::vector<Box>& mTaken;
+    const std::int32_t mCanvasWidth;
     Size mCell;
     std::int32_t mColumns = 1;
     std::int32_t mRows = 1;
@@ -129,13 +146,22 @@ std::vector<Box> arrange(const std::vector<Size>& sizes, const std::vector<Link>
             next = table;
             most = joined;
         }
-        cells[*next] = grid.take(placedNeighbours(*next));
+        const auto near = placedNeighbours(*next);
+        const auto beside = grid.takeBeside(near, sizes[*next]);
+        cells[*next] = beside ? *beside : grid.take(near);
     }
 
     for (std::size_t table = 0; table < count; ++table)
         boxes[table] = {cells[table]->left, cells[table]->top, sizes[table].width,
                         sizes[table].height};
     return boxes;
+}
+
+std::vector<Box> arrangeAgain(const std::vector<Size>& sizes, const std::vector<Link>& links,
+                              const std::vector<std::optional<Place>>& standing,
+                              std::int32_t canvasWidth) {
+    if (sizes.empty()) return {};
+    return arrangeInColumns(sizes, links, canvasWidth, standing);
 }
 
 } // namespace model::layout

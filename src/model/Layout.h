@@ -2,6 +2,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <utility>
 #include <vector>
 
@@ -15,6 +16,11 @@ inline constexpr std::int32_t betweenRows = 450;
 struct Size {
     std::int32_t width = 0;
     std::int32_t height = 0;
+};
+
+struct Place {
+    std::int32_t left = 0;
+    std::int32_t top = 0;
 };
 
 struct Box {
@@ -34,9 +40,17 @@ using Link = std::pair<std::size_t, std::size_t>;
 /// Boxes for tables of these sizes, in their order. Joined tables come near each other; no box
 /// comes closer to another or to one of `taken` than the distances above. They are as wide together
 /// as `canvasWidth` allows (one column at least) and as deep as they need. Where nothing is taken
-/// they stand in columns by their joins (arrangeInColumns); otherwise in the free cells, as large
-/// as the largest table, of a grid.
+/// they stand in columns by their joins (arrangeInColumns); otherwise to the right of what they are
+/// joined to, or to the left of it, and where neither is free in the cells, as large as the largest
+/// table, of a grid.
 std::vector<Box> arrange(const std::vector<Size>& sizes, const std::vector<Link>& links,
                          const std::vector<Box>& taken, std::int32_t canvasWidth);
+
+/// Boxes for all tables of a drawing that has grown: in columns, as above, but so that those with a
+/// place in `standing` move no further than it is worth, for somebody knows by now where they are.
+/// A table is new where `standing` has nothing, or ends before it.
+std::vector<Box> arrangeAgain(const std::vector<Size>& sizes, const std::vector<Link>& links,
+                              const std::vector<std::optional<Place>>& standing,
+                              std::int32_t canvasWidth);
 
 } // namespace model::layout

@@ -37,7 +37,11 @@ protected:
          "CREATE TABLE lines (o REFERENCES orders, pos, PRIMARY KEY (o, pos))",
          "CREATE TABLE parts (o, pos, FOREIGN KEY (o, pos) REFERENCES lines)",
          "CREATE TABLE staff (id INTEGER PRIMARY KEY, boss REFERENCES staff)",
-         "CREATE TABLE odd (x REFERENCES customers (no_such_column))"}};
+         "CREATE TABLE odd (x REFERENCES customers (no_such_column))",
+         "CREATE TABLE bills (payer REFERENCES customers, Buyer REFERENCES customers, a REFERENCES "
+         "customers (gone), again REFERENCES customers (gone), taker REFERENCES customers)",
+         "CREATE TABLE teams (id INTEGER PRIMARY KEY, head REFERENCES members)",
+         "CREATE TABLE members (id INTEGER PRIMARY KEY, team REFERENCES teams)"}};
     model::Query query;
 };
 
@@ -95,6 +99,29 @@ TEST_F(AddingTables, JoinsATableThatRefersToItselfToItsSecondInstanceOnly) {
 TEST_F(AddingTables, LeavesOutAKeyToAColumnThatIsNotThere) {
     ASSERT_TRUE(add({u"odd", u"customers"}));
     EXPECT_EQ(joins(query), Joins{});
+}
+
+TEST_F(AddingTables, DrawsOneOfSeveralKeysBetweenTwoTablesAndTellsOfTheOthers) {
+    std::vector<reader::LeftOut> leftOut;
+    ASSERT_TRUE(reader::addTables(query, database.reader(), {{u"", u"customers"}, {u"", u"bills"}},
+                                  16000, &leftOut));
+    EXPECT_EQ(joins(query), (Joins{"bills.Buyer = customers.id"}));
+    ASSERT_EQ(leftOut.size(), 2U);
+    for (const auto& each : leftOut) EXPECT_EQ(each.drawn.columns.front().first, u"Buyer");
+    EXPECT_EQ(leftOut[0].other.columns.front().first, u"payer");
+    EXPECT_EQ(leftOut[1].other.columns.front().first, u"taker");
+    // Also when the one that is referred to comes later.
+    ASSERT_TRUE(add({u"orders"}));
+    EXPECT_EQ(joins(query).size(), 2U);
+}
+
+TEST_F(AddingTables, DrawsOneOfTwoKeysThatRunAgainstEachOther) {
+    std::vector<reader::LeftOut> leftOut;
+    ASSERT_TRUE(reader::addTables(query, database.reader(), {{u"", u"members"}, {u"", u"teams"}},
+                                  16000, &leftOut));
+    EXPECT_EQ(joins(query), (Joins{"teams.head = members.id"}));
+    ASSERT_EQ(leftOut.size(), 1U);
+    EXPECT_EQ(leftOut[0].other.child.name, u"members");
 }
 
 TEST_F(AddingTables, ChangesNothingWhenOneOfThemIsNotThere) {

@@ -107,6 +107,60 @@ TEST(TheLayout, PutsANewTableBesideATakenOneItIsJoinedTo) {
     EXPECT_EQ(boxes[0].top, 300);
 }
 
+TEST(TheLayout, PutsANewTableToTheRightWhileThereIsRoom) {
+    const Box taken{300, 500, 2000, 2000};
+    auto boxes = arrange({cell}, {{0, 1}}, {taken}, 13000);
+    EXPECT_EQ(boxes[0].left, 300 + 3200);
+    EXPECT_EQ(boxes[0].top, 500);
+    // On a narrow canvas there is none.
+    boxes = arrange({cell}, {{0, 1}}, {taken}, 5000);
+    EXPECT_EQ(boxes[0].left, 300);
+    EXPECT_GE(boxes[0].top, 2500);
+}
+
+TEST(TheLayout, ThatGrowsByAChainGoesToTheRightAndLeavesTheEarlierTables) {
+    std::vector<Size> sizes;
+    std::vector<Link> links;
+    std::vector<std::optional<Place>> standing;
+    for (std::size_t n = 0; n < 5; ++n) {
+        sizes.push_back(cell);
+        if (n > 0) links.emplace_back(n - 1, n);
+        const auto boxes = arrangeAgain(sizes, links, standing, 5 * 3200);
+        for (std::size_t table = 0; table < standing.size(); ++table) {
+            EXPECT_EQ(boxes[table].left, standing[table]->left) << n << " " << table;
+            EXPECT_EQ(boxes[table].top, 300);
+        }
+        EXPECT_EQ(boxes[n].left, 300 + static_cast<std::int32_t>(n) * 3200);
+        standing.clear();
+        for (const Box& box : boxes) standing.push_back(Place{box.left, box.top});
+    }
+}
+
+TEST(TheLayout, ThatGrowsPutsTablesWithoutJoinsToTheRightToo) {
+    std::vector<std::optional<Place>> standing{Place{300, 300}, Place{3500, 300}};
+    const auto boxes = arrangeAgain(std::vector<Size>(3, cell), {}, standing, 4 * 3200);
+    EXPECT_EQ(boxes[0].left, 300);
+    EXPECT_EQ(boxes[1].left, 3500);
+    EXPECT_EQ(boxes[2].left, 6700);
+    EXPECT_EQ(boxes[2].top, 300);
+}
+
+TEST(TheLayout, ThatGrowsMovesATableThatStandsInAnothersWay) {
+    // Two that are joined by a third which comes between them.
+    std::vector<std::optional<Place>> standing{Place{300, 300}, Place{3500, 300}};
+    const auto boxes =
+        arrangeAgain(std::vector<Size>(3, cell), {{0, 2}, {1, 2}}, standing, 4 * 3200);
+    EXPECT_TRUE(apart(boxes));
+    EXPECT_EQ(std::abs(boxes[0].left - boxes[2].left), 3200);
+    EXPECT_EQ(std::abs(boxes[1].left - boxes[2].left), 3200);
+}
+
+TEST(TheLayout, OfOneRowBeginsAtTheTopWhateverTheHeights) {
+    const auto boxes =
+        arrange({{2000, 700}, {2000, 2900}, {2000, 1500}}, {{0, 1}, {1, 2}}, {}, 4 * 3200);
+    for (const Box& box : boxes) EXPECT_EQ(box.top, 300);
+}
+
 TEST(TheLayout, IgnoresAJoinOfATableWithItself) {
     EXPECT_TRUE(apart(arrange({cell, cell}, {{0, 0}}, {}, 13000)));
 }

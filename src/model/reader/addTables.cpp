@@ -63,6 +63,56 @@ Result<std::vector<Relation>> relations(DatabaseReader& reader, const std::vecto
     return result;
 }
 
+/// The columns that a key connects, pair by pair; none for a key that fits no longer.
+std::vector<std::pair<Ref<model::Column>, Ref<model::Column>>> ends(const TableList& tables,
+                                                                    const Relation& relation) {
+    std::vector<std::pair<Ref<model::Column>, Ref<model::Column>>> result;
+    for (const auto& [child, parent] : relation.key.columns) {
+        result.emplace_back(tables[relation.child]->columnNamed(child),
+                            tables[relation.parent]->columnNamed(parent));
+        if (!result.back().first || !result.back().second) return {};
+    }
+    return result;
+}
+
+bool hasSmallerName(const ForeignKey& a, const ForeignKey& b) {
+    const auto name = [](const ForeignKey& key) {
+        return std::pair(model::foldedName(key.columns.front().first),
+                         model::foldedName(key.child.name));
+    };
+    return name(a) < name(b);
+}
+
+/// Leaves those that fit, and of those between one pair of tables one.
+std::vector<LeftOut> choose(const TableList& tables, std::vector<Relation>& relations) {
+    const auto fits = [&](const Relation& relation) { return !ends(tables, relation).empty(); };
+    const auto onePair = [](const Relation& a, const Relation& b) {
+        return (a.child == b.child && a.parent == b.parent) ||
+               (a.child == b.parent && a.parent == b.child);
+    };
+    std::vector<Relation> chosen;
+    std::vector<Relation> others;
+    for (Relation& relation : relations) {
+        if (!fits(relation)) continue;
+        const auto rival = std::ranges::find_if(
+            chosen, [&](const Relation& other) { return onePair(relation, other); });
+        if (rival == chosen.end()) {
+            chosen.push_back(std::move(relation));
+        } else if (rival->key != relation.key) {
+            if (hasSmallerName(relation.key, rival->key)) std::swap(relation, *rival);
+            others.push_back(std::move(relation));
+        }
+    }
+    relations = std::move(chosen);
+    std::vector<LeftOut> leftOut;
+    for (Relation& other : others) {
+        const auto drawn = std::ranges::find_if(
+            relations, [&](const Relation& relation) { return onePair(relation, other); });
+        leftOut.push_back({drawn->key, std::move(other.key)});
+    }
+    return leftOut;
+}
+
 void place(const TableList& present, const TableList& added, const std::vector<Relation>& relations,
            std::int32_t canvasWidth) {
     // The layout counts the new tables first.
@@ -102,25 +152,20 @@ void place(const TableList& present, const TableList& added, const std::vector<R
     }
 }
 
-void addJoins(model::Query& query, const model::Table& child, const model::Table& parent,
-              const ForeignKey& key) {
-    std::vector<Ref<model::Join>> joins;
-    for (const auto& [childName, parentName] : key.columns) {
-        const auto childColumn = child.columnNamed(childName);
-        const auto parentColumn = parent.columnNamed(parentName);
-        if (!childColumn || !parentColumn) return; // a key that fits no longer
+void addJoins(model::Query& query, const TableList& tables, const Relation& relation) {
+    for (const auto& [child, parent] : ends(tables, relation)) {
         const auto join = makeRef<model::Join>();
-        join->LeftColumn(childColumn);
-        join->RightColumn(parentColumn);
-        joins.push_back(join);
+        join->LeftColumn(child);
+        join->RightColumn(parent);
+        query.AddJoin(join);
     }
-    for (const auto& join : joins) query.AddJoin(join);
 }
 
 } // namespace
 
 Result<TableList> addTables(model::Query& query, DatabaseReader& reader,
-                            const std::vector<TableId>& names, std::int32_t canvasWidth) {
+                            const std::vector<TableId>& names, std::int32_t canvasWidth,
+                            std::vector<LeftOut>* leftOut) {
     std::vector<model::TableDescription> descriptions;
     for (const TableId& name : names) {
         auto description = reader.table(name);
@@ -131,16 +176,17 @@ Result<TableList> addTables(model::Query& query, DatabaseReader& reader,
     std::vector<TableId> sources;
     for (const auto& table : present) sources.push_back({table->schema(), table->sourceName()});
     sources.insert(sources.end(), names.begin(), names.end());
-    const auto found = relations(reader, sources, present.size());
+    auto found = relations(reader, sources, present.size());
     if (!found) return Error{found.error()};
 
     TableList added;
     for (const auto& description : descriptions) added.push_back(query.addTable(description));
-    place(present, added, *found, canvasWidth);
     TableList all = present;
     all.insert(all.end(), added.begin(), added.end());
-    for (const Relation& relation : *found)
-        addJoins(query, *all[relation.child], *all[relation.parent], relation.key);
+    auto others = choose(all, *found);
+    if (leftOut) *leftOut = std::move(others);
+    place(present, added, *found, canvasWidth);
+    for (const Relation& relation : *found) addJoins(query, all, relation);
     return added;
 }
 
