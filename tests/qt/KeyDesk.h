@@ -22,6 +22,8 @@ public:
             if (action->isEnabled() && !action->isSeparator()) enabled += action->objectName();
         QTimer::singleShot(0, menu, [this, menu] {
             at = menu->pos();
+            const QAction* const active = menu->activeAction();
+            highlighted = active ? active->objectName() : QString();
             for (QAction* action : menu->actions())
                 if (action->objectName() == choice) menu->setActiveAction(action);
             hands::key(*menu, choice.isEmpty() ? Qt::Key_Escape : Qt::Key_Return);
@@ -32,6 +34,7 @@ public:
     QString choice; ///< the entry that the user takes; empty: none
     int opened = 0;
     QStringList enabled;
+    QString highlighted; ///< the entry that Enter would take
     QPoint at;
 };
 

@@ -75,6 +75,22 @@ TEST_F(Keyboard, OpensTheMenuOfATableAtItsCurrentEntry) {
     EXPECT_EQ(menus.opened, 2);
 }
 
+TEST_F(Keyboard, HighlightsTheFirstEntryThatCanBeTaken) {
+    tabTo("linJoin(2)");
+    menuKey();
+    EXPECT_EQ(menus.highlighted, "mnuJoinShowDefinition");
+    tabTo("lstTable(1)");
+    menuKey();
+    EXPECT_EQ(menus.highlighted, "mnuTableDefinitionCopy");
+    canvas().focusOn(nullptr, Qt::TabFocusReason);
+    menuKey();
+    EXPECT_EQ(menus.highlighted, "");
+    // Whoever opens it with the mouse goes on with the mouse.
+    hands::mouse(canvas(), QEvent::MouseButtonRelease, {600, 30}, Qt::RightButton);
+    EXPECT_EQ(menus.highlighted, "");
+    EXPECT_EQ(menus.opened, 4);
+}
+
 TEST_F(Keyboard, OpensTheMenuOfATableWithoutEntries) {
     auto empty = library.newModel();
     empty->table(u"EMPTY")->place(300, 300, 1800, 1500);

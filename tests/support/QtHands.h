@@ -11,6 +11,12 @@
 #include <QWindow>
 #include <QtTest/qtestspontaneevent.h>
 
+// Qt's own, for its tests.
+Q_GUI_EXPORT bool qt_sendShortcutOverrideEvent(QObject* receiver, ulong timestamp, int key,
+                                               Qt::KeyboardModifiers modifiers,
+                                               const QString& text = {}, bool repeats = false,
+                                               ushort count = 1);
+
 /// Real Qt input, as the window system would deliver it.
 namespace hands {
 
@@ -38,6 +44,11 @@ inline void key(QWidget& widget, int key, const QString& text = {},
         QSpontaneKeyEvent::setSpontaneous(&event);
         qApp->notify(&widget, &event);
     }
+}
+
+/// A key of which the window around may have made a shortcut.
+inline void shortcut(QWidget& widget, int key, Qt::KeyboardModifiers modifiers = {}) {
+    qt_sendShortcutOverrideEvent(&widget, 0, key, modifiers);
 }
 
 /// The menu key, which the window system reports as a request for the menu of its own kind.

@@ -57,11 +57,19 @@ QAction* PopupMenuAdapter::chosenByKey(const QString& name) const {
     return nullptr;
 }
 
+QAction* PopupMenuAdapter::firstOnOffer() const {
+    for (QAction* action : mMenu.actions())
+        if (action->isEnabled() && action->isVisible() && !action->isSeparator()) return action;
+    return nullptr;
+}
+
 QAction* PopupMenuAdapter::chosenByUser(std::optional<QPoint> at) {
     // The menu has no parent, so it does not follow the widget's looks by itself.
     mMenu.setPalette(mSurface.palette());
     mMenu.setFont(mSurface.font());
     mMenu.setLayoutDirection(mSurface.layoutDirection());
+    // Who opened it by a key goes on by keys, and sees where they begin.
+    if (at) mMenu.setActiveAction(firstOnOffer());
     return mMenu.exec(at.value_or(QCursor::pos()));
 }
 

@@ -17,6 +17,7 @@ public:
 
 private:
     QAction* chosenByKey(const QString& name) const;
+    QAction* firstOnOffer() const;
     QAction* chosenByUser(std::optional<QPoint> at);
 
     QWidget& mSurface;
