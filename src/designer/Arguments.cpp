@@ -22,8 +22,9 @@ reader::Result<Arguments> readArguments(const QStringList& arguments) {
     const QCommandLineOption tables(QStringLiteral("tables"), {}, QStringLiteral("names"));
     const QCommandLineOption screenshot(QStringLiteral("screenshot"), {}, QStringLiteral("file"));
     const QCommandLineOption picture(QStringLiteral("picture"), {}, QStringLiteral("query"));
+    const QCommandLineOption asShown(QStringLiteral("as-shown"));
     const QCommandLineOption dark(QStringLiteral("dark"));
-    parser.addOptions({tables, screenshot, picture, dark});
+    parser.addOptions({tables, screenshot, picture, asShown, dark});
     parser.addOptions(shell::options());
     // The parser takes the first argument for the program's name.
     if (!parser.parse(QStringList(QStringLiteral("zandor-designer")) + arguments))
@@ -56,6 +57,9 @@ reader::Result<Arguments> readArguments(const QStringList& arguments) {
             return reader::Error{
                 QStringLiteral("--picture opens no window; leave out what is for one.")};
     }
+    result.asShown = parser.isSet(asShown);
+    if (result.asShown && result.picture.isEmpty())
+        return reader::Error{QStringLiteral("--as-shown goes with --picture only.")};
     result.dark = parser.isSet(dark);
     const auto task = shell::taskOf(parser);
     if (!task) return reader::Error{task.error()};
@@ -86,7 +90,7 @@ bool asksForTask(const QStringList& arguments) {
 
 QString helpText() {
     return QStringLiteral(R"(Usage: zandor-designer [options] [FILE|ADDRESS|QUERY]
-       zandor-designer --picture QUERY OUT
+       zandor-designer --picture QUERY OUT [--as-shown]
        zandor-designer --sql QUERY [--dialect NAME]
        zandor-designer --run QUERY [--format csv|json] [--database ADDRESS]
                        [--limit N] [--set NAME=VALUE]...
@@ -97,8 +101,8 @@ Without any of them the sample database is opened, with a small query to look
 at.
 
 Options:
-  --tables NAMES   the tables to show, with commas between them; otherwise
-                   the first 16 in the order of their names
+  --tables NAMES   tables to begin with, with commas between them; otherwise
+                   the drawing is empty
   --screenshot FILE
                    draw the window into a picture (PNG) and end
   --dark           dark colours, whatever the desktop uses
@@ -107,6 +111,8 @@ Without a window, over a file of a query:
   --picture QUERY OUT
                    draw its tables and joins into OUT, a picture by its name:
                    .png, .svg or .pdf
+  --as-shown       with the tables as high as in the window, instead of with
+                   all their columns
   --sql QUERY      print the statement
   --dialect NAME   for sqlite, postgresql, mysql, sqlserver or standard;
                    otherwise for the query's database

@@ -13,6 +13,7 @@ struct Arguments {
     QString screenshot = {}; ///< a file to draw the window into instead of staying open
     QString drawing = {};    ///< a query's file whose drawing is to be put into `picture`
     QString picture = {};
+    bool asShown = false; ///< the picture's tables are as high as they are drawn
     bool dark = false;
     std::optional<shell::Task> task = {}; ///< to be done instead of opening a window
 };

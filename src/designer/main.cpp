@@ -34,10 +34,14 @@ int refuse(const QString& why) {
 }
 
 /// Draws the tables and joins of a query's file into another file.
-int drawQuery(const QString& query, const QString& file) {
-    const auto document = files::loadQuery(QFile::encodeName(query).toStdString());
+int drawQuery(const designer::Arguments& arguments) {
+    const auto document = files::loadQuery(QFile::encodeName(arguments.drawing).toStdString());
     if (!document) return refuse(QString::fromStdString(document.error()));
-    const auto error = designer::savePicture(designer::DrawingPicture(*document->query), file);
+    using designer::DrawingPicture;
+    const DrawingPicture picture(*document->query, {},
+                                 arguments.asShown ? DrawingPicture::Rows::asDrawn
+                                                   : DrawingPicture::Rows::all);
+    const auto error = designer::savePicture(picture, arguments.picture);
     if (!error) return 0;
     say(stderr, QStringLiteral("zandor-designer: %1\n").arg(*error));
     return pictureFailed;
@@ -72,7 +76,7 @@ int main(int argc, char** argv) {
     const auto arguments = designer::readArguments(argumentsOf(argc, argv));
     if (!arguments) return refuse(arguments.error());
     if (arguments->dark) designer::useDarkColours();
-    if (!arguments->drawing.isEmpty()) return drawQuery(arguments->drawing, arguments->picture);
+    if (!arguments->drawing.isEmpty()) return drawQuery(*arguments);
     designer::DesignerWindow window;
     if (const auto error = window.openAtFirst(*arguments, QStringLiteral(ZANDOR_SAMPLE_DATABASE)))
         return refuse(*error);

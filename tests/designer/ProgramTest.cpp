@@ -158,6 +158,10 @@ TEST(TheDesignerProgram, DrawsTheTablesOfAQueryFileIntoAPicture) {
     ASSERT_TRUE(svg.open(QIODevice::ReadOnly));
     EXPECT_TRUE(svg.readAll().contains(">order_lines</text>"));
     EXPECT_GT(QImage(folder.path("out.png")).width(), 2000);
+    // With all columns of the tables, unless they are to be as in the window.
+    ASSERT_EQ(run({"--picture", query, folder.path("shown.png"), "--as-shown"}).code, 0);
+    EXPECT_LT(QImage(folder.path("shown.png")).height(), QImage(folder.path("out.png")).height());
+    expectRefusal({"--as-shown", query}, "--as-shown goes with --picture only.");
 }
 
 TEST(TheDesignerProgram, RefusesAPictureOfABrokenQueryInOneLine) {

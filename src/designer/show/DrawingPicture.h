@@ -12,12 +12,18 @@ class QPainter;
 
 namespace designer {
 
-/// The whole drawing of a query as it is now: its tables and joins, whatever part of them a window
-/// shows. Nothing is written into the query. Needs a QApplication.
+/// The whole drawing of a query as it is now, for a page: its tables and joins, whatever part of
+/// them a window shows, on white, without what only a mouse needs and without what is selected.
+/// Nothing is written into the query. Needs a QApplication.
 class DrawingPicture {
 public:
+    /// How high the tables are: with all their columns, as far as the canvas reaches (32767 twips),
+    /// what stands below moving down; or as they are drawn, ending with a whole row.
+    enum class Rows { all, asDrawn };
+
     /// `options` are properties of the control by name.
-    explicit DrawingPicture(const model::Query& query, const QVariantMap& options = {});
+    explicit DrawingPicture(const model::Query& query, const QVariantMap& options = {},
+                            Rows rows = Rows::all);
     ~DrawingPicture();
 
     bool isEmpty() const { return mSize.isEmpty(); }
@@ -32,7 +38,7 @@ public:
     void paint(QPainter& painter, const QRectF& into) const;
 
 private:
-    void showWholeRows(model::Query& query);
+    void bind(const platform::Ref<model::Query>& query);
     void render(QPainter& painter) const;
 
     model::Library mLibrary;

@@ -2,10 +2,12 @@
 
 #include "designer/DrawingArea.h"
 #include "designer/document/Document.h"
+#include "designer/document/QueryFile.h"
 #include "designer/show/DrawingPicture.h"
 #include "designer/show/savePicture.h"
 
 #include <QClipboard>
+#include <QDir>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QGuiApplication>
@@ -13,12 +15,27 @@
 #include <QMessageBox>
 #include <QPrintDialog>
 #include <QPrinter>
+#include <QSettings>
+#include <QStandardPaths>
 
 namespace designer {
 
-ShowCommands::ShowCommands(Document& document, const DrawingArea& area, QWidget& window)
+namespace {
+
+QString allColumnsKey() { return QStringLiteral("pictures/allColumns"); }
+
+} // namespace
+
+ShowCommands::ShowCommands(Document& document, const QueryFile& file, const DrawingArea& area,
+                           QSettings& settings, QWidget& window)
     : QObject(&window), exportPicture(tr("&Export drawing\u2026")), print(tr("&Print\u2026")),
-      copyPicture(tr("Copy as p&icture")), mDocument(document), mArea(area), mWindow(window) {
+      copyPicture(tr("Copy as p&icture")), allColumns(tr("Pictures with all &columns")),
+      mDocument(document), mFile(file), mArea(area), mWindow(window) {
+    allColumns.setObjectName(QStringLiteral("allColumns"));
+    allColumns.setCheckable(true);
+    allColumns.setChecked(settings.value(allColumnsKey(), true).toBool());
+    connect(&allColumns, &QAction::toggled, this,
+            [&settings](bool on) { settings.setValue(allColumnsKey(), on); });
     exportPicture.setObjectName(QStringLiteral("exportPicture"));
     print.setObjectName(QStringLiteral("print"));
     copyPicture.setObjectName(QStringLiteral("copyPicture"));
@@ -38,7 +55,18 @@ void ShowCommands::follow() {
 }
 
 DrawingPicture ShowCommands::picture() const {
-    return DrawingPicture(*mDocument.query(), mArea.options());
+    return DrawingPicture(*mDocument.query(), mArea.options(),
+                          allColumns.isChecked() ? DrawingPicture::Rows::all
+                                                 : DrawingPicture::Rows::asDrawn);
+}
+
+/// Beside the query's file and called like it.
+QString ShowCommands::proposedName() const {
+    const QFileInfo file(mFile.path());
+    if (!mFile.path().isEmpty())
+        return file.dir().filePath(file.completeBaseName() + QStringLiteral(".png"));
+    return QDir(QStandardPaths::writableLocation(QStandardPaths::PicturesLocation))
+        .filePath(tr("drawing.png"));
 }
 
 void ShowCommands::askForFile() {
@@ -52,6 +80,9 @@ void ShowCommands::askForFile() {
     };
     connect(&dialog, &QFileDialog::filterSelected, &dialog, follow);
     follow(dialog.selectedNameFilter());
+    const QFileInfo proposed(proposedName());
+    if (proposed.dir().exists()) dialog.setDirectory(proposed.dir());
+    dialog.selectFile(proposed.fileName());
     if (dialog.exec() != QDialog::Accepted) return;
     if (const auto error = savePicture(picture(), dialog.selectedFiles().value(0)))
         QMessageBox::warning(&mWindow, tr("Export drawing"), *error);
