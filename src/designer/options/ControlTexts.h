@@ -5,13 +5,14 @@
 #include <span>
 
 /// The texts that the control shows, for its LNG properties. English is what the control has of its
-/// own; the other languages are translations of it.
+/// own, but spelt right and with letters to choose the menu's entries by; the other languages are
+/// translations of it.
 namespace designer::controlTexts {
 
 struct Text {
     const char* property;
-    const char* english; ///< as the control has it at first
-    const char* use;     ///< where the control shows it, in English; translated by useOf()
+    const char* english;
+    const char* use; ///< where the control shows it, in English; translated by useOf()
 };
 
 std::span<const Text> all();

@@ -129,7 +129,7 @@ TEST_F(TheOptionsDialog, BringsTheDefaultsBack) {
     click(box("JoinModifyDisabled"));
     EXPECT_FALSE(box("JoinModifyDisabled").isChecked());
     click(button(QDialogButtonBox::RestoreDefaults));
-    EXPECT_EQ(text("LNGJoinForm"), "Join Defintion");
+    EXPECT_EQ(text("LNGJoinForm"), "Join Definition");
     EXPECT_TRUE(box("JoinModifyDisabled").isChecked());
     EXPECT_FALSE(button(QDialogButtonBox::Apply).isEnabled());
 }
@@ -141,12 +141,12 @@ TEST_F(TheOptionsDialog, FillsInTheTextsOfALanguage) {
     EXPECT_EQ(languages, QStringList({"English", "Deutsch", QString::fromUtf8("Fran\u00e7ais"),
                                       QString::fromUtf8("Espa\u00f1ol")}));
     menu->actions().at(1)->trigger();
-    EXPECT_EQ(text("LNGMnuDelTable"), QString::fromUtf8("Tabelle l\u00f6schen"));
+    EXPECT_EQ(text("LNGSpreadField"), "Feld:");
     for (int row = 0; row < texts().rowCount(); ++row) EXPECT_NE(texts().item(row, 1)->text(), "");
     EXPECT_TRUE(button(QDialogButtonBox::Apply).isEnabled());
     menu->actions().at(0)->trigger();
-    EXPECT_EQ(text("LNGMnuDelTable"), "Delete Table");
-    EXPECT_EQ(text("LNGMnuDelCol"), "Delete Coumn");
+    EXPECT_EQ(text("LNGMnuDelTable"), "Delete &Table");
+    EXPECT_EQ(text("LNGMnuDelCol"), "&Delete Column");
 }
 
 TEST_F(TheOptionsDialog, BringsATextBackThatIsEmptied) {

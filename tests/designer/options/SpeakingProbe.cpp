@@ -26,7 +26,10 @@ int main(int argc, char** argv) {
         panel.findChild<QPlainTextEdit*>()->placeholderText(),
         dialog.windowTitle(),
         buttons->button(QDialogButtonBox::Cancel)->text().remove(u'&'),
-        designer::ControlOptions().properties().value(QStringLiteral("LNGMnuDelTable")).toString(),
+        designer::ControlOptions()
+            .properties()
+            .value(QStringLiteral("LNGJoinLeftTable"))
+            .toString(),
     };
     std::fputs(said.join(u'\n').toUtf8().constData(), stdout);
     return 0;
