@@ -39,6 +39,7 @@ ConnectionBanner::ConnectionBanner(Database& database, QWidget* parent)
 
     connect(&database, &Database::lost, this, &ConnectionBanner::showLoss);
     connect(&database, &Database::opened, this, &QWidget::hide);
+    connect(&database, &Database::found, this, &QWidget::hide);
     connect(again, &QPushButton::clicked, this, &ConnectionBanner::reconnect);
     connect(close, &QToolButton::clicked, this, &QWidget::hide);
 }

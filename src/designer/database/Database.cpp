@@ -105,4 +105,8 @@ void Database::sayLost(const QString& message) {
     emit lost(message);
 }
 
+void Database::sayFound() {
+    if (std::exchange(mLost, false)) emit found();
+}
+
 } // namespace designer

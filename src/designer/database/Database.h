@@ -64,12 +64,15 @@ public:
     /// Tells everybody, once until the connection is renewed, that it has broken down; `message` is
     /// the engine's. A file cannot be lost.
     void sayLost(const QString& message);
+    /// That it answers again, over whatever connection; emits found() when it was lost.
+    void sayFound();
     bool isLost() const { return mLost; }
 
 signals:
     /// Another database, the same one afresh, or none.
     void opened();
     void lost(const QString& message);
+    void found();
 
 private:
     std::optional<QString> take(const QString& address, const QString& password,

@@ -37,6 +37,7 @@ TablesRead readTables(const Connector& connect, const Wanted& wanted) {
 std::optional<QString> takeTables(Database& database, const TablesRead& read) {
     if (read.tables) {
         database.reader().remember(*read.tables);
+        database.sayFound();
         return {};
     }
     if (read.lost) database.sayLost(read.tables.error());

@@ -1,41 +1,92 @@
 #include "designer/run/ParameterDialog.h"
 
 #include <QDialogButtonBox>
+#include <QEvent>
 #include <QFormLayout>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QScrollArea>
+#include <QScrollBar>
 
 namespace designer {
+
+namespace {
+
+constexpr int fieldCharacters = 32; // more than most values need
+constexpr int besideTitle = 160;    // logical pixels: the window's own icon and buttons
+constexpr int highestForm = 400;    // what a small screen leaves beside the rest
+constexpr int widestForm = 640;
+
+/// The form itself, which scrolls where it is higher than a small screen.
+class FormArea final : public QScrollArea {
+public:
+    explicit FormArea(QWidget* form) {
+        setFrameShape(NoFrame);
+        setWidgetResizable(true);
+        setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+        setFocusPolicy(Qt::NoFocus);
+        setWidget(form);
+        for (QWidget* field : form->findChildren<QWidget*>()) field->installEventFilter(this);
+    }
+    /// By itself an area follows the focus only when it comes from within.
+    bool eventFilter(QObject* watched, QEvent* event) override {
+        if (event->type() == QEvent::FocusIn) ensureWidgetVisible(static_cast<QWidget*>(watched));
+        return QScrollArea::eventFilter(watched, event);
+    }
+    QSize sizeHint() const override {
+        const int width = std::min(widget()->sizeHint().width(), widestForm);
+        const int height = widget()->hasHeightForWidth() ? widget()->heightForWidth(width)
+                                                         : widget()->sizeHint().height();
+        if (height <= highestForm) return {width, height};
+        return {width + verticalScrollBar()->sizeHint().width(), highestForm};
+    }
+    QSize minimumSizeHint() const override {
+        return {widget()->minimumSizeHint().width(), std::min(sizeHint().height(), 100)};
+    }
+};
+
+} // namespace
 
 ParameterDialog::ParameterDialog(std::vector<Question> questions, const Answers& answers,
                                  QWidget* parent)
     : QDialog(parent), mQuestions(std::move(questions)), mComplaint(new QLabel(this)),
       mButtons(new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel, this)) {
     setWindowTitle(tr("Values for the query"));
-    auto* layout = new QFormLayout(this);
-    layout->setFieldGrowthPolicy(QFormLayout::ExpandingFieldsGrow);
-    layout->setRowWrapPolicy(QFormLayout::WrapLongRows);
+    auto* const form = new QWidget;
+    auto* const rows = new QFormLayout(form);
+    rows->setContentsMargins({});
+    rows->setFieldGrowthPolicy(QFormLayout::ExpandingFieldsGrow);
+    rows->setRowWrapPolicy(QFormLayout::WrapLongRows);
     for (const Question& question : mQuestions) {
-        auto* field = new QLineEdit(answers.value(question.name), this);
+        auto* const field = new QLineEdit(answers.value(question.name));
         field->setObjectName(question.name);
         field->setPlaceholderText(wanted(question));
         field->setToolTip(wanted(question));
-        field->setMinimumWidth(field->fontMetrics().horizontalAdvance(wanted(question)) + 24);
+        field->setMinimumWidth(std::max(field->fontMetrics().horizontalAdvance(wanted(question)),
+                                        field->fontMetrics().averageCharWidth() * fieldCharacters) +
+                               24);
         field->selectAll();
         connect(field, &QLineEdit::textChanged, this, &ParameterDialog::check);
-        auto* label = new QLabel(this);
+        auto* const label = new QLabel;
         label->setTextFormat(Qt::PlainText);
         label->setText(QString(question.name).replace(u'&', QStringLiteral("&&")));
+        label->setWordWrap(label->sizeHint().width() > widestForm / 2);
         label->setBuddy(field);
-        layout->addRow(label, field);
+        rows->addRow(label, field);
         mFields.push_back(field);
     }
     mComplaint->setTextFormat(Qt::PlainText);
     mComplaint->setWordWrap(true);
     mComplaint->setForegroundRole(QPalette::PlaceholderText);
-    layout->addRow(mComplaint);
-    layout->addRow(mButtons);
+    auto* const layout = new QVBoxLayout(this);
+    layout->addWidget(new FormArea(form), 1);
+    layout->addWidget(mComplaint);
+    layout->addWidget(mButtons);
+    // Window managers cut a title that does not fit beside their buttons.
+    QFont titleFont = font();
+    titleFont.setBold(true);
+    setMinimumWidth(QFontMetrics(titleFont).horizontalAdvance(windowTitle()) + besideTitle);
     mButtons->button(QDialogButtonBox::Ok)->setText(tr("&Run"));
     connect(mButtons, &QDialogButtonBox::accepted, this, &QDialog::accept);
     connect(mButtons, &QDialogButtonBox::rejected, this, &QDialog::reject);

@@ -5,7 +5,9 @@
 #include <QLocale>
 #include <QPalette>
 
+#include <algorithm>
 #include <limits>
+#include <map>
 #include <set>
 
 namespace designer {
@@ -42,6 +44,7 @@ void ResultModel::setSpool(const std::shared_ptr<Spool>& spool) {
     beginResetModel();
     mSpool = spool;
     mColumns.clear();
+    mOrder.clear();
     mRows = 0;
     mPages.clear();
     mPages.setMaxCost(pageMemory);
@@ -61,6 +64,16 @@ void ResultModel::refresh() {
     beginInsertRows({}, mRows, static_cast<int>(present) - 1);
     mRows = static_cast<int>(present);
     endInsertRows();
+}
+
+void ResultModel::setOrder(RowOrder order) {
+    mOrder = std::move(order);
+    if (mRows > 0) emit dataChanged(index(0, 0), index(mRows - 1, columnCount() - 1));
+}
+
+qint64 ResultModel::spooled(int row) const {
+    const auto place = static_cast<std::size_t>(row);
+    return place < mOrder.size() ? mOrder[place] : row;
 }
 
 int ResultModel::rowCount(const QModelIndex& parent) const { return parent.isValid() ? 0 : mRows; }
@@ -93,13 +106,17 @@ QVariant ResultModel::data(const QModelIndex& index, int role) const {
 QVariant ResultModel::headerData(int section, Qt::Orientation orientation, int role) const {
     if (orientation == Qt::Vertical)
         return role == Qt::DisplayRole ? QVariant(QLocale().toString(section + 1)) : QVariant();
-    const bool asked = role == Qt::DisplayRole || role == Qt::ToolTipRole;
-    return asked ? QVariant(mColumns.value(section)) : QVariant();
+    if (role == Qt::DisplayRole) return mColumns.value(section);
+    if (role == Qt::ToolTipRole)
+        return tr("%1\nClick to sort the rows that are shown; the query stays as it is.")
+            .arg(mColumns.value(section));
+    return {};
 }
 
 Cell ResultModel::cell(const QModelIndex& index) const {
     if (!mSpool || !index.isValid()) return {};
-    const qint64 number = index.row() / Spool::rowsInAPage;
+    const qint64 place = spooled(index.row());
+    const qint64 number = place / Spool::rowsInAPage;
     const std::vector<Row>* page = mPages.object(number);
     if (!page) {
         auto read = std::make_unique<std::vector<Row>>(mSpool->page(number, mostBytesOfACell));
@@ -107,7 +124,7 @@ Cell ResultModel::cell(const QModelIndex& index) const {
         const qsizetype cost = std::min(memoryOf(*page), pageMemory);
         mPages.insert(number, read.release(), cost);
     }
-    const auto row = static_cast<std::size_t>(index.row() % Spool::rowsInAPage);
+    const auto row = static_cast<std::size_t>(place % Spool::rowsInAPage);
     if (row >= page->size()) return {};
     return (*page)[row][static_cast<std::size_t>(index.column())];
 }
@@ -124,27 +141,34 @@ std::optional<QString> ResultModel::copied(const QItemSelection& selection) cons
     }
     if (cells > mostCellsCopied) return {};
 
-    QString text;
-    std::vector<Row> page;
-    qint64 pageNumber = -1;
+    // In the order of the spool, so that each page of it is read once.
+    std::vector<std::pair<qint64, int>> places;
     int next = 0;
     for (const auto& [first, last] : rows) {
-        for (int row = std::max(first, next); row <= last; ++row) {
-            if (const qint64 number = row / Spool::rowsInAPage; number != pageNumber) {
-                page = mSpool->page(number, std::numeric_limits<qint64>::max());
-                pageNumber = number;
-            }
-            const auto place = static_cast<std::size_t>(row % Spool::rowsInAPage);
-            if (!text.isEmpty()) text += u'\n';
-            for (const int column : columns) {
-                if (column != *columns.begin()) text += u'\t';
-                if (place < page.size() && selection.contains(index(row, column)))
-                    appendCopied(text, page[place][static_cast<std::size_t>(column)]);
-            }
-        }
+        for (int row = std::max(first, next); row <= last; ++row)
+            places.emplace_back(spooled(row), row);
         next = std::max(next, last + 1);
     }
-    return text;
+    std::sort(places.begin(), places.end());
+    std::map<int, QString> lines;
+    std::vector<Row> page;
+    qint64 pageNumber = -1;
+    for (const auto& [spooledRow, row] : places) {
+        if (const qint64 number = spooledRow / Spool::rowsInAPage; number != pageNumber) {
+            page = mSpool->page(number, std::numeric_limits<qint64>::max());
+            pageNumber = number;
+        }
+        const auto place = static_cast<std::size_t>(spooledRow % Spool::rowsInAPage);
+        QString& line = lines[row];
+        for (const int column : columns) {
+            if (column != *columns.begin()) line += u'\t';
+            if (place < page.size() && selection.contains(index(row, column)))
+                appendCopied(line, page[place][static_cast<std::size_t>(column)]);
+        }
+    }
+    QStringList text;
+    for (const auto& [row, line] : lines) text << line;
+    return text.join(u'\n');
 }
 
 } // namespace designer

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "designer/run/RowOrder.h"
 #include "designer/run/Spool.h"
 
 #include <QAbstractTableModel>
@@ -21,6 +22,13 @@ public:
     void setSpool(const std::shared_ptr<Spool>& spool);
     /// Looks for what has come: columns, and rows.
     void refresh();
+    const std::shared_ptr<Spool>& spool() const { return mSpool; }
+
+    /// Shows the rows in another order than they came in, or with an empty one as they came. Rows
+    /// that come later stand behind it.
+    void setOrder(RowOrder order);
+    /// A view wants the rows sorted by a column, or with -1 as they came.
+    void sort(int column, Qt::SortOrder direction) override { emit sortWished(column, direction); }
 
     int rowCount(const QModelIndex& parent = {}) const override;
     int columnCount(const QModelIndex& parent = {}) const override;
@@ -32,11 +40,17 @@ public:
     /// when they are more than a clipboard should hold.
     std::optional<QString> copied(const QItemSelection& selection) const;
 
+signals:
+    void sortWished(int column, Qt::SortOrder direction);
+
 private:
     Cell cell(const QModelIndex& index) const;
+    /// Where a row that is shown is in the spool.
+    qint64 spooled(int row) const;
 
     std::shared_ptr<Spool> mSpool;
     QStringList mColumns;
+    RowOrder mOrder; ///< empty: as they came
     int mRows = 0;
     mutable QCache<qint64, std::vector<Row>> mPages;
 };

@@ -6,6 +6,7 @@
 #include <QHeaderView>
 #include <QHelpEvent>
 #include <QKeyEvent>
+#include <QSignalBlocker>
 #include <QStyledItemDelegate>
 #include <QTextDocument>
 #include <QToolTip>
@@ -61,10 +62,45 @@ ResultTable::ResultTable(QWidget* parent)
     horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     horizontalHeader()->setMinimumSectionSize(narrowestColumn);
 
+    // A click goes from smallest first over largest first back to how the rows came.
+    horizontalHeader()->setSortIndicatorClearable(true);
+    showSorting(-1);
+    setSortingEnabled(true);
+
     mCopy->setShortcut(QKeySequence::Copy);
     mCopy->setShortcutContext(Qt::WidgetShortcut);
     connect(mCopy, &QAction::triggered, this, &ResultTable::copy);
     addAction(mCopy);
+    addCommand(tr("Copy &with all columns"), "copyRows", [this] {
+        selectionModel()->select(selectionModel()->selection(),
+                                 QItemSelectionModel::Select | QItemSelectionModel::Rows);
+        copy();
+    });
+    addCommand(tr("Select c&olumn"), "selectColumn",
+               [this] { selectColumn(currentIndex().column()); });
+    const auto sortBy = [this](Qt::SortOrder direction) {
+        if (currentIndex().isValid())
+            horizontalHeader()->setSortIndicator(currentIndex().column(), direction);
+    };
+    addCommand(tr("Sort &ascending"), "sortAscending", [=] { sortBy(Qt::AscendingOrder); });
+    addCommand(tr("Sort &descending"), "sortDescending", [=] { sortBy(Qt::DescendingOrder); });
+    addCommand(tr("As the &query gives them"), "sortNot",
+               [this] { horizontalHeader()->setSortIndicator(-1, Qt::AscendingOrder); });
+}
+
+QAction* ResultTable::addCommand(const QString& text, const char* name,
+                                 const std::function<void()>& what) {
+    auto* const action = new QAction(text, this);
+    action->setObjectName(QLatin1String(name));
+    connect(action, &QAction::triggered, this, what);
+    addAction(action);
+    return action;
+}
+
+void ResultTable::showSorting(int column, Qt::SortOrder direction) {
+    const QSignalBlocker quiet(horizontalHeader());
+    horizontalHeader()->setSortIndicator(column, direction);
+    horizontalHeader()->viewport()->update();
 }
 
 void ResultTable::fitColumns() {

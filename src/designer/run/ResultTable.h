@@ -4,6 +4,8 @@
 
 #include <QTableView>
 
+#include <functional>
+
 namespace designer {
 
 /// The rows of a result, to be looked at and copied.
@@ -16,6 +18,8 @@ public:
     ResultModel& rows() { return *mModel; }
     /// Makes the columns as wide as the rows that are there need, within reason.
     void fitColumns();
+    /// The arrow in the header; -1 for none. Sorts nothing.
+    void showSorting(int column, Qt::SortOrder direction = Qt::AscendingOrder);
     QAction* copyAction() { return mCopy; }
 
 signals:
@@ -27,6 +31,7 @@ protected:
 
 private:
     void copy();
+    QAction* addCommand(const QString& text, const char* name, const std::function<void()>& what);
 
     ResultModel* mModel;
     QAction* mCopy;

@@ -1,6 +1,7 @@
 #include "designer/run/ResultsPanel.h"
 
 #include "designer/database/Database.h"
+#include "designer/database/patiently.h"
 #include "designer/document/Document.h"
 #include "designer/run/FileExport.h"
 #include "designer/run/ParameterDialog.h"
@@ -38,10 +39,12 @@ ResultsPanel::ResultsPanel(Document& document, Database& database, QWidget* pare
     mPatience.setInterval(serversTime);
     mPatience.setSingleShot(true);
     connect(&mPatience, &QTimer::timeout, this, &ResultsPanel::giveUp);
+    connect(&mDocument, &Document::replaced, this, &ResultsPanel::forget);
     connect(&mDocument, &Document::changed, this, &ResultsPanel::queryChanged);
     connect(&mDatabase, &Database::opened, this, [this] {
         if (mDatabase.address() != mAddress) forget();
     });
+    connect(&mTable->rows(), &ResultModel::sortWished, this, &ResultsPanel::sort);
     connect(mTable, &ResultTable::tooMuchToCopy, this, [this] {
         setStatus(tr("These are too many cells to copy; export the rows instead."));
     });
@@ -57,9 +60,8 @@ void ResultsPanel::run() {
     const auto made = command(limit());
     if (!made) return;
     mSpool = std::make_shared<Spool>();
-    mTable->rows().setSpool(mSpool);
+    showSpool();
     mFitted = false;
-    mOutdated = false;
     mPages->setCurrentWidget(mTable);
     start(*made, mSpool, {});
     emit shown();
@@ -88,7 +90,8 @@ std::optional<Command> ResultsPanel::command(std::optional<qint64> limit) {
         QStringList lines(tr("The query cannot be run yet:"));
         for (const model::Finding& finding : text.findings)
             if (finding.isError())
-                lines << QStringLiteral("\u2022 ") + inWords(QString::fromStdU16String(finding.text));
+                lines << QStringLiteral("\u2022 ") +
+                             inWords(QString::fromStdU16String(finding.text));
         showMessage(lines.join(u'\n'));
         return {};
     }
@@ -163,6 +166,7 @@ void ResultsPanel::giveUp() {
 }
 
 void ResultsPanel::stopped() {
+    mFile.clear();
     mLook.stop();
     mPatience.stop();
     mWorker.reset();
@@ -174,12 +178,18 @@ void ResultsPanel::stopped() {
 
 void ResultsPanel::finish(const Outcome& outcome) {
     progress();
+    const QString file = mFile;
     stopped();
+    mSorting.clear(); // it can be done from now on
+    // The engine has answered, whatever it said.
+    using End = Outcome::End;
+    if (outcome.end == End::complete || outcome.end == End::limited || outcome.end == End::failed)
+        mDatabase.sayFound();
     const QString rows = number(outcome.rows);
-    const bool exporting = !mFile.isEmpty();
+    const bool exporting = !file.isEmpty();
     switch (outcome.end) {
     case Outcome::End::complete:
-        setStatus(exporting ? tr("Exported to %1. Rows: %2 \u00b7 %3").arg(mFile, rows, seconds())
+        setStatus(exporting ? tr("Exported to %1. Rows: %2 \u00b7 %3").arg(file, rows, seconds())
                             : tr("Rows: %1 \u00b7 %2").arg(rows, seconds()));
         break;
     case Outcome::End::limited:
@@ -209,18 +219,18 @@ void ResultsPanel::finish(const Outcome& outcome) {
 }
 
 void ResultsPanel::askForFile() {
-    const QString path = QFileDialog::getSaveFileName(this, tr("Export all rows"), {},
+    const QString path = QFileDialog::getSaveFileName(this, tr("Export all rows"), tr("rows.csv"),
                                                       tr("Comma-separated values (*.csv)"));
     if (path.isEmpty()) return;
     const bool named = path.endsWith(QLatin1String(".csv"), Qt::CaseInsensitive);
     exportTo(named ? path : path + QLatin1String(".csv"));
 }
 
-/// Of another database there are no rows yet.
+/// Of another query or database there are no rows yet. What is being exported still is wanted.
 void ResultsPanel::forget() {
-    stopped();
-    mTable->rows().setSpool(nullptr);
+    if (mFile.isEmpty()) stopped();
     mSpool.reset();
+    showSpool();
     mAll->hide();
     mAddress = mDatabase.address();
     showMessage(tr("Run the query to see its rows here."));
@@ -229,7 +239,47 @@ void ResultsPanel::forget() {
 void ResultsPanel::queryChanged() {
     if (mOutdated || isRunning() || !mSpool || mPages->currentWidget() != mTable) return;
     mOutdated = true;
-    setStatus(tr("%1 \u00b7 the drawing has changed since").arg(mStatus->toolTip()));
+    showStatus();
+}
+
+void ResultsPanel::showSpool() {
+    mTable->showSorting(-1);
+    mTable->rows().setSpool(mSpool);
+    mSorting.clear();
+    mOutdated = false;
+}
+
+/// Sorts the rows that are shown, and not the query: neither is it changed nor run again.
+void ResultsPanel::sort(int column, Qt::SortOrder direction) {
+    ResultModel& rows = mTable->rows();
+    const qint64 count = rows.rowCount();
+    const auto refuse = [&](const QString& why) {
+        mTable->showSorting(-1);
+        rows.setOrder({});
+        mSorting = why;
+        showStatus();
+    };
+    mTable->clearSelection();
+    if (column < 0 || count == 0) return refuse({});
+    if (isRunning()) return refuse(tr("the rows can be sorted when all of them have come"));
+    if (count > mostRowsSorted)
+        return refuse(tr("these are too many rows to sort here; use the row \"Sort:\" of the "
+                         "drawing"));
+    const auto stop = std::make_shared<std::atomic<bool>>(false);
+    const auto spool = mSpool;
+    const auto sorted =
+        patiently<std::optional<RowOrder>>(tr("Sorting the rows\u2026"), window(), [=] {
+            return sortedRows(*spool, column, direction, count, *stop);
+        });
+    *stop = true;                // when nobody waits for it any longer
+    if (mSpool != spool) return; // they are gone by now
+    if (!sorted || !*sorted) return refuse({});
+    rows.setOrder(**sorted);
+    const QString name = rows.headerData(column, Qt::Horizontal).toString();
+    mSorting = direction == Qt::AscendingOrder
+                   ? tr("these rows are sorted by %1 here, the query is not").arg(name)
+                   : tr("these rows are sorted by %1 descending here, the query is not").arg(name);
+    showStatus();
 }
 
 void ResultsPanel::showMessage(const QString& text, const QString& statement) {
@@ -242,6 +292,15 @@ void ResultsPanel::showMessage(const QString& text, const QString& statement) {
 }
 
 void ResultsPanel::setStatus(const QString& text) {
+    mState = text;
+    showStatus();
+}
+
+void ResultsPanel::showStatus() {
+    QStringList parts{mState};
+    if (!mSorting.isEmpty()) parts << mSorting;
+    if (mOutdated) parts << tr("the drawing has changed since");
+    const QString text = parts.join(QStringLiteral(" \u00b7 "));
     mStatus->setText(text);
     mStatus->setToolTip(text);
 }

@@ -70,8 +70,11 @@ private:
     void runAll();
     void forget();
     void queryChanged();
+    void showSpool();
+    void sort(int column, Qt::SortOrder direction);
     void showMessage(const QString& text, const QString& statement = {});
     void setStatus(const QString& text);
+    void showStatus();
     QString seconds() const;
 
     Document& mDocument;
@@ -79,12 +82,14 @@ private:
     QString mAddress; ///< where the rows that are shown came from
     QMap<QString, QString> mAnswers;
     QString mStatement; ///< that ran last
-    QString mFile;      ///< that is being exported to; empty while rows are shown
+    QString mFile;      ///< that is being exported to; empty otherwise
     std::shared_ptr<Spool> mSpool;
     WorkerPointer mWorker;
     QElapsedTimer mClock;
     QTimer mLook;     ///< at what has come
     QTimer mPatience; ///< with a server that is to stop
+    QString mState;   ///< of the rows or the run
+    QString mSorting; ///< how the rows are sorted here; empty: as they came
     bool mFitted = false;
     bool mOutdated = false;
 

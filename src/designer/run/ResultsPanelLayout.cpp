@@ -36,11 +36,12 @@ void ResultsPanel::makeActions() {
 
     mCancel = new QAction(shapeIcon({{0.15, 0.15}, {0.85, 0.15}, {0.85, 0.85}, {0.15, 0.85}}),
                           tr("&Cancel"), this);
-    mCancel->setToolTip(tr("Stop what is running, on the database too"));
+    mCancel->setShortcuts({Qt::Key_Escape, Qt::CTRL | Qt::Key_Period});
+    mCancel->setToolTip(tr("Stop what is running, on the database too (Esc)"));
     connect(mCancel, &QAction::triggered, this, &ResultsPanel::cancel);
 
-    mExport =
-        new QAction(style()->standardIcon(QStyle::SP_DialogSaveButton), tr("&Export rows\u2026"), this);
+    mExport = new QAction(style()->standardIcon(QStyle::SP_DialogSaveButton),
+                          tr("&Export rows\u2026"), this);
     mExport->setIconText(tr("Export\u2026")); // beside the rows
     mExport->setToolTip(tr("Run the query and write all its rows into a CSV file"));
     connect(mExport, &QAction::triggered, this, &ResultsPanel::askForFile);

@@ -121,6 +121,16 @@ TEST_F(ALostConnection, IsRenewedWithTheButtonOfTheBanner) {
     EXPECT_TRUE(database.reader().table(towns));
 }
 
+TEST_F(ALostConnection, IsOverAsSoonAsTheServerHasAnswered) {
+    killServer();
+    ASSERT_TRUE(read());
+    ASSERT_TRUE(banner->isVisible());
+    restartServer();
+    EXPECT_EQ(read(), std::nullopt);
+    EXPECT_FALSE(banner->isVisible());
+    EXPECT_FALSE(database.isLost());
+}
+
 TEST_F(ALostConnection, MayBeLeftLostAndIsToldAgainTheNextTime) {
     killServer();
     ASSERT_TRUE(read());
@@ -129,6 +139,7 @@ TEST_F(ALostConnection, MayBeLeftLostAndIsToldAgainTheNextTime) {
     restartServer();
     EXPECT_EQ(read(), std::nullopt); // what reads over connections of its own just goes on
     EXPECT_EQ(database.renew(), std::nullopt);
+    EXPECT_FALSE(database.isLost());
     killServer();
     ASSERT_TRUE(read());
     EXPECT_TRUE(banner->isVisible());

@@ -69,3 +69,39 @@ TEST_F(AskingForParameters, RemembersWhatWasTypedTheLastTime) {
     EXPECT_EQ(field("Which product?").text(), "Tea");
     EXPECT_TRUE(run().isEnabled());
 }
+
+TEST_F(AskingForParameters, CutsNeitherItsTitleNorItsFields) {
+    open();
+    const QFontMetrics metrics = dialog->fontMetrics();
+    // Beside the title stand the window's own buttons.
+    EXPECT_GE(dialog->width(), metrics.horizontalAdvance(dialog->windowTitle()) * 3 / 2 + 120);
+    for (const char* name : {"most", "Which product?"}) {
+        QLineEdit& line = field(name);
+        EXPECT_GE(line.width(), metrics.averageCharWidth() * 30) << name;
+        EXPECT_GT(line.width(), metrics.horizontalAdvance(line.placeholderText()));
+    }
+    EXPECT_GE(dialog->width(), dialog->minimumSizeHint().width());
+}
+
+TEST_F(AskingForParameters, HasRoomForManyOnASmallScreen) {
+    QStringList criteria;
+    for (int n = 0; n < 40; ++n)
+        criteria << QStringLiteral("= [what the value number %1 is]").arg(n);
+    const auto query =
+        draw(sampleDatabase(), {"products"}, {{"products.name", {criteria.join(" Or ")}}});
+    dialog.emplace(designer::questions(designer::statementFor(*query, Dialect::SQLite, {})),
+                   designer::Answers());
+    dialog->show();
+    EXPECT_EQ(dialog->findChildren<QLineEdit*>().size(), 40);
+    EXPECT_LE(dialog->height(), 560);
+    EXPECT_LE(dialog->width(), 1000);
+    // The buttons are in sight, and a field comes into it with the focus.
+    EXPECT_TRUE(dialog->rect().contains(run().mapTo(&*dialog, run().rect().center())));
+    QLineEdit& last = field("what the value number 39 is");
+    dialog->activateWindow();
+    QCoreApplication::processEvents();
+    last.setFocus(Qt::BacktabFocusReason);
+    QCoreApplication::processEvents();
+    EXPECT_FALSE(last.visibleRegion().isEmpty());
+    EXPECT_GE(last.visibleRegion().boundingRect().width(), last.width());
+}

@@ -72,6 +72,22 @@ TEST_F(ShownRows, GrowAsTheyCome) {
     EXPECT_EQ(at(399, 1), "row 99");
 }
 
+TEST_F(ShownRows, StandInAnotherOrderWhenTheyAreSorted) {
+    addNumbered(600);
+    const auto order = designer::sortedRows(*spool, 0, Qt::DescendingOrder, 600, false);
+    ASSERT_TRUE(order);
+    table.rows().setOrder(*order);
+    EXPECT_EQ(at(0, 1), "row 599");
+    EXPECT_EQ(at(599, 0), "0");
+    // Copied as they stand.
+    EXPECT_EQ(copied(range(342, 0, 345, 0)), "257\n256\n255\n254");
+    // What comes later stands behind them.
+    addNumbered(1);
+    EXPECT_EQ(at(600, 0), "0");
+    table.rows().setOrder({});
+    EXPECT_EQ(at(0, 1), "row 0");
+}
+
 TEST_F(ShownRows, AreAlignedByTheirKind) {
     addNumbered(1);
     EXPECT_EQ(at(0, 0, Qt::TextAlignmentRole).toInt(), Qt::AlignRight | Qt::AlignVCenter);

@@ -12,6 +12,7 @@
 #include <QAction>
 #include <QComboBox>
 #include <QElapsedTimer>
+#include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPlainTextEdit>
@@ -166,6 +167,20 @@ TEST_F(TheResultsPanel, StaysAliveWhileTheEngineWorksAndCancels) {
     EXPECT_TRUE(panel.runAction()->isEnabled());
 }
 
+TEST_F(TheResultsPanel, CancelsByAKeyThatItsMenuNames) {
+    open(numbersTable(3000));
+    document.setQuery(drawForMinutes(file));
+    panel.addAction(panel.cancelAction());
+    EXPECT_EQ(panel.cancelAction()->shortcut(), QKeySequence(Qt::Key_Escape));
+    pressRun();
+    ASSERT_TRUE(panel.isRunning());
+    panel.activateWindow();
+    EXPECT_TRUE(until([&] { return panel.isActiveWindow(); }));
+    hands::shortcut(panel, Qt::Key_Escape);
+    ASSERT_TRUE(ended());
+    EXPECT_THAT(status(), StartsWith("Cancelled."));
+}
+
 TEST_F(TheResultsPanel, KeepsTheRowsThatCameBeforeItWasCancelled) {
     open(numbersTable(3000));
     show({"numbers", "numbers", "numbers"});
@@ -226,6 +241,92 @@ TEST_F(TheResultsPanel, SaysThatTheDrawingHasChanged) {
     pressRun();
     ASSERT_TRUE(ended());
     EXPECT_EQ(status().find("changed"), std::string::npos);
+}
+
+TEST_F(TheResultsPanel, ForgetsTheRowsAndMessagesOfAnotherQuery) {
+    open(numbersTable(10));
+    show({"numbers"});
+    pressRun();
+    ASSERT_TRUE(ended());
+    ASSERT_EQ(table().rows().rowCount(), 10);
+    document.setQuery(platform::makeRef<model::Query>());
+    EXPECT_EQ(table().rows().rowCount(), 0);
+    EXPECT_EQ(message(), "Run the query to see its rows here.");
+    EXPECT_EQ(status(), "");
+    pressRun();
+    EXPECT_THAT(message(), HasSubstr("The query has no tables"));
+    document.setQuery(platform::makeRef<model::Query>());
+    EXPECT_EQ(message(), "Run the query to see its rows here.");
+}
+
+TEST_F(TheResultsPanel, EndsTheRunOfAnotherQueryButNotItsExport) {
+    open(numbersTable(3000));
+    document.setQuery(drawForMinutes(file));
+    pressRun();
+    ASSERT_TRUE(panel.isRunning());
+    document.setQuery(platform::makeRef<model::Query>());
+    EXPECT_FALSE(panel.isRunning());
+    EXPECT_TRUE(panel.runAction()->isEnabled());
+
+    show({"numbers", "numbers"}, {{"numbers.n", {"< 100"}}});
+    panel.exportTo(folder.path("all.csv"));
+    ASSERT_TRUE(panel.isRunning());
+    document.setQuery(platform::makeRef<model::Query>());
+    ASSERT_TRUE(ended());
+    EXPECT_THAT(status(), StartsWith("Exported to "));
+    EXPECT_TRUE(QFile::exists(folder.path("all.csv")));
+}
+
+TEST_F(TheResultsPanel, SortsTheRowsByAClickOnAHeaderAndSaysSo) {
+    open(numbersTable(3000));
+    show({"numbers"}, {{"numbers.n", {"< 12"}}, {"numbers.word"}});
+    pressRun();
+    ASSERT_TRUE(ended());
+    auto& header = *table().horizontalHeader();
+    const auto clickHeader = [&](int column) {
+        hands::click(*header.viewport(),
+                     QPointF(header.sectionViewportPosition(column) + 10, header.height() / 2));
+    };
+    const std::string before = status();
+    clickHeader(0);
+    EXPECT_EQ(at(11, 0), "11"); // as a number
+    EXPECT_THAT(status(), HasSubstr("these rows are sorted by n here, the query is not"));
+    clickHeader(0);
+    EXPECT_EQ(at(0, 0), "11");
+    EXPECT_THAT(status(), HasSubstr("sorted by n descending here"));
+    EXPECT_TRUE(table()
+                    .rows()
+                    .headerData(0, Qt::Horizontal, Qt::ToolTipRole)
+                    .toString()
+                    .contains("Click to sort"));
+    clickHeader(0);
+    EXPECT_EQ(at(0, 0), "0");
+    EXPECT_EQ(status(), before);
+    // By keys from the menu.
+    table().setCurrentIndex(table().rows().index(3, 0));
+    table().findChild<QAction*>("sortDescending")->trigger();
+    EXPECT_EQ(at(0, 0), "11");
+    // The next rows are as the query gives them.
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(at(0, 0), "0");
+    EXPECT_EQ(header.sortIndicatorSection(), -1);
+    EXPECT_EQ(status().find("sorted"), std::string::npos);
+}
+
+TEST_F(TheResultsPanel, SortsOnlyWhenAllRowsHaveCome) {
+    open(numbersTable(3000));
+    show({"numbers", "numbers", "numbers"});
+    panel.setLimit(ResultsPanel::mostRows);
+    pressRun();
+    ASSERT_TRUE(until([&] { return table().rows().rowCount() > 1000; }));
+    table().horizontalHeader()->setSortIndicator(0, Qt::DescendingOrder);
+    EXPECT_EQ(table().horizontalHeader()->sortIndicatorSection(), -1);
+    EXPECT_EQ(at(0, 0), "0");
+    EXPECT_THAT(status(), HasSubstr("can be sorted when all of them have come"));
+    panel.cancel();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(status().find("can be sorted"), std::string::npos);
 }
 
 TEST_F(TheResultsPanel, ForgetsTheRowsOfAnotherDatabase) {
