@@ -19,7 +19,10 @@ void useOwnColours() {
     if (ownStyle().isEmpty()) return; // nothing was changed
     QApplication::setStyle(ownStyle());
     QApplication::setPalette(QPalette());
+    ownStyle().clear();
 }
+
+bool areDarkColoursUsed() { return !ownStyle().isEmpty(); }
 
 bool areColoursDark() {
     constexpr int middle = 128;

@@ -8,7 +8,10 @@ void useDarkColours();
 /// Gives it the desktop's own colours again.
 void useOwnColours();
 
-/// Whether the application's colours of the moment are dark.
+/// Whether useDarkColours() is in force.
+bool areDarkColoursUsed();
+
+/// Whether the application's colours of the moment are dark, by whomever.
 bool areColoursDark();
 
 } // namespace designer

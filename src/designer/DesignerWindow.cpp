@@ -22,7 +22,6 @@
 #include "designer/tables/TableAdding.h"
 #include "designer/tables/TableDropTarget.h"
 #include "designer/tables/TablesPanel.h"
-#include "designer/tables/placeTables.h"
 
 #include <QCloseEvent>
 #include <QDockWidget>
@@ -55,7 +54,7 @@ DesignerWindow::DesignerWindow()
     : mCounts(new QLabel), mDrawing(new DrawingArea(mDocument)),
       mFiles(new FileDialogs(mDocument, mFile, mRecentQueries, *this)),
       mDatabases(new DatabaseCommands(mDatabase, mFile, *mFiles, mRecentDatabases, *this)),
-      mShow(new ShowCommands(mDocument, *mDrawing, *this)) {
+      mShow(new ShowCommands(mDocument, mFile, *mDrawing, mSettings, *this)) {
     mDrawing->setOptions(ControlOptions::read(mSettings).properties());
     auto* const middle = new QWidget;
     auto* const layout = new QVBoxLayout(middle);
@@ -65,7 +64,9 @@ DesignerWindow::DesignerWindow()
     layout->addWidget(mDrawing, 1);
     setCentralWidget(middle);
     mCounts->setObjectName(QStringLiteral("counts"));
-    statusBar()->addWidget(mCounts);
+    // Permanent, so that a message leaves it its place. What is cut off of one is in the tip.
+    statusBar()->addPermanentWidget(mCounts);
+    connect(statusBar(), &QStatusBar::messageChanged, statusBar(), &QWidget::setToolTip);
     setAcceptDrops(true);
     makePanels();
     makeMenus();
@@ -153,6 +154,7 @@ void DesignerWindow::makeMenus() {
     file->addSeparator();
     file->addAction(&mShow->exportPicture);
     file->addAction(&mShow->print);
+    file->addAction(&mShow->allColumns);
     file->addSeparator();
     command(file, tr("&Quit"), "quit", [this] { close(); })->setShortcut(QKeySequence::Quit);
 
@@ -179,9 +181,8 @@ void DesignerWindow::makeMenus() {
     query->addAction(mResults->cancelAction());
     query->addAction(mResults->exportAction());
     query->addSeparator();
-    QAction* const arrange = command(query, tr("&Arrange tables"), "arrange", [this] {
-        arrangeTables(mDocument, mDrawing->width() * twipsPerPixel);
-    });
+    QAction* const arrange =
+        command(query, tr("&Arrange tables"), "arrange", [this] { mAdding->arrange(); });
     arrange->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_A);
     mTableCommands.push_back(arrange);
     mTableCommands.push_back(
@@ -199,11 +200,13 @@ void DesignerWindow::makeMenus() {
     QAction* const dark = view->addAction(tr("&Dark colours"));
     dark->setObjectName(QStringLiteral("dark"));
     dark->setCheckable(true);
+    // They may have been asked for on the command line, for this once.
+    if (mSettings.value(darkKey()).toBool()) useDarkColours();
+    dark->setChecked(areDarkColoursUsed());
     connect(dark, &QAction::toggled, this, [this](bool on) {
         mSettings.setValue(darkKey(), on);
         on ? useDarkColours() : useOwnColours();
     });
-    dark->setChecked(mSettings.value(darkKey()).toBool());
     view->addSeparator();
     command(view, tr("&Find table"), "findTable", [this] {
         mTables->parentWidget()->show();
@@ -222,7 +225,13 @@ void DesignerWindow::makeMenus() {
     panel(tr("&Rows"), "resultsDock");
     panel(tr("&Events"), "eventsDock");
 
-    command(add(tr("&Help"), "helpMenu"), tr("&About"), "about", &DesignerWindow::about);
+    QMenu* const help = add(tr("&Help"), "helpMenu");
+    command(help, tr("&Criteria"), "helpCriteria", [this] {
+        showHelp(HelpWindow::Page::criteria);
+    })->setShortcut(QKeySequence::HelpContents);
+    command(help, tr("&Keys"), "helpKeys", [this] { showHelp(HelpWindow::Page::keys); });
+    help->addSeparator();
+    command(help, tr("&About"), "about", &DesignerWindow::about);
 }
 
 void DesignerWindow::connectParts() {
@@ -233,6 +242,7 @@ void DesignerWindow::connectParts() {
             [this](const std::vector<reader::TableId>& tables) { mAdding->add(tables); });
     connect(target, &TableDropTarget::dropped, mAdding, &TableAdding::add);
     connect(mAdding, &TableAdding::added, this, &DesignerWindow::showTable);
+    connect(mAdding, &TableAdding::noted, this, &DesignerWindow::tell);
     connect(mAdding, &TableAdding::refused, this,
             [this](const QString& why) { QMessageBox::warning(this, tr("Add tables"), why); });
 
@@ -250,6 +260,7 @@ void DesignerWindow::connectParts() {
     });
     connect(&mFile, &QueryFile::changed, this, &DesignerWindow::showTitle);
     connect(mFiles, &FileDialogs::opened, mDatabases, &DatabaseCommands::followFile);
+    connect(&mDocument, &Document::replaced, statusBar(), &QStatusBar::clearMessage);
     connect(&mDocument, &Document::changed, this, &DesignerWindow::showCounts);
     connect(&mDocument, &Document::changed, this, &DesignerWindow::offerCommands);
     connect(&mDocument, &Document::changed, this, &DesignerWindow::warnOfFullGrid);
@@ -271,7 +282,8 @@ std::optional<QString> DesignerWindow::openAtFirst(const Arguments& arguments,
                   {arguments.tables, isSample, address, mDrawing->width() * twipsPerPixel});
     if (!opened) return opened.error();
     mDocument.setQuery(opened->query);
-    statusBar()->showMessage(opened->message, messageTime);
+    mAdding->takeAsArranged();
+    tell(opened->message);
     return {};
 }
 
@@ -280,6 +292,10 @@ void DesignerWindow::keepSafe(const QString& folder) {
     connect(mAutosave.get(), &Autosave::failed, this,
             [this](const QString& message) { statusBar()->showMessage(message); });
     if (offerRecovery(mFile, *mAutosave, folder, this)) mDatabases->followFile();
+}
+
+void DesignerWindow::tell(const QString& message) {
+    statusBar()->showMessage(message, messageTime);
 }
 
 void DesignerWindow::closeEvent(QCloseEvent* event) {
@@ -313,6 +329,11 @@ void DesignerWindow::dropEvent(QDropEvent* event) {
 void DesignerWindow::showTable(const QString& name) {
     const auto table = mDocument.query()->tableNamed(name.toStdU16String());
     if (!table) return;
+    // With what it is joined to, as far as there is room.
+    for (const auto& join : platform::Each<TalvikZandorLib::ZDJoin>(mDocument.query()->Joins()))
+        for (const auto& [one, other] : {std::pair(join->LeftTable(), join->RightTable()),
+                                         std::pair(join->RightTable(), join->LeftTable())})
+            if (one == table && other) bringIntoView(mDrawing->control(), *other);
     const QPointer<QWidget> typing = focusWidget();
     model::Finding finding{};
     finding.table = table->Key();
@@ -358,6 +379,11 @@ void DesignerWindow::showOptions() {
 }
 
 void DesignerWindow::renameTable() { RenameDialog(mDocument, this).exec(); }
+
+void DesignerWindow::showHelp(HelpWindow::Page page) {
+    if (!mHelp) mHelp = new HelpWindow(this);
+    mHelp->showPage(page);
+}
 
 void DesignerWindow::about() {
     QMessageBox::about(

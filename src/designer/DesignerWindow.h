@@ -6,6 +6,7 @@
 #include "designer/document/Document.h"
 #include "designer/document/QueryFile.h"
 #include "designer/document/RecentFiles.h"
+#include "designer/help/HelpWindow.h"
 
 #include <QMainWindow>
 #include <QSettings>
@@ -32,8 +33,9 @@ public:
     DesignerWindow();
     ~DesignerWindow() override;
 
-    /// Opens what the command line names: a database with the tables named, or a query with its
-    /// database. Nothing named opens the sample. Returns what went wrong; the window is empty then.
+    /// Opens what the command line names: a database with the tables named, if any, or a query with
+    /// its database. Nothing named opens the sample with its example. Returns what went wrong; the
+    /// window is empty then.
     std::optional<QString> openAtFirst(const Arguments& arguments, const QString& sample);
     /// Saves what is done from time to time, in a folder, and offers to go on with what a designer
     /// that was killed has left there. To be called once the window stands.
@@ -57,12 +59,15 @@ private:
     void connectParts();
     void restoreLayout();
     void showTable(const QString& name);
+    /// In the status bar, for a while.
+    void tell(const QString& message);
     void showTitle();
     void showCounts();
     void offerCommands();
     void warnOfFullGrid();
     void showOptions();
     void renameTable();
+    void showHelp(HelpWindow::Page page);
     void about();
 
     bool mWarnedOfFullGrid = false;
@@ -80,6 +85,7 @@ private:
     ResultsPanel* mResults;
     EventPanel* mEvents;
     TableAdding* mAdding;
+    HelpWindow* mHelp = nullptr;          ///< made when it is asked for first
     std::vector<QAction*> mTableCommands; ///< that need a table
     FileDialogs* mFiles;
     DatabaseCommands* mDatabases;

@@ -1,6 +1,7 @@
 #include "designer/OpenedQuery.h"
 
 #include "designer/ExampleQuery.h"
+#include "designer/tables/leftOutWords.h"
 #include "model/Names.h"
 #include "model/reader/addTables.h"
 
@@ -34,27 +35,20 @@ Result<std::vector<TableId>> named(const QStringList& names, const std::vector<T
     return result;
 }
 
-std::vector<TableId> firstOf(const std::vector<TableEntry>& present) {
-    std::vector<TableId> result;
-    for (const TableEntry& entry : present) {
-        if (result.size() == mostTables) break;
-        result.push_back(entry.id);
-    }
-    return result;
-}
-
 } // namespace
 
 Result<OpenedQuery> openQuery(reader::DatabaseReader& schema,
                               const std::vector<TableEntry>& present, const FirstTables& wanted) {
     const bool example = wanted.example && wanted.names.isEmpty();
     const QStringList names = example ? exampleTables() : wanted.names;
-    auto chosen = names.isEmpty() ? firstOf(present) : named(names, present, wanted.database);
+    const auto chosen = named(names, present, wanted.database);
     if (!chosen) return Error{chosen.error()};
 
     OpenedQuery opened;
     opened.query = platform::makeRef<model::Query>();
-    const auto added = reader::addTables(*opened.query, schema, *chosen, wanted.canvasWidth);
+    std::vector<reader::LeftOut> leftOut;
+    const auto added =
+        reader::addTables(*opened.query, schema, *chosen, wanted.canvasWidth, &leftOut);
     if (!added) return Error{added.error()};
     if (opened.query->Joins().Count() > mostJoins)
         return Error{tr("These tables have %1 joins, and the canvas takes %2; choose fewer tables "
@@ -65,10 +59,7 @@ Result<OpenedQuery> openQuery(reader::DatabaseReader& schema,
         placeInARow(*added);
         addExampleColumns(*opened.query);
     }
-    if (names.isEmpty() && present.size() > chosen->size())
-        opened.message = tr("%1 of %2 tables; choose others in the panel \"Tables\"")
-                             .arg(chosen->size())
-                             .arg(present.size());
+    opened.message = leftOutWords(leftOut);
     return opened;
 }
 

@@ -11,21 +11,22 @@ namespace designer {
 inline constexpr std::int32_t mostTables = 16;
 inline constexpr std::int32_t mostJoins = 64;
 
-/// A query over a database that was read, ready to be shown.
+/// A query over a database, ready to be shown.
 struct OpenedQuery {
     platform::Ref<model::Query> query;
-    QString message; ///< what of the database was left out, or empty
+    QString message; ///< which joins were left out, or empty
 };
 
 /// Which tables a new query begins with.
 struct FirstTables {
-    QStringList names = {}; ///< empty: the first ones
+    QStringList names = {}; ///< empty: none, for nobody has asked for any
     bool example = false;   ///< those of the example with its output columns, when no name is given
     QString database = {};  ///< how messages call it
     std::int32_t canvasWidth = 18000; ///< twips
 };
 
-/// Reads the tables that are wanted, with the joins between them. `present` are the database's.
+/// A query of the tables that are wanted, with the joins between them. `present` are the
+/// database's.
 reader::Result<OpenedQuery> openQuery(reader::DatabaseReader& schema,
                                       const std::vector<reader::TableEntry>& present,
                                       const FirstTables& wanted);

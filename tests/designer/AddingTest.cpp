@@ -47,6 +47,17 @@ TEST_F(ATableOfThePanel, IsInvitedOnAnEmptyDrawing) {
     EXPECT_FALSE(invitation().isVisible());
 }
 
+TEST_F(ATableOfThePanel, IsInvitedWhenADatabaseIsNamedAtTheStart) {
+    open({.file = sampleDatabase()});
+    EXPECT_THAT(shownTables(), IsEmpty());
+    EXPECT_TRUE(invitation().isVisible());
+    EXPECT_EQ(list().model()->rowCount(), 16);
+    EXPECT_FALSE(window->isWindowModified());
+    add("orders");
+    EXPECT_THAT(shownTables(), ElementsAre("orders"));
+    window->document().setModified(false);
+}
+
 TEST_F(ATableOfThePanel, ComesWithItsJoinsByADoubleClick) {
     open({.tables = {"customers"}});
     add("orders");
@@ -88,7 +99,7 @@ TEST_F(ATableOfThePanel, GetsAnotherNameWhenItIsThereAlready) {
 }
 
 TEST_F(ATableOfThePanel, IsRefusedAsTheSeventeenth) {
-    open({.file = sampleDatabase()});
+    open({.tables = sampleTables()});
     ASSERT_EQ(shownTables().size(), 16U);
     std::string text;
     answering([&](QMessageBox& box) { text = box.text().toStdString(), box.accept(); },

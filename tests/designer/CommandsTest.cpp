@@ -104,11 +104,13 @@ TEST_F(TheWindowsCommands, PutColumnsOnTheGridAndBackInOneStep) {
 
 TEST_F(TheWindowsCommands, ArrangeTheTablesAndPutThemBack) {
     open();
+    window->document().change("Move",
+                              [](model::Query& query) { query.tableNamed(u"orders")->Top(4000); });
     const auto before = query().record();
     command("arrange");
     const auto after = query().record();
     EXPECT_NE(after, before);
-    EXPECT_EQ(window->document().steps().count(), 1);
+    EXPECT_EQ(window->document().steps().count(), 2);
     command("undo");
     EXPECT_EQ(query().record(), before);
     command("redo");
@@ -213,6 +215,43 @@ TEST_F(TheWindowsCommands, ExportTheDrawingAsTheKindOfFileThatIsNamed) {
     EXPECT_TRUE(svg.readAll().contains(">order_lines</text>"));
     commandWithFile("exportPicture", folder.path("drawing"));
     EXPECT_FALSE(QImage(folder.path("drawing.png")).isNull());
+}
+
+TEST_F(TheWindowsCommands, ProposeANameForTheDrawing) {
+    open();
+    const auto proposed = [&] {
+        QString name;
+        const Answering answers({[&](QDialog& dialog) {
+            name = dialog.findChild<QLineEdit*>("fileNameEdit")->text();
+            dialog.reject();
+        }});
+        command("exportPicture");
+        return name;
+    };
+    EXPECT_EQ(proposed(), "drawing.png");
+    commandWithFile("save", folder.path("large orders.json"));
+    EXPECT_EQ(proposed(), "large orders.png");
+}
+
+TEST_F(TheWindowsCommands, CutTablesInPicturesWhenThatIsWanted) {
+    open({.tables = {"customers"}});
+    window->document().change(
+        "Resize", [](model::Query& query) { query.tableNamed(u"customers")->Height(1500); });
+    const auto height = [&] {
+        command("copyPicture");
+        return QGuiApplication::clipboard()->image().height();
+    };
+    const int whole = height();
+    command("allColumns");
+    EXPECT_LT(height(), whole);
+    window->document().setModified(false);
+    EXPECT_TRUE(window->close());
+    open({.tables = {"customers"}});
+    for (const QAction* action : menu("fileMenu").actions())
+        if (action->objectName() == "allColumns") {
+            EXPECT_FALSE(action->isChecked());
+        }
+    EXPECT_LT(height(), whole);
 }
 
 TEST_F(TheWindowsCommands, ChangeTheControlsOptionsForGood) {

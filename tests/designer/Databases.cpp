@@ -11,6 +11,14 @@
 
 QString sampleDatabase() { return QStringLiteral(ZANDOR_SAMPLE_DATABASE); }
 
+QStringList sampleTables() {
+    designer::Database database;
+    EXPECT_EQ(database.open(sampleDatabase()), std::nullopt);
+    QStringList names;
+    for (const auto& entry : database.tables()) names << QString::fromStdU16String(entry.id.name);
+    return names;
+}
+
 designer::OpenedQuery openedSample(const QStringList& tables) {
     const auto opened =
         openDatabaseFile(sampleDatabase(), {.names = tables, .example = tables.isEmpty()});

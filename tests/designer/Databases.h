@@ -8,6 +8,8 @@
 
 /// The sample database, and folders with databases of a test's own.
 QString sampleDatabase();
+/// The names of its sixteen tables and views.
+QStringList sampleTables();
 
 /// The query that the designer opens with over the sample, or one of these tables; fails the test
 /// when it opens none.

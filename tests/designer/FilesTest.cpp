@@ -146,7 +146,7 @@ TEST_F(TheWindowsFiles, BringTheirDatabaseAlong) {
     const QString other =
         folder.database("other.db", {"CREATE TABLE only (id INTEGER PRIMARY KEY)"});
     const QString file = savedQuery("query.json", sampleDatabase(), {"orders"});
-    open({.file = other});
+    open({.file = other, .tables = {"only"}});
     EXPECT_THAT(shownTables(), ElementsAre("only"));
     commandWithFile("open", file);
     EXPECT_EQ(window->database().name(), "trading.sqlite");

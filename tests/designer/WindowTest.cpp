@@ -1,6 +1,8 @@
 #include "Databases.h"
 
+#include "designer/Colours.h"
 #include "designer/DesignerWindow.h"
+#include "designer/options/Languages.h"
 #include "designer/tables/RenameDialog.h"
 #include "platform/qt/CanvasItems.h"
 #include "platform/qt/GridModel.h"
@@ -21,6 +23,7 @@
 #include <QMimeData>
 #include <QStatusBar>
 #include <QTimer>
+#include <QTranslator>
 #include <QUrl>
 
 using platform::qt::Canvas;
@@ -120,6 +123,41 @@ TEST_F(TheDesignersWindow, NamesTheDatabaseAndSaysWhatIsInTheQuery) {
     EXPECT_EQ(window->statusBar()->findChild<QLabel*>("counts")->text(), "Tables: 5   Joins: 4");
 }
 
+TEST_F(TheDesignersWindow, NeverWritesOneTextOverAnotherInItsStatusBar) {
+    open();
+    auto& counts = *window->statusBar()->findChild<QLabel*>("counts");
+    EXPECT_TRUE(counts.isVisible());
+    const QString message(300, u'x');
+    // Also one that was there before the window.
+    for (const bool shown : {true, false}) {
+        window->setVisible(shown);
+        window->statusBar()->showMessage(message);
+        window->show();
+        QCoreApplication::processEvents();
+        EXPECT_TRUE(counts.isVisible());
+        const QRect place(counts.mapTo(window->statusBar(), QPoint()), counts.size());
+        const QImage with = window->statusBar()->grab(place).toImage();
+        window->statusBar()->clearMessage();
+        EXPECT_EQ(with, window->statusBar()->grab(place).toImage());
+    }
+    window->statusBar()->showMessage(message);
+    EXPECT_EQ(window->statusBar()->toolTip(), message);
+    window->document().setQuery(platform::makeRef<model::Query>());
+    EXPECT_EQ(window->statusBar()->currentMessage(), "");
+}
+
+TEST_F(TheDesignersWindow, TicksTheColoursThatAreUsed) {
+    designer::useDarkColours(); // as the command line asks for it
+    open();
+    auto* const dark = window->findChild<QAction*>("dark");
+    EXPECT_TRUE(dark->isChecked());
+    dark->trigger();
+    EXPECT_FALSE(designer::areColoursDark());
+    open();
+    EXPECT_FALSE(window->findChild<QAction*>("dark")->isChecked());
+    QSettings().clear();
+}
+
 TEST_F(TheDesignersWindow, ShowsNoTraceBoxesAndNoReports) {
     open();
     EXPECT_EQ(window->drawing().control().DebugSwitch(), 0);
@@ -127,7 +165,7 @@ TEST_F(TheDesignersWindow, ShowsNoTraceBoxesAndNoReports) {
 }
 
 TEST_F(TheDesignersWindow, BindsTheWholeSample) {
-    open({.file = sampleDatabase()});
+    open({.tables = sampleTables()});
     EXPECT_EQ(shownTables().size(), 16U);
     EXPECT_EQ(paintedItems().size(), 3U * 19U);
 }
@@ -283,4 +321,25 @@ TEST_F(TheDesignersWindow, HasRoomForItsPanelsOnASmallScreen) {
     EXPECT_GE(window->drawing().height(), 400);
     EXPECT_GE(window->drawing().width(), 1000);
     EXPECT_LE(window->minimumSizeHint().height(), 720);
+}
+
+TEST_F(TheDesignersWindow, FitsTheScreensThatPeopleHaveInEveryLanguage) {
+    // 1600x1000 at 150 %, and 1024x600, each without a task bar and a title.
+    constexpr QSize smallest(1024, 540);
+    for (const char* language : {"en", "de", "fr", "es"}) {
+        QTranslator translator;
+        ASSERT_TRUE(designer::loadCatalogue(translator, QLocale(QLatin1String(language))));
+        QCoreApplication::installTranslator(&translator);
+        open();
+        window->findChild<QDockWidget*>("eventsDock")->show();
+        QCoreApplication::processEvents();
+        const QSize least = window->minimumSizeHint();
+        EXPECT_LE(least.width(), smallest.width()) << language;
+        EXPECT_LE(least.height(), smallest.height()) << language;
+        window->resize(smallest);
+        QCoreApplication::processEvents();
+        EXPECT_EQ(window->size(), smallest) << language;
+        EXPECT_GE(window->drawing().height(), 240) << language;
+        QCoreApplication::removeTranslator(&translator);
+    }
 }

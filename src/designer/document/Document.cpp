@@ -35,6 +35,7 @@ void Document::setQuery(const platform::Ref<model::Query>& query) {
     mQuery = query;
     mKnown = model::Snapshot(*mQuery);
     mSteps->clear();
+    emit replaced();
     emit outdated();
     emit changed();
 }

@@ -27,7 +27,7 @@ public:
     /// Never nothing. Until the next setQuery() the same object; undone and done again in place.
     const platform::Ref<model::Query>& query() const { return mQuery; }
     /// Takes another query, or an empty one, with no steps to undo, as one that is saved. Emits
-    /// outdated() and changed().
+    /// replaced(), outdated() and changed().
     void setQuery(const platform::Ref<model::Query>& query);
 
     /// The steps made so far, after settle(); each has a name for the menu ("Delete table orders").
@@ -59,6 +59,8 @@ public:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 signals:
+    /// It is another query: what there was to say about the one before is past.
+    void replaced();
     /// The query says something else than before, whoever changed it.
     void changed();
     /// The control must show the query anew, for it was not the control that changed it.

@@ -53,7 +53,9 @@ int scrolled(int now, int extent, int begin, int end) {
     return end > now + extent ? end + model::layout::margin - extent : now;
 }
 
-void bringIntoView(ZandorWidget& control, const model::Table& table) {
+} // namespace
+
+void bringIntoView(ZandorWidget& control, const TalvikZandorLib::ZDTable& table) {
     const int width = control.width() * twipsPerPixel;
     // Output columns have the lower half.
     const int height = control.height() * twipsPerPixel / (control.OnlyJoin() ? 1 : 2);
@@ -64,8 +66,6 @@ void bringIntoView(ZandorWidget& control, const model::Table& table) {
     if (left != control.VisibleFrameLeft()) control.setVisibleFrameLeft(left);
     if (top != control.VisibleFrameTop()) control.setVisibleFrameTop(top);
 }
-
-} // namespace
 
 void showPlace(ZandorWidget& control, model::Query& query, const model::Finding& finding) {
     for (const auto& [table, column] : placesOf(query, finding)) {

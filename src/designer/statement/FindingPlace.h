@@ -12,4 +12,7 @@ namespace designer {
 /// becomes the grid's current one. Nothing happens when it is no longer in the query.
 void showPlace(ZandorWidget& control, model::Query& query, const model::Finding& finding);
 
+/// Scrolls the canvas by as little as it takes to show a table, or as much of it as goes in.
+void bringIntoView(ZandorWidget& control, const TalvikZandorLib::ZDTable& table);
+
 } // namespace designer

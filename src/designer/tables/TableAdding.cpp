@@ -7,6 +7,7 @@
 #include "designer/database/readTables.h"
 #include "designer/document/Document.h"
 #include "designer/statement/ModelWords.h"
+#include "designer/tables/leftOutWords.h"
 #include "designer/tables/placeTables.h"
 #include "model/reader/addTables.h"
 
@@ -34,7 +35,7 @@ std::vector<TableId> sourcesOf(model::Query& query) {
 } // namespace
 
 TableAdding::TableAdding(Document& document, Database& database, DrawingArea& area)
-    : QObject(&area), mDocument(document), mDatabase(database), mArea(area) {}
+    : QObject(&area), mDocument(document), mDatabase(database), mArea(area), mPlaces(document) {}
 
 void TableAdding::add(const std::vector<TableId>& tables, std::optional<QPoint> place) {
     if (tables.empty() || !mDatabase.isOpen()) return;
@@ -53,14 +54,26 @@ void TableAdding::add(const std::vector<TableId>& tables, std::optional<QPoint> 
     const QString step =
         tables.size() == 1 ? tr("Add table %1").arg(QString::fromStdU16String(tables.front().name))
                            : tr("Add %1 tables").arg(tables.size());
+    mDocument.settle();
+    const bool arranges = !place && mPlaces.areAll();
     QString last;
+    std::vector<reader::LeftOut> leftOut;
     mDocument.change(step, [&](model::Query& query) {
-        const auto added = reader::addTables(query, mDatabase.reader(), tables, canvasWidth());
+        const auto added =
+            reader::addTables(query, mDatabase.reader(), tables, canvasWidth(), &leftOut);
         if (!added) return; // it went well on the copy
         if (place) placeAt(query, *added, *place);
+        if (arranges) arrangeGrown(query, *added, canvasWidth());
         last = QString::fromStdU16String(added->back()->Name());
     });
+    if (arranges) mPlaces.note();
     if (!last.isEmpty()) emit added(last);
+    if (const QString what = leftOutWords(leftOut); !what.isEmpty()) emit noted(what);
+}
+
+void TableAdding::arrange() {
+    arrangeTables(mDocument, canvasWidth());
+    mPlaces.note();
 }
 
 /// Everything that adding asks for, so that it does not wait for the server then.

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "designer/database/Database.h"
+#include "designer/tables/OwnPlaces.h"
 
 #include <QPoint>
 
@@ -16,13 +17,21 @@ class TableAdding final : public QObject {
 public:
     TableAdding(Document& document, Database& database, DrawingArea& area);
 
-    /// As one step; at free places, or at a place on the canvas in twips, which then is the upper
-    /// left corner of the first. More tables or joins than the drawing takes are refused.
+    /// As one step; beside what they are joined to, or at a place on the canvas in twips, which
+    /// then is the upper left corner of the first. A drawing that nobody has arranged by hand is
+    /// arranged as it grows; of another no table is moved. More tables or joins than the drawing
+    /// takes are refused.
     void add(const std::vector<reader::TableId>& tables, std::optional<QPoint> place = {});
+    /// Lays all tables out anew, as one step, and from then on as the drawing grows.
+    void arrange();
+    /// All tables stand now where the designer has put them, and not a person.
+    void takeAsArranged() { mPlaces.note(); }
 
 signals:
     /// The tables are there; `name` is that of the last one in the query.
     void added(const QString& name);
+    /// One line on what of it one might have expected otherwise.
+    void noted(const QString& what);
     /// Nothing was added; one line says why.
     void refused(const QString& why);
 
@@ -35,6 +44,7 @@ private:
     Document& mDocument;
     Database& mDatabase;
     DrawingArea& mArea;
+    OwnPlaces mPlaces;
 };
 
 } // namespace designer

@@ -35,14 +35,25 @@ std::vector<model::layout::Link> linksAmong(model::Query& query, const Tables& t
     return links;
 }
 
-std::vector<Box> arranged(model::Query& query, const Tables& tables, int canvasWidth) {
+Tables tablesOf(model::Query& query) {
+    Tables tables;
+    for (const auto& each : Each<TalvikZandorLib::ZDTable>(query.Tables()))
+        tables.push_back(std::static_pointer_cast<model::Table>(each));
+    return tables;
+}
+
+std::vector<model::layout::Size> sizesOf(const Tables& tables) {
     std::vector<model::layout::Size> sizes;
     for (const auto& table : tables) {
         const model::layout::Size usual{2000, 2000}; // what the control gives a table without one
         const bool sized = table->Width() > 0 && table->Height() > 0;
         sizes.push_back(sized ? model::layout::Size{table->Width(), table->Height()} : usual);
     }
-    return model::layout::arrange(sizes, linksAmong(query, tables), {}, canvasWidth);
+    return sizes;
+}
+
+std::vector<Box> arranged(model::Query& query, const Tables& tables, int canvasWidth) {
+    return model::layout::arrange(sizesOf(tables), linksAmong(query, tables), {}, canvasWidth);
 }
 
 void move(model::Table& table, const Box& box, QPoint by) {
@@ -61,12 +72,23 @@ void placeAt(model::Query& query, const Tables& tables, QPoint place) {
         move(*tables[n], boxes[n], place - QPoint(model::layout::margin, model::layout::margin));
 }
 
+void arrangeGrown(model::Query& query, const Tables& added, int canvasWidth) {
+    const Tables tables = tablesOf(query);
+    std::vector<std::optional<model::layout::Place>> standing;
+    for (const auto& table : tables) {
+        standing.emplace_back();
+        if (std::find(added.begin(), added.end(), table) == added.end())
+            standing.back() = {table->Left(), table->Top()};
+    }
+    const auto boxes = model::layout::arrangeAgain(sizesOf(tables), linksAmong(query, tables),
+                                                   standing, canvasWidth);
+    for (std::size_t n = 0; n < tables.size(); ++n) move(*tables[n], boxes[n], {});
+}
+
 void arrangeTables(Document& document, int canvasWidth) {
     const auto name = QCoreApplication::translate("designer::TableAdding", "Arrange tables");
     document.change(name, [&](model::Query& query) {
-        Tables tables;
-        for (const auto& each : Each<TalvikZandorLib::ZDTable>(query.Tables()))
-            tables.push_back(std::static_pointer_cast<model::Table>(each));
+        const Tables tables = tablesOf(query);
         const auto boxes = arranged(query, tables, canvasWidth);
         for (std::size_t n = 0; n < tables.size(); ++n) move(*tables[n], boxes[n], {});
     });

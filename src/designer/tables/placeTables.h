@@ -13,6 +13,11 @@ class Document;
 void placeAt(model::Query& query, const std::vector<platform::Ref<model::Table>>& tables,
              QPoint place);
 
+/// Lays all tables of a query out by their joins, where `added` have come to others, which move no
+/// further than it is worth. Twips.
+void arrangeGrown(model::Query& query, const std::vector<platform::Ref<model::Table>>& added,
+                  int canvasWidth);
+
 /// Lays all tables of the document out anew by their joins, as one step. Twips.
 void arrangeTables(Document& document, int canvasWidth);
 
