@@ -40,6 +40,7 @@ namespace designer {
 namespace {
 
 constexpr QSize newSize(1340, 800); // logical pixels
+constexpr QSize frameSize(16, 40);  // what a desktop puts around a window, more or less
 constexpr int layoutVersion = 1;    // another number forgets where the panels were
 constexpr int mostOutputColumns = 255;
 constexpr int messageTime = 10'000; // milliseconds
@@ -72,7 +73,10 @@ DesignerWindow::DesignerWindow()
     makeMenus();
     connectParts();
     // Off screen there is no edge that a window could reach beyond.
-    resize(isOffscreen() ? newSize : newSize.boundedTo(screen()->availableSize()));
+    const QSize room = screen()->availableSize() - frameSize;
+    const bool large = isOffscreen() || newSize == newSize.boundedTo(room);
+    resize(large ? newSize : newSize.boundedTo(room));
+    if (!large) setWindowState(Qt::WindowMaximized);
     restoreLayout();
     showTitle();
     showCounts();
@@ -213,6 +217,22 @@ void DesignerWindow::makeMenus() {
         mTables->filterBox().setFocus();
         mTables->filterBox().selectAll();
     })->setShortcut(QKeySequence::Find);
+    // From anywhere to anywhere without a long row of Tabs.
+    QMenu* const go = view->addMenu(tr("&Go to"));
+    go->setObjectName(QStringLiteral("goMenu"));
+    command(go, tr("&Drawing"), "goDrawing", [this] {
+        mDrawing->control().setFocus(Qt::TabFocusReason);
+    })->setShortcut(Qt::CTRL | Qt::Key_1);
+    const auto goTo = [&](const QString& text, const char* name, Qt::Key key, QWidget* panel) {
+        command(go, text, name, [panel] {
+            panel->parentWidget()->show();
+            panel->parentWidget()->raise();
+            panel->setFocus(Qt::ShortcutFocusReason);
+        })->setShortcut(Qt::CTRL | key);
+    };
+    goTo(tr("&Tables"), "goTables", Qt::Key_2, mTables);
+    goTo(tr("&SQL"), "goStatement", Qt::Key_3, mStatement);
+    goTo(tr("&Rows"), "goResults", Qt::Key_4, mResults);
     view->addSeparator();
     const auto panel = [&](const QString& text, const char* name) {
         QAction* const action = findChild<QDockWidget*>(QLatin1String(name))->toggleViewAction();

@@ -3,6 +3,7 @@
 #include "designer/Colours.h"
 #include "designer/DesignerWindow.h"
 #include "designer/options/Languages.h"
+#include "designer/run/ResultsPanel.h"
 #include "designer/tables/RenameDialog.h"
 #include "platform/qt/CanvasItems.h"
 #include "platform/qt/GridModel.h"
@@ -19,6 +20,7 @@
 #include <QDockWidget>
 #include <QLabel>
 #include <QLineEdit>
+#include <QMenu>
 #include <QMessageBox>
 #include <QMimeData>
 #include <QStatusBar>
@@ -342,4 +344,24 @@ TEST_F(TheDesignersWindow, FitsTheScreensThatPeopleHaveInEveryLanguage) {
         EXPECT_GE(window->drawing().height(), 240) << language;
         QCoreApplication::removeTranslator(&translator);
     }
+}
+
+TEST_F(TheDesignersWindow, LeadsToEachOfItsPartsByAKey) {
+    open();
+    window->activateWindow();
+    const auto go = [&](const char* name) {
+        for (QAction* action : window->findChild<QMenu*>("goMenu")->actions())
+            if (action->objectName() == name) action->trigger();
+        QCoreApplication::processEvents();
+        return window->focusWidget();
+    };
+    const auto isIn = [&](const QWidget* focus, const char* dock) {
+        return focus && window->findChild<QDockWidget*>(dock)->isAncestorOf(focus);
+    };
+    window->findChild<QDockWidget*>("tablesDock")->hide();
+    EXPECT_TRUE(isIn(go("goTables"), "tablesDock"));
+    EXPECT_TRUE(isIn(go("goStatement"), "statementDock"));
+    EXPECT_TRUE(window->drawing().isAncestorOf(go("goDrawing")));
+    go("goResults");
+    EXPECT_TRUE(window->results().isVisible());
 }

@@ -77,6 +77,7 @@ void ResultsPanel::makeLayout() {
     mPages = new QStackedWidget(this);
     mPages->addWidget(makeMessagePage());
     mPages->addWidget(mTable);
+    setFocusProxy(mTable);
 
     mStatus = new QLabel(this);
     mStatus->setObjectName(QStringLiteral("runStatus"));

@@ -87,6 +87,7 @@ DrawingPicture::DrawingPicture(const model::Query& query, const QVariantMap& opt
     unselect(*copy);
     mControl->setAttribute(Qt::WA_DontShowOnScreen);
     mControl->setPalette(pagePalette());
+    mControl->setComforts(comforts::Flags::all()); // what they show is part of the drawing
     mControl->setDebugSwitch(0);
     for (auto option = options.begin(); option != options.end(); ++option)
         mControl->setProperty(option.key().toLatin1().constData(), option.value());

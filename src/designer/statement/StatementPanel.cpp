@@ -73,6 +73,7 @@ StatementPanel::StatementPanel(Document& document, QWidget* parent)
     layout->addLayout(top);
     layout->addWidget(parts, 1);
 
+    setFocusProxy(mView);
     mSoon.setSingleShot(true);
     connect(&mSoon, &QTimer::timeout, this, &StatementPanel::showNow);
     connect(&document, &Document::changed, this, &StatementPanel::queue);
