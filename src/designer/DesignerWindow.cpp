@@ -39,9 +39,9 @@ namespace designer {
 
 namespace {
 
-constexpr QSize newSize(1340, 800); // logical pixels
-constexpr QSize frameSize(16, 40);  // what a desktop puts around a window, more or less
-constexpr int layoutVersion = 1;    // another number forgets where the panels were
+constexpr QSize newSize(1340, 800);   // logical pixels
+constexpr QSize aroundWindow(16, 40); // what a desktop puts around a window, more or less
+constexpr int layoutVersion = 1;      // another number forgets where the panels were
 constexpr int mostOutputColumns = 255;
 constexpr int messageTime = 10'000; // milliseconds
 
@@ -73,7 +73,7 @@ DesignerWindow::DesignerWindow()
     makeMenus();
     connectParts();
     // Off screen there is no edge that a window could reach beyond.
-    const QSize room = screen()->availableSize() - frameSize;
+    const QSize room = screen()->availableSize() - aroundWindow;
     const bool large = isOffscreen() || newSize == newSize.boundedTo(room);
     resize(large ? newSize : newSize.boundedTo(room));
     if (!large) setWindowState(Qt::WindowMaximized);

@@ -97,8 +97,7 @@ TEST_F(TheWindowsCommands, PutColumnsOnTheGridAndBackInOneStep) {
     command("undo");
     EXPECT_THAT(fields(1), ElementsAre(""));
     command("redo");
-    // A control that is bound to the query anew names the columns without their table.
-    EXPECT_THAT(fields(4), ElementsAre("id", "customer_id", "ordered_at", ""));
+    EXPECT_THAT(fields(4), ElementsAre("orders.id", "orders.customer_id", "orders.ordered_at", ""));
     window->document().setModified(false);
 }
 

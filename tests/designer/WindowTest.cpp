@@ -103,12 +103,15 @@ TEST_F(TheDesignersWindow, ShowsTheOutputColumnsOfTheExample) {
     EXPECT_TRUE(part<GridWidget>("sprColumn").isVisible());
     EXPECT_THAT(gridColumn(0),
                 ElementsAre("Field:", "Synonym:", "Sort:", "Visible:", "Criteria:", "Or:"));
-    EXPECT_THAT(gridColumn(1),
-                ElementsAre("country_code", "country", "", "Visible", "= 'DE'", "= 'AT'"));
-    EXPECT_THAT(gridColumn(2), ElementsAre("ordered_at", "", "Ascending", "Visible", "", ""));
-    EXPECT_THAT(gridColumn(3), ElementsAre("quantity", "", "", "Visible", ">= 10", ">= 20"));
-    EXPECT_THAT(gridColumn(4), ElementsAre("unit_price", "", "", "Visible", "", ""));
-    EXPECT_THAT(gridColumn(5), ElementsAre("is_discontinued", "", "", "Invisible", "= 0", "= 0"));
+    EXPECT_THAT(gridColumn(1), ElementsAre("customers.country_code", "country", "", "Visible",
+                                           "= 'DE'", "= 'AT'"));
+    EXPECT_THAT(gridColumn(2),
+                ElementsAre("orders.ordered_at", "", "Ascending", "Visible", "", ""));
+    EXPECT_THAT(gridColumn(3),
+                ElementsAre("order_lines.quantity", "", "", "Visible", ">= 10", ">= 20"));
+    EXPECT_THAT(gridColumn(4), ElementsAre("order_lines.unit_price", "", "", "Visible", "", ""));
+    EXPECT_THAT(gridColumn(5),
+                ElementsAre("products.is_discontinued", "", "", "Invisible", "= 0", "= 0"));
     EXPECT_THAT(gridColumn(6), ElementsAre("", "", "", "", "", ""));
 }
 

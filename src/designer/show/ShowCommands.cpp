@@ -29,7 +29,7 @@ QString allColumnsKey() { return QStringLiteral("pictures/allColumns"); }
 ShowCommands::ShowCommands(Document& document, const QueryFile& file, const DrawingArea& area,
                            QSettings& settings, QWidget& window)
     : QObject(&window), exportPicture(tr("&Export drawing\u2026")), print(tr("&Print\u2026")),
-      copyPicture(tr("Copy as p&icture")), allColumns(tr("Pictures with all &columns")),
+      copyPicture(tr("Copy as p&icture")), allColumns(tr("Pictures &with all columns")),
       mDocument(document), mFile(file), mArea(area), mWindow(window) {
     allColumns.setObjectName(QStringLiteral("allColumns"));
     allColumns.setCheckable(true);
