@@ -109,7 +109,9 @@ void DesignerWindow::makePanels() {
     tabifyDockWidget(results, statement);
     events->hide();
     resizeDocks({findChild<QDockWidget*>(QStringLiteral("tablesDock"))}, {220}, Qt::Horizontal);
-    resizeDocks({statement}, {220}, Qt::Vertical);
+    // On a small screen the drawing needs the room more.
+    const int quarter = (isOffscreen() ? newSize.height() : screen()->availableSize().height()) / 4;
+    resizeDocks({statement}, {std::min(220, quarter)}, Qt::Vertical);
     for (const QAction* action : {mResults->runAction(), mResults->exportAction()})
         connect(action, &QAction::triggered, results, [results] {
             results->show();
@@ -222,6 +224,10 @@ void DesignerWindow::makeMenus() {
     go->setObjectName(QStringLiteral("goMenu"));
     command(go, tr("&Drawing"), "goDrawing", [this] {
         mDrawing->control().setFocus(Qt::TabFocusReason);
+        for (const auto& table :
+             platform::Each<TalvikZandorLib::ZDTable>(mDocument.query()->Tables()))
+            if (table->Selected() != 0)
+                mDrawing->control().SetCurrentTable(QString::fromStdU16String(table->Name()));
     })->setShortcut(Qt::CTRL | Qt::Key_1);
     const auto goTo = [&](const QString& text, const char* name, Qt::Key key, QWidget* panel) {
         command(go, text, name, [panel] {
