@@ -2,21 +2,19 @@
 #include "designer/DesignerWindow.h"
 #include "designer/Screen.h"
 #include "designer/document/AutosaveSlot.h"
+#include "designer/document/paths.h"
 #include "designer/options/Languages.h"
 #include "designer/show/DrawingPicture.h"
 #include "designer/show/savePicture.h"
+#include "designer/statement/ModelWords.h"
 #include "model/files/QueryDocument.h"
+#include "model/files/Replacement.h"
 
+#include <QBuffer>
 #include <QDir>
-#include <QFile>
 #include <QPixmap>
 
-#include <cstdio>
-
 namespace {
-
-constexpr int pictureFailed = 1;
-constexpr int unusable = 2;
 
 QStringList argumentsOf(int argc, char** argv) {
     QStringList arguments;
@@ -24,45 +22,46 @@ QStringList argumentsOf(int argc, char** argv) {
     return arguments;
 }
 
-void say(std::FILE* stream, const QString& text) {
-    std::fputs(text.toLocal8Bit().constData(), stream);
+int refuse(const QString& why) {
+    designer::shell::complain(why);
+    return designer::shell::unusable;
 }
 
-int refuse(const QString& why) {
-    say(stderr, QStringLiteral("zandor-designer: %1\n").arg(why));
-    return unusable;
+int failed(const QString& why) {
+    designer::shell::complain(why);
+    return designer::shell::failed;
 }
 
 /// Draws the tables and joins of a query's file into another file.
 int drawQuery(const designer::Arguments& arguments) {
-    const auto document = files::loadQuery(QFile::encodeName(arguments.drawing).toStdString());
+    const auto document = files::loadQuery(designer::pathOf(arguments.drawing));
     if (!document) return refuse(QString::fromStdString(document.error()));
     using designer::DrawingPicture;
     const DrawingPicture picture(*document->query, {},
                                  arguments.asShown ? DrawingPicture::Rows::asDrawn
                                                    : DrawingPicture::Rows::all);
     const auto error = designer::savePicture(picture, arguments.picture);
-    if (!error) return 0;
-    say(stderr, QStringLiteral("zandor-designer: %1\n").arg(*error));
-    return pictureFailed;
+    return error ? failed(*error) : designer::shell::allWell;
 }
 
 /// Draws a window that is shown into a file.
 int draw(designer::DesignerWindow& window, const QString& file) {
     QCoreApplication::processEvents();
-    if (window.grab().save(file, "PNG")) return 0;
-    say(stderr, QStringLiteral("zandor-designer: The picture \"%1\" cannot be written; check the "
-                               "folder and your permissions.\n")
-                    .arg(file));
-    return pictureFailed;
+    QBuffer png;
+    window.grab().save(&png, "PNG");
+    const auto error =
+        designer::inWords(files::replaceFile(designer::pathOf(file), png.data().toStdString()));
+    return error ? failed(*error) : designer::shell::allWell;
 }
 
 } // namespace
 
 int main(int argc, char** argv) {
     const QStringList given = argumentsOf(argc, argv);
-    if (designer::asksForHelp(given)) return say(stdout, designer::helpText()), 0;
-    if (designer::asksForVersion(given)) return say(stdout, designer::versionText()), 0;
+    if (designer::asksForHelp(given))
+        return designer::shell::print(designer::helpText().toLocal8Bit());
+    if (designer::asksForVersion(given))
+        return designer::shell::print(designer::versionText().toLocal8Bit());
 
     if (designer::asksForTask(given)) {
         const QCoreApplication application(argc, argv);
@@ -89,9 +88,9 @@ int main(int argc, char** argv) {
 
     const QString file = QDir::temp().filePath(QStringLiteral("zandor-designer.png"));
     const int result = draw(window, file);
-    if (result == 0)
-        say(stdout, QStringLiteral("No display can be reached; the window was drawn off screen:\n"
-                                   "%1\n")
-                        .arg(file));
-    return result;
+    if (result != designer::shell::allWell) return result;
+    return designer::shell::print(
+        QStringLiteral("No display can be reached; the window was drawn off screen:\n%1\n")
+            .arg(file)
+            .toLocal8Bit());
 }

@@ -122,8 +122,8 @@ TEST(TheDesignerProgram, DrawsDarkColoursWhenAskedTo) {
 TEST(TheDesignerProgram, EndsWithCodeOneWhenThePictureCannotBeWritten) {
     const Ended ended = run({"--screenshot", "/no/such/folder/window.png"});
     EXPECT_EQ(ended.code, 1);
-    EXPECT_EQ(ended.err, "zandor-designer: The picture \"/no/such/folder/window.png\" cannot be "
-                         "written; check the folder and your permissions.\n");
+    EXPECT_EQ(ended.err, "zandor-designer: The file \"/no/such/folder/window.png\" cannot be saved "
+                         "(No such file or directory); check the path.\n");
 }
 
 TEST(TheDesignerProgram, DrawsAPictureWhenThereIsNoDisplay) {

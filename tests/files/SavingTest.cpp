@@ -1,41 +1,40 @@
 #include "Files.h"
 
 #include "model/SmallQuery.h"
+#include "support/NoRoom.h"
 
-#include <sys/resource.h>
 #include <sys/stat.h>
-
-#include <csignal>
 
 namespace {
 
 namespace fs = std::filesystem;
-
-/// While it lives, no file of this process grows beyond a size: the disk is full, as it were.
-class NoRoom {
-public:
-    explicit NoRoom(rlim_t bytes) {
-        getrlimit(RLIMIT_FSIZE, &mBefore);
-        const rlimit little = {bytes, mBefore.rlim_max};
-        mSignal = std::signal(SIGXFSZ, SIG_IGN);
-        setrlimit(RLIMIT_FSIZE, &little);
-    }
-    ~NoRoom() {
-        setrlimit(RLIMIT_FSIZE, &mBefore);
-        std::signal(SIGXFSZ, mSignal);
-    }
-
-private:
-    rlimit mBefore = {};
-    void (*mSignal)(int) = nullptr;
-};
 
 std::string errorOfSaving(const fs::path& path, const files::QueryDocument& document) {
     const auto error = files::saveQuery(path, document);
     return error ? error->text : std::string();
 }
 
+class AQuerysFile : public WithoutRoom {};
+
 } // namespace
+
+TEST_P(AQuerysFile, StaysWhenThereIsNoRoomForAnother) {
+    SmallQuery small;
+    const fs::path path = folder() / "a.json";
+    ASSERT_EQ(errorOfSaving(path, small.query), "");
+    const std::string before = contentOf(path);
+    withoutRoom([&] {
+        for (int tables = 0; tables < 12; ++tables) {
+            small.query->addTable(SmallQuery::described(u"table" + platform::decimal(tables)));
+            ASSERT_NE(errorOfSaving(path, small.query).find(reason()), std::string::npos);
+            ASSERT_EQ(contentOf(path), before);
+        }
+    });
+    EXPECT_EQ(errorOfSaving(path, small.query), "");
+    EXPECT_TRUE(files::loadQuery(path));
+}
+
+ZANDOR_WITHOUT_ROOM(AQuerysFile);
 
 TEST(SavingAQuery, WritesAFileThatLoads) {
     const TemporaryFolder folder;
@@ -54,7 +53,7 @@ TEST(SavingAQuery, LeavesTheOldFileWholeAndNoOtherWhenTheDiskIsFull) {
     const std::string before = contentOf(folder / "a.json");
     small.query->addTable(SmallQuery::described(u"third"));
     {
-        const NoRoom noRoom(before.size() / 2);
+        const LittleRoom little(before.size() / 2);
         EXPECT_EQ(errorOfSaving(folder / "a.json", small.query),
                   "The file \"" + (folder / "a.json").string() +
                       "\" cannot be saved (File too large); choose another disk.");

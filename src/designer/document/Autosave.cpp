@@ -31,17 +31,18 @@ void Autosave::documentChanged() {
 }
 
 void Autosave::save() {
-    if (!mSlot) mSlot = AutosaveSlot::made(mFolder);
-    if (!mSlot) return tell(tr("the folder %1 cannot be written").arg(mFolder));
+    if (!mSlot) {
+        auto made = AutosaveSlot::made(mFolder);
+        if (!made) return tell(QString::fromStdString(made.error()));
+        mSlot = std::move(*made);
+    }
     const auto bytes = Autosaved{mFile.path(), mFile.content()}.bytes();
     if (!bytes) return tell(QString::fromStdString(bytes.error()));
     mWriter.start([this, file = mSlot->file(), content = *bytes] {
         const auto error = AutosaveSlot::write(file, content);
         QMetaObject::invokeMethod(this, [this, error] {
-            if (error)
-                tell(*error);
-            else
-                mFailed = false;
+            if (error) return tell(*error);
+            if (std::exchange(mFailed, false)) emit worked();
         });
     });
 }
@@ -50,12 +51,14 @@ void Autosave::remove() {
     mTimer.stop();
     mWriter.waitForDone();
     if (mSlot) mSlot->remove();
+    if (std::exchange(mFailed, false)) emit worked();
 }
 
 void Autosave::tell(const QString& reason) {
-    if (!std::exchange(mFailed, true))
-        emit failed(
-            tr("The query could not be saved for a recovery (%1); save it yourself.").arg(reason));
+    mFailed = true;
+    emit failed(tr("The changes cannot be kept safe in \"%1\" (%2); save the query yourself.")
+                    .arg(mFolder, reason));
+    if (mDocument.isModified()) mTimer.start(); // there may be room again
 }
 
 } // namespace designer

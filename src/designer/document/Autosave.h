@@ -30,8 +30,10 @@ public:
     void adopt(AutosaveSlot::Ptr slot);
 
 signals:
-    /// It could not be written: one line for the status bar. Told once until it works again.
+    /// It could not be written: one line. Told each time; it is tried again and again.
     void failed(const QString& message);
+    /// What failed works again, or there is nothing to keep any more.
+    void worked();
 
 private:
     void documentChanged();

@@ -1,10 +1,12 @@
 #include "designer/document/AutosaveSlot.h"
 
+#include "designer/document/paths.h"
+#include "model/files/Replacement.h"
+
 #include <QDir>
 #include <QFileInfo>
 #include <QJsonDocument>
 #include <QJsonObject>
-#include <QSaveFile>
 #include <QStandardPaths>
 #include <QUuid>
 
@@ -44,12 +46,18 @@ AutosaveSlot::AutosaveSlot(const QString& file)
     mLock.setStaleLockTime(0);
 }
 
-AutosaveSlot::Ptr AutosaveSlot::made(const QString& folder) {
-    if (!QDir().mkpath(folder)) return {};
+files::Result<AutosaveSlot::Ptr> AutosaveSlot::made(const QString& folder) {
+    std::error_code code;
+    std::filesystem::create_directories(pathOf(folder), code);
+    if (code) return files::Error{code.message()};
     QFile::setPermissions(folder, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
     const QString name = QUuid::createUuid().toString(QUuid::WithoutBraces) + suffix;
     Ptr slot(new AutosaveSlot(QDir(folder).filePath(name)));
-    return slot->mLock.tryLock(0) ? std::move(slot) : Ptr();
+    if (slot->mLock.tryLock(0)) return slot;
+    // What keeps the lock from being written keeps any file from it, and has a name there.
+    const auto why = write(slot->mFile, QByteArray(1, ' '));
+    slot->remove();
+    return files::Error{why.value_or(QStringLiteral("no lock")).toStdString()};
 }
 
 std::vector<AutosaveSlot::Ptr> AutosaveSlot::abandoned(const QString& folder) {
@@ -76,10 +84,9 @@ std::optional<Autosaved> AutosaveSlot::read() const {
 }
 
 std::optional<QString> AutosaveSlot::write(const QString& file, const QByteArray& bytes) {
-    QSaveFile saving(file);
-    if (saving.open(QIODevice::WriteOnly) && saving.write(bytes) == bytes.size() && saving.commit())
-        return {};
-    return saving.errorString();
+    const auto error = files::replaceFile(pathOf(file), bytes.toStdString());
+    if (!error) return {};
+    return QString::fromStdString(error->reason.empty() ? error->text : error->reason);
 }
 
 void AutosaveSlot::remove() { QFile::remove(mFile); }

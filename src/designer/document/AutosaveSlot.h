@@ -31,8 +31,9 @@ public:
 
     /// Where the designer keeps them: below QStandardPaths::AppDataLocation, in "autosave".
     static QString standardFolder();
-    /// A new one, without its file yet; the folder is made for the user alone.
-    static Ptr made(const QString& folder);
+    /// A new one, without its file yet; the folder is made for the user alone. The error is what
+    /// the system said.
+    static files::Result<Ptr> made(const QString& folder);
     /// Those with a file that no running process holds, the newest first: what designers left
     /// behind that were killed.
     static std::vector<Ptr> abandoned(const QString& folder);
@@ -40,8 +41,8 @@ public:
     const QString& file() const { return mFile; }
     QDateTime saved() const;
     std::optional<Autosaved> read() const;
-    /// Replaces the file in one step. May be called from another thread; the error's text or
-    /// nothing.
+    /// Replaces the file in one step. May be called from another thread; what the system said when
+    /// it could not, or nothing.
     static std::optional<QString> write(const QString& file, const QByteArray& bytes);
     void remove();
 

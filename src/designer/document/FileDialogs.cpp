@@ -3,6 +3,7 @@
 #include "designer/document/Document.h"
 #include "designer/document/QueryFile.h"
 #include "designer/document/RecentFiles.h"
+#include "designer/statement/ModelWords.h"
 
 #include <QFileDialog>
 #include <QFileInfo>
@@ -99,7 +100,7 @@ bool FileDialogs::saveTo(const QString& path) {
 }
 
 void FileDialogs::tell(const QString& title, const QString& error) {
-    QMessageBox::warning(&mWindow, title, error);
+    QMessageBox::warning(&mWindow, title, inWords(error));
 }
 
 } // namespace designer

@@ -2,17 +2,11 @@
 
 #include "designer/database/Address.h"
 #include "designer/document/Document.h"
+#include "designer/document/paths.h"
 
-#include <QFile>
 #include <QFileInfo>
 
 namespace designer {
-
-namespace {
-
-files::Path pathOf(const QString& path) { return QFile::encodeName(path).toStdString(); }
-
-} // namespace
 
 QueryFile::QueryFile(Document& document, QObject* parent) : QObject(parent), mDocument(document) {}
 

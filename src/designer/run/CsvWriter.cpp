@@ -1,6 +1,6 @@
 #include "designer/run/CsvWriter.h"
 
-#include "designer/run/writeAll.h"
+#include "designer/statement/ModelWords.h"
 
 #include <algorithm>
 
@@ -50,9 +50,9 @@ std::optional<QString> CsvWriter::finish() { return {}; }
 
 std::optional<QString> CsvWriter::writeLine() {
     mLine += "\r\n";
-    const auto error = writeAll(mDevice, mLine);
+    const auto error = mOutput.write({mLine.constData(), std::size_t(mLine.size())});
     mLine.resize(0); // and keeps its room
-    return error;
+    return inWords(error);
 }
 
 } // namespace designer

@@ -1,8 +1,7 @@
 #pragma once
 
 #include "designer/run/fetch.h"
-
-class QIODevice;
+#include "model/files/Output.h"
 
 namespace designer {
 
@@ -10,8 +9,8 @@ namespace designer {
 /// is empty, an empty text a pair of quotes, a blob in Base64.
 class CsvWriter final : public Sink {
 public:
-    /// The device is open for writing and outlives the writer.
-    explicit CsvWriter(QIODevice& device) : mDevice(device) {}
+    /// The output outlives the writer.
+    explicit CsvWriter(files::Output& output) : mOutput(output) {}
 
     std::optional<QString> begin(const QStringList& columns) override;
     std::optional<QString> add(const Row& row) override;
@@ -20,7 +19,7 @@ public:
 private:
     std::optional<QString> writeLine();
 
-    QIODevice& mDevice;
+    files::Output& mOutput;
     QByteArray mLine;
 };
 

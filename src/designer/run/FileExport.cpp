@@ -1,26 +1,16 @@
 #include "designer/run/FileExport.h"
 
-#include <QCoreApplication>
+#include "designer/statement/ModelWords.h"
 
 namespace designer {
 
 std::optional<QString> FileExport::begin(const QStringList& columns) {
-    if (!mFile.open(QIODevice::WriteOnly)) return complain();
+    if (const auto error = mFile.open()) return inWords(error);
     return mWriter.begin(columns);
 }
 
 std::optional<QString> FileExport::add(const Row& row) { return mWriter.add(row); }
 
-std::optional<QString> FileExport::finish() {
-    if (!mFile.commit()) return complain();
-    return {};
-}
-
-std::optional<QString> FileExport::complain() const {
-    return QCoreApplication::translate("designer::FileExport",
-                                       "The file \"%1\" cannot be written (%2): check the folder "
-                                       "and your permissions.")
-        .arg(mFile.fileName(), mFile.errorString());
-}
+std::optional<QString> FileExport::finish() { return inWords(mFile.commit()); }
 
 } // namespace designer

@@ -1,8 +1,8 @@
 #pragma once
 
+#include "designer/document/paths.h"
 #include "designer/run/CsvWriter.h"
-
-#include <QSaveFile>
+#include "model/files/Replacement.h"
 
 namespace designer {
 
@@ -10,16 +10,14 @@ namespace designer {
 /// it; until then one that was there before stays.
 class FileExport final : public Sink {
 public:
-    explicit FileExport(const QString& path) : mFile(path), mWriter(mFile) {}
+    explicit FileExport(const QString& path) : mFile(pathOf(path)), mWriter(mFile) {}
 
     std::optional<QString> begin(const QStringList& columns) override;
     std::optional<QString> add(const Row& row) override;
     std::optional<QString> finish() override;
 
 private:
-    std::optional<QString> complain() const;
-
-    QSaveFile mFile;
+    files::Replacement mFile;
     CsvWriter mWriter;
 };
 

@@ -1,6 +1,6 @@
 #include "designer/run/JsonWriter.h"
 
-#include "designer/run/writeAll.h"
+#include "designer/statement/ModelWords.h"
 
 #include <nlohmann/json.hpp>
 
@@ -41,7 +41,7 @@ std::optional<QString> JsonWriter::begin(const QStringList& columns) {
         names << name;
         mNames.push_back(quoted(name.toUtf8()) + ": ");
     }
-    return writeAll(mDevice, "[");
+    return write("[");
 }
 
 std::optional<QString> JsonWriter::add(const Row& row) {
@@ -54,9 +54,13 @@ std::optional<QString> JsonWriter::add(const Row& row) {
         mLine += written(row[i]);
     }
     mLine += '}';
-    return writeAll(mDevice, mLine);
+    return write({mLine.constData(), std::size_t(mLine.size())});
 }
 
-std::optional<QString> JsonWriter::finish() { return writeAll(mDevice, mAny ? "\n]\n" : "]\n"); }
+std::optional<QString> JsonWriter::finish() { return write(mAny ? "\n]\n" : "]\n"); }
+
+std::optional<QString> JsonWriter::write(std::string_view bytes) {
+    return inWords(mOutput.write(bytes));
+}
 
 } // namespace designer

@@ -1,8 +1,7 @@
 #pragma once
 
 #include "designer/run/fetch.h"
-
-class QIODevice;
+#include "model/files/Output.h"
 
 namespace designer {
 
@@ -10,15 +9,17 @@ namespace designer {
 /// columns with one name the later ones get "_2", "_3" behind it.
 class JsonWriter final : public Sink {
 public:
-    /// The device is open for writing and outlives the writer.
-    explicit JsonWriter(QIODevice& device) : mDevice(device) {}
+    /// The output outlives the writer.
+    explicit JsonWriter(files::Output& output) : mOutput(output) {}
 
     std::optional<QString> begin(const QStringList& columns) override;
     std::optional<QString> add(const Row& row) override;
     std::optional<QString> finish() override;
 
 private:
-    QIODevice& mDevice;
+    std::optional<QString> write(std::string_view bytes);
+
+    files::Output& mOutput;
     std::vector<QByteArray> mNames; ///< with quotes and colon
     QByteArray mLine;
     bool mAny = false;

@@ -1,12 +1,19 @@
 #include "designer/run/Spool.h"
 
-#include "designer/run/writeAll.h"
+#include "designer/document/paths.h"
+#include "designer/statement/ModelWords.h"
 
 #include <QCoreApplication>
-#include <QDataStream>
 #include <QDir>
 #include <QFileInfo>
 #include <QStorageInfo>
+
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdlib>
+#include <cstring>
 
 namespace designer {
 
@@ -40,16 +47,73 @@ QString shortened(const QByteArray& text) {
     return QString::fromUtf8(text.left(std::max<qsizetype>(end - 1, 0))) + u'\u2026';
 }
 
-bool read(QIODevice& device, Cell& cell, qint64 mostBytes) {
+/// A file of no name, that nobody else can open and that no end of the process leaves behind.
+files::Descriptor namelessFile(const QString& folder) {
+    const files::Path path = pathOf(folder);
+    constexpr mode_t owner = 0600;
+#ifdef O_TMPFILE
+    files::Descriptor file(::open(path.c_str(), O_TMPFILE | O_RDWR | O_CLOEXEC, owner));
+    if (file.isOpen()) return file;
+#endif
+    // Not every file system can do that.
+    std::string name = path / "zandor-rows-XXXXXX";
+    files::Descriptor named(::mkostemp(name.data(), O_CLOEXEC));
+    if (named.isOpen()) ::unlink(name.c_str());
+    return named;
+}
+
+/// Reads a file from a place on, without moving the place where others read and write.
+class Reading {
+public:
+    Reading(int file, qint64 from) : mFile(file), mNext(from) {}
+
+    bool read(char* into, qint64 bytes) {
+        while (bytes > 0) {
+            if (mPlace == mPiece.size() && !fetch()) return false;
+            const qint64 taken = std::min<qint64>(bytes, mPiece.size() - mPlace);
+            std::memcpy(into, mPiece.constData() + mPlace, static_cast<std::size_t>(taken));
+            mPlace += taken;
+            into += taken;
+            bytes -= taken;
+        }
+        return true;
+    }
+    void skip(qint64 bytes) {
+        const qint64 here = std::min<qint64>(bytes, mPiece.size() - mPlace);
+        mPlace += here;
+        mNext += bytes - here;
+    }
+
+private:
+    bool fetch() {
+        constexpr qsizetype piece = 1 << 16;
+        mPiece.resize(piece);
+        mPlace = 0;
+        ssize_t count = 0;
+        do count = ::pread(mFile, mPiece.data(), piece, mNext);
+        while (count < 0 && errno == EINTR);
+        mPiece.resize(std::max<ssize_t>(count, 0));
+        mNext += mPiece.size();
+        return count > 0;
+    }
+
+    const int mFile;
+    qint64 mNext;
+    QByteArray mPiece;
+    qsizetype mPlace = 0;
+};
+
+bool read(Reading& file, Cell& cell, qint64 mostBytes) {
     char kind = 0;
-    if (!device.getChar(&kind)) return false;
+    if (!file.read(&kind, 1)) return false;
     cell.kind = static_cast<Cell::Kind>(kind);
     if (cell.kind == Cell::Kind::null) return true;
     quint32 size = 0;
-    if (device.read(reinterpret_cast<char*>(&size), sizeof size) != sizeof size) return false;
+    if (!file.read(reinterpret_cast<char*>(&size), sizeof size)) return false;
     const qint64 taken = std::min<qint64>(size, mostBytes);
-    const QByteArray text = device.read(taken);
-    if (text.size() != taken || device.skip(size - taken) != size - taken) return false;
+    QByteArray text(taken, Qt::Uninitialized);
+    if (!file.read(text.data(), taken)) return false;
+    file.skip(size - taken);
     cell.text = taken == size ? QString::fromUtf8(text) : shortened(text);
     return true;
 }
@@ -59,14 +123,12 @@ bool read(QIODevice& device, Cell& cell, qint64 mostBytes) {
 std::optional<QString> Spool::begin(const QStringList& columns) {
     const std::lock_guard lock(mMutex);
     mColumns = columns;
-    mFile.setFileTemplate(QDir(folder()).filePath(QStringLiteral("zandor-rows-XXXXXX")));
-    // Not through a buffer, so that a page can be read as soon as it is written.
-    if (static_cast<QIODevice&>(mFile).open(QIODevice::ReadWrite | QIODevice::Unbuffered))
-        return {};
+    mFile = namelessFile(folder());
+    if (mFile.isOpen()) return {};
     return QCoreApplication::translate("designer::Spool",
                                        "No file for the rows can be made in \"%1\" (%2): set "
                                        "TMPDIR to a folder that you may write to.")
-        .arg(folder(), mFile.errorString());
+        .arg(folder(), qt_error_string(errno));
 }
 
 std::optional<QString> Spool::add(const Row& row) {
@@ -104,11 +166,10 @@ std::vector<Row> Spool::page(qint64 number, qint64 mostBytes) {
     const auto count = static_cast<std::size_t>(std::min(rowsInAPage, mReadable - first));
     const qint64 begin = mPages[static_cast<std::size_t>(number)];
     const auto columns = static_cast<std::size_t>(mColumns.size());
-    QFile file(mFile.fileName());
+    Reading file(mFile.number(), begin);
     lock.unlock();
 
     std::vector<Row> rows(count, Row(columns));
-    if (!file.open(QIODevice::ReadOnly) || !file.seek(begin)) return {};
     for (Row& row : rows)
         for (Cell& cell : row)
             if (!read(file, cell, mostBytes)) return {};
@@ -119,17 +180,23 @@ std::optional<QString> Spool::flush() {
     if (mFailure || mPending.isEmpty()) return mFailure;
     if (mEnd >= mNextLook) {
         mNextLook = mEnd + betweenLooks;
-        if (QStorageInfo(QFileInfo(mFile.fileName()).path()).bytesAvailable() < roomLeftToOthers)
+        if (QStorageInfo(folder()).bytesAvailable() < roomLeftToOthers)
             mFailure = QCoreApplication::translate(
                            "designer::Spool",
                            "The rows would fill the disk with the folder \"%1\": make room there, "
                            "or ask for fewer rows.")
                            .arg(folder());
     }
-    if (!mFailure) mFailure = writeAll(mFile, mPending);
+    if (!mFailure) mFailure = written();
     if (!mFailure) mReadable = mRows;
     mPending.resize(0); // and keeps its room
     return mFailure;
+}
+
+std::optional<QString> Spool::written() const {
+    const std::string_view bytes(mPending.constData(), static_cast<std::size_t>(mPending.size()));
+    if (files::writeAll(mFile.number(), bytes)) return {};
+    return inWords(files::systemError("The rows cannot be written", errno));
 }
 
 } // namespace designer

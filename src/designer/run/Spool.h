@@ -1,8 +1,7 @@
 #pragma once
 
 #include "designer/run/fetch.h"
-
-#include <QTemporaryFile>
+#include "model/files/Descriptor.h"
 
 #include <mutex>
 
@@ -32,12 +31,13 @@ public:
 
 private:
     std::optional<QString> flush();
+    std::optional<QString> written() const;
 
     mutable std::mutex mMutex;
     QStringList mColumns;
-    QTemporaryFile mFile;
-    QByteArray mPending;        ///< not in the file yet
-    qint64 mEnd = 0;            ///< of the file and what is pending
+    files::Descriptor mFile; ///< that has no name: it is gone with the process, however that ends
+    QByteArray mPending;     ///< not in the file yet
+    qint64 mEnd = 0;         ///< of the file and what is pending
     qint64 mNextLook = 1 << 26; ///< at the room on the disk: when so much is written
     qint64 mRows = 0;
     qint64 mReadable = 0;       ///< those in the file

@@ -1,8 +1,11 @@
 #include "designer/shell/Task.h"
 
 #include "designer/shell/Words.h"
+#include "designer/statement/ModelWords.h"
 
 #include <QCommandLineParser>
+
+#include <unistd.h>
 
 #include <cstdio>
 #include <utility>
@@ -95,6 +98,21 @@ reader::Result<std::optional<Task>> taskOf(const QCommandLineParser& parser) {
 
 int perform(const Task& task) {
     return task.kind == Task::Kind::printStatement ? printStatement(task) : runQuery(task);
+}
+
+int print(const QByteArray& text) {
+    files::Stream out = standardOutput();
+    auto error = out.write({text.constData(), std::size_t(text.size())});
+    if (!error) error = out.flush();
+    if (!error) return allWell;
+    complain(*inWords(error));
+    return unusable;
+}
+
+files::Stream standardOutput() {
+    // On a terminal one sees each row as it comes.
+    return {STDOUT_FILENO, "The output cannot be written",
+            isatty(STDOUT_FILENO) ? files::Stream::nothingWaits : files::Stream::usuallyWaiting};
 }
 
 void complain(const QString& what) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "model/files/Output.h"
 #include "model/reader/Result.h"
 #include "model/sql/Dialect.h"
 
@@ -40,10 +41,15 @@ int perform(const Task& task);
 // What perform() is made of.
 int printStatement(const Task& task);
 int runQuery(const Task& task);
+files::Stream standardOutput();
 
 inline constexpr int allWell = 0;
 inline constexpr int failed = 1;   ///< the statement could not be written or run
 inline constexpr int unusable = 2; ///< arguments, a file or the database
+
+/// Writes to the standard output stream; what could not be written is complained about. Returns the
+/// exit code.
+int print(const QByteArray& text);
 
 /// Writes a line to the standard error stream, with the program's name before it.
 void complain(const QString& what);

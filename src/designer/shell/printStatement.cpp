@@ -1,11 +1,8 @@
 #include "designer/database/Address.h"
+#include "designer/document/paths.h"
 #include "designer/shell/Task.h"
 #include "model/files/QueryDocument.h"
 #include "model/sql/Builder.h"
-
-#include <QFile>
-
-#include <cstdio>
 
 namespace designer::shell {
 
@@ -28,7 +25,7 @@ Dialect dialectFor(const QString& database) {
 } // namespace
 
 int printStatement(const Task& task) {
-    const auto document = files::loadQuery(QFile::encodeName(task.query).toStdString());
+    const auto document = files::loadQuery(pathOf(task.query));
     if (!document) return complain(QString::fromStdString(document.error())), unusable;
     const Dialect dialect =
         task.dialect ? *task.dialect : dialectFor(QString::fromStdU16String(document->database));
@@ -37,8 +34,7 @@ int printStatement(const Task& task) {
         complain(QString::fromStdU16String(finding.text));
     // One with something left out would not say what was drawn.
     if (!text.runnable()) return failed;
-    std::fputs((platform::toUtf8(text.text) + '\n').c_str(), stdout);
-    return std::fflush(stdout) == 0 ? allWell : unusable;
+    return print(QByteArray::fromStdString(platform::toUtf8(text.text)) + '\n');
 }
 
 } // namespace designer::shell

@@ -1,18 +1,16 @@
 #include "designer/database/Address.h"
+#include "designer/document/paths.h"
 #include "designer/run/CsvWriter.h"
 #include "designer/run/JsonWriter.h"
 #include "designer/shell/Task.h"
 #include "designer/shell/Words.h"
 #include "designer/shell/askPassword.h"
+#include "designer/statement/ModelWords.h"
 #include "model/files/QueryDocument.h"
 #include "model/reader/dialectOf.h"
 #include "model/reader/serverError.h"
 
-#include <QFile>
-
 #include <csignal>
-
-#include <unistd.h>
 
 namespace designer::shell {
 
@@ -97,15 +95,15 @@ int exitCode(const Outcome& outcome) {
     return unusable;
 }
 
-std::unique_ptr<Sink> makeWriter(Format format, QIODevice& device) {
-    if (format == Format::json) return std::make_unique<JsonWriter>(device);
-    return std::make_unique<CsvWriter>(device);
+std::unique_ptr<Sink> makeWriter(Format format, files::Output& out) {
+    if (format == Format::json) return std::make_unique<JsonWriter>(out);
+    return std::make_unique<CsvWriter>(out);
 }
 
 } // namespace
 
 int runQuery(const Task& task) {
-    const auto document = files::loadQuery(QFile::encodeName(task.query).toStdString());
+    const auto document = files::loadQuery(pathOf(task.query));
     if (!document) return complain(QString::fromStdString(document.error())), unusable;
     const QString address =
         task.database.isEmpty() ? QString::fromStdU16String(document->database) : task.database;
@@ -125,17 +123,14 @@ int runQuery(const Task& task) {
     if (const auto wrong = complaint(questions(text), task.values))
         return complain(*wrong), unusable;
 
-    QFile out;
-    // On a terminal one sees each row as it comes.
-    const auto buffering = isatty(STDOUT_FILENO) ? QIODevice::Unbuffered : QIODevice::NotOpen;
-    if (!out.open(STDOUT_FILENO, QIODevice::WriteOnly | buffering))
-        return complain(out.errorString()), unusable;
+    files::Stream out = standardOutput();
     const auto command = makeCommand(text, opened->dialect, task.values, task.limit);
     const auto writer = makeWriter(task.format, out);
     const Outcome outcome = fetch(opened->connector, command, *writer, stopWished);
-    const bool written = out.flush() && out.error() == QFileDevice::NoError;
-    if (!written && outcome.end == Outcome::End::complete)
-        return complain(out.errorString()), unusable;
+    const auto unwritten = out.flush();
+    const bool ended =
+        outcome.end == Outcome::End::complete || outcome.end == Outcome::End::limited;
+    if (unwritten && ended) return complain(*inWords(unwritten)), unusable;
     return exitCode(outcome);
 }
 

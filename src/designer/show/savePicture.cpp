@@ -1,6 +1,9 @@
 #include "designer/show/savePicture.h"
 
+#include "designer/document/paths.h"
 #include "designer/show/DrawingPicture.h"
+#include "designer/statement/ModelWords.h"
+#include "model/files/Replacement.h"
 
 #include <QBuffer>
 #include <QCoreApplication>
@@ -10,7 +13,6 @@
 #include <QPainter>
 #include <QPdfWriter>
 #include <QPrinter>
-#include <QSaveFile>
 
 namespace designer {
 
@@ -59,12 +61,10 @@ std::optional<QString> savePicture(const DrawingPicture& picture, const QString&
     content.open(QIODevice::WriteOnly);
     const bool drawn = write(picture, content);
     content.close();
-    QSaveFile file(path);
-    if (!drawn || !file.open(QIODevice::WriteOnly) ||
-        file.write(content.data()) != content.data().size() || !file.commit())
-        return tr("The picture \"%1\" cannot be written; check the folder and your permissions.")
+    if (!drawn)
+        return tr("The drawing is too large for \"%1\"; choose a name that ends in .svg.")
             .arg(path);
-    return {};
+    return inWords(files::replaceFile(pathOf(path), content.data().toStdString()));
 }
 
 std::optional<QString> printPicture(const DrawingPicture& picture, QPrinter& printer) {

@@ -131,11 +131,27 @@ constexpr const char* messages[] = {
                                "mode also needs permission to write to the folder"),
     QT_TRANSLATE_NOOP("Model", "the file is damaged; restore it from a copy"),
     QT_TRANSLATE_NOOP("Model", "it is damaged or encrypted; choose another file"),
+    // files (what the system said); what to do
+    QT_TRANSLATE_NOOP("Model", "\"%1\" is not a file; choose another name."),
+    QT_TRANSLATE_NOOP("Model", "\"%1\" is not a file; choose a query file."),
+    QT_TRANSLATE_NOOP("Model", "The file \"%1\" is write-protected; save under another name."),
+    QT_TRANSLATE_NOOP("Model", "%1 (%2); %3."),
+    QT_TRANSLATE_NOOP("Model", "The file \"%1\" cannot be saved"),
+    QT_TRANSLATE_NOOP("Model", "The file \"%1\" cannot be read"),
+    QT_TRANSLATE_NOOP("Model", "The output cannot be written"),
+    QT_TRANSLATE_NOOP("Model", "The rows cannot be written"),
+    QT_TRANSLATE_NOOP("Model", "check the path"),
+    QT_TRANSLATE_NOOP("Model", "ask the owner for permission, or choose another folder"),
+    QT_TRANSLATE_NOOP("Model", "make room on the disk, or choose another one"),
+    QT_TRANSLATE_NOOP("Model", "choose another disk"),
+    QT_TRANSLATE_NOOP("Model", "choose a folder on another disk"),
+    QT_TRANSLATE_NOOP("Model", "try again, or choose another folder"),
 };
 
 /// Whether what was put into a message may be messages of their own.
 bool nests(QLatin1String english) {
-    return english.endsWith(QLatin1String(": %3.")) || english.endsWith(QLatin1String("holds %1"));
+    return english.endsWith(QLatin1String(": %3.")) || english.endsWith(QLatin1String("; %3.")) ||
+           english.endsWith(QLatin1String("holds %1"));
 }
 
 /// A message as it is recognised: its own text around what was put into it.
@@ -188,6 +204,11 @@ QString inWords(const QString& message) {
         return filled(QCoreApplication::translate("Model", english), texts);
     }
     return message;
+}
+
+std::optional<QString> inWords(const std::optional<files::Error>& error) {
+    if (!error) return {};
+    return inWords(QString::fromStdString(error->text));
 }
 
 QStringList knownMessages() {

@@ -1,23 +1,15 @@
 #pragma once
 
 #include "model/Query.h"
-#include "model/Result.h"
+#include "model/files/Error.h"
 
-#include <filesystem>
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 
 /// Queries as files. The format is described in docs/file-format.md.
 namespace files {
-
-/// What went wrong, where, and what to do about it: one line of UTF-8, ready to be shown to a user.
-struct Error {
-    std::string text;
-};
-
-template <class T>
-using Result = model::Result<T, Error>;
 
 /// What a file has beyond what this version knows.
 struct Unknown;
@@ -48,12 +40,8 @@ Result<std::string> toJson(const QueryDocument& document);
 /// and says in which line or under which JSON pointer the fault is.
 Result<QueryDocument> fromJson(std::string_view text);
 
-/// The path of the file as saved or loaded.
-using Path = std::filesystem::path;
-
-/// Writes a file beside the old one and puts it in the old one's place when all of it is on the
-/// disk; on a failure the old file is as it was and no other is left. A link stays a link, and the
-/// file's permissions stay. Nothing on success.
+/// Writes the file as a Replacement: on a failure the old file is as it was and no other is left.
+/// Nothing on success.
 std::optional<Error> saveQuery(const Path& path, const QueryDocument& document);
 
 Result<QueryDocument> loadQuery(const Path& path);

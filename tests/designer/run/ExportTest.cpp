@@ -87,6 +87,8 @@ TEST_F(Exporting, LeavesNoHalfFileWhenItIsCancelled) {
 TEST_F(Exporting, SaysWhenTheFileCannotBeWritten) {
     const Outcome outcome = run(draw(database, {"numbers"}), "/no/such/folder/a.csv");
     EXPECT_EQ(outcome.end, Outcome::End::refused);
-    EXPECT_THAT(outcome.message.toStdString(),
-                HasSubstr("The file \"/no/such/folder/a.csv\" cannot be written ("));
+    EXPECT_THAT(
+        outcome.message.toStdString(),
+        HasSubstr(
+            "The file \"/no/such/folder/a.csv\" cannot be saved (No such file or directory)"));
 }

@@ -1,6 +1,11 @@
+#include "support/NoRoom.h"
+
 #include "designer/run/Spool.h"
 
 #include <gtest/gtest.h>
+
+#include <QDir>
+#include <QTemporaryDir>
 
 #include <limits>
 #include <thread>
@@ -80,4 +85,29 @@ TEST(TheSpool, CanBeReadWhileRowsAreComing) {
         ASSERT_EQ(page[0], numbered(static_cast<int>(last * Spool::rowsInAPage)));
     }
     writing.join();
+}
+
+TEST(TheSpool, HasAFileOfNoNameThatIsGoneWithTheProcessHoweverThatEnds) {
+    const QTemporaryDir folder;
+    const QByteArray before = qgetenv("TMPDIR");
+    qputenv("TMPDIR", folder.path().toLocal8Bit());
+    {
+        Spool spool;
+        fill(spool, 100'000);
+        EXPECT_EQ(spool.rows(), 100'000);
+        EXPECT_EQ(
+            QDir(folder.path()).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
+            QStringList());
+        EXPECT_EQ(spool.page(300, all)[7], numbered(300 * 256 + 7));
+    }
+    before.isNull() ? qunsetenv("TMPDIR") : qputenv("TMPDIR", before);
+}
+
+TEST(TheSpool, SaysWhyItHasNoRoom) {
+    Spool spool;
+    ASSERT_FALSE(spool.begin({"n", "text"}));
+    const LittleRoom none(0);
+    ASSERT_FALSE(spool.add(numbered(1))) << "it waits for others";
+    EXPECT_EQ(spool.finish().value_or(""),
+              "The rows cannot be written (File too large); choose another disk.");
 }

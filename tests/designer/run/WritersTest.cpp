@@ -3,23 +3,31 @@
 
 #include <gtest/gtest.h>
 
-#include <QBuffer>
-
 using designer::Cell;
 using designer::Row;
 using Kind = designer::Cell::Kind;
 
 namespace {
 
+class Memory final : public files::Output {
+public:
+    std::optional<files::Error> write(std::string_view bytes) override {
+        content += bytes;
+        return {};
+    }
+    std::optional<files::Error> flush() override { return {}; }
+
+    std::string content;
+};
+
 template <class Writer>
 std::string written(const QStringList& columns, const std::vector<Row>& rows) {
-    QBuffer buffer;
-    buffer.open(QIODevice::WriteOnly);
-    Writer writer(buffer);
+    Memory memory;
+    Writer writer(memory);
     EXPECT_FALSE(writer.begin(columns));
     for (const Row& row : rows) EXPECT_FALSE(writer.add(row));
     EXPECT_FALSE(writer.finish());
-    return buffer.data().toStdString();
+    return memory.content;
 }
 
 std::string csv(const QStringList& columns, const std::vector<Row>& rows) {
@@ -85,7 +93,9 @@ TEST(RowsAsJson, KeepColumnsOfOneNameApart) {
 }
 
 TEST(RowsAsJson, SayWhenTheyCannotBeWritten) {
-    QBuffer closed;
+    files::Stream closed(-1, "The rows cannot be written", files::Stream::nothingWaits);
     designer::JsonWriter writer(closed);
-    EXPECT_TRUE(writer.begin({"a"}));
+    EXPECT_EQ(writer.begin({"a"}),
+              "The rows cannot be written (Bad file descriptor); try again, or "
+              "choose another folder.");
 }

@@ -183,3 +183,22 @@ TEST_F(InAShell, StopsWhenInterrupted) {
     EXPECT_EQ(program.exitCode(), 1);
     EXPECT_EQ(program.readAllStandardError(), "zandor-designer: Cancelled.\n");
 }
+
+// To a device on which there is never room.
+TEST_F(InAShell, SaysWhenItsOutputCannotBeWritten) {
+    for (const QStringList& arguments :
+         {QStringList{"--run", savedNumbers({{"numbers.n", {"< 3"}}}, database)},
+          QStringList{"--run", folder.path("query.json"), "--format", "json"},
+          QStringList{"--run", folder.path("query.json"), "--limit", "1"},
+          QStringList{"--sql", folder.path("query.json")}, QStringList{"--help"},
+          QStringList{"--version"}}) {
+        QProcess program;
+        program.setStandardOutputFile("/dev/full");
+        program.start(ZANDOR_DESIGNER, arguments);
+        ASSERT_TRUE(program.waitForFinished(60'000));
+        EXPECT_EQ(program.exitCode(), 2) << arguments.join(' ').toStdString();
+        EXPECT_EQ(program.readAllStandardError().toStdString(),
+                  "zandor-designer: The output cannot be written (No space left on device); make "
+                  "room on the disk, or choose another one.\n");
+    }
+}

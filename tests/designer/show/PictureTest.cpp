@@ -201,6 +201,6 @@ TEST_F(APicture, OfAnotherKindIsRefused) {
 
 TEST_F(APicture, ThatCannotBeWrittenIsRefusedInOneLine) {
     EXPECT_EQ(designer::savePicture(designer::DrawingPicture(*opened.query), "/no/such/a.svg"),
-              QStringLiteral("The picture \"/no/such/a.svg\" cannot be written; check the folder "
-                             "and your permissions."));
+              QStringLiteral("The file \"/no/such/a.svg\" cannot be saved (No such file or "
+                             "directory); check the path."));
 }

@@ -1,0 +1,21 @@
+#include "model/files/Output.h"
+
+#include "model/files/Descriptor.h"
+
+#include <cerrno>
+
+namespace files {
+
+std::optional<Error> Stream::write(std::string_view bytes) {
+    if (mFailure) return mFailure;
+    mWaiting += bytes;
+    return mWaiting.size() < mMostWaiting ? std::nullopt : flush();
+}
+
+std::optional<Error> Stream::flush() {
+    if (!mFailure && !writeAll(mFile, mWaiting)) mFailure = systemError(mRefusal, errno);
+    mWaiting.clear();
+    return mFailure;
+}
+
+} // namespace files

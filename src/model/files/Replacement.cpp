@@ -1,0 +1,87 @@
+#include "model/files/Replacement.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdio>
+#include <random>
+#include <system_error>
+
+namespace files {
+
+namespace {
+
+/// A name that nothing else in the folder has.
+Path nameBeside(const Path& path) {
+    constexpr const char* digits = "0123456789abcdef";
+    std::random_device random;
+    std::string name = "." + path.filename().string().substr(0, 200) + '.';
+    for (int n = 0; n < 12; ++n) name += digits[random() % 16];
+    return path.parent_path() / name;
+}
+
+/// Where a link leads to; the path itself when it is none.
+Path resolved(const Path& path) {
+    std::error_code none;
+    const Path target = std::filesystem::canonical(path, none);
+    return none ? std::filesystem::absolute(path, none) : target;
+}
+
+std::string refusal(const Path& path) { return "The file " + quoted(path) + " cannot be saved"; }
+
+/// Some file systems have no such thing as waiting for the disk.
+bool isOnDisk(int file) { return ::fsync(file) == 0 || errno == EINVAL; }
+
+} // namespace
+
+Replacement::Replacement(const Path& path) : mPath(path), mTarget(resolved(path)) {}
+
+Replacement::~Replacement() {
+    if (!mBeside.empty()) ::unlink(mBeside.c_str());
+}
+
+std::optional<Error> Replacement::open() {
+    struct stat old = {};
+    const bool replaces = ::stat(mTarget.c_str(), &old) == 0;
+    if (replaces && !S_ISREG(old.st_mode))
+        return Error{quoted(mPath) + " is not a file; choose another name."};
+    if (replaces && ::access(mTarget.c_str(), W_OK) != 0)
+        return Error{"The file " + quoted(mPath) + " is write-protected; save under another name."};
+
+    const Path beside = nameBeside(mTarget);
+    constexpr mode_t everybody = 0666; // less what the user's mask forbids
+    mFile = Descriptor(::open(beside.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, everybody));
+    if (!mFile.isOpen()) return refused(errno);
+    mBeside = beside;
+    mStream.emplace(mFile.number(), refusal(mPath));
+    // Without the permissions of the old file the new one is not its like; without its owner it is.
+    if (replaces && ::fchmod(mFile.number(), old.st_mode & 07777) != 0) return refused(errno);
+    return {};
+}
+
+std::optional<Error> Replacement::commit() {
+    if (const auto error = flush()) return error;
+    if (!isOnDisk(mFile.number()) || !mFile.close() ||
+        std::rename(mBeside.c_str(), mTarget.c_str()) != 0)
+        return refused(errno);
+    mBeside.clear();
+
+    // The new name is on the disk only with the folder. The file is saved whatever comes of it.
+    const Descriptor folder(
+        ::open(mTarget.parent_path().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+    if (folder.isOpen()) ::fsync(folder.number());
+    return {};
+}
+
+Error Replacement::refused(int number) const { return systemError(refusal(mPath), number); }
+
+std::optional<Error> replaceFile(const Path& path, std::string_view content) {
+    Replacement file(path);
+    if (auto error = file.open()) return error;
+    if (auto error = file.write(content)) return error;
+    return file.commit();
+}
+
+} // namespace files
