@@ -77,8 +77,11 @@ void DatabaseCommands::followFile() {
         QMessageBox::Warning, tr("Open database"),
         tr("The query is open, but not its database. %1").arg(inWords(opening.error)).trimmed(),
         QMessageBox::Close, &mWindow);
+    box.setTextFormat(Qt::PlainText);
+    const auto* again = box.addButton(tr("&Try again"), QMessageBox::AcceptRole);
     const auto* another = box.addButton(tr("&Choose database\u2026"), QMessageBox::AcceptRole);
     box.exec();
+    if (box.clickedButton() == again) return followFile();
     if (box.clickedButton() != another) return;
     // The query keeps what it has; it may have moved.
     ConnectionDialog dialog(mDatabase, &mWindow);

@@ -1,7 +1,9 @@
 #include "designer/DesignerWindow.h"
 
+#include "designer/Banner.h"
 #include "designer/Colours.h"
 #include "designer/DatabaseCommands.h"
+#include "designer/EndingSignals.h"
 #include "designer/Invitation.h"
 #include "designer/OpenedQuery.h"
 #include "designer/Screen.h"
@@ -17,12 +19,14 @@
 #include "designer/run/ResultsPanel.h"
 #include "designer/show/ShowCommands.h"
 #include "designer/statement/FindingPlace.h"
+#include "designer/statement/ModelWords.h"
 #include "designer/statement/StatementPanel.h"
 #include "designer/tables/RenameDialog.h"
 #include "designer/tables/TableAdding.h"
 #include "designer/tables/TableDropTarget.h"
 #include "designer/tables/TablesPanel.h"
 
+#include <QApplication>
 #include <QCloseEvent>
 #include <QDockWidget>
 #include <QLabel>
@@ -30,6 +34,7 @@
 #include <QMenuBar>
 #include <QMessageBox>
 #include <QMimeData>
+#include <QPushButton>
 #include <QScreen>
 #include <QStatusBar>
 #include <QToolButton>
@@ -52,7 +57,8 @@ QString layoutKey() { return QStringLiteral("window/layout"); }
 } // namespace
 
 DesignerWindow::DesignerWindow()
-    : mCounts(new QLabel), mDrawing(new DrawingArea(mDocument)),
+    : mUnsafe(new Banner), mNotOpened(new Banner), mCounts(new QLabel),
+      mDrawing(new DrawingArea(mDocument)),
       mFiles(new FileDialogs(mDocument, mFile, mRecentQueries, *this)),
       mDatabases(new DatabaseCommands(mDatabase, mFile, *mFiles, mRecentDatabases, *this)),
       mShow(new ShowCommands(mDocument, mFile, *mDrawing, mSettings, *this)) {
@@ -61,9 +67,13 @@ DesignerWindow::DesignerWindow()
     auto* const layout = new QVBoxLayout(middle);
     layout->setContentsMargins({});
     layout->setSpacing(0);
+    layout->addWidget(mUnsafe);
+    layout->addWidget(mNotOpened);
     layout->addWidget(new ConnectionBanner(mDatabase));
     layout->addWidget(mDrawing, 1);
     setCentralWidget(middle);
+    mUnsafe->setObjectName(QStringLiteral("unsafe"));
+    mNotOpened->setObjectName(QStringLiteral("notOpened"));
     mCounts->setObjectName(QStringLiteral("counts"));
     // Permanent, so that a message leaves it its place. What is cut off of one is in the tip.
     statusBar()->addPermanentWidget(mCounts);
@@ -287,6 +297,14 @@ void DesignerWindow::connectParts() {
     connect(&mFile, &QueryFile::changed, this, &DesignerWindow::showTitle);
     connect(mFiles, &FileDialogs::opened, mDatabases, &DatabaseCommands::followFile);
     connect(&mDocument, &Document::replaced, statusBar(), &QStatusBar::clearMessage);
+    connect(mFiles, &FileDialogs::gone, this,
+            [this](const QString& message) { statusBar()->showMessage(message); });
+    connect(mUnsafe->addButton(tr("Save &as\u2026"), QStringLiteral("saveUnsafe")),
+            &QPushButton::clicked, mFiles, &FileDialogs::saveAs);
+    mAgain = mNotOpened->addButton(tr("&Try again"), QStringLiteral("tryAgain"));
+    connect(&mDatabase, &Database::opened, mNotOpened, &QWidget::hide);
+    connect(mFiles, &FileDialogs::opened, mNotOpened, &QWidget::hide);
+    connect(mResults->runAction(), &QAction::triggered, &mDatabase, &Database::look);
     connect(&mDocument, &Document::changed, this, &DesignerWindow::showCounts);
     connect(&mDocument, &Document::changed, this, &DesignerWindow::offerCommands);
     connect(&mDocument, &Document::changed, this, &DesignerWindow::warnOfFullGrid);
@@ -315,13 +333,48 @@ std::optional<QString> DesignerWindow::openAtFirst(const Arguments& arguments,
 
 void DesignerWindow::keepSafe(const QString& folder) {
     mAutosave = std::make_unique<Autosave>(mDocument, mFile, folder);
-    connect(mAutosave.get(), &Autosave::failed, this,
-            [this](const QString& message) { statusBar()->showMessage(message); });
+    connect(mAutosave.get(), &Autosave::failed, mUnsafe,
+            [this](const QString& message) { mUnsafe->say(message); });
+    connect(mAutosave.get(), &Autosave::worked, mUnsafe, &QWidget::hide);
+    connect(new EndingSignals(this), &EndingSignals::ending, this, &DesignerWindow::saveForTheEnd);
+    connect(qGuiApp, &QGuiApplication::commitDataRequest, this, &DesignerWindow::saveForTheEnd);
     if (offerRecovery(mFile, *mAutosave, folder, this)) mDatabases->followFile();
 }
 
 void DesignerWindow::tell(const QString& message) {
     statusBar()->showMessage(message, messageTime);
+}
+
+/// Nobody can be asked any more.
+void DesignerWindow::saveForTheEnd() {
+    if (!mAutosave) return;
+    if (const auto error = mAutosave->saveAtOnce()) shell::complain(*error);
+}
+
+void DesignerWindow::offerAgain(const QString& error, const Arguments& arguments,
+                                const QString& sample) {
+    mNotOpened->say(inWords(error));
+    mAgain->disconnect();
+    connect(mAgain, &QPushButton::clicked, this, [this, arguments, sample] {
+        if (const auto again = openAtFirst(arguments, sample))
+            mNotOpened->say(inWords(*again));
+        else
+            mNotOpened->hide();
+    });
+}
+
+bool DesignerWindow::event(QEvent* event) {
+    // After the event, for there may be questions.
+    if (event->type() == QEvent::WindowActivate)
+        QMetaObject::invokeMethod(this, &DesignerWindow::lookAround, Qt::QueuedConnection);
+    return QMainWindow::event(event);
+}
+
+/// Other programs may have been at work meanwhile.
+void DesignerWindow::lookAround() {
+    if (QApplication::activeModalWidget()) return;
+    mDatabase.look();
+    mFiles->lookAtFile();
 }
 
 void DesignerWindow::closeEvent(QCloseEvent* event) {

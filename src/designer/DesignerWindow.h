@@ -12,10 +12,12 @@
 #include <QSettings>
 
 class QLabel;
+class QPushButton;
 
 namespace designer {
 
 class Autosave;
+class Banner;
 class DatabaseCommands;
 class EventPanel;
 class FileDialogs;
@@ -37,6 +39,8 @@ public:
     /// its database. Nothing named opens the sample with its example. Returns what went wrong; the
     /// window is empty then.
     std::optional<QString> openAtFirst(const Arguments& arguments, const QString& sample);
+    /// Says in the window what went wrong with that, and offers to try it again.
+    void offerAgain(const QString& error, const Arguments& arguments, const QString& sample);
     /// Saves what is done from time to time, in a folder, and offers to go on with what a designer
     /// that was killed has left there. To be called once the window stands.
     void keepSafe(const QString& folder);
@@ -47,6 +51,7 @@ public:
     ResultsPanel& results() { return *mResults; }
 
 protected:
+    bool event(QEvent* event) override;
     void closeEvent(QCloseEvent* event) override;
     void dragEnterEvent(QDragEnterEvent* event) override;
     void dropEvent(QDropEvent* event) override;
@@ -58,6 +63,8 @@ private:
     void makeMenus();
     void connectParts();
     void restoreLayout();
+    void lookAround();
+    void saveForTheEnd();
     void showTable(const QString& name);
     /// In the status bar, for a while.
     void tell(const QString& message);
@@ -78,6 +85,9 @@ private:
     RecentFiles mRecentDatabases{mSettings, QStringLiteral("databases")};
     Database mDatabase;
     // Children of the window.
+    Banner* mUnsafe;     ///< while the changes cannot be kept safe
+    Banner* mNotOpened;  ///< while what was named at first could not be opened
+    QPushButton* mAgain; ///< of the latter
     QLabel* mCounts;
     DrawingArea* mDrawing;
     TablesPanel* mTables;

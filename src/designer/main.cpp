@@ -77,8 +77,13 @@ int main(int argc, char** argv) {
     if (arguments->dark) designer::useDarkColours();
     if (!arguments->drawing.isEmpty()) return drawQuery(*arguments);
     designer::DesignerWindow window;
-    if (const auto error = window.openAtFirst(*arguments, QStringLiteral(ZANDOR_SAMPLE_DATABASE)))
-        return refuse(*error);
+    const QString sample = QStringLiteral(ZANDOR_SAMPLE_DATABASE);
+    const bool stays = arguments->screenshot.isEmpty() && !designer::isOffscreen();
+    if (const auto error = window.openAtFirst(*arguments, sample)) {
+        // Names that are not in the database were typed in a shell, where somebody reads this.
+        if (!stays || window.database().isOpen()) return refuse(*error);
+        window.offerAgain(*error, *arguments, sample);
+    }
     window.show();
     if (!arguments->screenshot.isEmpty()) return draw(window, arguments->screenshot);
     if (!designer::isOffscreen()) {

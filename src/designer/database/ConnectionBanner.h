@@ -1,30 +1,24 @@
 #pragma once
 
-#include <QFrame>
-
-class QLabel;
+#include "designer/Banner.h"
+#include "designer/database/Database.h"
 
 namespace designer {
 
-class Database;
-
-/// A slim bar that is there while the database is lost, with a button that connects it afresh.
-class ConnectionBanner final : public QFrame {
+/// There while the database is lost, or is no longer what was read of it; with a button that
+/// connects it afresh.
+class ConnectionBanner final : public Banner {
     Q_OBJECT
 
 public:
     explicit ConnectionBanner(Database& database, QWidget* parent = nullptr);
 
-protected:
-    void changeEvent(QEvent* event) override;
-
 private:
-    void colour();
     void showLoss(const QString& message);
+    void showChange(Database::Change change);
     void reconnect();
 
     Database& mDatabase;
-    QLabel* mText;
 };
 
 } // namespace designer

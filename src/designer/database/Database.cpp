@@ -3,7 +3,10 @@
 #include "designer/database/Address.h"
 #include "model/reader/dialectOf.h"
 
+#include <QCryptographicHash>
 #include <QFileInfo>
+#include <QSqlError>
+#include <QSqlQuery>
 
 namespace designer {
 
@@ -14,6 +17,20 @@ QString lasting(const QString& address) {
     const auto parts = parseAddress(address);
     return parts && parts->engine == Engine::SQLite ? QFileInfo(parts->file).absoluteFilePath()
                                                     : address;
+}
+
+/// All that an SQLite file says of its tables; nothing while it cannot be read.
+std::optional<QByteArray> structureOf(const reader::Connection& connection) {
+    QSqlQuery query(connection.database());
+    query.setForwardOnly(true);
+    if (!query.exec(QStringLiteral("SELECT type, name, sql FROM sqlite_master ORDER BY 1, 2")))
+        return {};
+    QCryptographicHash hash(QCryptographicHash::Sha1);
+    while (query.next())
+        for (int column = 0; column < 3; ++column)
+            hash.addData(query.value(column).toString().toUtf8() + '\0');
+    if (query.lastError().isValid()) return {};
+    return hash.result();
 }
 
 } // namespace
@@ -58,6 +75,9 @@ std::optional<QString> Database::take(const QString& address, const QString& pas
         mPassword = secret;
     }
     mLost = false;
+    mOutdated = false;
+    mMark = isServer() ? std::nullopt : FileMark::of(mAddress);
+    mStructure = isServer() ? QByteArray() : structureOf(*mConnection).value_or(QByteArray());
     emit opened();
     return {};
 }
@@ -72,6 +92,8 @@ void Database::close() {
         mPassword.clear();
     }
     mLost = false;
+    mOutdated = false;
+    mMark.reset();
     emit opened();
 }
 
@@ -107,6 +129,30 @@ void Database::sayLost(const QString& message) {
 
 void Database::sayFound() {
     if (std::exchange(mLost, false)) emit found();
+}
+
+void Database::look() {
+    if (mOutdated || !mMark) return;
+    const auto change = changed();
+    if (!change) return;
+    mOutdated = true;
+    emit outdated(*change);
+}
+
+std::optional<Database::Change> Database::changed() {
+    const auto mark = FileMark::of(mAddress);
+    if (!mark) return Change::gone;
+    if (!mark->isOfSameFile(*mMark)) return Change::replaced;
+    const bool hasLog = QFileInfo::exists(mAddress + QStringLiteral("-wal")); // changes go there
+    if (*mark == *mMark && !hasLog) return {};
+    // Rows come and go, which nobody here minds. Over a connection of its own, for the one that is
+    // open remembers pages of a file that may have been written over.
+    const auto connection = connect();
+    const auto structure = connection ? structureOf(*connection) : std::nullopt;
+    if (!structure) return {}; // it is being written; the next look tells
+    mMark = mark;
+    if (*structure == mStructure) return {};
+    return Change::altered;
 }
 
 } // namespace designer

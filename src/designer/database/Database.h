@@ -1,5 +1,6 @@
 #pragma once
 
+#include "designer/FileMark.h"
 #include "designer/database/RememberingReader.h"
 #include "model/reader/Connection.h"
 #include "model/sql/Dialect.h"
@@ -68,13 +69,25 @@ public:
     void sayFound();
     bool isLost() const { return mLost; }
 
+    /// What became of an SQLite file since it was opened.
+    enum class Change {
+        gone,
+        replaced, ///< another file has its name; what is open here nobody else sees any more
+        altered,  ///< its tables are others
+    };
+    /// Looks whether the open file is still what was read, and tells everybody, once until the
+    /// connection is renewed. A server is not asked.
+    void look();
+
 signals:
     /// Another database, the same one afresh, or none.
     void opened();
     void lost(const QString& message);
     void found();
+    void outdated(designer::Database::Change change);
 
 private:
+    std::optional<Change> changed();
     std::optional<QString> take(const QString& address, const QString& password,
                                 std::optional<Tables> tables);
 
@@ -85,6 +98,9 @@ private:
     std::unique_ptr<RememberingReader> mReader;
     Tables mTables;
     bool mLost = false;
+    std::optional<FileMark> mMark; ///< of a file, when it was read
+    QByteArray mStructure;         ///< what a file said of its tables then
+    bool mOutdated = false;
 };
 
 } // namespace designer

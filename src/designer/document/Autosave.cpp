@@ -3,6 +3,8 @@
 #include "designer/document/Document.h"
 #include "designer/document/QueryFile.h"
 
+#include <QCoreApplication>
+
 namespace designer {
 
 Autosave::Autosave(Document& document, QueryFile& file, const QString& folder,
@@ -30,19 +32,28 @@ void Autosave::documentChanged() {
         mTimer.start();
 }
 
+std::optional<QString> Autosave::saveAtOnce() {
+    if (!mDocument.isModified()) return {};
+    mTimer.stop();
+    save();
+    mWriter.waitForDone();
+    QCoreApplication::sendPostedEvents(this, QEvent::MetaCall); // how it went
+    return mFailure;
+}
+
 void Autosave::save() {
     if (!mSlot) {
         auto made = AutosaveSlot::made(mFolder);
         if (!made) return tell(QString::fromStdString(made.error()));
         mSlot = std::move(*made);
     }
-    const auto bytes = Autosaved{mFile.path(), mFile.content()}.bytes();
+    const auto bytes = Autosaved{mFile.path(), mFile.content(), mFile.origin()}.bytes();
     if (!bytes) return tell(QString::fromStdString(bytes.error()));
     mWriter.start([this, file = mSlot->file(), content = *bytes] {
         const auto error = AutosaveSlot::write(file, content);
         QMetaObject::invokeMethod(this, [this, error] {
             if (error) return tell(*error);
-            if (std::exchange(mFailed, false)) emit worked();
+            works();
         });
     });
 }
@@ -51,13 +62,17 @@ void Autosave::remove() {
     mTimer.stop();
     mWriter.waitForDone();
     if (mSlot) mSlot->remove();
-    if (std::exchange(mFailed, false)) emit worked();
+    works();
+}
+
+void Autosave::works() {
+    if (std::exchange(mFailure, std::nullopt)) emit worked();
 }
 
 void Autosave::tell(const QString& reason) {
-    mFailed = true;
-    emit failed(tr("The changes cannot be kept safe in \"%1\" (%2); save the query yourself.")
-                    .arg(mFolder, reason));
+    mFailure = tr("The changes cannot be kept safe in \"%1\" (%2); save the query yourself.")
+                   .arg(mFolder, reason);
+    emit failed(*mFailure);
     if (mDocument.isModified()) mTimer.start(); // there may be room again
 }
 

@@ -28,6 +28,9 @@ public:
 
     /// Goes on with the file of one that was killed, whose query the document has now.
     void adopt(AutosaveSlot::Ptr slot);
+    /// For a process that is ended from outside: writes what is modified and waits until it is on
+    /// the disk. What went wrong, or nothing.
+    std::optional<QString> saveAtOnce();
 
 signals:
     /// It could not be written: one line. Told each time; it is tried again and again.
@@ -40,6 +43,7 @@ private:
     void save();
     void remove();
     void tell(const QString& reason);
+    void works();
 
     Document& mDocument;
     QueryFile& mFile;
@@ -47,7 +51,7 @@ private:
     AutosaveSlot::Ptr mSlot; ///< made when it is needed first
     QTimer mTimer;
     QThreadPool mWriter; ///< one thread, so that files are written in their order
-    bool mFailed = false;
+    std::optional<QString> mFailure;
 };
 
 } // namespace designer

@@ -16,6 +16,7 @@ namespace {
 
 const QString suffix = QStringLiteral(".autosave");
 const QString fileMember = QStringLiteral("file");
+const QString originMember = QStringLiteral("origin");
 const QString queryMember = QStringLiteral("query");
 
 } // namespace
@@ -23,8 +24,9 @@ const QString queryMember = QStringLiteral("query");
 files::Result<QByteArray> Autosaved::bytes() const {
     const auto text = files::toJson(content);
     if (!text) return files::Error{text.error()};
-    return QJsonDocument(
-               QJsonObject{{fileMember, path}, {queryMember, QString::fromStdString(*text)}})
+    return QJsonDocument(QJsonObject{{fileMember, path},
+                                     {originMember, QString::fromLatin1(origin.toHex())},
+                                     {queryMember, QString::fromStdString(*text)}})
         .toJson(QJsonDocument::Compact);
 }
 
@@ -32,7 +34,8 @@ files::Result<Autosaved> Autosaved::read(const QByteArray& bytes) {
     const QJsonObject object = QJsonDocument::fromJson(bytes).object();
     const auto content = files::fromJson(object.value(queryMember).toString().toStdString());
     if (!content) return files::Error{content.error()};
-    return Autosaved{object.value(fileMember).toString(), *content};
+    return Autosaved{object.value(fileMember).toString(), *content,
+                     QByteArray::fromHex(object.value(originMember).toString().toLatin1())};
 }
 
 QString AutosaveSlot::standardFolder() {

@@ -17,6 +17,7 @@ namespace designer {
 struct Autosaved {
     QString path; ///< of the file that it is a later state of; empty: there is none yet
     files::QueryDocument content;
+    QByteArray origin = {}; ///< QueryFile::origin()
 
     /// One line of what is wrong, in place of the bytes, when the query cannot be written.
     files::Result<QByteArray> bytes() const;

@@ -8,6 +8,8 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QPushButton>
+#include <QScopedValueRollback>
 #include <QStandardPaths>
 
 namespace designer {
@@ -91,12 +93,64 @@ bool FileDialogs::mayLose() {
 }
 
 bool FileDialogs::saveTo(const QString& path) {
+    const bool own = QFileInfo(path).absoluteFilePath() == mFile.path();
+    if (own && mFile.onDisk(QueryFile::Look::thorough) == QueryFile::OnDisk::changed) {
+        switch (ask(tr("To save your query overwrites these changes."), tr("&Overwrite them"),
+                    tr("Cancel"))) {
+        case Whose::theirs: openFrom(path); return false;
+        case Whose::mine: break;
+        case Whose::elsewhere: return saveAs();
+        case Whose::open: return false;
+        }
+    }
     if (const auto error = mFile.saveAs(path)) {
         tell(tr("Save query"), *error);
         return false;
     }
     mRecent.add(mFile.path());
     return true;
+}
+
+void FileDialogs::lookAtFile() {
+    // The question itself takes the window's focus and gives it back.
+    if (mAsking) return;
+    const QScopedValueRollback asking(mAsking, true);
+    const QString path = mFile.path();
+    switch (mFile.onDisk(QueryFile::Look::quick)) {
+    case QueryFile::OnDisk::asKnown: return;
+    case QueryFile::OnDisk::gone:
+        mFile.keepInstead();
+        emit gone(tr("The file \"%1\" is no longer there; save the query to have one.")
+                      .arg(mFile.name()));
+        return;
+    case QueryFile::OnDisk::changed: break;
+    }
+    const QString detail = mDocument.isModified() ? tr("To load it gives up your own changes.")
+                                                  : tr("You have not changed it since.");
+    switch (ask(detail, tr("&Keep mine"), tr("&Decide later"))) {
+    case Whose::theirs: openFrom(path); break;
+    case Whose::mine: mFile.keepInstead(); break;
+    case Whose::elsewhere: saveAs(); break;
+    case Whose::open: mFile.decideLater(); break;
+    }
+}
+
+FileDialogs::Whose FileDialogs::ask(const QString& detail, const QString& mine,
+                                    const QString& open) {
+    QMessageBox box(QMessageBox::Warning, tr("Changed file"),
+                    tr("Another program has changed \"%1\" since you opened it.").arg(mFile.name()),
+                    QMessageBox::NoButton, &mWindow);
+    box.setTextFormat(Qt::PlainText);
+    box.setInformativeText(detail);
+    const auto* theirs = box.addButton(tr("&Load the file"), QMessageBox::DestructiveRole);
+    const auto* own = box.addButton(mine, QMessageBox::AcceptRole);
+    auto* elsewhere = box.addButton(tr("Save &as\u2026"), QMessageBox::AcceptRole);
+    box.setEscapeButton(box.addButton(open, QMessageBox::RejectRole));
+    box.setDefaultButton(elsewhere);
+    box.exec();
+    if (box.clickedButton() == theirs) return Whose::theirs;
+    if (box.clickedButton() == own) return Whose::mine;
+    return box.clickedButton() == elsewhere ? Whose::elsewhere : Whose::open;
 }
 
 void FileDialogs::tell(const QString& title, const QString& error) {

@@ -26,6 +26,9 @@ public:
     /// Asks for a file when there is none yet.
     bool save();
     bool saveAs();
+    /// Looks whether another program has changed the file, and asks whose state is to stay. To be
+    /// called when the user comes back to the window.
+    void lookAtFile();
     /// Whether the query may be given up: it is saved, the user saves it now, or discards it. To be
     /// asked before it is replaced by something else than these commands and before the window
     /// closes.
@@ -34,8 +37,12 @@ public:
 signals:
     /// A file was opened: its database may be another one (QueryFile::databaseAddress()).
     void opened();
+    /// The query's file is no longer there: one line.
+    void gone(const QString& message);
 
 private:
+    enum class Whose { theirs, mine, elsewhere, open };
+    Whose ask(const QString& detail, const QString& mine, const QString& open);
     bool openFrom(const QString& path);
     bool saveTo(const QString& path);
     void tell(const QString& title, const QString& error);
@@ -44,6 +51,7 @@ private:
     QueryFile& mFile;
     RecentFiles& mRecent;
     QWidget& mWindow;
+    bool mAsking = false;
 };
 
 } // namespace designer

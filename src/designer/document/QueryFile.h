@@ -1,5 +1,6 @@
 #pragma once
 
+#include "designer/FileMark.h"
 #include "model/files/QueryDocument.h"
 
 #include <QObject>
@@ -28,6 +29,16 @@ public:
     /// For the next saving; a password is taken out of it. Nothing is modified by it.
     void setDatabaseAddress(const QString& address);
 
+    /// What became of the file on the disk since it was read or written here.
+    enum class OnDisk { asKnown, changed, gone };
+    /// `thorough` reads it even where the system says that nothing has happened to it.
+    enum class Look { quick, thorough };
+    OnDisk onDisk(Look look);
+    /// From now on the file counts as known as it is, and the query as another than that one.
+    void keepInstead();
+    /// A quick look says no more of the file as it is; a thorough one, before it is written, does.
+    void decideLater();
+
     /// An empty query without a file; the database stays.
     void startNew();
     /// On an error everything stays as it was.
@@ -38,8 +49,12 @@ public:
 
     /// Everything that is saved, as it is now.
     files::QueryDocument content() const;
-    /// Takes a content over as one that is not saved, in a file of this path (or of none yet).
-    void recover(const QString& path, const files::QueryDocument& content);
+    /// By what the file is known again that the query comes from; empty: there is none.
+    const QByteArray& origin() const { return mOrigin; }
+    /// Takes a content over as one that is not saved, in a file of this path (or of none yet), with
+    /// the origin that it had; without one the file counts as known as it is.
+    void recover(const QString& path, const files::QueryDocument& content,
+                 const QByteArray& origin = {});
 
 signals:
     /// path() is another, or databaseAddress().
@@ -47,9 +62,12 @@ signals:
 
 private:
     void take(const QString& path, const files::QueryDocument& content);
+    void knowAsItIs();
 
     Document& mDocument;
     QString mPath;
+    QByteArray mOrigin;            ///< a digest of the file as it was last read or written here
+    std::optional<FileMark> mMark; ///< of the file then
     QString mDatabase;
     std::shared_ptr<const files::Unknown> mUnknown;
 };

@@ -49,7 +49,7 @@ bool offerRecovery(QueryFile& file, Autosave& autosave, const QString& folder, Q
         }
         switch (Recovery::ask(saved->path, slot->saved(), window)) {
         case Recovery::Answer::recover:
-            file.recover(saved->path, saved->content);
+            file.recover(saved->path, saved->content, saved->origin);
             autosave.adopt(std::move(slot));
             return true;
         case Recovery::Answer::discard: slot->remove(); break;

@@ -9,6 +9,7 @@
 #include <QSqlError>
 #include <QSqlQuery>
 
+#include <cstdio>
 #include <thread>
 
 using designer::Database;
@@ -26,6 +27,18 @@ protected:
     std::size_t columnsOf(const TableId& id) {
         const auto table = database.reader().table(id);
         return table ? table->columns.size() : 0;
+    }
+
+    /// What the database tells of its file, look after look.
+    std::vector<Database::Change> looked() {
+        std::vector<Database::Change> told;
+        const auto connection =
+            QObject::connect(&database, &Database::outdated,
+                             [&](Database::Change change) { told.push_back(change); });
+        database.look();
+        database.look();
+        QObject::disconnect(connection);
+        return told;
     }
 
     DatabaseFolder folder;
@@ -115,4 +128,46 @@ TEST_F(ADatabase, OfAFileCannotBeLost) {
     database.sayLost(QStringLiteral("gone"));
     EXPECT_EQ(lost, 0);
     EXPECT_TRUE(database.reader().table({u"", u"a"}));
+}
+
+TEST_F(ADatabase, SaysNothingWhileOthersWriteRows) {
+    const QString path = make(QStringLiteral("a.sqlite"));
+    ASSERT_EQ(database.open(path), std::nullopt);
+    EXPECT_TRUE(looked().empty());
+    folder.database(QStringLiteral("a.sqlite"), {QStringLiteral("INSERT INTO a VALUES (1)")});
+    EXPECT_TRUE(looked().empty());
+}
+
+TEST_F(ADatabase, SaysOnceThatAnotherFileHasTakenItsPlace) {
+    const QString path = make(QStringLiteral("a.sqlite"));
+    const QString other = make(QStringLiteral("b.sqlite"));
+    ASSERT_EQ(database.open(path), std::nullopt);
+    ASSERT_EQ(::rename(other.toLocal8Bit().constData(), path.toLocal8Bit().constData()), 0);
+    EXPECT_EQ(looked(), std::vector{Database::Change::replaced});
+    ASSERT_EQ(database.renew(), std::nullopt);
+    EXPECT_TRUE(looked().empty());
+}
+
+TEST_F(ADatabase, SaysThatItIsWrittenOverByAnother) {
+    const QString path = make(QStringLiteral("a.sqlite"));
+    const QString other =
+        folder.database(QStringLiteral("b.sqlite"), {QStringLiteral("CREATE TABLE other (id)"),
+                                                     QStringLiteral("CREATE TABLE more (id)")});
+    ASSERT_EQ(database.open(path), std::nullopt);
+    QFile from(other), into(path);
+    ASSERT_TRUE(from.open(QIODevice::ReadOnly) && into.open(QIODevice::WriteOnly));
+    into.write(from.readAll());
+    into.close();
+    EXPECT_EQ(looked(), std::vector{Database::Change::altered});
+}
+
+TEST_F(ADatabase, SaysThatItsTablesAreOthersInALogTooAndThatItIsGone) {
+    const QString path = make(QStringLiteral("a.sqlite"));
+    folder.database(QStringLiteral("a.sqlite"), {QStringLiteral("PRAGMA journal_mode = WAL")});
+    ASSERT_EQ(database.open(path), std::nullopt);
+    folder.database(QStringLiteral("a.sqlite"), {QStringLiteral("CREATE TABLE c (id)")});
+    EXPECT_EQ(looked(), std::vector{Database::Change::altered});
+    ASSERT_EQ(database.renew(), std::nullopt);
+    ASSERT_TRUE(QFile::remove(path));
+    EXPECT_EQ(looked(), std::vector{Database::Change::gone});
 }

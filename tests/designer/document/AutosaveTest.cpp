@@ -11,6 +11,8 @@
 #include <QProcess>
 #include <QTemporaryDir>
 
+#include <csignal>
+
 namespace {
 
 using designer::Autosave;
@@ -87,6 +89,26 @@ TEST_F(AnAutosave, WritesSoonAfterAChangeWhereTheQueryBelongsAndWhichDatabaseItA
     EXPECT_EQ(read->path, ordersFile);
     EXPECT_EQ(read->content.database, u"postgresql://ann@host/trade");
     EXPECT_EQ(read->content.query->record(), drawing.query().record());
+}
+
+TEST_F(AnAutosave, RemembersWhichStateOfTheFileItComesFrom) {
+    ASSERT_FALSE(file.saveAs(temporary.filePath(QStringLiteral("orders.json"))));
+    const auto autosave = started();
+    drawing.join(u"customers", u"orders");
+    drawing.document.settle();
+    ASSERT_TRUE(comesTrue([&] { return saved().size() == 1; }));
+    const auto read = designer::Autosaved::read(content());
+    ASSERT_TRUE(read);
+    EXPECT_EQ(read->origin, file.origin());
+}
+
+TEST_F(AnAutosave, IsWrittenAtOnceBeforeTheProcessIsEnded) {
+    Autosave autosave(drawing.document, file, folder(), std::chrono::hours(1));
+    EXPECT_FALSE(autosave.saveAtOnce());
+    EXPECT_EQ(saved().size(), 0) << "nothing has changed";
+    drawing.join(u"customers", u"orders");
+    EXPECT_FALSE(autosave.saveAtOnce());
+    EXPECT_EQ(saved().size(), 1);
 }
 
 TEST_F(AnAutosave, WritesEveryLaterChangeToo) {
@@ -176,6 +198,27 @@ TEST_F(AnAutosave, OfAKilledDesignerIsFoundOnceAndTheOthersAreLeft) {
     EXPECT_EQ(read->content.database, u"postgresql://ann@host/trade");
     EXPECT_TRUE(read->content.query->tableNamed(u"stock"));
     kill(*living);
+}
+
+// What a session manager, a terminal that is closed, or an administrator sends.
+TEST_F(AnAutosave, OfADesignerThatIsAskedToEndIsWrittenBefore) {
+    for (const int signal : {SIGTERM, SIGINT, SIGHUP}) {
+        QProcess process;
+        process.start(QStringLiteral(AUTOSAVING_DESIGNER),
+                      {folder(), ordersFile, QString("t%1").arg(signal), "once-asked"});
+        ASSERT_TRUE(process.waitForReadyRead(20'000));
+        EXPECT_EQ(saved().size(), 0) << "it saves of itself in an hour";
+        ASSERT_EQ(::kill(static_cast<pid_t>(process.processId()), signal), 0);
+        ASSERT_TRUE(process.waitForFinished(20'000));
+        EXPECT_EQ(process.exitStatus(), QProcess::CrashExit) << "by the signal";
+        EXPECT_EQ(process.exitCode(), signal);
+        const auto found = AutosaveSlot::abandoned(folder());
+        ASSERT_EQ(found.size(), 1u);
+        const auto read = found[0]->read();
+        ASSERT_TRUE(read);
+        EXPECT_TRUE(read->content.query->tableNamed(u"t" + platform::decimal(signal)));
+        found[0]->remove();
+    }
 }
 
 TEST_F(AnAutosave, IsRecoveredAsAModifiedQueryAndKeptUntilThatIsSaved) {
