@@ -81,6 +81,10 @@ public:
     /// What is being typed goes into its cell, and the editor closes. For hosts that are about to
     /// use the query: before they run, save or close it.
     void takeOver();
+    /// Writes what stands in the open text editor into the definition of the same key in another
+    /// model; the editor and the control's own model stay as they are. Returns whether there was
+    /// anything that is not in the model yet.
+    bool writeTyping(const platform::Ref<TalvikZandorLib::Zandor>& copy);
     /// A printable text typed while the grid has the focus, for its current cell.
     bool cellTyped(const String& text);
     /// A key in an open editor. The caret counts as at an end of the text when nothing is selected

@@ -76,6 +76,13 @@ public:
     void note(std::int32_t row, std::int32_t column, const String& text) {
         control().sprColumn->CellNote(row, column, text);
     }
+    /// Writes a text into a definition of whatever model, as the control does for a cell of a row;
+    /// false when there is nothing to change or the row has no text of its own.
+    bool store(const Ref<TalvikZandorLib::ZDColumnDefinition>& definition, std::int32_t row,
+               const String& text) {
+        if (row != row::synonym && row <= row::visible) return false;
+        return control().StoreText(control().Hold(definition), row, text);
+    }
     /// Makes an output column of an entry (1-based) of the table in a slot, as dropping it on a
     /// grid column does. What was copied for a later "Paste Column" stays.
     void drop(std::int16_t table, std::int32_t entry, std::int32_t column);

@@ -63,6 +63,20 @@ void Comforts::takeOver() {
     });
 }
 
+bool Comforts::writeTyping(const platform::Ref<TalvikZandorLib::Zandor>& copy) {
+    if (!mTyping) return false;
+    return act(u"writeTyping", [&](Door& door) {
+        if (door.editor() != Editor::text || door.model() != mTyping->model) return false;
+        const String text = door.editorValue();
+        const std::int32_t column = door.columnWith(mTyping->keyNumber, mTyping->column);
+        if (text == mTyping->value || column == 0) return false;
+        const auto definition = door.definitionOf(column);
+        if (!definition) return false;
+        door.store(copy->ColumnDefinitions().Item(definition->Key()), mTyping->row, text);
+        return true;
+    });
+}
+
 bool Comforts::cellTyped(const String& text) {
     return act(u"cellTyped", [&](Door& door) {
         const std::int32_t row = door.grid().Row();

@@ -42,7 +42,7 @@ QPushButton* Banner::addButton(const QString& text, const QString& name) {
 }
 
 void Banner::say(const QString& text, const QString& toolTip) {
-    mText->setText(text);
+    mText->setText(platform::qt::asSigns(text));
     mText->setToolTip(platform::qt::asToolTip(toolTip));
     show();
 }

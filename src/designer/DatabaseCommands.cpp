@@ -1,5 +1,6 @@
 #include "designer/DatabaseCommands.h"
 
+#include "designer/PlainBox.h"
 #include "designer/database/ConnectionDialog.h"
 #include "designer/database/opening.h"
 #include "designer/document/FileDialogs.h"
@@ -10,7 +11,6 @@
 
 #include <QFileDialog>
 #include <QMenu>
-#include <QMessageBox>
 #include <QPushButton>
 
 namespace designer {
@@ -57,7 +57,7 @@ void DatabaseCommands::openAddress(const QString& address) {
     if (!mFiles.mayLose()) return;
     const Opening opening = openAskingForPassword(mDatabase, address, &mWindow);
     if (!opening.error.isEmpty())
-        QMessageBox::warning(&mWindow, tr("Open database"), inWords(opening.error));
+        PlainBox::warn(&mWindow, tr("Open database"), inWords(opening.error));
     if (opening.opened) begin();
 }
 
@@ -73,11 +73,10 @@ void DatabaseCommands::followFile() {
     const Opening opening = openAskingForPassword(mDatabase, *address, &mWindow);
     if (opening.opened) return;
     if (mDatabase.isOpen()) mDatabase.close(); // the query is not to run on another one
-    QMessageBox box(
+    PlainBox box(
         QMessageBox::Warning, tr("Open database"),
         tr("The query is open, but not its database. %1").arg(inWords(opening.error)).trimmed(),
         QMessageBox::Close, &mWindow);
-    box.setTextFormat(Qt::PlainText);
     const auto* again = box.addButton(tr("&Try again"), QMessageBox::AcceptRole);
     const auto* another = box.addButton(tr("&Choose database\u2026"), QMessageBox::AcceptRole);
     box.exec();
@@ -107,8 +106,7 @@ void DatabaseCommands::askForConnection() {
 
 void DatabaseCommands::reconnect() {
     const Opening opening = renewPatiently(mDatabase, &mWindow);
-    if (!opening.error.isEmpty())
-        QMessageBox::warning(&mWindow, tr("Reconnect"), inWords(opening.error));
+    if (!opening.error.isEmpty()) PlainBox::warn(&mWindow, tr("Reconnect"), inWords(opening.error));
 }
 
 } // namespace designer

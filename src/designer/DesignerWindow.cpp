@@ -6,6 +6,7 @@
 #include "designer/EndingSignals.h"
 #include "designer/Invitation.h"
 #include "designer/OpenedQuery.h"
+#include "designer/PlainBox.h"
 #include "designer/Screen.h"
 #include "designer/canvasSize.h"
 #include "designer/database/ConnectionBanner.h"
@@ -21,10 +22,12 @@
 #include "designer/statement/FindingPlace.h"
 #include "designer/statement/ModelWords.h"
 #include "designer/statement/StatementPanel.h"
+#include "designer/tables/MissingTables.h"
 #include "designer/tables/RenameDialog.h"
 #include "designer/tables/TableAdding.h"
 #include "designer/tables/TableDropTarget.h"
 #include "designer/tables/TablesPanel.h"
+#include "platform/qt/ShownText.h"
 
 #include <QApplication>
 #include <QCloseEvent>
@@ -32,7 +35,6 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QMenuBar>
-#include <QMessageBox>
 #include <QMimeData>
 #include <QPushButton>
 #include <QScreen>
@@ -274,13 +276,14 @@ void DesignerWindow::connectParts() {
     mAdding = new TableAdding(mDocument, mDatabase, *mDrawing);
     auto* const target = new TableDropTarget(*mDrawing);
     new Invitation(mDocument, mDatabase, *mDrawing);
+    new MissingTables(mDocument, mDatabase, *mDrawing);
     connect(mTables, &TablesPanel::chosen, mAdding,
             [this](const std::vector<reader::TableId>& tables) { mAdding->add(tables); });
     connect(target, &TableDropTarget::dropped, mAdding, &TableAdding::add);
     connect(mAdding, &TableAdding::added, this, &DesignerWindow::showTable);
     connect(mAdding, &TableAdding::noted, this, &DesignerWindow::tell);
     connect(mAdding, &TableAdding::refused, this,
-            [this](const QString& why) { QMessageBox::warning(this, tr("Add tables"), why); });
+            [this](const QString& why) { PlainBox::warn(this, tr("Add tables"), why); });
 
     connect(mStatement, &StatementPanel::findingChosen, this,
             [this](const model::Finding& finding) {
@@ -336,6 +339,9 @@ void DesignerWindow::keepSafe(const QString& folder) {
     connect(mAutosave.get(), &Autosave::failed, mUnsafe,
             [this](const QString& message) { mUnsafe->say(message); });
     connect(mAutosave.get(), &Autosave::worked, mUnsafe, &QWidget::hide);
+    mAutosave->setTyping([this](const platform::Ref<model::Query>& copy) {
+        return mDrawing->control().writeTyping(copy);
+    });
     connect(new EndingSignals(this), &EndingSignals::ending, this, &DesignerWindow::saveForTheEnd);
     connect(qGuiApp, &QGuiApplication::commitDataRequest, this, &DesignerWindow::saveForTheEnd);
     if (offerRecovery(mFile, *mAutosave, folder, this)) mDatabases->followFile();
@@ -421,8 +427,8 @@ void DesignerWindow::showTable(const QString& name) {
 }
 
 void DesignerWindow::showTitle() {
-    QStringList parts{mFile.name() + QStringLiteral("[*]")};
-    if (mDatabase.isOpen()) parts += mDatabase.name();
+    QStringList parts{platform::qt::asSigns(mFile.name()) + QStringLiteral("[*]")};
+    if (mDatabase.isOpen()) parts += platform::qt::asSigns(mDatabase.name());
     parts += QStringLiteral("Zandor Designer");
     setWindowTitle(parts.join(QStringLiteral(" \u2014 ")));
 }
@@ -442,11 +448,10 @@ void DesignerWindow::offerCommands() {
 void DesignerWindow::warnOfFullGrid() {
     const bool full = mDocument.query()->ColumnDefinitions().Count() >= mostOutputColumns;
     if (full && !mWarnedOfFullGrid)
-        QMessageBox::warning(
-            this, tr("Output columns"),
-            tr("The grid shows %1 output columns and is full. Delete one before you "
-               "add another; it would take the place of the last.")
-                .arg(mostOutputColumns));
+        PlainBox::warn(this, tr("Output columns"),
+                       tr("The grid shows %1 output columns and is full. Delete one before you "
+                          "add another; it would take the place of the last.")
+                           .arg(mostOutputColumns));
     mWarnedOfFullGrid = full;
 }
 
@@ -465,11 +470,12 @@ void DesignerWindow::showHelp(HelpWindow::Page page) {
 }
 
 void DesignerWindow::about() {
-    QMessageBox::about(
-        this, tr("About Zandor Designer"),
-        tr("Zandor Designer %1\n\nDraw a query, read its SQL, run it. The database is "
-           "only read.")
-            .arg(QStringLiteral(ZANDOR_VERSION)));
+    PlainBox(QMessageBox::Information, tr("About Zandor Designer"),
+             tr("Zandor Designer %1\n\nDraw a query, read its SQL, run it. The database is "
+                "only read.")
+                 .arg(QStringLiteral(ZANDOR_VERSION)),
+             QMessageBox::Ok, this)
+        .exec();
 }
 
 } // namespace designer

@@ -304,4 +304,20 @@ TEST_F(TypingInACell, IsReportedOnceWhereTheModelRefusesIt) {
     EXPECT_EQ(events(), Names{});
 }
 
+TEST_F(TypingInACell, CanBeWrittenIntoACopyOfTheModelAndGoesOn) {
+    const auto copy = library.newModel();
+    const auto definition = copy->definition(copy->table(u"ORDERS", {u"*", u"ID"}), u"ID");
+    ASSERT_EQ(definition->Key(), first->Key());
+    EXPECT_FALSE(stage->comforts().writeTyping(copy)) << "no editor is open";
+    press(left, criteriaRow, 1);
+    EXPECT_FALSE(stage->comforts().writeTyping(copy)) << "it says what the model says";
+    stage->type("txtValue", u"> 20");
+    forget();
+    EXPECT_TRUE(stage->comforts().writeTyping(copy));
+    EXPECT_EQ(definition->Criteria().Item(u"4")->Criterium(), u"> 20");
+    EXPECT_EQ(first->Criteria().Item(u"4")->Criterium(), u"> 1");
+    EXPECT_TRUE(shows("fraValue"));
+    expectNothing();
+}
+
 } // namespace gridstage

@@ -2,9 +2,11 @@
 
 #include "designer/Banner.h"
 #include "designer/database/ConnectionBanner.h"
+#include "designer/document/AutosaveSlot.h"
 #include "model/files/QueryDocument.h"
 
 #include <QDir>
+#include <QLineEdit>
 #include <QPushButton>
 #include <QSessionManager>
 
@@ -13,6 +15,7 @@
 #include <cstdio>
 
 using designer::Banner;
+using platform::qt::GridWidget;
 using testing::ElementsAre;
 using testing::HasSubstr;
 
@@ -146,4 +149,61 @@ TEST_F(ASafeWindow, NoticesThatItsDatabaseWasReplaced) {
     press(connectionBanner(), "reconnect");
     EXPECT_FALSE(connectionBanner().isVisible());
     EXPECT_TRUE(row("there").isValid());
+}
+
+TEST_F(ASafeWindow, MarksTheTablesThatAreGoneFromTheDatabase) {
+    const QStringList tables = {"CREATE TABLE stays (id INTEGER PRIMARY KEY)",
+                                "CREATE TABLE goes (id INTEGER PRIMARY KEY)"};
+    const QString path = folder.database("a.db", tables);
+    open({.file = path, .tables = {"stays", "goes"}});
+    EXPECT_EQ(shownTable("goes")->note(), "");
+    folder.database("a.db", {"DROP TABLE goes"});
+    comeBack();
+    EXPECT_EQ(connectionBanner().text(),
+              "The tables of a.db have been changed by another program.");
+    press(connectionBanner(), "reconnect");
+    EXPECT_EQ(shownTable("stays")->note(), "");
+    EXPECT_EQ(shownTable("goes")->note(), "There is no table \"goes\" in a.db.");
+    EXPECT_EQ(shownTable("goes")->accessibleDescription(), shownTable("goes")->note());
+    // However the drawing is shown anew.
+    window->drawing().setOptions(window->drawing().options());
+    calm();
+    EXPECT_NE(shownTable("goes")->note(), "");
+    if (const QByteArray picture = qgetenv("ZANDOR_PICTURES"); !picture.isEmpty())
+        window->grab().save(QString::fromLocal8Bit(picture) + "/missing.png");
+    folder.database("a.db", {tables[1]});
+    comeBack();
+    press(connectionBanner(), "reconnect");
+    EXPECT_EQ(shownTable("goes")->note(), "");
+}
+
+TEST_F(ASafeWindow, KeepsWhatIsBeingTypedSafeToo) {
+    open();
+    window->keepSafe(autosaves());
+    auto& grid = part<GridWidget>("sprColumn");
+    hands::click(grid, grid.cellRect(4, 1).center());
+    calm();
+    auto& editor = part<QLineEdit>("txtValue");
+    ASSERT_TRUE(editor.isVisible());
+    for (const char16_t c : u"= 77")
+        if (c) hands::key(editor, Qt::Key_unknown, QString(QChar(c)));
+    ASSERT_EQ(editor.text(), "= 77");
+    EXPECT_FALSE(window->document().isModified());
+    const auto kept = [&]() -> std::u16string {
+        const QStringList files = QDir(autosaves()).entryList({"*.autosave"});
+        if (files.size() != 1) return {};
+        QFile file(QDir(autosaves()).filePath(files.front()));
+        if (!file.open(QIODevice::ReadOnly)) return {};
+        const auto saved = designer::Autosaved::read(file.readAll());
+        if (!saved) return {};
+        const auto definition = saved->content.query->ColumnDefinitions().Item(1);
+        return definition->HasCriterium(u"4") ? definition->Criteria().Item(u"4")->Criterium()
+                                              : std::u16string();
+    };
+    EXPECT_TRUE(until([&] { return kept() == u"= 77"; }));
+    EXPECT_TRUE(editor.isVisible()) << "nobody is interrupted";
+    EXPECT_FALSE(query().ColumnDefinitions().Item(1)->HasCriterium(u"4"));
+    hands::key(editor, Qt::Key_Escape);
+    EXPECT_TRUE(until([&] { return QDir(autosaves()).entryList({"*.autosave"}).isEmpty(); }))
+        << "it was given up";
 }

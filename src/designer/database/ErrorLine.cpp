@@ -2,6 +2,7 @@
 
 #include "designer/Colours.h"
 #include "designer/statement/ModelWords.h"
+#include "platform/qt/ShownText.h"
 
 #include <QEvent>
 
@@ -29,7 +30,7 @@ void ErrorLine::changeEvent(QEvent* event) {
 }
 
 void ErrorLine::say(const QString& error) {
-    setText(inWords(error));
+    setText(platform::qt::asSigns(inWords(error)));
     setVisible(!error.isEmpty());
 }
 

@@ -1,8 +1,11 @@
 #include "designer/database/patiently.h"
 
+#include "platform/qt/ShownText.h"
+
 #include <QCoreApplication>
 #include <QEventLoop>
 #include <QFutureWatcher>
+#include <QLabel>
 #include <QProgressDialog>
 #include <QPromise>
 #include <QThreadPool>
@@ -39,8 +42,11 @@ bool runPatiently(const QString& what, QWidget* window, std::function<void()> wo
     loop.exec(QEventLoop::ExcludeUserInputEvents);
     if (watcher.isFinished()) return true;
 
-    QProgressDialog dialog(what, QCoreApplication::translate("designer::Waiting", "Cancel"), 0, 0,
-                           window);
+    QProgressDialog dialog(QString(), QCoreApplication::translate("designer::Waiting", "Cancel"), 0,
+                           0, window);
+    auto* const label = new QLabel(platform::qt::asSigns(what));
+    label->setTextFormat(Qt::PlainText);
+    dialog.setLabel(label);
     dialog.setWindowTitle(QCoreApplication::applicationName());
     dialog.setWindowModality(Qt::WindowModal);
     dialog.setMinimumDuration(0);

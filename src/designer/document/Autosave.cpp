@@ -16,6 +16,9 @@ Autosave::Autosave(Document& document, QueryFile& file, const QString& folder,
     connect(&mTimer, &QTimer::timeout, this, &Autosave::save);
     connect(&document, &Document::changed, this, &Autosave::documentChanged);
     connect(&document, &Document::modifiedChanged, this, &Autosave::documentChanged);
+    connect(&document, &Document::settled, this, [this] {
+        if (mTyping && !mTimer.isActive()) mTimer.start();
+    });
 }
 
 Autosave::~Autosave() { remove(); }
@@ -33,7 +36,6 @@ void Autosave::documentChanged() {
 }
 
 std::optional<QString> Autosave::saveAtOnce() {
-    if (!mDocument.isModified()) return {};
     mTimer.stop();
     save();
     mWriter.waitForDone();
@@ -41,13 +43,29 @@ std::optional<QString> Autosave::saveAtOnce() {
     return mFailure;
 }
 
+/// What is to be kept; nothing when all of it is in the query's file.
+std::optional<files::QueryDocument> Autosave::wanted() const {
+    files::QueryDocument content = mFile.content();
+    if (mTyping) {
+        const auto copy = model::Query::restored(content.query->record());
+        if (mTyping(copy)) {
+            content.query = copy;
+            return content;
+        }
+    }
+    if (!mDocument.isModified()) return {};
+    return content;
+}
+
 void Autosave::save() {
+    const auto content = wanted();
+    if (!content) return remove();
     if (!mSlot) {
         auto made = AutosaveSlot::made(mFolder);
         if (!made) return tell(QString::fromStdString(made.error()));
         mSlot = std::move(*made);
     }
-    const auto bytes = Autosaved{mFile.path(), mFile.content(), mFile.origin()}.bytes();
+    const auto bytes = Autosaved{mFile.path(), *content, mFile.origin()}.bytes();
     if (!bytes) return tell(QString::fromStdString(bytes.error()));
     mWriter.start([this, file = mSlot->file(), content = *bytes] {
         const auto error = AutosaveSlot::write(file, content);

@@ -7,6 +7,7 @@
 #include <QTimer>
 
 #include <chrono>
+#include <functional>
 
 namespace designer {
 
@@ -28,6 +29,11 @@ public:
 
     /// Goes on with the file of one that was killed, whose query the document has now.
     void adopt(AutosaveSlot::Ptr slot);
+    /// Writes what is being typed, and in the query not yet, into a copy of it; false when nothing
+    /// is.
+    using Typing = std::function<bool(const platform::Ref<model::Query>& copy)>;
+    /// From now on that is kept too.
+    void setTyping(Typing typing) { mTyping = std::move(typing); }
     /// For a process that is ended from outside: writes what is modified and waits until it is on
     /// the disk. What went wrong, or nothing.
     std::optional<QString> saveAtOnce();
@@ -40,6 +46,7 @@ signals:
 
 private:
     void documentChanged();
+    std::optional<files::QueryDocument> wanted() const;
     void save();
     void remove();
     void tell(const QString& reason);
@@ -48,6 +55,7 @@ private:
     Document& mDocument;
     QueryFile& mFile;
     const QString mFolder;
+    Typing mTyping;
     AutosaveSlot::Ptr mSlot; ///< made when it is needed first
     QTimer mTimer;
     QThreadPool mWriter; ///< one thread, so that files are written in their order

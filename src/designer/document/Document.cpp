@@ -98,6 +98,7 @@ void Document::changedByControl() {
 void Document::settle() {
     mSettlesLater = false;
     if (record({})) emit changed();
+    emit settled();
 }
 
 bool Document::eventFilter(QObject*, QEvent* event) {

@@ -66,6 +66,8 @@ signals:
     /// The control must show the query anew, for it was not the control that changed it.
     void outdated();
     void modifiedChanged(bool modified);
+    /// A gesture or a key is over, whether or not it has changed the query.
+    void settled();
 
 private:
     /// False when there was nothing. Names the step after what changed when it gets no name.

@@ -1,5 +1,6 @@
 #include "designer/document/FileDialogs.h"
 
+#include "designer/PlainBox.h"
 #include "designer/document/Document.h"
 #include "designer/document/QueryFile.h"
 #include "designer/document/RecentFiles.h"
@@ -7,7 +8,6 @@
 
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QMessageBox>
 #include <QPushButton>
 #include <QScopedValueRollback>
 #include <QStandardPaths>
@@ -80,9 +80,9 @@ bool FileDialogs::saveAs() {
 
 bool FileDialogs::mayLose() {
     if (!mDocument.isModified()) return true;
-    QMessageBox box(QMessageBox::Warning, tr("Save query"),
-                    tr("Save the changes to \"%1\"?").arg(mFile.name()),
-                    QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel, &mWindow);
+    PlainBox box(QMessageBox::Warning, tr("Save query"),
+                 tr("Save the changes to \"%1\"?").arg(mFile.name()),
+                 QMessageBox::Save | QMessageBox::Discard | QMessageBox::Cancel, &mWindow);
     box.setInformativeText(tr("Changes that are not saved are lost."));
     box.setDefaultButton(QMessageBox::Save);
     switch (box.exec()) {
@@ -137,10 +137,9 @@ void FileDialogs::lookAtFile() {
 
 FileDialogs::Whose FileDialogs::ask(const QString& detail, const QString& mine,
                                     const QString& open) {
-    QMessageBox box(QMessageBox::Warning, tr("Changed file"),
-                    tr("Another program has changed \"%1\" since you opened it.").arg(mFile.name()),
-                    QMessageBox::NoButton, &mWindow);
-    box.setTextFormat(Qt::PlainText);
+    PlainBox box(QMessageBox::Warning, tr("Changed file"),
+                 tr("Another program has changed \"%1\" since you opened it.").arg(mFile.name()),
+                 QMessageBox::NoButton, &mWindow);
     box.setInformativeText(detail);
     const auto* theirs = box.addButton(tr("&Load the file"), QMessageBox::DestructiveRole);
     const auto* own = box.addButton(mine, QMessageBox::AcceptRole);
@@ -154,7 +153,7 @@ FileDialogs::Whose FileDialogs::ask(const QString& detail, const QString& mine,
 }
 
 void FileDialogs::tell(const QString& title, const QString& error) {
-    QMessageBox::warning(&mWindow, title, inWords(error));
+    PlainBox::warn(&mWindow, title, inWords(error));
 }
 
 } // namespace designer

@@ -1,6 +1,7 @@
 #include "designer/document/RecentMenu.h"
 
 #include "designer/document/RecentFiles.h"
+#include "platform/qt/ShownText.h"
 
 #include <QDir>
 #include <QFontMetrics>
@@ -15,7 +16,7 @@ QString shown(const QString& fileOrAddress, const QFontMetrics& metrics) {
     QString text = fileOrAddress;
     const QString home = QDir::homePath() + QLatin1Char('/');
     if (text.startsWith(home)) text.replace(0, home.size(), QStringLiteral("~/"));
-    return metrics.elidedText(text, Qt::ElideMiddle, widest)
+    return metrics.elidedText(platform::qt::asSigns(text), Qt::ElideMiddle, widest)
         .replace(QLatin1Char('&'), QLatin1String("&&"));
 }
 
@@ -38,7 +39,7 @@ void RecentMenu::fill() {
         const QString text = shown(entry, fontMetrics());
         // A digit as the letter to press; the tenth has none left but 0.
         QAction* action = addAction(QStringLiteral("&%1  %2").arg(++number % 10).arg(text));
-        action->setToolTip(entry);
+        action->setToolTip(platform::qt::asToolTip(entry));
         action->setEnabled(RecentFiles::isThere(entry));
         connect(action, &QAction::triggered, this, [this, entry] { emit chosen(entry); });
     }

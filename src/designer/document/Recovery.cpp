@@ -1,12 +1,12 @@
 #include "designer/document/Recovery.h"
 
+#include "designer/PlainBox.h"
 #include "designer/document/Autosave.h"
 #include "designer/document/QueryFile.h"
 
 #include <QCoreApplication>
 #include <QFileInfo>
 #include <QLocale>
-#include <QMessageBox>
 #include <QPushButton>
 
 namespace designer {
@@ -24,8 +24,8 @@ public:
             path.isEmpty()
                 ? tr("A query was drawn and never saved.")
                 : tr("\"%1\" has changes that were not saved.").arg(QFileInfo(path).fileName());
-        QMessageBox box(QMessageBox::Question, tr("Recover query"), text, QMessageBox::NoButton,
-                        window);
+        PlainBox box(QMessageBox::Question, tr("Recover query"), text, QMessageBox::NoButton,
+                     window);
         box.setInformativeText(
             tr("The designer ended unexpectedly. The changes up to %1 can be recovered.")
                 .arg(QLocale().toString(saved, QLocale::ShortFormat)));

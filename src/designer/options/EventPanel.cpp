@@ -2,6 +2,7 @@
 
 #include "control/Interface.h"
 #include "designer/options/EventWords.h"
+#include "platform/qt/ShownText.h"
 #include "platform/qt/Text.h"
 #include "platform/qt/ZandorWidget.h"
 #include "platform/qt/ZandorWindowMessage.h"
@@ -18,6 +19,9 @@
 #include <QTreeWidget>
 
 namespace designer {
+
+using platform::qt::asSigns;
+using platform::qt::asToolTip;
 
 namespace {
 
@@ -117,10 +121,10 @@ void EventPanel::add(const QString& name, const QString& number, const QString& 
     const bool atEnd = bar->value() == bar->maximum();
     auto* const item =
         new QTreeWidgetItem(mEvents, {QTime::currentTime().toString(QStringLiteral("HH:mm:ss.zzz")),
-                                      number, name, arguments});
+                                      number, name, asSigns(arguments)});
     item->setTextAlignment(numberColumn, Qt::AlignRight | Qt::AlignVCenter);
-    item->setToolTip(nameColumn, name);
-    item->setToolTip(argumentsColumn, arguments);
+    item->setToolTip(nameColumn, asToolTip(name));
+    item->setToolTip(argumentsColumn, asToolTip(arguments));
     while (mEvents->topLevelItemCount() > mostEvents) delete mEvents->takeTopLevelItem(0);
     // Who has scrolled back reads there.
     if (atEnd) mEvents->scrollToBottom();

@@ -1,6 +1,7 @@
 #include "designer/options/FlagsPage.h"
 
 #include "designer/options/ControlOptions.h"
+#include "platform/qt/ShownText.h"
 
 #include <QBoxLayout>
 #include <QCheckBox>
@@ -66,9 +67,9 @@ void FlagsPage::addOffer(QVBoxLayout& layout, const QString& title, const QStrin
 void FlagsPage::addFlag(QLayout& layout, const ControlProperty& property) {
     auto* const box = new QCheckBox(wordsFor(property));
     box->setObjectName(property.name);
-    box->setToolTip(property.also.isEmpty()
-                        ? property.name
-                        : QStringLiteral("%1, %2").arg(property.name, property.also));
+    box->setToolTip(platform::qt::asToolTip(
+        property.also.isEmpty() ? QString(property.name)
+                                : QStringLiteral("%1, %2").arg(property.name, property.also)));
     layout.addWidget(box);
     mFlags.push_back({&property, box});
     connect(box, &QCheckBox::clicked, this, [this] {

@@ -3,6 +3,7 @@
 #include "designer/options/ControlOptions.h"
 #include "designer/options/ControlProperties.h"
 #include "designer/options/ControlTexts.h"
+#include "platform/qt/ShownText.h"
 
 #include <QBoxLayout>
 #include <QHeaderView>
@@ -50,7 +51,8 @@ TextsPage::TextsPage(QWidget* parent) : QWidget(parent), mTable(new QTableWidget
         const ControlProperty& property = *properties[static_cast<std::size_t>(row)];
         auto* const use = new QTableWidgetItem(wordsFor(property));
         use->setFlags(Qt::ItemIsEnabled | Qt::ItemIsSelectable);
-        use->setToolTip(QStringLiteral("%1\n%2").arg(use->text(), property.name));
+        use->setToolTip(
+            platform::qt::asToolTip(QStringLiteral("%1\n%2").arg(use->text(), property.name)));
         mTable->setItem(row, useColumn, use);
         mTable->setItem(row, textColumn, new QTableWidgetItem);
     }

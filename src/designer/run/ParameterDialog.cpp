@@ -1,5 +1,7 @@
 #include "designer/run/ParameterDialog.h"
 
+#include "platform/qt/ShownText.h"
+
 #include <QDialogButtonBox>
 #include <QEvent>
 #include <QFormLayout>
@@ -62,7 +64,7 @@ ParameterDialog::ParameterDialog(std::vector<Question> questions, const Answers&
         auto* const field = new QLineEdit(answers.value(question.name));
         field->setObjectName(question.name);
         field->setPlaceholderText(wanted(question));
-        field->setToolTip(wanted(question));
+        field->setToolTip(platform::qt::asToolTip(wanted(question)));
         field->setMinimumWidth(std::max(field->fontMetrics().horizontalAdvance(wanted(question)),
                                         field->fontMetrics().averageCharWidth() * fieldCharacters) +
                                24);
@@ -70,7 +72,7 @@ ParameterDialog::ParameterDialog(std::vector<Question> questions, const Answers&
         connect(field, &QLineEdit::textChanged, this, &ParameterDialog::check);
         auto* const label = new QLabel;
         label->setTextFormat(Qt::PlainText);
-        label->setText(QString(question.name).replace(u'&', QStringLiteral("&&")));
+        label->setText(platform::qt::asSigns(question.name).replace(u'&', QStringLiteral("&&")));
         label->setWordWrap(label->sizeHint().width() > widestForm / 2);
         label->setBuddy(field);
         rows->addRow(label, field);
@@ -114,7 +116,8 @@ void ParameterDialog::check() {
     QString complaint;
     for (std::size_t i = 0; complaint.isEmpty() && i < mFields.size(); ++i)
         if (!fits(mQuestions[i], mFields[i]->text()))
-            complaint = tr("%1 has to be %2.").arg(mQuestions[i].name, wanted(mQuestions[i]));
+            complaint = tr("%1 has to be %2.")
+                            .arg(platform::qt::asSigns(mQuestions[i].name), wanted(mQuestions[i]));
     mComplaint->setText(complaint);
     mButtons->button(QDialogButtonBox::Ok)->setEnabled(complaint.isEmpty());
 }

@@ -1,5 +1,7 @@
 #include "designer/run/ResultModel.h"
 
+#include "platform/qt/ShownText.h"
+
 #include <QApplication>
 #include <QFont>
 #include <QLocale>
@@ -11,6 +13,9 @@
 #include <set>
 
 namespace designer {
+
+using platform::qt::asSigns;
+using platform::qt::asToolTip;
 
 namespace {
 
@@ -87,9 +92,9 @@ QVariant ResultModel::data(const QModelIndex& index, int role) const {
     case Qt::DisplayRole: {
         const Cell value = cell(index);
         if (value.kind == Cell::Kind::null) return QStringLiteral("NULL");
-        return readable(value).left(mostShown).simplified();
+        return asSigns(readable(value).left(mostShown).simplified());
     }
-    case Qt::ToolTipRole: return readable(cell(index));
+    case Qt::ToolTipRole: return asToolTip(readable(cell(index)));
     case Qt::TextAlignmentRole: {
         const bool number = cell(index).kind == Cell::Kind::number;
         return QVariant(Qt::AlignVCenter | (number ? Qt::AlignRight : Qt::AlignLeft));
@@ -106,10 +111,11 @@ QVariant ResultModel::data(const QModelIndex& index, int role) const {
 QVariant ResultModel::headerData(int section, Qt::Orientation orientation, int role) const {
     if (orientation == Qt::Vertical)
         return role == Qt::DisplayRole ? QVariant(QLocale().toString(section + 1)) : QVariant();
-    if (role == Qt::DisplayRole) return mColumns.value(section);
+    if (role == Qt::DisplayRole) return asSigns(mColumns.value(section)).left(mostShown);
     if (role == Qt::ToolTipRole)
-        return tr("%1\nClick to sort the rows that are shown; the query stays as it is.")
-            .arg(mColumns.value(section));
+        return asToolTip(
+            tr("%1\nClick to sort the rows that are shown; the query stays as it is.")
+                .arg(asSigns(mColumns.value(section))));
     return {};
 }
 

@@ -8,7 +8,6 @@
 #include <QKeyEvent>
 #include <QSignalBlocker>
 #include <QStyledItemDelegate>
-#include <QTextDocument>
 #include <QToolTip>
 
 namespace designer {
@@ -17,6 +16,7 @@ namespace {
 
 constexpr int widestColumn = 320; // logical pixels
 constexpr int narrowestColumn = 48;
+constexpr int widestByHand = 1200;
 constexpr int roomInARow = 8;
 
 /// Shows a tip where a text is cut off.
@@ -33,8 +33,7 @@ public:
             QToolTip::hideText();
             return false;
         }
-        // As rich text it is wrapped.
-        QToolTip::showText(event->globalPos(), Qt::convertFromPlainText(text), view);
+        QToolTip::showText(event->globalPos(), text, view);
         return true;
     }
 };
@@ -61,6 +60,7 @@ ResultTable::ResultTable(QWidget* parent)
     horizontalHeader()->setHighlightSections(false);
     horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     horizontalHeader()->setMinimumSectionSize(narrowestColumn);
+    horizontalHeader()->setMaximumSectionSize(widestByHand);
 
     // A click goes from smallest first over largest first back to how the rows came.
     horizontalHeader()->setSortIndicatorClearable(true);

@@ -1,5 +1,6 @@
 #include "designer/run/ResultsPanel.h"
 
+#include "designer/PlainBox.h"
 #include "designer/database/Database.h"
 #include "designer/database/patiently.h"
 #include "designer/document/Document.h"
@@ -7,6 +8,7 @@
 #include "designer/run/ParameterDialog.h"
 #include "designer/run/ResultTable.h"
 #include "designer/statement/ModelWords.h"
+#include "platform/qt/ShownText.h"
 
 #include <QAction>
 #include <QComboBox>
@@ -283,7 +285,7 @@ void ResultsPanel::sort(int column, Qt::SortOrder direction) {
 }
 
 void ResultsPanel::showMessage(const QString& text, const QString& statement) {
-    mMessage->setText(text);
+    mMessage->setText(linesAsSigns(text));
     mMessageStatement->setPlainText(statement);
     mMessageStatement->setVisible(!statement.isEmpty());
     mPages->setCurrentIndex(0);
@@ -301,8 +303,8 @@ void ResultsPanel::showStatus() {
     if (!mSorting.isEmpty()) parts << mSorting;
     if (mOutdated) parts << tr("the drawing has changed since");
     const QString text = parts.join(QStringLiteral(" \u00b7 "));
-    mStatus->setText(text);
-    mStatus->setToolTip(text);
+    mStatus->setText(platform::qt::asSigns(text));
+    mStatus->setToolTip(platform::qt::asToolTip(text));
 }
 
 QString ResultsPanel::seconds() const {

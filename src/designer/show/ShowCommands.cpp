@@ -1,6 +1,7 @@
 #include "designer/show/ShowCommands.h"
 
 #include "designer/DrawingArea.h"
+#include "designer/PlainBox.h"
 #include "designer/document/Document.h"
 #include "designer/document/QueryFile.h"
 #include "designer/show/DrawingPicture.h"
@@ -12,7 +13,6 @@
 #include <QFileInfo>
 #include <QGuiApplication>
 #include <QImage>
-#include <QMessageBox>
 #include <QPrintDialog>
 #include <QPrinter>
 #include <QSettings>
@@ -85,7 +85,7 @@ void ShowCommands::askForFile() {
     dialog.selectFile(proposed.fileName());
     if (dialog.exec() != QDialog::Accepted) return;
     if (const auto error = savePicture(picture(), dialog.selectedFiles().value(0)))
-        QMessageBox::warning(&mWindow, tr("Export drawing"), *error);
+        PlainBox::warn(&mWindow, tr("Export drawing"), *error);
 }
 
 void ShowCommands::askForPrinter() {
@@ -95,7 +95,7 @@ void ShowCommands::askForPrinter() {
     QPrintDialog dialog(&printer, &mWindow);
     if (dialog.exec() != QDialog::Accepted) return;
     if (const auto error = printPicture(picture(), printer))
-        QMessageBox::warning(&mWindow, tr("Print"), *error);
+        PlainBox::warn(&mWindow, tr("Print"), *error);
 }
 
 void ShowCommands::copy() {

@@ -4,6 +4,7 @@
 #include "designer/statement/ModelWords.h"
 #include "designer/statement/SqlView.h"
 #include "model/sql/Builder.h"
+#include "platform/qt/ShownText.h"
 #include "platform/qt/Text.h"
 
 #include <QBoxLayout>
@@ -163,7 +164,7 @@ void StatementPanel::showFindings(const model::Findings& findings) {
         auto* const item =
             new QListWidgetItem(style()->standardIcon(error ? QStyle::SP_MessageBoxCritical
                                                             : QStyle::SP_MessageBoxWarning),
-                                inWords(toQt(finding.text)), mList);
+                                platform::qt::asSigns(inWords(toQt(finding.text))), mList);
         item->setData(Qt::AccessibleTextRole,
                       (error ? tr("Error: %1") : tr("Warning: %1")).arg(item->text()));
     }

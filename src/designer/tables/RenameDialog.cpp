@@ -1,6 +1,7 @@
 #include "designer/tables/RenameDialog.h"
 
 #include "designer/document/Document.h"
+#include "platform/qt/ShownText.h"
 
 #include <QComboBox>
 #include <QDialogButtonBox>
@@ -20,6 +21,7 @@ RenameDialog::RenameDialog(Document& document, QWidget* parent)
     mFault->setObjectName(QStringLiteral("renameFault"));
     for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(document.query()->Tables()))
         mTables->addItem(QString::fromStdU16String(table->Name()));
+    mFault->setTextFormat(Qt::PlainText);
     mFault->setWordWrap(true);
 
     auto* const buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel);
@@ -50,7 +52,7 @@ void RenameDialog::chooseTable() {
 }
 
 void RenameDialog::showFault(const QString& fault) {
-    mFault->setText(fault);
+    mFault->setText(platform::qt::asSigns(fault));
     mFault->setVisible(!fault.isEmpty());
 }
 

@@ -1,12 +1,15 @@
 #include "designer/tables/TableListModel.h"
 
 #include "designer/tables/tableMime.h"
+#include "platform/qt/ShownText.h"
 
 #include <QMimeData>
 
 #include <algorithm>
 
 namespace designer {
+
+using platform::qt::asSigns;
 
 namespace {
 
@@ -65,14 +68,15 @@ QVariant TableListModel::data(const QModelIndex& index, int role) const {
     if (!checkIndex(index, CheckIndexOption::IndexIsValid)) return {};
     const reader::TableEntry& table = entry(index.row());
     switch (role) {
-    case Qt::DisplayRole: return qtText(table.id.name);
-    case SchemaRole: return qtText(table.id.schema);
+    case Qt::DisplayRole: return asSigns(qtText(table.id.name));
+    case SchemaRole: return asSigns(qtText(table.id.schema));
     case IsViewRole: return table.isView;
     case Qt::AccessibleTextRole: {
         const QString name = table.id.schema.empty()
                                  ? qtText(table.id.name)
                                  : qtText(table.id.schema) + u'.' + qtText(table.id.name);
-        return table.isView ? tr("%1, view").arg(name) : tr("%1, table").arg(name);
+        return table.isView ? tr("%1, view").arg(asSigns(name))
+                            : tr("%1, table").arg(asSigns(name));
     }
     default: return {};
     }

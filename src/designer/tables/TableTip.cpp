@@ -2,6 +2,7 @@
 
 #include "designer/database/patiently.h"
 #include "designer/tables/TableListModel.h"
+#include "platform/qt/ShownText.h"
 
 #include <QCoreApplication>
 #include <QFuture>
@@ -15,7 +16,13 @@ namespace {
 
 constexpr std::size_t mostColumns = 24; // a tip that fits on a small screen
 
-QString qtText(const platform::String& text) { return QString::fromStdU16String(text); }
+constexpr qsizetype widest = 60; // characters of a name
+
+/// A name in a tip, which is HTML.
+QString inTip(const platform::String& name) {
+    const QString shown = platform::qt::asSigns(QString::fromStdU16String(name));
+    return (shown.size() > widest ? shown.left(widest - 1) + u'\u2026' : shown).toHtmlEscaped();
+}
 
 } // namespace
 
@@ -45,9 +52,9 @@ bool TableTip::eventFilter(QObject*, QEvent* event) {
 
 void TableTip::show(const reader::TableEntry& table, QPoint at) {
     const auto columns = mDatabase.reader().table(table.id);
-    QToolTip::showText(at,
-                       columns ? tipText(*columns, table.isView) : columns.error().toHtmlEscaped(),
-                       mList.viewport());
+    QToolTip::showText(
+        at, columns ? tipText(*columns, table.isView) : platform::qt::asToolTip(columns.error()),
+        mList.viewport());
 }
 
 void TableTip::read(const reader::TableEntry& table, QPoint at) {
@@ -66,7 +73,7 @@ QString tipText(const model::TableDescription& table, bool isView) {
     const auto text = [](const char* words) {
         return QCoreApplication::translate("designer::TableTip", words);
     };
-    const QString name = qtText(table.name).toHtmlEscaped();
+    const QString name = inTip(table.name);
     QString tip =
         QStringLiteral("<p style='white-space:pre'><b>%1</b></p><table>")
             .arg(isView ? text(QT_TRANSLATE_NOOP("designer::TableTip", "%1 (view)")).arg(name)
@@ -74,10 +81,10 @@ QString tipText(const model::TableDescription& table, bool isView) {
     const std::size_t shown = std::min(table.columns.size(), mostColumns);
     for (std::size_t n = 0; n < shown; ++n) {
         const auto& column = table.columns[n];
-        const QString own = qtText(column.name).toHtmlEscaped();
+        const QString own = inTip(column.name);
         tip += QStringLiteral("<tr><td>%1&nbsp;&nbsp;</td><td>%2</td></tr>")
                    .arg(column.primaryKey ? QStringLiteral("<u>%1</u>").arg(own) : own,
-                        qtText(column.declaredType).toHtmlEscaped());
+                        inTip(column.declaredType));
     }
     tip += QStringLiteral("</table>");
     if (shown < table.columns.size())

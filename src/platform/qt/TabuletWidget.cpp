@@ -12,6 +12,7 @@
 #include <QPainter>
 #include <QPointer>
 #include <QScrollBar>
+#include <QToolTip>
 
 #include <cmath>
 
@@ -82,6 +83,25 @@ private:
     TabuletWidget& mBox;
 };
 
+/// A triangle with a mark in it, on whatever colour.
+void paintWarning(QPainter& painter, const QRectF& place) {
+    painter.save();
+    painter.setRenderHint(QPainter::Antialiasing);
+    const QColor amber(0xf5, 0xb8, 0x1c);
+    const QColor dark(0x3c, 0x2f, 0x08);
+    painter.setPen(QPen(dark, 1, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
+    painter.setBrush(amber);
+    painter.drawPolygon(QPolygonF{{place.center().x(), place.top()},
+                                  {place.right(), place.bottom()},
+                                  {place.left(), place.bottom()}});
+    const QPointF middle(place.center().x(), place.top());
+    const qreal high = place.height();
+    painter.setPen(QPen(dark, high / 8, Qt::SolidLine, Qt::RoundCap));
+    painter.drawLine(middle + QPointF(0, high * 0.38), middle + QPointF(0, high * 0.62));
+    painter.drawPoint(middle + QPointF(0, high * 0.82));
+    painter.restore();
+}
+
 Qt::CursorShape cursorFor(Qt::Edges edges) {
     const bool sideways = edges & (Qt::LeftEdge | Qt::RightEdge);
     const bool upright = edges & (Qt::TopEdge | Qt::BottomEdge);
@@ -124,6 +144,14 @@ void TabuletWidget::setTitle(const QString& title) {
     update(titleBar());
 }
 
+void TabuletWidget::setNote(const QString& note) {
+    if (mNote == note) return;
+    mNote = note;
+    setAccessibleDescription(asSigns(note));
+    mList->setAccessibleDescription(asSigns(note));
+    update(titleBar());
+}
+
 void TabuletWidget::setCurrent(bool current) {
     if (mCurrent == current) return;
     mCurrent = current;
@@ -132,6 +160,18 @@ void TabuletWidget::setCurrent(bool current) {
 
 QSize TabuletWidget::smallest() const {
     return {mTitleHeight * 3, mTitleHeight + mList->rowHeight() + border};
+}
+
+QRect TabuletWidget::titlePlace() const {
+    const int sign = mNote.isEmpty() ? 0 : mTitleHeight - 4;
+    return titleBar().adjusted(border + 4 + sign, 0, -mTitleHeight, 0);
+}
+
+QFont TabuletWidget::titleFont() const {
+    QFont bold = font();
+    bold.setWeight(QFont::DemiBold);
+    bold.setStrikeOut(!mNote.isEmpty());
+    return bold;
 }
 
 QRect TabuletWidget::titleBar() const { return {0, 0, width(), mTitleHeight}; }
@@ -162,14 +202,15 @@ void TabuletWidget::paintEvent(QPaintEvent*) {
     painter.fillRect(rect(), palette().base());
     painter.fillRect(titleBar(), colours.back);
 
-    QFont bold = font();
-    bold.setWeight(QFont::DemiBold);
+    const QFont bold = titleFont();
     painter.setFont(bold);
     painter.setPen(colours.text);
-    const QRect place = titleBar().adjusted(border + 4, 0, -mTitleHeight, 0);
+    const QRect place = titlePlace();
     painter.setLayoutDirection(asItReads);
     painter.drawText(place, static_cast<int>(atTheLeft) | Qt::TextSingleLine,
                      QFontMetrics(bold).elidedText(mTitle, Qt::ElideRight, place.width()));
+    if (!mNote.isEmpty())
+        paintWarning(painter, {border + 4, 5, mTitleHeight - 10, mTitleHeight - 10});
 
     painter.setPen(colours.frame);
     painter.drawRect(rect().adjusted(0, 0, -1, -1));
@@ -178,11 +219,10 @@ void TabuletWidget::paintEvent(QPaintEvent*) {
 bool TabuletWidget::event(QEvent* event) {
     if (event->type() == QEvent::ToolTip) {
         const auto& help = *static_cast<QHelpEvent*>(event);
-        QFont bold = font();
-        bold.setWeight(QFont::DemiBold);
-        if (titleBar().contains(help.pos()))
-            showElisionToolTip(help, *this, mTitle, bold,
-                               titleBar().adjusted(border + 4, 0, -mTitleHeight, 0));
+        if (titleBar().contains(help.pos()) && !mNote.isEmpty())
+            QToolTip::showText(help.globalPos(), asToolTip(mNote), this, titleBar());
+        else if (titleBar().contains(help.pos()))
+            showElisionToolTip(help, *this, mTitle, titleFont(), titlePlace());
         return true;
     }
     return QWidget::event(event);

@@ -42,6 +42,9 @@ public:
     void setTitle(const QString& title);
     /// As it is shown.
     const QString& title() const { return mTitle; }
+    /// What is wrong with the table, as a sign in its title and a tooltip over it; empty: nothing.
+    void setNote(const QString& note);
+    const QString& note() const { return mNote; }
     void setCurrent(bool current);
     bool isCurrent() const { return mCurrent; }
 
@@ -70,6 +73,8 @@ private:
     enum class Gesture { none, move, resize };
 
     void measure();
+    QRect titlePlace() const;
+    QFont titleFont() const;
     void arrange();
     Qt::Edges edgesAt(QPoint at) const;
     void endGesture();
@@ -83,6 +88,7 @@ private:
     ColumnListView* mList;
     QAbstractButton* mClose;
     QString mTitle;
+    QString mNote;
     bool mCurrent = false;
     int mTitleHeight = 0;
     Gesture mGesture = Gesture::none;

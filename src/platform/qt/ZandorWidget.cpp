@@ -4,6 +4,8 @@
 #include "platform/qt/CanvasItems.h"
 #include "platform/qt/JoinName.h"
 #include "platform/qt/QtToolkit.h"
+#include "platform/qt/ShownText.h"
+#include "platform/qt/TabuletWidget.h"
 #include "platform/qt/Text.h"
 
 #include <QKeyEvent>
@@ -119,6 +121,18 @@ bool ZandorWidget::showCell(const QString& definition, int row) {
 }
 
 void ZandorWidget::takeOver() { mToolkit->comforts().takeOver(); }
+
+bool ZandorWidget::writeTyping(const ZandorModel& copy) {
+    return mToolkit->comforts().writeTyping(copy);
+}
+
+void ZandorWidget::setTableNotes(const QMap<QString, QString>& notes) {
+    QMap<QString, QString> byTitle;
+    for (auto note = notes.begin(); note != notes.end(); ++note)
+        byTitle[platform::qt::asSigns(note.key())] = note.value();
+    for (auto* const box : findChildren<platform::qt::TabuletWidget*>())
+        box->setNote(byTitle.value(box->title()));
+}
 
 QSize ZandorWidget::sizeHint() const { return {900, 600}; }
 

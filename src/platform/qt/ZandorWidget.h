@@ -4,6 +4,7 @@
 #include "comforts/Flags.h"
 #include "control/Zandor.h"
 
+#include <QMap>
 #include <QWidget>
 
 #include <memory>
@@ -124,6 +125,15 @@ public:
     /// by itself when the user turns to something else in its window, shortcuts included; hosts
     /// that are about to run, save or close the query for another reason call it first.
     void takeOver();
+    /// With that comfort, writes what stands in an open text editor into the definition of the same
+    /// key of another model, such as a copy that is kept safe; the editor stays open and the query
+    /// as it is. Returns whether there was anything that is not in the query yet.
+    bool writeTyping(const ZandorModel& copy);
+
+    /// Marks tables on the canvas, by their names, as ones that something is wrong with; the note
+    /// says what, as a tooltip and to screen readers. Tables that are not named lose their mark,
+    /// and one that comes later has none.
+    void setTableNotes(const QMap<QString, QString>& notes);
 
     /// What there is to say about cells of the grid, each shown at its cell, as a mark and in the
     /// tooltip; cells that are not named have nothing. Stays until it is set anew, and goes with
