@@ -129,7 +129,7 @@ Without a window, over a file of a query:
   --version, -v    show the version
 
 Exit codes: 0 all well, 1 the picture could not be written or the query
-not be run, 2 the arguments, a file or the database cannot be used.
+not be run, 2 the arguments, a file, the database or the output cannot be used.
 )");
 }
 

@@ -210,7 +210,7 @@ void TabuletWidget::paintEvent(QPaintEvent*) {
     painter.drawText(place, static_cast<int>(atTheLeft) | Qt::TextSingleLine,
                      QFontMetrics(bold).elidedText(mTitle, Qt::ElideRight, place.width()));
     if (!mNote.isEmpty())
-        paintWarning(painter, {border + 4, 5, mTitleHeight - 10, mTitleHeight - 10});
+        paintWarning(painter, QRect(border + 4, 5, mTitleHeight - 10, mTitleHeight - 10));
 
     painter.setPen(colours.frame);
     painter.drawRect(rect().adjusted(0, 0, -1, -1));
