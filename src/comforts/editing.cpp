@@ -72,8 +72,7 @@ bool Comforts::writeTyping(const platform::Ref<TalvikZandorLib::Zandor>& copy) {
         if (text == mTyping->value || column == 0) return false;
         const auto definition = door.definitionOf(column);
         if (!definition) return false;
-        door.store(copy->ColumnDefinitions().Item(definition->Key()), mTyping->row, text);
-        return true;
+        return door.store(copy->ColumnDefinitions().Item(definition->Key()), mTyping->row, text);
     });
 }
 

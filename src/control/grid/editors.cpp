@@ -127,7 +127,6 @@ bool Zandor::StoreText(const Held<ZDColumnDefinition>& definition, std::int32_t 
         definition->Synonym(text);
         return true;
     }
-    if (row < firstCriteriaRow) return false;
     const String key = platform::decimal(row);
     if (!definition->HasCriterium(key)) {
         if (text.empty()) return false;
