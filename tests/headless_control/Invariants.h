@@ -24,6 +24,8 @@ public:
     /// when another model is bound, so that they may outlive their definitions, or bear the number
     /// of another's.
     void abandonColumns();
+    /// Remembers what the control holds now.
+    void watch() { watchElements(); }
     /// What the control held has been destroyed.
     std::string survivors() const;
 

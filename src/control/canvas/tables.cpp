@@ -21,22 +21,30 @@ Held<TalvikTabulet::Tabulet> Zandor::ShowTable(std::int16_t slot, const Held<ZDT
                                                std::int32_t& cascade) {
     lstTable.Load(slot);
     const auto element = Hold(lstTable(slot));
-    element->Text(table->Name());
-    element->Tag(table->Key());
+    const String name = table->Name();
+    element->Text(name);
+    const String key = table->Key();
+    element->Tag(key);
 
     // A table without place and size of its own takes two steps of the cascade.
-    const auto asked = [&](std::int32_t (ZDTable::*side)() const) { return ((*table).*side)(); };
+    const auto asked = [&](std::int32_t (ZDTable::*side)() const) {
+        return static_cast<float>(((*table).*side)());
+    };
     if (asked(&ZDTable::Left) >= 0 && asked(&ZDTable::Top) >= 0) {
-        element->Left(static_cast<float>(asked(&ZDTable::Left)));
-        element->Top(static_cast<float>(asked(&ZDTable::Top)));
+        const float left = asked(&ZDTable::Left);
+        element->Left(left);
+        const float top = asked(&ZDTable::Top);
+        element->Top(top);
     } else {
         ++cascade;
         element->Left(static_cast<float>(cascade * 120));
         element->Top(static_cast<float>(cascade * 120));
     }
     if (asked(&ZDTable::Width) > 0 && asked(&ZDTable::Height) > 0) {
-        element->Width(static_cast<float>(asked(&ZDTable::Width)));
-        element->Height(static_cast<float>(asked(&ZDTable::Height)));
+        const float width = asked(&ZDTable::Width);
+        element->Width(width);
+        const float height = asked(&ZDTable::Height);
+        element->Height(height);
     } else {
         ++cascade;
         element->Width(2000);

@@ -159,8 +159,13 @@ void Zandor::mnuColumnDefinitionDelete_Click() {
         // The host may have shown its model anew when it was asked.
         require(mModel == model.pointer() && sprColumn->ColData(column) == number);
         RemoveColumn(column);
+        const std::int32_t binding = mBinding;
         const String key = definition->Key();
         List(model, &TalvikZandorLib::Zandor::ColumnDefinitions).Remove(key);
+        // A host that showed its model anew on the way has shown the column once more.
+        if (binding != mBinding && mModel == model.pointer())
+            for (std::int32_t i = 1; i < sprColumn->Cols(); ++i)
+                if (sprColumn->ColData(i) == number) RemoveColumn(i);
         Raise(Event::ColumnRemoved, {.Definition = definition});
     });
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <exception>
+#include <functional>
 #include <map>
 #include <string>
 #include <vector>
@@ -26,10 +27,14 @@ public:
     const std::vector<std::string>& calls() const { return mCalls; }
     void forget() { mCalls.clear(); }
 
+    /// Called with the name of each call before it does anything.
+    std::function<void(const std::string& call)> onPass;
+
     /// False while nobody asks for names: the caller need not make one.
-    bool listening() const { return mRemembering || !mArmed.empty(); }
+    bool listening() const { return mRemembering || !mArmed.empty() || onPass; }
 
     void pass(const std::string& call) {
+        if (onPass) onPass(call);
         if (mRemembering) mCalls.push_back(call);
         const auto armed = mArmed.find(call);
         if (armed == mArmed.end() || --armed->second.countdown > 0) return;

@@ -199,6 +199,7 @@ void Toolkit::endDragOf(const Tabulet* table) {
 }
 
 void Toolkit::close() {
+    mClosed = true;
     for (Dialog* dialog : mDialogs) dialog->dismiss();
     mSurface.hide();
 }
@@ -209,7 +210,7 @@ std::string Toolkit::openMenu(const PopupMenu& menu) {
         ~Open() { flag = false; }
         bool& flag;
     } const open(mMenuOpen);
-    return onMenu ? onMenu(menu) : std::string();
+    return onMenu && !mClosed ? onMenu(menu) : std::string();
 }
 
 void Toolkit::runModal(Dialog& dialog) {
@@ -225,7 +226,8 @@ void Toolkit::runModal(Dialog& dialog) {
         std::vector<Dialog*>& dialogs;
     } const open(mDialogs, dialog);
 
-    if (onDialog) onDialog(dialog);
+    if (mClosed) dialog.dismiss();
+    if (onDialog && !mClosed) onDialog(dialog);
     if (dialog.shown()) dialog.close();
 
     // The window behind is active again, with the focus where it was and no event of it.

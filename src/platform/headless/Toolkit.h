@@ -143,6 +143,7 @@ private:
     std::vector<WindowMessage> mMessages;
     std::vector<String> mRegistered;
     bool mMenuOpen = false;
+    bool mClosed = false;
     Surface mSurface;
 };
 

@@ -167,14 +167,15 @@ void User::closeDialog() {
 
 Tabulet& User::dragFrame(const std::string& name, const Bounds& by) {
     if (auto& table = reach<Tabulet>(name); table.usable()) table.takeFocus();
-    auto& table = reach<Tabulet>(name);
-    const Bounds start = table.placement();
+    const Bounds start = reach<Tabulet>(name).placement();
     for (const float part : {0.5F, 1.0F}) {
+        // What the step before told may have taken the table away.
+        auto& table = reach<Tabulet>(name);
         table.drag({start.Left + part * by.Left, start.Top + part * by.Top,
                     start.Width + part * by.Width, start.Height + part * by.Height});
         if (table.events.Moving) table.events.Moving(table.index);
     }
-    return table;
+    return reach<Tabulet>(name);
 }
 
 void User::moveTable(const std::string& name, float left, float top) {

@@ -62,9 +62,9 @@ void User::pressEntry(const std::string& name, std::int32_t entry, std::int16_t 
         table.entry(entry).select(!mPress.selected);
     else if (!mPress.selected)
         selectOnly(table, entry);
+    const auto told = table.entries()[std::size_t(entry) - 1];
     if (table.events.ColumnMouseDown)
-        table.events.ColumnMouseDown(table.index, table.entries()[std::size_t(entry) - 1], button,
-                                     shift);
+        table.events.ColumnMouseDown(table.index, told, button, shift);
 }
 
 void User::moveOverEntry(const std::string& name, std::int32_t entry, std::int16_t button,
@@ -72,9 +72,9 @@ void User::moveOverEntry(const std::string& name, std::int32_t entry, std::int16
     auto& table = reachEntry(name, entry);
     const std::int32_t told = mPress.table == name ? mPress.entry : entry;
     if (told < 1 || std::size_t(told) > table.entries().size()) return;
+    const auto item = table.entries()[std::size_t(told) - 1];
     if (table.events.ColumnMouseMove)
-        table.events.ColumnMouseMove(table.index, table.entries()[std::size_t(told) - 1], button,
-                                     shift);
+        table.events.ColumnMouseMove(table.index, item, button, shift);
 }
 
 void User::releaseEntry(const std::string& name, std::int32_t entry, std::int16_t button,
@@ -95,9 +95,8 @@ void User::releaseEntry(const std::string& name, std::int32_t entry, std::int16_
         table = &mToolkit.find<Tabulet>(name);
         if (std::size_t(entry) > table->entries().size()) return;
     }
-    if (table->events.ColumnMouseUp)
-        table->events.ColumnMouseUp(table->index, table->entries()[std::size_t(entry) - 1], button,
-                                    shift);
+    const auto told = table->entries()[std::size_t(entry) - 1];
+    if (table->events.ColumnMouseUp) table->events.ColumnMouseUp(table->index, told, button, shift);
 }
 
 void User::doubleClickEntry(const std::string& name, std::int32_t entry) {
@@ -130,17 +129,20 @@ void User::dragOver(const std::string& name, float X, float Y) {
 void User::dropOn(const std::string& target, float X, float Y) {
     auto& element = reach<Element>(target);
     if (!mToolkit.dragged()) return;
-    auto* const table = dynamic_cast<Tabulet*>(&element);
-    if (table)
+    const bool onTable = dynamic_cast<Tabulet*>(&element) != nullptr;
+    if (onTable)
         dragOver(target, X, Y);
     else
         leaveDragTarget();
     mDragTarget.clear();
     Tabulet* const source = mToolkit.dragged();
     mToolkit.endDragOf(source);
-    if (table) {
-        if (table->events.DragDrop) table->events.DragDrop(table->index, source, X, Y);
-    } else if (auto* grid = dynamic_cast<Grid*>(&element); grid && grid->events.DragDrop) {
+    if (!source) return;
+    if (onTable) {
+        auto& table = reach<Tabulet>(target);
+        if (table.events.DragDrop) table.events.DragDrop(table.index, source, X, Y);
+    } else if (auto* grid = dynamic_cast<Grid*>(&reach<Element>(target));
+               grid && grid->events.DragDrop) {
         grid->events.DragDrop(source, X, Y);
     }
 }

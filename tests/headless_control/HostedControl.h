@@ -1,0 +1,86 @@
+#pragma once
+
+#include "Invariants.h"
+#include "platform/headless/User.h"
+
+#include <functional>
+#include <optional>
+
+/// What a host may do while its code runs.
+enum class HostAction {
+    bindsAnotherModel,
+    bindsNothing,
+    bindsTheSameModel,
+    terminates,
+    closesATable,
+    removesAJoin,
+    setsOnlyJoin,
+    destroysTheControl,
+};
+
+inline constexpr HostAction hostActions[] = {
+    HostAction::bindsAnotherModel, HostAction::bindsNothing,       HostAction::bindsTheSameModel,
+    HostAction::terminates,        HostAction::closesATable,       HostAction::removesAJoin,
+    HostAction::setsOnlyJoin,      HostAction::destroysTheControl,
+};
+const char* name(HostAction action);
+
+/// A control between a host and a user, with every trace on. Each place where the host's code can
+/// run is counted, and at one of them the host does something.
+class HostedControl : private TalvikDBxZandor::ZandorEvents {
+public:
+    HostedControl();
+    ~HostedControl() override;
+
+    /// From now on: count the places, and at the nth of them (from 1) do something.
+    void watch(int place = 0, HostAction action = HostAction::bindsNothing);
+    int places() const { return mPlaces; }
+    /// What the place was that the host acted at.
+    const std::string& where() const { return mWhere; }
+    /// Whether anything of toolkit, model or host was called after the control had been destroyed.
+    const std::string& calledAfterTheEnd() const { return mCalledAfterTheEnd; }
+
+    bool gone() const { return mGone; }
+    /// One thing that the user or the host does; what turns out to be out of reach is not done.
+    void step(const std::function<void()>& deed);
+    /// What is broken, at the end.
+    std::string broken();
+
+    TalvikDBxZandor::Zandor& control() { return *mControl; }
+    void bind(const platform::Ref<fake::Model>& model);
+    void destroy();
+
+    fake::Library library;
+    platform::Ref<fake::Model> model; ///< with three tables, a join and two definitions
+    platform::headless::Toolkit toolkit;
+    platform::headless::User user{toolkit};
+    std::string chosen;             ///< from the menu that opens next
+    std::function<void()> inDialog; ///< while the dialog stands open
+
+private:
+    struct House {
+        std::optional<TalvikDBxZandor::Zandor> control;
+    };
+
+    void Raise(TalvikDBxZandor::Event event,
+               const TalvikDBxZandor::EventArguments& arguments) override;
+    static bool reachesTheHost(const std::string& toolkitCall);
+    void at(const std::string& place);
+    void act();
+    platform::Ref<fake::Model> newModel();
+    platform::Ref<fake::Model> bound();
+
+    std::shared_ptr<House> mHouse;
+    std::shared_ptr<House> mLeft; ///< until the user's hand is off it
+    TalvikDBxZandor::Zandor* mControl = nullptr;
+    std::unique_ptr<Invariants> mInvariants;
+    platform::Ref<fake::Model> mOther;
+    int mPlaces = 0;
+    int mPlace = 0;
+    bool mWatching = false;
+    bool mEnding = false;
+    bool mGone = false;
+    HostAction mAction = HostAction::bindsNothing;
+    std::string mWhere;
+    std::string mCalledAfterTheEnd;
+};
