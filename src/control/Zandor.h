@@ -20,6 +20,9 @@ class Door;
 namespace TalvikDBxZandor {
 
 class frmJoinDefinition;
+struct QueryPicture;
+struct TablePicture;
+struct DefinitionPicture;
 
 /// The query designer: tables on a canvas, joins between them, output columns in a grid.
 ///
@@ -167,6 +170,16 @@ public:
 
     // Beyond the public interface: for front ends and what stands between them and the control.
 
+    /// Brings what is shown to what the model has now, whoever changed it: what has gone is taken
+    /// away, what has come is added, and all else stays as it is, with the scroll positions, the
+    /// current table, selected entries, the grid's current cell, an open editor and the text in it
+    /// (which go with their cell, and close with it), widths of columns, and the order in which
+    /// tables lie over each other. A table whose place or size the model leaves to the control
+    /// keeps its own; joins that no line can show are left out. Raises no event and shows no
+    /// trace; takes and gives no focus. The model is read before anything is shown: with an error
+    /// of it all stays as it was.
+    void ShowAnew();
+
     /// Moves a column of the grid to another position, both from 1 to the last column, and its
     /// definition in the model with it; raises ColumnModified when it stands elsewhere then. A
     /// position behind the last definition is that of the last. Closes an open editor; the current
@@ -247,6 +260,18 @@ private:
     void MakeCurrent(const Held<Tabulet>& table);
     void SelectColumn(const Held<Tabulet>& table, const String& name);
 
+    // Showing anew
+    class Untraced;
+    class ShownTables;
+    void ShowTablesAnew(const QueryPicture& picture);
+    void ShowTableAnew(Tabulet& element, const TablePicture& table);
+    void RemoveOtherJoins(const QueryPicture& picture, const ShownTables& shown);
+    void ShowJoinsAnew(const QueryPicture& picture, const ShownTables& shown);
+    void ShowDefinitionsAnew(const QueryPicture& picture);
+    void ShowDefinitionAnew(std::int32_t column, const DefinitionPicture& definition);
+    void RemoveOtherColumns(const QueryPicture& picture);
+    bool IsBlank(std::int32_t column) const;
+
     // Canvas: tables
     bool Shows(std::int16_t slot, const Held<Tabulet>& element) const;
     bool Shows(const Held<Tabulet>& element) const;
@@ -260,6 +285,7 @@ private:
     bool RemoveTable(std::int16_t Index);
     void RemoveColumnsOf(const String& tableName);
     void TerminateTable(std::int16_t Index);
+    void UnloadTable(std::int16_t Index);
     void SetFocusBack();
     void lstTable_CloseClick(std::int16_t Index);
     void lstTable_GotFocus(std::int16_t Index);
@@ -333,7 +359,9 @@ private:
     void GetSortOrder(const String& cellText);
     void GetVisibility(const String& cellText);
     void EditCell();
+    void HideEditors();
     void OpenEditor(const Part<platform::Frame>& frame, const Part<platform::CommandButton>& set);
+    void PlaceEditor(const Part<platform::Frame>& frame);
     Held<TalvikZandorLib::ZDColumnDefinition> DefinitionOf(std::int32_t column);
     void sprColumn_MouseDown(std::int16_t Button, std::int16_t Shift, float X, float Y);
     void sprColumn_MouseUp(std::int16_t Button, std::int16_t Shift, float X, float Y);
@@ -362,6 +390,7 @@ private:
     Held<TalvikZandorLib::ZDColumnDefinition> DefinitionBefore(std::int32_t column);
     bool InsertColumnDefinition(const String& fieldName, std::int32_t column);
     bool RemoveColumn(std::int32_t column);
+    void ClearColumn(std::int32_t column);
     void FitColumn(std::int32_t column, const String& fieldName);
 
     // Context menu
@@ -378,6 +407,7 @@ private:
     Hooks mHooks;
 
     std::int16_t mDebugSwitch = 1;
+    bool mTraces = true; ///< false for what is not traced even with DebugSwitch
     std::int16_t mJoinModifyDisabled = 0;
     bool mOnlyJoin = true;
     bool mUseJoinType[4] = {true, true, true, true};

@@ -8,7 +8,8 @@ using platform::single;
 using platform::toInteger;
 
 void Zandor::Trace(platform::StringView text, platform::StringView title) const {
-    if (mDebugSwitch != 0) mLife.MsgBox(String(text), platform::styleSystemModal, String(title));
+    if (mDebugSwitch != 0 && mTraces)
+        mLife.MsgBox(String(text), platform::styleSystemModal, String(title));
 }
 
 void Zandor::Raise(Event event, const EventArguments& arguments) {

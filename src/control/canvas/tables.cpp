@@ -153,12 +153,7 @@ bool Zandor::RemoveTable(std::int16_t Index) {
             if (Draws(record)) RemoveJoin(record);
 
         require(Shows(Index, table));
-        TerminateTable(Index);
-        require(Shows(Index, table));
-        lstTable.Unload(Index);
-        mTableFreeList->FreeIndex(Index);
-        // A drag record may hold the element for longer; it leaves the screen all the same.
-        table->Unload();
+        UnloadTable(Index);
         OrganizeTables();
         SetFocusBack();
         result = true;
@@ -185,6 +180,16 @@ void Zandor::TerminateTable(std::int16_t Index) {
     Guard(u"TerminateTable", [&] {
         if (const auto table = Hold(lstTable.Find(Index))) table->Terminate();
     });
+}
+
+void Zandor::UnloadTable(std::int16_t Index) {
+    const auto table = Hold(lstTable(Index));
+    TerminateTable(Index);
+    require(Shows(Index, table));
+    lstTable.Unload(Index);
+    mTableFreeList->FreeIndex(Index);
+    // A drag record may hold the element for longer; it leaves the screen all the same.
+    table->Unload();
 }
 
 void Zandor::lstTable_CloseClick(std::int16_t Index) {

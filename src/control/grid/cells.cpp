@@ -42,12 +42,16 @@ void Zandor::MakeGetValueFieldsInvisible() {
     Guard(u"MakeGetValueFieldsInvisible", [&] {
         // A copy, as the one above: what it does may end the control.
         if (const auto closing = mHooks.EditorsClosing) closing();
-        fraValue->Visible(false);
-        fraSortOrder->Visible(false);
-        fraVisibility->Visible(false);
+        HideEditors();
         if (mLastJoin && mLastJoin->JoinLineIndex() != -1)
             linJoin(mLastJoin->JoinLineIndex())->BorderWidth(1);
     });
+}
+
+void Zandor::HideEditors() {
+    fraValue->Visible(false);
+    fraSortOrder->Visible(false);
+    fraVisibility->Visible(false);
 }
 
 void Zandor::GetTextValue(const String& cellText) {
@@ -74,10 +78,18 @@ void Zandor::GetVisibility(const String& cellText) {
     });
 }
 
-/// Centres an editor over the current cell, inside the control but for its upper edge, and shows
-/// it. The grid's top is added, its left is not; nor is there a lower bound for the top.
 void Zandor::OpenEditor(const Part<platform::Frame>& frame,
                         const Part<platform::CommandButton>& set) {
+    PlaceEditor(frame);
+    frame->Visible(true);
+    frame->ZOrder();
+    set->Default(true);
+    if (const auto opened = mHooks.EditorOpened) opened();
+}
+
+/// Centres an editor over the current cell, inside the control but for its upper edge. The grid's
+/// top is added, its left is not; nor is there a lower bound for the top.
+void Zandor::PlaceEditor(const Part<platform::Frame>& frame) {
     constexpr float margin = 30;
     const float width = frame->Width();
     const float height = frame->Height();
@@ -94,10 +106,6 @@ void Zandor::OpenEditor(const Part<platform::Frame>& frame,
         top = single(mToolkit->ScaleHeight() - height - margin);
 
     frame->setBounds({left, top, width, height});
-    frame->Visible(true);
-    frame->ZOrder();
-    set->Default(true);
-    if (const auto opened = mHooks.EditorOpened) opened();
 }
 
 } // namespace TalvikDBxZandor

@@ -134,17 +134,21 @@ bool Zandor::RemoveColumn(std::int32_t column) {
     Guard(u"RemoveColumn", [&] {
         const std::int32_t last = sprColumn->Cols() - 1;
         if (column + 1 <= last) {
-            for (std::int32_t row = 0; row < sprColumn->Rows(); ++row)
-                sprColumn->TextMatrix(row, column, {});
-            sprColumn->ColWidth(column, sprColumn->ColWidth(0));
-            // A blank column names no definition, so that an editor over it finds none.
-            sprColumn->ColData(column, 0);
+            ClearColumn(column);
             for (std::int32_t i = column + 1; i <= last; ++i) sprColumn->ColPosition(i, i - 1);
         }
         // The last column has nothing behind it that could close the gap; it stays as it is.
         result = true;
     });
     return result;
+}
+
+void Zandor::ClearColumn(std::int32_t column) {
+    for (std::int32_t row = 0; row < sprColumn->Rows(); ++row)
+        sprColumn->TextMatrix(row, column, {});
+    sprColumn->ColWidth(column, sprColumn->ColWidth(0));
+    // A blank column names no definition, so that an editor over it finds none.
+    sprColumn->ColData(column, 0);
 }
 
 void Zandor::mnuColumnDefinitionDelete_Click() {

@@ -34,7 +34,7 @@ void ColumnListModel::append(const QString& text) {
 }
 
 void ColumnListModel::setMarked(int row, bool marked) {
-    mRows[static_cast<std::size_t>(row)].marked = marked;
+    if (std::exchange(mRows[static_cast<std::size_t>(row)].marked, marked) == marked) return;
     Q_EMIT dataChanged(index(row), index(row), {markedRole, Qt::AccessibleDescriptionRole});
 }
 

@@ -134,6 +134,18 @@ void ZandorWidget::setTableNotes(const QMap<QString, QString>& notes) {
         box->setNote(byTitle.value(box->title()));
 }
 
+void ZandorWidget::showAnew() {
+    const auto hasKeyboard = [this] {
+        const QWidget* const focus = window()->focusWidget();
+        return focus && (focus == this || isAncestorOf(focus));
+    };
+    const bool had = hasKeyboard();
+    const QPointer<ZandorWidget> alive = this;
+    mControl->ShowAnew();
+    // The part that had it may have gone.
+    if (alive && had && !hasKeyboard()) mToolkit->navigation().enter(true);
+}
+
 QSize ZandorWidget::sizeHint() const { return {900, 600}; }
 
 QSize ZandorWidget::minimumSizeHint() const { return {240, 160}; }

@@ -143,6 +143,12 @@ public:
     /// and the column of the definition with a key. False when it is not there.
     bool showCell(const QString& definition, int row);
 
+    /// Brings what is shown to what the bound model has now: for a host that has changed the model
+    /// itself, or has bound another one and wants nothing left of the one before. What is the same
+    /// stays as it is, with scroll positions, selections, focus, and an open editor with its text.
+    /// No signals, no traces. See TalvikDBxZandor::Zandor::ShowAnew.
+    void showAnew();
+
     QSize sizeHint() const override;
     QSize minimumSizeHint() const override;
 
