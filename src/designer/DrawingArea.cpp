@@ -17,7 +17,10 @@ using platform::qt::toQt;
 DrawingArea::DrawingArea(Document& document, QWidget* parent)
     : QWidget(parent), mDocument(document) {
     connect(&document, &Document::outdated, this, &DrawingArea::showAnew);
-    showAnew();
+    // What the control did it has shown, but not all that came of it: it takes the columns of more
+    // tables than one out of the grid, say, and leaves blank columns before one dropped far out.
+    connect(&document, &Document::changed, this, [this] { mControl->showAnew(); });
+    makeControl();
 }
 
 // The control leaves its library's objects behind, so it goes before the library.
@@ -28,7 +31,7 @@ DrawingArea::~DrawingArea() {
 
 void DrawingArea::setOptions(const QVariantMap& options) {
     mOptions = options;
-    showAnew();
+    makeControl();
 }
 
 void DrawingArea::showFindings(const model::Findings& findings) {
@@ -45,6 +48,14 @@ QPoint DrawingArea::canvasPlace(QPoint at) const {
 }
 
 void DrawingArea::showAnew() {
+    // Nothing of a query stays in the drawing of another.
+    if (mControl->model() != mDocument.query()) return makeControl();
+    fitCanvas();
+    mControl->control().UserControl_Resize();
+    mControl->showAnew();
+}
+
+void DrawingArea::makeControl() {
     ZandorWidget* const before = mControl;
     mControl = new ZandorWidget(mLibrary, this);
     mControl->setDebugSwitch(0);
@@ -57,6 +68,7 @@ void DrawingArea::showAnew() {
     // After the texts, for it shows the grid's row titles.
     mControl->setOnlyJoin(mOptions.value(QStringLiteral("OnlyJoin"), false).toBool());
     mControl->setModel(mDocument.query());
+    mControl->showAnew();
     mControl->setFindings(mFindings);
     mControl->show();
     if (before) {

@@ -11,8 +11,9 @@ namespace designer {
 
 class Document;
 
-/// The control over the document's query. The control shows what it changed itself; for everything
-/// else it is made anew, because binding a model again keeps the grid's columns of the one before.
+/// The control over the document's query. Whenever the query has changed, by the control or by
+/// others, the control shows it anew; for another query, and with other options, a new control is
+/// made.
 class DrawingArea final : public QWidget {
     Q_OBJECT
 
@@ -20,8 +21,8 @@ public:
     explicit DrawingArea(Document& document, QWidget* parent = nullptr);
     ~DrawingArea() override;
 
-    /// The control of the moment. It goes whenever the drawing is shown anew: keep it no longer
-    /// than a statement, and connect to every one from controlMade().
+    /// The control of the moment. It goes when another query or other options come: keep it no
+    /// longer than a statement, and connect to every one from controlMade().
     ZandorWidget& control() { return *mControl; }
     /// The control's properties by name, set on this control and all later ones before they get
     /// their model.
@@ -43,6 +44,7 @@ protected:
 
 private:
     void showAnew();
+    void makeControl();
     void fitCanvas();
 
     Document& mDocument;
