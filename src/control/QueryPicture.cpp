@@ -1,47 +1,57 @@
 #include "control/QueryPicture.h"
 
 #include "control/KeyNumber.h"
-#include "platform/KeyedCollection.h"
+#include "control/ModelList.h"
 
 namespace TalvikDBxZandor {
 
-using platform::Each;
-using platform::Ref;
 using platform::String;
+using TalvikZandorLib::ZDColumnDefinition;
+using TalvikZandorLib::ZDTable;
 
 namespace {
 
-TablePicture pictureOf(TalvikZandorLib::ZDTable& table) {
-    TablePicture result{.key = table.Key(),
-                        .name = table.Name(),
-                        .left = table.Left(),
-                        .top = table.Top(),
-                        .width = table.Width(),
-                        .height = table.Height(),
-                        .selected = table.Selected() != 0,
-                        .entries = {}};
-    for (const auto& column : Each(table.Columns()))
-        result.entries.push_back({column->Key(), column->Name(), column->Marker()});
+template <class Owner, class Collection>
+auto list(const Life& life, const Held<Owner>& owner, Collection& (Owner::*collection)()) {
+    return ModelList<Owner, Collection>(life, owner, collection);
+}
+
+TablePicture pictureOf(const Life& life, const Held<ZDTable>& table) {
+    TablePicture result;
+    result.key = table->Key();
+    result.name = table->Name();
+    result.left = table->Left();
+    result.top = table->Top();
+    result.width = table->Width();
+    result.height = table->Height();
+    result.selected = table->Selected() != 0;
+    for (const auto& column : list(life, table, &ZDTable::Columns)) {
+        EntryPicture& entry = result.entries.emplace_back();
+        entry.key = column->Key();
+        entry.text = column->Name();
+        entry.marked = column->Marker();
+    }
     return result;
 }
 
 /// Texts that the editors of the cells read as what they say: a column that is not shown is "Not
 /// Visible", and one that is not sorted says nothing.
-DefinitionPicture pictureOf(TalvikZandorLib::ZDColumnDefinition& definition, std::size_t rows) {
+DefinitionPicture pictureOf(const Life& life, const Held<ZDColumnDefinition>& definition,
+                            std::size_t rows) {
     constexpr std::size_t firstCriterion = 4;
-    const String key = definition.Key();
+    const String key = definition->Key();
     DefinitionPicture result{.number = isKeyOfNumber(key) ? numberOfKey(key) : 0,
                              .cells = std::vector<String>(rows)};
-    const auto column = definition.Column();
+    const auto column = hold(life, definition->Column());
     // One that has lost its column must be seen to be deleted.
     result.cells.at(0) = column ? column->Name() : u"?";
-    result.cells.at(1) = definition.Synonym();
-    const std::int16_t order = definition.SortOrder();
+    result.cells.at(1) = definition->Synonym();
+    const std::int16_t order = definition->SortOrder();
     if (order == 1) result.cells.at(2) = u"Ascending";
     if (order == 2) result.cells.at(2) = u"Descending";
-    result.cells.at(3) = definition.Visible() ? u"Visible" : u"Not Visible";
+    result.cells.at(3) = definition->Visible() ? u"Visible" : u"Not Visible";
     std::size_t row = firstCriterion;
-    for (const auto& criterium : Each(definition.Criteria())) {
+    for (const auto& criterium : list(life, definition, &ZDColumnDefinition::Criteria)) {
         if (row == rows) break;
         result.cells.at(row++) = criterium->Criterium();
     }
@@ -50,27 +60,33 @@ DefinitionPicture pictureOf(TalvikZandorLib::ZDColumnDefinition& definition, std
 
 } // namespace
 
-QueryPicture pictureOf(TalvikZandorLib::Zandor& model, std::size_t tables, std::size_t definitions,
-                       std::size_t rows) {
+QueryPicture pictureOf(const Life& life, const Held<TalvikZandorLib::Zandor>& model,
+                       std::size_t tables, std::size_t definitions, std::size_t rows) {
+    using Query = TalvikZandorLib::Zandor;
     QueryPicture picture;
-    for (const auto& table : Each(model.Tables())) {
+    for (const auto& table : list(life, model, &Query::Tables)) {
         if (picture.tables.size() == tables) break;
-        picture.tables.push_back(pictureOf(*table));
+        picture.tables.push_back(pictureOf(life, table));
     }
-    for (const auto& join : Each(model.Joins())) {
-        const auto leftTable = join->LeftTable();
-        const auto leftColumn = join->LeftColumn();
-        const auto rightTable = join->RightTable();
-        const auto rightColumn = join->RightColumn();
+    for (const auto& join : list(life, model, &Query::Joins)) {
+        const auto leftTable = hold(life, join->LeftTable());
+        const auto leftColumn = hold(life, join->LeftColumn());
+        const auto rightTable = hold(life, join->RightTable());
+        const auto rightColumn = hold(life, join->RightColumn());
         if (!leftTable || !leftColumn || !rightTable || !rightColumn) continue;
-        JoinPicture each{
-            join->Key(),         leftTable->Key(), leftColumn->Name(),     rightTable->Key(),
-            rightColumn->Name(), join->JoinType(), join->CompareOperator()};
+        JoinPicture each;
+        each.key = join->Key();
+        each.leftTable = leftTable->Key();
+        each.leftColumn = leftColumn->Name();
+        each.rightTable = rightTable->Key();
+        each.rightColumn = rightColumn->Name();
+        each.type = join->JoinType();
+        each.comparison = join->CompareOperator();
         if (each.leftTable != each.rightTable) picture.joins.push_back(std::move(each));
     }
-    for (const auto& definition : Each(model.ColumnDefinitions())) {
+    for (const auto& definition : list(life, model, &Query::ColumnDefinitions)) {
         if (picture.definitions.size() == definitions) break;
-        picture.definitions.push_back(pictureOf(*definition, rows));
+        picture.definitions.push_back(pictureOf(life, definition, rows));
     }
     return picture;
 }

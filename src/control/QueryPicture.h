@@ -1,5 +1,6 @@
 #pragma once
 
+#include "control/Reached.h"
 #include "platform/TalvikZandorLib.h"
 
 #include <vector>
@@ -54,8 +55,8 @@ struct QueryPicture {
 
 /// Reads the first tables of a model, as many as are shown at most; the joins, but for those that
 /// no line can show, from a table to itself or with an end lost; and the first definitions, with
-/// the texts of as many rows. An error of the model passes through.
-QueryPicture pictureOf(TalvikZandorLib::Zandor& model, std::size_t tables, std::size_t definitions,
-                       std::size_t rows);
+/// the texts of as many rows. An error of the model passes through; ends in quiet with the control.
+QueryPicture pictureOf(const Life& life, const Held<TalvikZandorLib::Zandor>& model,
+                       std::size_t tables, std::size_t definitions, std::size_t rows);
 
 } // namespace TalvikDBxZandor

@@ -13,6 +13,8 @@
 #include "platform/TalvikZandorLib.h"
 #include "platform/Toolkit.h"
 
+#include <optional>
+
 namespace comforts {
 class Door;
 }
@@ -175,9 +177,9 @@ public:
     /// current table, selected entries, the grid's current cell, an open editor and the text in it
     /// (which go with their cell, and close with it), widths of columns, and the order in which
     /// tables lie over each other. A table whose place or size the model leaves to the control
-    /// keeps its own; joins that no line can show are left out. Raises no event and shows no
-    /// trace; takes and gives no focus. The model is read before anything is shown: with an error
-    /// of it all stays as it was.
+    /// keeps its own, or has it back when the model had one meanwhile; joins that no line can show
+    /// are left out. Raises no event and shows no trace; takes and gives no focus. The model is
+    /// read before anything is shown: with an error of it all stays as it was.
     void ShowAnew();
 
     /// Moves a column of the grid to another position, both from 1 to the last column, and its
@@ -263,8 +265,16 @@ private:
     // Showing anew
     class Untraced;
     class ShownTables;
+    /// What the control gave a table whose place, or size, the model left to it.
+    struct OwnPlace {
+        std::optional<platform::Bounds> place, size;
+        bool placed = false; ///< the model had a place when the table was last shown anew
+        bool sized = false;
+    };
+    platform::Bounds PlaceAnew(std::int16_t slot, const TablePicture& table,
+                               const platform::Bounds& now);
     void ShowTablesAnew(const QueryPicture& picture);
-    void ShowTableAnew(Tabulet& element, const TablePicture& table);
+    void ShowTableAnew(std::int16_t slot, const TablePicture& table);
     void RemoveOtherJoins(const QueryPicture& picture, const ShownTables& shown);
     void ShowJoinsAnew(const QueryPicture& picture, const ShownTables& shown);
     void ShowDefinitionsAnew(const QueryPicture& picture);
@@ -422,6 +432,7 @@ private:
     std::int16_t mActiveTableIndex = 0;
     std::int32_t mBinding = 0;      ///< which one it is, counted: the last one is what is shown
     std::int32_t mBoundColumns = 0; ///< grid columns filled by the last binding
+    std::map<std::int16_t, OwnPlace> mOwnPlaces; ///< by slot
     Ref<clsJoinLine> mLastJoin;
     float mPopupX = 0;
     float mPopupY = 0;

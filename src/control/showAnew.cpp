@@ -14,22 +14,9 @@ using platform::Bounds;
 
 namespace {
 
-/// Where the model wants a table; what it leaves to the control stays as it is.
-Bounds placeOf(const TablePicture& table, const Bounds& now) {
-    // A table stands between two twips where its user left it, and the model has the nearest one.
-    const auto nearest = [](std::int32_t wanted, float given) {
-        return platform::toLong(given) == wanted ? given : static_cast<float>(wanted);
-    };
-    Bounds place = now;
-    if (table.isPlaced()) {
-        place.Left = nearest(table.left, now.Left);
-        place.Top = nearest(table.top, now.Top);
-    }
-    if (table.isSized()) {
-        place.Width = nearest(table.width, now.Width);
-        place.Height = nearest(table.height, now.Height);
-    }
-    return place;
+/// A table stands between two twips where its user left it, and the model has the nearest one.
+float nearest(std::int32_t wanted, float now) {
+    return platform::toLong(now) == wanted ? now : static_cast<float>(wanted);
 }
 
 /// How many steps of the cascade a table takes.
@@ -84,7 +71,8 @@ public:
     /// The element of the table with a key, or nothing.
     Ref<Tabulet> element(const String& key) const {
         for (std::size_t n = 0; n < mSlots.size(); ++n)
-            if (mTables[n].key == key && mSlots[n] != 0) return mControl.lstTable(mSlots[n]);
+            if (mTables[n].key == key && !mControl.mTableFreeList->IsFree(mSlots[n]))
+                return mControl.lstTable(mSlots[n]);
         return {};
     }
     /// The slot of the selected table, else of the first; 0 without tables.
@@ -105,35 +93,42 @@ private:
 
 void Zandor::ShowAnew() {
     Guard(u"ShowAnew", [&] {
-        const auto model = Model();
-        const QueryPicture picture =
-            pictureOf(*model, lastTableSlot, static_cast<std::size_t>(sprColumn->Cols()) - 1,
-                      static_cast<std::size_t>(sprColumn->Rows()));
-        if (model != mModel) return; // another one was bound meanwhile, and has been shown
+        const std::int32_t binding = mBinding;
+        const QueryPicture picture = pictureOf(mLife, Model(), lastTableSlot,
+                                               static_cast<std::size_t>(sprColumn->Cols()) - 1,
+                                               static_cast<std::size_t>(sprColumn->Rows()));
+        require(binding == mBinding); // what was bound meanwhile has been shown
         const Untraced untraced(*this);
         ShowTablesAnew(picture);
+        require(binding == mBinding);
         ShowDefinitionsAnew(picture);
         ShowMenuEntries();
     });
 }
 
 void Zandor::ShowTablesAnew(const QueryPicture& picture) {
+    const std::int32_t binding = mBinding;
     ShownTables shown(*this, picture);
     RemoveOtherJoins(picture, shown);
-    for (const std::int16_t index : shown.others()) UnloadTable(index);
+    // The focus may go from a table that goes, and the host be told of where it goes.
+    for (const std::int16_t index : shown.others()) {
+        if (!mTableFreeList->IsFree(index)) UnloadTable(index);
+        require(binding == mBinding);
+    }
 
     std::int32_t cascade = 0;
     for (std::size_t n = 0; n < shown.count(); ++n) {
         const TablePicture& table = picture.tables[n];
-        if (shown.slot(n) != 0) {
-            ShowTableAnew(*Ref<Tabulet>(lstTable(shown.slot(n))), table);
+        if (!mTableFreeList->IsFree(shown.slot(n))) {
+            ShowTableAnew(shown.slot(n), table);
             cascade += cascadeSteps(table);
             continue;
         }
         std::int32_t slot = 0;
         if (!mTableFreeList->GetNextFreeIndex(slot)) continue;
         shown.slot(n) = static_cast<std::int16_t>(slot);
-        ShowTable(shown.slot(n), *Model()->Tables().Item(table.key), cascade);
+        ShowTable(shown.slot(n), Tables().Item(table.key), cascade);
+        require(binding == mBinding);
     }
     // The current table stays, and has an heir when it has gone.
     if (mTableFreeList->IsFree(mActiveTableIndex)) mActiveTableIndex = shown.heir();
@@ -143,14 +138,42 @@ void Zandor::ShowTablesAnew(const QueryPicture& picture) {
     OrganizeTables();
 }
 
-/// Gives a table that is shown already the name, the place and the columns that it has now.
-void Zandor::ShowTableAnew(Tabulet& element, const TablePicture& table) {
-    if (element.Text() != table.name) element.Text(table.name);
-    const Bounds now = element.bounds();
-    const Bounds place = placeOf(table, now);
-    if (place != now) element.setBounds(place);
+/// Where a table is to stand that stands somewhere now. What the model leaves to the control stays
+/// as it is, for its user may have changed it; but where the model had a place meanwhile and has
+/// given it up, as by undoing, the table goes back.
+Bounds Zandor::PlaceAnew(std::int16_t slot, const TablePicture& table, const Bounds& now) {
+    OwnPlace& own = mOwnPlaces[slot];
+    Bounds place = now;
+    const bool wasPlaced = std::exchange(own.placed, table.isPlaced());
+    if (table.isPlaced()) {
+        place.Left = nearest(table.left, now.Left);
+        place.Top = nearest(table.top, now.Top);
+    } else {
+        if (!wasPlaced || !own.place) own.place = now;
+        place.Left = own.place->Left;
+        place.Top = own.place->Top;
+    }
+    const bool wasSized = std::exchange(own.sized, table.isSized());
+    if (table.isSized()) {
+        place.Width = nearest(table.width, now.Width);
+        place.Height = nearest(table.height, now.Height);
+    } else {
+        if (!wasSized || !own.size) own.size = now;
+        place.Width = own.size->Width;
+        place.Height = own.size->Height;
+    }
+    return place;
+}
 
-    auto& shown = element.ColumnItems();
+/// Gives a table that is shown already the name, the place and the columns that it has now.
+void Zandor::ShowTableAnew(std::int16_t slot, const TablePicture& table) {
+    const auto element = Hold(lstTable(slot));
+    if (element->Text() != table.name) element->Text(table.name);
+    const Bounds now = element->bounds();
+    const Bounds place = PlaceAnew(slot, table, now);
+    if (place != now) element->setBounds(place);
+
+    auto& shown = element->ColumnItems();
     std::int32_t same = 0;
     const auto wanted = static_cast<std::int32_t>(table.entries.size());
     const auto at = [&](std::int32_t n) -> const EntryPicture& {
@@ -162,7 +185,7 @@ void Zandor::ShowTableAnew(Tabulet& element, const TablePicture& table) {
     if (same < shown.Count()) {
         for (std::int32_t n = 1; n <= shown.Count(); ++n)
             if (shown.Item(n)->Selected()) selected.push_back(shown.Item(n)->Key());
-        element.Terminate();
+        element->Terminate();
         same = 0;
     }
     const bool grows = same < wanted;
@@ -171,7 +194,7 @@ void Zandor::ShowTableAnew(Tabulet& element, const TablePicture& table) {
         entry->Image(at(n).marked ? std::int16_t{1} : std::int16_t{0});
         if (std::ranges::find(selected, at(n).key) != selected.end()) entry->Selected(true);
     }
-    if (grows) element.Complete();
+    if (grows) element->Complete();
 }
 
 /// Removes the lines of joins that the model has no longer, or between other columns.

@@ -159,6 +159,20 @@ TEST_F(ShowingAnew, LeavesATableWhereItsUserPutItIfTheModelHasNoPlaceForIt) {
     EXPECT_EQ(table(2).bounds, (platform::Bounds{4500, 900, 3000, 1800}));
 }
 
+TEST_F(ShowingAnew, PutsATableBackOfWhichTheModelHadAPlaceMeanwhile) {
+    model->table(u"ITEMS", {u"*"});
+    showAnew();
+    showAnew();
+    const auto before = table(3).bounds;
+    stage->moveTable(3, 4500, 900);
+    stage->resizeTable(3, 3000, 1800);
+    showAnew();
+    EXPECT_EQ(table(3).bounds, (platform::Bounds{4500, 900, 3000, 1800}));
+    model->tableAt(3).place(-1, -1, 0, 0);
+    showAnew();
+    EXPECT_EQ(table(3).bounds, before);
+}
+
 TEST_F(ShowingAnew, AddsNewColumnsToAListWithoutTouchingTheOthers) {
     for (int n = 0; n < 20; ++n) orders->addColumn(u"C" + platform::decimal(n));
     showAnew();

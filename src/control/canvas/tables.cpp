@@ -188,6 +188,7 @@ void Zandor::UnloadTable(std::int16_t Index) {
     require(Shows(Index, table));
     lstTable.Unload(Index);
     mTableFreeList->FreeIndex(Index);
+    mOwnPlaces.erase(Index);
     // A drag record may hold the element for longer; it leaves the screen all the same.
     table->Unload();
 }

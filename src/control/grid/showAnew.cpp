@@ -22,8 +22,8 @@ void Zandor::ShowDefinitionsAnew(const QueryPicture& picture) {
     if (sprColumn->ColData(current) != edited)
         HideEditors();
     else if (current != col)
-        for (auto* frame : {fraValue.get(), fraSortOrder.get(), fraVisibility.get()})
-            if (frame->Visible()) PlaceEditor(*frame);
+        for (const auto* frame : {&fraValue, &fraSortOrder, &fraVisibility})
+            if ((*frame)->Visible()) PlaceEditor(*frame);
 }
 
 bool Zandor::IsBlank(std::int32_t column) const {
