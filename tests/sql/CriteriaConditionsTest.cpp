@@ -98,7 +98,8 @@ TEST_F(ACondition, MayNameAColumnInAnyMixOfBracketsAndCases) {
 
 TEST_F(ACondition, TakesABareNameThatIsNoColumnAsWhatTheColumnHolds) {
     EXPECT_EQ(condition(u"text", u"t.nothing"), "t.text = 't.nothing'");
-    EXPECT_EQ(condition(u"whole", u"t.nothing"), "At character 1: expected a number.");
+    EXPECT_EQ(condition(u"whole", u"t.nothing"),
+              "At character 1: this is no number, write it like 12 or 1.5.");
     EXPECT_EQ(condition(u"text", u"number"), "t.text = 'number'");
 }
 
@@ -124,8 +125,9 @@ TEST_F(ACondition, AsksForWhatIsNoColumn) {
 }
 
 TEST_F(ACondition, TakesAColonThatBeginsNoNameAsText) {
-    EXPECT_EQ(condition(u"text", u":)"), "At character 2: expected And, Or or the end.");
+    EXPECT_EQ(condition(u"text", u":)"),
+              "At character 2: put And or Or between two conditions, or quotes around a text.");
     EXPECT_EQ(condition(u"text", u":-|"), "t.text = ':-|'");
     EXPECT_EQ(condition(u"text", u":"), "t.text = ':'");
-    EXPECT_EQ(condition(u"whole", u":1"), "At character 2: expected the parameter's name.");
+    EXPECT_EQ(condition(u"whole", u":1"), "At character 2: a parameter needs a name, as in :year.");
 }

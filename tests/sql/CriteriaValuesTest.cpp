@@ -56,7 +56,7 @@ TEST_F(AValue, ThatIsNoNumberIsRefusedForANumberColumn) {
         EXPECT_EQ(condition(u"whole", text).rfind("At character ", 0), 0u)
             << platform::toUtf8(text) << " became " << condition(u"whole", text);
     EXPECT_EQ(condition(u"whole", platform::String(101, u'1')),
-              "At character 1: expected a number.");
+              "At character 1: this is no number, write it like 12 or 1.5.");
     EXPECT_EQ(condition(u"whole", platform::String(100, u'1')),
               "t.whole = " + std::string(100, '1'));
 }
@@ -69,7 +69,8 @@ TEST_F(AValue, OfADateColumnIsADayOfTheCalendar) {
     for (const auto* text :
          {u"2023-02-29", u"1900-02-29", u"2024-13-01", u"2024-00-10", u"2024-04-31", u"2024-01-00",
           u"0000-01-01", u"24-01-01", u"2024/1/1", u"2024-01-01 10:00", u"tomorrow", u"##"})
-        EXPECT_EQ(condition(u"on_day", text), "At character 1: expected a date (2024-12-31).")
+        EXPECT_EQ(condition(u"on_day", text),
+                  "At character 1: this is no date, write it like 2024-12-31.")
             << platform::toUtf8(text);
 }
 
@@ -78,7 +79,8 @@ TEST_F(AValue, OfATimeColumnIsATimeOfTheDay) {
     EXPECT_EQ(condition(u"clock", u"23:59:59"), "t.clock = '23:59:59'");
     EXPECT_EQ(condition(u"clock", u"#00:00#"), "t.clock = '00:00:00'");
     for (const auto* text : {u"24:00", u"12:60", u"12:00:60", u"12", u"12:5", u"noon"})
-        EXPECT_EQ(condition(u"clock", text), "At character 1: expected a time (23:59).")
+        EXPECT_EQ(condition(u"clock", text),
+                  "At character 1: this is no time, write it like 23:59.")
             << platform::toUtf8(text);
 }
 
@@ -88,7 +90,7 @@ TEST_F(AValue, OfATimestampColumnIsADayWithOrWithoutATime) {
     EXPECT_EQ(condition(u"moment", u"2024-05-01"), "t.moment = '2024-05-01 00:00:00'");
     EXPECT_EQ(condition(u"moment", u"#2024-5-1 1:30#"), "t.moment = '2024-05-01 01:30:00'");
     EXPECT_EQ(condition(u"moment", u"2024-05-01 25:00"),
-              "At character 1: expected a date and time (2024-12-31 23:59).");
+              "At character 1: this is no date and time, write it like 2024-12-31 23:59.");
 }
 
 TEST_F(AValue, OfABooleanColumnIsOneOfSixWords) {
@@ -96,12 +98,12 @@ TEST_F(AValue, OfABooleanColumnIsOneOfSixWords) {
         EXPECT_EQ(condition(u"truth", text), "t.truth = TRUE") << platform::toUtf8(text);
     for (const auto* text : {u"false", u"No", u"0"})
         EXPECT_EQ(condition(u"truth", text), "t.truth = FALSE") << platform::toUtf8(text);
-    EXPECT_EQ(condition(u"truth", u"2"), "At character 1: expected true or false.");
+    EXPECT_EQ(condition(u"truth", u"2"), "At character 1: write true or false here.");
 }
 
 TEST_F(AValue, OfABlobColumnCannotBeTyped) {
     EXPECT_EQ(condition(u"bytes", u"abc"),
-              "At character 1: expected Is Null, a column or a parameter.");
+              "At character 1: only Is Null, a column or a parameter can stand here.");
     EXPECT_EQ(condition(u"bytes", u"Is Null"), "t.bytes IS NULL");
     EXPECT_EQ(condition(u"bytes", u"[t].[bytes]"), "t.bytes = t.bytes");
     EXPECT_EQ(condition(u"bytes", u":b"), "t.bytes = :b");
@@ -113,10 +115,26 @@ TEST_F(AValue, OfAColumnOfUnknownTypeIsANumberOrADateOrAText) {
     EXPECT_EQ(condition(u"anything", u"some words"), "t.anything = 'some words'");
     EXPECT_EQ(condition(u"anything", u"#2024-1-2#"), "t.anything = '2024-01-02'");
     EXPECT_EQ(condition(u"anything", u"#2024-1-2 3:04#"), "t.anything = '2024-01-02 03:04:00'");
-    EXPECT_EQ(condition(u"anything", u"#words#"), "At character 1: expected a value.");
+    EXPECT_EQ(condition(u"anything", u"#words#"),
+              "At character 1: only dates and times stand between two #.");
 }
 
 TEST_F(AValue, BetweenNumberSignsIsNoText) {
-    EXPECT_EQ(condition(u"text", u"#2024-05-01#"), "At character 1: expected a text.");
+    EXPECT_EQ(condition(u"text", u"#2024-05-01#"),
+              "At character 1: only dates and times stand between two #.");
     EXPECT_EQ(condition(u"text", u"'#2024-05-01#'"), "t.text = '#2024-05-01#'");
+}
+
+TEST_F(AValue, WithADecimalCommaIsToldOfThePoint) {
+    const std::string point = ": decimals are written with a point, as in 1.5.";
+    EXPECT_EQ(condition(u"number", u"1,5"), "At character 2" + point);
+    EXPECT_EQ(condition(u"number", u"> -12,75"), "At character 6" + point);
+    EXPECT_EQ(condition(u"whole", u"1,5"), "At character 2" + point);
+    EXPECT_EQ(condition(u"number", u"= '1,5'"), "At character 3" + point);
+    EXPECT_EQ(condition(u"anything", u"1,5"), "At character 2" + point);
+    EXPECT_EQ(condition(u"number", u"Between 1,5 And 2"), "At character 10" + point);
+    EXPECT_EQ(condition(u"number", u"In (1,5)"), "t.number IN (1, 5)") << "a list of two";
+    const std::string other = ": put And or Or between two conditions, or quotes around a text.";
+    EXPECT_EQ(condition(u"number", u"1, 5"), "At character 2" + other);
+    EXPECT_EQ(condition(u"text", u"1,5"), "At character 2" + other) << "it may be a text";
 }

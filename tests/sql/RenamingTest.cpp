@@ -105,16 +105,16 @@ TEST_F(CriteriaThatNameTables, KeepWordsThatOnlyLookLikeNames) {
 TEST_F(CriteriaThatNameTables, AreAFindingWhenTheTableIsDeleted) {
     defined(a, u"id", u"1 Or b.id");
     query->DeleteTable(b);
-    EXPECT_EQ(where(), "a.id: At character 6: expected a column of the query, the table that had "
-                       "this one was deleted.");
+    EXPECT_EQ(where(),
+              "a.id: At character 6: the table of this column was deleted from the query.");
 }
 
 TEST_F(CriteriaThatNameTables, NeverTurnToAnotherTableOfTheDeletedOnesName) {
     const auto definition = defined(a, u"id", u"b.id");
     query->DeleteTable(b);
     query->addTable(described(u"b", u"weight"));
-    EXPECT_EQ(where(), "a.id: At character 1: expected a column of the query, the table that had "
-                       "this one was deleted.");
+    EXPECT_EQ(where(),
+              "a.id: At character 1: the table of this column was deleted from the query.");
     definition->Criteria().Item(u"4")->Criterium(u"b.id");
     EXPECT_EQ(where(), "a.id = b.id") << "typed anew it means the table of now";
 }
@@ -122,11 +122,11 @@ TEST_F(CriteriaThatNameTables, NeverTurnToAnotherTableOfTheDeletedOnesName) {
 TEST_F(CriteriaThatNameTables, NeverTurnToAColumnOfAnotherTableNorToAParameter) {
     defined(a, u"id", u"[weight]");
     query->DeleteTable(b);
-    EXPECT_EQ(where(), "a.id: At character 1: expected a column of the query, the table that had "
-                       "this one was deleted.");
+    EXPECT_EQ(where(),
+              "a.id: At character 1: the table of this column was deleted from the query.");
     query->addTable(described(u"d", u"weight"));
-    EXPECT_EQ(where(), "a.id: At character 1: expected a column of the query, the table that had "
-                       "this one was deleted.");
+    EXPECT_EQ(where(),
+              "a.id: At character 1: the table of this column was deleted from the query.");
 }
 
 TEST_F(CriteriaThatNameTables, StayWithTheColumnThatWasMeantWhenAnotherTableGetsItToo) {
@@ -148,8 +148,7 @@ TEST_F(CriteriaThatNameTables, StayParametersAndTextsWhateverTablesComeLater) {
 
 TEST_F(CriteriaThatNameTables, MayNameATableBeforeItIsThere) {
     defined(a, u"id", u"[late].[id] Or late.size");
-    EXPECT_EQ(where(),
-              "a.id: At character 1: expected a column of the query, there is no late.id.");
+    EXPECT_EQ(where(), "a.id: At character 1: the query has no column late.id.");
     const auto late = query->addTable(described(u"late", u"size"));
     EXPECT_EQ(where(), "a.id = late.id\n    OR a.id = late.size");
     query->renameTable(late, u"now");

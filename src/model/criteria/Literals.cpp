@@ -162,11 +162,11 @@ std::optional<sql::Value> booleanValue(StringView text) {
     return {};
 }
 
+} // namespace
+
 bool isNumber(ColumnType type) {
     return type == ColumnType::Integer || type == ColumnType::Decimal;
 }
-
-} // namespace
 
 StringView nameOf(ColumnType type) {
     switch (type) {
@@ -181,6 +181,21 @@ StringView nameOf(ColumnType type) {
     case ColumnType::Unknown: break;
     }
     return u"a value";
+}
+
+StringView refusalOf(ColumnType type) {
+    switch (type) {
+    case ColumnType::Integer:
+    case ColumnType::Decimal: return u"this is no number, write it like 12 or 1.5";
+    case ColumnType::Date: return u"this is no date, write it like 2024-12-31";
+    case ColumnType::Time: return u"this is no time, write it like 23:59";
+    case ColumnType::Timestamp: return u"this is no date and time, write it like 2024-12-31 23:59";
+    case ColumnType::Boolean: return u"write true or false here";
+    case ColumnType::Blob: return u"only Is Null, a column or a parameter can stand here";
+    case ColumnType::Text:
+    case ColumnType::Unknown: break;
+    }
+    return u"only dates and times stand between two #";
 }
 
 std::optional<sql::Value> literal(StringView text, ColumnType type) {

@@ -9,6 +9,9 @@ namespace model::criteria {
 
 /// What a value of a type is called in a message: "a number", "a date (2024-12-31)".
 StringView nameOf(ColumnType type);
+/// What is said of something typed that is no value of a type, ending with a way to write one.
+StringView refusalOf(ColumnType type);
+bool isNumber(ColumnType type);
 
 /// The value that a text is for a column of a type, canonical, or nothing when it is none.
 /// Numbers: sign, digits, point, exponent. Dates: year-month-day, checked against the calendar.

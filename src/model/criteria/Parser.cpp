@@ -12,6 +12,7 @@ using sql::Node;
 namespace {
 
 constexpr int deepestNesting = 100;
+constexpr StringView decimalPoint = u"decimals are written with a point, as in 1.5";
 
 class Parser {
 public:
@@ -23,7 +24,8 @@ public:
     Reading read() {
         try {
             if (peek().kind != TokenKind::end) mReading.condition = disjunction();
-            if (peek().kind != TokenKind::end) fail(u"expected And, Or or the end");
+            if (peek().kind != TokenKind::end)
+                fail(u"put And or Or between two conditions, or quotes around a text");
         } catch (Error& error) {
             mReading.condition = {};
             mReading.error = std::move(error);
@@ -38,7 +40,7 @@ private:
     public:
         explicit Nesting(Parser& parser) : mParser(parser) {
             if (++mParser.mDepth > deepestNesting)
-                mParser.fail(u"expected less nesting, 100 levels are the most");
+                mParser.fail(u"this is nested too deep, 100 levels are the most");
         }
         ~Nesting() { --mParser.mDepth; }
 
@@ -63,11 +65,37 @@ private:
         take();
         return true;
     }
-    [[noreturn]] void fail(StringView expected) const { throw errorAt(peek().begin, expected); }
-    [[noreturn]] void failValue(const Token& token, ColumnType type) const {
-        String what = u"expected ";
-        what += nameOf(type);
+    [[noreturn]] void fail(StringView what) const {
+        if (atDecimalComma()) throw errorAt(peek().begin, decimalPoint);
+        throw errorAt(peek().begin, what);
+    }
+    /// For want of a value.
+    [[noreturn]] void failMissing(const Token& token) const {
+        String what(nameOf(mSubjectColumn.type));
+        what += u" is missing";
         throw errorAt(token.begin, what);
+    }
+    /// For a value that is none of the column's.
+    [[noreturn]] void failValue(const Token& token) const {
+        const bool number = isNumber(mSubjectColumn.type);
+        const std::size_t comma = token.text.find(u',');
+        if (number && comma != String::npos) {
+            String point = token.text;
+            point[comma] = u'.';
+            if (literal(point, ColumnType::Decimal)) throw errorAt(token.begin, decimalPoint);
+        }
+        throw errorAt(token.begin, refusalOf(mSubjectColumn.type));
+    }
+    /// Whether digits stand on both sides of a comma that no list has, as in 1,5.
+    bool atDecimalComma() const {
+        if (peek().kind != TokenKind::comma || mAt == 0 || mSubjectColumn.type == ColumnType::Text)
+            return false;
+        const Token& before = mTokens[mAt - 1];
+        const Token& behind = peek(1);
+        return before.kind == TokenKind::word && behind.kind == TokenKind::word &&
+               before.end == peek().begin && peek().end == behind.begin &&
+               literal(before.text, ColumnType::Decimal) &&
+               literal(behind.text, ColumnType::Decimal);
     }
 
     Node disjunction() {
@@ -98,7 +126,7 @@ private:
             const Nesting nesting(*this);
             take();
             Node inner = disjunction();
-            if (!takeKind(TokenKind::close)) fail(u"expected a closing )");
+            if (!takeKind(TokenKind::close)) fail(u"a closing ) is missing");
             return inner;
         }
         if (at(u"Like")) return like(negated);
@@ -106,7 +134,7 @@ private:
         if (at(u"In") && peek(1).kind == TokenKind::open) return in(negated);
         if (negated) {
             take();
-            fail(u"expected ( after In");
+            fail(u"after In comes a list in parentheses, as in In (1, 2)");
         }
         if (at(u"Is")) return isNull();
         auto comparison = sql::Comparison::equal;
@@ -126,7 +154,8 @@ private:
     Node isNull() {
         take();
         const bool negated = takeKeyword(u"Not");
-        if (!takeKeyword(u"Null")) fail(u"expected Null, a text that begins so needs quotes");
+        if (!takeKeyword(u"Null"))
+            fail(u"after Is comes Null or Not Null, and a text that begins so needs quotes");
         return sql::make(sql::IsNull{negated, mSubject});
     }
 
@@ -134,7 +163,7 @@ private:
         const Token word = take();
         if (!takesAnyText())
             throw errorAt(word.begin,
-                          u"expected a comparison, Like works on columns that hold text");
+                          u"Like works only on columns that hold text, use =, < or > here");
         const Token first = peek();
         const bool qualified = first.kind == TokenKind::bracketed && peek(1).kind == TokenKind::dot;
         Node asked;
@@ -142,7 +171,8 @@ private:
             asked = first.kind == TokenKind::bracketed ? bracketedName() : takeParameter();
         const auto* parameter = asked ? std::get_if<sql::Parameter>(&asked->node) : nullptr;
         if (qualified || (asked && !parameter))
-            throw errorAt(first.begin, u"expected a pattern, as in Like 'A*', not a column");
+            throw errorAt(first.begin,
+                          u"after Like comes a pattern, as in Like 'A*', not a column");
         if (parameter) {
             sql::Parameter pattern = *parameter;
             pattern.pattern = true;
@@ -150,14 +180,15 @@ private:
         }
         const String typed = first.kind == TokenKind::quoted ? take().text : barePattern();
         if (first.kind != TokenKind::quoted && typed.empty())
-            fail(u"expected a pattern, as in Like 'A*'");
+            fail(u"after Like comes a pattern, as in Like 'A*'");
         return sql::make(sql::Like{negated, mSubject,
                                    sql::make(sql::Value{ColumnType::Text, likePattern(typed)})});
     }
 
     Node between(bool negated) {
         Node low = operand();
-        if (!takeKeyword(u"And")) fail(u"expected And and the upper value");
+        if (!takeKeyword(u"And"))
+            fail(u"Between needs And and a second value, as in Between 1 And 5");
         Node high = operand();
         return sql::make(sql::Between{negated, mSubject, std::move(low), std::move(high)});
     }
@@ -167,7 +198,7 @@ private:
         take();
         std::vector<Node> list{operand()};
         while (takeKind(TokenKind::comma)) list.push_back(operand());
-        if (!takeKind(TokenKind::close)) fail(u"expected a comma or a closing )");
+        if (!takeKind(TokenKind::close)) fail(u"a comma or a closing ) is missing");
         return sql::make(sql::In{negated, mSubject, std::move(list)});
     }
 
@@ -181,7 +212,7 @@ private:
         case TokenKind::dated: return delimitedValue(take());
         case TokenKind::word: return bareValue();
         case TokenKind::bracketed: return bracketedName();
-        default: failValue(first, mSubjectColumn.type);
+        default: failMissing(first);
         }
     }
 
@@ -189,24 +220,25 @@ private:
         ColumnType type = mSubjectColumn.type;
         if (token.kind == TokenKind::dated) {
             const auto moment = momentLiteral(token.text, type);
-            if (!moment) failValue(token, type);
+            if (!moment) failValue(token);
             return sql::make(*moment);
         }
         // Quotes around a value say that it is text wherever the column does not know better.
         if (type == ColumnType::Unknown) type = ColumnType::Text;
         const auto value = literal(token.text, type);
-        if (!value) failValue(token, type);
+        if (!value) failValue(token);
         return sql::make(*value);
     }
 
     Node bareValue() {
         const Token first = peek();
         if (at(u"Null"))
-            fail(u"expected a value, write Is Null for a missing one or 'Null' for the word");
+            fail(u"nothing is equal to Null, write Is Null for a missing value or 'Null' for the "
+                 u"word");
         const String typed = bareText();
-        if (typed.empty()) failValue(first, mSubjectColumn.type);
+        if (typed.empty()) failMissing(first);
         const auto value = literal(typed, mSubjectColumn.type);
-        if (!value) failValue(first, mSubjectColumn.type);
+        if (!value) failValue(first);
         return sql::make(*value);
     }
 
@@ -243,7 +275,7 @@ private:
         if (!isBareName(name)) {
             // A text may begin with a colon; other values cannot.
             if (takesAnyText()) return {};
-            throw errorAt(token.begin + 1, u"expected the parameter's name");
+            throw errorAt(token.begin + 1, u"a parameter needs a name, as in :year");
         }
         take();
         return sql::make(sql::Parameter{std::move(name), mSubjectColumn.type});
@@ -259,10 +291,10 @@ private:
             take();
             const Token second = take();
             if (second.kind != TokenKind::bracketed && second.kind != TokenKind::word)
-                throw errorAt(second.begin, u"expected the column's name");
+                throw errorAt(second.begin, u"the name of a column is missing behind the point");
             const auto found = lookUp({first.begin, first.end}, first.text, second.text);
             if (!found) {
-                String what = u"expected a column of the query, there is no ";
+                String what = u"the query has no column ";
                 what += first.text + u"." + second.text;
                 throw errorAt(first.begin, what);
             }
@@ -295,8 +327,8 @@ private:
         }
         const auto found = mResolver.columnsNamed(token.text);
         if (found.size() > 1) {
-            String what = u"expected the table too, as in [" + found.front().column.table + u"].[" +
-                          token.text + u"], several tables have this column";
+            String what = u"several tables have this column, write the table too, as in [" +
+                          found.front().column.table + u"].[" + token.text + u"]";
             throw errorAt(token.begin, what);
         }
         Reference reference{token.begin, token.begin};
@@ -331,9 +363,7 @@ private:
         if (known.column.empty()) return {};
         const auto column = known.column.column();
         if (!column)
-            throw errorAt(
-                known.begin,
-                u"expected a column of the query, the table that had this one was deleted");
+            throw errorAt(known.begin, u"the table of this column was deleted from the query");
         return columnRef(*column, *known.column.table().table());
     }
 
@@ -347,7 +377,7 @@ private:
 
     Node columnNode(const Token& token, const sql::ColumnRef& column) {
         if (!comparable(column.type, mSubjectColumn.type)) {
-            String what = u"expected a column that holds ";
+            String what = u"compare it with a column that holds ";
             what += nameOf(mSubjectColumn.type);
             throw errorAt(token.begin, what);
         }

@@ -20,14 +20,14 @@ bool isSpecial(char16_t c) { return StringView(u"'\"()[],=<>!").find(c) != Strin
 /// A character that text cannot carry to any engine.
 std::optional<Error> unusable(StringView text) {
     if (text.size() > longestText)
-        return errorAt(longestText, u"expected the end, a criterion has at most 10000 characters");
+        return errorAt(longestText, u"a criterion has at most 10000 characters");
     for (std::size_t i = 0; i < text.size(); ++i) {
         const char16_t c = text[i];
-        if (c == 0) return errorAt(i, u"expected a character, found the character zero");
+        if (c == 0) return errorAt(i, u"the character zero cannot stand in a criterion");
         if (c < 0xD800 || c > 0xDFFF) continue;
         const bool paired =
             c < 0xDC00 && i + 1 < text.size() && text[i + 1] >= 0xDC00 && text[i + 1] <= 0xDFFF;
-        if (!paired) return errorAt(i, u"expected a character, found half of one");
+        if (!paired) return errorAt(i, u"half a character stands here, type it afresh");
         ++i;
     }
     return {};
@@ -52,15 +52,15 @@ private:
 
     std::optional<Error> next() {
         switch (mText[mAt]) {
-        case u'\'': return delimited(TokenKind::quoted, u'\'', u"expected a closing '");
-        case u'"': return delimited(TokenKind::quoted, u'"', u"expected a closing \"");
+        case u'\'': return delimited(TokenKind::quoted, u'\'', u"a closing ' is missing");
+        case u'"': return delimited(TokenKind::quoted, u'"', u"a closing \" is missing");
         case u'[': return bracketed();
-        case u'#': return delimited(TokenKind::dated, u'#', u"expected a closing #");
+        case u'#': return delimited(TokenKind::dated, u'#', u"a closing # is missing");
         case u'(': return single(TokenKind::open);
         case u')': return single(TokenKind::close);
         case u',': return single(TokenKind::comma);
-        case u']': return errorAt(mAt, u"expected a [ before this ]");
-        case u'!': return errorAt(mAt, u"expected an operator, write <> for unequal");
+        case u']': return errorAt(mAt, u"a [ before this ] is missing");
+        case u'!': return errorAt(mAt, u"write <> for unequal");
         case u'=':
         case u'<':
         case u'>': return comparison();
@@ -101,10 +101,10 @@ private:
     }
 
     std::optional<Error> bracketed() {
-        if (auto error = delimited(TokenKind::bracketed, u']', u"expected a closing ]"))
+        if (auto error = delimited(TokenKind::bracketed, u']', u"a closing ] is missing"))
             return error;
         if (mTokens.back().text.empty())
-            return errorAt(mTokens.back().begin + 1, u"expected a name between the brackets");
+            return errorAt(mTokens.back().begin + 1, u"a name is missing between the brackets");
         return {};
     }
 

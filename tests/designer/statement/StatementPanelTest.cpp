@@ -157,7 +157,7 @@ TEST_F(TheStatementPanel, ListsErrorsBeforeWarningsEachWithItsMark) {
     });
     ASSERT_TRUE(soon([&] { return list().count() == 3; }));
     EXPECT_EQ(list().item(0)->text(),
-              "orders.name: At character 5: expected a pattern, as in Like 'A*'.");
+              "orders.name: At character 5: after Like comes a pattern, as in Like 'A*'.");
     EXPECT_EQ(list().item(1)->text(), "No join connects customers with orders: every row of one "
                                       "comes with every row of the other.");
     EXPECT_EQ(list().item(2)->text(), "orders.* cannot be sorted: sort one of its columns.");
