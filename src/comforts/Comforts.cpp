@@ -18,7 +18,11 @@ void Comforts::attach(TalvikDBxZandor::Zandor& control) {
          .CellWritten =
              [this](auto column) {
                  if (mDoor->grid().ColData(column) != 0) fit(*mDoor, column);
-             }});
+             },
+         .JoinPlaced = {},
+         .MenuChecked = [this](std::int16_t source) { menuChecked(source); }});
+    if (mFlags.ReadsJoins) readJoins(true);
+    offerRename();
 }
 
 void Comforts::detach() {
@@ -27,6 +31,13 @@ void Comforts::detach() {
     mTyping.reset();
     mOffer.reset();
     mFields.reset();
+    mRename.reset();
+}
+
+void Comforts::setWords(const Words& words) {
+    mWords = words;
+    if (mRename) mRename->Caption(mWords.Rename);
+    if (mFlags.ReadsJoins) readJoins(true);
 }
 
 bool Comforts::act(platform::StringView procedure, const std::function<bool(Door&)>& body) {
@@ -42,7 +53,9 @@ bool Comforts::act(platform::StringView procedure, const std::function<bool(Door
 }
 
 void Comforts::setFlags(const Flags& flags) {
-    mFlags = flags;
+    const bool readBefore = std::exchange(mFlags, flags).ReadsJoins;
+    if (readBefore != mFlags.ReadsJoins) readJoins(mFlags.ReadsJoins);
+    offerRename();
     act(u"setFlags", [this](Door& door) { return bound(door), true; });
 }
 

@@ -2,7 +2,9 @@
 
 #include "comforts/Field.h"
 #include "comforts/Flags.h"
+#include "comforts/Words.h"
 #include "control/Events.h"
+#include "control/Hooks.h"
 #include "platform/Toolkit.h"
 
 #include <map>
@@ -44,6 +46,8 @@ public:
 
     const Flags& flags() const { return mFlags; }
     void setFlags(const Flags& flags);
+    const Words& words() const { return mWords; }
+    void setWords(const Words& words);
 
     /// An event of the control, on its way to the host.
     void raised(TalvikDBxZandor::Event event, const TalvikDBxZandor::EventArguments& arguments);
@@ -76,6 +80,13 @@ public:
     /// Goes to a cell as a click on it does, without opening its editor. False when it is not in
     /// the grid.
     bool showCell(const String& definition, std::int32_t row);
+    // Joins and tables
+    /// A join in one sentence, with the words of the moment.
+    String sentenceOf(const TalvikDBxZandor::PlacedJoin& join) const;
+    /// The right button has come up over the title of the table in a slot.
+    bool titleClicked(std::int16_t table);
+    /// The user wants another name for a table, by its key; set by the front end.
+    std::function<void(const String& key)> RenameRequested;
 
     // Editors of cells
     /// What is being typed goes into its cell, and the editor closes. For hosts that are about to
@@ -127,8 +138,15 @@ private:
     void markFindings(Door& door);
     static bool goOn(Door& door, std::int32_t rows, std::int32_t columns, bool edits);
 
+    platform::LineNotes notesOf(const TalvikDBxZandor::PlacedJoin& join) const;
+    void readJoins(bool now);
+    void offerRename();
+    void menuChecked(std::int16_t source);
+
     platform::Toolkit& mToolkit;
     Flags mFlags;
+    Words mWords;
+    std::unique_ptr<platform::MenuEntry> mRename;
     std::shared_ptr<Door> mDoor;
     std::optional<Typing> mTyping;
     std::optional<Offer> mOffer;

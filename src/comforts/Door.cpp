@@ -130,6 +130,20 @@ void Door::clearNotes() {
         for (std::int32_t row = 0; row < grid().Rows(); ++row) note(row, column, {});
 }
 
+void Door::popUpOver(std::int16_t table) {
+    control().lstTable_GotFocus(table);
+    if (isOpen()) control().PopupZandorMenu(0, 0, 0);
+}
+
+std::unique_ptr<platform::MenuEntry>
+Door::addMenuEntry(platform::StringView name, const String& caption, platform::PlainEvent click) {
+    return control().mnuZandor->makeEntry({.Name = name, .Caption = caption}, std::move(click));
+}
+
+platform::String Door::keyOfActiveTable() const {
+    return control().lstTable(control().mActiveTableIndex)->Tag();
+}
+
 void Door::goTo(std::int32_t row, std::int32_t column) {
     control().sprColumn->Row(row);
     control().sprColumn->Col(column);

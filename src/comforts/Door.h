@@ -35,6 +35,10 @@ public:
     ~Door() { shut(); }
 
     void listen(TalvikDBxZandor::Hooks hooks) { control().mHooks = std::move(hooks); }
+    void
+    listenToJoins(std::function<void(const TalvikDBxZandor::PlacedJoin&, platform::Line&)> placed) {
+        control().mHooks.JoinPlaced = std::move(placed);
+    }
     void shut();
     bool isOpen() const { return mControl && !mControl->mLife.ended(); }
 
@@ -86,6 +90,15 @@ public:
     /// Makes an output column of an entry (1-based) of the table in a slot, as dropping it on a
     /// grid column does. What was copied for a later "Paste Column" stays.
     void drop(std::int16_t table, std::int32_t entry, std::int32_t column);
+
+    // Canvas and menu
+    void drawJoins() { control().DrawJoins(); }
+    /// Opens the menu as over the list of the table in a slot.
+    void popUpOver(std::int16_t table);
+    /// At the menu's end.
+    std::unique_ptr<platform::MenuEntry>
+    addMenuEntry(platform::StringView name, const String& caption, platform::PlainEvent click);
+    String keyOfActiveTable() const;
 
     // The current cell
     void goTo(std::int32_t row, std::int32_t column);

@@ -21,6 +21,15 @@ struct Flags {
     bool MovesColumns = false;
     /// Columns are as wide as what they hold, within limits, until somebody sets their width.
     bool FitsColumns = false;
+    /// A line shows which table keeps all its rows and an operator other than "="; a sentence says
+    /// it in full. A double click on a line opens its definition.
+    bool ReadsJoins = false;
+
+    /// A table's title opens the menu of its list; there the table can be renamed, by the host.
+    bool HasTitleMenu = false;
+
+    /// Canvas and grid are divided by a handle that the user moves.
+    bool MovesPanes = false;
 
     static constexpr Flags all() {
         return {.AddsOnDoubleClick = true,
@@ -28,7 +37,10 @@ struct Flags {
                 .MarksOutput = true,
                 .OffersFields = true,
                 .MovesColumns = true,
-                .FitsColumns = true};
+                .FitsColumns = true,
+                .ReadsJoins = true,
+                .HasTitleMenu = true,
+                .MovesPanes = true};
     }
 
     friend bool operator==(const Flags&, const Flags&) = default;

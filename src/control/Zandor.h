@@ -163,6 +163,11 @@ public:
     Ref<TalvikZandorLib::ZDColumn> ActiveColumn() const { return Nothing<TalvikZandorLib::ZDColumn>(u"P_GET activecolumn"); }
     // clang-format on
 
+    /// The share of the height that the canvas has above the grid; not part of the public
+    /// interface. Kept within 0.05 and 0.95; what is no number changes nothing.
+    float UpperPaneShare() const { return mUpperPaneShare; }
+    void UpperPaneShare(float share);
+
     /// Drops every table and replaces the model by an empty one.
     void Terminate();
     /// Selects the columns of a name in every shown and model table of a name, and no others there.
@@ -420,6 +425,8 @@ private:
     bool mTraces = true; ///< false for what is not traced even with DebugSwitch
     std::int16_t mJoinModifyDisabled = 0;
     bool mOnlyJoin = true;
+    static constexpr float half = 0.5F;
+    float mUpperPaneShare = half;
     bool mUseJoinType[4] = {true, true, true, true};
     bool mUseOperator[6] = {true, true, true, true, true, true};
 

@@ -2,6 +2,9 @@
 
 #include "platform/Numbers.h"
 
+#include <algorithm>
+#include <cmath>
+
 namespace TalvikDBxZandor {
 
 using platform::single;
@@ -60,7 +63,14 @@ void Zandor::End() {
 
 float Zandor::UpperPaneHeight() const {
     const float height = mToolkit->ScaleHeight();
-    return mOnlyJoin ? height : single(height / 2);
+    return mOnlyJoin ? height : single(height * mUpperPaneShare);
+}
+
+void Zandor::UpperPaneShare(float share) {
+    constexpr float least = 0.05F;
+    if (std::isnan(share)) return;
+    mUpperPaneShare = std::clamp(share, least, 1 - least);
+    ResizeControls();
 }
 
 void Zandor::ResizeControls() {
@@ -80,7 +90,7 @@ void Zandor::ResizeControls() {
         if (height <= 300) return;
         if (!mOnlyJoin) {
             sprColumn->Top(height);
-            sprColumn->Height(height);
+            sprColumn->Height(single(mToolkit->ScaleHeight() - height));
         }
         vsbTable->Height(single(height - hsbTable->Height()));
         hsbTable->Top(vsbTable->Height());

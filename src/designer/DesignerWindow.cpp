@@ -52,6 +52,7 @@ constexpr int layoutVersion = 1;      // another number forgets where the panels
 constexpr int mostOutputColumns = 255;
 constexpr int messageTime = 10'000; // milliseconds
 
+QString paneShareKey() { return QStringLiteral("window/paneShare"); }
 QString geometryKey() { return QStringLiteral("window/geometry"); }
 QString darkKey() { return QStringLiteral("window/dark"); }
 QString layoutKey() { return QStringLiteral("window/layout"); }
@@ -65,6 +66,11 @@ DesignerWindow::DesignerWindow()
       mDatabases(new DatabaseCommands(mDatabase, mFile, *mFiles, mRecentDatabases, *this)),
       mShow(new ShowCommands(mDocument, mFile, *mDrawing, mSettings, *this)) {
     mDrawing->setOptions(ControlOptions::read(mSettings).properties());
+    mDrawing->setPaneShare(mSettings.value(paneShareKey(), 0.6).toDouble());
+    connect(mDrawing, &DrawingArea::paneShareChanged, this,
+            [this](double share) { mSettings.setValue(paneShareKey(), share); });
+    connect(mDrawing, &DrawingArea::renameRequested, this,
+            [this](const QString& key) { RenameDialog(mDocument, this, key).exec(); });
     auto* const middle = new QWidget;
     auto* const layout = new QVBoxLayout(middle);
     layout->setContentsMargins({});

@@ -43,6 +43,12 @@ void DrawingArea::showFindings(const model::Findings& findings) {
     mControl->setFindings(mFindings);
 }
 
+void DrawingArea::setPaneShare(double share) {
+    mPaneShare = share;
+    mControl->setUpperPaneShare(share);
+    fitCanvas();
+}
+
 QPoint DrawingArea::canvasPlace(QPoint at) const {
     return at * twipsPerPixel + QPoint(mControl->VisibleFrameLeft(), mControl->VisibleFrameTop());
 }
@@ -64,6 +70,7 @@ void DrawingArea::makeControl() {
         mControl->setProperty(option.key().toLatin1().constData(), option.value());
     emit controlMade(mControl);
     mControl->setGeometry(rect());
+    mControl->setUpperPaneShare(mPaneShare);
     fitCanvas();
     // After the texts, for it shows the grid's row titles.
     mControl->setOnlyJoin(mOptions.value(QStringLiteral("OnlyJoin"), false).toBool());
@@ -83,6 +90,12 @@ void DrawingArea::makeControl() {
         // This may run within a signal of its own.
         before->deleteLater();
     }
+    connect(mControl, &ZandorWidget::upperPaneShareChanged, this, [this](double share) {
+        mPaneShare = share;
+        fitCanvas();
+        emit paneShareChanged(share);
+    });
+    connect(mControl, &ZandorWidget::renameRequested, this, &DrawingArea::renameRequested);
     const auto tell = [this](auto... events) {
         (connect(mControl, events, &mDocument, &Document::changedByControl), ...);
     };
@@ -102,10 +115,10 @@ void DrawingArea::resizeEvent(QResizeEvent* event) {
 void DrawingArea::fitCanvas() {
     const QSize needed = canvasNeeded(*mDocument.query());
     const QSize visible = size() * twipsPerPixel;
-    // The grid covers the lower half, yet the control scrolls a canvas only when it is higher than
-    // both halves together.
-    const int scrolling = needed.height() > visible.height() / 2 ? visible.height() + twipsPerPixel
-                                                                 : visible.height();
+    // The grid covers the lower pane, yet the control scrolls a canvas only when it is higher than
+    // both panes together.
+    const bool scrolls = needed.height() > visible.height() * mPaneShare;
+    const int scrolling = scrolls ? visible.height() + twipsPerPixel : visible.height();
     mControl->setMXHorzFrameSize(canvasLength(std::max(needed.width(), visible.width())));
     mControl->setMXVertFrameSize(canvasLength(std::max(needed.height(), scrolling)));
 }

@@ -31,6 +31,8 @@ public:
 
     /// Marks the cells of the grid that the findings are about.
     void showFindings(const model::Findings& findings);
+    /// The share of the height that the canvas has above the grid, of this control and later ones.
+    void setPaneShare(double share);
 
     /// The place on the canvas, in twips, that is seen at a place of this widget.
     QPoint canvasPlace(QPoint at) const;
@@ -38,6 +40,10 @@ public:
 signals:
     /// A control was made, and has its options and not yet its model.
     void controlMade(ZandorWidget* control);
+    /// The user has moved the divider.
+    void paneShareChanged(double share);
+    /// The user wants another name for the table of a key.
+    void renameRequested(const QString& key);
 
 protected:
     void resizeEvent(QResizeEvent* event) override;
@@ -51,6 +57,7 @@ private:
     model::Library mLibrary; ///< outlives every control
     QVariantMap mOptions;
     std::vector<comforts::Finding> mFindings;
+    double mPaneShare = 0.6;
     ZandorWidget* mControl = nullptr;
 };
 

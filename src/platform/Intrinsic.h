@@ -94,6 +94,17 @@ public:
     virtual void Enabled(bool value) = 0;
 };
 
+/// Short texts at a line, from its first end to its second, and the whole in a sentence. Empty ones
+/// are not shown.
+struct LineNotes {
+    String First;
+    String Middle;
+    String Second;
+    String Sentence;
+
+    friend bool operator==(const LineNotes&, const LineNotes&) = default;
+};
+
 /// A line painted by the canvas, below every table. Coordinates in canvas twips.
 class Line {
 public:
@@ -106,6 +117,8 @@ public:
     /// In logical pixels; 1 is plain, 2 highlighted.
     virtual void BorderWidth(std::int16_t value) = 0;
     virtual void Visible(bool value) = 0;
+    /// A line has none at first.
+    virtual void Notes(const LineNotes& value) = 0;
 };
 
 inline constexpr std::int16_t shapeSquare = 1;

@@ -156,7 +156,12 @@ TEST_F(TheWidget, TakesTheParametersOfTheMethodsUnderTheirNames) {
 TEST_F(TheWidget, HasEveryEventOfTheInterfaceAsASignalAndNoOther) {
     Names events;
     for (const auto& event : automation::events()) events.insert(platform::toUtf8(event.name));
-    EXPECT_EQ(namesOf(methodsOf(QMetaMethod::Signal)), events);
+    // What stands beside the interface begins with a small letter.
+    Names raised = namesOf(methodsOf(QMetaMethod::Signal));
+    std::erase_if(raised, [](const std::string& name) { return name[0] >= 'a'; });
+    EXPECT_EQ(raised, events);
+    EXPECT_TRUE(std::none_of(events.begin(), events.end(),
+                             [](const std::string& name) { return name[0] >= 'a'; }));
 }
 
 TEST_F(TheWidget, CarriesInItsSignalsWhatTheEventsCarry) {

@@ -44,7 +44,10 @@ void Zandor::lstTable_Moved(std::int16_t Index) {
         if (table->Top() < visibleTop) table->Top(visibleTop);
         if (table->Left() < visibleLeft) table->Left(visibleLeft);
         // The lower limit reckons with the grid's top, not its height; it comes last and wins.
-        float bottom = single(mToolkit->ScaleHeight() - sprColumn->Top());
+        // Between panes that are no halves, the grid's top is where the upper one ends.
+        const bool halves = mOnlyJoin || mUpperPaneShare == half;
+        float bottom =
+            halves ? single(mToolkit->ScaleHeight() - sprColumn->Top()) : sprColumn->Top();
         bottom = single(single(bottom - fraTable->Top()) - 600);
         if (table->Top() > bottom) table->Top(bottom);
         const float right = single(single(mToolkit->ScaleWidth() - fraTable->Left()) - 600);

@@ -44,6 +44,7 @@ void Zandor::CheckMenus(std::int16_t source, float X, float Y) {
             if (column >= 1 && !sprColumn->TextMatrix(0, column).empty())
                 mnuColumnDefinitionDelete->Enabled(true);
         }
+        if (const auto checked = mHooks.MenuChecked) checked(source);
     });
 }
 

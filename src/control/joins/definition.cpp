@@ -1,5 +1,6 @@
 #include "control/Zandor.h"
 
+#include "control/joins/symbols.h"
 #include "frmJoinDefinition.h"
 #include "platform/Numbers.h"
 
@@ -40,11 +41,10 @@ void Zandor::SetEnabledJoinTypes(frmJoinDefinition& dialog) {
 void Zandor::SetEnabledJoinOperators(frmJoinDefinition& dialog) {
     // Shares its report name with the list of types.
     Guard(u"SetEnabledJoinTypes", [&] {
-        const platform::StringView symbols[] = {u"=", u"<>", u"<", u">", u"<=", u">="};
         const auto& list = dialog.cboJoinCompareOperator;
         list->Clear();
-        for (std::size_t code = 0; code < std::size(symbols); ++code)
-            if (mUseOperator[code]) list->AddItem(String(symbols[code]));
+        for (std::size_t code = 0; code < operatorSymbols.size(); ++code)
+            if (mUseOperator[code]) list->AddItem(String(operatorSymbols[code]));
     });
 }
 

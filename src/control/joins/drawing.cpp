@@ -95,6 +95,15 @@ void Zandor::PlaceJoin(const clsJoinLine& JoinLine) {
     platform::Line& line = *linJoin(JoinLine.JoinLineIndex());
     line.setEnds(single(westPoint.X + markA.Width()), single(markA.Top() + markA.Height() / 2),
                  single(eastPoint.X - markB.Width()), single(markB.Top() + markB.Height() / 2));
+    if (const auto placed = mHooks.JoinPlaced)
+        placed({.LeftTable = leftTable->Text(),
+                .LeftColumn = leftItem->Text(),
+                .RightTable = rightTable->Text(),
+                .RightColumn = rightItem->Text(),
+                .JoinType = JoinLine.JoinType(),
+                .CompareOperator = JoinLine.CompareOperator(),
+                .LeftIsWest = leftIsWest},
+               line);
     line.Visible(true);
     markA.Visible(true);
     markB.Visible(true);

@@ -12,15 +12,18 @@
 
 namespace designer {
 
-RenameDialog::RenameDialog(Document& document, QWidget* parent)
+RenameDialog::RenameDialog(Document& document, QWidget* parent, const QString& key)
     : QDialog(parent), mDocument(document), mTables(new QComboBox), mName(new QLineEdit),
       mFault(new QLabel) {
     setWindowTitle(tr("Rename table"));
     mTables->setObjectName(QStringLiteral("renameTable"));
     mName->setObjectName(QStringLiteral("renameName"));
     mFault->setObjectName(QStringLiteral("renameFault"));
-    for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(document.query()->Tables()))
+    for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(document.query()->Tables())) {
         mTables->addItem(QString::fromStdU16String(table->Name()));
+        if (QString::fromStdU16String(table->Key()) == key)
+            mTables->setCurrentIndex(mTables->count() - 1);
+    }
     mFault->setTextFormat(Qt::PlainText);
     mFault->setWordWrap(true);
 

@@ -16,7 +16,8 @@ class RenameDialog final : public QDialog {
     Q_OBJECT
 
 public:
-    explicit RenameDialog(Document& document, QWidget* parent = nullptr);
+    /// Begins with the table of a key, or with the first.
+    explicit RenameDialog(Document& document, QWidget* parent = nullptr, const QString& key = {});
 
     /// Renames, as one step. What is wrong with the name is shown, and the dialog stays.
     void accept() override;

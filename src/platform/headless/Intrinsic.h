@@ -139,6 +139,8 @@ public:
     void setEnds(float X1, float Y1, float X2, float Y2) override;
     void BorderWidth(std::int16_t value) override;
     void Visible(bool value) override;
+    void Notes(const LineNotes& value) override { mNotes = value; }
+    const LineNotes& notes() const { return mNotes; }
 
     struct Ends {
         float X1 = 0, Y1 = 0, X2 = 0, Y2 = 0;
@@ -147,6 +149,7 @@ public:
     std::int16_t borderWidth() const { return mBorderWidth; }
 
 private:
+    LineNotes mNotes;
     Ends mEnds;
     std::int16_t mBorderWidth = 1;
 };

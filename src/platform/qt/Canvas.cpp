@@ -5,13 +5,17 @@
 #include "platform/qt/FocusFrame.h"
 #include "platform/qt/KeyCodes.h"
 #include "platform/qt/KeyboardMenu.h"
+#include "platform/qt/ShownText.h"
 #include "platform/qt/TabuletWidget.h"
+#include "platform/qt/Text.h"
 #include "platform/qt/Twips.h"
 
 #include <QAccessible>
+#include <QHelpEvent>
 #include <QMouseEvent>
 #include <QPaintEvent>
 #include <QPainter>
+#include <QToolTip>
 
 #include <algorithm>
 
@@ -118,6 +122,9 @@ void Canvas::paintEvent(QPaintEvent* event) {
     for (const CanvasItem* item : mItems)
         if (item->visible() && event->region().intersects(item->extent()))
             item->paint(painter, palette());
+    for (const CanvasItem* item : mItems)
+        if (item->visible() && event->region().intersects(item->extent()))
+            item->paintAbove(painter, palette());
     if (frameShown()) paintFocusFrame(painter, mView.seen(), palette());
 }
 
@@ -197,8 +204,44 @@ void Canvas::mousePressEvent(QMouseEvent* event) {
 
 void Canvas::mouseReleaseEvent(QMouseEvent* event) { report(mEvents.MouseUp, *event); }
 
-// The second press of a double click is a press like any other.
-void Canvas::mouseDoubleClickEvent(QMouseEvent* event) { mousePressEvent(event); }
+// The second press of a double click is a press like any other, and with a comfort more than that.
+void Canvas::mouseDoubleClickEvent(QMouseEvent* event) {
+    const QPointer<Canvas> alive = this;
+    mousePressEvent(event);
+    if (!alive || !mCurrent || event->button() != Qt::LeftButton || !mView.readsJoins()) return;
+    // The dialog must not come up while the press is being dealt with.
+    QMetaObject::invokeMethod(this, &Canvas::openCurrentLine, Qt::QueuedConnection);
+}
+
+bool Canvas::event(QEvent* event) {
+    if (event->type() != QEvent::ToolTip) return QWidget::event(event);
+    const auto& help = static_cast<QHelpEvent&>(*event);
+    const QString text = sentenceAt(help.pos());
+    if (text.isEmpty())
+        QToolTip::hideText();
+    else
+        QToolTip::showText(help.globalPos(), text, this);
+    return true;
+}
+
+QString Canvas::sentenceAt(QPoint at) const {
+    constexpr double reach = 90; // twips
+    const CanvasLine* nearest = nullptr;
+    double best = reach;
+    for (const CanvasLine* line : lines()) {
+        const double distance = line->distanceTo(QPointF(at) * twipsPerPixel);
+        if (distance >= best) continue;
+        best = distance;
+        nearest = line;
+    }
+    return nearest ? asToolTip(asSigns(toQt(nearest->notes().Sentence))) : QString();
+}
+
+void Canvas::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() != QEvent::FontChange) return;
+    for (CanvasItem* item : mItems) item->fontChanged();
+}
 
 void Canvas::dragEnterEvent(QDragEnterEvent* event) {
     event->setAccepted(mView.carries(event->mimeData()));

@@ -49,6 +49,8 @@ public:
     void dragGone() { mScroller.stop(); }
 
 protected:
+    bool event(QEvent* event) override;
+    void changeEvent(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
     void moveEvent(QMoveEvent* event) override;
     void focusInEvent(QFocusEvent* event) override;
@@ -65,6 +67,7 @@ protected:
 private:
     void makeCurrent(CanvasLine* line);
     bool frameShown() const { return mFocusShown && hasFocus() && !mCurrent; }
+    QString sentenceAt(QPoint at) const;
     void showFocus();
     void announceFocus();
     QPointF placeForKeys() const;

@@ -3,7 +3,10 @@
 #include "platform/qt/Canvas.h"
 #include "platform/qt/CanvasItems.h"
 #include "platform/qt/CanvasView.h"
+#include "platform/qt/PaneHandle.h"
+#include "platform/qt/ShownText.h"
 #include "platform/qt/TabuletWidget.h"
+#include "platform/qt/Text.h"
 #include "platform/qt/Twips.h"
 
 #include <QAccessibleWidget>
@@ -31,6 +34,7 @@ public:
     int indexOfChild(const QAccessibleInterface*) const override { return -1; }
 
     QString text(QAccessible::Text kind) const override {
+        if (kind == QAccessible::Description) return asSigns(toQt(mLine.notes().Sentence));
         return kind == QAccessible::Name ? mCanvas.view().nameOf(mLine) : QString();
     }
     void setText(QAccessible::Text, const QString&) override {}
@@ -113,6 +117,8 @@ QAccessibleInterface* make(const QString& className, QObject* object) {
         return new CanvasAccessible(*static_cast<Canvas*>(object));
     if (className == QLatin1String(TabuletWidget::staticMetaObject.className()))
         return new QAccessibleWidget(static_cast<QWidget*>(object), QAccessible::Window);
+    if (className == QLatin1String(PaneHandle::staticMetaObject.className()))
+        return new QAccessibleWidget(static_cast<QWidget*>(object), QAccessible::Splitter);
     if (className == QLatin1String("ZandorWidget"))
         return new QAccessibleWidget(static_cast<QWidget*>(object), QAccessible::Grouping);
     return nullptr;

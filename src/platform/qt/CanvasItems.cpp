@@ -1,8 +1,11 @@
 #include "platform/qt/CanvasItems.h"
 
 #include "platform/qt/CanvasAccessible.h"
+#include "platform/qt/ShownText.h"
+#include "platform/qt/Text.h"
 #include "platform/qt/Twips.h"
 
+#include <QFontMetricsF>
 #include <QLineF>
 #include <QPainter>
 
@@ -120,7 +123,66 @@ QRegion CanvasLine::area() const {
                       .adjusted(-margin, -margin, margin, margin)
                       .toAlignedRect();
     }
+    for (const Plate& plate : plates())
+        region += plate.place.adjusted(-1, -1, 1, 1).toAlignedRect();
     return region;
+}
+
+void CanvasLine::Notes(const LineNotes& value) {
+    if (value == mNotes) return;
+    mNotes = value;
+    changed();
+}
+
+QFont CanvasLine::plateFont() const {
+    QFont font = canvas() ? canvas()->font() : QFont();
+    if (font.pointSizeF() > 0)
+        font.setPointSizeF(font.pointSizeF() * 0.85);
+    else
+        font.setPixelSize(std::max(1, font.pixelSize() * 85 / 100));
+    return font;
+}
+
+std::vector<CanvasLine::Plate> CanvasLine::plates() const {
+    if (mNotes.First.empty() && mNotes.Middle.empty() && mNotes.Second.empty()) return {};
+    const QLineF line(pixelPoint(mX1, mY1), pixelPoint(mX2, mY2));
+    const QFontMetricsF metrics(plateFont());
+    std::vector<Plate> all;
+    const auto add = [&](const String& note, qreal side) {
+        if (note.empty()) return;
+        constexpr qreal padding = 4;
+        constexpr qreal clear = 6; // of the mark at the end
+        const QString text = asSigns(toQt(note));
+        const QSizeF size(metrics.horizontalAdvance(text) + 2 * padding, metrics.height() + 1);
+        // On a short line the plates stay apart from each other rather than from the ends.
+        const qreal way = std::min(line.length() * 0.2, size.width() / 2 + clear);
+        const qreal share = line.length() > 0 ? way / line.length() : 0;
+        QRectF place({}, size);
+        place.moveCenter(line.pointAt(side < 0 ? share : side > 0 ? 1 - share : 0.5));
+        all.push_back({text, place});
+    };
+    add(mNotes.First, -1);
+    add(mNotes.Middle, 0);
+    add(mNotes.Second, 1);
+    return all;
+}
+
+void CanvasLine::paintAbove(QPainter& painter, const QPalette& palette) const {
+    const auto all = plates();
+    if (all.empty()) return;
+    const bool highlighted = mBorderWidth > 1 || focused();
+    const QColor window = palette.color(QPalette::Window);
+    const QColor text = palette.color(QPalette::WindowText);
+    painter.setFont(plateFont());
+    for (const Plate& plate : all) {
+        painter.setPen(QPen(
+            highlighted ? palette.color(QPalette::Highlight) : between(window, text, 0.45), 1));
+        painter.setBrush(palette.color(QPalette::Base));
+        const QRectF inner = plate.place.adjusted(0.5, 0.5, -0.5, -0.5);
+        painter.drawRoundedRect(inner, inner.height() / 2.5, inner.height() / 2.5);
+        painter.setPen(palette.color(QPalette::Text));
+        painter.drawText(plate.place, Qt::AlignCenter, plate.text);
+    }
 }
 
 void CanvasLine::paint(QPainter& painter, const QPalette& palette) const {

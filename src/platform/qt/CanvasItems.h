@@ -25,6 +25,10 @@ public:
     /// Items of a lower layer are painted first.
     virtual int layer() const = 0;
     virtual void paint(QPainter& painter, const QPalette& palette) const = 0;
+    /// What stands above every line and mark.
+    virtual void paintAbove(QPainter&, const QPalette&) const {}
+    /// The canvas has another font.
+    void fontChanged() { changed(); }
 
     /// Whether the item is one of the marks at a line's ends.
     virtual bool touches(const CanvasLine&) const { return false; }
@@ -66,6 +70,8 @@ public:
     void BorderWidth(std::int16_t value) override;
     std::int16_t borderWidth() const { return mBorderWidth; }
     void Visible(bool value) override { setVisible(value); }
+    void Notes(const LineNotes& value) override;
+    const LineNotes& notes() const { return mNotes; }
 
     std::int16_t index() const { return mIndex; }
     const LineEnds& ends() const { return mEnds; }
@@ -78,13 +84,23 @@ public:
 
     int layer() const override { return 0; }
     void paint(QPainter& painter, const QPalette& palette) const override;
+    void paintAbove(QPainter& painter, const QPalette& palette) const override;
 
 private:
+    /// A note and the plate that it stands on, in logical pixels.
+    struct Plate {
+        QString text;
+        QRectF place;
+    };
+
     QRegion area() const override;
+    QFont plateFont() const;
+    std::vector<Plate> plates() const;
 
     const std::int16_t mIndex;
     const LineEnds& mAsked;
     LineEnds mEnds;
+    LineNotes mNotes;
     float mX1 = 0, mY1 = 0, mX2 = 0, mY2 = 0;
     std::int16_t mBorderWidth = 1;
     QAccessible::Id mAccessible = 0;

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "comforts/Comforts.h"
+
 #include <QPoint>
 #include <QPointer>
 #include <QRect>
@@ -24,7 +26,8 @@ class CanvasView {
 public:
     using Namer = std::function<QString(const CanvasLine&)>;
 
-    CanvasView(KeyboardMenu& menu, DragSession& drags) : mMenu(menu), mDrags(drags) {}
+    CanvasView(KeyboardMenu& menu, DragSession& drags, const comforts::Comforts& comforts)
+        : mMenu(menu), mDrags(drags), mComforts(comforts) {}
 
     void setCanvas(Canvas* canvas);
     void setBar(QScrollBar* bar) { (bar->orientation() == Qt::Horizontal ? mAcross : mDown) = bar; }
@@ -34,6 +37,7 @@ public:
     Canvas* canvas() const;
     KeyboardMenu& menu() const { return mMenu; }
     QString nameOf(const CanvasLine& line) const { return mNamer ? mNamer(line) : QString(); }
+    bool readsJoins() const { return mComforts.flags().ReadsJoins; }
     /// Whether the data are those of a drag within this control.
     bool carries(const QMimeData* data) const;
 
@@ -53,6 +57,7 @@ private:
 
     KeyboardMenu& mMenu;
     DragSession& mDrags;
+    const comforts::Comforts& mComforts;
     QPointer<QWidget> mCanvas;
     QPointer<QScrollBar> mAcross;
     QPointer<QScrollBar> mDown;

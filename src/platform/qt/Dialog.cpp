@@ -91,6 +91,7 @@ void DialogAdapter::Caption(const String& value) {
 
 void DialogAdapter::ShowModal() {
     if (!mWidget) return;
+    mWidget->prepare();
     mWidget->focusFirst();
     mWidget->exec();
 }

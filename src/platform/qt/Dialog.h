@@ -28,6 +28,12 @@ public:
     /// Gives the focus to what can be changed, or else to the button that Enter presses.
     void focusFirst();
     void setCloseEvent(PlainEvent Close) { mClose = std::move(Close); }
+    /// Called when the form is filled and about to be shown.
+    using Preparation = std::function<void(QDialog&)>;
+    void setPreparation(Preparation preparation) { mPreparation = std::move(preparation); }
+    void prepare() {
+        if (mPreparation) mPreparation(*this);
+    }
 
     QSize sizeHint() const override;
     /// Escape and the close button of the frame both come here.
@@ -39,6 +45,7 @@ private:
     int mLabels = 0;
     int mFields = 0;
     PlainEvent mClose;
+    Preparation mPreparation;
 };
 
 class DialogAdapter final : public Adapter<platform::Dialog, FormDialog> {

@@ -5,6 +5,7 @@
 #include "platform/qt/GridCorner.h"
 #include "platform/qt/GridModel.h"
 #include "platform/qt/KeyCodes.h"
+#include "platform/qt/PaneHandle.h"
 #include "platform/qt/ShownText.h"
 #include "platform/qt/Twips.h"
 
@@ -43,7 +44,7 @@ void prepareHeader(QHeaderView& header) {
 GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     : QWidget(parent), mModel(new GridModel(rows, cols, this)), mView(new TableView(this)),
       mTitles(new FieldTitles(*this, mView)), mGestures(*mTitles),
-      mCorner(new GridCorner(*mModel, mView)) {
+      mCorner(new GridCorner(*mModel, mView)), mHandle(new PaneHandle(this)) {
     setAcceptDrops(true);
     setFocusProxy(mView);
     mView->setFocusPolicy(Qt::ClickFocus);
@@ -231,7 +232,18 @@ QRect GridWidget::cellRect(int row, int col) const {
     return cell.translated(mView->pos() + mView->contentsRect().topLeft());
 }
 
-void GridWidget::resizeEvent(QResizeEvent*) { mView->setGeometry(rect()); }
+void GridWidget::showHandle(bool shown) {
+    mHandle->setVisible(shown);
+    arrange();
+}
+
+void GridWidget::arrange() {
+    const int above = mHandle->isHidden() ? 0 : PaneHandle::thickness;
+    mHandle->setGeometry(0, 0, width(), PaneHandle::thickness);
+    mView->setGeometry(rect().adjusted(0, above, 0, 0));
+}
+
+void GridWidget::resizeEvent(QResizeEvent*) { arrange(); }
 
 void GridWidget::changeEvent(QEvent* event) {
     QWidget::changeEvent(event);
@@ -386,7 +398,7 @@ bool GridWidget::toolTip(QWidget* part, const QHelpEvent& help) {
     for (int row = 0; row < mModel->rows(); ++row) {
         for (int col = 0; col < mModel->cols(); ++col) {
             // The fixed cells lie over those that have been scrolled below them.
-            const bool fixedRow = at.y() <= mCorner->geometry().bottom();
+            const bool fixedRow = at.y() <= mView->y() + mCorner->geometry().bottom();
             const bool fixedCol = at.x() <= mCorner->geometry().right();
             if (fixedRow != (row == 0) || fixedCol != (col == 0)) continue;
             const QRect cell = cellRect(row, col);

@@ -13,6 +13,7 @@ class FieldTitles;
 class GridCorner;
 class GridHeader;
 class GridModel;
+class PaneHandle;
 
 class GridListener {
 public:
@@ -55,6 +56,9 @@ public:
     void setListener(GridListener* listener);
     GridModel& model() const { return *mModel; }
     QTableView& view() const { return *mView; }
+    /// Stands above the cells while it is shown.
+    PaneHandle& handle() const { return *mHandle; }
+    void showHandle(bool shown);
 
     /// The model has changed.
     void touch();
@@ -96,6 +100,7 @@ private:
 
     GridHeader& fields() const;
     GridHeader& titles() const;
+    void arrange();
     void measure();
     /// Columns keep the share of their texts that they show.
     void fitColumnsToFont();
@@ -116,6 +121,7 @@ private:
     FieldTitles* mTitles;
     FieldGestures mGestures;
     GridCorner* mCorner;
+    PaneHandle* mHandle;
     int mRow = 1;
     int mCol = 1;
     int mRowHeight = 0;

@@ -1,6 +1,7 @@
 #include "platform/qt/JoinName.h"
 
 #include "control/Zandor.h"
+#include "control/joins/symbols.h"
 #include "platform/KeyedCollection.h"
 #include "platform/qt/LineEnds.h"
 #include "platform/qt/ShownText.h"
@@ -32,13 +33,12 @@ StringView textOf(std::int16_t code, const std::array<StringView, size>& texts) 
 }
 
 QString describe(TalvikDBxZandor::Zandor& control, const TalvikZandorLib::ZDJoin& join) {
-    const std::array<StringView, 6> symbols = {u"=", u"<>", u"<", u">", u"<=", u">="};
     // A normal join needs no word.
     const std::array<StringView, 4> types = {u"", control.LNGJoinTypeLeftOuter,
                                              control.LNGJoinTypeRightOuter,
                                              control.LNGJoinTypeBothOuter};
     const QString sides = phrase(field(join.LeftTable()->Name(), join.LeftColumn()->Name()),
-                                 textOf(join.CompareOperator(), symbols),
+                                 textOf(join.CompareOperator(), TalvikDBxZandor::operatorSymbols),
                                  field(join.RightTable()->Name(), join.RightColumn()->Name()));
     const StringView type = textOf(join.JoinType(), types);
     return type.empty() ? sides : sides + QStringLiteral(", ") + toQt(type);

@@ -6,6 +6,7 @@
 #include "platform/qt/Frames.h"
 #include "platform/qt/GridWidget.h"
 #include "platform/qt/KeyCodes.h"
+#include "platform/qt/PaneHandle.h"
 #include "platform/qt/TabuletWidget.h"
 
 #include <QKeyEvent>
@@ -51,7 +52,11 @@ std::vector<Navigation::Stop> Navigation::stops() const {
         for (CanvasLine* line : lines) all.push_back({canvas, line});
         if (lines.empty()) all.push_back({canvas, nullptr});
     }
-    if (grid()) all.push_back({grid(), nullptr});
+    if (grid()) {
+        PaneHandle& handle = static_cast<GridWidget*>(grid())->handle();
+        if (handle.isVisible()) all.push_back({&handle, nullptr});
+        all.push_back({grid(), nullptr});
+    }
     if (mHome && mHome->isVisible() && mHome->isEnabled()) all.push_back({mHome, nullptr});
     return all;
 }

@@ -11,6 +11,7 @@
 #include "platform/qt/GridModel.h"
 #include "platform/qt/HomeButton.h"
 #include "platform/qt/Inputs.h"
+#include "platform/qt/JoinSentence.h"
 #include "platform/qt/MessageBox.h"
 #include "platform/qt/PickListWidget.h"
 #include "platform/qt/PopupMenu.h"
@@ -50,6 +51,8 @@ QWidget* QtToolkit::parentOf(const Design& design) const {
     WidgetHolder* holder = holderOf(design);
     return holder ? holder->widget() : &mSurface;
 }
+
+GridWidget* QtToolkit::grid() const { return static_cast<GridWidget*>(mGrid.data()); }
 
 QWidget* QtToolkit::window() const { return mClosing ? nullptr : mSurface.window(); }
 
@@ -167,6 +170,8 @@ std::unique_ptr<Dialog> QtToolkit::makeDialog(const Design& design, DialogEvents
     dialog->setWindowTitle(toQt(design.Caption));
     dialog->setObjectName(toQt(design.Name));
     dialog->setProperty(ownerProperty, QVariant::fromValue(static_cast<void*>(this)));
+    if (mComforts.flags().ReadsJoins)
+        dialog->setPreparation([this](QDialog& open) { addJoinSentence(open, mComforts); });
     return std::make_unique<DialogAdapter>(dialog, mFocus);
 }
 

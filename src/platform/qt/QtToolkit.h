@@ -30,6 +30,8 @@ public:
     CanvasView& view() { return mView; }
     Navigation& navigation() { return mNavigation; }
     comforts::Comforts& comforts() { return mComforts; }
+    /// nullptr before it is made.
+    GridWidget* grid() const;
 
     void MsgBox(const String& prompt, std::int32_t style, const String& title) override;
     std::unique_ptr<Frame> makeFrame(const Design& design, FrameEvents events) override;
@@ -75,7 +77,7 @@ private:
     LineEnds mAsked;
     comforts::Comforts mComforts{*this};
     TabuletSurroundings mTables{mDrags, mMenu, mAsked, mComforts};
-    CanvasView mView{mMenu, mDrags};
+    CanvasView mView{mMenu, mDrags, mComforts};
     Navigation mNavigation{mSurface, mView, mComforts};
     QPointer<QWidget> mGrid;
     bool mClosing = false;

@@ -72,6 +72,7 @@ private:
     void menuKey(int row, QPoint at) override;
     void deleteKey(int row) override;
     void closeClicked() override;
+    void titleClicked() override { mSurroundings.comforts.titleClicked(mIndex); }
     void gestureBegan() override;
     void gestureMoved(Qt::Edges edges, QPointF way) override;
     void gestureEnded(Qt::Edges edges) override;

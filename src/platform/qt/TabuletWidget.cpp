@@ -303,6 +303,8 @@ void TabuletWidget::mouseMoveEvent(QMouseEvent* event) {
 
 void TabuletWidget::mouseReleaseEvent(QMouseEvent* event) {
     if (event->button() == Qt::LeftButton) endGesture();
+    const bool onTitle = titleBar().contains(event->position().toPoint());
+    if (event->button() == Qt::RightButton && onTitle && mListener) mListener->titleClicked();
 }
 
 void TabuletWidget::endGesture() {

@@ -14,6 +14,8 @@ class ColumnListModel;
 class TabuletListener : public EntryListener {
 public:
     virtual void closeClicked() = 0;
+    /// The right button has come up over the title.
+    virtual void titleClicked() = 0;
     /// A move (no edge) or a resize by one or two edges begins.
     virtual void gestureBegan() = 0;
     /// The mouse is `way` logical pixels from where the gesture began.

@@ -2,7 +2,9 @@
 
 #include "platform/Numbers.h"
 #include "platform/qt/CanvasItems.h"
+#include "platform/qt/GridWidget.h"
 #include "platform/qt/JoinName.h"
+#include "platform/qt/PaneHandle.h"
 #include "platform/qt/QtToolkit.h"
 #include "platform/qt/ShownText.h"
 #include "platform/qt/TabuletWidget.h"
@@ -93,7 +95,48 @@ ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
     mToolkit->view().setNamer([this](const platform::qt::CanvasLine& line) {
         return mControl ? joinName(*mControl, line.ends()) : QString();
     });
+    mToolkit->comforts().setWords(translatedWords());
+    mToolkit->comforts().RenameRequested = [this](const platform::String& key) {
+        QMetaObject::invokeMethod(
+            this, [this, name = toQt(key)] { Q_EMIT renameRequested(name); }, Qt::QueuedConnection);
+    };
+    mToolkit->grid()->handle().setMover([this](int down) { moveDivider(down); });
     mControl->UserControl_Resize();
+}
+
+double ZandorWidget::upperPaneShare() const { return mControl->UpperPaneShare(); }
+
+void ZandorWidget::setUpperPaneShare(double share) {
+    // An open editor would stay where its cell was.
+    mControl->UserControl_Paint();
+    mControl->UpperPaneShare(static_cast<float>(share));
+}
+
+void ZandorWidget::moveDivider(int down) {
+    // Both panes stay large enough to be worked in: a table above, the first rows below.
+    constexpr int above = 120;
+    const platform::qt::GridWidget& grid = *mToolkit->grid();
+    const int below = platform::qt::PaneHandle::thickness + 5 * grid.rowHeight();
+    if (height() < above + below) return;
+    const int top = std::clamp(grid.y() + down, above, height() - below);
+    if (top == grid.y()) return;
+    const double share = static_cast<double>(top) / height();
+    setUpperPaneShare(share);
+    Q_EMIT upperPaneShareChanged(share);
+}
+
+comforts::Words ZandorWidget::translatedWords() {
+    return {.All = fromQt(tr("all", "the rows of a table, at the end of a line")),
+            .Matching = fromQt(tr("the rows of %1 and %2 that match")),
+            .AllOfOne = fromQt(tr("all rows of %1, and those of %2 that match")),
+            .AllOfBoth = fromQt(tr("all rows of %1 and of %2, side by side where they match")),
+            .Rename = fromQt(tr("Re&name…"))};
+}
+
+const comforts::Words& ZandorWidget::comfortWords() const { return mToolkit->comforts().words(); }
+
+void ZandorWidget::setComfortWords(const comforts::Words& words) {
+    mToolkit->comforts().setWords(words);
 }
 
 ZandorWidget::~ZandorWidget() {
@@ -110,6 +153,7 @@ const comforts::Flags& ZandorWidget::comforts() const { return mToolkit->comfort
 
 void ZandorWidget::setComforts(const comforts::Flags& flags) {
     mToolkit->comforts().setFlags(flags);
+    mToolkit->grid()->showHandle(flags.MovesPanes);
 }
 
 void ZandorWidget::setFindings(std::vector<comforts::Finding> findings) {

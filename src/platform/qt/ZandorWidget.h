@@ -2,6 +2,7 @@
 
 #include "comforts/Field.h"
 #include "comforts/Flags.h"
+#include "comforts/Words.h"
 #include "control/Zandor.h"
 
 #include <QMap>
@@ -288,6 +289,15 @@ public:
     void update();
     void repaint();
 
+    // Beside the interface
+    /// The share of the height that the canvas has above the grid; half of it at first. Kept
+    /// within 0.05 and 0.95.
+    double upperPaneShare() const;
+    void setUpperPaneShare(double share);
+    /// What the comforts say; translated by what is installed for the class.
+    const comforts::Words& comfortWords() const;
+    void setComfortWords(const comforts::Words& words);
+
 Q_SIGNALS:
     /// DeletedTable has the name.
     void TableDeleted();
@@ -300,6 +310,12 @@ Q_SIGNALS:
     void JoinCreated(const ZDJoin& join);
     void JoinModified(const ZDJoin& join);
     void JoinRemoved(const ZDJoin& join);
+
+    // Beside the interface
+    /// The user has moved the divider of the panes.
+    void upperPaneShareChanged(double share);
+    /// The user wants another name for the table of a key. Comes when the menu has closed.
+    void renameRequested(const QString& key);
 
 protected:
     bool event(QEvent* event) override;
@@ -317,6 +333,8 @@ private:
     class House;
 
     void queuePaint();
+    void moveDivider(int down);
+    static comforts::Words translatedWords();
     void setInteger(platform::StringView procedure, int value,
                     void (*set)(TalvikDBxZandor::Zandor&, std::int16_t));
 

@@ -1,0 +1,33 @@
+#include "comforts/Comforts.h"
+#include "comforts/Door.h"
+
+// The menu on a table's title.
+
+namespace comforts {
+
+bool Comforts::titleClicked(std::int16_t table) {
+    if (!mFlags.HasTitleMenu) return false;
+    return act(u"titleClicked", [&](Door& door) {
+        door.popUpOver(table);
+        return true;
+    });
+}
+
+void Comforts::offerRename() {
+    if (!mDoor || !mFlags.HasTitleMenu || mRename) return;
+    act(u"offerRename", [&](Door& door) {
+        mRename = door.addMenuEntry(u"mnuTableRename", mWords.Rename, [this] {
+            if (!mDoor) return;
+            const String key = mDoor->keyOfActiveTable();
+            if (const auto asked = RenameRequested) asked(key);
+        });
+        mRename->Visible(false);
+        return true;
+    });
+}
+
+void Comforts::menuChecked(std::int16_t source) {
+    if (mRename) mRename->Visible(mFlags.HasTitleMenu && source == 0);
+}
+
+} // namespace comforts
