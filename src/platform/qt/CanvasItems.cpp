@@ -164,6 +164,14 @@ std::vector<CanvasLine::Plate> CanvasLine::plates() const {
     add(mNotes.First, -1);
     add(mNotes.Middle, 0);
     add(mNotes.Second, 1);
+    qreal together = 0;
+    for (const Plate& plate : all) together += plate.place.width();
+    if (all.size() < 2 || together < line.length()) return all;
+    // A line too short for all of them has them on one.
+    String joined;
+    for (const Plate& plate : std::exchange(all, {}))
+        joined += (joined.empty() ? u"" : u" ") + fromQt(plate.text);
+    add(joined, 0);
     return all;
 }
 
