@@ -121,7 +121,7 @@ void FieldTitles::paintSection(QPainter* painter, const QRect& place, int sectio
         const QRect inside = place.adjusted(cellMargin, 0, -cellMargin, 0);
         painter->drawText(
             inside, static_cast<int>(Qt::AlignCenter) | Qt::TextSingleLine,
-            fontMetrics().elidedText(tr("Choose a field…"), Qt::ElideRight, inside.width()));
+            fontMetrics().elidedText(tr("Add field…"), Qt::ElideRight, inside.width()));
         painter->restore();
     }
     if (mGrid.currentRow() == 0 && mGrid.currentCol() == section + 1)
