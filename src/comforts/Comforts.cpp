@@ -61,6 +61,8 @@ void Comforts::setFlags(const Flags& flags) {
 
 /// What follows from the model, shown afresh.
 void Comforts::bound(Door& door) {
+    // Another query has the same key numbers for other columns.
+    if (door.hasAnotherModel()) mWidths.clear();
     door.markOutput(mFlags.MarksOutput);
     fitAll(door);
     markFindings(door);

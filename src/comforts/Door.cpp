@@ -14,6 +14,13 @@ void Door::shut() {
     mControl = nullptr;
 }
 
+bool Door::hasAnotherModel() {
+    const auto now = model();
+    const bool another = mModel.lock() != now;
+    mModel = now;
+    return another;
+}
+
 std::int32_t Door::lastColumn() const {
     std::int32_t column = grid().Cols() - 1;
     while (column > 0 && !isUsed(column)) --column;

@@ -48,6 +48,8 @@ public:
     bool hasGrid() const { return !control().mOnlyJoin; }
     const MSFlexGridLib::MSFlexGrid& grid() const { return *control().sprColumn; }
     Ref<TalvikZandorLib::Zandor> model() { return control().Model(); }
+    /// Than at the last call.
+    bool hasAnotherModel();
 
     // Columns of the grid
     /// The last one with a field in it; 0 when there is none.
@@ -128,6 +130,7 @@ private:
     }
 
     TalvikDBxZandor::Zandor* mControl;
+    std::weak_ptr<TalvikZandorLib::Zandor> mModel; ///< the one last seen
 };
 
 } // namespace comforts

@@ -63,6 +63,16 @@ TEST_F(TheWidthOfAColumn, StaysAsItWasSetByHand) {
     EXPECT_EQ(width(1), 2250);
 }
 
+TEST_F(TheWidthOfAColumn, SetByHandIsThatOfItsQueryAlone) {
+    stage->dragBorder(1, 2250);
+    bind();
+    EXPECT_EQ(width(1), 2250);
+    const auto other = library.newModel();
+    other->definition(other->table(u"OTHERS", {u"*", u"ID"}), u"ID");
+    control().P_SET_Zandor(std::shared_ptr<TalvikZandorLib::Zandor>(other));
+    EXPECT_EQ(width(1), narrowest);
+}
+
 TEST_F(TheWidthOfAColumn, GoesWithItsColumn) {
     stage->dragBorder(1, 2250);
     drag(1, {total}, 1);
