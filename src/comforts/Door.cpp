@@ -99,7 +99,8 @@ void Door::changeField(std::int32_t column, const Field& field) {
 
 platform::Ref<TalvikZandorLib::ZDTable> Door::tableOf(const TalvikTabulet::Tabulet& element) {
     try {
-        return control().Tables().Item(element.Tag());
+        const String key = element.Tag();
+        return control().Tables().Item(key);
     } catch (const platform::RuntimeError&) {
         return {};
     }
@@ -123,7 +124,7 @@ void Door::markOutput(bool marks) {
         const auto own = control().List(held, &TalvikZandorLib::ZDTable::Columns);
         for (std::int32_t n = 1; n <= own.Count(); ++n) {
             const auto column = own.Item(n);
-            const auto& entries = table->ColumnItems();
+            const auto& entries = control().Hold(table)->ColumnItems();
             if (n > entries.Count()) break;
             const auto entry = entries.Item(n);
             entry->ComesOut(columns.contains(column.get()) ||

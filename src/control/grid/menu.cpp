@@ -26,9 +26,11 @@ void Zandor::CheckMenus(std::int16_t source, float X, float Y) {
         if (source == 0) {
             mnuTableDefinitionCopy->Enabled(true);
             mnuTableDefinitionPaste->Enabled(false);
-            if (!mDragColumns.empty() &&
-                lstTable(mActiveTableIndex)->Tag() != mDragColumns.front()->Table()->Tag())
-                mnuTableDefinitionPaste->Enabled(true);
+            if (!mDragColumns.empty()) {
+                const String active = lstTable(mActiveTableIndex)->Tag();
+                if (active != Hold(mDragColumns.front()->Table())->Tag())
+                    mnuTableDefinitionPaste->Enabled(true);
+            }
             mnuTableDefinitionDelete->Enabled(true);
         } else if (source == 1) {
             Ref<clsJoinLine> hit;
