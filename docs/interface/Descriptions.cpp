@@ -56,8 +56,11 @@ const std::map<std::string_view, std::string_view> descriptions = {
     {"VisibleFrameLeft",
      "How far the canvas is scrolled to the left, in twips. A value past the end goes to the end."},
     {"VisibleFrameTop", "How far the canvas is scrolled up, in twips."},
-    {"Zandor", "The query model, never nothing. In C++ its accessors are `P_GET_Zandor()` and "
-               "`P_SET_Zandor(model)`."},
+    {"Zandor",
+     "The query model, never nothing. In C++ its accessors are `P_GET_Zandor()` and "
+     "`P_SET_Zandor(model)`. Setting it keeps grid columns of the model before; `ShowAnew()` "
+     "(`showAnew()` of the widget) behind it takes them away, and is what to call after "
+     "changing the model."},
     {"HorizMaxScrollPos", "End of the horizontal scroll range; the next layout overwrites it."},
     {"VertMaxScrollPos", "End of the vertical scroll range; the next layout overwrites it."},
     {"HorizontalScrollbarPos", "Horizontal scroll position; setting it scrolls the canvas."},
