@@ -92,7 +92,8 @@ public:
 
 private:
     /// Columns begin at the top; those of fewer joined tables than another has stand in the middle
-    /// of the height of the tallest. Returns where the columns end.
+    /// of the height of the tallest, unless the drawing grows: they would move down each time.
+    /// Returns where the columns end.
     std::int32_t place(const Columns& columns) {
         std::int32_t tallest = 0;
         std::size_t most = 0;
@@ -102,7 +103,7 @@ private:
         }
         std::int32_t left = margin;
         for (std::size_t n = 0; n < columns.size(); ++n) {
-            const bool fewer = joinedOf(columns[n]) < most;
+            const bool fewer = mStanding.empty() && joinedOf(columns[n]) < most;
             std::int32_t top = margin + (fewer ? (tallest - heightOf(columns[n])) / 2 : 0);
             std::int32_t width = 0;
             for (const std::size_t table : columns[n]) {

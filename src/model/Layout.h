@@ -47,8 +47,9 @@ std::vector<Box> arrange(const std::vector<Size>& sizes, const std::vector<Link>
                          const std::vector<Box>& taken, std::int32_t canvasWidth);
 
 /// Boxes for all tables of a drawing that has grown: in columns, as above, but so that those with a
-/// place in `standing` move no further than it is worth, for somebody knows by now where they are.
-/// A table is new where `standing` has nothing, or ends before it.
+/// place in `standing` move no further than it is worth, for somebody knows by now where they are,
+/// and that all columns begin at the top, where they are seen. A table is new where `standing` has
+/// nothing, or ends before it.
 std::vector<Box> arrangeAgain(const std::vector<Size>& sizes, const std::vector<Link>& links,
                               const std::vector<std::optional<Place>>& standing,
                               std::int32_t canvasWidth);

@@ -136,6 +136,20 @@ TEST(TheLayout, ThatGrowsByAChainGoesToTheRightAndLeavesTheEarlierTables) {
     }
 }
 
+TEST(TheLayout, ThatGrowsByASecondRowLeavesTheFirstAtTheTop) {
+    // A chain as wide as the canvas, and one table more at its end.
+    std::vector<std::optional<Place>> standing;
+    std::vector<Link> links;
+    for (std::int32_t n = 0; n < 4; ++n) standing.push_back(Place{300 + n * 3200, 300});
+    for (std::size_t n = 1; n < 5; ++n) links.emplace_back(n - 1, n);
+    const auto boxes = arrangeAgain(std::vector<Size>(5, cell), links, standing, 4 * 3200);
+    for (std::size_t n = 0; n < 4; ++n) {
+        EXPECT_EQ(boxes[n].left, standing[n]->left) << n;
+        EXPECT_EQ(boxes[n].top, 300) << n;
+    }
+    EXPECT_GT(boxes[4].top, 2300);
+}
+
 TEST(TheLayout, ThatGrowsPutsTablesWithoutJoinsToTheRightToo) {
     std::vector<std::optional<Place>> standing{Place{300, 300}, Place{3500, 300}};
     const auto boxes = arrangeAgain(std::vector<Size>(3, cell), {}, standing, 4 * 3200);

@@ -76,6 +76,7 @@ void HelpWindow::load(QTextBrowser& browser) {
     browser.document()->setDocumentMargin(pageMargin);
     browser.document()->setMarkdown(QString::fromUtf8(file.readAll()));
     ruleTables(*browser.document(), browser.palette().color(QPalette::Mid));
+    browser.moveCursor(QTextCursor::Start);
 }
 
 void HelpWindow::showPage(Page page) {

@@ -89,7 +89,10 @@ void arrangeTables(Document& document, int canvasWidth) {
     const auto name = QCoreApplication::translate("designer::TableAdding", "Arrange tables");
     document.change(name, [&](model::Query& query) {
         const Tables tables = tablesOf(query);
-        const auto boxes = arranged(query, tables, canvasWidth);
+        // As it would have grown by itself.
+        const auto boxes = model::layout::arrangeAgain(
+            sizesOf(tables), linksAmong(query, tables),
+            std::vector<std::optional<model::layout::Place>>(tables.size()), canvasWidth);
         for (std::size_t n = 0; n < tables.size(); ++n) move(*tables[n], boxes[n], {});
     });
 }

@@ -8,6 +8,7 @@
 #include <QLineEdit>
 #include <QMenu>
 #include <QMenuBar>
+#include <QScrollBar>
 #include <QSettings>
 #include <QTabWidget>
 #include <QTextBrowser>
@@ -36,6 +37,7 @@ TEST_F(TheHelp, IsOpenedByTheMenuAndStaysBesideTheDrawing) {
     auto* const help = window.findChild<HelpWindow*>();
     ASSERT_TRUE(help);
     EXPECT_TRUE(help->isVisible());
+    EXPECT_EQ(page(*help).verticalScrollBar()->value(), 0);
     EXPECT_FALSE(help->isModal());
     EXPECT_THAT(page(*help).toPlainText().toStdString(),
                 HasSubstr("A criterion is what a user types"));
