@@ -103,6 +103,7 @@ void Zandor::ShowAnew() {
         require(binding == mBinding);
         ShowDefinitionsAnew(picture);
         ShowMenuEntries();
+        if (const auto bound = mHooks.Bound) bound();
     });
 }
 

@@ -47,6 +47,14 @@ TEST_F(TheEntriesThatComeOut, AreThoseOfTheModelBoundLast) {
     EXPECT_EQ(marked(1), Texts{u"TEXT"});
 }
 
+TEST_F(TheEntriesThatComeOut, FollowAModelThatIsShownAnew) {
+    named->visible = false;
+    model->definition(orders, u"TOTAL");
+    control().ShowAnew();
+    EXPECT_EQ(marked(1), (Texts{u"ID", u"TOTAL"}));
+    EXPECT_EQ(marked(2), Texts{});
+}
+
 TEST_F(TheEntriesThatComeOut, StayWhenAnotherTableGoes) {
     stage->closeTable(2);
     EXPECT_EQ(marked(1), Texts{u"ID"});
