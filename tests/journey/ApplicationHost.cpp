@@ -6,6 +6,7 @@
 #include "designer/options/Languages.h"
 
 #include <QApplication>
+#include <QScreen>
 
 // The designer's own window, over what the command line names.
 
@@ -25,6 +26,9 @@ int main(int argc, char** argv) {
     QObject::connect(&window.drawing(), &designer::DrawingArea::controlMade, &host,
                      [&](ZandorWidget* control) { host.listen(*control); });
     window.move(0, 0);
+    // The share of a window manager, of which there is none.
+    if (qEnvironmentVariableIsSet("ZANDOR_MAXIMISED"))
+        window.resize(QGuiApplication::primaryScreen()->availableSize());
     window.show();
     window.activateWindow();
     // What a designer that was killed has left there is offered now.

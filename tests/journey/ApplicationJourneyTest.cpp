@@ -1,11 +1,12 @@
 #include "Designer.h"
+#include "Home.h"
+#include "Reference.h"
 
 #include "support/PostgresServer.h"
 
 #include <QFileInfo>
 #include <QSqlError>
 #include <QSqlQuery>
-#include <QTemporaryDir>
 
 #include <gtest/gtest.h>
 
@@ -19,18 +20,11 @@ namespace {
 /// A new user's way with the designer itself, with settings and a home of its own.
 class ADesignersDay : public testing::Test {
 protected:
-    QStringList environment() {
-        return {"HOME=" + home.path(), "XDG_CONFIG_HOME=" + home.filePath("config"),
-                "XDG_DATA_HOME=" + home.filePath("data"),
-                "LC_ALL=C.UTF-8", // the words of the journey are English ones
-                "LANGUAGE=en"};
-    }
-
     void start(const QStringList& arguments = {}) {
         designer.reset();
         designer = std::make_unique<Designer>(screen, QStringLiteral(ZANDOR_APPLICATION_HOST),
                                               QStringList(home.filePath("autosave")) + arguments,
-                                              environment());
+                                              home.environment());
     }
 
     void command(const QString& menu, const QString& name) {
@@ -74,25 +68,10 @@ protected:
         return rows;
     }
 
-    QTemporaryDir home;
+    Home home;
     Screen screen;
     std::unique_ptr<Designer> designer;
 };
-
-/// The rows of a statement written by hand.
-QStringList reference(const QString& statement) {
-    QStringList rows;
-    {
-        auto database = QSqlDatabase::addDatabase("QSQLITE", "reference");
-        database.setDatabaseName(QStringLiteral(ZANDOR_SAMPLE_DATABASE));
-        EXPECT_TRUE(database.open());
-        QSqlQuery query(statement, database);
-        EXPECT_TRUE(query.isActive()) << query.lastError().text().toStdString();
-        while (query.next()) rows += query.value(0).toString() + " | " + query.value(1).toString();
-    }
-    QSqlDatabase::removeDatabase("reference");
-    return rows;
-}
 
 } // namespace
 

@@ -4,6 +4,7 @@
 #include "QueryText.h"
 
 #include "platform/qt/ColumnListModel.h"
+#include "platform/qt/GridWidget.h"
 #include "platform/qt/TabuletWidget.h"
 
 #include <QApplication>
@@ -24,9 +25,7 @@
 
 namespace {
 
-QString text(const std::optional<QPoint>& place) {
-    return place ? QStringLiteral("%1 %2").arg(place->x()).arg(place->y()) : QString();
-}
+QString numbers(int one, int other) { return QStringLiteral("%1 %2").arg(one).arg(other); }
 
 /// A line for each row, with " | " between the cells.
 QString rowsOf(const QTableView& view) {
@@ -60,6 +59,7 @@ bool Host::eventFilter(QObject* watched, QEvent* event) {
 }
 
 void Host::listen(ZandorWidget& control) {
+    mControl = &control;
     using Widget = ZandorWidget;
     const auto log = [&](auto signal, const char* name) {
         connect(&control, signal, this, [this, name] { mLog += name; });
@@ -96,12 +96,16 @@ QString Host::answer(const QString& question) {
     const QString& asked = words.value(0);
     if (asked == "events") return mLog.join(u'\n');
     if (asked == "query") return textOf(mQuery());
-    if (asked == "place") return text(placeOf(mWindow, words.mid(1)));
+    if (asked == "place") return onScreen(placeOf(mWindow, words.mid(1)));
     if (asked == "dragged") {
         // Where the drag that is on was seen last.
         if (!mWindow.findChild<QDrag*>()) return {};
-        return mDraggedOver ? text(mDraggedOver) : QStringLiteral("nowhere");
+        return mDraggedOver ? onScreen(mDraggedOver) : QStringLiteral("nowhere");
     }
+    if (asked == "focus") return focusedName();
+    if (asked == "cell") return currentCell();
+    if (asked == "scrolls" && mControl)
+        return numbers(mControl->HorizMaxScrollPos(), mControl->VertMaxScrollPos());
     if (asked == "selected") return selected(words.value(1));
     if (asked == "text") return shownText(words.value(1));
     if (asked == "focused") return isFocused(words.value(1)) ? QStringLiteral("yes") : QString();
@@ -109,6 +113,28 @@ QString Host::answer(const QString& question) {
     if (asked == "picture") return QString::number(savePicture(question.mid(8)));
     if (asked == "quit") QApplication::quit();
     return {};
+}
+
+/// The mouse counts the screen's own pixels.
+QString Host::onScreen(const std::optional<QPoint>& place) const {
+    if (!place) return {};
+    const QPoint at = (QPointF(*place) * mWindow.devicePixelRatio()).toPoint();
+    return numbers(at.x(), at.y());
+}
+
+QString Host::focusedName() {
+    const QWidget* at = QApplication::focusWidget();
+    while (at && (at->objectName().isEmpty() || at->objectName().startsWith(u"qt_")))
+        at = at->parentWidget();
+    return at ? at->objectName() : QString();
+}
+
+QString Host::currentCell() const {
+    const auto* grid = dynamic_cast<platform::qt::GridWidget*>(
+        mControl ? mControl->findChild<QWidget*>(QStringLiteral("sprColumn")) : nullptr);
+    if (!grid) return {};
+    const QModelIndex current = grid->view().currentIndex();
+    return numbers(current.row() + 1, current.column() + 1);
 }
 
 bool Host::isFocused(const QString& name) {

@@ -3,6 +3,7 @@
 #include "model/Query.h"
 #include "platform/qt/ZandorWidget.h"
 
+#include <QPointer>
 #include <QSocketNotifier>
 
 #include <functional>
@@ -18,7 +19,10 @@
 ///     selected TABLE      the selected entries of a table
 ///     text NAME           what an input, a label or a table of results reads
 ///     dragged             where the drag that is on was seen last, "nowhere" or nothing
+///     focus               the name of the control that keys go to, or of what that is part of
 ///     focused NAME        "yes" when keys go to a control
+///     cell                row and column of the grid's current cell
+///     scrolls             how far the canvas scrolls across and down, in twips
 ///     active              "yes" when the window or a dialog of it has the keyboard
 ///     picture FILE        saves what the window shows; "1" when that worked
 ///     quit                ends the program
@@ -37,6 +41,9 @@ public:
 private:
     void read();
     QString answer(const QString& question);
+    QString onScreen(const std::optional<QPoint>& place) const;
+    QString currentCell() const;
+    static QString focusedName();
     bool isFocused(const QString& name);
     QString selected(const QString& title);
     QString shownText(const QString& name);
@@ -48,4 +55,5 @@ private:
     QByteArray mPending;
     QStringList mLog;
     std::optional<QPoint> mDraggedOver;
+    QPointer<ZandorWidget> mControl; ///< listened to last
 };

@@ -1,6 +1,7 @@
 #include "Places.h"
 
 #include "platform/qt/CanvasItems.h"
+#include "platform/qt/CanvasView.h"
 #include "platform/qt/ColumnListModel.h"
 #include "platform/qt/GridWidget.h"
 #include "platform/qt/TabuletWidget.h"
@@ -36,6 +37,15 @@ Place middle(const QWidget* widget, const QRect& rect) {
     return widget->mapToGlobal(shown.center());
 }
 
+/// The middle of what can be seen of a part of the drawing, which bars and grid lie over.
+Place middleInDrawing(const QWidget* part, const QRect& rect) {
+    for (const QWidget* at = part; at; at = at->parentWidget())
+        if (const auto* canvas = dynamic_cast<const Canvas*>(at))
+            return middle(part,
+                          rect & canvas->view().seen().translated(part->mapFrom(canvas, QPoint())));
+    return {};
+}
+
 TabuletWidget* tableOf(const QWidget& window, const QString& title) {
     for (QWidget* child : window.findChildren<QWidget*>())
         if (auto* table = dynamic_cast<TabuletWidget*>(child); table && table->title() == title)
@@ -47,8 +57,9 @@ Place entry(const TabuletWidget* table, const QString& column) {
     if (!table) return {};
     for (int row = 0; row < table->model().rowCount(); ++row)
         if (table->model().text(row) == column)
-            return middle(table->list().viewport(),
-                          table->list().visualRect(table->model().index(row)));
+            return middleInDrawing(table->list().viewport(),
+                                   table->list().visualRect(table->model().index(row)) &
+                                       table->list().viewport()->rect());
     return {};
 }
 
@@ -135,11 +146,15 @@ Place placeOf(const QWidget& window, const QStringList& words) {
     if (kind == "cell") {
         const auto* grid =
             dynamic_cast<GridWidget*>(window.findChild<QWidget*>(QStringLiteral("sprColumn")));
-        return grid ? middle(grid, grid->cellRect(name.toInt(), words.value(2).toInt())) : Place();
+        if (!grid) return {};
+        QRect cell = grid->cellRect(name.toInt(), words.value(2).toInt());
+        if (name.toInt() > 0) cell &= grid->view().viewport()->geometry();
+        return middle(grid, cell);
     }
     if (const auto* table = tableOf(window, name)) {
-        if (kind == "title") return middle(table, table->titleBar());
-        if (kind == "close") return middle(&table->closeButton(), table->closeButton().rect());
+        if (kind == "title") return middleInDrawing(table, table->titleBar());
+        if (kind == "close")
+            return middleInDrawing(&table->closeButton(), table->closeButton().rect());
     }
     return {};
 }
