@@ -29,6 +29,7 @@ void Comforts::detach() {
     if (mDoor) mDoor->shut();
     mDoor.reset();
     mTyping.reset();
+    mUnderDrag.clear();
     mOffer.reset();
     mFields.reset();
     mRename.reset();

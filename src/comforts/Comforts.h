@@ -5,11 +5,14 @@
 #include "comforts/Words.h"
 #include "control/Events.h"
 #include "control/Hooks.h"
+#include "platform/Tabulet.h"
 #include "platform/Toolkit.h"
 
 #include <map>
 #include <memory>
 #include <optional>
+#include <utility>
+#include <vector>
 
 namespace TalvikDBxZandor {
 class Zandor;
@@ -88,6 +91,14 @@ public:
     /// The user wants another name for a table, by its key; set by the front end.
     std::function<void(const String& key)> RenameRequested;
 
+    // Drags over tables
+    /// A drag comes over the table in a slot; the control will select there what is dropped on.
+    void dragCame(std::int16_t table);
+    /// The drag has left the table or ended over it without a join, and the control has been told.
+    void dragGone();
+    /// It has ended over the table with what the control made of it.
+    void dragTaken() { mUnderDrag.clear(); }
+
     // Editors of cells
     /// What is being typed goes into its cell, and the editor closes. For hosts that are about to
     /// use the query: before they run, save or close it.
@@ -153,6 +164,8 @@ private:
     std::unique_ptr<platform::PickList> mFields; ///< made when it is first needed
     std::vector<Finding> mFindings;
     std::map<std::int32_t, float> mWidths; ///< set by hand, by key number
+    /// The entries of the table under a drag, and whether each was selected.
+    std::vector<std::pair<platform::Ref<TalvikTabulet::ColumnItem>, bool>> mUnderDrag;
 };
 
 } // namespace comforts

@@ -102,6 +102,11 @@ public:
     addMenuEntry(platform::StringView name, const String& caption, platform::PlainEvent click);
     String keyOfActiveTable() const;
 
+    // Tables
+    TalvikTabulet::ColumnList& entriesOf(std::int16_t table) {
+        return control().lstTable(table)->ColumnItems();
+    }
+
     // The current cell
     void goTo(std::int32_t row, std::int32_t column);
     void showCurrentCell() { control().sprColumn->EnsureVisible(); }

@@ -31,6 +31,10 @@ struct Flags {
     /// Canvas and grid are divided by a handle that the user moves.
     bool MovesPanes = false;
 
+    /// A drag that goes on or ends without a join leaves the selection of the tables on its way as
+    /// it was.
+    bool KeepsSelectionUnderDrags = false;
+
     static constexpr Flags all() {
         return {.AddsOnDoubleClick = true,
                 .KeepsTyping = true,
@@ -40,7 +44,8 @@ struct Flags {
                 .FitsColumns = true,
                 .ReadsJoins = true,
                 .HasTitleMenu = true,
-                .MovesPanes = true};
+                .MovesPanes = true,
+                .KeepsSelectionUnderDrags = true};
     }
 
     friend bool operator==(const Flags&, const Flags&) = default;

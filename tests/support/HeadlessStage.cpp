@@ -133,6 +133,10 @@ public:
                      std::int32_t target) override {
         mUser.dragToEntry(tableName(from), entry, tableName(to), target);
     }
+    void dragAcross(std::int16_t from, std::int32_t entry, std::int16_t across, std::int32_t passed,
+                    std::int32_t row, std::int32_t col) override {
+        mUser.dragAcross(tableName(from), entry, tableName(across), passed, "sprColumn", row, col);
+    }
     void dragToCell(std::int16_t from, std::int32_t entry, std::int32_t row,
                     std::int32_t col) override {
         mUser.dragToCell(tableName(from), entry, "sprColumn", row, col);

@@ -57,6 +57,16 @@ inline void menuKey(QWidget& window) {
     QCoreApplication::sendEvent(window.windowHandle(), &event);
 }
 
+/// Carries a drag over a place of a widget, from where it goes on.
+inline void carryOver(QDrag& drag, QWidget& over, QPointF at) {
+    QWindow* const window = over.window()->windowHandle();
+    const QPoint place = over.mapTo(over.window(), at).toPoint();
+    QDragEnterEvent enter(place, Qt::CopyAction, drag.mimeData(), Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(window, &enter);
+    QDragMoveEvent move(place, Qt::CopyAction, drag.mimeData(), Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(window, &move);
+}
+
 /// Carries a drag to a place of a widget and drops it there, or leaves where nothing takes it.
 /// The events reach the widget through its window, which looks for whoever takes drops.
 inline void carry(QDrag& drag, QWidget& over, QPointF at) {

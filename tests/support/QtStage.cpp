@@ -74,6 +74,7 @@ public:
         listen();
         // The platform without a screen carries no drags.
         mWidget->toolkit().drags().setCarrier([this](QDrag& drag) {
+            if (mDragOver.widget) hands::carryOver(drag, *mDragOver.widget, mDragOver.at);
             if (mDropAt.widget) hands::carry(drag, *mDropAt.widget, mDropAt.at);
         });
         mHostField.move(-1000, -1000); // out of the way
@@ -178,6 +179,12 @@ public:
     void dragToEntry(std::int16_t from, std::int32_t entry, std::int16_t to,
                      std::int32_t target) override {
         drag(from, entry, entrySpot(to, target));
+    }
+    void dragAcross(std::int16_t from, std::int32_t entry, std::int16_t across, std::int32_t passed,
+                    std::int32_t row, std::int32_t col) override {
+        mDragOver = entrySpot(across, passed);
+        drag(from, entry, cellSpot(row, col));
+        mDragOver = {};
     }
     void dragToCell(std::int16_t from, std::int32_t entry, std::int32_t row,
                     std::int32_t col) override {
@@ -339,7 +346,8 @@ private:
     static void lookAtKind(QWidget& widget, Seen& seen);
 
     StageEvents mEvents;
-    Spot mDropAt; ///< where a drag that begins now ends; no widget: it is given up at once
+    Spot mDragOver; ///< what such a drag passes; no widget: nothing
+    Spot mDropAt;   ///< where a drag that begins now ends; no widget: it is given up at once
     std::unique_ptr<ZandorWidget> mWidget;
     QLineEdit& mHostField = *new QLineEdit(mWidget.get());
 };

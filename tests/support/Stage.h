@@ -119,6 +119,9 @@ public:
     /// (0: an empty place of the list).
     virtual void dragToEntry(std::int16_t from, std::int32_t entry, std::int16_t to,
                              std::int32_t target) = 0;
+    /// A whole drag over an entry of another table on to the middle of a grid cell.
+    virtual void dragAcross(std::int16_t from, std::int32_t entry, std::int16_t across,
+                            std::int32_t passed, std::int32_t row, std::int32_t col) = 0;
     /// A whole drag to the middle of a grid cell.
     virtual void dragToCell(std::int16_t from, std::int32_t entry, std::int32_t row,
                             std::int32_t col) = 0;

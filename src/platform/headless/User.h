@@ -77,6 +77,10 @@ public:
     /// A whole drag with the left button to an entry; 0 is an empty place of the list.
     void dragToEntry(const std::string& from, std::int32_t entry, const std::string& to,
                      std::int32_t target);
+    /// A whole drag over an entry of another table on to the middle of a grid cell.
+    void dragAcross(const std::string& from, std::int32_t entry, const std::string& across,
+                    std::int32_t passed, const std::string& grid, std::int32_t row,
+                    std::int32_t col);
     /// A whole drag with the left button to the middle of a grid cell.
     void dragToCell(const std::string& from, std::int32_t entry, const std::string& grid,
                     std::int32_t row, std::int32_t col);

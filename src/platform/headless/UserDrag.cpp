@@ -113,6 +113,7 @@ void User::leaveDragTarget() {
     auto& table = mToolkit.find<Tabulet>(left);
     if (table.events.DragOver)
         table.events.DragOver(table.index, mToolkit.dragged(), mDragPoint.X, mDragPoint.Y, leave);
+    mToolkit.comforts.dragGone();
 }
 
 void User::dragOver(const std::string& name, float X, float Y) {
@@ -122,6 +123,7 @@ void User::dragOver(const std::string& name, float X, float Y) {
     if (entering) leaveDragTarget();
     mDragTarget = name;
     mDragPoint = {X, Y};
+    if (entering) mToolkit.comforts.dragCame(table.index);
     if (table.events.DragOver)
         table.events.DragOver(table.index, mToolkit.dragged(), X, Y, entering ? enter : over);
 }
@@ -140,7 +142,10 @@ void User::dropOn(const std::string& target, float X, float Y) {
     if (!source) return;
     if (onTable) {
         auto& table = reach<Tabulet>(target);
+        const auto entry = table.ColumnAt(X, Y);
+        const bool taken = entry && entry->Text() != u"*" && &table != source;
         if (table.events.DragDrop) table.events.DragDrop(table.index, source, X, Y);
+        taken ? mToolkit.comforts.dragTaken() : mToolkit.comforts.dragGone();
     } else if (auto* grid = dynamic_cast<Grid*>(&reach<Element>(target));
                grid && grid->events.DragDrop) {
         grid->events.DragDrop(source, X, Y);
@@ -163,6 +168,16 @@ bool User::beginDragFrom(const std::string& table, std::int32_t entry) {
     const TalvikTabulet::Point start = placeOf(mToolkit.find<Tabulet>(table), entry);
     dragOver(table, start.X, start.Y);
     return true;
+}
+
+void User::dragAcross(const std::string& from, std::int32_t entry, const std::string& across,
+                      std::int32_t passed, const std::string& grid, std::int32_t row,
+                      std::int32_t col) {
+    if (!beginDragFrom(from, entry)) return;
+    const TalvikTabulet::Point on = placeOf(reachEntry(across, passed), passed);
+    dragOver(across, on.X, on.Y);
+    const Bounds at = reachCell(grid, row, col);
+    dropOn(grid, at.Left + at.Width / 2, at.Top + at.Height / 2);
 }
 
 void User::dragToEntry(const std::string& from, std::int32_t entry, const std::string& to,

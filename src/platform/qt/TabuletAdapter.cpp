@@ -300,23 +300,31 @@ void TabuletAdapter::keepOppositeEdges(const Bounds& left) {
 }
 
 bool TabuletAdapter::draggedOver(const QMimeData* data, QPointF at, std::int16_t state) {
+    constexpr std::int16_t entering = 0;
     constexpr std::int16_t leaving = 1;
     if (data ? !mDrags.accepts(data) : !mDrags.source()) return false;
+    if (state == entering) mSurroundings.comforts.dragCame(mIndex);
     mEntryTaken = false;
     const QPointer<TabuletWidget> alive = mWidget;
     if (mEvents.DragOver)
         mEvents.DragOver(mIndex, mDrags.source(), toTwips(at.x()), toTwips(at.y()), state);
     // The control answers by selecting the entry under the mouse if it can be dropped on. The drop
     // goes to the control either way; the cursor tells the user beforehand.
-    if (alive) mDrags.showWhetherDropCounts(state == leaving || mEntryTaken);
+    if (!alive || !alive->property(controlProperty).isValid()) return true;
+    mDrags.showWhetherDropCounts(state == leaving || mEntryTaken);
+    if (state == leaving) mSurroundings.comforts.dragGone();
     return true;
 }
 
 bool TabuletAdapter::dropped(const QMimeData* data, QPointF at) {
     if (!mDrags.accepts(data)) return false;
-    mDrags.drop([this, alive = mWidget, at] {
-        if (alive && alive->property(controlProperty).isValid() && mEvents.DragDrop)
+    // The comforts outlive the table, which may be gone once the host has heard of the drop.
+    auto& comforts = mSurroundings.comforts;
+    mDrags.drop([this, &comforts, alive = mWidget, at, taken = mEntryTaken] {
+        if (!alive) return;
+        if (alive->property(controlProperty).isValid() && mEvents.DragDrop)
             mEvents.DragDrop(mIndex, mDrags.source(), toTwips(at.x()), toTwips(at.y()));
+        if (alive) taken ? comforts.dragTaken() : comforts.dragGone();
     });
     return true;
 }
