@@ -58,10 +58,11 @@ TEST_F(ShowingAnew, ChangesNothingWhereNothingHasChanged) {
     stage->scrollGrid(2, 2);
     stage->selectEntries(1, {id, total});
     stage->selectEntries(2, {name});
+    const std::int32_t topRow = grid().TopRow(); // 2, where not all rows are seen at once
     showAnew();
     EXPECT_EQ(stage->look("hsbTable").value, 300);
     EXPECT_EQ(stage->look("vsbTable").value, 150);
-    EXPECT_EQ(grid().TopRow(), 2);
+    EXPECT_EQ(grid().TopRow(), topRow);
     EXPECT_EQ(grid().LeftCol(), 2);
     EXPECT_EQ(table(1).selected, (Texts{u"ID", u"TOTAL"}));
     EXPECT_EQ(table(2).selected, Texts{u"NAME"});
@@ -166,8 +167,10 @@ TEST_F(ShowingAnew, PutsATableBackOfWhichTheModelHadAPlaceMeanwhile) {
     const auto before = table(3).bounds;
     stage->moveTable(3, 4500, 900);
     stage->resizeTable(3, 3000, 1800);
+    const auto placed = table(3).bounds; // to whole pixels, on a screen
+    EXPECT_NE(placed, before);
     showAnew();
-    EXPECT_EQ(table(3).bounds, (platform::Bounds{4500, 900, 3000, 1800}));
+    EXPECT_EQ(table(3).bounds, placed);
     model->tableAt(3).place(-1, -1, 0, 0);
     showAnew();
     EXPECT_EQ(table(3).bounds, before);

@@ -111,7 +111,7 @@ TEST_F(TheDesignersWindow, ShowsTheOutputColumnsOfTheExample) {
                 ElementsAre("order_lines.quantity", "", "", "Visible", ">= 10", ">= 20"));
     EXPECT_THAT(gridColumn(4), ElementsAre("order_lines.unit_price", "", "", "Visible", "", ""));
     EXPECT_THAT(gridColumn(5),
-                ElementsAre("products.is_discontinued", "", "", "Invisible", "= 0", "= 0"));
+                ElementsAre("products.is_discontinued", "", "", "Not Visible", "= 0", "= 0"));
     EXPECT_THAT(gridColumn(6), ElementsAre("", "", "", "", "", ""));
 }
 

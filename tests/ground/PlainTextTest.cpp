@@ -10,8 +10,9 @@ TEST(TheDesigner, ShowsNoMessageBoxesButPlainOnes) {
     const std::regex made(
         R"(\bQMessageBox(::(warning|information|about|critical|question)\b| \w+\())");
     for (const std::string& file : sources::below("src/designer"))
-        if (file.find("PlainBox") == std::string::npos)
+        if (file.find("PlainBox") == std::string::npos) {
             EXPECT_FALSE(std::regex_search(sources::contentOf(file), made)) << file;
+        }
 }
 
 TEST(TheDesigner, HandsNoTextToATooltipThatMayHoldMarkup) {

@@ -70,7 +70,7 @@ std::map<std::string, std::string> procedureReports() {
 
 std::string setterHead(const Property& property) {
     if (property.setter == Setter::object)
-        return "P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& model) {";
+        return "P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& given) {";
     const std::string type = property.type == Type::Boolean ? "bool" : "std::int16_t";
     return platform::toUtf8(property.name) + "(" + type + " v) {";
 }

@@ -27,7 +27,7 @@ protected:
     };
 
     void currentCell(int row, int col) {
-        grid().view().setCurrentIndex(grid().view().model()->index(row - 1, col - 1));
+        grid().setCurrentCell(row, col);
     }
 };
 

@@ -68,13 +68,14 @@ inline void carryOver(QDrag& drag, QWidget& over, QPointF at) {
 }
 
 /// Carries a drag to a place of a widget and drops it there, or leaves where nothing takes it.
-/// The events reach the widget through its window, which looks for whoever takes drops.
-inline void carry(QDrag& drag, QWidget& over, QPointF at) {
+/// The events reach the widget through its window, which looks for whoever takes drops; it is
+/// entered once, before whatever the drag passes.
+inline void carry(QDrag& drag, QWidget& over, QPointF at, bool isInWindow = false) {
     QWindow* const window = over.window()->windowHandle();
     const QPoint place = over.mapTo(over.window(), at).toPoint();
     const QMimeData* const data = drag.mimeData();
     QDragEnterEvent enter(place, Qt::CopyAction, data, Qt::LeftButton, Qt::NoModifier);
-    QCoreApplication::sendEvent(window, &enter);
+    if (!isInWindow) QCoreApplication::sendEvent(window, &enter);
     QDragMoveEvent move(place, Qt::CopyAction, data, Qt::LeftButton, Qt::NoModifier);
     QCoreApplication::sendEvent(window, &move);
     if (move.isAccepted()) {

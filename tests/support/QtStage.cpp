@@ -11,6 +11,7 @@
 #include "platform/qt/ZandorWidget.h"
 #include "platform/qt/ZandorWindowMessage.h"
 #include "support/QtHands.h"
+#include "support/QtLook.h"
 #include "support/Stage.h"
 #include "support/StageEvents.h"
 
@@ -75,7 +76,7 @@ public:
         // The platform without a screen carries no drags.
         mWidget->toolkit().drags().setCarrier([this](QDrag& drag) {
             if (mDragOver.widget) hands::carryOver(drag, *mDragOver.widget, mDragOver.at);
-            if (mDropAt.widget) hands::carry(drag, *mDropAt.widget, mDropAt.at);
+            if (mDropAt.widget) hands::carry(drag, *mDropAt.widget, mDropAt.at, mDragOver.widget);
         });
         mHostField.move(-1000, -1000); // out of the way
         mWidget->resize(800, 600);
@@ -343,7 +344,6 @@ private:
     void boxOpened(QMessageBox& box);
     void menuOpened(QMenu& menu);
     void dialogOpened(QDialog& dialog);
-    static void lookAtKind(QWidget& widget, Seen& seen);
 
     StageEvents mEvents;
     Spot mDragOver; ///< what such a drag passes; no widget: nothing
@@ -442,46 +442,11 @@ Stage::Seen QtStage::look(const std::string& name) {
         seen.enabled = widget->isEnabled();
         seen.focused = widget->window()->focusWidget() == &focusable(*widget);
         seen.font = fromQt(widget->font().family());
-        lookAtKind(*widget, seen);
+        hands::lookAtKind(*widget, seen);
     } else {
         ADD_FAILURE() << "there is no " << name;
     }
     return seen;
-}
-
-void QtStage::lookAtKind(QWidget& widget, Seen& seen) {
-    if (const auto* button = dynamic_cast<QAbstractButton*>(&widget)) {
-        seen.text = fromQt(button->text());
-    } else if (const auto* label = dynamic_cast<QLabel*>(&widget)) {
-        seen.text = fromQt(label->text());
-    } else if (const auto* input = dynamic_cast<QLineEdit*>(&widget)) {
-        seen.text = fromQt(input->text());
-    } else if (const auto* dialog = dynamic_cast<QDialog*>(&widget)) {
-        seen.text = fromQt(dialog->windowTitle());
-    } else if (const auto* combo = dynamic_cast<QComboBox*>(&widget)) {
-        seen.text = fromQt(combo->currentText());
-        seen.listIndex = static_cast<std::int16_t>(combo->currentIndex());
-        for (int i = 0; i < combo->count(); ++i) seen.items.push_back(fromQt(combo->itemText(i)));
-    } else if (const auto* bar = dynamic_cast<QScrollBar*>(&widget)) {
-        seen.value = static_cast<std::int16_t>(bar->value());
-        seen.max = static_cast<std::int16_t>(bar->maximum());
-        seen.largeChange = static_cast<std::int16_t>(bar->pageStep());
-    } else if (const auto* list = dynamic_cast<platform::qt::PickListWidget*>(&widget)) {
-        seen.text = fromQt(list->box().text());
-        const QAbstractItemModel& left = *list->list().model();
-        for (int row = 0; row < left.rowCount(); ++row)
-            seen.items.push_back(fromQt(left.index(row, 0).data().toString()));
-    } else if (const auto* table = dynamic_cast<TabuletWidget*>(&widget)) {
-        seen.text = fromQt(table->title());
-        for (int row = 0; row < table->model().rowCount(); ++row) {
-            seen.items.push_back(fromQt(table->model().text(row)));
-            using platform::qt::ColumnListModel;
-            if (table->model().index(row).data(ColumnListModel::outputRole).toBool())
-                seen.output.push_back(seen.items.back());
-            if (table->list().selectionModel()->isRowSelected(row))
-                seen.selected.push_back(seen.items.back());
-        }
-    }
 }
 
 Spot QtStage::entrySpot(int index, std::int32_t entry) const {

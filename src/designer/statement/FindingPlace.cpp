@@ -57,8 +57,9 @@ int scrolled(int now, int extent, int begin, int end) {
 
 void bringIntoView(ZandorWidget& control, const TalvikZandorLib::ZDTable& table) {
     const int width = control.width() * twipsPerPixel;
-    // Output columns have the lower half.
-    const int height = control.height() * twipsPerPixel / (control.OnlyJoin() ? 1 : 2);
+    // Output columns have the lower pane.
+    const double share = control.OnlyJoin() ? 1 : control.upperPaneShare();
+    const int height = static_cast<int>(control.height() * twipsPerPixel * share);
     const int left =
         scrolled(control.VisibleFrameLeft(), width, table.Left(), table.Left() + table.Width());
     const int top =

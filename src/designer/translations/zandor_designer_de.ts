@@ -198,10 +198,6 @@
 <context>
     <name>ControlTexts</name>
     <message>
-        <source>Join Defintion</source>
-        <translation>Verknüpfung</translation>
-    </message>
-    <message>
         <source>Left Table:</source>
         <translation>Linke Tabelle:</translation>
     </message>
@@ -246,34 +242,6 @@
         <translation>&amp;Abbrechen</translation>
     </message>
     <message>
-        <source>Show Join Definition</source>
-        <translation>Verknüpfung bearbeiten</translation>
-    </message>
-    <message>
-        <source>Delete Join</source>
-        <translation>Verknüpfung löschen</translation>
-    </message>
-    <message>
-        <source>Copy Column</source>
-        <translation>Spalte kopieren</translation>
-    </message>
-    <message>
-        <source>Create Join</source>
-        <translation>Verknüpfung erstellen</translation>
-    </message>
-    <message>
-        <source>Delete Table</source>
-        <translation>Tabelle löschen</translation>
-    </message>
-    <message>
-        <source>Paste Column</source>
-        <translation>Spalte einfügen</translation>
-    </message>
-    <message>
-        <source>Delete Coumn</source>
-        <translation>Spalte löschen</translation>
-    </message>
-    <message>
         <source>Field:</source>
         <translation>Feld:</translation>
     </message>
@@ -296,6 +264,38 @@
     <message>
         <source>Or:</source>
         <translation>Oder:</translation>
+    </message>
+    <message>
+        <source>Join Definition</source>
+        <translation>Verknüpfung bearbeiten</translation>
+    </message>
+    <message>
+        <source>Show &amp;Join Definition</source>
+        <translation>Verknüpfung &amp;bearbeiten</translation>
+    </message>
+    <message>
+        <source>Delete Jo&amp;in</source>
+        <translation>Verknüpfung &amp;löschen</translation>
+    </message>
+    <message>
+        <source>&amp;Copy Column</source>
+        <translation>Spalte &amp;kopieren</translation>
+    </message>
+    <message>
+        <source>C&amp;reate Join</source>
+        <translation>Verknüpfung &amp;erstellen</translation>
+    </message>
+    <message>
+        <source>Delete &amp;Table</source>
+        <translation>&amp;Tabelle löschen</translation>
+    </message>
+    <message>
+        <source>&amp;Paste Column</source>
+        <translation>Spalte e&amp;infügen</translation>
+    </message>
+    <message>
+        <source>&amp;Delete Column</source>
+        <translation>&amp;Ausgabespalte löschen</translation>
     </message>
 </context>
 <context>
@@ -383,130 +383,6 @@
     <message>
         <source>%1: At character %2: %3.</source>
         <translation>%1: Bei Zeichen %2: %3.</translation>
-    </message>
-    <message>
-        <source>expected And, Or or the end</source>
-        <translation>And, Or oder das Ende erwartet</translation>
-    </message>
-    <message>
-        <source>expected less nesting, 100 levels are the most</source>
-        <translation>weniger Verschachtelung erwartet, höchstens 100 Ebenen</translation>
-    </message>
-    <message>
-        <source>expected a closing %1</source>
-        <translation>schließendes %1 erwartet</translation>
-    </message>
-    <message>
-        <source>expected ( after In</source>
-        <translation>( nach In erwartet</translation>
-    </message>
-    <message>
-        <source>expected Null, a text that begins so needs quotes</source>
-        <translation>Null erwartet, ein Text, der so beginnt, braucht Anführungszeichen</translation>
-    </message>
-    <message>
-        <source>expected a comparison, Like works on columns that hold text</source>
-        <translation>ein Vergleich erwartet, Like gilt nur für Spalten mit Text</translation>
-    </message>
-    <message>
-        <source>expected a pattern, as in Like &apos;A*&apos;, not a column</source>
-        <translation>ein Muster erwartet, wie in Like &apos;A*&apos;, keine Spalte</translation>
-    </message>
-    <message>
-        <source>expected a pattern, as in Like &apos;A*&apos;</source>
-        <translation>ein Muster erwartet, wie in Like &apos;A*&apos;</translation>
-    </message>
-    <message>
-        <source>expected And and the upper value</source>
-        <translation>And und der obere Wert erwartet</translation>
-    </message>
-    <message>
-        <source>expected a comma or a closing )</source>
-        <translation>ein Komma oder ) erwartet</translation>
-    </message>
-    <message>
-        <source>expected a value, write Is Null for a missing one or &apos;Null&apos; for the word</source>
-        <translation>ein Wert erwartet, schreiben Sie Is Null für einen fehlenden oder &apos;Null&apos; für das Wort</translation>
-    </message>
-    <message>
-        <source>expected the parameter&apos;s name</source>
-        <translation>der Name des Parameters erwartet</translation>
-    </message>
-    <message>
-        <source>expected the column&apos;s name</source>
-        <translation>der Name der Spalte erwartet</translation>
-    </message>
-    <message>
-        <source>expected a column of the query, there is no %1</source>
-        <translation>eine Spalte der Abfrage erwartet, %1 gibt es nicht</translation>
-    </message>
-    <message>
-        <source>expected a column of the query, the table that had this one was deleted</source>
-        <translation>eine Spalte der Abfrage erwartet, die Tabelle mit dieser Spalte wurde gelöscht</translation>
-    </message>
-    <message>
-        <source>expected the table too, as in %1, several tables have this column</source>
-        <translation>auch die Tabelle erwartet, wie in %1, mehrere Tabellen haben diese Spalte</translation>
-    </message>
-    <message>
-        <source>expected a column that holds %1</source>
-        <translation>eine Spalte mit diesem Inhalt erwartet: %1</translation>
-    </message>
-    <message>
-        <source>expected the end, a criterion has at most 10000 characters</source>
-        <translation>das Ende erwartet, ein Kriterium hat höchstens 10000 Zeichen</translation>
-    </message>
-    <message>
-        <source>expected a character, found the character zero</source>
-        <translation>ein Zeichen erwartet, das Zeichen null gefunden</translation>
-    </message>
-    <message>
-        <source>expected a character, found half of one</source>
-        <translation>ein Zeichen erwartet, ein halbes gefunden</translation>
-    </message>
-    <message>
-        <source>expected a [ before this ]</source>
-        <translation>ein [ vor diesem ] erwartet</translation>
-    </message>
-    <message>
-        <source>expected an operator, write &lt;&gt; for unequal</source>
-        <translation>ein Operator erwartet, schreiben Sie &lt;&gt; für ungleich</translation>
-    </message>
-    <message>
-        <source>expected a name between the brackets</source>
-        <translation>ein Name zwischen den Klammern erwartet</translation>
-    </message>
-    <message>
-        <source>expected a text</source>
-        <translation>ein Text erwartet</translation>
-    </message>
-    <message>
-        <source>expected a number</source>
-        <translation>eine Zahl erwartet</translation>
-    </message>
-    <message>
-        <source>expected a date (2024-12-31)</source>
-        <translation>Datum erwartet (2024-12-31)</translation>
-    </message>
-    <message>
-        <source>expected a time (23:59)</source>
-        <translation>Uhrzeit erwartet (23:59)</translation>
-    </message>
-    <message>
-        <source>expected a date and time (2024-12-31 23:59)</source>
-        <translation>Datum und Uhrzeit erwartet (2024-12-31 23:59)</translation>
-    </message>
-    <message>
-        <source>expected true or false</source>
-        <translation>true oder false erwartet</translation>
-    </message>
-    <message>
-        <source>expected Is Null, a column or a parameter</source>
-        <translation>Is Null, eine Spalte oder ein Parameter erwartet</translation>
-    </message>
-    <message>
-        <source>expected a value</source>
-        <translation>ein Wert erwartet</translation>
     </message>
     <message>
         <source>a text</source>
@@ -668,6 +544,218 @@
         <source>it is damaged or encrypted; choose another file</source>
         <translation>sie ist beschädigt oder verschlüsselt; wählen Sie eine andere Datei</translation>
     </message>
+    <message>
+        <source>put And or Or between two conditions, or quotes around a text</source>
+        <translation>setzen Sie And oder Or zwischen zwei Bedingungen oder Anführungszeichen um einen Text</translation>
+    </message>
+    <message>
+        <source>this is nested too deep, 100 levels are the most</source>
+        <translation>das ist zu tief verschachtelt, höchstens 100 Ebenen sind möglich</translation>
+    </message>
+    <message>
+        <source>a closing %1 is missing</source>
+        <translation>hier fehlt ein schließendes %1</translation>
+    </message>
+    <message>
+        <source>after In comes a list in parentheses, as in In (1, 2)</source>
+        <translation>nach In kommt eine Liste in Klammern, wie in In (1, 2)</translation>
+    </message>
+    <message>
+        <source>after Is comes Null or Not Null, and a text that begins so needs quotes</source>
+        <translation>nach Is kommt Null oder Not Null, und ein Text, der so beginnt, braucht Anführungszeichen</translation>
+    </message>
+    <message>
+        <source>Like works only on columns that hold text, use =, &lt; or &gt; here</source>
+        <translation>Like geht nur bei Spalten, die Text enthalten, nehmen Sie hier =, &lt; oder &gt;</translation>
+    </message>
+    <message>
+        <source>after Like comes a pattern, as in Like &apos;A*&apos;, not a column</source>
+        <translation>nach Like kommt ein Muster, wie in Like &apos;A*&apos;, keine Spalte</translation>
+    </message>
+    <message>
+        <source>after Like comes a pattern, as in Like &apos;A*&apos;</source>
+        <translation>nach Like kommt ein Muster, wie in Like &apos;A*&apos;</translation>
+    </message>
+    <message>
+        <source>Between needs And and a second value, as in Between 1 And 5</source>
+        <translation>Between braucht And und einen zweiten Wert, wie in Between 1 And 5</translation>
+    </message>
+    <message>
+        <source>a comma or a closing ) is missing</source>
+        <translation>hier fehlt ein Komma oder ein schließendes )</translation>
+    </message>
+    <message>
+        <source>nothing is equal to Null, write Is Null for a missing value or &apos;Null&apos; for the word</source>
+        <translation>nichts ist gleich Null, schreiben Sie Is Null für einen fehlenden Wert oder &apos;Null&apos; für das Wort</translation>
+    </message>
+    <message>
+        <source>a parameter needs a name, as in :year</source>
+        <translation>ein Parameter braucht einen Namen, wie in :jahr</translation>
+    </message>
+    <message>
+        <source>the name of a column is missing behind the point</source>
+        <translation>hinter dem Punkt fehlt der Name einer Spalte</translation>
+    </message>
+    <message>
+        <source>the query has no column %1</source>
+        <translation>die Abfrage hat keine Spalte %1</translation>
+    </message>
+    <message>
+        <source>the table of this column was deleted from the query</source>
+        <translation>die Tabelle dieser Spalte wurde aus der Abfrage gelöscht</translation>
+    </message>
+    <message>
+        <source>several tables have this column, write the table too, as in %1</source>
+        <translation>mehrere Tabellen haben diese Spalte, schreiben Sie auch die Tabelle, wie in %1</translation>
+    </message>
+    <message>
+        <source>compare it with a column that holds %1</source>
+        <translation>vergleichen Sie mit einer Spalte, die Werte dieser Art enthält: %1</translation>
+    </message>
+    <message>
+        <source>a criterion has at most 10000 characters</source>
+        <translation>ein Kriterium hat höchstens 10000 Zeichen</translation>
+    </message>
+    <message>
+        <source>the character zero cannot stand in a criterion</source>
+        <translation>das Zeichen null darf nicht in einem Kriterium stehen</translation>
+    </message>
+    <message>
+        <source>half a character stands here, type it afresh</source>
+        <translation>hier steht ein halbes Zeichen, tippen Sie es neu</translation>
+    </message>
+    <message>
+        <source>a [ before this ] is missing</source>
+        <translation>vor diesem ] fehlt ein [</translation>
+    </message>
+    <message>
+        <source>write &lt;&gt; for unequal</source>
+        <translation>schreiben Sie &lt;&gt; für ungleich</translation>
+    </message>
+    <message>
+        <source>a name is missing between the brackets</source>
+        <translation>zwischen den Klammern fehlt ein Name</translation>
+    </message>
+    <message>
+        <source>a text is missing</source>
+        <translation>hier fehlt ein Text</translation>
+    </message>
+    <message>
+        <source>a number is missing</source>
+        <translation>hier fehlt eine Zahl</translation>
+    </message>
+    <message>
+        <source>a date (2024-12-31) is missing</source>
+        <translation>hier fehlt ein Datum (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>a time (23:59) is missing</source>
+        <translation>hier fehlt eine Uhrzeit (23:59)</translation>
+    </message>
+    <message>
+        <source>a date and time (2024-12-31 23:59) is missing</source>
+        <translation>hier fehlen Datum und Uhrzeit (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>true or false is missing</source>
+        <translation>hier fehlt true oder false</translation>
+    </message>
+    <message>
+        <source>Is Null, a column or a parameter is missing</source>
+        <translation>hier fehlt Is Null, eine Spalte oder ein Parameter</translation>
+    </message>
+    <message>
+        <source>a value is missing</source>
+        <translation>hier fehlt ein Wert</translation>
+    </message>
+    <message>
+        <source>this is no number, write it like 12 or 1.5</source>
+        <translation>das ist keine Zahl, schreiben Sie sie wie 12 oder 1.5</translation>
+    </message>
+    <message>
+        <source>decimals are written with a point, as in 1.5</source>
+        <translation>Dezimalzahlen schreibt man mit einem Punkt, wie in 1.5</translation>
+    </message>
+    <message>
+        <source>this is no date, write it like 2024-12-31</source>
+        <translation>das ist kein Datum, schreiben Sie es wie 2024-12-31</translation>
+    </message>
+    <message>
+        <source>this is no time, write it like 23:59</source>
+        <translation>das ist keine Uhrzeit, schreiben Sie sie wie 23:59</translation>
+    </message>
+    <message>
+        <source>this is no date and time, write it like 2024-12-31 23:59</source>
+        <translation>das ist nicht Datum und Uhrzeit, schreiben Sie beides wie 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>write true or false here</source>
+        <translation>schreiben Sie hier true oder false</translation>
+    </message>
+    <message>
+        <source>only Is Null, a column or a parameter can stand here</source>
+        <translation>hier darf nur Is Null, eine Spalte oder ein Parameter stehen</translation>
+    </message>
+    <message>
+        <source>only dates and times stand between two #</source>
+        <translation>zwischen zwei # stehen nur Datum und Uhrzeit</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is not a file; choose another name.</source>
+        <translation>„%1“ ist keine Datei; wählen Sie einen anderen Namen.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is not a file; choose a query file.</source>
+        <translation>„%1“ ist keine Datei; wählen Sie eine Abfragedatei.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is write-protected; save under another name.</source>
+        <translation>Die Datei „%1“ ist schreibgeschützt; speichern Sie unter einem anderen Namen.</translation>
+    </message>
+    <message>
+        <source>%1 (%2); %3.</source>
+        <translation>%1 (%2); %3.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be saved</source>
+        <translation>Die Datei „%1“ kann nicht gespeichert werden</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read</source>
+        <translation>Die Datei „%1“ kann nicht gelesen werden</translation>
+    </message>
+    <message>
+        <source>The output cannot be written</source>
+        <translation>Die Ausgabe kann nicht geschrieben werden</translation>
+    </message>
+    <message>
+        <source>The rows cannot be written</source>
+        <translation>Die Zeilen können nicht geschrieben werden</translation>
+    </message>
+    <message>
+        <source>check the path</source>
+        <translation>prüfen Sie den Pfad</translation>
+    </message>
+    <message>
+        <source>ask the owner for permission, or choose another folder</source>
+        <translation>bitten Sie den Eigentümer um die Erlaubnis oder wählen Sie einen anderen Ordner</translation>
+    </message>
+    <message>
+        <source>make room on the disk, or choose another one</source>
+        <translation>schaffen Sie Platz auf dem Datenträger oder wählen Sie einen anderen</translation>
+    </message>
+    <message>
+        <source>choose another disk</source>
+        <translation>wählen Sie einen anderen Datenträger</translation>
+    </message>
+    <message>
+        <source>choose a folder on another disk</source>
+        <translation>wählen Sie einen Ordner auf einem anderen Datenträger</translation>
+    </message>
+    <message>
+        <source>try again, or choose another folder</source>
+        <translation>versuchen Sie es noch einmal oder wählen Sie einen anderen Ordner</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -686,6 +774,27 @@
         <source>Query designer</source>
         <translation>Abfrageentwurf</translation>
     </message>
+    <message>
+        <source>all</source>
+        <comment>the rows of a table, at the end of a line</comment>
+        <translation>alle</translation>
+    </message>
+    <message>
+        <source>the rows of %1 and %2 that match</source>
+        <translation>die Zeilen von %1 und %2, die zueinander passen</translation>
+    </message>
+    <message>
+        <source>all rows of %1, and those of %2 that match</source>
+        <translation>alle Zeilen von %1 und die passenden von %2</translation>
+    </message>
+    <message>
+        <source>all rows of %1 and of %2, side by side where they match</source>
+        <translation>alle Zeilen von %1 und von %2, nebeneinander, wo sie zueinander passen</translation>
+    </message>
+    <message>
+        <source>Re&amp;name…</source>
+        <translation>&amp;Umbenennen…</translation>
+    </message>
 </context>
 <context>
     <name>designer</name>
@@ -696,10 +805,6 @@
     <message>
         <source>A picture ends in .png, .svg or .pdf; &quot;%1&quot; does not.</source>
         <translation>Ein Bild endet auf .png, .svg oder .pdf; „%1“ nicht.</translation>
-    </message>
-    <message>
-        <source>The picture &quot;%1&quot; cannot be written; check the folder and your permissions.</source>
-        <translation>Das Bild „%1“ kann nicht geschrieben werden; prüfen Sie den Ordner und Ihre Rechte.</translation>
     </message>
     <message>
         <source>The printer cannot be reached; choose another one.</source>
@@ -722,19 +827,22 @@
         <translation>Diese Tabellen haben %1 Verknüpfungen, die Zeichenfläche nimmt %2; wählen Sie mit --tables weniger Tabellen.</translation>
     </message>
     <message>
-        <source>%1 of %2 tables; choose others in the panel &quot;Tables&quot;</source>
-        <translation>%1 von %2 Tabellen; weitere wählen Sie in der Leiste „Tabellen“</translation>
+        <source>The drawing is too large for &quot;%1&quot;; choose a name that ends in .svg.</source>
+        <translation>Die Zeichnung ist zu groß für „%1“; wählen Sie einen Namen, der auf .svg endet.</translation>
     </message>
 </context>
 <context>
     <name>designer::Autosave</name>
     <message>
-        <source>the folder %1 cannot be written</source>
-        <translation>in den Ordner %1 kann nicht geschrieben werden</translation>
+        <source>The changes cannot be kept safe in &quot;%1&quot; (%2); save the query yourself.</source>
+        <translation>Die Änderungen können in „%1“ nicht gesichert werden (%2); speichern Sie die Abfrage selbst.</translation>
     </message>
+</context>
+<context>
+    <name>designer::Banner</name>
     <message>
-        <source>The query could not be saved for a recovery (%1); save it yourself.</source>
-        <translation>Die Abfrage konnte nicht für eine Wiederherstellung gesichert werden (%1); speichern Sie sie selbst.</translation>
+        <source>Close</source>
+        <translation>Schließen</translation>
     </message>
 </context>
 <context>
@@ -751,12 +859,20 @@
         <translation>&amp;Neu verbinden</translation>
     </message>
     <message>
-        <source>Close</source>
-        <translation>Schließen</translation>
-    </message>
-    <message>
         <source>The connection to %1 is lost. Your query is kept.</source>
         <translation>Die Verbindung zu %1 ist abgebrochen. Ihre Abfrage bleibt erhalten.</translation>
+    </message>
+    <message>
+        <source>The file of %1 is no longer there. Your query is kept.</source>
+        <translation>Die Datei von %1 ist nicht mehr da. Ihre Abfrage bleibt erhalten.</translation>
+    </message>
+    <message>
+        <source>%1 has been replaced by another file since it was opened.</source>
+        <translation>%1 wurde seit dem Öffnen durch eine andere Datei ersetzt.</translation>
+    </message>
+    <message>
+        <source>The tables of %1 have been changed by another program.</source>
+        <translation>Die Tabellen von %1 wurden von einem anderen Programm geändert.</translation>
     </message>
 </context>
 <context>
@@ -879,6 +995,10 @@
     <message>
         <source>Reco&amp;nnect</source>
         <translation>&amp;Neu verbinden</translation>
+    </message>
+    <message>
+        <source>&amp;Try again</source>
+        <translation>&amp;Erneut versuchen</translation>
     </message>
 </context>
 <context>
@@ -1015,6 +1135,26 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
         <source>&amp;Events</source>
         <translation>&amp;Ereignisse</translation>
     </message>
+    <message>
+        <source>&amp;Go to</source>
+        <translation>&amp;Wechseln zu</translation>
+    </message>
+    <message>
+        <source>&amp;Drawing</source>
+        <translation>Zeich&amp;nung</translation>
+    </message>
+    <message>
+        <source>&amp;Criteria</source>
+        <translation>&amp;Kriterien</translation>
+    </message>
+    <message>
+        <source>&amp;Keys</source>
+        <translation>&amp;Tasten</translation>
+    </message>
+    <message>
+        <source>&amp;Try again</source>
+        <translation>&amp;Erneut versuchen</translation>
+    </message>
 </context>
 <context>
     <name>designer::Document</name>
@@ -1115,12 +1255,53 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
         <source>Changes that are not saved are lost.</source>
         <translation>Änderungen, die nicht gespeichert sind, gehen verloren.</translation>
     </message>
-</context>
-<context>
-    <name>designer::FileExport</name>
     <message>
-        <source>The file &quot;%1&quot; cannot be written (%2): check the folder and your permissions.</source>
-        <translation>Die Datei „%1“ kann nicht geschrieben werden (%2): Prüfen Sie den Ordner und Ihre Rechte.</translation>
+        <source>To save your query overwrites these changes.</source>
+        <translation>Wenn Sie Ihre Abfrage speichern, werden diese Änderungen überschrieben.</translation>
+    </message>
+    <message>
+        <source>&amp;Overwrite them</source>
+        <translation>Änderungen ü&amp;berschreiben</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is no longer there; save the query to have one.</source>
+        <translation>Die Datei „%1“ ist nicht mehr da; speichern Sie die Abfrage, um wieder eine zu haben.</translation>
+    </message>
+    <message>
+        <source>To load it gives up your own changes.</source>
+        <translation>Wenn Sie sie laden, gehen Ihre eigenen Änderungen verloren.</translation>
+    </message>
+    <message>
+        <source>You have not changed it since.</source>
+        <translation>Sie selbst haben seitdem nichts geändert.</translation>
+    </message>
+    <message>
+        <source>&amp;Keep mine</source>
+        <translation>Meine Fassung &amp;behalten</translation>
+    </message>
+    <message>
+        <source>&amp;Decide later</source>
+        <translation>Spä&amp;ter entscheiden</translation>
+    </message>
+    <message>
+        <source>Changed file</source>
+        <translation>Geänderte Datei</translation>
+    </message>
+    <message>
+        <source>Another program has changed &quot;%1&quot; since you opened it.</source>
+        <translation>Ein anderes Programm hat „%1“ geändert, seit Sie die Datei geöffnet haben.</translation>
+    </message>
+    <message>
+        <source>&amp;Load the file</source>
+        <translation>Datei &amp;laden</translation>
+    </message>
+    <message>
+        <source>Save &amp;as…</source>
+        <translation>Speichern &amp;unter…</translation>
     </message>
 </context>
 <context>
@@ -1139,6 +1320,25 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
+    <name>designer::HelpWindow</name>
+    <message>
+        <source>Help</source>
+        <translation>Hilfe</translation>
+    </message>
+    <message>
+        <source>&amp;Criteria</source>
+        <translation>&amp;Kriterien</translation>
+    </message>
+    <message>
+        <source>&amp;Keys</source>
+        <translation>&amp;Tasten</translation>
+    </message>
+    <message>
+        <source>Find on this page</source>
+        <translation>Auf dieser Seite suchen</translation>
+    </message>
+</context>
+<context>
     <name>designer::Invitation</name>
     <message>
         <source>Drag a table here from the list of tables, or double-click it there.
@@ -1149,6 +1349,13 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
         <translation>Öffnen Sie zuerst eine Datenbank: siehe das Menü „Datenbank“.</translation>
+    </message>
+</context>
+<context>
+    <name>designer::MissingTables</name>
+    <message>
+        <source>There is no table &quot;%1&quot; in %2.</source>
+        <translation>In %2 gibt es keine Tabelle „%1“.</translation>
     </message>
 </context>
 <context>
@@ -1348,12 +1555,38 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
         <source>(blob, %1 bytes)</source>
         <translation>(BLOB, %1 Bytes)</translation>
     </message>
+    <message>
+        <source>%1
+Click to sort the rows that are shown; the query stays as it is.</source>
+        <translation>%1
+Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie ist.</translation>
+    </message>
 </context>
 <context>
     <name>designer::ResultTable</name>
     <message>
         <source>&amp;Copy</source>
         <translation>&amp;Kopieren</translation>
+    </message>
+    <message>
+        <source>Copy &amp;with all columns</source>
+        <translation>Mit &amp;allen Spalten kopieren</translation>
+    </message>
+    <message>
+        <source>Select c&amp;olumn</source>
+        <translation>Spalte aus&amp;wählen</translation>
+    </message>
+    <message>
+        <source>Sort &amp;ascending</source>
+        <translation>Au&amp;fsteigend sortieren</translation>
+    </message>
+    <message>
+        <source>Sort &amp;descending</source>
+        <translation>A&amp;bsteigend sortieren</translation>
+    </message>
+    <message>
+        <source>As the &amp;query gives them</source>
+        <translation>In der &amp;Reihenfolge der Abfrage</translation>
     </message>
 </context>
 <context>
@@ -1435,10 +1668,6 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
         <translation>Führen Sie die Abfrage aus, um hier ihre Zeilen zu sehen.</translation>
     </message>
     <message>
-        <source>%1 · the drawing has changed since</source>
-        <translation>%1 · die Zeichnung wurde seitdem geändert</translation>
-    </message>
-    <message>
         <source>%1 s</source>
         <translation>%1 s</translation>
     </message>
@@ -1453,10 +1682,6 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>&amp;Cancel</source>
         <translation>&amp;Abbrechen</translation>
-    </message>
-    <message>
-        <source>Stop what is running, on the database too</source>
-        <translation>Anhalten, was läuft, auch auf der Datenbank</translation>
     </message>
     <message>
         <source>Run the query and write all its rows into a CSV file</source>
@@ -1485,6 +1710,38 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>Export…</source>
         <translation>Exportieren…</translation>
+    </message>
+    <message>
+        <source>rows.csv</source>
+        <translation>zeilen.csv</translation>
+    </message>
+    <message>
+        <source>the rows can be sorted when all of them have come</source>
+        <translation>die Zeilen lassen sich sortieren, wenn alle da sind</translation>
+    </message>
+    <message>
+        <source>these are too many rows to sort here; use the row &quot;Sort:&quot; of the drawing</source>
+        <translation>das sind zu viele Zeilen, um sie hier zu sortieren; nehmen Sie die Zeile „Sortierung:“ der Zeichnung</translation>
+    </message>
+    <message>
+        <source>Sorting the rows…</source>
+        <translation>Zeilen werden sortiert…</translation>
+    </message>
+    <message>
+        <source>these rows are sorted by %1 here, the query is not</source>
+        <translation>diese Zeilen sind hier nach %1 sortiert, die Abfrage nicht</translation>
+    </message>
+    <message>
+        <source>these rows are sorted by %1 descending here, the query is not</source>
+        <translation>diese Zeilen sind hier nach %1 absteigend sortiert, die Abfrage nicht</translation>
+    </message>
+    <message>
+        <source>the drawing has changed since</source>
+        <translation>die Zeichnung hat sich seitdem geändert</translation>
+    </message>
+    <message>
+        <source>Stop what is running, on the database too (Esc)</source>
+        <translation>Abbrechen, was gerade läuft, auch in der Datenbank (Esc)</translation>
     </message>
 </context>
 <context>
@@ -1524,6 +1781,14 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>Print</source>
         <translation>Drucken</translation>
+    </message>
+    <message>
+        <source>Pictures &amp;with all columns</source>
+        <translation>Bilder mit &amp;allen Spalten</translation>
+    </message>
+    <message>
+        <source>drawing.png</source>
+        <translation>zeichnung.png</translation>
     </message>
 </context>
 <context>
@@ -1729,6 +1994,17 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
         <source>Change column %1</source>
         <translation>Spalte %1 ändern</translation>
     </message>
+    <message>
+        <source>Move column %1</source>
+        <translation>Spalte %1 verschieben</translation>
+    </message>
+    <message numerus="yes">
+        <source>Move %n column(s)</source>
+        <translation>
+            <numerusform>%n Spalte verschieben</numerusform>
+            <numerusform>%n Spalten verschieben</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>designer::TableAdding</name>
@@ -1759,6 +2035,10 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>The drawing takes %1 joins, and with this there would be %2; delete tables or joins first.</source>
         <translation>Die Zeichnung nimmt %1 Verknüpfungen, und damit wären es %2; löschen Sie zuerst Tabellen oder Verknüpfungen.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 are joined by %3. Not joined by %4: draw those yourself if you need them.</source>
+        <translation>%1 und %2 sind über %3 verknüpft. Nicht verknüpft über %4: Zeichnen Sie diese Verknüpfungen selbst, wenn Sie sie brauchen.</translation>
     </message>
 </context>
 <context>
@@ -1916,13 +2196,6 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::writeAll</name>
-    <message>
-        <source>The rows cannot be written (%1): see that the disk has room and that you may write there.</source>
-        <translation>Die Zeilen können nicht geschrieben werden (%1): Sehen Sie nach, ob Platz ist und ob Sie dort schreiben dürfen.</translation>
-    </message>
-</context>
-<context>
     <name>platform::qt::Canvas</name>
     <message>
         <source>Tables and joins</source>
@@ -1946,6 +2219,17 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
         <source>key column</source>
         <translation>Schlüsselspalte</translation>
     </message>
+    <message>
+        <source>comes out</source>
+        <translation>wird ausgegeben</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::FieldTitles</name>
+    <message>
+        <source>Add field…</source>
+        <translation>Feld hinzufügen…</translation>
+    </message>
 </context>
 <context>
     <name>platform::qt::GridModel</name>
@@ -1966,6 +2250,32 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>Back to the origin</source>
         <translation>Zurück zum Anfang</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::PaneHandle</name>
+    <message>
+        <source>Divider of canvas and grid</source>
+        <translation>Trennleiste zwischen Zeichenfläche und Raster</translation>
+    </message>
+    <message>
+        <source>Drag to give the canvas or the grid more room</source>
+        <translation>Ziehen Sie, um der Zeichenfläche oder dem Raster mehr Platz zu geben</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::PickListWidget</name>
+    <message>
+        <source>Type to find a field</source>
+        <translation>Tippen Sie, um ein Feld zu finden</translation>
+    </message>
+    <message>
+        <source>Field</source>
+        <translation>Feld</translation>
+    </message>
+    <message>
+        <source>Fields</source>
+        <translation>Felder</translation>
     </message>
 </context>
 </TS>

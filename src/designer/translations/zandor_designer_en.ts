@@ -66,5 +66,12 @@
             <numerusform>Delete %n columns</numerusform>
         </translation>
     </message>
+    <message numerus="yes">
+        <source>Move %n column(s)</source>
+        <translation>
+            <numerusform>Move %n column</numerusform>
+            <numerusform>Move %n columns</numerusform>
+        </translation>
+    </message>
 </context>
 </TS>

@@ -198,10 +198,6 @@
 <context>
     <name>ControlTexts</name>
     <message>
-        <source>Join Defintion</source>
-        <translation>Definición de la combinación</translation>
-    </message>
-    <message>
         <source>Left Table:</source>
         <translation>Tabla izquierda:</translation>
     </message>
@@ -246,34 +242,6 @@
         <translation>&amp;Cancelar</translation>
     </message>
     <message>
-        <source>Show Join Definition</source>
-        <translation>Definir la combinación</translation>
-    </message>
-    <message>
-        <source>Delete Join</source>
-        <translation>Eliminar la combinación</translation>
-    </message>
-    <message>
-        <source>Copy Column</source>
-        <translation>Copiar la columna</translation>
-    </message>
-    <message>
-        <source>Create Join</source>
-        <translation>Crear una combinación</translation>
-    </message>
-    <message>
-        <source>Delete Table</source>
-        <translation>Eliminar la tabla</translation>
-    </message>
-    <message>
-        <source>Paste Column</source>
-        <translation>Pegar la columna</translation>
-    </message>
-    <message>
-        <source>Delete Coumn</source>
-        <translation>Eliminar la columna</translation>
-    </message>
-    <message>
         <source>Field:</source>
         <translation>Campo:</translation>
     </message>
@@ -296,6 +264,38 @@
     <message>
         <source>Or:</source>
         <translation>O:</translation>
+    </message>
+    <message>
+        <source>Join Definition</source>
+        <translation>Definición de la combinación</translation>
+    </message>
+    <message>
+        <source>Show &amp;Join Definition</source>
+        <translation>&amp;Definir la combinación</translation>
+    </message>
+    <message>
+        <source>Delete Jo&amp;in</source>
+        <translation>&amp;Eliminar la combinación</translation>
+    </message>
+    <message>
+        <source>&amp;Copy Column</source>
+        <translation>&amp;Copiar la columna</translation>
+    </message>
+    <message>
+        <source>C&amp;reate Join</source>
+        <translation>C&amp;rear una combinación</translation>
+    </message>
+    <message>
+        <source>Delete &amp;Table</source>
+        <translation>Eliminar la &amp;tabla</translation>
+    </message>
+    <message>
+        <source>&amp;Paste Column</source>
+        <translation>&amp;Pegar la columna</translation>
+    </message>
+    <message>
+        <source>&amp;Delete Column</source>
+        <translation>Eliminar la co&amp;lumna</translation>
     </message>
 </context>
 <context>
@@ -383,130 +383,6 @@
     <message>
         <source>%1: At character %2: %3.</source>
         <translation>%1: en el carácter %2: %3.</translation>
-    </message>
-    <message>
-        <source>expected And, Or or the end</source>
-        <translation>se esperaba And, Or o el final</translation>
-    </message>
-    <message>
-        <source>expected less nesting, 100 levels are the most</source>
-        <translation>se esperaban menos niveles, 100 como máximo</translation>
-    </message>
-    <message>
-        <source>expected a closing %1</source>
-        <translation>se esperaba %1 de cierre</translation>
-    </message>
-    <message>
-        <source>expected ( after In</source>
-        <translation>se esperaba ( después de In</translation>
-    </message>
-    <message>
-        <source>expected Null, a text that begins so needs quotes</source>
-        <translation>se esperaba Null, un texto que empieza así necesita comillas</translation>
-    </message>
-    <message>
-        <source>expected a comparison, Like works on columns that hold text</source>
-        <translation>se esperaba una comparación, Like sirve para columnas de texto</translation>
-    </message>
-    <message>
-        <source>expected a pattern, as in Like &apos;A*&apos;, not a column</source>
-        <translation>se esperaba un patrón, como en Like &apos;A*&apos;, no una columna</translation>
-    </message>
-    <message>
-        <source>expected a pattern, as in Like &apos;A*&apos;</source>
-        <translation>se esperaba un patrón, como en Like &apos;A*&apos;</translation>
-    </message>
-    <message>
-        <source>expected And and the upper value</source>
-        <translation>se esperaba And y el valor superior</translation>
-    </message>
-    <message>
-        <source>expected a comma or a closing )</source>
-        <translation>se esperaba una coma o )</translation>
-    </message>
-    <message>
-        <source>expected a value, write Is Null for a missing one or &apos;Null&apos; for the word</source>
-        <translation>se esperaba un valor, escriba Is Null si falta o &apos;Null&apos; para la palabra</translation>
-    </message>
-    <message>
-        <source>expected the parameter&apos;s name</source>
-        <translation>se esperaba el nombre del parámetro</translation>
-    </message>
-    <message>
-        <source>expected the column&apos;s name</source>
-        <translation>se esperaba el nombre de la columna</translation>
-    </message>
-    <message>
-        <source>expected a column of the query, there is no %1</source>
-        <translation>se esperaba una columna de la consulta, no existe %1</translation>
-    </message>
-    <message>
-        <source>expected a column of the query, the table that had this one was deleted</source>
-        <translation>se esperaba una columna de la consulta, la tabla que tenía esta se eliminó</translation>
-    </message>
-    <message>
-        <source>expected the table too, as in %1, several tables have this column</source>
-        <translation>se esperaba también la tabla, como en %1, varias tablas tienen esta columna</translation>
-    </message>
-    <message>
-        <source>expected a column that holds %1</source>
-        <translation>se esperaba una columna que contenga %1</translation>
-    </message>
-    <message>
-        <source>expected the end, a criterion has at most 10000 characters</source>
-        <translation>se esperaba el final, un criterio tiene como máximo 10000 caracteres</translation>
-    </message>
-    <message>
-        <source>expected a character, found the character zero</source>
-        <translation>se esperaba un carácter, se encontró el carácter cero</translation>
-    </message>
-    <message>
-        <source>expected a character, found half of one</source>
-        <translation>se esperaba un carácter, se encontró medio</translation>
-    </message>
-    <message>
-        <source>expected a [ before this ]</source>
-        <translation>se esperaba un [ antes de este ]</translation>
-    </message>
-    <message>
-        <source>expected an operator, write &lt;&gt; for unequal</source>
-        <translation>se esperaba un operador, escriba &lt;&gt; para distinto</translation>
-    </message>
-    <message>
-        <source>expected a name between the brackets</source>
-        <translation>se esperaba un nombre entre los corchetes</translation>
-    </message>
-    <message>
-        <source>expected a text</source>
-        <translation>se esperaba un texto</translation>
-    </message>
-    <message>
-        <source>expected a number</source>
-        <translation>se esperaba un número</translation>
-    </message>
-    <message>
-        <source>expected a date (2024-12-31)</source>
-        <translation>se esperaba una fecha (2024-12-31)</translation>
-    </message>
-    <message>
-        <source>expected a time (23:59)</source>
-        <translation>se esperaba una hora (23:59)</translation>
-    </message>
-    <message>
-        <source>expected a date and time (2024-12-31 23:59)</source>
-        <translation>se esperaba una fecha con hora (2024-12-31 23:59)</translation>
-    </message>
-    <message>
-        <source>expected true or false</source>
-        <translation>se esperaba true o false</translation>
-    </message>
-    <message>
-        <source>expected Is Null, a column or a parameter</source>
-        <translation>se esperaba Is Null, una columna o un parámetro</translation>
-    </message>
-    <message>
-        <source>expected a value</source>
-        <translation>se esperaba un valor</translation>
     </message>
     <message>
         <source>a text</source>
@@ -668,6 +544,218 @@
         <source>it is damaged or encrypted; choose another file</source>
         <translation>está dañado o cifrado; elija otro archivo</translation>
     </message>
+    <message>
+        <source>put And or Or between two conditions, or quotes around a text</source>
+        <translation>ponga And u Or entre dos condiciones, o comillas alrededor de un texto</translation>
+    </message>
+    <message>
+        <source>this is nested too deep, 100 levels are the most</source>
+        <translation>hay demasiados niveles anidados, 100 como máximo</translation>
+    </message>
+    <message>
+        <source>a closing %1 is missing</source>
+        <translation>falta %1 de cierre</translation>
+    </message>
+    <message>
+        <source>after In comes a list in parentheses, as in In (1, 2)</source>
+        <translation>después de In escriba una lista entre paréntesis, como en In (1, 2)</translation>
+    </message>
+    <message>
+        <source>after Is comes Null or Not Null, and a text that begins so needs quotes</source>
+        <translation>después de Is escriba Null o Not Null, y un texto que empieza así necesita comillas</translation>
+    </message>
+    <message>
+        <source>Like works only on columns that hold text, use =, &lt; or &gt; here</source>
+        <translation>Like solo sirve para columnas de texto, use aquí =, &lt; o &gt;</translation>
+    </message>
+    <message>
+        <source>after Like comes a pattern, as in Like &apos;A*&apos;, not a column</source>
+        <translation>después de Like escriba un patrón, como en Like &apos;A*&apos;, no una columna</translation>
+    </message>
+    <message>
+        <source>after Like comes a pattern, as in Like &apos;A*&apos;</source>
+        <translation>después de Like escriba un patrón, como en Like &apos;A*&apos;</translation>
+    </message>
+    <message>
+        <source>Between needs And and a second value, as in Between 1 And 5</source>
+        <translation>Between necesita And y un segundo valor, como en Between 1 And 5</translation>
+    </message>
+    <message>
+        <source>a comma or a closing ) is missing</source>
+        <translation>falta una coma o un ) de cierre</translation>
+    </message>
+    <message>
+        <source>nothing is equal to Null, write Is Null for a missing value or &apos;Null&apos; for the word</source>
+        <translation>nada es igual a Null, escriba Is Null para un valor que falta o &apos;Null&apos; para la palabra</translation>
+    </message>
+    <message>
+        <source>a parameter needs a name, as in :year</source>
+        <translation>un parámetro necesita un nombre, como en :fecha</translation>
+    </message>
+    <message>
+        <source>the name of a column is missing behind the point</source>
+        <translation>falta el nombre de una columna después del punto</translation>
+    </message>
+    <message>
+        <source>the query has no column %1</source>
+        <translation>la consulta no tiene ninguna columna %1</translation>
+    </message>
+    <message>
+        <source>the table of this column was deleted from the query</source>
+        <translation>la tabla de esta columna se eliminó de la consulta</translation>
+    </message>
+    <message>
+        <source>several tables have this column, write the table too, as in %1</source>
+        <translation>varias tablas tienen esta columna, escriba también la tabla, como en %1</translation>
+    </message>
+    <message>
+        <source>compare it with a column that holds %1</source>
+        <translation>compárelo con una columna que contenga %1</translation>
+    </message>
+    <message>
+        <source>a criterion has at most 10000 characters</source>
+        <translation>un criterio tiene como máximo 10000 caracteres</translation>
+    </message>
+    <message>
+        <source>the character zero cannot stand in a criterion</source>
+        <translation>el carácter cero no puede aparecer en un criterio</translation>
+    </message>
+    <message>
+        <source>half a character stands here, type it afresh</source>
+        <translation>aquí hay medio carácter, escríbalo de nuevo</translation>
+    </message>
+    <message>
+        <source>a [ before this ] is missing</source>
+        <translation>falta un [ antes de este ]</translation>
+    </message>
+    <message>
+        <source>write &lt;&gt; for unequal</source>
+        <translation>escriba &lt;&gt; para distinto</translation>
+    </message>
+    <message>
+        <source>a name is missing between the brackets</source>
+        <translation>falta un nombre entre los corchetes</translation>
+    </message>
+    <message>
+        <source>a text is missing</source>
+        <translation>falta un texto</translation>
+    </message>
+    <message>
+        <source>a number is missing</source>
+        <translation>falta un número</translation>
+    </message>
+    <message>
+        <source>a date (2024-12-31) is missing</source>
+        <translation>falta una fecha (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>a time (23:59) is missing</source>
+        <translation>falta una hora (23:59)</translation>
+    </message>
+    <message>
+        <source>a date and time (2024-12-31 23:59) is missing</source>
+        <translation>falta una fecha con hora (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>true or false is missing</source>
+        <translation>falta true o false</translation>
+    </message>
+    <message>
+        <source>Is Null, a column or a parameter is missing</source>
+        <translation>falta Is Null, una columna o un parámetro</translation>
+    </message>
+    <message>
+        <source>a value is missing</source>
+        <translation>falta un valor</translation>
+    </message>
+    <message>
+        <source>this is no number, write it like 12 or 1.5</source>
+        <translation>esto no es un número, escríbalo como 12 o 1.5</translation>
+    </message>
+    <message>
+        <source>decimals are written with a point, as in 1.5</source>
+        <translation>escriba los decimales con punto, como en 1.5</translation>
+    </message>
+    <message>
+        <source>this is no date, write it like 2024-12-31</source>
+        <translation>esto no es una fecha, escríbala como 2024-12-31</translation>
+    </message>
+    <message>
+        <source>this is no time, write it like 23:59</source>
+        <translation>esto no es una hora, escríbala como 23:59</translation>
+    </message>
+    <message>
+        <source>this is no date and time, write it like 2024-12-31 23:59</source>
+        <translation>esto no es una fecha con hora, escríbala como 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>write true or false here</source>
+        <translation>escriba aquí true o false</translation>
+    </message>
+    <message>
+        <source>only Is Null, a column or a parameter can stand here</source>
+        <translation>aquí solo puede ir Is Null, una columna o un parámetro</translation>
+    </message>
+    <message>
+        <source>only dates and times stand between two #</source>
+        <translation>entre dos # escriba solo fechas y horas</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is not a file; choose another name.</source>
+        <translation>«%1» no es un archivo; elija otro nombre.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is not a file; choose a query file.</source>
+        <translation>«%1» no es un archivo; elija un archivo de consulta.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is write-protected; save under another name.</source>
+        <translation>El archivo «%1» está protegido contra escritura; guarde con otro nombre.</translation>
+    </message>
+    <message>
+        <source>%1 (%2); %3.</source>
+        <translation>%1 (%2); %3.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be saved</source>
+        <translation>No se puede guardar el archivo «%1»</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read</source>
+        <translation>No se puede leer el archivo «%1»</translation>
+    </message>
+    <message>
+        <source>The output cannot be written</source>
+        <translation>No se puede escribir la salida</translation>
+    </message>
+    <message>
+        <source>The rows cannot be written</source>
+        <translation>No se pueden escribir las filas</translation>
+    </message>
+    <message>
+        <source>check the path</source>
+        <translation>compruebe la ruta</translation>
+    </message>
+    <message>
+        <source>ask the owner for permission, or choose another folder</source>
+        <translation>pida permiso al propietario o elija otra carpeta</translation>
+    </message>
+    <message>
+        <source>make room on the disk, or choose another one</source>
+        <translation>haga sitio en el disco o elija otro</translation>
+    </message>
+    <message>
+        <source>choose another disk</source>
+        <translation>elija otro disco</translation>
+    </message>
+    <message>
+        <source>choose a folder on another disk</source>
+        <translation>elija una carpeta en otro disco</translation>
+    </message>
+    <message>
+        <source>try again, or choose another folder</source>
+        <translation>inténtelo de nuevo o elija otra carpeta</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -686,6 +774,27 @@
         <source>Query designer</source>
         <translation>Diseñador de consultas</translation>
     </message>
+    <message>
+        <source>all</source>
+        <comment>the rows of a table, at the end of a line</comment>
+        <translation>todas</translation>
+    </message>
+    <message>
+        <source>the rows of %1 and %2 that match</source>
+        <translation>las filas de %1 y %2 que coinciden</translation>
+    </message>
+    <message>
+        <source>all rows of %1, and those of %2 that match</source>
+        <translation>todas las filas de %1, y las de %2 que coinciden</translation>
+    </message>
+    <message>
+        <source>all rows of %1 and of %2, side by side where they match</source>
+        <translation>todas las filas de %1 y de %2, emparejadas donde coinciden</translation>
+    </message>
+    <message>
+        <source>Re&amp;name…</source>
+        <translation>Cambiar el &amp;nombre…</translation>
+    </message>
 </context>
 <context>
     <name>designer</name>
@@ -696,10 +805,6 @@
     <message>
         <source>A picture ends in .png, .svg or .pdf; &quot;%1&quot; does not.</source>
         <translation>Una imagen termina en .png, .svg o .pdf; «%1» no.</translation>
-    </message>
-    <message>
-        <source>The picture &quot;%1&quot; cannot be written; check the folder and your permissions.</source>
-        <translation>No se puede escribir la imagen «%1»; compruebe la carpeta y sus permisos.</translation>
     </message>
     <message>
         <source>The printer cannot be reached; choose another one.</source>
@@ -722,19 +827,22 @@
         <translation>Estas tablas tienen %1 combinaciones y el lienzo admite %2; elija menos tablas con --tables.</translation>
     </message>
     <message>
-        <source>%1 of %2 tables; choose others in the panel &quot;Tables&quot;</source>
-        <translation>%1 de %2 tablas; elija otras en el panel «Tablas»</translation>
+        <source>The drawing is too large for &quot;%1&quot;; choose a name that ends in .svg.</source>
+        <translation>El dibujo es demasiado grande para «%1»; elija un nombre que termine en .svg.</translation>
     </message>
 </context>
 <context>
     <name>designer::Autosave</name>
     <message>
-        <source>the folder %1 cannot be written</source>
-        <translation>no se puede escribir en la carpeta %1</translation>
+        <source>The changes cannot be kept safe in &quot;%1&quot; (%2); save the query yourself.</source>
+        <translation>Los cambios no se pueden poner a salvo en «%1» (%2); guarde usted la consulta.</translation>
     </message>
+</context>
+<context>
+    <name>designer::Banner</name>
     <message>
-        <source>The query could not be saved for a recovery (%1); save it yourself.</source>
-        <translation>No se pudo guardar la consulta para una recuperación (%1); guárdela usted.</translation>
+        <source>Close</source>
+        <translation>Cerrar</translation>
     </message>
 </context>
 <context>
@@ -751,12 +859,20 @@
         <translation>&amp;Reconectar</translation>
     </message>
     <message>
-        <source>Close</source>
-        <translation>Cerrar</translation>
-    </message>
-    <message>
         <source>The connection to %1 is lost. Your query is kept.</source>
         <translation>Se ha perdido la conexión con %1. Su consulta se conserva.</translation>
+    </message>
+    <message>
+        <source>The file of %1 is no longer there. Your query is kept.</source>
+        <translation>El archivo de %1 ya no existe. Su consulta se conserva.</translation>
+    </message>
+    <message>
+        <source>%1 has been replaced by another file since it was opened.</source>
+        <translation>Otro archivo ha sustituido a %1 desde que se abrió.</translation>
+    </message>
+    <message>
+        <source>The tables of %1 have been changed by another program.</source>
+        <translation>Otro programa ha cambiado las tablas de %1.</translation>
     </message>
 </context>
 <context>
@@ -879,6 +995,10 @@
     <message>
         <source>Reco&amp;nnect</source>
         <translation>Reco&amp;nectar</translation>
+    </message>
+    <message>
+        <source>&amp;Try again</source>
+        <translation>&amp;Intentar de nuevo</translation>
     </message>
 </context>
 <context>
@@ -1015,6 +1135,26 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <source>&amp;Events</source>
         <translation>&amp;Eventos</translation>
     </message>
+    <message>
+        <source>&amp;Go to</source>
+        <translation>&amp;Ir a</translation>
+    </message>
+    <message>
+        <source>&amp;Drawing</source>
+        <translation>&amp;Dibujo</translation>
+    </message>
+    <message>
+        <source>&amp;Criteria</source>
+        <translation>&amp;Criterios</translation>
+    </message>
+    <message>
+        <source>&amp;Keys</source>
+        <translation>&amp;Teclado</translation>
+    </message>
+    <message>
+        <source>&amp;Try again</source>
+        <translation>&amp;Intentar de nuevo</translation>
+    </message>
 </context>
 <context>
     <name>designer::Document</name>
@@ -1115,12 +1255,53 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <source>Changes that are not saved are lost.</source>
         <translation>Los cambios que no se guarden se perderán.</translation>
     </message>
-</context>
-<context>
-    <name>designer::FileExport</name>
     <message>
-        <source>The file &quot;%1&quot; cannot be written (%2): check the folder and your permissions.</source>
-        <translation>No se puede escribir el archivo «%1» (%2): compruebe la carpeta y sus permisos.</translation>
+        <source>To save your query overwrites these changes.</source>
+        <translation>Si guarda su consulta, se sobrescriben esos cambios.</translation>
+    </message>
+    <message>
+        <source>&amp;Overwrite them</source>
+        <translation>&amp;Sobrescribirlos</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancelar</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is no longer there; save the query to have one.</source>
+        <translation>El archivo «%1» ya no existe; guarde la consulta para volver a tenerlo.</translation>
+    </message>
+    <message>
+        <source>To load it gives up your own changes.</source>
+        <translation>Si carga el archivo, se pierden sus propios cambios.</translation>
+    </message>
+    <message>
+        <source>You have not changed it since.</source>
+        <translation>Usted no lo ha cambiado desde entonces.</translation>
+    </message>
+    <message>
+        <source>&amp;Keep mine</source>
+        <translation>Conservar lo &amp;mío</translation>
+    </message>
+    <message>
+        <source>&amp;Decide later</source>
+        <translation>&amp;Decidir más tarde</translation>
+    </message>
+    <message>
+        <source>Changed file</source>
+        <translation>Archivo cambiado</translation>
+    </message>
+    <message>
+        <source>Another program has changed &quot;%1&quot; since you opened it.</source>
+        <translation>Otro programa ha cambiado «%1» desde que usted lo abrió.</translation>
+    </message>
+    <message>
+        <source>&amp;Load the file</source>
+        <translation>Cargar el &amp;archivo</translation>
+    </message>
+    <message>
+        <source>Save &amp;as…</source>
+        <translation>Guardar &amp;como…</translation>
     </message>
 </context>
 <context>
@@ -1139,6 +1320,25 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
+    <name>designer::HelpWindow</name>
+    <message>
+        <source>Help</source>
+        <translation>Ayuda</translation>
+    </message>
+    <message>
+        <source>&amp;Criteria</source>
+        <translation>&amp;Criterios</translation>
+    </message>
+    <message>
+        <source>&amp;Keys</source>
+        <translation>&amp;Teclado</translation>
+    </message>
+    <message>
+        <source>Find on this page</source>
+        <translation>Buscar en esta página</translation>
+    </message>
+</context>
+<context>
     <name>designer::Invitation</name>
     <message>
         <source>Drag a table here from the list of tables, or double-click it there.
@@ -1149,6 +1349,13 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
         <translation>Abra una base de datos para empezar: vea el menú «Base de datos».</translation>
+    </message>
+</context>
+<context>
+    <name>designer::MissingTables</name>
+    <message>
+        <source>There is no table &quot;%1&quot; in %2.</source>
+        <translation>No hay ninguna tabla «%1» en %2.</translation>
     </message>
 </context>
 <context>
@@ -1348,12 +1555,38 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
         <source>(blob, %1 bytes)</source>
         <translation>(blob, %1 bytes)</translation>
     </message>
+    <message>
+        <source>%1
+Click to sort the rows that are shown; the query stays as it is.</source>
+        <translation>%1
+Haga clic para ordenar las filas que se muestran; la consulta queda como está.</translation>
+    </message>
 </context>
 <context>
     <name>designer::ResultTable</name>
     <message>
         <source>&amp;Copy</source>
         <translation>&amp;Copiar</translation>
+    </message>
+    <message>
+        <source>Copy &amp;with all columns</source>
+        <translation>Copiar con &amp;todas las columnas</translation>
+    </message>
+    <message>
+        <source>Select c&amp;olumn</source>
+        <translation>&amp;Seleccionar la columna</translation>
+    </message>
+    <message>
+        <source>Sort &amp;ascending</source>
+        <translation>Orden &amp;ascendente</translation>
+    </message>
+    <message>
+        <source>Sort &amp;descending</source>
+        <translation>Orden &amp;descendente</translation>
+    </message>
+    <message>
+        <source>As the &amp;query gives them</source>
+        <translation>C&amp;omo las da la consulta</translation>
     </message>
 </context>
 <context>
@@ -1435,10 +1668,6 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
         <translation>Ejecute la consulta para ver aquí sus filas.</translation>
     </message>
     <message>
-        <source>%1 · the drawing has changed since</source>
-        <translation>%1 · el dibujo ha cambiado desde entonces</translation>
-    </message>
-    <message>
         <source>%1 s</source>
         <translation>%1 s</translation>
     </message>
@@ -1453,10 +1682,6 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>&amp;Cancel</source>
         <translation>&amp;Cancelar</translation>
-    </message>
-    <message>
-        <source>Stop what is running, on the database too</source>
-        <translation>Detener lo que se está ejecutando, también en la base de datos</translation>
     </message>
     <message>
         <source>Run the query and write all its rows into a CSV file</source>
@@ -1485,6 +1710,38 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>Export…</source>
         <translation>Exportar…</translation>
+    </message>
+    <message>
+        <source>rows.csv</source>
+        <translation>filas.csv</translation>
+    </message>
+    <message>
+        <source>the rows can be sorted when all of them have come</source>
+        <translation>las filas se pueden ordenar cuando hayan llegado todas</translation>
+    </message>
+    <message>
+        <source>these are too many rows to sort here; use the row &quot;Sort:&quot; of the drawing</source>
+        <translation>son demasiadas filas para ordenarlas aquí; use la fila «Orden:» del dibujo</translation>
+    </message>
+    <message>
+        <source>Sorting the rows…</source>
+        <translation>Ordenando las filas…</translation>
+    </message>
+    <message>
+        <source>these rows are sorted by %1 here, the query is not</source>
+        <translation>aquí estas filas están ordenadas por %1, la consulta no</translation>
+    </message>
+    <message>
+        <source>these rows are sorted by %1 descending here, the query is not</source>
+        <translation>aquí estas filas están ordenadas por %1 en orden descendente, la consulta no</translation>
+    </message>
+    <message>
+        <source>the drawing has changed since</source>
+        <translation>el dibujo ha cambiado desde entonces</translation>
+    </message>
+    <message>
+        <source>Stop what is running, on the database too (Esc)</source>
+        <translation>Detener lo que se está ejecutando, también en la base de datos (Esc)</translation>
     </message>
 </context>
 <context>
@@ -1524,6 +1781,14 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>Print</source>
         <translation>Imprimir</translation>
+    </message>
+    <message>
+        <source>Pictures &amp;with all columns</source>
+        <translation>Imágenes con &amp;todas las columnas</translation>
+    </message>
+    <message>
+        <source>drawing.png</source>
+        <translation>dibujo.png</translation>
     </message>
 </context>
 <context>
@@ -1729,6 +1994,17 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
         <source>Change column %1</source>
         <translation>Cambiar la columna %1</translation>
     </message>
+    <message>
+        <source>Move column %1</source>
+        <translation>Mover la columna %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Move %n column(s)</source>
+        <translation>
+            <numerusform>Mover %n columna</numerusform>
+            <numerusform>Mover %n columnas</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>designer::TableAdding</name>
@@ -1759,6 +2035,10 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>The drawing takes %1 joins, and with this there would be %2; delete tables or joins first.</source>
         <translation>El dibujo admite %1 combinaciones y así habría %2; elimine primero tablas o combinaciones.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 are joined by %3. Not joined by %4: draw those yourself if you need them.</source>
+        <translation>%1 y %2 se combinan mediante %3. No se combinan mediante %4: dibuje usted esas combinaciones si las necesita.</translation>
     </message>
 </context>
 <context>
@@ -1916,13 +2196,6 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::writeAll</name>
-    <message>
-        <source>The rows cannot be written (%1): see that the disk has room and that you may write there.</source>
-        <translation>No se pueden escribir las filas (%1): compruebe que hay sitio y que puede escribir allí.</translation>
-    </message>
-</context>
-<context>
     <name>platform::qt::Canvas</name>
     <message>
         <source>Tables and joins</source>
@@ -1946,6 +2219,17 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
         <source>key column</source>
         <translation>columna clave</translation>
     </message>
+    <message>
+        <source>comes out</source>
+        <translation>columna de salida</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::FieldTitles</name>
+    <message>
+        <source>Add field…</source>
+        <translation>Añadir campo…</translation>
+    </message>
 </context>
 <context>
     <name>platform::qt::GridModel</name>
@@ -1966,6 +2250,32 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>Back to the origin</source>
         <translation>Volver al origen</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::PaneHandle</name>
+    <message>
+        <source>Divider of canvas and grid</source>
+        <translation>Divisor entre el lienzo y la cuadrícula</translation>
+    </message>
+    <message>
+        <source>Drag to give the canvas or the grid more room</source>
+        <translation>Arrastre para dar más espacio al lienzo o a la cuadrícula</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::PickListWidget</name>
+    <message>
+        <source>Type to find a field</source>
+        <translation>Escriba para buscar un campo</translation>
+    </message>
+    <message>
+        <source>Field</source>
+        <translation>Campo</translation>
+    </message>
+    <message>
+        <source>Fields</source>
+        <translation>Campos</translation>
     </message>
 </context>
 </TS>

@@ -198,10 +198,6 @@
 <context>
     <name>ControlTexts</name>
     <message>
-        <source>Join Defintion</source>
-        <translation>Définition de la jointure</translation>
-    </message>
-    <message>
         <source>Left Table:</source>
         <translation>Table de gauche&#xa0;:</translation>
     </message>
@@ -246,34 +242,6 @@
         <translation>&amp;Annuler</translation>
     </message>
     <message>
-        <source>Show Join Definition</source>
-        <translation>Définir la jointure</translation>
-    </message>
-    <message>
-        <source>Delete Join</source>
-        <translation>Supprimer la jointure</translation>
-    </message>
-    <message>
-        <source>Copy Column</source>
-        <translation>Copier la colonne</translation>
-    </message>
-    <message>
-        <source>Create Join</source>
-        <translation>Créer une jointure</translation>
-    </message>
-    <message>
-        <source>Delete Table</source>
-        <translation>Supprimer la table</translation>
-    </message>
-    <message>
-        <source>Paste Column</source>
-        <translation>Coller la colonne</translation>
-    </message>
-    <message>
-        <source>Delete Coumn</source>
-        <translation>Supprimer la colonne</translation>
-    </message>
-    <message>
         <source>Field:</source>
         <translation>Champ&#xa0;:</translation>
     </message>
@@ -296,6 +264,38 @@
     <message>
         <source>Or:</source>
         <translation>Ou&#xa0;:</translation>
+    </message>
+    <message>
+        <source>Join Definition</source>
+        <translation>Définition de la jointure</translation>
+    </message>
+    <message>
+        <source>Show &amp;Join Definition</source>
+        <translation>Définir la &amp;jointure</translation>
+    </message>
+    <message>
+        <source>Delete Jo&amp;in</source>
+        <translation>Supprimer la jo&amp;inture</translation>
+    </message>
+    <message>
+        <source>&amp;Copy Column</source>
+        <translation>&amp;Copier la colonne</translation>
+    </message>
+    <message>
+        <source>C&amp;reate Join</source>
+        <translation>C&amp;réer une jointure</translation>
+    </message>
+    <message>
+        <source>Delete &amp;Table</source>
+        <translation>Supprimer la &amp;table</translation>
+    </message>
+    <message>
+        <source>&amp;Paste Column</source>
+        <translation>Co&amp;ller la colonne</translation>
+    </message>
+    <message>
+        <source>&amp;Delete Column</source>
+        <translation>&amp;Supprimer la colonne</translation>
     </message>
 </context>
 <context>
@@ -383,130 +383,6 @@
     <message>
         <source>%1: At character %2: %3.</source>
         <translation>%1&#xa0;: au caractère %2&#xa0;: %3.</translation>
-    </message>
-    <message>
-        <source>expected And, Or or the end</source>
-        <translation>And, Or ou la fin attendus</translation>
-    </message>
-    <message>
-        <source>expected less nesting, 100 levels are the most</source>
-        <translation>moins d’imbrications attendues, 100 niveaux au plus</translation>
-    </message>
-    <message>
-        <source>expected a closing %1</source>
-        <translation>%1 fermant attendu</translation>
-    </message>
-    <message>
-        <source>expected ( after In</source>
-        <translation>( attendue après In</translation>
-    </message>
-    <message>
-        <source>expected Null, a text that begins so needs quotes</source>
-        <translation>Null attendu, un texte qui commence ainsi doit être entre guillemets</translation>
-    </message>
-    <message>
-        <source>expected a comparison, Like works on columns that hold text</source>
-        <translation>une comparaison attendue, Like s’applique aux colonnes de texte</translation>
-    </message>
-    <message>
-        <source>expected a pattern, as in Like &apos;A*&apos;, not a column</source>
-        <translation>un motif attendu, comme dans Like &apos;A*&apos;, et non une colonne</translation>
-    </message>
-    <message>
-        <source>expected a pattern, as in Like &apos;A*&apos;</source>
-        <translation>un motif attendu, comme dans Like &apos;A*&apos;</translation>
-    </message>
-    <message>
-        <source>expected And and the upper value</source>
-        <translation>And et la valeur supérieure attendus</translation>
-    </message>
-    <message>
-        <source>expected a comma or a closing )</source>
-        <translation>une virgule ou ) attendue</translation>
-    </message>
-    <message>
-        <source>expected a value, write Is Null for a missing one or &apos;Null&apos; for the word</source>
-        <translation>une valeur attendue, écrivez Is Null si elle manque ou &apos;Null&apos; pour le mot</translation>
-    </message>
-    <message>
-        <source>expected the parameter&apos;s name</source>
-        <translation>le nom du paramètre attendu</translation>
-    </message>
-    <message>
-        <source>expected the column&apos;s name</source>
-        <translation>le nom de la colonne attendu</translation>
-    </message>
-    <message>
-        <source>expected a column of the query, there is no %1</source>
-        <translation>une colonne de la requête attendue, %1 n’existe pas</translation>
-    </message>
-    <message>
-        <source>expected a column of the query, the table that had this one was deleted</source>
-        <translation>une colonne de la requête attendue, la table qui contenait celle-ci a été supprimée</translation>
-    </message>
-    <message>
-        <source>expected the table too, as in %1, several tables have this column</source>
-        <translation>la table attendue aussi, comme dans %1, plusieurs tables ont cette colonne</translation>
-    </message>
-    <message>
-        <source>expected a column that holds %1</source>
-        <translation>une colonne de ce contenu attendue&#xa0;: %1</translation>
-    </message>
-    <message>
-        <source>expected the end, a criterion has at most 10000 characters</source>
-        <translation>la fin attendue, un critère compte au plus 10000 caractères</translation>
-    </message>
-    <message>
-        <source>expected a character, found the character zero</source>
-        <translation>un caractère attendu, le caractère zéro trouvé</translation>
-    </message>
-    <message>
-        <source>expected a character, found half of one</source>
-        <translation>un caractère attendu, un demi-caractère trouvé</translation>
-    </message>
-    <message>
-        <source>expected a [ before this ]</source>
-        <translation>un [ attendu avant ce ]</translation>
-    </message>
-    <message>
-        <source>expected an operator, write &lt;&gt; for unequal</source>
-        <translation>un opérateur attendu, écrivez &lt;&gt; pour différent</translation>
-    </message>
-    <message>
-        <source>expected a name between the brackets</source>
-        <translation>un nom attendu entre les crochets</translation>
-    </message>
-    <message>
-        <source>expected a text</source>
-        <translation>un texte attendu</translation>
-    </message>
-    <message>
-        <source>expected a number</source>
-        <translation>un nombre attendu</translation>
-    </message>
-    <message>
-        <source>expected a date (2024-12-31)</source>
-        <translation>date attendue (2024-12-31)</translation>
-    </message>
-    <message>
-        <source>expected a time (23:59)</source>
-        <translation>heure attendue (23:59)</translation>
-    </message>
-    <message>
-        <source>expected a date and time (2024-12-31 23:59)</source>
-        <translation>date et heure attendues (2024-12-31 23:59)</translation>
-    </message>
-    <message>
-        <source>expected true or false</source>
-        <translation>true ou false attendu</translation>
-    </message>
-    <message>
-        <source>expected Is Null, a column or a parameter</source>
-        <translation>Is Null, une colonne ou un paramètre attendu</translation>
-    </message>
-    <message>
-        <source>expected a value</source>
-        <translation>une valeur attendue</translation>
     </message>
     <message>
         <source>a text</source>
@@ -668,6 +544,218 @@
         <source>it is damaged or encrypted; choose another file</source>
         <translation>il est endommagé ou chiffré&#xa0;; choisissez un autre fichier</translation>
     </message>
+    <message>
+        <source>put And or Or between two conditions, or quotes around a text</source>
+        <translation>mettez And ou Or entre deux conditions, ou des guillemets autour d’un texte</translation>
+    </message>
+    <message>
+        <source>this is nested too deep, 100 levels are the most</source>
+        <translation>l’imbrication est trop profonde, 100 niveaux au plus</translation>
+    </message>
+    <message>
+        <source>a closing %1 is missing</source>
+        <translation>il manque un %1 fermant</translation>
+    </message>
+    <message>
+        <source>after In comes a list in parentheses, as in In (1, 2)</source>
+        <translation>après In, écrivez une liste entre parenthèses, comme dans In (1, 2)</translation>
+    </message>
+    <message>
+        <source>after Is comes Null or Not Null, and a text that begins so needs quotes</source>
+        <translation>après Is, écrivez Null ou Not Null, et mettez entre guillemets un texte qui commence ainsi</translation>
+    </message>
+    <message>
+        <source>Like works only on columns that hold text, use =, &lt; or &gt; here</source>
+        <translation>Like ne s’applique qu’aux colonnes de texte, utilisez ici =, &lt; ou &gt;</translation>
+    </message>
+    <message>
+        <source>after Like comes a pattern, as in Like &apos;A*&apos;, not a column</source>
+        <translation>après Like, écrivez un motif, comme dans Like &apos;A*&apos;, et non une colonne</translation>
+    </message>
+    <message>
+        <source>after Like comes a pattern, as in Like &apos;A*&apos;</source>
+        <translation>après Like, écrivez un motif, comme dans Like &apos;A*&apos;</translation>
+    </message>
+    <message>
+        <source>Between needs And and a second value, as in Between 1 And 5</source>
+        <translation>Between a besoin de And et d’une seconde valeur, comme dans Between 1 And 5</translation>
+    </message>
+    <message>
+        <source>a comma or a closing ) is missing</source>
+        <translation>il manque une virgule ou un ) fermant</translation>
+    </message>
+    <message>
+        <source>nothing is equal to Null, write Is Null for a missing value or &apos;Null&apos; for the word</source>
+        <translation>rien n’est égal à Null, écrivez Is Null pour une valeur manquante ou &apos;Null&apos; pour le mot</translation>
+    </message>
+    <message>
+        <source>a parameter needs a name, as in :year</source>
+        <translation>un paramètre a besoin d’un nom, comme dans :an</translation>
+    </message>
+    <message>
+        <source>the name of a column is missing behind the point</source>
+        <translation>il manque le nom d’une colonne après le point</translation>
+    </message>
+    <message>
+        <source>the query has no column %1</source>
+        <translation>la requête n’a pas de colonne %1</translation>
+    </message>
+    <message>
+        <source>the table of this column was deleted from the query</source>
+        <translation>la table de cette colonne a été supprimée de la requête</translation>
+    </message>
+    <message>
+        <source>several tables have this column, write the table too, as in %1</source>
+        <translation>plusieurs tables ont cette colonne, écrivez aussi la table, comme dans %1</translation>
+    </message>
+    <message>
+        <source>compare it with a column that holds %1</source>
+        <translation>comparez avec une colonne qui contient %1</translation>
+    </message>
+    <message>
+        <source>a criterion has at most 10000 characters</source>
+        <translation>un critère compte au plus 10000 caractères</translation>
+    </message>
+    <message>
+        <source>the character zero cannot stand in a criterion</source>
+        <translation>le caractère zéro ne peut pas figurer dans un critère</translation>
+    </message>
+    <message>
+        <source>half a character stands here, type it afresh</source>
+        <translation>il y a ici un demi-caractère, saisissez-le à nouveau</translation>
+    </message>
+    <message>
+        <source>a [ before this ] is missing</source>
+        <translation>il manque un [ avant ce ]</translation>
+    </message>
+    <message>
+        <source>write &lt;&gt; for unequal</source>
+        <translation>écrivez &lt;&gt; pour différent</translation>
+    </message>
+    <message>
+        <source>a name is missing between the brackets</source>
+        <translation>il manque un nom entre les crochets</translation>
+    </message>
+    <message>
+        <source>a text is missing</source>
+        <translation>il manque un texte</translation>
+    </message>
+    <message>
+        <source>a number is missing</source>
+        <translation>il manque un nombre</translation>
+    </message>
+    <message>
+        <source>a date (2024-12-31) is missing</source>
+        <translation>il manque une date (2024-12-31)</translation>
+    </message>
+    <message>
+        <source>a time (23:59) is missing</source>
+        <translation>il manque une heure (23:59)</translation>
+    </message>
+    <message>
+        <source>a date and time (2024-12-31 23:59) is missing</source>
+        <translation>il manque une date et une heure (2024-12-31 23:59)</translation>
+    </message>
+    <message>
+        <source>true or false is missing</source>
+        <translation>il manque true ou false</translation>
+    </message>
+    <message>
+        <source>Is Null, a column or a parameter is missing</source>
+        <translation>il manque Is Null, une colonne ou un paramètre</translation>
+    </message>
+    <message>
+        <source>a value is missing</source>
+        <translation>il manque une valeur</translation>
+    </message>
+    <message>
+        <source>this is no number, write it like 12 or 1.5</source>
+        <translation>ce n’est pas un nombre, écrivez-le comme 12 ou 1.5</translation>
+    </message>
+    <message>
+        <source>decimals are written with a point, as in 1.5</source>
+        <translation>les décimales s’écrivent avec un point, comme dans 1.5</translation>
+    </message>
+    <message>
+        <source>this is no date, write it like 2024-12-31</source>
+        <translation>ce n’est pas une date, écrivez-la comme 2024-12-31</translation>
+    </message>
+    <message>
+        <source>this is no time, write it like 23:59</source>
+        <translation>ce n’est pas une heure, écrivez-la comme 23:59</translation>
+    </message>
+    <message>
+        <source>this is no date and time, write it like 2024-12-31 23:59</source>
+        <translation>ce n’est pas une date avec une heure, écrivez-les comme 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>write true or false here</source>
+        <translation>écrivez ici true ou false</translation>
+    </message>
+    <message>
+        <source>only Is Null, a column or a parameter can stand here</source>
+        <translation>n’écrivez ici que Is Null, une colonne ou un paramètre</translation>
+    </message>
+    <message>
+        <source>only dates and times stand between two #</source>
+        <translation>n’écrivez entre deux # que des dates et des heures</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is not a file; choose another name.</source>
+        <translation>«&#xa0;%1&#xa0;» n’est pas un fichier&#xa0;; choisissez un autre nom.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is not a file; choose a query file.</source>
+        <translation>«&#xa0;%1&#xa0;» n’est pas un fichier&#xa0;; choisissez un fichier de requête.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is write-protected; save under another name.</source>
+        <translation>Le fichier «&#xa0;%1&#xa0;» est protégé en écriture&#xa0;; enregistrez sous un autre nom.</translation>
+    </message>
+    <message>
+        <source>%1 (%2); %3.</source>
+        <translation>%1 (%2)&#xa0;; %3.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be saved</source>
+        <translation>Le fichier «&#xa0;%1&#xa0;» ne peut pas être enregistré</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read</source>
+        <translation>Le fichier «&#xa0;%1&#xa0;» ne peut pas être lu</translation>
+    </message>
+    <message>
+        <source>The output cannot be written</source>
+        <translation>La sortie ne peut pas être écrite</translation>
+    </message>
+    <message>
+        <source>The rows cannot be written</source>
+        <translation>Les lignes ne peuvent pas être écrites</translation>
+    </message>
+    <message>
+        <source>check the path</source>
+        <translation>vérifiez le chemin</translation>
+    </message>
+    <message>
+        <source>ask the owner for permission, or choose another folder</source>
+        <translation>demandez l’autorisation au propriétaire, ou choisissez un autre dossier</translation>
+    </message>
+    <message>
+        <source>make room on the disk, or choose another one</source>
+        <translation>faites de la place sur le disque, ou choisissez-en un autre</translation>
+    </message>
+    <message>
+        <source>choose another disk</source>
+        <translation>choisissez un autre disque</translation>
+    </message>
+    <message>
+        <source>choose a folder on another disk</source>
+        <translation>choisissez un dossier sur un autre disque</translation>
+    </message>
+    <message>
+        <source>try again, or choose another folder</source>
+        <translation>réessayez, ou choisissez un autre dossier</translation>
+    </message>
 </context>
 <context>
     <name>QObject</name>
@@ -686,6 +774,27 @@
         <source>Query designer</source>
         <translation>Éditeur de requêtes</translation>
     </message>
+    <message>
+        <source>all</source>
+        <comment>the rows of a table, at the end of a line</comment>
+        <translation>toutes</translation>
+    </message>
+    <message>
+        <source>the rows of %1 and %2 that match</source>
+        <translation>les lignes de %1 et de %2 qui correspondent</translation>
+    </message>
+    <message>
+        <source>all rows of %1, and those of %2 that match</source>
+        <translation>toutes les lignes de %1, et celles de %2 qui correspondent</translation>
+    </message>
+    <message>
+        <source>all rows of %1 and of %2, side by side where they match</source>
+        <translation>toutes les lignes de %1 et de %2, côte à côte là où elles correspondent</translation>
+    </message>
+    <message>
+        <source>Re&amp;name…</source>
+        <translation>Re&amp;nommer…</translation>
+    </message>
 </context>
 <context>
     <name>designer</name>
@@ -696,10 +805,6 @@
     <message>
         <source>A picture ends in .png, .svg or .pdf; &quot;%1&quot; does not.</source>
         <translation>Une image se termine par .png, .svg ou .pdf&#xa0;; ce n’est pas le cas de «&#xa0;%1&#xa0;».</translation>
-    </message>
-    <message>
-        <source>The picture &quot;%1&quot; cannot be written; check the folder and your permissions.</source>
-        <translation>L’image «&#xa0;%1&#xa0;» ne peut pas être écrite&#xa0;; vérifiez le dossier et vos droits.</translation>
     </message>
     <message>
         <source>The printer cannot be reached; choose another one.</source>
@@ -722,19 +827,22 @@
         <translation>Ces tables ont %1 jointures, la zone de dessin en accepte %2&#xa0;; choisissez moins de tables avec --tables.</translation>
     </message>
     <message>
-        <source>%1 of %2 tables; choose others in the panel &quot;Tables&quot;</source>
-        <translation>%1 tables sur %2&#xa0;; choisissez-en d’autres dans le panneau «&#xa0;Tables&#xa0;»</translation>
+        <source>The drawing is too large for &quot;%1&quot;; choose a name that ends in .svg.</source>
+        <translation>Le dessin est trop grand pour «&#xa0;%1&#xa0;»&#xa0;; choisissez un nom qui se termine par .svg.</translation>
     </message>
 </context>
 <context>
     <name>designer::Autosave</name>
     <message>
-        <source>the folder %1 cannot be written</source>
-        <translation>impossible d’écrire dans le dossier %1</translation>
+        <source>The changes cannot be kept safe in &quot;%1&quot; (%2); save the query yourself.</source>
+        <translation>Les modifications ne peuvent pas être mises en sûreté dans «&#xa0;%1&#xa0;» (%2)&#xa0;; enregistrez vous-même la requête.</translation>
     </message>
+</context>
+<context>
+    <name>designer::Banner</name>
     <message>
-        <source>The query could not be saved for a recovery (%1); save it yourself.</source>
-        <translation>La requête n’a pas pu être sauvegardée pour une récupération (%1)&#xa0;; enregistrez-la vous-même.</translation>
+        <source>Close</source>
+        <translation>Fermer</translation>
     </message>
 </context>
 <context>
@@ -751,12 +859,20 @@
         <translation>&amp;Reconnecter</translation>
     </message>
     <message>
-        <source>Close</source>
-        <translation>Fermer</translation>
-    </message>
-    <message>
         <source>The connection to %1 is lost. Your query is kept.</source>
         <translation>La connexion à %1 est perdue. Votre requête est conservée.</translation>
+    </message>
+    <message>
+        <source>The file of %1 is no longer there. Your query is kept.</source>
+        <translation>Le fichier de %1 n’existe plus. Votre requête est conservée.</translation>
+    </message>
+    <message>
+        <source>%1 has been replaced by another file since it was opened.</source>
+        <translation>Un autre fichier a pris la place de %1 depuis son ouverture.</translation>
+    </message>
+    <message>
+        <source>The tables of %1 have been changed by another program.</source>
+        <translation>Les tables de %1 ont été modifiées par un autre programme.</translation>
     </message>
 </context>
 <context>
@@ -879,6 +995,10 @@
     <message>
         <source>Reco&amp;nnect</source>
         <translation>Reco&amp;nnecter</translation>
+    </message>
+    <message>
+        <source>&amp;Try again</source>
+        <translation>&amp;Réessayer</translation>
     </message>
 </context>
 <context>
@@ -1015,6 +1135,26 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <source>&amp;Events</source>
         <translation>&amp;Événements</translation>
     </message>
+    <message>
+        <source>&amp;Go to</source>
+        <translation>&amp;Aller à</translation>
+    </message>
+    <message>
+        <source>&amp;Drawing</source>
+        <translation>&amp;Dessin</translation>
+    </message>
+    <message>
+        <source>&amp;Criteria</source>
+        <translation>&amp;Critères</translation>
+    </message>
+    <message>
+        <source>&amp;Keys</source>
+        <translation>&amp;Touches</translation>
+    </message>
+    <message>
+        <source>&amp;Try again</source>
+        <translation>Réessa&amp;yer</translation>
+    </message>
 </context>
 <context>
     <name>designer::Document</name>
@@ -1115,12 +1255,53 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <source>Changes that are not saved are lost.</source>
         <translation>Les modifications non enregistrées seront perdues.</translation>
     </message>
-</context>
-<context>
-    <name>designer::FileExport</name>
     <message>
-        <source>The file &quot;%1&quot; cannot be written (%2): check the folder and your permissions.</source>
-        <translation>Le fichier «&#xa0;%1&#xa0;» ne peut pas être écrit (%2)&#xa0;: vérifiez le dossier et vos droits.</translation>
+        <source>To save your query overwrites these changes.</source>
+        <translation>Enregistrer votre requête écrase ces modifications.</translation>
+    </message>
+    <message>
+        <source>&amp;Overwrite them</source>
+        <translation>&amp;Les écraser</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; is no longer there; save the query to have one.</source>
+        <translation>Le fichier «&#xa0;%1&#xa0;» n’existe plus&#xa0;; enregistrez la requête pour en avoir un.</translation>
+    </message>
+    <message>
+        <source>To load it gives up your own changes.</source>
+        <translation>Le charger abandonne vos propres modifications.</translation>
+    </message>
+    <message>
+        <source>You have not changed it since.</source>
+        <translation>Vous ne l’avez pas modifié depuis.</translation>
+    </message>
+    <message>
+        <source>&amp;Keep mine</source>
+        <translation>&amp;Garder ma version</translation>
+    </message>
+    <message>
+        <source>&amp;Decide later</source>
+        <translation>&amp;Décider plus tard</translation>
+    </message>
+    <message>
+        <source>Changed file</source>
+        <translation>Fichier modifié</translation>
+    </message>
+    <message>
+        <source>Another program has changed &quot;%1&quot; since you opened it.</source>
+        <translation>Un autre programme a modifié «&#xa0;%1&#xa0;» depuis que vous l’avez ouvert.</translation>
+    </message>
+    <message>
+        <source>&amp;Load the file</source>
+        <translation>&amp;Charger le fichier</translation>
+    </message>
+    <message>
+        <source>Save &amp;as…</source>
+        <translation>Enregistrer &amp;sous…</translation>
     </message>
 </context>
 <context>
@@ -1139,6 +1320,25 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
+    <name>designer::HelpWindow</name>
+    <message>
+        <source>Help</source>
+        <translation>Aide</translation>
+    </message>
+    <message>
+        <source>&amp;Criteria</source>
+        <translation>&amp;Critères</translation>
+    </message>
+    <message>
+        <source>&amp;Keys</source>
+        <translation>&amp;Touches</translation>
+    </message>
+    <message>
+        <source>Find on this page</source>
+        <translation>Chercher dans cette page</translation>
+    </message>
+</context>
+<context>
     <name>designer::Invitation</name>
     <message>
         <source>Drag a table here from the list of tables, or double-click it there.
@@ -1149,6 +1349,13 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
         <translation>Ouvrez une base de données pour commencer : voir le menu « Base de données ».</translation>
+    </message>
+</context>
+<context>
+    <name>designer::MissingTables</name>
+    <message>
+        <source>There is no table &quot;%1&quot; in %2.</source>
+        <translation>Il n’y a pas de table «&#xa0;%1&#xa0;» dans %2.</translation>
     </message>
 </context>
 <context>
@@ -1348,12 +1555,38 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
         <source>(blob, %1 bytes)</source>
         <translation>(blob, %1 octets)</translation>
     </message>
+    <message>
+        <source>%1
+Click to sort the rows that are shown; the query stays as it is.</source>
+        <translation>%1
+Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.</translation>
+    </message>
 </context>
 <context>
     <name>designer::ResultTable</name>
     <message>
         <source>&amp;Copy</source>
         <translation>&amp;Copier</translation>
+    </message>
+    <message>
+        <source>Copy &amp;with all columns</source>
+        <translation>Copier a&amp;vec toutes les colonnes</translation>
+    </message>
+    <message>
+        <source>Select c&amp;olumn</source>
+        <translation>Sélectionner la c&amp;olonne</translation>
+    </message>
+    <message>
+        <source>Sort &amp;ascending</source>
+        <translation>Trier en ordre c&amp;roissant</translation>
+    </message>
+    <message>
+        <source>Sort &amp;descending</source>
+        <translation>Trier en ordre &amp;décroissant</translation>
+    </message>
+    <message>
+        <source>As the &amp;query gives them</source>
+        <translation>Comme la re&amp;quête les donne</translation>
     </message>
 </context>
 <context>
@@ -1435,10 +1668,6 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
         <translation>Exécutez la requête pour voir ses lignes ici.</translation>
     </message>
     <message>
-        <source>%1 · the drawing has changed since</source>
-        <translation>%1 · le dessin a changé depuis</translation>
-    </message>
-    <message>
         <source>%1 s</source>
         <translation>%1 s</translation>
     </message>
@@ -1453,10 +1682,6 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>&amp;Cancel</source>
         <translation>&amp;Annuler</translation>
-    </message>
-    <message>
-        <source>Stop what is running, on the database too</source>
-        <translation>Arrêter ce qui est en cours, sur la base de données aussi</translation>
     </message>
     <message>
         <source>Run the query and write all its rows into a CSV file</source>
@@ -1485,6 +1710,38 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>Export…</source>
         <translation>Exporter…</translation>
+    </message>
+    <message>
+        <source>rows.csv</source>
+        <translation>lignes.csv</translation>
+    </message>
+    <message>
+        <source>the rows can be sorted when all of them have come</source>
+        <translation>les lignes pourront être triées quand elles seront toutes arrivées</translation>
+    </message>
+    <message>
+        <source>these are too many rows to sort here; use the row &quot;Sort:&quot; of the drawing</source>
+        <translation>ces lignes sont trop nombreuses pour être triées ici&#xa0;; utilisez la ligne «&#xa0;Tri&#xa0;:&#xa0;» du dessin</translation>
+    </message>
+    <message>
+        <source>Sorting the rows…</source>
+        <translation>Tri des lignes…</translation>
+    </message>
+    <message>
+        <source>these rows are sorted by %1 here, the query is not</source>
+        <translation>ces lignes sont triées ici selon %1, la requête ne l’est pas</translation>
+    </message>
+    <message>
+        <source>these rows are sorted by %1 descending here, the query is not</source>
+        <translation>ces lignes sont triées ici selon %1 en ordre décroissant, la requête ne l’est pas</translation>
+    </message>
+    <message>
+        <source>the drawing has changed since</source>
+        <translation>le dessin a changé depuis</translation>
+    </message>
+    <message>
+        <source>Stop what is running, on the database too (Esc)</source>
+        <translation>Arrêter ce qui est en cours, sur la base de données aussi (Échap)</translation>
     </message>
 </context>
 <context>
@@ -1524,6 +1781,14 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>Print</source>
         <translation>Imprimer</translation>
+    </message>
+    <message>
+        <source>Pictures &amp;with all columns</source>
+        <translation>Images &amp;avec toutes les colonnes</translation>
+    </message>
+    <message>
+        <source>drawing.png</source>
+        <translation>dessin.png</translation>
     </message>
 </context>
 <context>
@@ -1729,6 +1994,17 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
         <source>Change column %1</source>
         <translation>Modifier la colonne %1</translation>
     </message>
+    <message>
+        <source>Move column %1</source>
+        <translation>Déplacer la colonne %1</translation>
+    </message>
+    <message numerus="yes">
+        <source>Move %n column(s)</source>
+        <translation>
+            <numerusform>Déplacer %n colonne</numerusform>
+            <numerusform>Déplacer %n colonnes</numerusform>
+        </translation>
+    </message>
 </context>
 <context>
     <name>designer::TableAdding</name>
@@ -1759,6 +2035,10 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>The drawing takes %1 joins, and with this there would be %2; delete tables or joins first.</source>
         <translation>Le dessin accepte %1 jointures, et il y en aurait %2&#xa0;; supprimez d’abord des tables ou des jointures.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 are joined by %3. Not joined by %4: draw those yourself if you need them.</source>
+        <translation>%1 et %2 sont reliées par %3, mais pas par %4&#xa0;: dessinez vous-même ces jointures si vous en avez besoin.</translation>
     </message>
 </context>
 <context>
@@ -1916,13 +2196,6 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::writeAll</name>
-    <message>
-        <source>The rows cannot be written (%1): see that the disk has room and that you may write there.</source>
-        <translation>Les lignes ne peuvent pas être écrites (%1)&#xa0;: vérifiez qu’il y a de la place et que vous pouvez y écrire.</translation>
-    </message>
-</context>
-<context>
     <name>platform::qt::Canvas</name>
     <message>
         <source>Tables and joins</source>
@@ -1946,6 +2219,17 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
         <source>key column</source>
         <translation>colonne clé</translation>
     </message>
+    <message>
+        <source>comes out</source>
+        <translation>colonne de sortie</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::FieldTitles</name>
+    <message>
+        <source>Add field…</source>
+        <translation>Ajouter un champ…</translation>
+    </message>
 </context>
 <context>
     <name>platform::qt::GridModel</name>
@@ -1966,6 +2250,32 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>Back to the origin</source>
         <translation>Retour à l’origine</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::PaneHandle</name>
+    <message>
+        <source>Divider of canvas and grid</source>
+        <translation>Séparateur entre la zone de dessin et la grille</translation>
+    </message>
+    <message>
+        <source>Drag to give the canvas or the grid more room</source>
+        <translation>Faites glisser pour donner plus de place à la zone de dessin ou à la grille</translation>
+    </message>
+</context>
+<context>
+    <name>platform::qt::PickListWidget</name>
+    <message>
+        <source>Type to find a field</source>
+        <translation>Tapez pour trouver un champ</translation>
+    </message>
+    <message>
+        <source>Field</source>
+        <translation>Champ</translation>
+    </message>
+    <message>
+        <source>Fields</source>
+        <translation>Champs</translation>
     </message>
 </context>
 </TS>

@@ -103,8 +103,9 @@ void User::doubleClickEntry(const std::string& name, std::int32_t entry) {
     pressEntry(name, entry, leftButton);
     releaseEntry(name, entry, leftButton);
     pressEntry(name, entry, leftButton);
-    mToolkit.comforts.entryDoubleClicked(reachEntry(name, entry).index, entry);
-    if (mToolkit.exists(name)) releaseEntry(name, entry, leftButton);
+    releaseEntry(name, entry, leftButton);
+    if (mToolkit.exists(name))
+        mToolkit.comforts.entryDoubleClicked(reachEntry(name, entry).index, entry);
 }
 
 void User::leaveDragTarget() {

@@ -66,7 +66,7 @@ void ColumnListView::selectFor(const QMouseEvent& event, const QModelIndex& inde
     const bool left = event.button() == Qt::LeftButton;
     const bool plain = event.modifiers() == Qt::NoModifier;
     mPressed = index;
-    mClickPending = QPersistentModelIndex();
+    mClickPending = mDoubleClicked = QPersistentModelIndex();
     if (left && plain && selectionModel()->isSelected(index)) mClickPending = index;
     if (!left && !index.isValid()) return;
     // Of the buttons, the left one alone extends.
@@ -99,6 +99,7 @@ void ColumnListView::mousePressEvent(QMouseEvent* event) {
 
 void ColumnListView::mouseMoveEvent(QMouseEvent* event) {
     if (!mListener || !mPressed.isValid() || event->buttons() == Qt::NoButton) return;
+    mDoubleClicked = QPersistentModelIndex(); // a drag that follows a click closely
     mListener->entryMoved(mPressed.row(), buttonState(event->buttons()),
                           shiftState(event->modifiers()));
 }
@@ -107,20 +108,22 @@ void ColumnListView::mouseReleaseEvent(QMouseEvent* event) {
     const QPointer<ColumnListView> alive = this;
     const QPersistentModelIndex index = indexAt(event->position().toPoint());
     const bool again = event->button() == Qt::LeftButton && mClickPending == index;
-    mPressed = mClickPending = QPersistentModelIndex();
+    const bool doubleClicked = event->button() == Qt::LeftButton && mDoubleClicked == index;
+    mPressed = mClickPending = mDoubleClicked = QPersistentModelIndex();
     if (again && index.isValid()) selectAlone(index);
     if (alive && mListener && index.isValid())
         mListener->entryReleased(index.row(), buttonState(event->button()),
                                  shiftState(event->modifiers()));
+    if (alive && mListener && index.isValid() && doubleClicked)
+        mListener->entryDoubleClicked(index.row());
 }
 
 void ColumnListView::mouseDoubleClickEvent(QMouseEvent* event) {
     const QPointer<ColumnListView> alive = this;
     mousePressEvent(event);
     if (!alive) return;
-    const QModelIndex index = indexAt(event->position().toPoint());
-    if (mListener && index.isValid() && event->button() == Qt::LeftButton)
-        mListener->entryDoubleClicked(index.row());
+    // Until the button comes up it may still become a drag.
+    if (event->button() == Qt::LeftButton) mDoubleClicked = indexAt(event->position().toPoint());
 }
 
 void ColumnListView::keyPressEvent(QKeyEvent* event) {

@@ -14,7 +14,7 @@ public:
     /// The mouse moves with a button held; told is the entry that was pressed, wherever it is now.
     virtual void entryMoved(int row, std::int16_t buttons, std::int16_t shift) = 0;
     virtual void entryReleased(int row, std::int16_t button, std::int16_t shift) = 0;
-    /// After the press that makes the click a double one; or by Enter.
+    /// When the button has come up from a double click; or by Enter.
     virtual void entryDoubleClicked(int row) = 0;
     /// The selection has changed otherwise than by a press on an entry.
     virtual void selectionChanged() = 0;
@@ -56,6 +56,7 @@ private:
 
     EntryListener* mListener = nullptr;
     QPersistentModelIndex mPressed;
+    QPersistentModelIndex mDoubleClicked;
     QPersistentModelIndex mClickPending; ///< to be selected alone when the button comes up
     int mRowHeight = 0;
     int mInset = 0; ///< of the entries, by a style sheet

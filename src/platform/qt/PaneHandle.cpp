@@ -9,6 +9,7 @@
 namespace platform::qt {
 
 PaneHandle::PaneHandle(QWidget* parent) : QWidget(parent) {
+    setObjectName(QStringLiteral("paneHandle"));
     setFocusPolicy(Qt::ClickFocus);
     setCursor(Qt::SplitVCursor);
     setAttribute(Qt::WA_OpaquePaintEvent);

@@ -30,7 +30,8 @@ protected:
 
     bool isInView(const platform::Ref<model::Table>& table) {
         ZandorWidget& control = area->control();
-        const QRect seen(control.VisibleFrameLeft(), control.VisibleFrameTop(), 800 * 15, 300 * 15);
+        const int height = static_cast<int>(600 * 15 * control.upperPaneShare());
+        const QRect seen(control.VisibleFrameLeft(), control.VisibleFrameTop(), 800 * 15, height);
         return seen.contains(QRect(table->Left(), table->Top(), table->Width(), table->Height()));
     }
 

@@ -90,13 +90,11 @@ TEST_F(TheStatementPanel, IsMadeOnceForManyChanges) {
     EXPECT_EQ(times, 1);
 }
 
-TEST_F(TheStatementPanel, WaitsUntilItCanBeSeen) {
+TEST_F(TheStatementPanel, WorksWhileItCannotBeSeenForCellsShowWhatItFinds) {
     panel.hide();
     drawn.table(u"orders");
     drawn.finish();
     QCoreApplication::processEvents();
-    EXPECT_EQ(text(), "");
-    panel.show();
     EXPECT_THAT(text(), HasSubstr("FROM orders"));
 }
 
