@@ -133,8 +133,7 @@ QString Host::currentCell() const {
     const auto* grid = dynamic_cast<platform::qt::GridWidget*>(
         mControl ? mControl->findChild<QWidget*>(QStringLiteral("sprColumn")) : nullptr);
     if (!grid) return {};
-    const QModelIndex current = grid->view().currentIndex();
-    return numbers(current.row() + 1, current.column() + 1);
+    return numbers(grid->currentRow(), grid->currentCol());
 }
 
 bool Host::isFocused(const QString& name) {
