@@ -53,8 +53,8 @@ bool Zandor::DrawJoin(clsJoinLine& JoinLine) {
     return result;
 }
 
-// Nothing on this way reaches the host, the hook included, so it holds nothing: it runs for each join
-// of a table at each step of its move.
+// Nothing on this way reaches the host, the hook included, so it holds nothing: it runs for each
+// join of a table at each step of its move.
 void Zandor::PlaceJoin(const clsJoinLine& JoinLine) {
     Ref<Tabulet> leftTable, rightTable;
     Ref<ColumnItem> leftItem, rightItem;
