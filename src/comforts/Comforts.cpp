@@ -65,8 +65,9 @@ void Comforts::bound(Door& door) {
     // Another query has the same key numbers for other columns.
     if (door.hasAnotherModel()) mWidths.clear();
     door.markOutput(mFlags.MarksOutput);
-    fitAll(door);
     markFindings(door);
+    if (mFlags.FitsColumns) readWidths(door);
+    fitAll(door);
 }
 
 void Comforts::raised(TalvikDBxZandor::Event event,

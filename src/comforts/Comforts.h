@@ -146,6 +146,9 @@ private:
     float fitting(Door& door, std::int32_t column) const;
     void fit(Door& door, std::int32_t column);
     void fitAll(Door& door);
+    void resize(Door& door, std::int32_t column, std::int32_t width);
+    void keep(std::int32_t keyNumber, std::int32_t width);
+    void readWidths(Door& door);
     void markFindings(Door& door);
     static bool goOn(Door& door, std::int32_t rows, std::int32_t columns, bool edits);
 

@@ -94,7 +94,30 @@ void Door::changeField(std::int32_t column, const Field& field) {
     if (now == 0) return;
     control().sprColumn->TextMatrix(row::field, now, field.name);
     control().FitColumn(now, field.name);
-    control().Raise(Event::ColumnModified, {.Definition = definition});
+    tellModified(definition);
+}
+
+TalvikDBxZandor::Held<TalvikZandorLib::SizedDefinition>
+Door::sizedDefinitionOf(std::int32_t column) {
+    const Ref<TalvikZandorLib::ZDColumnDefinition> definition = definitionOf(column);
+    const Ref<TalvikZandorLib::SizedDefinition> sized =
+        std::dynamic_pointer_cast<TalvikZandorLib::SizedDefinition>(definition);
+    return control().Hold(sized);
+}
+
+std::optional<std::int32_t> Door::storedWidth(std::int32_t column) {
+    const auto sized = sizedDefinitionOf(column);
+    if (!sized) return {};
+    return sized->Width();
+}
+
+TalvikDBxZandor::Held<TalvikZandorLib::ZDColumnDefinition> Door::storeWidth(std::int32_t column,
+                                                                            std::int32_t width) {
+    const auto definition = definitionOf(column);
+    const auto sized = sizedDefinitionOf(column);
+    if (!sized || sized->Width() == width) return {};
+    sized->Width(width);
+    return definition;
 }
 
 platform::Ref<TalvikZandorLib::ZDTable> Door::tableOf(const TalvikTabulet::Tabulet& element) {

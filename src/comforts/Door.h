@@ -74,6 +74,16 @@ public:
     void setWidth(std::int32_t column, float width) {
         control().sprColumn->ColWidth(column, width);
     }
+    /// As SizedDefinition has it; nothing where the column's definition keeps no width.
+    std::optional<std::int32_t> storedWidth(std::int32_t column);
+    /// Has the column's definition keep another width. Returns the definition when that is news to
+    /// it.
+    TalvikDBxZandor::Held<TalvikZandorLib::ZDColumnDefinition> storeWidth(std::int32_t column,
+                                                                          std::int32_t width);
+    void
+    tellModified(const TalvikDBxZandor::Held<TalvikZandorLib::ZDColumnDefinition>& definition) {
+        control().Raise(TalvikDBxZandor::Event::ColumnModified, {.Definition = definition});
+    }
     /// Gives a column's definition another field, unless it has that already.
     void changeField(std::int32_t column, const Field& field);
     /// Marks the entries whose columns come out in the rows, or none.
@@ -126,6 +136,7 @@ public:
     void set(Editor editor);
 
 private:
+    TalvikDBxZandor::Held<TalvikZandorLib::SizedDefinition> sizedDefinitionOf(std::int32_t column);
     /// The elements on the canvas and their slots; held, for a host may unload them meanwhile.
     std::vector<std::pair<std::int16_t, Ref<TalvikTabulet::Tabulet>>> tables() const;
 

@@ -1,5 +1,6 @@
 #include "comforts/Comforts.h"
 #include "comforts/Door.h"
+#include "platform/Numbers.h"
 
 #include <algorithm>
 
@@ -12,6 +13,9 @@ namespace {
 constexpr float narrowest = 1200; // twips; below it "Descending" would be cut
 constexpr float widest = 4500;
 constexpr float besideText = 300; // the margins of a cell
+// A border that somebody drags stays within reach.
+constexpr float narrowestByHand = 300;
+constexpr auto widestByHand = static_cast<float>(TalvikZandorLib::SizedDefinition::greatestWidth);
 
 } // namespace
 
@@ -44,7 +48,8 @@ bool Comforts::currentColumnMoved(std::int32_t step) {
 bool Comforts::borderDragged(std::int32_t column, float width) {
     if (!mFlags.FitsColumns) return false;
     return act(u"borderDragged", [&](Door& door) {
-        if (door.isUsed(column)) mWidths[door.grid().ColData(column)] = width;
+        const float kept = std::clamp(width, narrowestByHand, widestByHand);
+        if (door.isUsed(column)) resize(door, column, platform::toLong(kept));
         return true;
     });
 }
@@ -52,10 +57,42 @@ bool Comforts::borderDragged(std::int32_t column, float width) {
 bool Comforts::borderDoubleClicked(std::int32_t column) {
     if (!mFlags.FitsColumns) return false;
     return act(u"borderDoubleClicked", [&](Door& door) {
-        mWidths.erase(door.grid().ColData(column));
-        door.setWidth(column, fitting(door, column));
+        if (door.isUsed(column))
+            resize(door, column, 0);
+        else
+            door.setWidth(column, fitting(door, column));
         return true;
     });
+}
+
+/// Gives a column a width, 0 for that of what it holds, and has it kept.
+void Comforts::resize(Door& door, std::int32_t column, std::int32_t width) {
+    const std::int32_t number = door.grid().ColData(column);
+    // As it was, should the model refuse.
+    fit(door, column);
+    const auto model = door.model();
+    const auto changed = door.storeWidth(column, width);
+    TalvikDBxZandor::require(door.model() == model);
+    keep(number, width);
+    if (const std::int32_t now = door.columnWith(number, column); now > 0) fit(door, now);
+    if (changed) door.tellModified(changed);
+}
+
+void Comforts::keep(std::int32_t keyNumber, std::int32_t width) {
+    if (width > 0)
+        mWidths[keyNumber] = std::min(static_cast<float>(width), widestByHand);
+    else
+        mWidths.erase(keyNumber);
+}
+
+/// Where definitions keep the widths of their columns, theirs are those that hold.
+void Comforts::readWidths(Door& door) {
+    for (std::int32_t column = door.lastColumn(); column > 0; --column) {
+        const std::int32_t number = door.grid().ColData(column);
+        const auto width = door.storedWidth(column);
+        TalvikDBxZandor::require(door.grid().ColData(column) == number);
+        if (width) keep(number, *width);
+    }
 }
 
 /// As wide as its widest text, within limits.

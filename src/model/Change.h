@@ -46,6 +46,7 @@ struct DefinitionState {
     String synonym = {};
     std::int16_t sortOrder = 0;
     bool visible = true;
+    std::int32_t width = 0;
     std::vector<CriterionState> criteria = {}; ///< in the order of their rows
 
     friend bool operator==(const DefinitionState&, const DefinitionState&) = default;
@@ -62,8 +63,8 @@ struct ListChange {
         State before;
         State after;
     };
-    std::vector<Placed> gone = {}; ///< by position in the list before
-    std::vector<Placed> come = {}; ///< by position in the list after
+    std::vector<Placed> gone = {};  ///< by position in the list before
+    std::vector<Placed> come = {};  ///< by position in the list after
     std::vector<Pair> changed = {}; ///< in the order of the list
 
     bool empty() const { return gone.empty() && come.empty() && changed.empty(); }

@@ -23,4 +23,9 @@ void ColumnDefinition::SortOrder(std::int16_t value) {
     mSortOrder = value;
 }
 
+void ColumnDefinition::Width(std::int32_t value) {
+    if (value < 0 || value > greatestWidth) throw platform::errors::invalidPropertyValue();
+    mWidth = value;
+}
+
 } // namespace model

@@ -9,7 +9,8 @@ class Query;
 
 /// One output column. It names its column by key, which reads as nothing once the table was
 /// deleted or the query is gone.
-class ColumnDefinition final : public TalvikZandorLib::ZDColumnDefinition {
+class ColumnDefinition final : public TalvikZandorLib::ZDColumnDefinition,
+                               public TalvikZandorLib::SizedDefinition {
 public:
     /// The column under its name in the grid, "table.column" (see FieldColumn); place() leads to
     /// the column itself.
@@ -25,6 +26,9 @@ public:
     void SortOrder(std::int16_t value) override;
     bool Visible() const override { return mVisible; }
     void Visible(bool value) override { mVisible = value; }
+    std::int32_t Width() const override { return mWidth; }
+    /// Error 380 outside 0 to greatestWidth.
+    void Width(std::int32_t value) override;
     /// Empty until the definition was added to a query; then "x" and a number, kept for good.
     String Key() const override { return mKey; }
     class Criteria& Criteria() override {
@@ -47,6 +51,7 @@ private:
     Revised<String> mSynonym{*mRevision};
     Revised<std::int16_t> mSortOrder{*mRevision};
     Revised<bool> mVisible{*mRevision, true};
+    Revised<std::int32_t> mWidth{*mRevision};
     String mKey;
     model::Criteria mCriteria{mRevision};
 };

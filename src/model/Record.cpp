@@ -1,7 +1,7 @@
 #include "model/Record.h"
 
 #include "model/Column.h"
-#include "model/Criteria.h"
+#include "model/ColumnDefinition.h"
 #include "model/Names.h"
 
 #include <algorithm>
@@ -113,6 +113,9 @@ private:
             fault(path + "column", "is the key of no column");
         if (definition.sortOrder < 0 || definition.sortOrder > 2)
             fault(path + "sort", "is no sort order");
+        if (definition.width < 0 || definition.width > ColumnDefinition::greatestWidth)
+            fault(path + "width",
+                  "is not from 0 to " + std::to_string(ColumnDefinition::greatestWidth));
         std::int32_t before = Criteria::firstRow - 1;
         for (std::size_t n = 0; n < definition.criteria.size() && !mFault; ++n) {
             const std::int16_t row = definition.criteria[n].row;

@@ -77,6 +77,7 @@ struct DefinitionRecord {
     String synonym = {};
     std::int16_t sortOrder = 0;
     bool visible = true;
+    std::int32_t width = 0;                     ///< as SizedDefinition::Width
     std::vector<CriterionRecord> criteria = {}; ///< in the order of their rows
 
     friend bool operator==(const DefinitionRecord&, const DefinitionRecord&) = default;

@@ -24,6 +24,7 @@ DefinitionState stateOf(Ref<ColumnDefinition> definition) {
                           definition->Synonym(),
                           definition->SortOrder(),
                           definition->Visible(),
+                          definition->Width(),
                           {}};
     for (const auto& [row, criterium] : definition->criteria().rows())
         state.criteria.push_back({row, criterium->Criterium(), criterium->references()});

@@ -81,6 +81,7 @@ void Query::set(const DefinitionState& state) {
     definition.mSynonym = state.synonym;
     definition.mSortOrder = state.sortOrder;
     definition.mVisible = state.visible;
+    definition.mWidth = state.width;
     definition.mCriteria.clear();
     for (const CriterionState& criterion : state.criteria) {
         definition.mCriteria.Add(criterion.text, platform::decimal(criterion.row));

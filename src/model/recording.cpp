@@ -56,6 +56,7 @@ DefinitionRecord recordOf(const ColumnDefinition& definition) {
                             .synonym = definition.Synonym(),
                             .sortOrder = definition.SortOrder(),
                             .visible = definition.Visible(),
+                            .width = definition.Width(),
                             .criteria = {}};
     for (const auto& [row, criterium] : definition.criteria().rows())
         record.criteria.push_back({row, criterium->Criterium(), recordOf(criterium->references())});
@@ -103,6 +104,7 @@ Ref<Query> Query::restored(const QueryRecord& record) {
         definition->mSynonym = from.synonym;
         definition->mSortOrder = from.sortOrder;
         definition->mVisible = from.visible;
+        definition->mWidth = from.width;
         definition->mKey = from.key;
         for (const CriterionRecord& criterion : from.criteria) {
             definition->AddCriterium(criterion.text, platform::decimal(criterion.row));

@@ -135,6 +135,20 @@ public:
                               const Ref<ZDColumnDefinition>& predecessor) = 0;
 };
 
+/// What a definition may be besides: one that keeps how wide its column of the grid is. It is asked
+/// for by a cast of the definition and never required; where it is missing, a width that somebody
+/// gives a column lasts as long as the control shows the query.
+class SizedDefinition {
+public:
+    virtual ~SizedDefinition() = default;
+    /// In twips; 0 leaves the width to the control, and so does anything less. A wider column than
+    /// `greatestWidth` is never asked for nor shown.
+    virtual std::int32_t Width() const = 0;
+    virtual void Width(std::int32_t value) = 0;
+
+    static constexpr std::int32_t greatestWidth = 100'000;
+};
+
 /// Makes the model objects that the control needs of its own accord.
 class Library {
 public:

@@ -101,6 +101,7 @@ private:
         definition->Synonym(text());
         definition->SortOrder(static_cast<std::int16_t>(upTo(2)));
         definition->Visible(chance(80));
+        if (chance(40)) definition->Width(upTo(model::ColumnDefinition::greatestWidth));
         mQuery->AddColumnDefinition(definition);
         for (int n = upTo(3); n > 0; --n) {
             const String row = platform::decimal(4 + (chance(95) ? upTo(8) : upTo(32763)));

@@ -34,6 +34,10 @@ TEST(ARecord, ThatIsNotTheSameIsNotEqual) {
         [](SmallQuery& s) { s.query->ColumnDefinitions().Item(1)->AddCriterium(u"1", u"4"); }));
     EXPECT_TRUE(
         different([](SmallQuery& s) { s.query->ColumnDefinitions().Item(1)->Visible(false); }));
+    EXPECT_TRUE(different([](SmallQuery& s) {
+        const auto definition = s.query->ColumnDefinitions().Item(1);
+        dynamic_cast<model::ColumnDefinition&>(*definition).Width(1500);
+    }));
 }
 
 TEST(TheKeysOfAQuery, EndWithAnErrorAndNotWithANumberTwice) {

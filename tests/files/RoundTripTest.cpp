@@ -54,6 +54,25 @@ TEST(ASavedQuery, LoadsWithObjectsThatWorkTogether) {
     EXPECT_EQ(loaded->ColumnDefinitions().Count(), 0);
 }
 
+TEST(ASavedQuery, HasTheWidthOfAColumnWhereSomebodyGaveItOne) {
+    SmallQuery small;
+    for (const std::int32_t width : {0, 1, 2250, model::ColumnDefinition::greatestWidth}) {
+        const auto definition = small.query->AddColumnDefinition(small.newDefinition(small.orders));
+        dynamic_cast<model::ColumnDefinition&>(*definition).Width(width);
+    }
+    const std::string text = jsonOf(small.query);
+    EXPECT_NE(text.find("\"width\": 2250,"), std::string::npos) << text;
+    const auto record = documentOf(text).query->record();
+    std::vector<std::int32_t> widths;
+    for (const auto& definition : record.definitions) widths.push_back(definition.width);
+    EXPECT_EQ(widths, (std::vector<std::int32_t>{0, 1, 2250, 100'000}));
+    small.query->ColumnDefinitions().Remove(u"x2");
+    small.query->ColumnDefinitions().Remove(u"x3");
+    small.query->ColumnDefinitions().Remove(u"x4");
+    EXPECT_NE(jsonOf(small.query).find("\"visible\": true, \"criteria\": []"), std::string::npos)
+        << "a file without widths is as files were before";
+}
+
 TEST(ASavedQuery, NeverGivesAKeyTwiceAfterLoading) {
     SmallQuery small;
     small.query->AddJoin(small.newJoin(small.orders, small.customers));

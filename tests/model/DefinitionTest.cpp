@@ -46,6 +46,17 @@ TEST(ADefinition, RefusesAnUnknownSortOrder) {
     EXPECT_EQ(definition.SortOrder(), 1);
 }
 
+TEST(ADefinition, LeavesTheWidthOfItsColumnToTheControlUntilThatIsSet) {
+    model::ColumnDefinition definition;
+    EXPECT_EQ(definition.Width(), 0);
+    definition.Width(model::ColumnDefinition::greatestWidth);
+    EXPECT_EQ(errorOf([&] { definition.Width(-1); }), 380);
+    EXPECT_EQ(errorOf([&] { definition.Width(model::ColumnDefinition::greatestWidth + 1); }), 380);
+    EXPECT_EQ(definition.Width(), 100'000);
+    definition.Width(0);
+    EXPECT_EQ(definition.Width(), 0);
+}
+
 TEST(ADefinition, StaysWithItsQueryOnceItIsStored) {
     SmallQuery small;
     SmallQuery other;

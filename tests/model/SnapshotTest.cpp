@@ -56,6 +56,15 @@ TEST_F(ASnapshot, FindsOnlyWhatHasChanged) {
     EXPECT_TRUE(change.definitions.empty());
 }
 
+TEST_F(ASnapshot, FindsTheWidthOfAColumn) {
+    const auto change =
+        changed([&] { dynamic_cast<model::ColumnDefinition&>(*definition(2)).Width(2250); });
+    ASSERT_EQ(change.definitions.changed.size(), 1u);
+    EXPECT_EQ(change.definitions.changed[0].before.width, 0);
+    EXPECT_EQ(change.definitions.changed[0].after.width, 2250);
+    EXPECT_TRUE(change.tables.empty());
+}
+
 TEST_F(ASnapshot, FindsNoChangeInASelection) {
     small.orders->Selected(1);
     small.id(small.orders)->Selected(true);

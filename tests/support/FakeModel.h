@@ -150,7 +150,7 @@ public:
     String text;
 };
 
-class Definition final : public TalvikZandorLib::ZDColumnDefinition, private Part {
+class Definition : public TalvikZandorLib::ZDColumnDefinition, private Part {
 public:
     explicit Definition(Calls calls) : Part(calls), criteria(calls, "Criteria"), mCalls(calls) {}
     Ref<TalvikZandorLib::ZDColumn> Column() const override;

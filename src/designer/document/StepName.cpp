@@ -160,6 +160,7 @@ QString StepName::definition(const DefinitionState& before, const DefinitionStat
     if (but(&DefinitionState::sortOrder)) return tr("Change sorting by %1").arg(name);
     if (but(&DefinitionState::visible))
         return (after.visible ? tr("Show column %1") : tr("Hide column %1")).arg(name);
+    if (but(&DefinitionState::width)) return tr("Resize column %1").arg(name);
     return tr("Change column %1").arg(name);
 }
 

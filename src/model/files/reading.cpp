@@ -147,6 +147,7 @@ void Reader::definition(Object object) {
     definition.synonym = object.text("synonym", String());
     definition.sortOrder = object.word("sort", words::sortOrders, 0);
     definition.visible = object.flag("visible", true);
+    definition.width = object.integer<std::int32_t>("width", 0);
     const std::string key = platform::toUtf8(definition.key);
     each(object.listOrNone("criteria", INT16_MAX), object.place() / "criteria", [&](Object each) {
         const auto row = each.integer<std::int16_t>("row");

@@ -154,13 +154,14 @@ json::Value Writer::definition(const model::DefinitionRecord& definition,
         if (!criterion.names.empty()) members.push_back({"names", names(criterion.names)});
         criteria.push_back(whole(std::move(members), key + '/' + std::to_string(criterion.row)));
     }
-    return whole({{"key", {key}},
-                  {"column", orNull(definition.column)},
-                  {"synonym", textOf(definition.synonym, place / "synonym")},
-                  {"sort", {word(words::sortOrders, definition.sortOrder)}},
-                  {"visible", {definition.visible}},
-                  {"criteria", {std::move(criteria)}}},
-                 key);
+    json::Members members = {{"key", {key}},
+                             {"column", orNull(definition.column)},
+                             {"synonym", textOf(definition.synonym, place / "synonym")},
+                             {"sort", {word(words::sortOrders, definition.sortOrder)}},
+                             {"visible", {definition.visible}}};
+    if (definition.width != 0) members.push_back({"width", json::number(definition.width)});
+    members.push_back({"criteria", {std::move(criteria)}});
+    return whole(std::move(members), key);
 }
 
 } // namespace
