@@ -67,18 +67,19 @@ TEST(AnIdentifier, IsQuotedWhenAnyDialectReservesIt) {
 
 TEST(AName, IsNotCarriedWhenItIsTooLong) {
     const auto name = [](std::size_t length) { return platform::String(length, u'n'); };
-    const std::string beginning = "the name \"" + std::string(40, 'n') + "…\", it has more than ";
+    const std::string beginning = "The name \"" + std::string(40, 'n') + "…\" is too long for ";
     EXPECT_EQ(refused(name(63), Dialect::PostgreSQL), "");
     EXPECT_EQ(refused(name(64), Dialect::PostgreSQL),
-              "PostgreSQL cannot carry " + beginning + "63 bytes");
+              beginning + "PostgreSQL, which takes 63 bytes (one for a letter from A to Z, more "
+                          "for most others): choose a shorter one.");
     EXPECT_EQ(refused(name(64), Dialect::MySQL), "");
     EXPECT_EQ(refused(name(65), Dialect::MySQL),
-              "MySQL/MariaDB cannot carry " + beginning + "64 characters");
+              beginning + "MySQL/MariaDB, which takes 64 characters: choose a shorter one.");
     EXPECT_EQ(refused(name(128), Dialect::SqlServer), "");
     EXPECT_EQ(refused(name(129), Dialect::SqlServer),
-              "SQL Server cannot carry " + beginning + "128 characters");
+              beginning + "SQL Server, which takes 128 characters: choose a shorter one.");
     EXPECT_EQ(refused(name(129), Dialect::Standard),
-              "Standard SQL cannot carry " + beginning + "128 characters");
+              beginning + "Standard SQL, which takes 128 characters: choose a shorter one.");
     EXPECT_EQ(refused(name(5000), Dialect::SQLite), "");
 }
 
@@ -92,29 +93,33 @@ TEST(AName, IsNotCarriedWithACharacterThatIsNone) {
     for (const Dialect dialect : allDialects) {
         const std::string who = toUtf8(nameOf(dialect));
         EXPECT_EQ(refused(platform::String(u"a\0b", 3), dialect),
-                  who + " cannot carry a name with the character zero in it");
-        EXPECT_EQ(refused(u"", dialect), who + " cannot carry an empty name");
+                  who + " takes no name with the character zero in it: choose another one.");
+        EXPECT_EQ(refused(u"", dialect), who + " takes no name that is empty: write one.");
         for (const platform::String& torn :
              {platform::String(u"a\xD83D"), platform::String(u"\xDE00z"),
               platform::String(u"\xD83D\xD83D\xDE00")})
             EXPECT_EQ(refused(torn, dialect),
-                      who + " cannot carry a name with half a character in it");
+                      who + " takes no name with half a character in it: type it afresh.");
     }
 }
 
 TEST(AName, IsNotCarriedByMySqlWhenItLiesBeyondTheBasicPlaneOrEndsWithABlank) {
-    EXPECT_EQ(refused(u"a😀", Dialect::MySQL),
-              "MySQL/MariaDB cannot carry the name \"a😀\", it has a character beyond U+FFFF");
-    EXPECT_EQ(refused(u"a ", Dialect::MySQL),
-              "MySQL/MariaDB cannot carry the name \"a \", it ends with a blank");
+    EXPECT_EQ(
+        refused(u"a😀", Dialect::MySQL),
+        "The name \"a😀\" has a rare character in it that MySQL/MariaDB does not take, such as "
+        "an emoji: write it without.");
+    EXPECT_EQ(
+        refused(u"a ", Dialect::MySQL),
+        "The name \"a \" ends with a blank, which MySQL/MariaDB does not take: write it without.");
     EXPECT_EQ(refused(u"a😀", Dialect::PostgreSQL), "");
 }
 
 TEST(AName, IsShortenedInAMessageBetweenTwoCharacters) {
     const platform::String name = platform::String(39, u'n') + u"😀" + platform::String(99, u'n');
-    EXPECT_EQ(refused(name, Dialect::Standard), "Standard SQL cannot carry the name \"" +
-                                                    std::string(39, 'n') +
-                                                    "…\", it has more than 128 characters");
+    EXPECT_EQ(refused(name, Dialect::Standard),
+              "The name \"" + std::string(39, 'n') +
+                  "…\" is too long for Standard SQL, which takes 128 characters: choose a shorter "
+                  "one.");
 }
 
 TEST(ALiteral, OfTextHasItsApostrophesDoubled) {

@@ -88,7 +88,8 @@ TEST_F(AFinding, OnADefinitionWithoutItsColumnNamesTheDefinition) {
     EXPECT_EQ(only().kind, Finding::Kind::definitionWithoutColumn);
     EXPECT_EQ(only().definition, u"x9");
     EXPECT_TRUE(only().isError());
-    EXPECT_EQ(toUtf8(only().text), "An output column has no column of the query: delete it.");
+    EXPECT_EQ(toUtf8(only().text), "The table of an output column is no longer in the query: "
+                                   "delete the output column, or choose another field for it.");
 }
 
 TEST_F(AFinding, OnASortOfAllColumnsNamesTheDefinition) {
@@ -200,7 +201,7 @@ TEST_F(AFinding, OnANameThatIsNotCarriedNamesTheDefinitionOrTheJoin) {
     EXPECT_EQ(findings[1].definition, column->Key());
     EXPECT_EQ(findings[2].definition, synonym->Key());
     EXPECT_EQ(toUtf8(findings[2].text),
-              "MySQL/MariaDB cannot carry a name with the character zero in it.");
+              "MySQL/MariaDB takes no name with the character zero in it: choose another one.");
     for (const auto& finding : findings) EXPECT_EQ(finding.kind, Finding::Kind::nameNotCarried);
 }
 
@@ -223,6 +224,8 @@ TEST_F(AFinding, OnAFullJoinThatTheDialectLacksNamesTheJoin) {
 TEST_F(AFinding, IsOneLineWhateverIsInTheNames) {
     added(u"a\nb");
     added(u"c\r\n\u2028d");
-    EXPECT_EQ(toUtf8(only().text), "No join connects c   d with a b: every row of one comes with "
-                                   "every row of the other.");
+    EXPECT_EQ(toUtf8(only().text),
+              "No join connects c   d with a b, so that every row of one comes "
+              "with every row of the other: draw a join between them, or "
+              "delete one.");
 }

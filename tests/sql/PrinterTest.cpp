@@ -157,11 +157,11 @@ TEST(ThePrinter, RefusesAFullJoinWhereTheEngineHasNone) {
     const Statement less = all(joined(JoinKind::fullOuter, on(Comparison::less)));
     const Statement mixed =
         all(joined(JoinKind::fullOuter, make(And{{on(Comparison::less), on(Comparison::equal)}})));
-    EXPECT_EQ(text(equal, Dialect::MySQL),
-              "MySQL/MariaDB has no full outer join: make it a left or a right one.");
+    EXPECT_EQ(text(equal, Dialect::MySQL), "MySQL/MariaDB has no join that keeps all rows of both "
+                                           "tables: let this one keep those of one table.");
     EXPECT_EQ(text(less, Dialect::PostgreSQL),
-              "PostgreSQL joins both outer only on equal columns: use the operator =, or make it a "
-              "left or a right outer join.");
+              "PostgreSQL keeps all rows of both tables only where a join asks for equal values: "
+              "choose the operator =, or let the join keep the rows of one table.");
     for (const Statement& fine : {equal, mixed})
         EXPECT_NE(text(fine, Dialect::PostgreSQL).find("FULL JOIN"), std::string::npos);
     for (const Dialect dialect : {Dialect::SQLite, Dialect::SqlServer, Dialect::Standard})
@@ -182,8 +182,10 @@ TEST(ThePrinter, RefusesMoreConditionsInARowThanSqliteTakes) {
     const auto row = [](std::size_t length) {
         return where(make(Or{std::vector<Node>(length, equals(u"1"))}));
     };
-    EXPECT_EQ(text(row(949), Dialect::SQLite),
-              "SQLite takes about 900 conditions in a row: use In for a long list.");
+    EXPECT_EQ(
+        text(row(949), Dialect::SQLite),
+        "These are more conditions than SQLite takes, which is about 900: write a long list of "
+        "values as In (1, 2, 3).");
     EXPECT_NE(text(row(948), Dialect::SQLite).find("WHERE"), std::string::npos);
     EXPECT_NE(text(row(949), Dialect::PostgreSQL).find("WHERE"), std::string::npos);
 }

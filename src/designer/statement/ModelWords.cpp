@@ -12,36 +12,50 @@ namespace {
 constexpr const char* messages[] = {
     // the query
     QT_TRANSLATE_NOOP("Model", "The query has no tables: add one first."),
-    QT_TRANSLATE_NOOP("Model", "An output column has no column of the query: delete it."),
-    QT_TRANSLATE_NOOP("Model", "%1.* cannot be sorted: sort one of its columns."),
-    QT_TRANSLATE_NOOP("Model", "%1.* cannot have a criterion: give one to one of its columns."),
-    QT_TRANSLATE_NOOP("Model", "Two output columns are named %1: give one of them a synonym."),
+    QT_TRANSLATE_NOOP("Model", "The table of an output column is no longer in the query: delete "
+                               "the output column, or choose another field for it."),
+    QT_TRANSLATE_NOOP("Model", "%1.* stands for all columns and cannot be sorted by: add the "
+                               "column that is to decide, and sort by that."),
+    QT_TRANSLATE_NOOP("Model", "%1.* stands for all columns and cannot have a criterion: add the "
+                               "column that is meant, and write the criterion there."),
+    QT_TRANSLATE_NOOP("Model", "Two output columns are named %1, so that nobody can tell them "
+                               "apart: give one of them a synonym."),
     // joins
-    QT_TRANSLATE_NOOP("Model", "%1 and %2 hold different kinds of values: the join will find "
-                               "nothing or fail."),
-    QT_TRANSLATE_NOOP("Model", "The outer join between %1 and %2 has no effect: normal joins "
-                               "connect them too."),
-    QT_TRANSLATE_NOOP("Model", "The outer joins around %1 and %2 contradict each other: the one "
-                               "drawn first decides which rows are kept."),
-    QT_TRANSLATE_NOOP("Model", "The outer joins around %1 can be read in several ways: change the "
-                               "type of one of them."),
-    QT_TRANSLATE_NOOP("Model", "No join connects %1 with %2: every row of one comes with every "
-                               "row of the other."),
+    QT_TRANSLATE_NOOP("Model", "%1 and %2 hold different kinds of values, so that their join finds "
+                               "nothing or fails: join columns that hold the same."),
+    QT_TRANSLATE_NOOP(
+        "Model",
+        "The outer join between %1 and %2 keeps no more rows than a normal one, for normal joins "
+        "connect these tables too: make it a normal join, or make the others outer ones."),
+    QT_TRANSLATE_NOOP(
+        "Model", "The outer joins around %1 and %2 contradict each other, and the one drawn first "
+                 "decides which rows are kept: let all of them keep the rows of the same table."),
+    QT_TRANSLATE_NOOP("Model", "The outer joins around %1 can be read in several ways, each with "
+                               "other rows: change the type of one of them."),
+    QT_TRANSLATE_NOOP("Model", "No join connects %1 with %2, so that every row of one comes with "
+                               "every row of the other: draw a join between them, or delete one."),
     // dialects
-    QT_TRANSLATE_NOOP("Model", "MySQL/MariaDB has no full outer join: make it a left or a right "
-                               "one."),
-    QT_TRANSLATE_NOOP("Model", "PostgreSQL joins both outer only on equal columns: use the "
-                               "operator =, or make it a left or a right outer join."),
-    QT_TRANSLATE_NOOP("Model", "SQLite takes about 900 conditions in a row: use In for a long "
-                               "list."),
-    QT_TRANSLATE_NOOP("Model", "%1 cannot carry an empty name."),
-    QT_TRANSLATE_NOOP("Model", "%1 cannot carry a name with the character zero in it."),
-    QT_TRANSLATE_NOOP("Model", "%1 cannot carry a name with half a character in it."),
-    QT_TRANSLATE_NOOP("Model", "%1 cannot carry the name \"%2\", it has more than %3 bytes."),
-    QT_TRANSLATE_NOOP("Model", "%1 cannot carry the name \"%2\", it has more than %3 characters."),
+    QT_TRANSLATE_NOOP("Model", "MySQL/MariaDB has no join that keeps all rows of both tables: let "
+                               "this one keep those of one table."),
     QT_TRANSLATE_NOOP("Model",
-                      "%1 cannot carry the name \"%2\", it has a character beyond U+FFFF."),
-    QT_TRANSLATE_NOOP("Model", "%1 cannot carry the name \"%2\", it ends with a blank."),
+                      "PostgreSQL keeps all rows of both tables only where a join asks for equal "
+                      "values: choose the operator =, or let the join keep the rows of one table."),
+    QT_TRANSLATE_NOOP("Model", "These are more conditions than SQLite takes, which is about 900: "
+                               "write a long list of values as In (1, 2, 3)."),
+    QT_TRANSLATE_NOOP("Model", "%1 takes no name that is empty: write one."),
+    QT_TRANSLATE_NOOP("Model",
+                      "%1 takes no name with the character zero in it: choose another one."),
+    QT_TRANSLATE_NOOP("Model", "%1 takes no name with half a character in it: type it afresh."),
+    QT_TRANSLATE_NOOP("Model",
+                      "The name \"%1\" is too long for %2, which takes %3 bytes (one for a letter "
+                      "from A to Z, more for most others): choose a shorter one."),
+    QT_TRANSLATE_NOOP(
+        "Model",
+        "The name \"%1\" is too long for %2, which takes %3 characters: choose a shorter one."),
+    QT_TRANSLATE_NOOP("Model", "The name \"%1\" has a rare character in it that %2 does not take, "
+                               "such as an emoji: write it without."),
+    QT_TRANSLATE_NOOP(
+        "Model", "The name \"%1\" ends with a blank, which %2 does not take: write it without."),
     // criteria
     QT_TRANSLATE_NOOP("Model", "%1: At character %2: %3."),
     QT_TRANSLATE_NOOP("Model", "put And or Or between two conditions, or quotes around a text"),
@@ -149,6 +163,7 @@ constexpr const char* messages[] = {
     QT_TRANSLATE_NOOP("Model", "The output cannot be written"),
     QT_TRANSLATE_NOOP("Model", "The rows cannot be written"),
     QT_TRANSLATE_NOOP("Model", "check the path"),
+    QT_TRANSLATE_NOOP("Model", "choose a shorter name"),
     QT_TRANSLATE_NOOP("Model", "ask the owner for permission, or choose another folder"),
     QT_TRANSLATE_NOOP("Model", "make room on the disk, or choose another one"),
     QT_TRANSLATE_NOOP("Model", "choose another disk"),

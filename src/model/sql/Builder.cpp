@@ -53,7 +53,8 @@ private:
         const Ref<Column> column = definition.place().column();
         if (!column) {
             report(Finding::Kind::definitionWithoutColumn, definition,
-                   u"An output column has no column of the query: delete it.");
+                   u"The table of an output column is no longer in the query: delete the "
+                   u"output column, or choose another field for it.");
             return;
         }
         const Ref<Table> table = definition.place().table().table();
@@ -77,11 +78,14 @@ private:
         if (definition.Visible()) mStatement.items.push_back({AllColumns{table}, {}});
         if (definition.SortOrder() != 0)
             report(Finding::Kind::sortOnAllColumns, definition,
-                   table + u".* cannot be sorted: sort one of its columns.");
+                   table + u".* stands for all columns and cannot be sorted by: add the column "
+                           u"that is to decide, and sort by that.");
         for (const auto& [row, criterium] : definition.criteria().rows())
             if (!criteria::isBlank(criterium->Criterium()))
                 report(Finding::Kind::badCriterion, definition,
-                       table + u".* cannot have a criterion: give one to one of its columns.", row);
+                       table + u".* stands for all columns and cannot have a criterion: add the "
+                               u"column that is meant, and write the criterion there.",
+                       row);
     }
 
     void addCriterion(const ColumnDefinition& definition, const ColumnRef& subject,
@@ -108,7 +112,7 @@ private:
             if (seen)
                 report(Finding::Kind::duplicateOutputName, *mNames[i].first,
                        u"Two output columns are named " + mNames[i].second +
-                           u": give one of them a synonym.");
+                           u", so that nobody can tell them apart: give one of them a synonym.");
         }
     }
 

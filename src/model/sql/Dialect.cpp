@@ -93,28 +93,34 @@ String identifier(StringView name, Dialect dialect) {
 }
 
 std::optional<String> cannotCarry(StringView name, Dialect dialect) {
-    const auto refusal = [dialect](StringView why) {
-        return String(nameOf(dialect)) + u" cannot carry " + String(why);
+    const String reader(nameOf(dialect));
+    const auto anyName = [&](StringView with, StringView advice) {
+        return reader + u" takes no name " + String(with) + u": " + String(advice) + u'.';
     };
-    if (name.empty()) return refusal(u"an empty name");
+    if (name.empty()) return anyName(u"that is empty", u"write one");
     if (name.find(u'\0') != StringView::npos)
-        return refusal(u"a name with the character zero in it");
-    if (isTorn(name)) return refusal(u"a name with half a character in it");
-    const auto theName = [name](StringView why) {
-        return u"the name \"" + shortened(name) + u"\", it " + String(why);
+        return anyName(u"with the character zero in it", u"choose another one");
+    if (isTorn(name)) return anyName(u"with half a character in it", u"type it afresh");
+    const auto thisName = [&](StringView why) {
+        return u"The name \"" + shortened(name) + u"\" " + String(why);
     };
     const auto tooLong = [&](std::size_t length, std::size_t most, StringView unit) {
         if (length <= most) return std::optional<String>();
-        return std::optional<String>(
-            refusal(theName(u"has more than " + platform::decimal(static_cast<std::int64_t>(most)) +
-                            u" " + String(unit))));
+        return std::optional(thisName(u"is too long for ") + reader + u", which takes " +
+                             platform::decimal(static_cast<std::int64_t>(most)) + u" " +
+                             String(unit) + u": choose a shorter one.");
     };
     switch (dialect) {
-    case Dialect::PostgreSQL: return tooLong(platform::toUtf8(name).size(), 63, u"bytes");
+    case Dialect::PostgreSQL:
+        return tooLong(platform::toUtf8(name).size(), 63,
+                       u"bytes (one for a letter from A to Z, more for most others)");
     case Dialect::MySQL:
         if (std::any_of(name.begin(), name.end(), isHighSurrogate))
-            return refusal(theName(u"has a character beyond U+FFFF"));
-        if (name.back() == u' ') return refusal(theName(u"ends with a blank"));
+            return thisName(u"has a rare character in it that ") + reader +
+                   u" does not take, such as an emoji: write it without.";
+        if (name.back() == u' ')
+            return thisName(u"ends with a blank, which ") + reader +
+                   u" does not take: write it without.";
         return tooLong(name.size(), 64, u"characters");
     case Dialect::SqlServer:
     case Dialect::Standard: return tooLong(name.size(), 128, u"characters");

@@ -56,9 +56,11 @@ private:
         const String leftName = leftTable->Name() + u"." + leftColumn->Name();
         const String rightName = rightTable->Name() + u"." + rightColumn->Name();
         if (!criteria::comparable(leftType, rightType))
-            report(Finding::Kind::incomparableJoin, join.Key(),
-                   leftName + u" and " + rightName +
-                       u" hold different kinds of values: the join will find nothing or fail.");
+            report(
+                Finding::Kind::incomparableJoin, join.Key(),
+                leftName + u" and " + rightName +
+                    u" hold different kinds of values, so that their join finds nothing or fails: "
+                    u"join columns that hold the same.");
         Node condition = make(Compare{static_cast<Comparison>(join.CompareOperator()),
                                       make(criteria::columnRef(*leftColumn, *leftTable)),
                                       make(criteria::columnRef(*rightColumn, *rightTable))});
@@ -101,7 +103,8 @@ private:
                 report(Finding::Kind::ambiguousOuterJoin, edge.key,
                        u"The outer join between " + mTables[edge.left]->Name() + u" and " +
                            mTables[edge.right]->Name() +
-                           u" has no effect: normal joins connect them too.");
+                           u" keeps no more rows than a normal one, for normal joins connect these "
+                           u"tables too: make it a normal join, or make the others outer ones.");
     }
 
     SourceNode leaf(std::size_t table) const {
@@ -224,7 +227,8 @@ private:
         report(Finding::Kind::ambiguousOuterJoin, edge.key,
                u"The outer joins around " + mTables[edge.left]->Name() + u" and " +
                    mTables[edge.right]->Name() +
-                   u" contradict each other: the one drawn first decides which rows are kept.");
+                   u" contradict each other, and the one drawn first decides which rows are kept: "
+                   u"let all of them keep the rows of the same table.");
     }
 
     /// Whether other rows would come out if the joins were carried out in another order. That is so
@@ -244,7 +248,8 @@ private:
         if (kind == JoinKind::fullOuter && !several && !isFilledWithin(met, joined)) return;
         report(Finding::Kind::ambiguousOuterJoin, meeting->key,
                u"The outer joins around " + mTables[mGroups[met].front()]->Name() +
-                   u" can be read in several ways: change the type of one of them.");
+                   u" can be read in several ways, each with other rows: change the type of one "
+                   u"of them.");
     }
 
     /// Whether one of the joined groups fills another.
@@ -320,9 +325,11 @@ private:
         const String first = firstTable(mResult.trees.front());
         for (std::size_t i = 1; i < mResult.trees.size(); ++i) {
             const String other = firstTable(mResult.trees[i]);
-            Finding finding{Finding::Kind::cartesianProduct,
-                            u"No join connects " + other + u" with " + first +
-                                u": every row of one comes with every row of the other."};
+            Finding finding{
+                Finding::Kind::cartesianProduct,
+                u"No join connects " + other + u" with " + first +
+                    u", so that every row of one comes with every row of the other: draw a "
+                    u"join between them, or delete one."};
             for (const auto& table : mTables)
                 if (table->Name() == other) finding.table = table->Key();
             mFindings.push_back(std::move(finding));

@@ -8,7 +8,7 @@ namespace {
 std::optional<Finding> firstUncarried(std::initializer_list<StringView> names, Dialect dialect) {
     for (const StringView name : names)
         if (const auto why = cannotCarry(name, dialect))
-            return Finding{Finding::Kind::nameNotCarried, *why + u"."};
+            return Finding{Finding::Kind::nameNotCarried, *why};
     return {};
 }
 

@@ -89,7 +89,7 @@ public:
 private:
     void name(StringView text) {
         if (const auto why = cannotCarry(text, mDialect))
-            throw Refusal{Refusal::Reason::name, *why + u"."};
+            throw Refusal{Refusal::Reason::name, *why};
         mOut += identifier(text, mDialect);
     }
 
@@ -156,21 +156,27 @@ private:
     void check(const JoinSource& join) const {
         if (join.kind != JoinKind::fullOuter) return;
         if (mDialect == Dialect::MySQL)
-            throw Refusal{Refusal::Reason::join,
-                          u"MySQL/MariaDB has no full outer join: make it a left or a right one.",
-                          join.key};
+            throw Refusal{
+                Refusal::Reason::join,
+                u"MySQL/MariaDB has no join that keeps all rows of both tables: let this one "
+                u"keep those of one table.",
+                join.key};
         if (mDialect == Dialect::PostgreSQL && !hasEquality(*join.on))
-            throw Refusal{Refusal::Reason::join,
-                          u"PostgreSQL joins both outer only on equal columns: use the operator =, "
-                          u"or make it a left or a right outer join.",
-                          join.key};
+            throw Refusal{
+                Refusal::Reason::join,
+                u"PostgreSQL keeps all rows of both tables only where a join asks for equal "
+                u"values: choose the operator =, or let the join keep the rows of one "
+                u"table.",
+                join.key};
     }
 
     void check(const Expression& where) const {
         constexpr std::size_t deepest = 950; // SQLite takes 1000
         if (mDialect == Dialect::SQLite && depth(where) > deepest)
-            throw Refusal{Refusal::Reason::size,
-                          u"SQLite takes about 900 conditions in a row: use In for a long list."};
+            throw Refusal{
+                Refusal::Reason::size,
+                u"These are more conditions than SQLite takes, which is about 900: write a "
+                u"long list of values as In (1, 2, 3)."};
     }
 
     void tableRef(const TableRef& table) {

@@ -138,8 +138,8 @@ TEST_F(TheStatementPanel, SaysWhyThereIsNoStatement) {
     ASSERT_TRUE(shows("FULL JOIN"));
     panel.setDatabaseDialect(Dialect::MySQL);
     ASSERT_TRUE(soon([&] { return text().empty(); }));
-    EXPECT_EQ(instead(), "MySQL/MariaDB cannot say this query:\n\nMySQL/MariaDB has no full outer "
-                         "join: make it a left or a right one.");
+    EXPECT_EQ(instead(), "MySQL/MariaDB cannot say this query:\n\nMySQL/MariaDB has no join that "
+                         "keeps all rows of both tables: let this one keep those of one table.");
     EXPECT_FALSE(copy().isEnabled());
     EXPECT_EQ(list().count(), 1);
 }
@@ -156,9 +156,12 @@ TEST_F(TheStatementPanel, ListsErrorsBeforeWarningsEachWithItsMark) {
     ASSERT_TRUE(soon([&] { return list().count() == 3; }));
     EXPECT_EQ(list().item(0)->text(),
               "orders.name: At character 5: after Like comes a pattern, as in Like 'A*'.");
-    EXPECT_EQ(list().item(1)->text(), "No join connects customers with orders: every row of one "
-                                      "comes with every row of the other.");
-    EXPECT_EQ(list().item(2)->text(), "orders.* cannot be sorted: sort one of its columns.");
+    EXPECT_EQ(list().item(1)->text(), "No join connects customers with orders, so that every row "
+                                      "of one comes with every row of the other: draw a join "
+                                      "between them, or delete one.");
+    EXPECT_EQ(list().item(2)->text(),
+              "orders.* stands for all columns and cannot be sorted by: add "
+              "the column that is to decide, and sort by that.");
     EXPECT_THAT(list().item(0)->data(Qt::AccessibleTextRole).toString().toStdString(),
                 StartsWith("Error: orders.name"));
     EXPECT_THAT(list().item(1)->data(Qt::AccessibleTextRole).toString().toStdString(),
