@@ -4,6 +4,7 @@
 #include "designer/document/AutosaveSlot.h"
 #include "designer/document/paths.h"
 #include "designer/options/Languages.h"
+#include "designer/run/spoolSweep.h"
 #include "designer/show/DrawingPicture.h"
 #include "designer/show/savePicture.h"
 #include "designer/statement/ModelWords.h"
@@ -76,6 +77,7 @@ int main(int argc, char** argv) {
     if (!arguments) return refuse(arguments.error());
     if (arguments->dark) designer::useDarkColours();
     if (!arguments->drawing.isEmpty()) return drawQuery(*arguments);
+    designer::sweepSpools();
     designer::DesignerWindow window;
     const QString sample = QStringLiteral(ZANDOR_SAMPLE_DATABASE);
     const bool stays = arguments->screenshot.isEmpty() && !designer::isOffscreen();

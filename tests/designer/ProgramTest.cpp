@@ -136,6 +136,15 @@ TEST(TheDesignerProgram, DrawsAPictureWhenThereIsNoDisplay) {
     EXPECT_EQ(QImage(folder.path("zandor-designer.png")).size(), QSize(1340, 800));
 }
 
+TEST(TheDesignerProgram, SweepsTheRowsThatAnEarlierRunHasLeft) {
+    DatabaseFolder folder;
+    QFile rows(folder.path("zandor-rows-Ab12Cd"));
+    ASSERT_TRUE(rows.open(QIODevice::WriteOnly));
+    rows.close();
+    EXPECT_EQ(run({}, {{"TMPDIR", folder.path("")}}).code, 0);
+    EXPECT_FALSE(rows.exists());
+}
+
 TEST(TheDesignerProgram, DrawsAPictureWhenTheDisplayCannotBeReached) {
     DatabaseFolder folder;
     const Ended ended = run({}, {{"TMPDIR", folder.path("")}, {"DISPLAY", ":8765"}});

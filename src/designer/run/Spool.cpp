@@ -23,13 +23,6 @@ constexpr qsizetype mostPending = 1 << 18;
 constexpr qint64 betweenLooks = 1 << 26;
 constexpr qint64 roomLeftToOthers = 1 << 28;
 
-/// The folder /tmp may be in memory, which large files are to stay out of.
-QString folder() {
-    const QString large = QStringLiteral("/var/tmp");
-    const bool chosen = qEnvironmentVariableIsSet("TMPDIR");
-    return !chosen && QFileInfo(large).isWritable() ? large : QDir::tempPath();
-}
-
 void append(QByteArray& bytes, const Cell& cell) {
     bytes += static_cast<char>(cell.kind);
     if (cell.kind == Cell::Kind::null) return;
@@ -56,7 +49,7 @@ files::Descriptor namelessFile(const QString& folder) {
     if (file.isOpen()) return file;
 #endif
     // Not every file system can do that.
-    std::string name = path / "zandor-rows-XXXXXX";
+    std::string name = path / (spoolName + QStringLiteral("XXXXXX")).toStdString();
     files::Descriptor named(::mkostemp(name.data(), O_CLOEXEC));
     if (named.isOpen()) ::unlink(name.c_str());
     return named;
@@ -120,15 +113,22 @@ bool read(Reading& file, Cell& cell, qint64 mostBytes) {
 
 } // namespace
 
+// The folder /tmp may be in memory, which large files are to stay out of.
+QString spoolFolder() {
+    const QString large = QStringLiteral("/var/tmp");
+    const bool chosen = qEnvironmentVariableIsSet("TMPDIR");
+    return !chosen && QFileInfo(large).isWritable() ? large : QDir::tempPath();
+}
+
 std::optional<QString> Spool::begin(const QStringList& columns) {
     const std::lock_guard lock(mMutex);
     mColumns = columns;
-    mFile = namelessFile(folder());
+    mFile = namelessFile(spoolFolder());
     if (mFile.isOpen()) return {};
     return QCoreApplication::translate("designer::Spool",
                                        "No file for the rows can be made in \"%1\" (%2): set "
                                        "TMPDIR to a folder that you may write to.")
-        .arg(folder(), qt_error_string(errno));
+        .arg(spoolFolder(), qt_error_string(errno));
 }
 
 std::optional<QString> Spool::add(const Row& row) {
@@ -180,12 +180,12 @@ std::optional<QString> Spool::flush() {
     if (mFailure || mPending.isEmpty()) return mFailure;
     if (mEnd >= mNextLook) {
         mNextLook = mEnd + betweenLooks;
-        if (QStorageInfo(folder()).bytesAvailable() < roomLeftToOthers)
+        if (QStorageInfo(spoolFolder()).bytesAvailable() < roomLeftToOthers)
             mFailure = QCoreApplication::translate(
                            "designer::Spool",
                            "The rows would fill the disk with the folder \"%1\": make room there, "
                            "or ask for fewer rows.")
-                           .arg(folder());
+                           .arg(spoolFolder());
     }
     if (!mFailure) mFailure = written();
     if (!mFailure) mReadable = mRows;

@@ -7,6 +7,12 @@
 
 namespace designer {
 
+/// How the files of spools are named where they have a name, before six letters and digits: for a
+/// moment on some systems, and for as long as they are read by versions before.
+inline const QString spoolName = QStringLiteral("zandor-rows-");
+/// Where they are made.
+QString spoolFolder();
+
 /// The rows of a result on the disk, to be read page by page while more are coming.
 ///
 /// All rows are taken as fast as the engine gives them, whether anybody looks at them or not: the
