@@ -98,6 +98,60 @@ TEST(SavingAQuery, ThroughALinkReplacesTheFileAndNotTheLink) {
     EXPECT_EQ(real->query->Tables().Count(), 3);
 }
 
+TEST(SavingAQuery, ThroughALinkThatLeadsNowhereYetMakesTheFileAndLeavesTheLink) {
+    const TemporaryFolder folder;
+    const SmallQuery small;
+    fs::create_directory(folder / "disk");
+    fs::create_symlink("disk/real.json", folder / "second.json");
+    fs::create_symlink("second.json", folder / "first.json");
+    ASSERT_EQ(errorOfSaving(folder / "first.json", small.query), "");
+    EXPECT_TRUE(fs::is_symlink(folder / "first.json"));
+    EXPECT_TRUE(fs::is_symlink(folder / "second.json"));
+    EXPECT_TRUE(files::loadQuery(folder / "disk" / "real.json"));
+
+    fs::remove_all(folder / "disk"); // as where it was mounted
+    EXPECT_EQ(errorOfSaving(folder / "first.json", small.query),
+              "The file \"" + (folder / "first.json").string() +
+                  "\" cannot be saved (No such file or directory); check the path.");
+    EXPECT_TRUE(fs::is_symlink(folder / "second.json"));
+}
+
+TEST(SavingAQuery, ThroughALinkToItselfIsRefused) {
+    const TemporaryFolder folder;
+    const SmallQuery small;
+    fs::create_symlink("loop.json", folder / "loop.json");
+    EXPECT_EQ(errorOfSaving(folder / "loop.json", small.query),
+              "The file \"" + (folder / "loop.json").string() +
+                  "\" cannot be saved (Too many levels of symbolic links); try again, or choose "
+                  "another folder.");
+    EXPECT_TRUE(fs::is_symlink(folder / "loop.json"));
+}
+
+TEST(SavingAQuery, UnderANameOfSeveralLinesMakesThatFile) {
+    const TemporaryFolder folder;
+    const SmallQuery small;
+    const auto path = folder / "two\nlines.json";
+    ASSERT_EQ(errorOfSaving(path, small.query), "");
+    EXPECT_TRUE(files::loadQuery(path));
+    EXPECT_EQ(std::distance(fs::directory_iterator(folder / ""), fs::directory_iterator()), 1);
+    EXPECT_EQ(files::loadQuery(folder / "no\nfile").error(),
+              "The file \"" + (folder / "no?file").string() +
+                  "\" cannot be read (No such file or directory); check the path.");
+}
+
+TEST(SavingAQuery, UnderTheLongestNameWorksAndUnderALongerOneIsRefused) {
+    const TemporaryFolder folder;
+    const SmallQuery small;
+    const std::string longest(255, 'n');
+    EXPECT_EQ(errorOfSaving(folder / longest, small.query), "");
+    EXPECT_EQ(errorOfSaving(folder / (longest + 'n'), small.query),
+              "The file \"" + (folder / (longest + 'n')).string() +
+                  "\" cannot be saved (File name too long); choose a shorter name.");
+    EXPECT_EQ(errorOfSaving(folder / longest / "a.json", small.query),
+              "The file \"" + (folder / longest / "a.json").string() +
+                  "\" cannot be saved (Not a directory); check the path.");
+}
+
 TEST(SavingAQuery, SaysInOneLineWhyItCannot) {
     const TemporaryFolder folder;
     const SmallQuery small;

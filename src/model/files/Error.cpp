@@ -9,7 +9,9 @@ namespace {
 
 std::string advice(int number) {
     switch (number) {
-    case ENOENT: return "check the path";
+    case ENOENT:
+    case ENOTDIR: return "check the path";
+    case ENAMETOOLONG: return "choose a shorter name";
     case EACCES:
     case EPERM: return "ask the owner for permission, or choose another folder";
     case ENOSPC:

@@ -22,11 +22,17 @@ Path nameBeside(const Path& path) {
     return path.parent_path() / name;
 }
 
-/// Where a link leads to; the path itself when it is none.
+/// Where a link leads to, also when nothing is there yet; the path itself when it is none. A link
+/// that leads to itself stays one.
 Path resolved(const Path& path) {
     std::error_code none;
     const Path target = std::filesystem::canonical(path, none);
-    return none ? std::filesystem::absolute(path, none) : target;
+    if (!none) return target;
+    Path end = std::filesystem::absolute(path, none);
+    constexpr int mostLinks = 40; // as the system has it
+    for (int n = 0; n < mostLinks && std::filesystem::is_symlink(end, none); ++n)
+        end = end.parent_path() / std::filesystem::read_symlink(end, none);
+    return end;
 }
 
 std::string refusal(const Path& path) { return "The file " + quoted(path) + " cannot be saved"; }
@@ -45,6 +51,7 @@ Replacement::~Replacement() {
 std::optional<Error> Replacement::open() {
     struct stat old = {};
     const bool replaces = ::stat(mTarget.c_str(), &old) == 0;
+    if (!replaces && errno != ENOENT) return refused(errno);
     if (replaces && !S_ISREG(old.st_mode))
         return Error{quoted(mPath) + " is not a file; choose another name."};
     if (replaces && ::access(mTarget.c_str(), W_OK) != 0)
