@@ -433,8 +433,13 @@ void DesignerWindow::showTable(const QString& name) {
 }
 
 void DesignerWindow::showTitle() {
-    QStringList parts{platform::qt::asSigns(mFile.name()) + QStringLiteral("[*]")};
-    if (mDatabase.isOpen()) parts += platform::qt::asSigns(mDatabase.name());
+    const QString mark = QStringLiteral("[*]");
+    // In a name it means itself.
+    const auto shown = [&](const QString& name) {
+        return platform::qt::asSigns(name).replace(mark, mark + mark);
+    };
+    QStringList parts{shown(mFile.name()) + mark};
+    if (mDatabase.isOpen()) parts += shown(mDatabase.name());
     parts += QStringLiteral("Zandor Designer");
     setWindowTitle(parts.join(QStringLiteral(" \u2014 ")));
 }

@@ -32,6 +32,19 @@ protected:
 
 } // namespace
 
+TEST_F(TheWindowsFiles, AreNamedAsTheyAreWhateverTheirNamesMeanToAWindow) {
+    open();
+    add("orders");
+    const QString path = folder.path("a[*]b\nc.json");
+    commandWithFile("save", path);
+    EXPECT_TRUE(QFile::exists(path));
+    EXPECT_FALSE(window->isWindowModified());
+    // To the window, two of its marks are one of the name's.
+    EXPECT_THAT(title(), StartsWith("a[*][*]b\u21b5c.json[*] "));
+    commandWithFile("open", path);
+    EXPECT_THAT(shownTables(), testing::Contains("orders"));
+}
+
 TEST_F(TheWindowsFiles, AreMadeSavedAndOpenedAgainByTheMenu) {
     open();
     command("new");

@@ -78,12 +78,10 @@ std::vector<AutosaveSlot::Ptr> AutosaveSlot::abandoned(const QString& folder) {
 
 QDateTime AutosaveSlot::saved() const { return QFileInfo(mFile).lastModified(); }
 
-std::optional<Autosaved> AutosaveSlot::read() const {
+files::Result<Autosaved> AutosaveSlot::read() const {
     QFile file(mFile);
-    if (!file.open(QIODevice::ReadOnly)) return {};
-    const auto content = Autosaved::read(file.readAll());
-    if (!content) return {};
-    return *content;
+    if (!file.open(QIODevice::ReadOnly)) return files::Error{file.errorString().toStdString()};
+    return Autosaved::read(file.readAll());
 }
 
 std::optional<QString> AutosaveSlot::write(const QString& file, const QByteArray& bytes) {
@@ -93,5 +91,12 @@ std::optional<QString> AutosaveSlot::write(const QString& file, const QByteArray
 }
 
 void AutosaveSlot::remove() { QFile::remove(mFile); }
+
+QString AutosaveSlot::setAside() {
+    const QString aside = mFile + QStringLiteral(".unreadable");
+    QString name = aside;
+    for (int n = 2; QFile::exists(name); ++n) name = aside + u'.' + QString::number(n);
+    return QFile::rename(mFile, name) ? name : mFile;
+}
 
 } // namespace designer

@@ -41,11 +41,15 @@ public:
 
     const QString& file() const { return mFile; }
     QDateTime saved() const;
-    std::optional<Autosaved> read() const;
+    /// One line of what is wrong when it cannot be read.
+    files::Result<Autosaved> read() const;
     /// Replaces the file in one step. May be called from another thread; what the system said when
     /// it could not, or nothing.
     static std::optional<QString> write(const QString& file, const QByteArray& bytes);
     void remove();
+    /// Gives the file another name, under which it is no autosave any more and nobody removes it:
+    /// one that cannot be read now may be one day. Returns where it is.
+    QString setAside();
 
 private:
     explicit AutosaveSlot(const QString& file);

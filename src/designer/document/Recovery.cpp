@@ -3,6 +3,7 @@
 #include "designer/PlainBox.h"
 #include "designer/document/Autosave.h"
 #include "designer/document/QueryFile.h"
+#include "designer/statement/ModelWords.h"
 
 #include <QCoreApplication>
 #include <QFileInfo>
@@ -36,6 +37,16 @@ public:
         if (box.clickedButton() == recover) return Answer::recover;
         return box.clickedButton() == discard ? Answer::discard : Answer::later;
     }
+
+    static void tell(const QString& error, const QString& path, QWidget* window) {
+        PlainBox box(QMessageBox::Warning, tr("Recover query"),
+                     tr("The designer ended unexpectedly, and the changes that were kept safe "
+                        "cannot be read. They stay in the file \"%1\".")
+                         .arg(path),
+                     QMessageBox::Ok, window);
+        box.setInformativeText(inWords(error));
+        box.exec();
+    }
 };
 
 } // namespace
@@ -44,7 +55,8 @@ bool offerRecovery(QueryFile& file, Autosave& autosave, const QString& folder, Q
     for (auto& slot : AutosaveSlot::abandoned(folder)) {
         const auto saved = slot->read();
         if (!saved) {
-            slot->remove(); // nobody can read it
+            // It may be of a later version of the designer, which can.
+            Recovery::tell(QString::fromStdString(saved.error()), slot->setAside(), window);
             continue;
         }
         switch (Recovery::ask(saved->path, slot->saved(), window)) {

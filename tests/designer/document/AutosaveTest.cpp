@@ -255,12 +255,41 @@ TEST_F(AnAutosave, IsDeletedWhenTheUserDiscardsItAndKeptForLater) {
     EXPECT_FALSE(drawing.document.isModified());
 }
 
-TEST_F(AnAutosave, ThatCannotBeReadIsNotOffered) {
+TEST_F(AnAutosave, ThatCannotBeReadIsToldOnceAndKept) {
     ASSERT_TRUE(QDir().mkpath(folder()));
-    QFile broken(QDir(folder()).filePath(QStringLiteral("x.autosave")));
-    ASSERT_TRUE(broken.open(QIODevice::WriteOnly) && broken.write("{\"query\": \"") > 0);
-    broken.close();
+    const QString path = QDir(folder()).filePath(QStringLiteral("x.autosave"));
+    // As of a later version of the designer.
+    const QByteArray content =
+        R"({"file":"","query":"{\"format\": \"zandor-query\", \"version\": 1000}"})";
+    QFile kept(path);
+    ASSERT_TRUE(kept.open(QIODevice::WriteOnly) && kept.write(content) == content.size());
+    kept.close();
+    std::string told;
+    answering([&](QMessageBox& box) { told = textOf(box), box.accept(); },
+              [&] { EXPECT_FALSE(designer::offerRecovery(file, *started(), folder(), nullptr)); });
+    EXPECT_NE(told.find("is 1000 and newer than 2"), std::string::npos) << told;
+    EXPECT_NE(told.find("x.autosave.unreadable"), std::string::npos) << told;
+    EXPECT_EQ(saved().size(), 0);
+    QFile aside(path + QStringLiteral(".unreadable"));
+    ASSERT_TRUE(aside.open(QIODevice::ReadOnly));
+    EXPECT_EQ(aside.readAll(), content);
+
     const Answering noQuestion({});
     EXPECT_FALSE(designer::offerRecovery(file, *started(), folder(), nullptr));
-    EXPECT_EQ(saved().size(), 0);
+}
+
+TEST_F(AnAutosave, ThatCannotBeReadIsSetAsideBesideEarlierOnes) {
+    ASSERT_TRUE(QDir().mkpath(folder()));
+    const auto plant = [this](const QString& name, const QByteArray& content) {
+        QFile file(QDir(folder()).filePath(name));
+        ASSERT_TRUE(file.open(QIODevice::WriteOnly) && file.write(content) == content.size());
+    };
+    plant(QStringLiteral("x.autosave.unreadable"), "first");
+    plant(QStringLiteral("x.autosave"), "second");
+    answering([&](QMessageBox& box) { box.accept(); },
+              [&] { EXPECT_FALSE(designer::offerRecovery(file, *started(), folder(), nullptr)); });
+    QFile first(QDir(folder()).filePath(QStringLiteral("x.autosave.unreadable")));
+    ASSERT_TRUE(first.open(QIODevice::ReadOnly));
+    EXPECT_EQ(first.readAll(), "first");
+    EXPECT_EQ(QDir(folder()).entryList({QStringLiteral("x.*")}, QDir::Files).size(), 2);
 }
