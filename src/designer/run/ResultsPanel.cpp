@@ -62,6 +62,7 @@ void ResultsPanel::run() {
     const auto made = command(limit());
     if (!made) return;
     mSpool = std::make_shared<Spool>();
+    mAsked = asked();
     showSpool();
     mFitted = false;
     mPages->setCurrentWidget(mTable);
@@ -218,6 +219,7 @@ void ResultsPanel::finish(const Outcome& outcome) {
         break;
     }
     if (!exporting && mPages->currentWidget() == mTable && !mFitted) mTable->fitColumns();
+    queryChanged(); // while it ran
 }
 
 void ResultsPanel::askForFile() {
@@ -238,9 +240,17 @@ void ResultsPanel::forget() {
     showMessage(tr("Run the query to see its rows here."));
 }
 
+/// What the query asks for at the moment, of which places and widths are no part.
+platform::String ResultsPanel::asked() {
+    return model::sql::statementText(*mDocument.query(), mDatabase.dialect(),
+                                     model::sql::ValueForm::literal)
+        .text;
+}
+
 void ResultsPanel::queryChanged() {
-    if (mOutdated || isRunning() || !mSpool || mPages->currentWidget() != mTable) return;
-    mOutdated = true;
+    if (isRunning() || !mSpool || mPages->currentWidget() != mTable) return;
+    if (mOutdated == (asked() != mAsked)) return;
+    mOutdated = !mOutdated;
     showStatus();
 }
 

@@ -69,6 +69,7 @@ private:
     void askForFile();
     void runAll();
     void forget();
+    platform::String asked();
     void queryChanged();
     void showSpool();
     void sort(int column, Qt::SortOrder direction);
@@ -81,8 +82,9 @@ private:
     Database& mDatabase;
     QString mAddress; ///< where the rows that are shown came from
     QMap<QString, QString> mAnswers;
-    QString mStatement; ///< that ran last
-    QString mFile;      ///< that is being exported to; empty otherwise
+    QString mStatement;      ///< that ran last
+    platform::String mAsked; ///< by the query whose rows are shown
+    QString mFile;           ///< that is being exported to; empty otherwise
     std::shared_ptr<Spool> mSpool;
     WorkerPointer mWorker;
     QElapsedTimer mClock;

@@ -238,9 +238,30 @@ TEST_F(TheResultsPanel, SaysThatTheDrawingHasChanged) {
     ASSERT_TRUE(ended());
     document.change("Add a column", [](model::Query& query) { addColumn(query, {"numbers.n"}); });
     EXPECT_THAT(status(), HasSubstr("the drawing has changed since"));
+    document.undo();
+    EXPECT_EQ(status().find("changed"), std::string::npos);
+    document.redo();
     pressRun();
     ASSERT_TRUE(ended());
     EXPECT_EQ(status().find("changed"), std::string::npos);
+}
+
+TEST_F(TheResultsPanel, SaysNothingOfAChangeThatNoRowDependsOn) {
+    open(numbersTable(10));
+    show({"numbers"});
+    pressRun();
+    ASSERT_TRUE(ended());
+    document.change("Move", [](model::Query& query) { query.Tables().Item(1)->Left(3000); });
+    EXPECT_EQ(status().find("changed"), std::string::npos);
+}
+
+TEST_F(TheResultsPanel, SaysThatTheDrawingHasChangedWhileItRan) {
+    open(numbersTable(10));
+    show({"numbers"});
+    pressRun();
+    document.change("Add a column", [](model::Query& query) { addColumn(query, {"numbers.n"}); });
+    ASSERT_TRUE(ended());
+    EXPECT_THAT(status(), HasSubstr("the drawing has changed since"));
 }
 
 TEST_F(TheResultsPanel, ForgetsTheRowsAndMessagesOfAnotherQuery) {
