@@ -3,6 +3,7 @@
 #include "designer/document/Document.h"
 #include "model/files/QueryDocument.h"
 #include "platform/qt/GridModel.h"
+#include "platform/qt/PaneHandle.h"
 
 #include <QHeaderView>
 #include <QLabel>
@@ -137,10 +138,20 @@ TEST_F(TheWidthsOfTheDesigner, KeepTheRowsOfTheLastRun) {
 }
 
 TEST_F(TheWidthsOfTheDesigner, LeaveTheShareOfTheUpperPaneToTheSettings) {
-    window->drawing().control().setUpperPaneShare(0.5);
-    emit window->drawing().control().upperPaneShareChanged(0.5);
+    const double before = window->drawing().control().upperPaneShare();
+    EXPECT_NEAR(before, 0.6, 1e-6);
+    QWidget& handle = grid().handle();
+    const QPointF at(100, 3);
+    const QPointF up = at - QPointF(0, 40);
+    hands::mouse(handle, QEvent::MouseButtonPress, at, Qt::LeftButton, Qt::LeftButton);
+    hands::mouse(handle, QEvent::MouseMove, up, Qt::NoButton, Qt::LeftButton);
+    hands::mouse(handle, QEvent::MouseButtonRelease, at, Qt::LeftButton);
+    calm();
+    const double share = window->drawing().control().upperPaneShare();
+    EXPECT_LT(share, before - 0.02);
+    EXPECT_FALSE(window->document().isModified()) << "it is the window's, not the query's";
     open();
-    EXPECT_NEAR(window->drawing().control().upperPaneShare(), 0.5, 1e-6);
+    EXPECT_NEAR(window->drawing().control().upperPaneShare(), share, 1e-6);
     QSettings().setValue("window/paneShare", "wide");
     open();
     EXPECT_GE(window->drawing().control().upperPaneShare(), 0.05);
