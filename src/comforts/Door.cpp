@@ -207,7 +207,11 @@ std::optional<platform::String> Door::storedValue(std::int32_t row, std::int32_t
     }
     if (row == row::synonym) return definition->Synonym();
     const String key = platform::decimal(row);
-    return definition->HasCriterium(key) ? definition->Criteria().Item(key)->Criterium() : String();
+    if (!definition->HasCriterium(key)) return String();
+    return control()
+        .List(definition, &TalvikZandorLib::ZDColumnDefinition::Criteria)
+        .Item(key)
+        ->Criterium();
 }
 
 void Door::set(Editor editor) {

@@ -450,6 +450,7 @@ private:
     Part<platform::Frame> fraTable;
     ControlArray<platform::Line> linJoin;
     ControlArray<platform::Shape> shpJoin;
+    Held<platform::ImageList> imgListTabulet;
     ControlArray<Tabulet> lstTable;
     Part<MSFlexGridLib::MSFlexGrid> sprColumn;
     Part<platform::ScrollBar> hsbTable;

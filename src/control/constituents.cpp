@@ -37,6 +37,8 @@ Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, Za
                   return mToolkit->makeShape({.Name = u"shpJoin", .Container = fraTable.get()},
                                              index);
               }),
+      imgListTabulet(
+          mLife, toolkit.makeImageList({.Name = u"imgListTabulet"}, {platform::Picture::key})),
       lstTable(mLife,
                [this](std::int16_t index, const Tabulet* pattern) {
                    return mToolkit->makeTabulet(
@@ -106,6 +108,7 @@ Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, Za
                                  {.Click = [this] { cmdSetTextValue_Click(); }, .GotFocus = {}})),
       mnuZandor(mLife,
                 toolkit.makePopupMenu({.Name = u"mnuZandor"}, [this] { mnuZandor_Click(); })) {
+    lstTable(0)->Images(imgListTabulet);
     MakeMenu();
     UserControl_Initialize();
 }

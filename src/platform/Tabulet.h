@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/Control.h"
+#include "platform/ImageList.h"
 #include "platform/Ref.h"
 
 #include <functional>
@@ -27,7 +28,8 @@ public:
     virtual const String& Key() const = 0;
     virtual bool Selected() const = 0;
     virtual void Selected(bool value) = 0;
-    /// 1 marks the column, 0 does not.
+    /// The number of the image beside the text, from the list that the table list has then; 0, or
+    /// one that the list has not: none. The control marks a column with 1.
     virtual void Image(std::int16_t value) = 0;
     /// Whether the column is shown as one that comes out in the query's rows.
     virtual void ComesOut(bool value) = 0;
@@ -61,6 +63,8 @@ public:
     virtual void Visible(bool value) = 0;
     virtual void Activated(bool value) = 0;
     virtual void Font(const platform::Font& value) = 0;
+    /// What the images of its entries are taken from; it has none at first.
+    virtual void Images(const Ref<platform::ImageList>& value) = 0;
     /// Unique among the live table lists of the process, never 0.
     virtual std::int32_t TableHandle() const = 0;
     virtual ColumnList& ColumnItems() = 0;

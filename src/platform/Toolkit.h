@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/ImageList.h"
 #include "platform/Intrinsic.h"
 #include "platform/MSFlexGrid.h"
 #include "platform/PickList.h"
@@ -41,8 +42,12 @@ public:
     /// Closed at first.
     virtual std::unique_ptr<PickList> makePickList(const Design& design, PickListEvents events) = 0;
 
-    /// Elements of control arrays stand inside design.Container. A table list takes its font from
-    /// the pattern, the array's element 0 (nullptr when element 0 itself is made), and starts
+    /// The pictures have the numbers from 1 on.
+    virtual Ref<ImageList> makeImageList(const Design& design,
+                                         const std::vector<Picture>& pictures) = 0;
+
+    /// Elements of control arrays stand inside design.Container. A table list takes font and images
+    /// from the pattern, the array's element 0 (nullptr when element 0 itself is made), and starts
     /// invisible; `events` outlives the element.
     virtual Ref<TalvikTabulet::Tabulet> makeTabulet(const Design& design, std::int16_t index,
                                                     const TalvikTabulet::Tabulet* pattern,

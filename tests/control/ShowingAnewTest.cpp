@@ -122,6 +122,7 @@ TEST_F(ShowingAnew, AddsATableThatHasComeInAFreeSlot) {
     EXPECT_EQ(table(3).text, u"ITEMS");
     EXPECT_EQ(table(3).bounds, (platform::Bounds{300, 4500, 1800, 1500}));
     EXPECT_EQ(table(3).items, (Texts{u"*", u"ID"}));
+    EXPECT_EQ(table(3).keys, Texts{u"ID"});
     EXPECT_TRUE(table(3).visible);
     EXPECT_EQ(Backstage::mActiveTableIndex(control()), before) << "the current table stays";
 }

@@ -20,6 +20,29 @@ TEST_F(ShowingTables, GivesEachTableTheNextSlotWithItsNameAndKey) {
     EXPECT_TRUE(slotIsFree(3));
 }
 
+TEST_F(ShowingTables, ShowsTheFirstImageBesideMarkedColumns) {
+    const auto orders = model->table(u"ORDERS", {u"ID", u"LINE", u"TOTAL"});
+    orders->column(u"ID").marker = true;
+    orders->column(u"LINE").marker = true;
+    model->table(u"NOTES", {u"TEXT"});
+    bind();
+
+    using Names = std::vector<String>;
+    EXPECT_EQ(look(1).keys, (Names{u"ID", u"LINE"}));
+    EXPECT_EQ(look(2).keys, Names{});
+}
+
+TEST_F(ShowingTables, HasImagesForNumbersInItsListAlone) {
+    model->table(u"ORDERS", {u"ID"});
+    bind();
+
+    const auto entry = element(1)->ColumnItems().Item(1);
+    for (const int number : {1, 0, 1, 2, 1, -1}) {
+        entry->Image(static_cast<std::int16_t>(number));
+        EXPECT_EQ(look(1).keys.size(), number == 1 ? 1U : 0U) << number;
+    }
+}
+
 TEST_F(ShowingTables, PutsATableWhereTheModelSays) {
     model->table(u"A")->place(300, 450, 1500, 1200);
     bind();

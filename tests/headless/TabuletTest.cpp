@@ -74,15 +74,33 @@ TEST(ATableList, HasAHandleOfItsOwn) {
     EXPECT_NE(t.first->TableHandle(), other.first->TableHandle());
 }
 
-TEST(ATableList, TakesItsFontFromThePatternAndStartsInvisible) {
+TEST(AnEntry, HasTheImageOfItsNumberFromTheListThatItsTableListHas) {
+    Tables t;
+    const auto entry = t.first->ColumnItems().Item(1);
+    const auto& seen = t.look<headless::Tabulet>("lstTable(1)").entry(1);
+    entry->Image(1);
+    EXPECT_EQ(seen.picture(), std::nullopt) << "there is no list yet";
+
+    t.first->Images(t.toolkit.makeImageList({.Name = u"images"}, {platform::Picture::key}));
+    EXPECT_EQ(t.look<headless::ImageList>("images").pictures().size(), 1U);
+    entry->Image(1);
+    EXPECT_EQ(seen.picture(), platform::Picture::key);
+    entry->Image(2);
+    EXPECT_EQ(seen.picture(), std::nullopt) << "the list has one image";
+}
+
+TEST(ATableList, TakesItsFontAndItsImagesFromThePatternAndStartsInvisible) {
     Tables t;
     t.first->Font({u"Segoe UI", 9});
+    t.first->Images(t.toolkit.makeImageList({.Name = u"images"}, {platform::Picture::key}));
     const TalvikTabulet::TabuletEvents events;
     auto made = t.toolkit.makeTabulet(
         {.Name = u"lstTable", .FontName = u"MS Sans Serif", .Container = t.canvas.get()}, 3,
         t.first.get(), events);
     EXPECT_EQ(t.look<headless::Tabulet>("lstTable(3)").look().font.Name, u"Segoe UI");
     EXPECT_FALSE(made->Visible());
+    made->ColumnItems().Add(u"k", u"ID")->Image(1);
+    EXPECT_EQ(t.look<headless::Tabulet>("lstTable(3)").entry(1).picture(), platform::Picture::key);
     auto pattern = t.toolkit.makeTabulet({.Name = u"lstTable", .FontName = u"MS Sans Serif"}, 0,
                                          nullptr, events);
     EXPECT_EQ(t.look<headless::Tabulet>("lstTable(0)").look().font.Name, u"MS Sans Serif");

@@ -52,6 +52,12 @@ TEST_F(TheDesign, PutsTheTablesAndTheJoinsIntoTheCanvas) {
         EXPECT_EQ(containerOf(name), "fraTable") << name;
 }
 
+TEST_F(TheDesign, HasAKeyAsTheFirstImageForTheTables) {
+    using platform::Picture;
+    const auto& images = headless().find<platform::headless::ImageList>("imgListTabulet");
+    EXPECT_EQ(images.pictures(), std::vector<Picture>{Picture::key});
+}
+
 TEST_F(TheDesign, CaptionsTheCanvas) { EXPECT_EQ(look("fraTable").text, u"Frame1"); }
 
 TEST_F(TheDesign, PutsTheOtherPartsOntoItsOwnSurface) {

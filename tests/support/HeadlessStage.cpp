@@ -224,6 +224,7 @@ private:
                 seen.items.push_back(entry.text());
                 if (entry.selected()) seen.selected.push_back(entry.text());
                 if (entry.comesOut()) seen.output.push_back(entry.text());
+                if (entry.picture() == platform::Picture::key) seen.keys.push_back(entry.text());
             }
         }
     }

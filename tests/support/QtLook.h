@@ -48,6 +48,8 @@ inline void lookAtKind(QWidget& widget, Stage::Seen& seen) {
             using platform::qt::ColumnListModel;
             if (table->model().index(row).data(ColumnListModel::outputRole).toBool())
                 seen.output.push_back(seen.items.back());
+            if (table->model().picture(row) == platform::Picture::key)
+                seen.keys.push_back(seen.items.back());
             if (table->list().selectionModel()->isRowSelected(row))
                 seen.selected.push_back(seen.items.back());
         }

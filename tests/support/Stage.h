@@ -48,6 +48,7 @@ public:
         std::vector<String> items;                        ///< combo boxes, table lists, "lstFields"
         std::vector<String> selected; ///< table lists: texts of selected entries
         std::vector<String> output;   ///< table lists: texts of entries marked as coming out
+        std::vector<String> keys;     ///< table lists: texts of entries that show a key
     };
 
     /// A menu entry at the moment the menu stands open.

@@ -52,6 +52,7 @@ void ColumnItem::Selected(bool value) {
 void ColumnItem::Image(std::int16_t value) {
     called("ColumnItem.Image");
     mImage = value;
+    mPicture = mTable && mTable->mImages ? mTable->mImages->Image(value) : std::nullopt;
 }
 
 void ColumnItem::ComesOut(bool value) {
@@ -141,6 +142,16 @@ void Tabulet::Activated(bool value) {
 void Tabulet::Font(const platform::Font& value) {
     called("Font");
     mLook.font = value;
+}
+
+void Tabulet::Images(const Ref<platform::ImageList>& value) {
+    called("Images");
+    mImages = value;
+}
+
+void Tabulet::takeLookOf(const Tabulet& pattern) {
+    mLook.font = pattern.mLook.font;
+    mImages = pattern.mImages;
 }
 
 std::int32_t Tabulet::TableHandle() const {

@@ -28,6 +28,8 @@ public:
 
     const String& text() const { return mText; }
     std::int16_t image() const { return mImage; }
+    /// What stands beside the text.
+    std::optional<Picture> picture() const { return mPicture; }
     bool comesOut() const { return mComesOut; }
     bool selected() const { return mSelected; }
     /// What the list shows: the selection as it was when the entry was last drawn.
@@ -46,6 +48,7 @@ private:
     String mKey;
     String mText;
     std::int16_t mImage = 0;
+    std::optional<Picture> mPicture;
     bool mComesOut = false;
     bool mSelected = false;
     bool mDrawnSelected = false;
@@ -65,6 +68,7 @@ public:
     void Visible(bool value) override;
     void Activated(bool value) override;
     void Font(const platform::Font& value) override;
+    void Images(const Ref<platform::ImageList>& value) override;
     std::int32_t TableHandle() const override;
     TalvikTabulet::ColumnList& ColumnItems() override;
     Ref<TalvikTabulet::ColumnItem> ColumnAt(float X, float Y) const override;
@@ -91,7 +95,8 @@ public:
     TalvikTabulet::Point emptyPlace() const;
     /// Makes an entry the first visible row. Scroll fires when that changes anything.
     void scrollTo(std::int32_t position);
-    void takeFontOf(const Tabulet& pattern) { mLook.font = pattern.mLook.font; }
+    /// Its font and its images.
+    void takeLookOf(const Tabulet& pattern);
     /// As the user leaves it with the mouse.
     void drag(const Bounds& bounds) { place(bounds); }
 
@@ -112,6 +117,7 @@ private:
     String mTag;
     bool mActivated = false;
     int mCompletions = 0;
+    Ref<platform::ImageList> mImages;
     std::int32_t mFirstVisible = 1;
     std::vector<Ref<TalvikTabulet::ColumnItem>> mItems;
 };

@@ -114,6 +114,12 @@ std::unique_ptr<platform::PickList> Toolkit::makePickList(const Design& design,
     return std::make_unique<PickList>(*this, design, containerOf(design), std::move(events));
 }
 
+Ref<platform::ImageList> Toolkit::makeImageList(const Design& design,
+                                                const std::vector<Picture>& pictures) {
+    called("makeImageList");
+    return makeRef<ImageList>(*this, design, pictures);
+}
+
 Ref<TalvikTabulet::Tabulet> Toolkit::makeTabulet(const Design& design, std::int16_t index,
                                                  const TalvikTabulet::Tabulet* pattern,
                                                  const TalvikTabulet::TabuletEvents& events) {
@@ -121,7 +127,7 @@ Ref<TalvikTabulet::Tabulet> Toolkit::makeTabulet(const Design& design, std::int1
     const ElementDesign element(design, index);
     Element* container = containerOf(design);
     auto table = makeRef<Tabulet>(*this, element.design, container, index, events);
-    if (pattern) table->takeFontOf(dynamic_cast<const Tabulet&>(*pattern));
+    if (pattern) table->takeLookOf(dynamic_cast<const Tabulet&>(*pattern));
     return std::shared_ptr<TalvikTabulet::Tabulet>(table);
 }
 

@@ -5,6 +5,7 @@
 #include "platform/headless/Dialog.h"
 #include "platform/headless/Faults.h"
 #include "platform/headless/Grid.h"
+#include "platform/headless/ImageList.h"
 #include "platform/headless/Intrinsic.h"
 #include "platform/headless/Menu.h"
 #include "platform/headless/PickList.h"
@@ -109,6 +110,8 @@ public:
                                                  DialogEvents events) override;
     std::unique_ptr<platform::PickList> makePickList(const Design& design,
                                                      PickListEvents events) override;
+    Ref<platform::ImageList> makeImageList(const Design& design,
+                                           const std::vector<Picture>& pictures) override;
     Ref<TalvikTabulet::Tabulet> makeTabulet(const Design& design, std::int16_t index,
                                             const TalvikTabulet::Tabulet* pattern,
                                             const TalvikTabulet::TabuletEvents& events) override;

@@ -1,7 +1,7 @@
 #include "platform/qt/ColumnDelegate.h"
 
 #include "platform/qt/ColumnListModel.h"
-#include "platform/qt/KeyMarker.h"
+#include "platform/qt/Images.h"
 #include "platform/qt/OutputMarker.h"
 #include "platform/qt/ShownText.h"
 
@@ -37,10 +37,11 @@ void ColumnDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option
         item.palette.color(group, selected ? QPalette::HighlightedText : QPalette::Text);
     const qreal side = item.fontMetrics.height() - 2;
     const qreal top = item.rect.center().y() + 0.5 - side / 2;
-    if (index.data(ColumnListModel::markedRole).toBool()) {
-        QColor key = colour;
-        if (!selected) key.setAlphaF(0.75F);
-        paintKeyMarker(*painter, {item.rect.left() + 3.0, top, side, side}, key);
+    if (const QVariant picture = index.data(ColumnListModel::pictureRole); picture.isValid()) {
+        QColor softer = colour;
+        if (!selected) softer.setAlphaF(0.75F);
+        paintPicture(*painter, static_cast<Picture>(picture.toInt()),
+                     {item.rect.left() + 3.0, top, side, side}, softer);
     }
     const bool comesOut = index.data(ColumnListModel::outputRole).toBool();
     if (comesOut)

@@ -13,7 +13,8 @@ int ColumnListModel::rowCount(const QModelIndex& parent) const {
 QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid() || index.row() >= rowCount()) return {};
     if (role == Qt::DisplayRole) return mRows[static_cast<std::size_t>(index.row())].shown;
-    if (role == markedRole) return marked(index.row());
+    if (role == pictureRole && picture(index.row()))
+        return static_cast<int>(*picture(index.row()));
     if (role == outputRole) return at(index.row()).comesOut;
     if (role == Qt::AccessibleDescriptionRole) return description(at(index.row()));
     return {};
@@ -21,7 +22,7 @@ QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
 
 QVariant ColumnListModel::description(const Row& row) {
     QStringList parts;
-    if (row.marked) parts += tr("key column");
+    if (row.picture == Picture::key) parts += tr("key column");
     if (row.comesOut) parts += tr("comes out");
     return parts.isEmpty() ? QVariant() : parts.join(QStringLiteral(", "));
 }
@@ -29,13 +30,13 @@ QVariant ColumnListModel::description(const Row& row) {
 void ColumnListModel::append(const QString& text) {
     const int row = rowCount();
     beginInsertRows({}, row, row);
-    mRows.push_back({text, asSigns(text), false});
+    mRows.push_back({.text = text, .shown = asSigns(text)});
     endInsertRows();
 }
 
-void ColumnListModel::setMarked(int row, bool marked) {
-    if (std::exchange(mRows[static_cast<std::size_t>(row)].marked, marked) == marked) return;
-    Q_EMIT dataChanged(index(row), index(row), {markedRole, Qt::AccessibleDescriptionRole});
+void ColumnListModel::setPicture(int row, std::optional<Picture> picture) {
+    if (std::exchange(at(row).picture, picture) == picture) return;
+    Q_EMIT dataChanged(index(row), index(row), {pictureRole, Qt::AccessibleDescriptionRole});
 }
 
 void ColumnListModel::setComesOut(int row, bool comesOut) {

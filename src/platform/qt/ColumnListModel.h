@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/ImageList.h"
+
 #include <QAbstractListModel>
 #include <QCoreApplication>
 
@@ -12,8 +14,8 @@ class ColumnListModel : public QAbstractListModel {
     Q_DECLARE_TR_FUNCTIONS(platform::qt::ColumnListModel)
 
 public:
-    /// Whether the column is marked.
-    static constexpr int markedRole = Qt::UserRole;
+    /// What the image before the name shows, as a number; nothing without one.
+    static constexpr int pictureRole = Qt::UserRole;
     /// Whether the column comes out in the query's rows.
     static constexpr int outputRole = Qt::UserRole + 1;
 
@@ -23,9 +25,9 @@ public:
     QVariant data(const QModelIndex& index, int role) const override;
 
     const QString& text(int row) const { return mRows[static_cast<std::size_t>(row)].text; }
-    bool marked(int row) const { return mRows[static_cast<std::size_t>(row)].marked; }
+    std::optional<Picture> picture(int row) const { return at(row).picture; }
     void append(const QString& text);
-    void setMarked(int row, bool marked);
+    void setPicture(int row, std::optional<Picture> picture);
     void setComesOut(int row, bool comesOut);
     void clear();
 
@@ -33,7 +35,7 @@ private:
     struct Row {
         QString text;
         QString shown;
-        bool marked = false;
+        std::optional<Picture> picture;
         bool comesOut = false;
     };
 

@@ -10,6 +10,7 @@
 #include "platform/qt/GridAdapter.h"
 #include "platform/qt/GridModel.h"
 #include "platform/qt/HomeButton.h"
+#include "platform/qt/Images.h"
 #include "platform/qt/Inputs.h"
 #include "platform/qt/JoinSentence.h"
 #include "platform/qt/MessageBox.h"
@@ -180,6 +181,10 @@ std::unique_ptr<PickList> QtToolkit::makePickList(const Design& design, PickList
     return adapt<PickListAdapter>(design, Role::frame, list);
 }
 
+Ref<ImageList> QtToolkit::makeImageList(const Design&, const std::vector<Picture>& pictures) {
+    return std::make_shared<Images>(pictures);
+}
+
 Ref<TalvikTabulet::Tabulet> QtToolkit::makeTabulet(const Design& design, std::int16_t index,
                                                    const TalvikTabulet::Tabulet* pattern,
                                                    const TalvikTabulet::TabuletEvents& events) {
@@ -190,7 +195,10 @@ Ref<TalvikTabulet::Tabulet> QtToolkit::makeTabulet(const Design& design, std::in
     if (const auto* holder = dynamic_cast<const WidgetHolder*>(pattern);
         holder && holder->widget() && holder->widget()->testAttribute(Qt::WA_SetFont))
         box->setFont(holder->widget()->font());
-    return std::make_shared<TabuletAdapter>(box, mFocus, mTables, index, events);
+    auto table = std::make_shared<TabuletAdapter>(box, mFocus, mTables, index, events);
+    if (const auto* shown = dynamic_cast<const TabuletAdapter*>(pattern))
+        table->Images(shown->images());
+    return table;
 }
 
 Ref<Line> QtToolkit::makeLine(const Design& design, std::int16_t index) {

@@ -49,6 +49,8 @@ public:
     std::unique_ptr<PopupMenu> makePopupMenu(const Design& design, PlainEvent Click) override;
     std::unique_ptr<Dialog> makeDialog(const Design& design, DialogEvents events) override;
     std::unique_ptr<PickList> makePickList(const Design& design, PickListEvents events) override;
+    Ref<ImageList> makeImageList(const Design& design,
+                                 const std::vector<Picture>& pictures) override;
     Ref<TalvikTabulet::Tabulet> makeTabulet(const Design& design, std::int16_t index,
                                             const TalvikTabulet::Tabulet* pattern,
                                             const TalvikTabulet::TabuletEvents& events) override;

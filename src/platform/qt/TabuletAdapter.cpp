@@ -49,7 +49,9 @@ public:
     }
 
     void Image(std::int16_t value) override {
-        if (live()) mTable->mWidget->model().setMarked(mRow, value == 1);
+        if (!live()) return;
+        const auto& images = mTable->mImages;
+        mTable->mWidget->model().setPicture(mRow, images ? images->Image(value) : std::nullopt);
     }
 
     void ComesOut(bool value) override {

@@ -38,6 +38,8 @@ public:
     void Visible(bool value) override;
     void Activated(bool value) override;
     void Font(const platform::Font& value) override;
+    void Images(const Ref<ImageList>& value) override { mImages = value; }
+    const Ref<ImageList>& images() const { return mImages; }
     std::int32_t TableHandle() const override { return mHandle; }
     TalvikTabulet::ColumnList& ColumnItems() override { return mEntries; }
     Ref<TalvikTabulet::ColumnItem> ColumnAt(float X, float Y) const override;
@@ -91,6 +93,7 @@ private:
     Entries mEntries{*this};
     String mText;
     String mTag;
+    Ref<ImageList> mImages;
     bool mVisible = false;
     bool mEntryTaken = false; ///< the control has selected an entry
     Bounds mGestureStart;

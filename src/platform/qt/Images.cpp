@@ -1,11 +1,13 @@
-#include "platform/qt/KeyMarker.h"
+#include "platform/qt/Images.h"
 
 #include <QPainter>
 #include <QPainterPath>
 
 namespace platform::qt {
 
-void paintKeyMarker(QPainter& painter, const QRectF& square, const QColor& colour) {
+namespace {
+
+void paintKey(QPainter& painter, const QRectF& square, const QColor& colour) {
     painter.save();
     painter.setRenderHint(QPainter::Antialiasing);
     painter.translate(square.topLeft());
@@ -21,6 +23,19 @@ void paintKeyMarker(QPainter& painter, const QRectF& square, const QColor& colou
     shaft.addRect(QRectF(10, 8, 2, 3.2));
     painter.fillPath(bow.subtracted(hole).united(shaft), colour);
     painter.restore();
+}
+
+} // namespace
+
+std::optional<Picture> Images::Image(std::int16_t number) const {
+    if (number < 1 || static_cast<std::size_t>(number) > mPictures.size()) return {};
+    return mPictures[static_cast<std::size_t>(number) - 1];
+}
+
+void paintPicture(QPainter& painter, Picture picture, const QRectF& square, const QColor& colour) {
+    switch (picture) {
+    case Picture::key: return paintKey(painter, square, colour);
+    }
 }
 
 } // namespace platform::qt
