@@ -163,7 +163,8 @@ std::string interfacePage() {
               "## Texts and flags\n\n"
               "Plain values. They take effect where they are read next: menu flags when a model is "
               "handed over, grid titles when `OnlyJoin` is set to False, the other texts when the "
-              "menu or the dialog opens.\n");
+              "menu or the dialog opens. What is shown and spoken beside these texts is listed in "
+              "[words.md](words.md).\n");
     page.row("Dispatch id", "Name", "Type", "Default", "Meaning");
     page.text("|---|---|---|---|---|");
     page.describedRows(Kind::field, control);

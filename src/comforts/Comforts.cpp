@@ -14,6 +14,7 @@ void Comforts::attach(TalvikDBxZandor::Zandor& control) {
     mDoor->listen(
         {.EditorOpened = [this] { editorOpened(*std::shared_ptr(mDoor)); },
          .EditorsClosing = [this] { editorsClosing(*std::shared_ptr(mDoor)); },
+         .LaidOut = [this] { laidOut(*std::shared_ptr(mDoor)); },
          .Bound = [this] { act(u"bound", [this](Door& door) { return bound(door), true; }); },
          .CellWritten =
              [this](auto column) {
@@ -35,7 +36,7 @@ void Comforts::detach() {
     mRename.reset();
 }
 
-void Comforts::setWords(const Words& words) {
+void Comforts::setWords(const platform::Words& words) {
     mWords = words;
     if (mRename) mRename->Caption(mWords.Rename);
     if (mFlags.ReadsJoins) readJoins(true);
@@ -68,6 +69,7 @@ void Comforts::bound(Door& door) {
     markFindings(door);
     if (mFlags.FitsColumns) readWidths(door);
     fitAll(door);
+    placeEditor(door);
 }
 
 void Comforts::raised(TalvikDBxZandor::Event event,

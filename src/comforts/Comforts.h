@@ -2,11 +2,11 @@
 
 #include "comforts/Field.h"
 #include "comforts/Flags.h"
-#include "comforts/Words.h"
 #include "control/Events.h"
 #include "control/Hooks.h"
 #include "platform/Tabulet.h"
 #include "platform/Toolkit.h"
+#include "platform/Words.h"
 
 #include <map>
 #include <memory>
@@ -49,8 +49,8 @@ public:
 
     const Flags& flags() const { return mFlags; }
     void setFlags(const Flags& flags);
-    const Words& words() const { return mWords; }
-    void setWords(const Words& words);
+    const platform::Words& words() const { return mWords; }
+    void setWords(const platform::Words& words);
 
     /// An event of the control, on its way to the host.
     void raised(TalvikDBxZandor::Event event, const TalvikDBxZandor::EventArguments& arguments);
@@ -107,7 +107,9 @@ public:
     /// model; the editor and the control's own model stay as they are. Returns whether there was
     /// anything that is not in the model yet.
     bool writeTyping(const platform::Ref<TalvikZandorLib::Zandor>& copy);
-    /// A printable text typed while the grid has the focus, for its current cell.
+    /// A printable text typed while the grid has the focus, for its current cell. An empty one is
+    /// about to be composed by an input method: the editor that will have it opens with its value,
+    /// but not a list, which has no use for a text before it is whole.
     bool cellTyped(const String& text);
     /// A key in an open editor. The caret counts as at an end of the text when nothing is selected
     /// and the key would not move it on; in a list it is at both.
@@ -140,6 +142,8 @@ private:
 
     void editorOpened(Door& door);
     void editorsClosing(Door& door);
+    void laidOut(Door& door);
+    void placeEditor(Door& door);
     void bound(Door& door);
     bool offerFields(Door& door, std::int32_t column, const String& typed);
     void fieldPicked(std::int32_t position);
@@ -159,7 +163,7 @@ private:
 
     platform::Toolkit& mToolkit;
     Flags mFlags;
-    Words mWords;
+    platform::Words mWords;
     std::unique_ptr<platform::MenuEntry> mRename;
     std::shared_ptr<Door> mDoor;
     std::optional<Typing> mTyping;

@@ -187,6 +187,20 @@ Editor Door::editor() const {
     return Editor::none;
 }
 
+void Door::dropDown() {
+    if (editor() == Editor::sortOrder) control().cobSortOrder->DropDown();
+    if (editor() == Editor::visibility) control().cobVisibility->DropDown();
+}
+
+void Door::placeEditor() {
+    switch (editor()) {
+    case Editor::text: return control().PlaceEditor(control().fraValue);
+    case Editor::sortOrder: return control().PlaceEditor(control().fraSortOrder);
+    case Editor::visibility: return control().PlaceEditor(control().fraVisibility);
+    case Editor::none: break;
+    }
+}
+
 platform::String Door::editorValue() const {
     switch (editor()) {
     case Editor::text: return control().txtValue->Text();

@@ -14,6 +14,7 @@ enum class Editor { none, text, sortOrder, visibility };
 namespace row {
 inline constexpr std::int32_t field = 0;
 inline constexpr std::int32_t synonym = 1;
+inline constexpr std::int32_t sort = 2;
 inline constexpr std::int32_t visible = 3;
 } // namespace row
 
@@ -125,6 +126,10 @@ public:
     // Editors
     Editor editor() const;
     void openEditor() { control().EditCell(); }
+    /// Drops the list of the open editor down.
+    void dropDown();
+    /// Brings the open editor over the current cell.
+    void placeEditor();
     void closeEditors() { control().MakeGetValueFieldsInvisible(); }
     /// What stands in the open editor: its text, or the number of the item chosen.
     String editorValue() const;

@@ -8,7 +8,8 @@ struct Flags {
     bool AddsOnDoubleClick = false; ///< a double click on an entry makes it an output column
 
     /// What is typed or chosen in a cell's editor is kept however the editor is left, but for
-    /// Escape; typing in a cell opens its editor; a choice in a list needs no "&Set".
+    /// Escape; typing in a cell opens its editor, which stays over its cell when that moves; a list
+    /// drops down with its editor, and a choice in it needs no "&Set".
     bool KeepsTyping = false;
 
     /// Entries whose columns come out in the rows are marked in their tables.

@@ -33,6 +33,7 @@ void Comforts::editorOpened(Door& door) {
             door.chooseVisibility(definition->Visible());
     typing.value = door.editorValue();
     mTyping = std::move(typing);
+    if (door.editor() != Editor::text) door.dropDown();
 }
 
 /// Whoever has the editors closed: what is in the open one goes into the cell that it was opened
@@ -53,6 +54,19 @@ void Comforts::editorsClosing(Door& door) {
     door.goTo(typing->row, column);
     door.set(editor);
     if (door.isOpen()) door.goTo(row, col);
+}
+
+/// An open editor goes where its cell has gone.
+void Comforts::placeEditor(Door& door) {
+    if (!mTyping || door.model() != mTyping->model) return;
+    const auto& grid = door.grid();
+    if (grid.Row() == mTyping->row && grid.ColData(grid.Col()) == mTyping->keyNumber)
+        door.placeEditor();
+}
+
+void Comforts::laidOut(Door& door) {
+    placeEditor(door);
+    if (mFields && mFields->IsOpen()) mFields->Close();
 }
 
 void Comforts::takeOver() {
@@ -84,6 +98,7 @@ bool Comforts::cellTyped(const String& text) {
         if (mFlags.OffersFields && row == row::field) return offerFields(door, column, text);
         if (mFlags.OffersFields && !door.isUsed(column)) return true;
         if (!mFlags.KeepsTyping || row == row::field || !door.isUsed(column)) return false;
+        if (text.empty() && (row == row::sort || row == row::visible)) return true;
         if (row == row::visible && text == u" ") {
             const auto definition = door.definitionOf(column);
             if (!definition) return false;
@@ -93,7 +108,7 @@ bool Comforts::cellTyped(const String& text) {
         }
         door.showCurrentCell();
         door.openEditor();
-        if (door.isOpen() && door.editor() == Editor::text) door.type(text);
+        if (door.isOpen() && door.editor() == Editor::text && !text.empty()) door.type(text);
         return true;
     });
 }

@@ -22,6 +22,7 @@ struct PlacedJoin {
 struct Hooks {
     platform::PlainEvent EditorOpened;   ///< over the grid's current cell, with the cell's value
     platform::PlainEvent EditorsClosing; ///< about to be hidden without being set
+    platform::PlainEvent LaidOut;        ///< the constituents have the places of the moment
     platform::PlainEvent Bound;          ///< the model is shown afresh
     std::function<void(std::int32_t column)> CellWritten; ///< of the grid, with its alignment
     std::function<void(const PlacedJoin& join, platform::Line& line)> JoinPlaced;

@@ -37,7 +37,7 @@ TablePicture pictureOf(const Life& life, const Held<ZDTable>& table) {
 /// Texts that the editors of the cells read as what they say: a column that is not shown is "Not
 /// Visible", and one that is not sorted says nothing.
 DefinitionPicture pictureOf(const Life& life, const Held<ZDColumnDefinition>& definition,
-                            std::size_t rows) {
+                            std::size_t rows, const platform::Words& words) {
     constexpr std::size_t firstCriterion = 4;
     const String key = definition->Key();
     DefinitionPicture result{.number = isKeyOfNumber(key) ? numberOfKey(key) : 0,
@@ -47,9 +47,9 @@ DefinitionPicture pictureOf(const Life& life, const Held<ZDColumnDefinition>& de
     result.cells.at(0) = column ? column->Name() : u"?";
     result.cells.at(1) = definition->Synonym();
     const std::int16_t order = definition->SortOrder();
-    if (order == 1) result.cells.at(2) = u"Ascending";
-    if (order == 2) result.cells.at(2) = u"Descending";
-    result.cells.at(3) = definition->Visible() ? u"Visible" : u"Not Visible";
+    if (order == 1) result.cells.at(2) = words.Ascending;
+    if (order == 2) result.cells.at(2) = words.Descending;
+    result.cells.at(3) = definition->Visible() ? words.Visible : words.NotVisible;
     std::size_t row = firstCriterion;
     for (const auto& criterium : list(life, definition, &ZDColumnDefinition::Criteria)) {
         if (row == rows) break;
@@ -61,7 +61,8 @@ DefinitionPicture pictureOf(const Life& life, const Held<ZDColumnDefinition>& de
 } // namespace
 
 QueryPicture pictureOf(const Life& life, const Held<TalvikZandorLib::Zandor>& model,
-                       std::size_t tables, std::size_t definitions, std::size_t rows) {
+                       std::size_t tables, std::size_t definitions, std::size_t rows,
+                       const platform::Words& words) {
     using Query = TalvikZandorLib::Zandor;
     QueryPicture picture;
     for (const auto& table : list(life, model, &Query::Tables)) {
@@ -86,7 +87,7 @@ QueryPicture pictureOf(const Life& life, const Held<TalvikZandorLib::Zandor>& mo
     }
     for (const auto& definition : list(life, model, &Query::ColumnDefinitions)) {
         if (picture.definitions.size() == definitions) break;
-        picture.definitions.push_back(pictureOf(life, definition, rows));
+        picture.definitions.push_back(pictureOf(life, definition, rows, words));
     }
     return picture;
 }

@@ -2,6 +2,7 @@
 
 #include "control/Reached.h"
 #include "platform/TalvikZandorLib.h"
+#include "platform/Words.h"
 
 #include <vector>
 
@@ -57,6 +58,7 @@ struct QueryPicture {
 /// no line can show, from a table to itself or with an end lost; and the first definitions, with
 /// the texts of as many rows. An error of the model passes through; ends in quiet with the control.
 QueryPicture pictureOf(const Life& life, const Held<TalvikZandorLib::Zandor>& model,
-                       std::size_t tables, std::size_t definitions, std::size_t rows);
+                       std::size_t tables, std::size_t definitions, std::size_t rows,
+                       const platform::Words& words);
 
 } // namespace TalvikDBxZandor

@@ -12,6 +12,7 @@
 #include "platform/KeyedCollection.h"
 #include "platform/TalvikZandorLib.h"
 #include "platform/Toolkit.h"
+#include "platform/Words.h"
 
 #include <optional>
 
@@ -177,6 +178,11 @@ public:
 
     // Beyond the public interface: for front ends and what stands between them and the control.
 
+    /// What is said in cells and editors. New words are shown at once, in the cells as in an open
+    /// editor; the model does not know them.
+    const platform::Words& Words() const { return mWords; }
+    void Words(const platform::Words& words);
+
     /// Brings what is shown to what the model has now, whoever changed it: what has gone is taken
     /// away, what has come is added, and all else stays as it is, with the scroll positions, the
     /// current table, selected entries, the grid's current cell, an open editor and the text in it
@@ -244,6 +250,7 @@ private:
     void UserControl_Initialize();
     void UserControl_Terminate();
     void ResizeControls();
+    void LayOut();
     float UpperPaneHeight() const;
     void WriteRowTitles();
     TalvikTabulet::TabuletEvents TableEvents();
@@ -420,6 +427,7 @@ private:
     const Given<TalvikZandorLib::Library> mLibrary;
     const Given<ZandorEvents> mEvents;
     Hooks mHooks;
+    platform::Words mWords;
 
     std::int16_t mDebugSwitch = 1;
     bool mTraces = true; ///< false for what is not traced even with DebugSwitch

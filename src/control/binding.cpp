@@ -153,13 +153,13 @@ void Zandor::ShowDefinition(std::int32_t column,
     SetCell(answer(1, [&] { return definition->Synonym(); }), MSFlexGridLib::alignLeftCenter);
 
     const std::int16_t sortOrder = answer(2, [&] { return definition->SortOrder(); });
-    if (sortOrder == 1) sprColumn->Text(u"Ascending");
-    if (sortOrder == 2) sprColumn->Text(u"Descending");
+    if (sortOrder == 1) sprColumn->Text(mWords.Ascending);
+    if (sortOrder == 2) sprColumn->Text(mWords.Descending);
     sprColumn->CellAlignment(MSFlexGridLib::alignCenterCenter);
 
     // "Invisible" here and "Not Visible" in the editor mean the same; both texts are settled.
     const bool visible = answer(3, [&] { return definition->Visible(); });
-    SetCell(visible ? u"Visible" : u"Invisible", MSFlexGridLib::alignCenterCenter);
+    SetCell(visible ? mWords.Visible : mWords.Invisible, MSFlexGridLib::alignCenterCenter);
 
     std::int32_t row = 4;
     goTo(row);

@@ -11,7 +11,6 @@ namespace {
 constexpr platform::StringView arial = u"Arial";
 constexpr platform::StringView sansSerif = u"MS Sans Serif";
 constexpr platform::StringView comicSans = u"Comic Sans MS";
-constexpr platform::StringView setCaption = u"&Set";
 
 // Fixed when the control is designed: one label column and 255 definitions.
 constexpr std::int32_t gridRows = 12;
@@ -37,8 +36,8 @@ Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, Za
                   return mToolkit->makeShape({.Name = u"shpJoin", .Container = fraTable.get()},
                                              index);
               }),
-      imgListTabulet(
-          mLife, toolkit.makeImageList({.Name = u"imgListTabulet"}, {platform::Picture::key})),
+      imgListTabulet(mLife,
+                     toolkit.makeImageList({.Name = u"imgListTabulet"}, {platform::Picture::key})),
       lstTable(mLife,
                [this](std::int16_t index, const Tabulet* pattern) {
                    return mToolkit->makeTabulet(
@@ -68,12 +67,12 @@ Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, Za
       cobSortOrder(
           mLife, toolkit.makeComboBox(
                      {.Name = u"cobSortOrder", .FontName = arial, .Container = fraSortOrder2.get()},
-                     {u"(None)", u"Ascending", u"Descending"},
+                     {mWords.None, mWords.Ascending, mWords.Descending},
                      [this](auto... a) { cobSortOrder_KeyDown(a...); })),
       cmdSetSortOrder(mLife, toolkit.makeCommandButton(
                                  {.Name = u"cmdSetSortOrder",
                                   .FontName = arial,
-                                  .Caption = setCaption,
+                                  .Caption = mWords.Set,
                                   .Container = fraSortOrder2.get()},
                                  {.Click = [this] { cmdSetSortOrder_Click(); }, .GotFocus = {}})),
       fraVisibility(mLife,
@@ -86,11 +85,12 @@ Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, Za
           mLife,
           toolkit.makeComboBox(
               {.Name = u"cobVisibility", .FontName = arial, .Container = fraVisibility2.get()},
-              {u"Visible", u"Not Visible"}, [this](auto... a) { cobVisibility_KeyDown(a...); })),
+              {mWords.Visible, mWords.NotVisible},
+              [this](auto... a) { cobVisibility_KeyDown(a...); })),
       cmdSetVisibility(mLife, toolkit.makeCommandButton(
                                   {.Name = u"cmdSetVisibility",
                                    .FontName = arial,
-                                   .Caption = setCaption,
+                                   .Caption = mWords.Set,
                                    .Container = fraVisibility2.get()},
                                   {.Click = [this] { cmdSetVisibility_Click(); }, .GotFocus = {}})),
       fraValue(mLife, toolkit.makeFrame({.Name = u"fraValue", .FontName = sansSerif}, {})),
@@ -103,7 +103,7 @@ Zandor::Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, Za
       cmdSetTextValue(mLife, toolkit.makeCommandButton(
                                  {.Name = u"cmdSetTextValue",
                                   .FontName = sansSerif,
-                                  .Caption = setCaption,
+                                  .Caption = mWords.Set,
                                   .Container = fraValue2.get()},
                                  {.Click = [this] { cmdSetTextValue_Click(); }, .GotFocus = {}})),
       mnuZandor(mLife,

@@ -75,32 +75,37 @@ void Zandor::UpperPaneShare(float share) {
 
 void Zandor::ResizeControls() {
     Guard(u"ResizeControls", [&] {
-        if (mToolkit->ScaleWidth() > 120) {
-            const float hidden = single(MXHorzFrameSize - mToolkit->ScaleWidth());
-            hsbTable->Max(hidden >= 1 ? toInteger(hidden) : std::int16_t{0});
-            fraTable->Width(MXHorzFrameSize);
-            sprColumn->Width(mToolkit->ScaleWidth());
-            vsbTable->Left(single(mToolkit->ScaleWidth() - vsbTable->Width()));
-            hsbTable->Width(vsbTable->Left());
-            cmdHome->Left(vsbTable->Left());
-            cmdHome->Width(vsbTable->Width());
-        }
-
-        const float height = UpperPaneHeight();
-        if (height <= 300) return;
-        if (!mOnlyJoin) {
-            sprColumn->Top(height);
-            sprColumn->Height(single(mToolkit->ScaleHeight() - height));
-        }
-        vsbTable->Height(single(height - hsbTable->Height()));
-        hsbTable->Top(vsbTable->Height());
-        cmdHome->Top(vsbTable->Height());
-        cmdHome->Height(hsbTable->Height());
-        // The test uses the whole height, the value the upper pane's: hosts rely on both.
-        const bool scrolls = single(MXVertFrameSize - mToolkit->ScaleHeight()) >= 1;
-        vsbTable->Max(scrolls ? toInteger(single(MXVertFrameSize - height)) : std::int16_t{0});
-        fraTable->Height(MXVertFrameSize);
+        LayOut();
+        if (const auto laidOut = mHooks.LaidOut) laidOut();
     });
+}
+
+void Zandor::LayOut() {
+    if (mToolkit->ScaleWidth() > 120) {
+        const float hidden = single(MXHorzFrameSize - mToolkit->ScaleWidth());
+        hsbTable->Max(hidden >= 1 ? toInteger(hidden) : std::int16_t{0});
+        fraTable->Width(MXHorzFrameSize);
+        sprColumn->Width(mToolkit->ScaleWidth());
+        vsbTable->Left(single(mToolkit->ScaleWidth() - vsbTable->Width()));
+        hsbTable->Width(vsbTable->Left());
+        cmdHome->Left(vsbTable->Left());
+        cmdHome->Width(vsbTable->Width());
+    }
+
+    const float height = UpperPaneHeight();
+    if (height <= 300) return;
+    if (!mOnlyJoin) {
+        sprColumn->Top(height);
+        sprColumn->Height(single(mToolkit->ScaleHeight() - height));
+    }
+    vsbTable->Height(single(height - hsbTable->Height()));
+    hsbTable->Top(vsbTable->Height());
+    cmdHome->Top(vsbTable->Height());
+    cmdHome->Height(hsbTable->Height());
+    // The test uses the whole height, the value the upper pane's: hosts rely on both.
+    const bool scrolls = single(MXVertFrameSize - mToolkit->ScaleHeight()) >= 1;
+    vsbTable->Max(scrolls ? toInteger(single(MXVertFrameSize - height)) : std::int16_t{0});
+    fraTable->Height(MXVertFrameSize);
 }
 
 } // namespace TalvikDBxZandor

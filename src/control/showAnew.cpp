@@ -96,7 +96,7 @@ void Zandor::ShowAnew() {
         const std::int32_t binding = mBinding;
         const QueryPicture picture = pictureOf(mLife, Model(), lastTableSlot,
                                                static_cast<std::size_t>(sprColumn->Cols()) - 1,
-                                               static_cast<std::size_t>(sprColumn->Rows()));
+                                               static_cast<std::size_t>(sprColumn->Rows()), mWords);
         require(binding == mBinding); // what was bound meanwhile has been shown
         const Untraced untraced(*this);
         ShowTablesAnew(picture);

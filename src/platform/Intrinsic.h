@@ -59,6 +59,10 @@ public:
     virtual void Enabled(bool value) = 0;
     virtual void Font(const platform::Font& value) = 0;
     virtual void SetFocus() = 0;
+    /// Shows the list, with the chosen item as its current one, as soon as its user's hands are
+    /// free for it. A list that has dropped down so takes Enter for its current item; Escape, and
+    /// Tab with its current item chosen, close it and reach the box.
+    virtual void DropDown() = 0;
 };
 
 class TextBox : public Control {

@@ -216,6 +216,54 @@ TEST_F(TypingInACell, SetsTheSortOrderByAChoice) {
     EXPECT_TRUE(stage->look("sprColumn").focused);
 }
 
+TEST_F(TypingInACell, DropsAListDownAtWhatTheCellHolds) {
+    first->sortOrder = 2;
+    second->visible = false;
+    bind();
+    press(left, sortRow, 1);
+    stage->releaseCell(left, sortRow, 1);
+    EXPECT_TRUE(stage->look("cobSortOrder").dropped);
+    EXPECT_EQ(stage->look("cobSortOrder").listIndex, 2);
+    standOn(visibleRow, 2);
+    stage->editCell();
+    EXPECT_FALSE(stage->look("cobSortOrder").dropped);
+    EXPECT_TRUE(stage->look("cobVisibility").dropped);
+    EXPECT_EQ(stage->look("cobVisibility").listIndex, 1);
+}
+
+TEST_F(TypingInACell, LeavesListsUpWithoutTheComfort) {
+    stage->comforts().setFlags({});
+    press(left, sortRow, 1);
+    EXPECT_TRUE(shows("fraSortOrder"));
+    EXPECT_FALSE(stage->look("cobSortOrder").dropped);
+}
+
+TEST_F(TypingInACell, StaysOverItsCellWhateverTheSizeOfTheControl) {
+    for (const std::int32_t row : {sortRow, criteriaRow}) {
+        press(left, row, 1);
+        if (row == criteriaRow) stage->type("txtValue", u"> 20");
+        const std::string frame = row == criteriaRow ? "fraValue" : "fraSortOrder";
+        for (const float height : {12000.0F, 6000.0F, 9000.0F}) {
+            stage->resizeControl(12000, height);
+            ASSERT_TRUE(shows(frame)) << row << ' ' << height;
+            const platform::Bounds editor = stage->look(frame).bounds;
+            const float middle = grid().Top() + grid().CellTop() + grid().CellHeight() / 2;
+            EXPECT_NEAR(editor.Top + editor.Height / 2, middle, 15) << row << ' ' << height;
+        }
+    }
+    EXPECT_EQ(events(), Names{});
+    stage->leaveControl();
+    expectKept(u"> 20");
+}
+
+TEST_F(TypingInACell, StaysWhereItWasWithoutTheComfortUntilTheControlIsPainted) {
+    stage->comforts().setFlags({});
+    press(left, criteriaRow, 1);
+    stage->resizeControl(12000, 12000);
+    stage->repaint();
+    EXPECT_FALSE(anyOpen());
+}
+
 TEST_F(TypingInACell, WritesNoChoiceOfWhatIsSoAlready) {
     press(left, sortRow, 1);
     stage->pick("cobSortOrder", 0);

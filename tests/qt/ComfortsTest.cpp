@@ -3,6 +3,8 @@
 #include "qt/KeyDesk.h"
 
 #include <QAccessible>
+#include <QComboBox>
+#include <QInputMethodEvent>
 #include <QListView>
 #include <QPushButton>
 #include <QShortcut>
@@ -19,7 +21,40 @@ protected:
         settle();
     }
 
-    static constexpr int criteriaRow = 4;
+    static constexpr int sortRow = 2, criteriaRow = 4;
+
+    /// The list that has dropped down; nullptr without one.
+    QAbstractItemView* list() {
+        for (const char* name : {"cobSortOrder", "cobVisibility"})
+            if (auto* const view = child<QComboBox>(name).view(); view->isVisible()) return view;
+        return nullptr;
+    }
+
+    /// The list of an editor drops down once the mouse is up.
+    void click(int row, int col) {
+        Desk::press(row, col);
+        EXPECT_FALSE(list());
+        const QPoint at = grid().cellRect(row, col).center();
+        QWidget& cells = *grid().view().viewport();
+        hands::mouse(cells, QEvent::MouseButtonRelease, cells.mapFrom(&grid(), at), Qt::LeftButton);
+        settle();
+    }
+
+    void standOn(int row, int col) {
+        widget->takeOver();
+        grid().setCurrentCell(row, col);
+        grid().view().setFocus();
+        settle();
+        ASSERT_TRUE(grid().view().hasFocus());
+    }
+
+    /// What an input method sends to who has the focus.
+    void compose(const char* preedit, const char* commit = nullptr) {
+        QInputMethodEvent event(QString::fromUtf8(preedit), {});
+        event.setCommitString(QString::fromUtf8(commit));
+        QCoreApplication::sendEvent(widget->window()->focusWidget(), &event);
+        calm();
+    }
 
     /// Types into the criterion of the first column, which reads "> 1000".
     void startTyping() {
@@ -206,6 +241,111 @@ TEST_F(Comforts, GoToTheCellOfAFinding) {
     EXPECT_EQ(grid().currentRow(), criteriaRow);
     EXPECT_EQ(grid().currentCol(), 2);
     EXPECT_FALSE(widget->showCell("x77", criteriaRow));
+}
+
+TEST_F(Comforts, TakeAnItemOfADroppedListByArrowsAndEnter) {
+    click(sortRow, 1);
+    ASSERT_TRUE(list());
+    hands::key(*list(), Qt::Key_Down);
+    hands::key(*list(), Qt::Key_Return);
+    calm();
+    EXPECT_EQ(model->definitionAt(1).sortOrder, 1);
+    EXPECT_FALSE(child<QWidget>("fraSortOrder").isVisible());
+    EXPECT_EQ(focus(), "sprColumn");
+}
+
+TEST_F(Comforts, CloseADroppedListAndItsEditorByOneEscape) {
+    click(sortRow, 1);
+    ASSERT_TRUE(list());
+    hands::key(*list(), Qt::Key_Down);
+    hands::key(*list(), Qt::Key_Escape);
+    calm();
+    EXPECT_EQ(model->definitionAt(1).sortOrder, 0);
+    EXPECT_FALSE(list());
+    EXPECT_FALSE(child<QWidget>("fraSortOrder").isVisible());
+}
+
+TEST_F(Comforts, TakeAnItemOfADroppedListByTabAndGoOn) {
+    click(sortRow, 2); // ascending
+    ASSERT_TRUE(list());
+    EXPECT_EQ(list()->currentIndex().row(), 1);
+    hands::key(*list(), Qt::Key_Down);
+    hands::key(*list(), Qt::Key_Tab);
+    calm();
+    EXPECT_EQ(model->definitionAt(2).sortOrder, 2);
+    EXPECT_EQ(grid().currentCol(), 3);
+    EXPECT_TRUE(child<QWidget>("fraSortOrder").isVisible());
+}
+
+TEST_F(Comforts, LetAnInputMethodTypeInACell) {
+    standOn(criteriaRow, 1);
+    compose("か");
+    const auto& box = child<QLineEdit>("txtValue");
+    EXPECT_TRUE(box.isVisible());
+    EXPECT_TRUE(grid().view().hasFocus()) << "a composition breaks off when the focus moves";
+    compose("かん");
+    compose(nullptr, "漢");
+    EXPECT_TRUE(box.hasFocus());
+    EXPECT_EQ(box.text(), "漢");
+    hands::key(child<QWidget>("txtValue"), 0, "7");
+    hands::key(child<QWidget>("txtValue"), Qt::Key_Return);
+    calm();
+    EXPECT_EQ(criterion(), u"漢7");
+}
+
+TEST_F(Comforts, TypeWhatAnInputMethodGivesAtOnce) {
+    standOn(criteriaRow, 1);
+    compose(nullptr, "漢字");
+    EXPECT_EQ(child<QLineEdit>("txtValue").text(), "漢字");
+    EXPECT_TRUE(child<QLineEdit>("txtValue").hasFocus());
+
+    standOn(sortRow, 1);
+    compose("D");
+    EXPECT_FALSE(child<QWidget>("fraSortOrder").isVisible());
+    compose(nullptr, "D");
+    EXPECT_EQ(child<QComboBox>("cobSortOrder").currentText(), "Descending");
+}
+
+TEST_F(Comforts, LeaveACellAsItWasWhenAnInputMethodGivesUp) {
+    standOn(criteriaRow, 1);
+    compose("か");
+    compose(nullptr);
+    EXPECT_EQ(child<QLineEdit>("txtValue").text(), "> 1000");
+    EXPECT_TRUE(child<QLineEdit>("txtValue").hasFocus());
+    hands::key(child<QWidget>("txtValue"), Qt::Key_Return);
+    calm();
+    EXPECT_EQ(criterion(), u"> 1000");
+}
+
+TEST_F(Comforts, LetAnInputMethodLookForAField) {
+    standOn(0, 4);
+    compose("to");
+    compose(nullptr, "town");
+    ASSERT_TRUE(fields().isVisible());
+    EXPECT_TRUE(fields().box().hasFocus());
+    EXPECT_EQ(fields().list().model()->rowCount(), 1);
+}
+
+TEST_F(Comforts, TellAnInputMethodWhereItsTextStands) {
+    standOn(criteriaRow, 1);
+    const auto ask = [&](Qt::InputMethodQuery what) {
+        QInputMethodQueryEvent query(what);
+        QCoreApplication::sendEvent(&grid().view(), &query);
+        return query.value(what);
+    };
+    EXPECT_TRUE(ask(Qt::ImEnabled).toBool());
+    const QRect cell(grid().view().mapFrom(&grid(), grid().cellRect(criteriaRow, 1).topLeft()),
+                     grid().cellRect(criteriaRow, 1).size());
+    EXPECT_EQ(ask(Qt::ImCursorRectangle).toRect(), cell);
+    compose("か");
+    auto& box = child<QLineEdit>("txtValue");
+    const QRect place = ask(Qt::ImCursorRectangle).toRect();
+    EXPECT_TRUE(QRect(grid().view().mapFromGlobal(box.mapToGlobal(QPoint())), box.size())
+                    .contains(place.center()));
+    compose(nullptr);
+    standOn(criteriaRow, 1);
+    widget->setComforts({});
+    EXPECT_FALSE(ask(Qt::ImEnabled).toBool());
 }
 
 TEST_F(Comforts, AreOffUntilTheyAreAskedFor) {

@@ -1,3 +1,5 @@
+#include "platform/qt/GridCells.h"
+#include "platform/qt/Twips.h"
 #include "qt/Desk.h"
 
 #include <QApplication>
@@ -53,7 +55,22 @@ protected:
     }
 
     int textWidth(const char* text) {
-        return QFontMetrics(grid().view().font()).horizontalAdvance(QString::fromLatin1(text));
+        return QFontMetrics(grid().view().font()).horizontalAdvance(QString::fromUtf8(text));
+    }
+
+    /// A cell's text as its column has room for it.
+    QString shownIn(int row, int col) {
+        grid().bringUpToDate();
+        auto& view = grid().view();
+        const auto index = view.model()->index(row - 1, col - 1);
+        QStyleOptionViewItem option;
+        option.initFrom(&view);
+        option.widget = &view;
+        option.rect = view.visualRect(index);
+        option.features = QStyleOptionViewItem::HasDisplay;
+        static_cast<platform::qt::GridCellDelegate*>(view.itemDelegate())
+            ->initStyleOption(&option, index);
+        return option.text;
     }
 
     const QFont before = QApplication::font();
@@ -68,7 +85,8 @@ TEST_P(AFont, ReachesEveryPartOfTheControl) {
              &table(1), &table(1).list(), &grid(), &grid().view(), grid().view().horizontalHeader(),
              grid().view().verticalHeader(), &child<QWidget>("cobSortOrder"),
              &child<QWidget>("txtValue"), &child<QWidget>("cmdSetTextValue")})
-        EXPECT_EQ(part->font().pointSizeF(), 19) << part->metaObject()->className() << (part == grid().view().horizontalHeader());
+        EXPECT_EQ(part->font().pointSizeF(), 19)
+            << part->metaObject()->className() << (part == grid().view().horizontalHeader());
     bind(); // a table made later has it, too
     EXPECT_EQ(table(2).list().font().pointSizeF(), 19);
 }
@@ -101,6 +119,29 @@ TEST_P(AFont, FindsRowsAndColumnsThatItFitsInto) {
         EXPECT_GE(grid().cellRect(2, 9).width(), textWidth(word)) << "in a blank column: " << word;
     EXPECT_GE(grid().cellRect(0, 1).width(), textWidth("ORDER_ID"));
     EXPECT_GE(grid().cellRect(0, 0).width(), textWidth("Synonym:"));
+}
+
+TEST_P(AFont, ShowsASortOrderWholeOrAsAnArrow) {
+    for (const qreal points : {9.0, 12.0, 16.0}) {
+        widget->setComforts({});
+        lay(points);
+        for (const auto& [word, arrow] : {std::pair{"Ascending", "▲"}, {"Descending", "▼"}})
+            for (const int width : {20, 40, 60, 80, 120, 160}) {
+                grid().model().setText(2, 1, word);
+                grid().model().setWidth(1, platform::qt::toTwips(width));
+                grid().touch();
+                grid().bringUpToDate();
+                const QString shown = shownIn(2, 1);
+                EXPECT_LE(textWidth(shown.toUtf8()), width) << points << ' ' << width;
+                EXPECT_EQ(shown, width < textWidth(word) + 4 ? arrow : shown);
+                EXPECT_EQ(shown, width > textWidth(word) + 12 ? word : shown);
+            }
+        widget->setComforts({.FitsColumns = true});
+        EXPECT_EQ(shownIn(2, 2), "Ascending") << points;
+        model->definitionAt(1).sortOrder = 2;
+        widget->showAnew();
+        EXPECT_EQ(shownIn(2, 1), "Descending") << points;
+    }
 }
 
 TEST_P(AFont, FitsIntoTheEditors) {

@@ -148,10 +148,10 @@ TEST_F(AJoinToRead, TakesItsNotesAwayWithTheComfort) {
 
 TEST_F(AJoinToRead, SpeaksTheHostsWords) {
     join(1, 0);
-    comforts::Words words;
+    platform::Words words;
     words.All = u"alle";
     words.AllOfOne = u"alle von %1, dazu passende von %2";
-    widget->setComfortWords(words);
+    widget->setWords(words);
     EXPECT_EQ(note(line().notes().First), "alle");
     EXPECT_EQ(toolTip(middle()), "alle von ORDERS, dazu passende von LINES");
 }

@@ -207,6 +207,7 @@ private:
             seen.largeChange = bar->largeChange();
         } else if (const auto* combo = dynamic_cast<const headless::ComboBox*>(&object)) {
             seen.listIndex = combo->chosen();
+            seen.dropped = combo->dropped();
             seen.items = combo->items();
         } else if (const auto* line = dynamic_cast<const headless::Line*>(&object)) {
             seen.X1 = line->ends().X1;

@@ -31,6 +31,7 @@ inline void lookAtKind(QWidget& widget, Stage::Seen& seen) {
     } else if (const auto* combo = dynamic_cast<QComboBox*>(&widget)) {
         seen.text = fromQt(combo->currentText());
         seen.listIndex = static_cast<std::int16_t>(combo->currentIndex());
+        seen.dropped = combo->view()->isVisible();
         for (int i = 0; i < combo->count(); ++i) seen.items.push_back(fromQt(combo->itemText(i)));
     } else if (const auto* bar = dynamic_cast<QScrollBar*>(&widget)) {
         seen.value = static_cast<std::int16_t>(bar->value());

@@ -41,6 +41,7 @@ public:
         String text; ///< caption of a button or entry, title of a table, text of an input
         String font;
         std::int16_t listIndex = -1;
+        bool dropped = false;                             ///< combo boxes: the list is down
         std::int16_t value = 0, max = 0, largeChange = 0; ///< scroll bars
         float X1 = 0, Y1 = 0, X2 = 0, Y2 = 0;             ///< lines
         std::int16_t borderWidth = 0;                     ///< lines

@@ -64,7 +64,9 @@ void Zandor::GetTextValue(const String& cellText) {
 
 void Zandor::GetSortOrder(const String& cellText) {
     Guard(u"GetSortOrder", [&] {
-        cobSortOrder->ListIndex(cellText == u"Ascending" ? 1 : cellText == u"Descending" ? 2 : 0);
+        cobSortOrder->ListIndex(cellText == mWords.Ascending    ? 1
+                                : cellText == mWords.Descending ? 2
+                                                                : 0);
         OpenEditor(fraSortOrder, cmdSetSortOrder);
         cobSortOrder->SetFocus();
     });
@@ -72,7 +74,7 @@ void Zandor::GetSortOrder(const String& cellText) {
 
 void Zandor::GetVisibility(const String& cellText) {
     Guard(u"GetVisibility", [&] {
-        cobVisibility->ListIndex(cellText == u"Not Visible" ? 1 : 0);
+        cobVisibility->ListIndex(cellText == mWords.NotVisible ? 1 : 0);
         OpenEditor(fraVisibility, cmdSetVisibility);
         cobVisibility->SetFocus();
     });

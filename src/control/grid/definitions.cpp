@@ -63,7 +63,7 @@ bool Zandor::InsertColumnDefinition(const String& fieldName, std::int32_t column
             sprColumn->ColPosition(i, i + 1);
         sprColumn->Col(column);
         sprColumn->Row(3);
-        SetCell(u"Visible", alignCenterCenter);
+        SetCell(mWords.Visible, alignCenterCenter);
         sprColumn->Row(0);
         SetCell(fieldName, alignCenterCenter);
         FitColumn(column, fieldName);

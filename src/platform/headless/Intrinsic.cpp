@@ -93,6 +93,7 @@ std::int16_t ComboBox::ListIndex() const {
 void ComboBox::ListIndex(std::int16_t value) {
     called("ListIndex=");
     choose(value);
+    mDropped = false;
 }
 
 void ComboBox::choose(std::int16_t index) {
@@ -131,6 +132,11 @@ void ComboBox::Font(const platform::Font& value) {
 void ComboBox::SetFocus() {
     called("SetFocus");
     takeFocus();
+}
+
+void ComboBox::DropDown() {
+    called("DropDown");
+    mDropped = true;
 }
 
 void ComboBox::keyDown(std::int16_t keyCode, std::int16_t shift) {

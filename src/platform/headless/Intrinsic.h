@@ -72,15 +72,19 @@ public:
     void Enabled(bool value) override;
     void Font(const platform::Font& value) override;
     void SetFocus() override;
+    void DropDown() override;
 
     void keyDown(std::int16_t keyCode, std::int16_t shift) override;
     const std::vector<String>& items() const { return mItems; }
+    /// Whether the list is down; it goes up when something else is chosen for its user.
+    bool dropped() const { return mDropped && shown(); }
     std::int16_t chosen() const { return mListIndex; }
     void choose(std::int16_t index);
 
 private:
     std::vector<String> mItems;
     std::int16_t mListIndex = -1;
+    bool mDropped = false;
     KeyEvent mKeyDown;
 };
 

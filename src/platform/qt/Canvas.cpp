@@ -39,7 +39,6 @@ Canvas::Canvas(CanvasView& view, QWidget* parent)
     setAttribute(Qt::WA_OpaquePaintEvent);
     setFocusPolicy(Qt::ClickFocus);
     setAcceptDrops(true);
-    setAccessibleName(tr("Tables and joins"));
 }
 
 Canvas::~Canvas() {

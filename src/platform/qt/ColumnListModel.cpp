@@ -1,6 +1,7 @@
 #include "platform/qt/ColumnListModel.h"
 
 #include "platform/qt/ShownText.h"
+#include "platform/qt/Text.h"
 
 #include <utility>
 
@@ -13,24 +14,23 @@ int ColumnListModel::rowCount(const QModelIndex& parent) const {
 QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid() || index.row() >= rowCount()) return {};
     if (role == Qt::DisplayRole) return mRows[static_cast<std::size_t>(index.row())].shown;
-    if (role == pictureRole && picture(index.row()))
-        return static_cast<int>(*picture(index.row()));
+    if (role == pictureRole && picture(index.row())) return static_cast<int>(*picture(index.row()));
     if (role == outputRole) return at(index.row()).comesOut;
     if (role == Qt::AccessibleDescriptionRole) return description(at(index.row()));
     return {};
 }
 
-QVariant ColumnListModel::description(const Row& row) {
+QVariant ColumnListModel::description(const Row& row) const {
     QStringList parts;
-    if (row.picture == Picture::key) parts += tr("key column");
-    if (row.comesOut) parts += tr("comes out");
+    if (row.picture == Picture::key) parts += mKeyColumn;
+    if (row.comesOut) parts += mComesOut;
     return parts.isEmpty() ? QVariant() : parts.join(QStringLiteral(", "));
 }
 
 void ColumnListModel::append(const QString& text) {
     const int row = rowCount();
     beginInsertRows({}, row, row);
-    mRows.push_back({.text = text, .shown = asSigns(text)});
+    mRows.push_back({text, asSigns(text), {}});
     endInsertRows();
 }
 
@@ -42,6 +42,11 @@ void ColumnListModel::setPicture(int row, std::optional<Picture> picture) {
 void ColumnListModel::setComesOut(int row, bool comesOut) {
     if (std::exchange(at(row).comesOut, comesOut) == comesOut) return;
     Q_EMIT dataChanged(index(row), index(row), {outputRole, Qt::AccessibleDescriptionRole});
+}
+
+void ColumnListModel::setWords(const Words& words) {
+    mKeyColumn = toQt(words.KeyColumn);
+    mComesOut = toQt(words.ComesOut);
 }
 
 void ColumnListModel::clear() {

@@ -1,9 +1,9 @@
 #pragma once
 
 #include "platform/ImageList.h"
+#include "platform/Words.h"
 
 #include <QAbstractListModel>
-#include <QCoreApplication>
 
 #include <vector>
 
@@ -11,8 +11,6 @@ namespace platform::qt {
 
 /// The rows of a table list as the view sees them.
 class ColumnListModel : public QAbstractListModel {
-    Q_DECLARE_TR_FUNCTIONS(platform::qt::ColumnListModel)
-
 public:
     /// What the image before the name shows, as a number; nothing without one.
     static constexpr int pictureRole = Qt::UserRole;
@@ -30,6 +28,7 @@ public:
     void setPicture(int row, std::optional<Picture> picture);
     void setComesOut(int row, bool comesOut);
     void clear();
+    void setWords(const Words& words);
 
 private:
     struct Row {
@@ -39,11 +38,13 @@ private:
         bool comesOut = false;
     };
 
-    static QVariant description(const Row& row);
+    QVariant description(const Row& row) const;
     Row& at(int row) { return mRows[static_cast<std::size_t>(row)]; }
     const Row& at(int row) const { return mRows[static_cast<std::size_t>(row)]; }
 
     std::vector<Row> mRows;
+    QString mKeyColumn;
+    QString mComesOut;
 };
 
 } // namespace platform::qt

@@ -24,6 +24,10 @@ void FocusTracker::forget(QWidget* widget) {
 void FocusTracker::take(QWidget* widget) {
     if (!widget || !widget->isVisible() || !widget->isEnabled())
         throw errors::invalidProcedureCall();
+    if (mHolds) {
+        mTaker = widget;
+        return;
+    }
     const QPointer<QWidget> alive = widget;
     widget->setFocus(Qt::OtherFocusReason);
     if (alive && mNotices.contains(widget) && widget->window()->focusWidget() == widget)

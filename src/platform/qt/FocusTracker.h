@@ -25,6 +25,12 @@ public:
     /// active one (a message box has just closed) gets the notice all the same, and at once.
     void take(QWidget* widget);
 
+    /// From now on the focus stays where it is; who takes it is remembered.
+    void hold() { mHolds = true, mTaker = nullptr; }
+    /// Who has taken the focus since it is held; nobody: nullptr.
+    QWidget* taker() const { return mTaker; }
+    void letGo() { mHolds = false; }
+
     /// Whether there is a focus to be had: not before the control's window is shown, nor after it
     /// was closed.
     bool onScreen() const { return mSurface && mSurface->isVisible(); }
@@ -44,6 +50,8 @@ private:
     const QPointer<QWidget> mSurface;
     QPointer<QWidget> mFallback;
     QPointer<QWidget> mOwner;
+    QPointer<QWidget> mTaker;
+    bool mHolds = false;
     QHash<QObject*, std::function<void()>> mNotices;
 };
 

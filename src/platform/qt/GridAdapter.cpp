@@ -10,6 +10,7 @@
 
 #include <QComboBox>
 #include <QCoreApplication>
+#include <QInputMethodEvent>
 #include <QKeyEvent>
 
 namespace platform::qt {
@@ -191,6 +192,28 @@ bool GridAdapter::typed(QKeyEvent& event) {
     auto* const list = alive ? qobject_cast<QComboBox*>(alive->window()->focusWidget()) : nullptr;
     if (list) QCoreApplication::sendEvent(list, &event);
     return true;
+}
+
+bool GridAdapter::composed(QInputMethodEvent& event) {
+    if (!mComposer.isComposing()) {
+        if (event.preeditString().isEmpty()) {
+            if (event.commitString().isEmpty()) return false;
+            QKeyEvent key(QEvent::KeyPress, Qt::Key_unknown, Qt::NoModifier, event.commitString());
+            return typed(key);
+        }
+        if (!mComposer.begin([this] { mComforts.cellTyped({}); })) return true;
+    }
+    mComposer.goOn(event);
+    return true;
+}
+
+void GridAdapter::asked(QInputMethodQueryEvent& query) {
+    if (mComposer.isComposing()) return mComposer.answer(query, grid().view());
+    const auto& flags = mComforts.flags();
+    query.setValue(Qt::ImEnabled, flags.KeepsTyping || flags.OffersFields);
+    const QRect cell = currentCell(grid());
+    query.setValue(Qt::ImCursorRectangle, cell.translated(-grid().view().pos()));
+    query.accept();
 }
 
 void GridAdapter::clickWithRightButton(QPointF at) {

@@ -3,6 +3,7 @@
 #include "comforts/Comforts.h"
 #include "platform/MSFlexGrid.h"
 #include "platform/qt/Adapter.h"
+#include "platform/qt/CellComposer.h"
 #include "platform/qt/GridWidget.h"
 
 namespace platform::qt {
@@ -56,6 +57,10 @@ private:
     void menuKey(QPointF at, QPoint screen) override;
     void deleteKey(QPointF at) override;
     bool typed(QKeyEvent& event) override;
+    bool composed(QInputMethodEvent& event) override;
+    void asked(QInputMethodQueryEvent& query) override;
+    QWidget* composer() const override { return mComposer.box(); }
+    void left() override { mComposer.breakOff(); }
     bool editKey() override { return mComforts.cellOpened(); }
     bool offersFields() const override { return mComforts.flags().OffersFields; }
     void fieldClicked(int col) override { mComforts.fieldClicked(col); }
@@ -77,6 +82,7 @@ private:
     DragSession& mDrags;
     KeyboardMenu& mMenu;
     comforts::Comforts& mComforts;
+    CellComposer mComposer{mFocus};
     const MSFlexGridLib::GridEvents mEvents;
 };
 

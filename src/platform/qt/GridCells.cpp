@@ -48,6 +48,19 @@ void paintWave(QPainter& painter, const QRect& place, const QPalette& palette) {
 GridCellDelegate::GridCellDelegate(const GridWidget& grid, QTableView& view)
     : QStyledItemDelegate(&view), mGrid(grid), mView(view) {}
 
+void GridCellDelegate::initStyleOption(QStyleOptionViewItem* option,
+                                       const QModelIndex& index) const {
+    QStyledItemDelegate::initStyleOption(option, index);
+    const QString arrow = index.data(GridModel::arrowRole).toString();
+    if (arrow.isEmpty()) return;
+    const QStyle& style = *mView.style();
+    const int margin = style.pixelMetric(QStyle::PM_FocusFrameHMargin, option, &mView) + 1;
+    if (option->fontMetrics.horizontalAdvance(option->text) <= option->rect.width() - 2 * margin)
+        return;
+    option->text = arrow;
+    option->textElideMode = Qt::ElideNone;
+}
+
 void GridCellDelegate::paint(QPainter* painter, const QStyleOptionViewItem& option,
                              const QModelIndex& index) const {
     QStyleOptionViewItem cell = option;
@@ -119,9 +132,8 @@ void FieldTitles::paintSection(QPainter* painter, const QRect& place, int sectio
         painter->save();
         painter->setPen(palette().color(QPalette::PlaceholderText));
         const QRect inside = place.adjusted(cellMargin, 0, -cellMargin, 0);
-        painter->drawText(
-            inside, static_cast<int>(Qt::AlignCenter) | Qt::TextSingleLine,
-            fontMetrics().elidedText(tr("Add field…"), Qt::ElideRight, inside.width()));
+        painter->drawText(inside, static_cast<int>(Qt::AlignCenter) | Qt::TextSingleLine,
+                          fontMetrics().elidedText(mGrid.offer(), Qt::ElideRight, inside.width()));
         painter->restore();
     }
     if (mGrid.currentRow() == 0 && mGrid.currentCol() == section + 1)

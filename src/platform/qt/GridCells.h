@@ -1,6 +1,5 @@
 #pragma once
 
-#include <QCoreApplication>
 #include <QHeaderView>
 #include <QStyledItemDelegate>
 
@@ -13,13 +12,16 @@ class GridWidget;
 /// The margin of a text in a cell of the grid, in logical pixels.
 inline constexpr int cellMargin = 4;
 
-/// Cells of the grid: the current one has a frame, thin while the grid is without the focus.
+/// Cells of the grid: the current one has a frame, thin while the grid is without the focus. A sort
+/// order that its column is too narrow for is an arrow.
 class GridCellDelegate : public QStyledItemDelegate {
 public:
     GridCellDelegate(const GridWidget& grid, QTableView& view);
 
     void paint(QPainter* painter, const QStyleOptionViewItem& option,
                const QModelIndex& index) const override;
+
+    void initStyleOption(QStyleOptionViewItem* option, const QModelIndex& index) const override;
 
 private:
     const GridWidget& mGrid;
@@ -45,8 +47,6 @@ protected:
 /// The fields at the head of the grid's columns. The current one has a frame as cells have; the
 /// first blank one says what it is for; a column that is being dragged shows where it would come.
 class FieldTitles : public GridHeader {
-    Q_DECLARE_TR_FUNCTIONS(platform::qt::FieldTitles)
-
 public:
     FieldTitles(const GridWidget& grid, QWidget* parent)
         : GridHeader(Qt::Horizontal, parent), mGrid(grid) {}

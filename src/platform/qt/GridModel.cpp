@@ -1,6 +1,7 @@
 #include "platform/qt/GridModel.h"
 
 #include "platform/qt/ShownText.h"
+#include "platform/qt/Text.h"
 
 #include <algorithm>
 #include <array>
@@ -10,6 +11,7 @@ namespace platform::qt {
 GridModel::GridModel(int rows, int cols, QObject* parent)
     : QAbstractTableModel(parent), mRows(rows), mColumns(static_cast<std::size_t>(cols)) {
     for (Column& column : mColumns) column.cells.resize(static_cast<std::size_t>(rows));
+    setWords({});
 }
 
 void GridModel::setAlignment(int row, int col, std::int16_t alignment) {
@@ -20,6 +22,12 @@ void GridModel::setAlignment(int row, int col, std::int16_t alignment) {
                                                               Qt::AlignBottom};
     const auto place = static_cast<std::size_t>(alignment > 8 ? 1 : alignment);
     cell(row, col).alignment = across[place / 3] | down[place % 3];
+}
+
+void GridModel::setWords(const Words& words) {
+    mAscending = toQt(words.Ascending);
+    mDescending = toQt(words.Descending);
+    mNumbered = toQt(words.Column);
 }
 
 void GridModel::move(int from, int to) {
@@ -59,8 +67,15 @@ QString GridModel::titleOf(int row, int col) const {
     QString title = text(titled, 0);
     if (title.endsWith(u':')) title.chop(1);
     const QString& field = text(0, col);
-    return asSigns(title + QStringLiteral(", ") +
-                   (field.isEmpty() ? tr("column %1").arg(col) : field));
+    return asSigns(title + QStringLiteral(", ") + (field.isEmpty() ? mNumbered.arg(col) : field));
+}
+
+QVariant GridModel::arrow(int row, int col) const {
+    constexpr int sortRow = 2;
+    if (row != sortRow) return {};
+    if (text(row, col) == mAscending) return QStringLiteral("▲");
+    if (text(row, col) == mDescending) return QStringLiteral("▼");
+    return {};
 }
 
 QVariant GridModel::data(const QModelIndex& index, int role) const {
@@ -70,6 +85,7 @@ QVariant GridModel::data(const QModelIndex& index, int role) const {
         const QString title = titleOf(index.row() + 1, index.column() + 1);
         return written.isEmpty() ? title : title + QStringLiteral(": ") + asSigns(written);
     }
+    if (role == arrowRole) return arrow(index.row() + 1, index.column() + 1);
     return valueOf(cell(index.row() + 1, index.column() + 1), role);
 }
 

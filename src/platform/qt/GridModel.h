@@ -1,7 +1,8 @@
 #pragma once
 
+#include "platform/Words.h"
+
 #include <QAbstractTableModel>
-#include <QCoreApplication>
 
 #include <vector>
 
@@ -11,10 +12,10 @@ namespace platform::qt {
 /// the rest is the body; nothing is announced until `announce`, so that filling the grid and
 /// moving its columns costs no more than the data.
 class GridModel : public QAbstractTableModel {
-    Q_DECLARE_TR_FUNCTIONS(platform::qt::GridModel)
-
 public:
     static constexpr int noteRole = Qt::UserRole;
+    /// Of a cell with a sort order: what says as much in little room.
+    static constexpr int arrowRole = Qt::UserRole + 1;
 
     GridModel(int rows, int cols, QObject* parent);
 
@@ -35,6 +36,8 @@ public:
     /// Moves a column with all it has; those in between shift by one.
     void move(int from, int to);
 
+    /// Nothing is announced of it, either.
+    void setWords(const Words& words);
     /// A cell as it is spoken, without its text: the row's title and the column's field.
     QString titleOf(int row, int col) const;
 
@@ -67,7 +70,12 @@ private:
     }
     Cell& cell(int row, int col) { return column(col).cells[static_cast<std::size_t>(row)]; }
 
+    QVariant arrow(int row, int col) const;
+
     const int mRows;
+    QString mAscending;
+    QString mDescending;
+    QString mNumbered; ///< a column without a field
     std::vector<Column> mColumns;
 };
 

@@ -7,6 +7,7 @@
 #include "platform/qt/KeyCodes.h"
 #include "platform/qt/PaneHandle.h"
 #include "platform/qt/ShownText.h"
+#include "platform/qt/Text.h"
 #include "platform/qt/Twips.h"
 
 #include <QAccessible>
@@ -48,7 +49,6 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     setAcceptDrops(true);
     setFocusProxy(mView);
     mView->setFocusPolicy(Qt::ClickFocus);
-    mView->setAccessibleName(tr("Output columns"));
     mView->setHorizontalHeader(mTitles);
     mView->setVerticalHeader(new RowTitles(mView));
     mCorner->raise();
@@ -109,6 +109,14 @@ GridHeader& GridWidget::titles() const {
 void GridWidget::setListener(GridListener* listener) {
     mListener = listener;
     mGestures.setListener(listener);
+}
+
+void GridWidget::setWords(const Words& words) {
+    mView->setAccessibleName(toQt(words.Grid));
+    mOffer = toQt(words.AddField);
+    mModel->setWords(words);
+    mHandle->setWords(words);
+    touch();
 }
 
 void GridWidget::measure() {
@@ -266,15 +274,27 @@ bool GridWidget::eventFilter(QObject* watched, QEvent* event) {
         break;
     case QEvent::FocusIn:
     case QEvent::FocusOut:
-        if (part == mView) mTitles->viewport()->update();
+        if (part != mView) break;
+        mTitles->viewport()->update();
+        if (event->type() == QEvent::FocusOut && mListener) mListener->left();
         break;
+    case QEvent::InputMethod:
+        if (part != mView || !mListener) break;
+        return mListener->composed(static_cast<QInputMethodEvent&>(*event));
+    case QEvent::InputMethodQuery:
+        if (part != mView || !mListener) break;
+        mListener->asked(static_cast<QInputMethodQueryEvent&>(*event));
+        return true;
     case QEvent::MouseMove:
         if (part == mTitles->viewport()) mGestures.moved(static_cast<QMouseEvent&>(*event));
         // No selecting along the way of a held button; headers need it for their widths.
         if (part == mView->viewport()) return true;
         break;
     case QEvent::KeyPress:
-        if (part == mView) return keyPressed(*static_cast<QKeyEvent*>(event));
+        if (part != mView) break;
+        if (QWidget* const box = mListener ? mListener->composer() : nullptr)
+            return QCoreApplication::sendEvent(box, event), true;
+        return keyPressed(*static_cast<QKeyEvent*>(event));
         break;
     case QEvent::ContextMenu:
         // The mouse opens the control's menu on release, and the host is to open none of its own.

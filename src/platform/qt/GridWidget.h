@@ -1,11 +1,14 @@
 #pragma once
 
+#include "platform/Words.h"
 #include "platform/qt/FieldGestures.h"
 
-#include <QCoreApplication>
 #include <QTableView>
 
 #include <functional>
+
+class QInputMethodEvent;
+class QInputMethodQueryEvent;
 
 namespace platform::qt {
 
@@ -27,6 +30,15 @@ public:
     virtual void deleteKey(QPointF at) = 0;
     /// A key with a printable text, for the current cell. False when it means nothing there.
     virtual bool typed(QKeyEvent& event) = 0;
+    /// An input method composes or gives a text for the current cell. False when that means
+    /// nothing.
+    virtual bool composed(QInputMethodEvent& event) = 0;
+    /// Answers what an input method asks.
+    virtual void asked(QInputMethodQueryEvent& query) = 0;
+    /// What shows the text being composed, and has the keys meanwhile; nullptr without one.
+    virtual QWidget* composer() const = 0;
+    /// The focus has left the cells.
+    virtual void left() = 0;
     /// A key asks for the current cell's editor. False when a press on the cell is to open it.
     virtual bool editKey() = 0;
     /// Whether fields can be chosen, so that they are cells to walk to as the others.
@@ -48,12 +60,11 @@ public:
 /// follows the model's data, widths and current cell when the events at hand have been dealt with,
 /// or at once by `bringUpToDate`.
 class GridWidget : public QWidget {
-    Q_DECLARE_TR_FUNCTIONS(platform::qt::GridWidget)
-
 public:
     GridWidget(int rows, int cols, QWidget* parent);
 
     void setListener(GridListener* listener);
+    void setWords(const Words& words);
     GridModel& model() const { return *mModel; }
     QTableView& view() const { return *mView; }
     /// Stands above the cells while it is shown.
@@ -66,7 +77,9 @@ public:
     void setCurrentCell(int row, int col);
     int currentRow() const { return mRow; }
     int currentCol() const { return mCol; }
-    /// The first blank column where fields can be chosen; 0 where they cannot.
+    /// What the first blank column says where fields can be chosen.
+    const QString& offer() const { return mOffer; }
+    /// That column; 0 where they cannot.
     int offeredColumn() const;
 
     void bringUpToDate() const;
@@ -125,6 +138,7 @@ private:
     int mRow = 1;
     int mCol = 1;
     int mRowHeight = 0;
+    QString mOffer;
     Sample mSample;
     int mResized = 0; ///< the column whose border the mouse drags
     bool mStale = false;

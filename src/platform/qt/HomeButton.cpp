@@ -13,8 +13,6 @@ namespace platform::qt {
 
 HomeButton::HomeButton(QWidget* parent) : QToolButton(parent) {
     setFocusPolicy(Qt::ClickFocus);
-    setToolTip(tr("Back to the origin"));
-    setAccessibleName(toolTip());
     setAutoFillBackground(true);
 }
 

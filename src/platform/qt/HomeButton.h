@@ -1,14 +1,11 @@
 #pragma once
 
-#include <QCoreApplication>
 #include <QToolButton>
 
 namespace platform::qt {
 
 /// The square between the scroll bars that brings the canvas back to its origin.
 class HomeButton : public QToolButton {
-    Q_DECLARE_TR_FUNCTIONS(platform::qt::HomeButton)
-
 public:
     explicit HomeButton(QWidget* parent);
 

@@ -6,6 +6,7 @@
 #include "platform/qt/ShownText.h"
 #include "platform/qt/Text.h"
 
+#include <QApplication>
 #include <QDialog>
 #include <QKeyEvent>
 #include <QScopedValueRollback>
@@ -100,7 +101,9 @@ ButtonAdapter::ButtonAdapter(QAbstractButton* widget, FocusTracker& focus,
 }
 
 void ButtonAdapter::Caption(const String& value) {
-    if (mWidget) mWidget->setText(toQt(value));
+    if (!mWidget) return;
+    mWidget->setText(toQt(value));
+    mWidget->parentWidget()->updateGeometry();
 }
 
 void ButtonAdapter::Default(bool value) {
@@ -123,6 +126,65 @@ void ChoiceBox::keyPressEvent(QKeyEvent* event) {
 void ChoiceBox::wheelEvent(QWheelEvent* event) {
     const QScopedValueRollback walking(mWalking, true);
     QComboBox::wheelEvent(event);
+}
+
+void ChoiceBox::dropDown() {
+    mDrops = true;
+    queueDrop();
+}
+
+void ChoiceBox::queueDrop() {
+    QMetaObject::invokeMethod(
+        this, [this] { drop(); }, Qt::QueuedConnection);
+}
+
+void ChoiceBox::drop() {
+    if (!mDrops) return;
+    // The release of the press that has opened the box would choose from the list.
+    if (QApplication::mouseButtons() != Qt::NoButton) return qApp->installEventFilter(this);
+    mDrops = false;
+    if (!isVisible() || window()->focusWidget() != this) return;
+    showPopup();
+    mDroppedItself = true;
+    mList = view();
+    mList->installEventFilter(this);
+}
+
+void ChoiceBox::hidePopup() {
+    mDroppedItself = false;
+    QComboBox::hidePopup();
+}
+
+void ChoiceBox::hideEvent(QHideEvent* event) {
+    mDrops = false;
+    qApp->removeEventFilter(this);
+    QComboBox::hideEvent(event);
+}
+
+bool ChoiceBox::eventFilter(QObject* watched, QEvent* event) {
+    if (mDrops && event->type() == QEvent::MouseButtonRelease) {
+        qApp->removeEventFilter(this);
+        queueDrop();
+    }
+    const bool keys =
+        event->type() == QEvent::KeyPress || event->type() == QEvent::ShortcutOverride;
+    if (watched == mList && mDroppedItself && keys && keyInList(static_cast<QKeyEvent&>(*event)))
+        return true;
+    return QComboBox::eventFilter(watched, event);
+}
+
+/// The keys that close a list together with its box.
+bool ChoiceBox::keyInList(QKeyEvent& key) {
+    const bool tab = key.key() == Qt::Key_Tab || key.key() == Qt::Key_Backtab;
+    if (!tab && key.key() != Qt::Key_Escape) return false;
+    key.accept();
+    // Nobody else is to close the list before the key itself comes.
+    if (key.type() == QEvent::ShortcutOverride) return true;
+    if (tab) setCurrentIndex(mList->currentIndex().row());
+    hidePopup();
+    QKeyEvent goesOn(QEvent::KeyPress, key.key(), key.modifiers());
+    QCoreApplication::sendEvent(this, &goesOn);
+    return true;
 }
 
 ComboBoxAdapter::ComboBoxAdapter(ChoiceBox* widget, FocusTracker& focus,
@@ -148,6 +210,10 @@ void ComboBoxAdapter::ListIndex(std::int16_t value) {
     mWidget->setCurrentIndex(value);
 }
 
+void ComboBoxAdapter::DropDown() {
+    if (mWidget) mWidget->dropDown();
+}
+
 String ComboBoxAdapter::Text() const { return mWidget ? fromQt(mWidget->currentText()) : String(); }
 
 void ComboBoxAdapter::Clear() {
@@ -160,6 +226,8 @@ void ComboBoxAdapter::AddItem(const String& text) {
     const int chosen = mWidget->currentIndex();
     mWidget->addItem(toQt(text));
     mWidget->setCurrentIndex(chosen);
+    // What stands around it is asked for its size before it would learn of this.
+    mWidget->parentWidget()->updateGeometry();
 }
 
 void ComboBoxAdapter::Font(const platform::Font& value) {

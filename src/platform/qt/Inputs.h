@@ -5,9 +5,11 @@
 #include "platform/qt/Adapter.h"
 
 #include <QAbstractButton>
+#include <QAbstractItemView>
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QPointer>
 #include <QPushButton>
 
 namespace platform::qt {
@@ -45,13 +47,26 @@ public:
     explicit ChoiceBox(QWidget* parent) : QComboBox(parent) {}
 
     bool isWalking() const { return mWalking; }
+    /// As ComboBox::DropDown.
+    void dropDown();
+
+    void hidePopup() override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
 
 protected:
     void keyPressEvent(QKeyEvent* event) override;
     void wheelEvent(QWheelEvent* event) override;
+    void hideEvent(QHideEvent* event) override;
 
 private:
+    void queueDrop();
+    void drop();
+    bool keyInList(QKeyEvent& key);
+
     bool mWalking = false;
+    bool mDrops = false;         ///< as soon as it can
+    bool mDroppedItself = false; ///< and is down
+    QPointer<QAbstractItemView> mList;
 };
 
 class ComboBoxAdapter final : public Adapter<platform::ComboBox, ChoiceBox> {
@@ -67,6 +82,7 @@ public:
     void Enabled(bool value) override { enable(value); }
     void Font(const platform::Font& value) override;
     void SetFocus() override { mFocus.take(mWidget); }
+    void DropDown() override;
 };
 
 class TextBoxAdapter final : public Adapter<platform::TextBox, QLineEdit> {

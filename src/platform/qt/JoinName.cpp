@@ -7,17 +7,15 @@
 #include "platform/qt/ShownText.h"
 #include "platform/qt/Text.h"
 
-#include <QCoreApplication>
-
 #include <array>
 
 namespace platform::qt {
 
 namespace {
 
-QString phrase(const QString& left, StringView symbol, const QString& right) {
-    return QCoreApplication::translate("ZandorWidget", "Join %1 %2 %3")
-        .arg(left, toQt(symbol), right);
+QString phrase(const TalvikDBxZandor::Zandor& control, const QString& left, StringView symbol,
+               const QString& right) {
+    return toQt(control.Words().Join).arg(left, toQt(symbol), right);
 }
 
 QString field(const String& table, const String& column) {
@@ -37,9 +35,10 @@ QString describe(TalvikDBxZandor::Zandor& control, const TalvikZandorLib::ZDJoin
     const std::array<StringView, 4> types = {u"", control.LNGJoinTypeLeftOuter,
                                              control.LNGJoinTypeRightOuter,
                                              control.LNGJoinTypeBothOuter};
-    const QString sides = phrase(field(join.LeftTable()->Name(), join.LeftColumn()->Name()),
-                                 textOf(join.CompareOperator(), TalvikDBxZandor::operatorSymbols),
-                                 field(join.RightTable()->Name(), join.RightColumn()->Name()));
+    const QString sides =
+        phrase(control, field(join.LeftTable()->Name(), join.LeftColumn()->Name()),
+               textOf(join.CompareOperator(), TalvikDBxZandor::operatorSymbols),
+               field(join.RightTable()->Name(), join.RightColumn()->Name()));
     const StringView type = textOf(join.JoinType(), types);
     return type.empty() ? sides : sides + QStringLiteral(", ") + toQt(type);
 }
@@ -66,7 +65,7 @@ QString joinName(TalvikDBxZandor::Zandor& control, const LineEnds& ends) {
     } catch (...) {
         // A name is no reason for a box: what the canvas knows by itself will do.
     }
-    return phrase(field(west->table()->Text(), west->Text()), u"=",
+    return phrase(control, field(west->table()->Text(), west->Text()), u"=",
                   field(east->table()->Text(), east->Text()));
 }
 

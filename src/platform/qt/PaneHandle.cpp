@@ -1,6 +1,7 @@
 #include "platform/qt/PaneHandle.h"
 
 #include "platform/qt/FocusFrame.h"
+#include "platform/qt/Text.h"
 
 #include <QKeyEvent>
 #include <QMouseEvent>
@@ -14,9 +15,12 @@ PaneHandle::PaneHandle(QWidget* parent) : QWidget(parent) {
     setCursor(Qt::SplitVCursor);
     setAttribute(Qt::WA_OpaquePaintEvent);
     setAttribute(Qt::WA_Hover);
-    setAccessibleName(tr("Divider of canvas and grid"));
-    setToolTip(tr("Drag to give the canvas or the grid more room"));
     hide();
+}
+
+void PaneHandle::setWords(const Words& words) {
+    setAccessibleName(toQt(words.Divider));
+    setToolTip(toQt(words.MoveDivider));
 }
 
 void PaneHandle::moveBy(int down) {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "platform/Words.h"
+
 #include <QWidget>
 
 #include <functional>
@@ -13,6 +15,7 @@ class PaneHandle : public QWidget {
 public:
     explicit PaneHandle(QWidget* parent);
 
+    void setWords(const Words& words);
     /// Told by how many logical pixels the bar is to move down.
     void setMover(std::function<void(int)> mover) { mMover = std::move(mover); }
 

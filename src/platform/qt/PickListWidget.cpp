@@ -25,7 +25,7 @@ constexpr QSize widths(220, 420); // least and most, logical pixels
 constexpr int border = 2;
 
 /// The items that hold every word typed, in whatever order and case.
-class Words : public QSortFilterProxyModel {
+class Filter : public QSortFilterProxyModel {
 public:
     using QSortFilterProxyModel::QSortFilterProxyModel;
 
@@ -50,17 +50,14 @@ private:
 
 PickListWidget::PickListWidget(QWidget* parent, Picked picked)
     : QFrame(parent), mPicked(std::move(picked)), mItems(new QStringListModel(this)),
-      mLeft(new Words(this)), mBox(new QLineEdit), mList(new QListView) {
+      mLeft(new Filter(this)), mBox(new QLineEdit), mList(new QListView) {
     hide();
     // Opaque, so that showing it never makes what lies below paint itself.
     setAutoFillBackground(true);
     mLeft->setSourceModel(mItems);
-    mBox->setPlaceholderText(tr("Type to find a field"));
-    mBox->setAccessibleName(tr("Field"));
     mBox->setFrame(false);
     mBox->installEventFilter(this);
     mList->setModel(mLeft);
-    mList->setAccessibleName(tr("Fields"));
     mList->setFrameShape(QFrame::NoFrame);
     mList->setEditTriggers(QListView::NoEditTriggers);
     mList->setUniformItemSizes(true);
@@ -75,7 +72,7 @@ PickListWidget::PickListWidget(QWidget* parent, Picked picked)
     layout->addWidget(mList, 1);
 
     connect(mBox, &QLineEdit::textEdited, this, [this](const QString& typed) {
-        static_cast<Words*>(mLeft)->setTyped(typed);
+        static_cast<Filter*>(mLeft)->setTyped(typed);
         chooseFirst();
     });
     connect(mList, &QListView::clicked, this, &PickListWidget::pick);
@@ -84,16 +81,21 @@ PickListWidget::PickListWidget(QWidget* parent, Picked picked)
     });
 }
 
+void PickListWidget::setWords(const platform::Words& words) {
+    mBox->setPlaceholderText(toQt(words.FindField));
+    mBox->setAccessibleName(toQt(words.Field));
+    mList->setAccessibleName(toQt(words.Fields));
+}
+
 void PickListWidget::open(const QRect& over, const QStringList& items, const QString& typed,
                           int position) {
     mItems->setStringList(items);
-    static_cast<Words*>(mLeft)->setTyped(typed);
+    static_cast<Filter*>(mLeft)->setTyped(typed);
     mBox->setText(typed);
     mList->setMinimumHeight(0);
     stand(over);
     show();
     raise();
-    mBox->setFocus();
     const QModelIndex current = mLeft->mapFromSource(mItems->index(position));
     if (!current.isValid()) return chooseFirst();
     mList->setCurrentIndex(current);
@@ -195,6 +197,7 @@ void PickListAdapter::Open(const Bounds& over, const std::vector<String>& items,
     QStringList names;
     for (const String& item : items) names += asSigns(toQt(item));
     mWidget->open(toPixels(over), names, toQt(typed), position);
+    if (mWidget->box().isVisible()) mFocus.take(&mWidget->box());
 }
 
 } // namespace platform::qt

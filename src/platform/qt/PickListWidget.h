@@ -1,9 +1,9 @@
 #pragma once
 
 #include "platform/PickList.h"
+#include "platform/Words.h"
 #include "platform/qt/Adapter.h"
 
-#include <QCoreApplication>
 #include <QFrame>
 
 class QKeyEvent;
@@ -16,13 +16,12 @@ namespace platform::qt {
 
 /// A box and, below it, the list of what is left of the items.
 class PickListWidget : public QFrame {
-    Q_DECLARE_TR_FUNCTIONS(platform::qt::PickListWidget)
-
 public:
     using Picked = std::function<void(int position)>;
 
     PickListWidget(QWidget* parent, Picked picked);
 
+    void setWords(const Words& words);
     void open(const QRect& over, const QStringList& items, const QString& typed, int position);
     /// Called when the user has done with it, before an item is told.
     void setClose(std::function<void()> close) { mClose = std::move(close); }

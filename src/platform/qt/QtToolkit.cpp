@@ -22,6 +22,7 @@
 
 #include <QApplication>
 #include <QFontMetricsF>
+#include <QInputMethod>
 #include <QPushButton>
 
 namespace platform::qt {
@@ -72,6 +73,27 @@ std::unique_ptr<AdapterType> QtToolkit::adapt(const Design& design, Role role, W
     return adapter;
 }
 
+void QtToolkit::setWords(const Words& words) {
+    const QString before = toQt(mWords.Designer);
+    mWords = words;
+    const auto name = [&](const char* part, const String& word) {
+        auto* const widget = mSurface.findChild<QWidget*>(QLatin1String(part));
+        if (widget) widget->setAccessibleName(toQt(word));
+        return widget;
+    };
+    // A name that the host has given stays.
+    if (mSurface.accessibleName().isEmpty() || mSurface.accessibleName() == before)
+        mSurface.setAccessibleName(toQt(words.Designer));
+    name("fraTable", words.Canvas);
+    name("hsbTable", words.ScrollAcross);
+    name("vsbTable", words.ScrollDown);
+    if (QWidget* const home = name("cmdHome", words.Home)) home->setToolTip(home->accessibleName());
+    if (grid()) grid()->setWords(words);
+    for (auto* const box : mSurface.findChildren<TabuletWidget*>()) box->setWords(words);
+    for (auto* const list : mSurface.findChildren<QFrame*>())
+        if (auto* const fields = dynamic_cast<PickListWidget*>(list)) fields->setWords(words);
+}
+
 void QtToolkit::dismiss() {
     mDrags.cancel();
     mView.setNamer({});
@@ -99,7 +121,12 @@ std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents ev
             const auto* grid = static_cast<const GridWidget*>(mGrid.data());
             return grid ? grid->model().titleOf(grid->currentRow(), grid->currentCol()) : QString();
         });
-    if (!design.Container) new EditorWatch(*frame, [this] { mComforts.editorLeft(); });
+    if (!design.Container)
+        new EditorWatch(*frame, [this] {
+            // A text still being composed is a text typed.
+            QGuiApplication::inputMethod()->commit();
+            mComforts.editorLeft();
+        });
     return adapt<RowFrameAdapter>(design, Role::frame, frame);
 }
 
@@ -178,6 +205,7 @@ std::unique_ptr<Dialog> QtToolkit::makeDialog(const Design& design, DialogEvents
 
 std::unique_ptr<PickList> QtToolkit::makePickList(const Design& design, PickListEvents events) {
     auto* list = new PickListWidget(parentOf(design), std::move(events.Picked));
+    list->setWords(mWords);
     return adapt<PickListAdapter>(design, Role::frame, list);
 }
 
@@ -191,6 +219,7 @@ Ref<TalvikTabulet::Tabulet> QtToolkit::makeTabulet(const Design& design, std::in
     Canvas& canvas = canvasOf(design);
     auto* box = new TabuletWidget(index, canvas);
     box->hide();
+    box->setWords(mWords);
     box->setObjectName(elementName(design.Name, index));
     if (const auto* holder = dynamic_cast<const WidgetHolder*>(pattern);
         holder && holder->widget() && holder->widget()->testAttribute(Qt::WA_SetFont))

@@ -26,6 +26,9 @@ public:
     void close() { mClosing = true; }
     /// The control has ended: its boxes, its dialog, its menu and its drag end too, untold.
     void dismiss();
+    /// What the parts made so far, and those made later, say.
+    void setWords(const Words& words);
+    const Words& words() const { return mWords; }
     DragSession& drags() { return mDrags; }
     CanvasView& view() { return mView; }
     Navigation& navigation() { return mNavigation; }
@@ -82,6 +85,7 @@ private:
     CanvasView mView{mMenu, mDrags, mComforts};
     Navigation mNavigation{mSurface, mView, mComforts};
     QPointer<QWidget> mGrid;
+    Words mWords;
     bool mClosing = false;
 };
 

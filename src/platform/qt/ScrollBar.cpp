@@ -28,7 +28,6 @@ CanvasScrollBar::CanvasScrollBar(Qt::Orientation orientation, QWidget* parent)
     // focus on from a bar.
     setFocusPolicy(Qt::ClickFocus);
     setAutoFillBackground(true);
-    setAccessibleName(orientation == Qt::Horizontal ? tr("Scroll across") : tr("Scroll down"));
 }
 
 void CanvasScrollBar::paintEvent(QPaintEvent* event) {

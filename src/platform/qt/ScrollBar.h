@@ -3,7 +3,6 @@
 #include "platform/Intrinsic.h"
 #include "platform/qt/Adapter.h"
 
-#include <QCoreApplication>
 #include <QScrollBar>
 
 class QWheelEvent;
@@ -12,8 +11,6 @@ namespace platform::qt {
 
 /// Moves the canvas; shows that it has the focus, which scroll bars of most styles do not.
 class CanvasScrollBar : public QScrollBar {
-    Q_DECLARE_TR_FUNCTIONS(platform::qt::CanvasScrollBar)
-
 public:
     CanvasScrollBar(Qt::Orientation orientation, QWidget* parent);
 

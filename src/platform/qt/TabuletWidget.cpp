@@ -6,6 +6,7 @@
 #include "platform/qt/ElisionToolTip.h"
 #include "platform/qt/KeyCodes.h"
 #include "platform/qt/ShownText.h"
+#include "platform/qt/Text.h"
 
 #include <QDropEvent>
 #include <QHelpEvent>
@@ -58,8 +59,6 @@ public:
         setFocusPolicy(Qt::NoFocus);
         setCursor(Qt::ArrowCursor);
         setAttribute(Qt::WA_Hover);
-        setToolTip(QObject::tr("Remove the table"));
-        setAccessibleName(toolTip());
     }
 
 protected:
@@ -135,6 +134,12 @@ TabuletWidget::TabuletWidget(int slot, Canvas& canvas)
 void TabuletWidget::setListener(TabuletListener* listener) {
     mListener = listener;
     mList->setListener(listener);
+}
+
+void TabuletWidget::setWords(const Words& words) {
+    mClose->setToolTip(toQt(words.RemoveTable));
+    mClose->setAccessibleName(mClose->toolTip());
+    mModel->setWords(words);
 }
 
 void TabuletWidget::setTitle(const QString& title) {

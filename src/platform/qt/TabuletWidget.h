@@ -1,5 +1,6 @@
 #pragma once
 
+#include "platform/Words.h"
 #include "platform/qt/ColumnListView.h"
 #include "platform/qt/DragScroller.h"
 
@@ -37,6 +38,7 @@ public:
     int slot() const { return mSlot; }
 
     void setListener(TabuletListener* listener);
+    void setWords(const Words& words);
     ColumnListView& list() const { return *mList; }
     ColumnListModel& model() const { return *mModel; }
     QAbstractButton& closeButton() const { return *mClose; }

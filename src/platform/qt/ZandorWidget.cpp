@@ -9,7 +9,10 @@
 #include "platform/qt/ShownText.h"
 #include "platform/qt/TabuletWidget.h"
 #include "platform/qt/Text.h"
+#include "platform/qt/translatedWords.h"
 
+#include <QGuiApplication>
+#include <QInputMethod>
 #include <QKeyEvent>
 #include <QPaintEvent>
 #include <QPointer>
@@ -86,7 +89,6 @@ ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
     setAutoFillBackground(true);
     setBackgroundRole(QPalette::Window);
     setFocusPolicy(Qt::TabFocus);
-    setAccessibleName(tr("Query designer"));
     resize(sizeHint());
     mToolkit->drags().setKeeper(mHouse);
     mHouse->control.emplace(*mToolkit, library, mHouse->events, mHouse);
@@ -95,7 +97,7 @@ ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
     mToolkit->view().setNamer([this](const platform::qt::CanvasLine& line) {
         return mControl ? joinName(*mControl, line.ends()) : QString();
     });
-    mToolkit->comforts().setWords(translatedWords());
+    resetWords();
     mToolkit->comforts().RenameRequested = [this](const platform::String& key) {
         QMetaObject::invokeMethod(
             this, [this, name = toQt(key)] { Q_EMIT renameRequested(name); }, Qt::QueuedConnection);
@@ -125,17 +127,21 @@ void ZandorWidget::moveDivider(int down) {
     Q_EMIT upperPaneShareChanged(share);
 }
 
-comforts::Words ZandorWidget::translatedWords() {
-    return {.All = fromQt(tr("all", "the rows of a table, at the end of a line")),
-            .Matching = fromQt(tr("the rows of %1 and %2 that match")),
-            .AllOfOne = fromQt(tr("all rows of %1, and those of %2 that match")),
-            .AllOfBoth = fromQt(tr("all rows of %1 and of %2, side by side where they match")),
-            .Rename = fromQt(tr("Re&name…"))};
+const platform::Words& ZandorWidget::words() const { return mToolkit->words(); }
+
+void ZandorWidget::setWords(const platform::Words& words) {
+    mOwnWords = true;
+    say(words);
 }
 
-const comforts::Words& ZandorWidget::comfortWords() const { return mToolkit->comforts().words(); }
+void ZandorWidget::resetWords() {
+    mOwnWords = false;
+    say(platform::qt::translatedWords());
+}
 
-void ZandorWidget::setComfortWords(const comforts::Words& words) {
+void ZandorWidget::say(const platform::Words& words) {
+    mToolkit->setWords(words);
+    mControl->Words(words);
     mToolkit->comforts().setWords(words);
 }
 
@@ -164,7 +170,10 @@ bool ZandorWidget::showCell(const QString& definition, int row) {
     return mToolkit->comforts().showCell(fromQt(definition), row);
 }
 
-void ZandorWidget::takeOver() { mToolkit->comforts().takeOver(); }
+void ZandorWidget::takeOver() {
+    QGuiApplication::inputMethod()->commit(); // a text still being composed is a text typed
+    mToolkit->comforts().takeOver();
+}
 
 bool ZandorWidget::writeTyping(const ZandorModel& copy) {
     return mToolkit->comforts().writeTyping(copy);
@@ -211,7 +220,10 @@ void ZandorWidget::repaint() {
 }
 
 void ZandorWidget::resizeEvent(QResizeEvent*) {
-    if (mControl) mControl->UserControl_Resize();
+    if (!mControl) return;
+    mControl->UserControl_Resize();
+    // An editor that does not go with its cell would be left where that was.
+    if (!comforts().KeepsTyping) queuePaint();
 }
 
 void ZandorWidget::showEvent(QShowEvent*) { queuePaint(); }
@@ -242,8 +254,9 @@ void ZandorWidget::keyPressEvent(QKeyEvent* event) {
 
 void ZandorWidget::changeEvent(QEvent* event) {
     QWidget::changeEvent(event);
-    if (event->type() != QEvent::StyleChange) return;
-    // Its bars may be of another thickness once they have the new style, too.
+    if (event->type() == QEvent::LanguageChange && mControl && !mOwnWords) resetWords();
+    if (event->type() != QEvent::StyleChange && event->type() != QEvent::FontChange) return;
+    // Its bars may be of another thickness once they have the new style, too, and cells elsewhere.
     QMetaObject::invokeMethod(
         this,
         [this] {

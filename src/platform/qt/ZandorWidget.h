@@ -2,7 +2,6 @@
 
 #include "comforts/Field.h"
 #include "comforts/Flags.h"
-#include "comforts/Words.h"
 #include "control/Zandor.h"
 
 #include <QMap>
@@ -294,9 +293,13 @@ public:
     /// within 0.05 and 0.95.
     double upperPaneShare() const;
     void setUpperPaneShare(double share);
-    /// What the comforts say; translated by what is installed for the class.
-    const comforts::Words& comfortWords() const;
-    void setComfortWords(const comforts::Words& words);
+    /// What is shown and spoken that no property says. At first it is what the translators that
+    /// are installed have for it, in this class's context; another language that the application
+    /// takes is followed until a host sets words of its own. See docs/words.md.
+    const platform::Words& words() const;
+    void setWords(const platform::Words& words);
+    /// Back to what the translators have, for a host that has set its own.
+    void resetWords();
 
 Q_SIGNALS:
     /// DeletedTable has the name.
@@ -334,7 +337,7 @@ private:
 
     void queuePaint();
     void moveDivider(int down);
-    static comforts::Words translatedWords();
+    void say(const platform::Words& words);
     void setInteger(platform::StringView procedure, int value,
                     void (*set)(TalvikDBxZandor::Zandor&, std::int16_t));
 
@@ -342,4 +345,5 @@ private:
     platform::qt::QtToolkit* mToolkit;
     TalvikDBxZandor::Zandor* mControl = nullptr;
     bool mPaintQueued = false;
+    bool mOwnWords = false; ///< the host has set them
 };
