@@ -72,18 +72,20 @@ void Comforts::bound(Door& door) {
     placeEditor(door);
 }
 
-void Comforts::raised(TalvikDBxZandor::Event event,
+bool Comforts::raised(TalvikDBxZandor::Event event,
                       const TalvikDBxZandor::EventArguments& arguments) {
     using TalvikDBxZandor::Event;
     const bool columns = event == Event::ColumnCreated || event == Event::ColumnModified ||
                          event == Event::ColumnRemoved || event == Event::TableDeleted;
-    if (!columns) return;
+    const std::shared_ptr<Door> held = mDoor;
+    if (!columns || !held) return true;
     act(u"raised", [&](Door& door) {
         if (mFlags.MarksOutput) door.markOutput(true);
         if (event == Event::ColumnCreated || event == Event::ColumnModified)
             fit(door, door.columnOfKey(arguments.Definition->Key()));
         return true;
     });
+    return held->isOpen();
 }
 
 } // namespace comforts

@@ -52,8 +52,9 @@ public:
     const platform::Words& words() const { return mWords; }
     void setWords(const platform::Words& words);
 
-    /// An event of the control, on its way to the host.
-    void raised(TalvikDBxZandor::Event event, const TalvikDBxZandor::EventArguments& arguments);
+    /// An event of the control, on its way to the host. False once the control has ended, as it may
+    /// in a call of the model: the event has nowhere to go.
+    bool raised(TalvikDBxZandor::Event event, const TalvikDBxZandor::EventArguments& arguments);
 
     // Entries of tables
     /// On an entry (1-based) of the table in a slot.

@@ -125,10 +125,14 @@ void Zandor::ShowTablesAnew(const QueryPicture& picture) {
             cascade += cascadeSteps(table);
             continue;
         }
+        // Before it takes a slot; one that has been closed since the model was read has none.
+        Held<TalvikZandorLib::ZDTable> added;
+        quietly([&] { added = Tables().Item(table.key); });
+        require(binding == mBinding);
         std::int32_t slot = 0;
-        if (!mTableFreeList->GetNextFreeIndex(slot)) continue;
+        if (!added || !mTableFreeList->GetNextFreeIndex(slot)) continue;
         shown.slot(n) = static_cast<std::int16_t>(slot);
-        ShowTable(shown.slot(n), Tables().Item(table.key), cascade);
+        ShowTable(shown.slot(n), added, cascade);
         require(binding == mBinding);
     }
     // The current table stays, and has an heir when it has gone.

@@ -5,58 +5,7 @@ namespace gridstage {
 namespace {
 
 TEST_F(AScenario, OfCellsSetLeftAndSetTwice) {
-    dragToColumn(ORDERS, {id, total}, 1);
-    openCell(synonymRow, 1);
-    stage->type("txtValue", u"Number");
-    stage->clickButton("cmdSetTextValue");
-    openCell(synonymRow, 2);
-    stage->type("txtValue", u"Sum");
-    stage->key("txtValue", enter);
-    noteEditor();
-    openCell(sortRow, 1);
-    stage->choose("cobSortOrder", 2);
-    stage->key("cobSortOrder", enter);
-    openCell(sortRow, 1);
-    stage->choose("cobSortOrder", 1);
-    stage->key("cobSortOrder", escape);
-    noteEditor();
-    openCell(visibleRow, 2);
-    stage->choose("cobVisibility", 1);
-    stage->clickButton("cmdSetVisibility");
-    openCell(visibleRow, 1);
-    stage->choose("cobVisibility", 1);
-    stage->key("cobVisibility", escape);
-    openCell(criteriaRow, 1);
-    stage->type("txtValue", u"> 7");
-    stage->clickButton("cmdSetTextValue");
-    openCell(criteriaRow + 1, 1);
-    stage->type("txtValue", u"never");
-    openCell(criteriaRow, 1);
-    stage->type("txtValue", u"never either");
-    note("> press the canvas");
-    stage->pressCanvas(left, 4350, 3900);
-    stage->releaseCanvas(left, 4350, 3900);
-    noteEditor();
-    openCell(criteriaRow, 1);
-    note("> press the field row");
-    press(left, fieldRow, 1);
-    noteEditor();
-    openCell(criteriaRow, 2);
-    stage->type("txtValue", u"");
-    stage->clickButton("cmdSetTextValue");
-    openCell(criteriaRow, 1);
-    stage->type("txtValue", u"");
-    stage->clickButton("cmdSetTextValue");
-    openCell(synonymRow, 5);
-    stage->type("txtValue", u"lost");
-    stage->clickButton("cmdSetTextValue");
-    note("> again");
-    stage->clickButton("cmdSetTextValue");
-    noteEditor();
-    note("> scroll the grid");
-    stage->scrollGrid(1, 2);
-    noteEditor();
-    noteQuery(2);
+    play();
     EXPECT_EQ(story(), R"(
 > drag ORDERS.ID, ORDERS.TOTAL to column 1
 event:ColumnCreated

@@ -4,6 +4,7 @@
 #include "support/FakeModel.h"
 #include "support/Stage.h"
 #include "support/StageEvents.h"
+#include "support/Tables.h"
 
 #include <gtest/gtest.h>
 
@@ -44,15 +45,21 @@ inline Stage::Box report(platform::StringView procedure, const platform::Runtime
 
 inline platform::RuntimeError refusal() { return {1234, u"The host refuses."}; }
 
+/// The names of the enabled entries of a menu.
+inline std::vector<std::string> enabledIn(const std::vector<Stage::Entry>& entries) {
+    std::vector<std::string> names;
+    for (const auto& entry : entries)
+        if (entry.enabled && entry.caption != u"-") names.push_back(platform::toUtf8(entry.name));
+    return names;
+}
+
 class GridTest : public testing::Test {
 protected:
     GridTest() {
         control().DebugSwitch(0);
         control().OnlyJoin(false);
-        orders = model->table(u"ORDERS", {u"*", u"ID", u"CUSTOMER", u"TOTAL"});
-        orders->place(300, 300, 2400, 2400);
-        customers = model->table(u"CUSTOMERS", {u"*", u"ID", u"NAME"});
-        customers->place(6000, 300, 2400, 2400);
+        orders = addOrders(*model);
+        customers = addCustomers(*model);
     }
 
     TalvikDBxZandor::Zandor& control() { return stage->control(); }
@@ -118,13 +125,7 @@ protected:
     }
 
     /// The names of the enabled entries of the menu seen last.
-    std::vector<std::string> enabled() const {
-        std::vector<std::string> names;
-        for (const auto& entry : menu)
-            if (entry.enabled && entry.caption != u"-")
-                names.push_back(platform::toUtf8(entry.name));
-        return names;
-    }
+    std::vector<std::string> enabled() const { return enabledIn(menu); }
 
     bool shows(const std::string& element) { return stage->look(element).visible; }
 

@@ -5,22 +5,7 @@ namespace gridstage {
 namespace {
 
 TEST_F(AScenario, OfTheMenuInItsThreePlaces) {
-    menuOnEntry(ORDERS, total);
-    menuOnCell(synonymRow, 1);
-    menuOnEntry(ORDERS, customer, "mnuTableDefinitionCopy");
-    menuOnEntry(ORDERS, total, "mnuTableDefinitionPaste");
-    menuOnEntry(CUSTOMERS, id, "mnuTableDefinitionPaste");
-    note("> menu on the canvas");
-    menuOnCanvas(4350, 3900);
-    menuOnCell(synonymRow, 1, "mnuColumnDefinitionPaste");
-    menuOnCell(sortRow, 1, "mnuColumnDefinitionPaste");
-    menuOnEntry(PARTS, no, "mnuTableDefinitionCopy");
-    menuOnCell(synonymRow, 0, "mnuColumnDefinitionPaste");
-    menuOnCell(synonymRow, 2, "mnuColumnDefinitionDelete");
-    menuOnCell(synonymRow, 7, "mnuColumnDefinitionDelete");
-    menuOnJoin(1, "mnuJoinDelete");
-    menuOnEntry(PARTS, no, "mnuTableDefinitionDelete");
-    noteQuery(3);
+    play();
     EXPECT_EQ(story(), R"(
 > menu on ORDERS.TOTAL 
 event:Activate
@@ -121,25 +106,7 @@ grid ORDERS.CUSTOMER, -, -
 }
 
 TEST_F(AScenario, OfAJoinsDefinitionShownKeptLeftAndChanged) {
-    dragTo(ORDERS, {customer}, CUSTOMERS, id);
-    const auto choose = [this](std::int16_t type, std::int16_t compare, const char* button) {
-        return [this, type, compare, button] {
-            stage->choose("cboJoinType", type);
-            stage->choose("cboJoinCompareOperator", compare);
-            if (*button) stage->clickButton(button);
-        };
-    };
-    const std::string show = "mnuJoinShowDefinition";
-    menuOnJoin(1, show, [this] { stage->clickButton("cmdOk"); });
-    menuOnJoin(1, show, [this] { stage->clickButton("cmdCancel"); });
-    menuOnJoin(1, show, choose(1, 5, "cmdCancel"));
-    menuOnJoin(1, show, choose(2, 3, ""));
-    menuOnJoin(1, show, [this] { stage->key("cboJoinType", escape); });
-    menuOnJoin(1, show, choose(1, 0, "cmdOk"));
-    noteQuery(1);
-    control().JoinModifyDisabled(0);
-    menuOnJoin(1, show, choose(3, 4, "cmdOk"));
-    noteQuery(1);
+    play();
     EXPECT_EQ(story(), R"(
 > drag ORDERS.CUSTOMER to CUSTOMERS.ID
 event:JoinCreated

@@ -3,8 +3,8 @@
 #include "GridStage.h"
 
 #include <functional>
-#include <sstream>
-#include <utility>
+#include <string>
+#include <vector>
 
 namespace gridstage {
 
@@ -15,151 +15,106 @@ constexpr std::int16_t PARTS = 3;
 constexpr std::int32_t no = 2;
 constexpr std::int32_t nowhere = 0;
 
-inline std::string joined(const std::vector<std::string>& texts) {
-    std::string all;
-    for (const std::string& text : texts) all += (all.empty() ? "" : ", ") + text;
-    return all;
+/// What a user does in a row with three tables, ORDERS in slot 1, CUSTOMERS in slot 2 and PARTS in
+/// slot 3, step by step, and what is told of it. Nothing is expected here, so that it can be played
+/// while a host gets in the way; who plays it may change what a step is.
+class Scenario {
+public:
+    /// Answers the stage's menus and dialogs while it is there, after whoever did before.
+    Scenario(Stage& stage, const Ref<fake::Model>& model);
+    Scenario(const Scenario&) = delete;
+    Scenario& operator=(const Scenario&) = delete;
+    virtual ~Scenario();
+
+    /// A press, a release, a key.
+    virtual void step(const std::function<void()>& deed) { deed(); }
+    /// A look at what has come of it, for the story.
+    virtual void look(const std::function<void()>& deed) { deed(); }
+    virtual void closeControl() { stage.closeControl(); }
+
+    void note(const std::string& line) { stage.transcript.push_back(line); }
+    TalvikDBxZandor::Zandor& control() { return stage.control(); }
+
+    void focus(const std::string& name);
+    void selectEntries(std::int16_t table, const std::vector<std::int32_t>& entries);
+    void pressEntry(std::int16_t table, std::int32_t entry, std::int16_t button);
+    void releaseEntry(std::int16_t table, std::int32_t entry, std::int16_t button);
+    void dragTo(std::int16_t from, const std::vector<std::int32_t>& entries, std::int16_t to,
+                std::int32_t target);
+    void dragToColumn(std::int16_t from, const std::vector<std::int32_t>& entries,
+                      std::int32_t col);
+
+    void menuOnEntry(std::int16_t table, std::int32_t entry, const std::string& command = {});
+    void menuOnCell(std::int32_t row, std::int32_t col, const std::string& command = {});
+    void menuOnCanvas(float x, float y, const std::string& command = {});
+    void menuOnJoin(int number, const std::string& command = {},
+                    const std::function<void()>& inDialog = {});
+
+    void openCell(std::int32_t row, std::int32_t col);
+    void pressCell(std::int32_t row, std::int32_t col);
+    void pressCanvas(float x, float y);
+    void type(const std::string& name, const String& text);
+    void choose(const std::string& name, std::int16_t listIndex);
+    void key(const std::string& name, std::int16_t keyCode);
+    void clickButton(const std::string& name);
+
+    void moveTable(std::int16_t table, float x, float y);
+    void resizeTable(std::int16_t table, float width, float height);
+    void closeTable(std::int16_t table);
+    void scrollBarTo(const std::string& name, std::int16_t value);
+    void scrollList(std::int16_t table, std::int32_t firstEntry);
+    void scrollGrid(std::int32_t topRow, std::int32_t leftCol);
+
+    /// Which editor is open, and with what in it.
+    void noteEditor();
+    void notePlace(std::int16_t table);
+    /// How far the canvas is scrolled, whether it can be, and which table was deleted last.
+    void noteScroll();
+    /// The joins and output columns of the model, and the first cells of the grid.
+    void noteQuery(std::int32_t columns);
+
+protected:
+    Stage& stage;
+    const Ref<fake::Model> model;
+
+private:
+    std::string entryName(std::int16_t table, std::int32_t entry);
+    std::string entryNames(std::int16_t table, const std::vector<std::int32_t>& entries);
+
+    const std::function<String(const std::vector<Stage::Entry>&)> mMenuBefore;
+    const std::function<void()> mDialogBefore;
+    std::string mChosen;
+    std::function<void()> mInDialog;
+};
+
+/// ORDERS, CUSTOMERS and PARTS.
+inline void addTables(fake::Model& model) {
+    addOrders(model);
+    addCustomers(model);
+    addParts(model);
 }
 
-/// What a user does in a row, and everything that is told of it, in its order: three tables, ORDERS
-/// in slot 1, CUSTOMERS in slot 2 and PARTS in slot 3. As each program runs the same scenarios, the
-/// toolkits tell the same.
+/// A scenario under the name of the test that expects its story.
+struct NamedScenario {
+    const char* name;
+    void (*play)(Scenario&);
+};
+const std::vector<NamedScenario>& scenarios();
+
+/// A scenario on a stage of its own, and everything that is told of it, in its order. As each
+/// program plays the same scenarios, the toolkits tell the same.
 class AScenario : public GridTest {
 protected:
     AScenario() {
-        parts = model->table(u"PARTS", {u"*", u"NO", u"TITLE"});
-        parts->place(9000, 300, 2100, 2400);
+        addParts(*model);
         control().JoinModifyDisabled(1);
-        stage->onMenu = [this](const std::vector<Stage::Entry>& shown) {
-            menu = shown;
-            note("  can " + joined(enabled()));
-            return platform::fromUtf8(std::exchange(mChosen, {}));
-        };
-        stage->onDialog = [this] {
-            note("  shows " + platform::toUtf8(stage->look("cboJoinType").text) + " " +
-                 platform::toUtf8(stage->look("cboJoinCompareOperator").text));
-            if (const auto use = std::exchange(mInDialog, {})) use();
-        };
         bind();
     }
 
-    void note(const std::string& line) { stage->transcript.push_back(line); }
-
+    /// Plays the one of the test's own name.
+    void play();
     /// What was told, each on a line of its own.
-    std::string story() const {
-        std::string all = "\n";
-        for (const std::string& told : stage->transcript) {
-            for (const char letter : told) {
-                if (letter == '\r') continue;
-                all += letter == '\n' ? "\n  " : std::string(1, letter == '\t' ? ' ' : letter);
-            }
-            all += "\n";
-        }
-        return all;
-    }
-
-    std::string entryName(std::int16_t table, std::int32_t entry) {
-        const auto list = stage->look("lstTable(" + std::to_string(table) + ")");
-        return platform::toUtf8(list.text) + "." +
-               (entry == 0 ? "(empty)" : platform::toUtf8(list.items.at(std::size_t(entry) - 1)));
-    }
-    std::string entryNames(std::int16_t table, const std::vector<std::int32_t>& entries) {
-        std::vector<std::string> names;
-        for (const std::int32_t entry : entries) names.push_back(entryName(table, entry));
-        return joined(names);
-    }
-
-    void dragTo(std::int16_t from, const std::vector<std::int32_t>& entries, std::int16_t to,
-                std::int32_t target) {
-        note("> drag " + entryNames(from, entries) + " to " + entryName(to, target));
-        stage->selectEntries(from, entries);
-        stage->dragToEntry(from, entries.front(), to, target);
-    }
-    void dragToColumn(std::int16_t from, const std::vector<std::int32_t>& entries,
-                      std::int32_t col) {
-        note("> drag " + entryNames(from, entries) + " to column " + std::to_string(col));
-        drag(from, entries, col);
-    }
-
-    void menuOnEntry(std::int16_t table, std::int32_t entry, const std::string& command = {}) {
-        note("> menu on " + entryName(table, entry) + " " + command);
-        mChosen = command;
-        stage->pressEntry(table, entry, right);
-        stage->releaseEntry(table, entry, right);
-    }
-    void menuOnCell(std::int32_t row, std::int32_t col, const std::string& command = {}) {
-        note("> menu on column " + std::to_string(col) + " " + command);
-        mChosen = command;
-        stage->pressCell(right, row, col);
-        stage->releaseCell(right, row, col);
-    }
-    void menuOnCanvas(float x, float y, const std::string& command = {}) {
-        mChosen = command;
-        stage->pressCanvas(right, x, y);
-        stage->releaseCanvas(right, x, y);
-    }
-    void menuOnJoin(int number, const std::string& command = {},
-                    const std::function<void()>& inDialog = {}) {
-        note("> menu on join " + std::to_string(number) + " " + command);
-        mInDialog = inDialog;
-        const auto line = stage->look("linJoin(" + std::to_string(number) + ")");
-        menuOnCanvas((line.X1 + line.X2) / 2, (line.Y1 + line.Y2) / 2, command);
-    }
-
-    void openCell(std::int32_t row, std::int32_t col) {
-        note("> open row " + std::to_string(row) + " of column " + std::to_string(col));
-        press(left, row, col);
-        noteEditor();
-    }
-    /// Which editor is open, and with what in it.
-    void noteEditor() {
-        const std::pair<const char*, const char*> editors[] = {{"fraSortOrder", "cobSortOrder"},
-                                                               {"fraVisibility", "cobVisibility"},
-                                                               {"fraValue", "txtValue"}};
-        for (const auto& [frame, input] : editors)
-            if (shows(frame))
-                note("  " + std::string(input) + " reads '" +
-                     platform::toUtf8(stage->look(input).text) + "'");
-    }
-
-    void notePlace(std::int16_t table) {
-        const auto box = stage->look("lstTable(" + std::to_string(table) + ")").bounds;
-        const auto& stored = model->tableAt(table);
-        std::ostringstream line;
-        line << "  at " << box.Left << " " << box.Top << ", " << box.Width << " by " << box.Height;
-        note(line.str());
-        EXPECT_EQ(box, (platform::Bounds{stored.left, stored.top, stored.width, stored.height}));
-    }
-
-    /// The joins and output columns of the model, and the first cells of the grid.
-    void noteQuery(std::int32_t columns) {
-        note("> query");
-        for (std::int32_t i = 1; i <= model->joinCount(); ++i) {
-            const auto& join = model->joinAt(i);
-            note(platform::toUtf8(join.leftTable->Name() + u"." + join.leftColumn->Name() + u" - " +
-                                  join.rightTable->Name() + u"." + join.rightColumn->Name()) +
-                 " " + std::to_string(join.joinType) + " " + std::to_string(join.compareOperator));
-        }
-        for (std::int32_t i = 1; i <= model->definitionCount(); ++i) {
-            auto& definition = model->definitionAt(i);
-            String line = definition.key + u" " + definition.column->Name() + u" '" +
-                          definition.synonym + u"' " + platform::decimal(definition.sortOrder) +
-                          (definition.visible ? u" visible" : u" hidden");
-            for (std::int32_t n = 1; n <= definition.criteria.items.Count(); ++n)
-                line += u" [" + definition.criteria.items.Item(n)->Criterium() + u"]";
-            note(platform::toUtf8(line));
-        }
-        std::vector<std::string> shown;
-        for (const String& field : fields(columns))
-            shown.push_back(field.empty() ? "-" : platform::toUtf8(field));
-        note("grid " + joined(shown));
-    }
-
-    Ref<fake::Table> parts;
-
-private:
-    std::string mChosen;
-    std::function<void()> mInDialog;
+    std::string story() const;
 };
 
 } // namespace gridstage

@@ -5,17 +5,7 @@ namespace gridstage {
 namespace {
 
 TEST_F(AScenario, OfColumnsDraggedToTablesAndToTheGrid) {
-    dragTo(ORDERS, {customer}, CUSTOMERS, id);
-    dragTo(ORDERS, {id}, ORDERS, total);
-    dragTo(ORDERS, {id}, CUSTOMERS, allColumns);
-    dragTo(ORDERS, {allColumns}, CUSTOMERS, name);
-    dragTo(ORDERS, {id, total}, CUSTOMERS, name);
-    dragTo(CUSTOMERS, {id}, PARTS, nowhere);
-    dragToColumn(ORDERS, {id, customer, total}, 1);
-    dragToColumn(CUSTOMERS, {name}, 2);
-    dragToColumn(PARTS, {no}, 0);
-    dragToColumn(ORDERS, {allColumns}, 7);
-    noteQuery(6);
+    play();
     EXPECT_EQ(story(), R"(
 > drag ORDERS.CUSTOMER to CUSTOMERS.ID
 event:JoinCreated
@@ -56,43 +46,8 @@ grid PARTS.NO, ORDERS.ID, CUSTOMERS.NAME, ORDERS.CUSTOMER, ORDERS.TOTAL, -
     EXPECT_EQ(stage->cell(fieldRow, 7), u"ORDERS.*");
 }
 
-// The mouse alone; no key is pressed.
 TEST_F(AScenario, OfTablesMovedSizedScrolledAndClosed) {
-    dragTo(ORDERS, {customer}, CUSTOMERS, id);
-    dragTo(CUSTOMERS, {name}, PARTS, no);
-    dragToColumn(CUSTOMERS, {id, name}, 1);
-    const auto move = [this](std::int16_t table, float x, float y) {
-        note("> move table " + std::to_string(table));
-        stage->moveTable(table, x, y);
-        notePlace(table);
-    };
-    move(ORDERS, 900, 600);
-    move(ORDERS, -450, -600);
-    move(PARTS, 11700, 4350);
-    move(PARTS, 9000, 3000);
-    note("> size table 1");
-    stage->resizeTable(ORDERS, 3000, 2700);
-    notePlace(ORDERS);
-    note("> scroll");
-    stage->scrollBarTo("hsbTable", 300);
-    stage->scrollBarTo("vsbTable", 600);
-    stage->scrollList(ORDERS, 1);
-    move(ORDERS, 150, 300);
-    move(PARTS, 12000, 6000);
-    note("> home");
-    stage->clickButton("cmdHome");
-    EXPECT_EQ(stage->look("hsbTable").value, 0);
-    EXPECT_EQ(stage->look("fraTable").bounds.Top, 0);
-    note("> close table 2");
-    stage->closeTable(CUSTOMERS);
-    noteQuery(1);
-    note("> close table 1");
-    stage->closeTable(ORDERS);
-    EXPECT_EQ(control().DeletedTable, u"ORDERS");
-    EXPECT_TRUE(stage->look("hsbTable").enabled);
-    note("> close table 3");
-    stage->closeTable(PARTS);
-    EXPECT_FALSE(stage->look("hsbTable").enabled);
+    play();
     EXPECT_EQ(story(), R"(
 > drag ORDERS.CUSTOMER to CUSTOMERS.ID
 event:JoinCreated
@@ -126,6 +81,7 @@ event:TableMoved
 event:TableMoved
   at 11700 4500, 2100 by 2400
 > home
+  scrolled by 0, 0; deleted '  '
 > close table 2
 event:TableDeleted
 > query
@@ -136,35 +92,15 @@ x2 NAME '' 0 visible
 grid -
 > close table 1
 event:TableDeleted
+  scrolled by 0, 0; deleted 'ORDERS'
 > close table 3
 event:TableDeleted
+  scrolled by 0, disabled, 0; deleted 'PARTS'
 )");
 }
 
 TEST_F(AScenario, ToldByTheTraces) {
-    note("> focus table 3");
-    stage->focus("lstTable(3)");
-    stage->selectEntries(ORDERS, {id, total});
-    stage->selectEntries(CUSTOMERS, {name});
-    control().DebugSwitch(1);
-    note("> press ORDERS.ID");
-    stage->pressEntry(ORDERS, id, left);
-    note("> release it");
-    stage->releaseEntry(ORDERS, id, left);
-    note("> menu on CUSTOMERS.NAME");
-    stage->pressEntry(CUSTOMERS, name, right);
-    stage->releaseEntry(CUSTOMERS, name, right);
-    stage->selectEntries(ORDERS, {customer});
-    dragTo(ORDERS, {customer}, CUSTOMERS, id);
-    note("> move table 3");
-    stage->moveTable(PARTS, 9000, 900);
-    note("> size table 3");
-    stage->resizeTable(PARTS, 2400, 2100);
-    menuOnJoin(1, "mnuJoinShowDefinition");
-    note("> close table 2");
-    stage->closeTable(CUSTOMERS);
-    note("> close the control");
-    stage->closeControl();
+    play();
     EXPECT_EQ(story(), R"(
 > focus table 3
 > press ORDERS.ID

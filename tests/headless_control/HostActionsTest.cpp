@@ -1,3 +1,4 @@
+#include "../control/Scenario.h"
 #include "HostedControl.h"
 #include "support/Backstage.h"
 #include "support/Sample.h"
@@ -11,10 +12,10 @@ namespace {
 using Backstage = TalvikDBxZandor::ZandorBackstage;
 using platform::String;
 
-constexpr std::int16_t left = 1;
-constexpr std::int16_t right = 2;
-constexpr std::int16_t enter = 13;
-constexpr std::int16_t escape = 27;
+using gridstage::enter;
+using gridstage::escape;
+using gridstage::left;
+using gridstage::right;
 
 const std::string orders = "lstTable(1)";
 const std::string customers = "lstTable(2)";
@@ -77,6 +78,36 @@ const Script scripts[] = {
          c.step([&] { c.control().UserControl_Resize(); });
          c.step([&] { c.control().P_GET_Zandor(); });
          c.step([&] { Backstage::ShowSelectedTable(c.control()); });
+     }},
+    {"the model shown anew",
+     [](HostedControl& c) {
+         const auto show = [&] { c.step([&] { c.control().ShowAnew(); }); };
+         show();
+         c.step([&] { c.user.selectEntries(orders, {2, 4}); });
+         c.step([&] { c.user.pressCell(grid, left, 4, 2); });
+         c.step([&] { c.user.type("txtValue", u"> 5"); });
+         auto& model = *c.model;
+         // Other names, places, columns and joins of what stays, and something new of each kind.
+         c.step([&] {
+             model.tableAt(1).name = u"SALES";
+             model.tableAt(1).place(600, 450, 2400, 2400);
+             model.tableAt(1).addColumn(u"STATE");
+             const auto items = model.table(u"ITEMS", {u"*", u"ID"});
+             model.join(items, u"ID",
+                        std::dynamic_pointer_cast<fake::Table>(model.tables.items.Item(1)), u"ID");
+             model.definition(items, u"ID");
+             model.definitionAt(1).synonym = u"Number";
+             model.joinAt(1).joinType = 1;
+         });
+         show();
+         // What has gone: the table with the focus, a join, the definition being edited.
+         c.step([&] { c.user.focus(customers); });
+         c.step([&] {
+             model.tables.items.Remove(model.tableAt(2).key);
+             model.definitions.items.Remove(model.definitionAt(2).key);
+             model.joins.items.Remove(model.joinAt(1).key);
+         });
+         show();
      }},
     {"the host's Terminate", [](HostedControl& c) { c.step([&] { c.control().Terminate(); }); }},
     {"the end", [](HostedControl& c) { c.step([&] { c.destroy(); }); }},
@@ -181,12 +212,48 @@ const Script scripts[] = {
      }},
 };
 
-/// A script with the host doing something at one of its places, and what is wrong afterwards.
-std::string played(const Script& script, int place, HostAction action, std::string& where) {
-    HostedControl c;
+/// A scenario of the suite, with the host in its way.
+class HostedScenario final : public gridstage::Scenario {
+public:
+    explicit HostedScenario(HostedControl& hosted)
+        : Scenario(*hosted.stage, hosted.model), mHosted(hosted) {}
+    void step(const std::function<void()>& deed) override { mHosted.step(deed); }
+    void look(const std::function<void()>&) override {}
+    void closeControl() override {
+        mHosted.step([this] { mHosted.destroy(); });
+    }
+
+private:
+    HostedControl& mHosted;
+};
+
+/// What is played to a control, one step after the other.
+struct Play {
+    std::string name;
+    HostedControl::Fill fill;
+    std::function<void(HostedControl&)> play;
+};
+
+std::vector<Play> plays() {
+    std::vector<Play> all;
+    for (const Script& script : scripts)
+        all.push_back({script.name, HostedControl::fill, script.play});
+    for (const auto& scenario : gridstage::scenarios())
+        all.push_back({std::string("the scenario ") + scenario.name, gridstage::addTables,
+                       [&scenario](HostedControl& hosted) {
+                           hosted.control().JoinModifyDisabled(1);
+                           HostedScenario user(hosted);
+                           scenario.play(user);
+                       }});
+    return all;
+}
+
+/// A play with the host doing something at one of its places, and what is wrong afterwards.
+std::string played(const Play& play, int place, HostAction action, std::string& where) {
+    HostedControl c(play.fill);
     c.bind(c.model);
     c.watch(place, action);
-    script.play(c);
+    play.play(c);
     where = c.where();
     const std::string broken = c.broken();
     if (!c.calledAfterTheEnd().empty())
@@ -194,11 +261,11 @@ std::string played(const Script& script, int place, HostAction action, std::stri
     return broken;
 }
 
-int placesIn(const Script& script) {
-    HostedControl c;
+int placesIn(const Play& play) {
+    HostedControl c(play.fill);
     c.bind(c.model);
     c.watch();
-    script.play(c);
+    play.play(c);
     return c.places();
 }
 
@@ -207,21 +274,22 @@ TEST(AHost, MayDoAnythingAtAnyTime) {
     int cells = 0;
     int tried = 0;
     int failures = 0;
-    for (const Script& script : scripts) {
-        const int places = placesIn(script);
-        EXPECT_GT(places, 0) << script.name;
+    for (const Play& play : plays()) {
+        const int places = placesIn(play);
+        EXPECT_GT(places, 0) << play.name;
         for (int place = 1; place <= places; ++place) {
             for (const HostAction action : hostActions) {
                 if (cells++ % sampleStep() != 0) continue;
                 ++tried;
                 std::string where;
-                const std::string broken = played(script, place, action, where);
+                const std::string broken = played(play, place, action, where);
                 if (broken.empty()) continue;
                 ADD_FAILURE() << "the host " << name(action) << " at place " << place << " ("
-                              << where << ") of " << script.name << ": " << broken;
+                              << where << ") of " << play.name << ": " << broken;
                 if (++failures == 30) GTEST_FAIL() << "and so on";
             }
         }
+        std::cout << "[ MATRIX   ] " << places << " places in " << play.name << '\n';
     }
     std::cout << "[ MATRIX   ] " << tried << " of " << cells << " cells tried\n";
 }

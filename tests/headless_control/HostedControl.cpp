@@ -1,9 +1,9 @@
 #include "HostedControl.h"
 
 #include "support/Backstage.h"
+#include "support/Tables.h"
 
-#include <algorithm>
-#include <array>
+#include <unordered_set>
 #include <utility>
 
 using Backstage = TalvikDBxZandor::ZandorBackstage;
@@ -19,33 +19,32 @@ const char* name(HostAction action) {
     case HostAction::closesATable: return "closes a table";
     case HostAction::removesAJoin: return "removes a join";
     case HostAction::setsOnlyJoin: return "sets OnlyJoin";
+    case HostAction::showsTheModelAnew: return "shows the model anew";
     case HostAction::destroysTheControl: return "destroys the control";
     }
     return "";
 }
 
-HostedControl::HostedControl() : model(newModel()), mOther(newModel()) {
-    toolkit.surface().resize(12000, 9000);
-    toolkit.onMenu = [this](const PopupMenu&) {
+HostedControl::HostedControl(Fill fillModel)
+    : model(newModel(fillModel)),
+      toolkit(dynamic_cast<platform::headless::Toolkit&>(stage->toolkit())),
+      mControl(&stage->control()), mOther(newModel()) {
+    stage->onMenu = [this](const auto&) {
         const std::string entry = std::exchange(chosen, {});
         at("menu");
-        return entry;
+        return platform::fromUtf8(entry);
     };
-    toolkit.onDialog = [this](auto&) {
+    stage->onDialog = [this] {
         at("dialog");
         if (const auto use = std::exchange(inDialog, {}); use && !gone()) use();
     };
+    stage->onEvent = [this] { at("event"); };
     library.calls->onPass = [this](const std::string& call) { at(call); };
     toolkit.faults.onPass = [this](const std::string& call) {
         // Each call of an array's element passes a second time, without its index.
         if (call.starts_with("lstTable.")) return;
-        if (gone() || reachesTheHost(call)) at(call);
+        if (gone() || (mWatching && reachesTheHost(call))) at(call);
     };
-    mHouse = std::make_shared<House>();
-    mHouse->control.emplace(toolkit, library, static_cast<TalvikDBxZandor::ZandorEvents&>(*this),
-                            mHouse);
-    mControl = &*mHouse->control;
-    toolkit.comforts.attach(*mControl);
     mControl->OnlyJoin(false);
     mInvariants = std::make_unique<Invariants>(*mControl, toolkit);
 }
@@ -58,19 +57,21 @@ HostedControl::~HostedControl() {
     toolkit.faults.onPass = nullptr;
 }
 
-Ref<fake::Model> HostedControl::newModel() {
-    auto made = library.newModel();
-    const auto orders = made->table(u"ORDERS", {u"*", u"ID", u"CUSTOMER", u"TOTAL"});
-    orders->place(300, 300, 2400, 2400);
+void HostedControl::fill(fake::Model& model) {
+    const auto orders = addOrders(model);
     orders->selected = 1;
     orders->column(u"ID").selected = true;
     orders->column(u"ID").marker = true;
-    const auto customers = made->table(u"CUSTOMERS", {u"*", u"ID", u"NAME"});
-    customers->place(6000, 300, 2400, 2400);
-    made->table(u"PARTS", {u"*", u"NO", u"TITLE"})->place(9000, 300, 2100, 2400);
-    made->join(orders, u"CUSTOMER", customers, u"ID");
-    made->definition(orders, u"ID", {u"> 1"});
-    made->definition(customers, u"NAME");
+    const auto customers = addCustomers(model);
+    addParts(model);
+    model.join(orders, u"CUSTOMER", customers, u"ID");
+    model.definition(orders, u"ID", {u"> 1"});
+    model.definition(customers, u"NAME");
+}
+
+Ref<fake::Model> HostedControl::newModel(Fill fillModel) {
+    auto made = library.newModel();
+    fillModel(*made);
     return made;
 }
 
@@ -86,14 +87,14 @@ void HostedControl::watch(int place, HostAction action) {
 /// place of a window, of which hosts can be told; lines and marks have no window.
 bool HostedControl::reachesTheHost(const std::string& toolkitCall) {
     if (toolkitCall.starts_with("linJoin") || toolkitCall.starts_with("shpJoin")) return false;
-    static constexpr std::array members = {
+    static const std::unordered_set<std::string> members = {
         "MsgBox",  "SendMessage", "PopupMenuAtMouse", "ShowModal", "Hide",     "Drag",   "SetFocus",
         "Visible", "Visible=",    "Enabled",          "setBounds", "Max=",     "Value=", "Unload",
         "ZOrder",  "Default",     "EnsureVisible",    "Activated", "Complete",
     };
     const auto dot = toolkitCall.rfind('.');
     const std::string member = dot == std::string::npos ? toolkitCall : toolkitCall.substr(dot + 1);
-    return std::find(members.begin(), members.end(), member) != members.end();
+    return members.contains(member);
 }
 
 void HostedControl::at(const std::string& place) {
@@ -106,10 +107,6 @@ void HostedControl::at(const std::string& place) {
     // What the host does reaches its own code again; that is not counted.
     mWatching = false;
     act();
-}
-
-void HostedControl::Raise(TalvikDBxZandor::Event, const TalvikDBxZandor::EventArguments&) {
-    at("event");
 }
 
 void HostedControl::act() {
@@ -127,6 +124,7 @@ void HostedControl::act() {
             Backstage::RemoveJoin(*mControl, Backstage::mJoinLines(*mControl).Item(1));
         return;
     case HostAction::setsOnlyJoin: return mControl->OnlyJoin(!mControl->OnlyJoin());
+    case HostAction::showsTheModelAnew: return mControl->ShowAnew();
     case HostAction::destroysTheControl: mInvariants->watch(); return destroy();
     }
 }
@@ -145,13 +143,13 @@ void HostedControl::destroy() {
     if (std::exchange(mEnding, true)) return;
     mControl->End();
     mGone = true;
-    toolkit.close();
-    toolkit.comforts.detach();
-    mLeft = std::move(mHouse);
+    stage->closeControl();
 }
 
 void HostedControl::step(const std::function<void()>& deed) {
     if (gone()) return;
+    // What the user's hand is on stays until it is off it.
+    const TalvikDBxZandor::Life::Procedure hand(Backstage::mLife(*mControl));
     try {
         deed();
     } catch (const std::logic_error&) {
@@ -159,7 +157,6 @@ void HostedControl::step(const std::function<void()>& deed) {
     } catch (const platform::RuntimeError&) {
         // Or made it what cannot be touched.
     }
-    mLeft.reset();
 }
 
 std::string HostedControl::broken() {

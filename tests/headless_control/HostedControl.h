@@ -2,9 +2,9 @@
 
 #include "Invariants.h"
 #include "platform/headless/User.h"
+#include "support/Stage.h"
 
 #include <functional>
-#include <optional>
 
 /// What a host may do while its code runs.
 enum class HostAction {
@@ -15,22 +15,28 @@ enum class HostAction {
     closesATable,
     removesAJoin,
     setsOnlyJoin,
+    showsTheModelAnew,
     destroysTheControl,
 };
 
 inline constexpr HostAction hostActions[] = {
-    HostAction::bindsAnotherModel, HostAction::bindsNothing,       HostAction::bindsTheSameModel,
-    HostAction::terminates,        HostAction::closesATable,       HostAction::removesAJoin,
-    HostAction::setsOnlyJoin,      HostAction::destroysTheControl,
+    HostAction::bindsAnotherModel, HostAction::bindsNothing,      HostAction::bindsTheSameModel,
+    HostAction::terminates,        HostAction::closesATable,      HostAction::removesAJoin,
+    HostAction::setsOnlyJoin,      HostAction::showsTheModelAnew, HostAction::destroysTheControl,
 };
 const char* name(HostAction action);
 
 /// A control between a host and a user, with every trace on. Each place where the host's code can
 /// run is counted, and at one of them the host does something.
-class HostedControl : private TalvikDBxZandor::ZandorEvents {
+class HostedControl {
 public:
-    HostedControl();
-    ~HostedControl() override;
+    /// What fills the model that is shown first.
+    using Fill = void (*)(fake::Model&);
+    /// Three tables, a join and two definitions.
+    static void fill(fake::Model& model);
+
+    explicit HostedControl(Fill fillModel = fill);
+    ~HostedControl();
 
     /// From now on: count the places, and at the nth of them (from 1) do something.
     void watch(int place = 0, HostAction action = HostAction::bindsNothing);
@@ -51,27 +57,20 @@ public:
     void destroy();
 
     fake::Library library;
-    platform::Ref<fake::Model> model; ///< with three tables, a join and two definitions
-    platform::headless::Toolkit toolkit;
+    platform::Ref<fake::Model> model;
+    const std::unique_ptr<Stage> stage = Stage::open(library);
+    platform::headless::Toolkit& toolkit;
     platform::headless::User user{toolkit};
     std::string chosen;             ///< from the menu that opens next
     std::function<void()> inDialog; ///< while the dialog stands open
 
 private:
-    struct House {
-        std::optional<TalvikDBxZandor::Zandor> control;
-    };
-
-    void Raise(TalvikDBxZandor::Event event,
-               const TalvikDBxZandor::EventArguments& arguments) override;
     static bool reachesTheHost(const std::string& toolkitCall);
     void at(const std::string& place);
     void act();
-    platform::Ref<fake::Model> newModel();
+    platform::Ref<fake::Model> newModel(Fill fillModel = fill);
     platform::Ref<fake::Model> bound();
 
-    std::shared_ptr<House> mHouse;
-    std::shared_ptr<House> mLeft; ///< until the user's hand is off it
     TalvikDBxZandor::Zandor* mControl = nullptr;
     std::unique_ptr<Invariants> mInvariants;
     platform::Ref<fake::Model> mOther;

@@ -91,6 +91,7 @@ struct ZandorBackstage {
     ZANDOR_PROCEDURE(SwitchSpecialMenusOff)
     ZANDOR_PROCEDURE(mnuZandor_Click)
 
+    ZANDOR_MEMBER(mLife)
     ZANDOR_MEMBER(mDebugSwitch)
     ZANDOR_MEMBER(mJoinModifyDisabled)
     ZANDOR_MEMBER(mOnlyJoin)

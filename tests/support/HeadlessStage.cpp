@@ -19,8 +19,7 @@ public:
         : mToolkit(toolkit), mHost(host) {}
     void Raise(TalvikDBxZandor::Event event,
                const TalvikDBxZandor::EventArguments& arguments) override {
-        mToolkit.comforts.raised(event, arguments);
-        mHost.Raise(event, arguments);
+        if (mToolkit.comforts.raised(event, arguments)) mHost.Raise(event, arguments);
     }
 
 private:

@@ -85,6 +85,8 @@ public:
     std::function<String(const std::vector<Entry>&)> onMenu;
     /// Called while the join dialog stands open. Unset: it is cancelled.
     std::function<void()> onDialog;
+    /// Called while the host is told of an event.
+    std::function<void()> onEvent;
 
     /// By name: "hsbTable", "lstTable(3)", "linJoin(1)", "shpJoin(2)", "mnuJoinDelete"; while the
     /// dialog is open also its controls. Fails the test when there is no such control.

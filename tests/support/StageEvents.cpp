@@ -21,4 +21,5 @@ void StageEvents::Raise(TalvikDBxZandor::Event event,
                         const TalvikDBxZandor::EventArguments& arguments) {
     mStage.raised.push_back({event, arguments});
     mStage.transcript.push_back("event:" + eventName(event));
+    if (mStage.onEvent) mStage.onEvent();
 }

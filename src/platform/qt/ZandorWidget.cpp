@@ -32,7 +32,7 @@ public:
     void Raise(TalvikDBxZandor::Event event,
                const TalvikDBxZandor::EventArguments& arguments) override {
         using TalvikDBxZandor::Event;
-        mWidget.mToolkit->comforts().raised(event, arguments);
+        if (!mWidget.mToolkit->comforts().raised(event, arguments)) return;
         switch (event) {
         case Event::TableDeleted: Q_EMIT mWidget.TableDeleted(); break;
         case Event::TableMoved: Q_EMIT mWidget.TableMoved(); break;
