@@ -33,12 +33,6 @@ TEST_F(ADragAcrossATable, ThatEndsInAJoinLeavesItsPartnerSelected) {
     EXPECT_EQ(selected(2), (Texts{u"NAME"}));
 }
 
-TEST_F(ADragAcrossATable, ThatEndsBesideItsEntriesLeavesItsSelection) {
-    stage->dragToEntry(1, customer, 2, 0);
-    EXPECT_EQ(model->joinCount(), 0);
-    EXPECT_EQ(selected(2), (Texts{u"ID"}));
-}
-
 TEST_F(ADragAcrossATable, LeavesSeveralSelectedEntries) {
     stage->selectEntries(2, {id, allColumns});
     stage->dragAcross(1, total, 2, name, synonymRow, 1);

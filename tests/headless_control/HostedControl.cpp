@@ -3,6 +3,7 @@
 #include "support/Backstage.h"
 #include "support/Tables.h"
 
+#include <unordered_map>
 #include <unordered_set>
 #include <utility>
 
@@ -43,7 +44,13 @@ HostedControl::HostedControl(Fill fillModel)
     toolkit.faults.onPass = [this](const std::string& call) {
         // Each call of an array's element passes a second time, without its index.
         if (call.starts_with("lstTable.")) return;
-        if (gone() || (mWatching && reachesTheHost(call))) at(call);
+        if (gone()) return at(call);
+        if (!mWatching) return;
+        // The same few hundred names again and again.
+        static std::unordered_map<std::string, bool> known;
+        const auto [name, isNew] = known.try_emplace(call);
+        if (isNew) name->second = reachesTheHost(call);
+        if (name->second) at(call);
     };
     mControl->OnlyJoin(false);
     mInvariants = std::make_unique<Invariants>(*mControl, toolkit);
@@ -148,6 +155,8 @@ void HostedControl::destroy() {
 
 void HostedControl::step(const std::function<void()>& deed) {
     if (gone()) return;
+    // Nothing is counted any more, so nobody need be told of each call.
+    if (!mWhere.empty()) toolkit.faults.onPass = nullptr;
     // What the user's hand is on stays until it is off it.
     const TalvikDBxZandor::Life::Procedure hand(Backstage::mLife(*mControl));
     try {
@@ -163,6 +172,8 @@ std::string HostedControl::broken() {
     mWatching = false;
     if (gone()) return mInvariants->survivors();
     mControl->DebugSwitch(0);
+    // What was shown anew in the middle of a change has to be shown once more.
+    if (changesTheModel || mAction == HostAction::showsTheModelAnew) mControl->ShowAnew();
     std::string all = mInvariants->broken(*bound());
     // And it goes on as ever.
     toolkit.faults.disarm();

@@ -61,6 +61,9 @@ public:
     const std::unique_ptr<Stage> stage = Stage::open(library);
     platform::headless::Toolkit& toolkit;
     platform::headless::User user{toolkit};
+    /// A host that changes the model itself shows it anew at the end, in case it got in its own
+    /// way.
+    bool changesTheModel = false;
     std::string chosen;             ///< from the menu that opens next
     std::function<void()> inDialog; ///< while the dialog stands open
 

@@ -4,6 +4,7 @@
 
 #include <QAction>
 #include <QDialog>
+#include <QLineEdit>
 #include <QMenu>
 
 namespace {
@@ -149,3 +150,29 @@ INSTANTIATE_TEST_SUITE_P(AtAnyTime, TheWidgetDeleted,
                          testing::Combine(testing::ValuesIn(moments), testing::Bool()));
 
 } // namespace
+
+namespace {
+
+class AWidgetWithComforts : public Desk {};
+
+} // namespace
+
+/// The comforts ask the model before the host's slots are told.
+TEST_F(AWidgetWithComforts, IsDeletedByItsModelWhileASignalIsOnItsWay) {
+    widget->setComforts(comforts::Flags::all());
+    show();
+    bind();
+    press(1, 1);
+    child<QLineEdit>("txtValue").setText("Number");
+    bool set = false;
+    library.calls->onPass = [&](const std::string& call) {
+        set = set || call == "ZDColumnDefinition.Synonym=";
+        if (set && call == "ZDColumnDefinition.Key") widget.reset();
+    };
+    hands::key(child<QWidget>("txtValue"), Qt::Key_Return);
+    library.calls->onPass = nullptr;
+    settle();
+    EXPECT_TRUE(set);
+    EXPECT_FALSE(widget);
+    EXPECT_EQ(model->definitionAt(1).synonym, u"Number");
+}

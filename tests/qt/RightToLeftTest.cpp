@@ -1,3 +1,4 @@
+#include "qt/Around.h"
 #include "qt/Desk.h"
 
 #include <QApplication>
@@ -7,21 +8,6 @@
 #include <QMenu>
 
 namespace {
-
-enum class Where { application, window, widget };
-enum class When { beforeShowing, afterShowing };
-
-struct Case {
-    Where where;
-    When when;
-};
-
-void PrintTo(const Case& c, std::ostream* out) {
-    *out << (c.where == Where::application ? "the application"
-             : c.where == Where::window    ? "the window"
-                                           : "the widget")
-         << (c.when == When::beforeShowing ? " before showing" : " after showing");
-}
 
 /// A host that is written from right to left.
 class ARightToLeftHost : public Desk, public testing::WithParamInterface<Case> {
@@ -42,11 +28,11 @@ protected:
     /// The query in the host's window, which looks from left to right unless it is turned.
     void lay(bool turned) {
         open(&host);
-        if (turned && GetParam().when == When::beforeShowing) turn();
+        if (turned && GetParam().when == When::before) turn();
         host.resize(widget->size());
         host.show();
         bind();
-        if (turned && GetParam().when == When::afterShowing) turn();
+        if (turned && GetParam().when == When::after) turn();
         settle();
     }
 
@@ -64,10 +50,10 @@ protected:
 
 TEST_P(ARightToLeftHost, ShowsCanvasAndGridAsEverywhere) {
     lay(false);
-    const QImage everywhere = image();
+    const QImage fromTheLeft = image();
     lay(true);
     ASSERT_EQ(widget->layoutDirection(), Qt::RightToLeft);
-    EXPECT_EQ(image(), everywhere);
+    EXPECT_EQ(image(), fromTheLeft);
 }
 
 TEST_P(ARightToLeftHost, ScrollsTheWayItsBarsSay) {
@@ -117,10 +103,4 @@ TEST_P(ARightToLeftHost, ReadsTheDialogAndTheMenuFromRightToLeft) {
     EXPECT_EQ(menu, Qt::RightToLeft);
 }
 
-INSTANTIATE_TEST_SUITE_P(TurnedOn, ARightToLeftHost,
-                         testing::Values(Case{Where::application, When::beforeShowing},
-                                         Case{Where::application, When::afterShowing},
-                                         Case{Where::window, When::beforeShowing},
-                                         Case{Where::window, When::afterShowing},
-                                         Case{Where::widget, When::beforeShowing},
-                                         Case{Where::widget, When::afterShowing}));
+INSTANTIATE_TEST_SUITE_P(TurnedOn, ARightToLeftHost, testing::ValuesIn(everywhere));

@@ -33,15 +33,15 @@ bool Zandor::IsBlank(std::int32_t column) const {
     return true;
 }
 
-/// Removes the columns whose definitions the model has no longer, and those that no number ties to
-/// theirs; the others keep their order.
+/// Removes the columns whose definitions the model has no longer, those that no number ties to
+/// theirs, and all but one of a definition; the others keep their order.
 void Zandor::RemoveOtherColumns(const QueryPicture& picture) {
     std::unordered_set<std::int32_t> numbers;
     for (const auto& definition : picture.definitions) numbers.insert(definition.number);
     const std::int32_t last = sprColumn->Cols() - 1;
     for (std::int32_t column = last; column >= 1; --column) {
         const std::int32_t number = sprColumn->ColData(column);
-        if ((number != 0 && numbers.contains(number)) || IsBlank(column)) continue;
+        if ((number != 0 && numbers.erase(number) != 0) || IsBlank(column)) continue;
         ClearColumn(column);
         if (column != last) sprColumn->ColPosition(column, last);
     }
