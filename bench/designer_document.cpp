@@ -1,10 +1,13 @@
 #include "designer/document/Document.h"
-#include "model/Library.h"
+
+#include <Zandor/Library.h>
 
 #include <QCoreApplication>
 #include <QUndoStack>
 
 #include <benchmark/benchmark.h>
+
+using namespace zandor;
 
 // Recording and undoing one step, in a small drawing and in the largest that the control shows:
 // tables, joins, definitions. The counters tell how often the smallest drawing's time that is.

@@ -1,8 +1,9 @@
 #include "designer/run/ResultTable.h"
 #include "designer/run/Worker.h"
-#include "model/files/QueryDocument.h"
-#include "model/reader/Connection.h"
 #include "support/PostgresServer.h"
+
+#include <Zandor/QueryDocument.h>
+#include <Zandor/reader/Connection.h>
 
 #include <QApplication>
 #include <QEventLoop>
@@ -15,6 +16,8 @@
 #include <benchmark/benchmark.h>
 
 #include <chrono>
+
+using namespace zandor;
 
 // The designer's ways to the first rows beside the engine's own, turn by turn in one run, so that
 // the ratios hold on a busy machine as well; and the memory that a million rows take.

@@ -11,6 +11,8 @@
 #include <cstdio>
 #include <vector>
 
+using namespace zandor;
+
 // From the start of a process to a window that is painted and waits for its user: the designer over
 // the sample, against an empty main window. The program starts itself, turn by turn, in either
 // form; whole processes, because libraries that have to be loaded count as well.

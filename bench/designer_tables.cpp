@@ -12,6 +12,8 @@
 
 #include <chrono>
 
+using namespace zandor;
+
 // Typing a name into the filter of the list of tables: of 5000 tables beside 100, turn by turn in
 // one run. Every key is answered and painted before the next.
 

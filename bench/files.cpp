@@ -1,6 +1,8 @@
-#include "model/files/QueryDocument.h"
+#include <Zandor/QueryDocument.h>
 
 #include <benchmark/benchmark.h>
+
+using namespace zandor;
 
 // Saving and loading, a usual query and the largest one.
 

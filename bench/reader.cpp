@@ -1,6 +1,7 @@
-#include "model/reader/Connection.h"
-#include "model/reader/DatabaseReader.h"
 #include "support/PostgresServer.h"
+
+#include <Zandor/DatabaseReader.h>
+#include <Zandor/reader/Connection.h>
 
 #include <QCoreApplication>
 #include <QSqlError>
@@ -10,6 +11,8 @@
 #include <benchmark/benchmark.h>
 
 #include <chrono>
+
+using namespace zandor;
 
 // The list of 5000 tables beside the engine's own query for their names, turn by turn in one run,
 // so that the ratio holds on a busy machine as well.

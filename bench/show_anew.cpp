@@ -1,5 +1,5 @@
-#include "model/Library.h"
-#include "platform/qt/ZandorWidget.h"
+#include <Zandor/Library.h>
+#include <Zandor/ZandorWidget.h>
 
 #include <QApplication>
 
@@ -7,6 +7,8 @@
 
 #include <algorithm>
 #include <chrono>
+
+using namespace zandor;
 
 // Showing a query anew beside making another widget for it, turn by turn in one run, so that the
 // ratio holds on a busy machine as well: nothing changed, one cell changed, one table added or

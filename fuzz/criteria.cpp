@@ -1,10 +1,13 @@
 #include "must.h"
 
 #include "model/criteria/QueryColumns.h"
-#include "model/sql/Builder.h"
 #include "model/sql/Printer.h"
 
+#include <Zandor/sql/Builder.h>
+
 #include <algorithm>
+
+using namespace zandor;
 
 namespace {
 

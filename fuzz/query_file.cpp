@@ -1,8 +1,10 @@
 #include "must.h"
 
-#include "model/files/QueryDocument.h"
+#include <Zandor/QueryDocument.h>
 
 #include <algorithm>
+
+using namespace zandor;
 
 /// Any bytes are a query that stays the same when it is saved and loaded, or an error of one line.
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {

@@ -1,10 +1,12 @@
 #include "InterfacePage.h"
 
-#include "control/Interface.h"
-#include "platform/headless/Toolkit.h"
+#include <Zandor/Interface.h>
+#include <Zandor/headless/Toolkit.h>
 
 #include <array>
 #include <cstdio>
+
+using namespace zandor;
 
 namespace docs {
 

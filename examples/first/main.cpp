@@ -1,9 +1,11 @@
-#include "model/Library.h"
-#include "model/reader/Connection.h"
-#include "model/reader/addTables.h"
-#include "platform/qt/ZandorWidget.h"
+#include <Zandor/Library.h>
+#include <Zandor/ZandorWidget.h>
+#include <Zandor/reader/Connection.h>
+#include <Zandor/reader/addTables.h>
 
 #include <QApplication>
+
+using namespace zandor;
 
 int main(int argc, char** argv) {
     const QApplication application(argc, argv);

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+using namespace zandor;
+
 namespace report {
 
 using platform::makeRef;

@@ -1,9 +1,11 @@
 #include "ReportModel.h"
 
-#include "platform/qt/ZandorWidget.h"
+#include <Zandor/ZandorWidget.h>
 
 #include <QApplication>
 #include <QTimer>
+
+using namespace zandor;
 
 /// Shows the report in the designer, and says what it has become when the window is closed. With
 /// "--close" the window closes by itself.

@@ -1,8 +1,8 @@
-#include "comforts/Comforts.h"
+#include <Zandor/comforts/Comforts.h>
 
 #include "comforts/Door.h"
 
-namespace comforts {
+namespace zandor::comforts {
 
 Comforts::Comforts(platform::Toolkit& toolkit) : mToolkit(toolkit) {}
 
@@ -88,4 +88,4 @@ bool Comforts::raised(TalvikDBxZandor::Event event,
     return held->isOpen();
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

@@ -5,7 +5,7 @@
 #include <algorithm>
 #include <set>
 
-namespace comforts {
+namespace zandor::comforts {
 
 using TalvikDBxZandor::Event;
 
@@ -237,4 +237,4 @@ void Door::set(Editor editor) {
     }
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

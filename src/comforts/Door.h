@@ -1,11 +1,11 @@
 #pragma once
 
-#include "comforts/Field.h"
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
+#include <Zandor/comforts/Field.h>
 
 #include <optional>
 
-namespace comforts {
+namespace zandor::comforts {
 
 /// The editors that stand over a cell.
 enum class Editor { none, text, sortOrder, visibility };
@@ -154,4 +154,4 @@ private:
     std::weak_ptr<TalvikZandorLib::Zandor> mModel; ///< the one last seen
 };
 
-} // namespace comforts
+} // namespace zandor::comforts

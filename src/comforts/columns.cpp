@@ -1,12 +1,13 @@
-#include "comforts/Comforts.h"
 #include "comforts/Door.h"
-#include "platform/Numbers.h"
+
+#include <Zandor/comforts/Comforts.h>
+#include <Zandor/platform/Numbers.h>
 
 #include <algorithm>
 
 // The order and the widths of the grid's columns.
 
-namespace comforts {
+namespace zandor::comforts {
 
 namespace {
 
@@ -116,4 +117,4 @@ void Comforts::fitAll(Door& door) {
     for (std::int32_t column = door.lastColumn(); column > 0; --column) fit(door, column);
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

@@ -1,8 +1,8 @@
-#include "comforts/Comforts.h"
+#include <Zandor/comforts/Comforts.h>
 
 #include "comforts/Door.h"
 
-namespace comforts {
+namespace zandor::comforts {
 
 void Comforts::dragCame(std::int16_t table) {
     mUnderDrag.clear();
@@ -28,4 +28,4 @@ void Comforts::dragGone() {
     });
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

@@ -1,11 +1,12 @@
-#include "comforts/Comforts.h"
 #include "comforts/Door.h"
+
+#include <Zandor/comforts/Comforts.h>
 
 #include <algorithm>
 
 // What is typed and chosen in the cells' editors.
 
-namespace comforts {
+namespace zandor::comforts {
 
 namespace {
 
@@ -153,4 +154,4 @@ bool Comforts::choiceMade() {
     return act(u"choiceMade", [](Door& door) { return goOn(door, 0, 0, false); });
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

@@ -1,9 +1,10 @@
-#include "comforts/Comforts.h"
 #include "comforts/Door.h"
+
+#include <Zandor/comforts/Comforts.h>
 
 // The entries of the tables on the canvas.
 
-namespace comforts {
+namespace zandor::comforts {
 
 /// The entry comes behind the last output column. A full grid has no place for it, and takes none.
 bool Comforts::entryDoubleClicked(std::int16_t table, std::int32_t entry) {
@@ -16,4 +17,4 @@ bool Comforts::entryDoubleClicked(std::int16_t table, std::int32_t entry) {
     });
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

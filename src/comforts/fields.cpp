@@ -1,11 +1,12 @@
-#include "comforts/Comforts.h"
 #include "comforts/Door.h"
+
+#include <Zandor/comforts/Comforts.h>
 
 #include <algorithm>
 
 // The fields that a column's first cell offers.
 
-namespace comforts {
+namespace zandor::comforts {
 
 bool Comforts::gridPressed(std::int16_t button, float X, float Y) {
     if (!mFlags.OffersFields || button != platform::leftButton) return false;
@@ -90,4 +91,4 @@ void Comforts::fieldPicked(std::int32_t position) {
     });
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

@@ -1,9 +1,10 @@
-#include "comforts/Comforts.h"
 #include "comforts/Door.h"
+
+#include <Zandor/comforts/Comforts.h>
 
 // What a host has to say about cells of the grid.
 
-namespace comforts {
+namespace zandor::comforts {
 
 void Comforts::setFindings(std::vector<Finding> findings) {
     mFindings = std::move(findings);
@@ -35,4 +36,4 @@ bool Comforts::showCell(const String& definition, std::int32_t row) {
     });
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

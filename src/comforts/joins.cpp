@@ -1,10 +1,11 @@
-#include "comforts/Comforts.h"
 #include "comforts/Door.h"
 #include "control/joins/symbols.h"
 
+#include <Zandor/comforts/Comforts.h>
+
 // Joins that can be read.
 
-namespace comforts {
+namespace zandor::comforts {
 
 using platform::String;
 using TalvikDBxZandor::PlacedJoin;
@@ -91,4 +92,4 @@ void Comforts::readJoins(bool now) {
     });
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

@@ -1,9 +1,10 @@
-#include "comforts/Comforts.h"
 #include "comforts/Door.h"
+
+#include <Zandor/comforts/Comforts.h>
 
 // The menu on a table's title.
 
-namespace comforts {
+namespace zandor::comforts {
 
 bool Comforts::titleClicked(std::int16_t table) {
     if (!mFlags.HasTitleMenu) return false;
@@ -30,4 +31,4 @@ void Comforts::menuChecked(std::int16_t source) {
     if (mRename) mRename->Visible(mFlags.HasTitleMenu && source == 0);
 }
 
-} // namespace comforts
+} // namespace zandor::comforts

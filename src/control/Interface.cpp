@@ -1,4 +1,4 @@
-#include "control/Interface.h"
+#include <Zandor/Interface.h>
 
 namespace TalvikDBxZandor::automation {
 

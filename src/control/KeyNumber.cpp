@@ -1,6 +1,6 @@
 #include "control/KeyNumber.h"
 
-#include "platform/Numbers.h"
+#include <Zandor/platform/Numbers.h>
 
 #include <algorithm>
 #include <limits>

@@ -1,8 +1,10 @@
 #pragma once
 
-#include "platform/String.h"
+#include <Zandor/platform/String.h>
 
 namespace TalvikDBxZandor {
+
+namespace platform = zandor::platform;
 
 /// The number of a definition's key: the first character dropped, leading digits as a decimal
 /// value, 0 without any. Error 6 when it does not fit 32 bits.

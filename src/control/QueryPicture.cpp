@@ -1,7 +1,8 @@
 #include "control/QueryPicture.h"
 
 #include "control/KeyNumber.h"
-#include "control/ModelList.h"
+
+#include <Zandor/control/ModelList.h>
 
 namespace TalvikDBxZandor {
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "control/Reached.h"
-#include "platform/TalvikZandorLib.h"
-#include "platform/Words.h"
+#include <Zandor/TalvikZandorLib.h>
+#include <Zandor/control/Reached.h>
+#include <Zandor/platform/Words.h>
 
 #include <vector>
 

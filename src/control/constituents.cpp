@@ -1,4 +1,4 @@
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
 
 // The control's parts and their design-time settings, each wired to its handlers.
 

@@ -1,7 +1,8 @@
 #include "control/QueryPicture.h"
-#include "control/Zandor.h"
 
-#include "platform/Numbers.h"
+#include <Zandor/Zandor.h>
+
+#include <Zandor/platform/Numbers.h>
 
 #include <algorithm>
 #include <utility>

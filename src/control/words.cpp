@@ -1,4 +1,4 @@
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
 
 #include <initializer_list>
 #include <utility>

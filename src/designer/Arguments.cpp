@@ -2,7 +2,7 @@
 
 #include <QCommandLineParser>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -135,4 +135,4 @@ not be run, 2 the arguments, a file, the database or the output cannot be used.
 
 QString versionText() { return QStringLiteral("zandor-designer " ZANDOR_VERSION "\n"); }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -4,7 +4,7 @@
 
 #include <QStringList>
 
-namespace designer {
+namespace zandor::designer {
 
 /// What the designer was asked on its command line.
 struct Arguments {
@@ -31,4 +31,4 @@ bool asksForTask(const QStringList& arguments);
 QString helpText();
 QString versionText();
 
-} // namespace designer
+} // namespace zandor::designer

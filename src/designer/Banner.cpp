@@ -1,7 +1,7 @@
 #include "designer/Banner.h"
 
 #include "designer/Colours.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QEvent>
 #include <QHBoxLayout>
@@ -9,7 +9,7 @@
 #include <QPushButton>
 #include <QToolButton>
 
-namespace designer {
+namespace zandor::designer {
 
 Banner::Banner(QWidget* parent) : QFrame(parent), mText(new QLabel) {
     colour();
@@ -64,4 +64,4 @@ void Banner::changeEvent(QEvent* event) {
     if (event->type() == QEvent::PaletteChange) colour();
 }
 
-} // namespace designer
+} // namespace zandor::designer

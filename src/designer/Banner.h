@@ -5,7 +5,7 @@
 class QLabel;
 class QPushButton;
 
-namespace designer {
+namespace zandor::designer {
 
 /// A slim bar above the drawing for what is wrong. It stays until that is over or somebody closes
 /// it; hidden at first.
@@ -30,4 +30,4 @@ private:
     QLabel* mText;
 };
 
-} // namespace designer
+} // namespace zandor::designer

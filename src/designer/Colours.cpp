@@ -4,7 +4,7 @@
 #include <QPalette>
 #include <QStyle>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -56,4 +56,4 @@ void useDarkColours() {
     QApplication::setPalette(palette);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,6 +1,6 @@
 #pragma once
 
-namespace designer {
+namespace zandor::designer {
 
 /// Gives the whole application dark colours, whatever the desktop uses.
 void useDarkColours();
@@ -14,4 +14,4 @@ bool areDarkColoursUsed();
 /// Whether the application's colours of the moment are dark, by whomever.
 bool areColoursDark();
 
-} // namespace designer
+} // namespace zandor::designer

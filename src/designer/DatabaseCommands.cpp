@@ -13,7 +13,7 @@
 #include <QMenu>
 #include <QPushButton>
 
-namespace designer {
+namespace zandor::designer {
 
 DatabaseCommands::DatabaseCommands(Database& database, QueryFile& file, FileDialogs& files,
                                    RecentFiles& recent, QWidget& window)
@@ -109,4 +109,4 @@ void DatabaseCommands::reconnect() {
     if (!opening.error.isEmpty()) PlainBox::warn(&mWindow, tr("Reconnect"), inWords(opening.error));
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -6,7 +6,7 @@
 class QMenu;
 class QWidget;
 
-namespace designer {
+namespace zandor::designer {
 
 class Database;
 class FileDialogs;
@@ -51,4 +51,4 @@ private:
     QAction mReconnect;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -27,7 +27,7 @@
 #include "designer/tables/TableAdding.h"
 #include "designer/tables/TableDropTarget.h"
 #include "designer/tables/TablesPanel.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QApplication>
 #include <QCloseEvent>
@@ -42,7 +42,7 @@
 #include <QToolButton>
 #include <QVBoxLayout>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -489,4 +489,4 @@ void DesignerWindow::about() {
         .exec();
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -14,7 +14,7 @@
 class QLabel;
 class QPushButton;
 
-namespace designer {
+namespace zandor::designer {
 
 class Autosave;
 class Banner;
@@ -103,4 +103,4 @@ private:
     std::unique_ptr<Autosave> mAutosave;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -3,13 +3,14 @@
 #include "designer/canvasSize.h"
 #include "designer/document/Document.h"
 #include "designer/statement/ModelWords.h"
-#include "platform/qt/Text.h"
+
+#include <Zandor/qt/Text.h>
 
 #include <QResizeEvent>
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 using platform::qt::fromQt;
 using platform::qt::toQt;
@@ -123,4 +124,4 @@ void DrawingArea::fitCanvas() {
     mControl->setMXVertFrameSize(canvasLength(std::max(needed.height(), scrolling)));
 }
 
-} // namespace designer
+} // namespace zandor::designer

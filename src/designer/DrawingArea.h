@@ -1,13 +1,13 @@
 #pragma once
 
-#include "model/Finding.h"
-#include "model/Library.h"
-#include "platform/qt/ZandorWidget.h"
+#include <Zandor/Library.h>
+#include <Zandor/ZandorWidget.h>
+#include <Zandor/model/Finding.h>
 
 #include <QPointer>
 #include <QVariantMap>
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 
@@ -61,4 +61,4 @@ private:
     ZandorWidget* mControl = nullptr;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -8,7 +8,7 @@
 #include <cerrno>
 #include <csignal>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -53,4 +53,4 @@ void EndingSignals::heed() {
     std::raise(number);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -2,7 +2,7 @@
 
 #include <QObject>
 
-namespace designer {
+namespace zandor::designer {
 
 /// Tells of the signals that end a program from outside (SIGTERM, SIGINT, SIGHUP) while it can
 /// still do something; then the signal takes its course. A second one ends the program at once. One
@@ -24,4 +24,4 @@ private:
     int mRead = -1;
 };
 
-} // namespace designer
+} // namespace zandor::designer

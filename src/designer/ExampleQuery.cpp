@@ -1,8 +1,8 @@
 #include "designer/ExampleQuery.h"
 
-#include "model/Layout.h"
+#include <Zandor/model/Layout.h>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -64,4 +64,4 @@ void addExampleColumns(model::Query& query) {
     }
 }
 
-} // namespace designer
+} // namespace zandor::designer

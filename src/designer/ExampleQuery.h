@@ -1,12 +1,12 @@
 #pragma once
 
-#include "model/Query.h"
+#include <Zandor/Query.h>
 
 #include <QStringList>
 
 /// The query that the sample database opens with: large orders from two countries, the oldest
 /// first.
-namespace designer {
+namespace zandor::designer {
 
 QStringList exampleTables();
 
@@ -17,4 +17,4 @@ void placeInARow(const std::vector<platform::Ref<model::Table>>& tables);
 /// there is left out.
 void addExampleColumns(model::Query& query);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -4,7 +4,7 @@
 
 #include <sys/stat.h>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -19,4 +19,4 @@ std::optional<FileMark> FileMark::of(const QString& path) {
                     nanoseconds(state.st_ctim)};
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -4,7 +4,7 @@
 
 #include <optional>
 
-namespace designer {
+namespace zandor::designer {
 
 /// What the system tells of a file, by which one sees that somebody has changed or replaced it.
 struct FileMark {
@@ -23,4 +23,4 @@ struct FileMark {
     friend bool operator==(const FileMark&, const FileMark&) = default;
 };
 
-} // namespace designer
+} // namespace zandor::designer

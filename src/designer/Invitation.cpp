@@ -6,7 +6,7 @@
 
 #include <QEvent>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -57,4 +57,4 @@ void Invitation::place() {
     setGeometry(0, 0, mArea.width(), onlyCanvas ? mArea.height() : mArea.height() / 2);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -2,7 +2,7 @@
 
 #include <QLabel>
 
-namespace designer {
+namespace zandor::designer {
 
 class Database;
 class Document;
@@ -28,4 +28,4 @@ private:
     DrawingArea& mArea;
 };
 
-} // namespace designer
+} // namespace zandor::designer

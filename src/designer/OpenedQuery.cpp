@@ -2,12 +2,13 @@
 
 #include "designer/ExampleQuery.h"
 #include "designer/tables/leftOutWords.h"
-#include "model/Names.h"
-#include "model/reader/addTables.h"
+
+#include <Zandor/model/Names.h>
+#include <Zandor/reader/addTables.h>
 
 #include <QCoreApplication>
 
-namespace designer {
+namespace zandor::designer {
 
 using reader::Error;
 using reader::Result;
@@ -16,7 +17,7 @@ using reader::TableId;
 
 namespace {
 
-QString tr(const char* text) { return QCoreApplication::translate("designer", text); }
+QString tr(const char* text) { return QCoreApplication::translate("zandor::designer", text); }
 
 Result<std::vector<TableId>> named(const QStringList& names, const std::vector<TableEntry>& present,
                                    const QString& file) {
@@ -63,4 +64,4 @@ Result<OpenedQuery> openQuery(reader::DatabaseReader& schema,
     return opened;
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,11 +1,11 @@
 #pragma once
 
-#include "model/Query.h"
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
+#include <Zandor/Query.h>
 
 #include <QStringList>
 
-namespace designer {
+namespace zandor::designer {
 
 /// The canvas has room for so many; the control leaves out what is beyond.
 inline constexpr std::int32_t mostTables = 16;
@@ -31,4 +31,4 @@ reader::Result<OpenedQuery> openQuery(reader::DatabaseReader& schema,
                                       const std::vector<reader::TableEntry>& present,
                                       const FirstTables& wanted);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,10 +1,10 @@
 #include "designer/PlainBox.h"
 
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QLabel>
 
-namespace designer {
+namespace zandor::designer {
 
 PlainBox::PlainBox(Icon icon, const QString& title, const QString& text, StandardButtons buttons,
                    QWidget* parent)
@@ -28,4 +28,4 @@ QString linesAsSigns(const QString& text) {
     return lines.join(u'\n');
 }
 
-} // namespace designer
+} // namespace zandor::designer

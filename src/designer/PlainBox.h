@@ -2,7 +2,7 @@
 
 #include <QMessageBox>
 
-namespace designer {
+namespace zandor::designer {
 
 /// A message box for texts that may hold anything, such as paths and names from files and
 /// databases: they are plain text, and what cannot be seen in them stands as a sign. The designer
@@ -21,4 +21,4 @@ public:
 /// Text of several lines with signs for what cannot be seen in it.
 QString linesAsSigns(const QString& text);
 
-} // namespace designer
+} // namespace zandor::designer

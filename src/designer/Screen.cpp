@@ -2,7 +2,7 @@
 
 #include <QLoggingCategory>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -47,4 +47,4 @@ bool isOffscreen() {
            QGuiApplication::platformName() == QLatin1String("minimal");
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -4,7 +4,7 @@
 
 #include <memory>
 
-namespace designer {
+namespace zandor::designer {
 
 /// Makes the application on the screen that can be had. QT_QPA_PLATFORM decides when it is set;
 /// otherwise it is the desktop's display, and a surface in memory when `offscreen` asks for one or
@@ -14,4 +14,4 @@ std::unique_ptr<QApplication> makeApplication(int& argc, char** argv, bool offsc
 /// Whether the application draws where nobody can see it.
 bool isOffscreen();
 
-} // namespace designer
+} // namespace zandor::designer

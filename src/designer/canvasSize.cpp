@@ -1,11 +1,11 @@
 #include "designer/canvasSize.h"
 
-#include "model/Layout.h"
+#include <Zandor/model/Layout.h>
 
 #include <algorithm>
 #include <limits>
 
-namespace designer {
+namespace zandor::designer {
 
 QSize canvasNeeded(model::Query& query) {
     QSize size;
@@ -26,4 +26,4 @@ QSize pixels(QSize twips) {
     return {(twips.width() + roundUp) / twipsPerPixel, (twips.height() + roundUp) / twipsPerPixel};
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,11 +1,11 @@
 #pragma once
 
-#include "model/Query.h"
+#include <Zandor/Query.h>
 
 #include <QSize>
 
 /// The size of the control's canvas.
-namespace designer {
+namespace zandor::designer {
 
 inline constexpr int twipsPerPixel = 15;
 
@@ -19,4 +19,4 @@ int twips(int pixels);
 int canvasLength(int twips);
 QSize pixels(QSize twips);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -8,12 +8,15 @@
 #include "designer/show/DrawingPicture.h"
 #include "designer/show/savePicture.h"
 #include "designer/statement/ModelWords.h"
-#include "model/files/QueryDocument.h"
-#include "model/files/Replacement.h"
+
+#include <Zandor/QueryDocument.h>
+#include <Zandor/files/Replacement.h>
 
 #include <QBuffer>
 #include <QDir>
 #include <QPixmap>
+
+using namespace zandor;
 
 namespace {
 

@@ -1,11 +1,11 @@
-#include "platform/Numbers.h"
+#include <Zandor/platform/Numbers.h>
 
-#include "platform/RuntimeError.h"
+#include <Zandor/platform/RuntimeError.h>
 
 #include <cmath>
 #include <limits>
 
-namespace platform {
+namespace zandor::platform {
 
 namespace {
 
@@ -33,4 +33,4 @@ float single(double value) {
     return rounded;
 }
 
-} // namespace platform
+} // namespace zandor::platform

@@ -1,9 +1,9 @@
-#include "platform/RuntimeError.h"
+#include <Zandor/platform/RuntimeError.h>
 
 #include <exception>
 #include <new>
 
-namespace platform {
+namespace zandor::platform {
 
 namespace errors {
 
@@ -52,4 +52,4 @@ RuntimeError currentError() {
     }
 }
 
-} // namespace platform
+} // namespace zandor::platform

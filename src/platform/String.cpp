@@ -1,6 +1,6 @@
-#include "platform/String.h"
+#include <Zandor/platform/String.h>
 
-namespace platform {
+namespace zandor::platform {
 
 namespace {
 
@@ -87,4 +87,4 @@ std::string toUtf8(StringView text) {
     return out;
 }
 
-} // namespace platform
+} // namespace zandor::platform

@@ -1,5 +1,7 @@
 #include "CanvasTest.h"
 
+using namespace zandor;
+
 namespace {
 
 class Arranging : public CanvasTest {

@@ -2,6 +2,8 @@
 
 #include <stdexcept>
 
+using namespace zandor;
+
 namespace {
 
 const platform::RuntimeError broken{1234, u"The host is broken"};

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+using namespace zandor;
+
 namespace {
 
 /// Three tables that are placed side by side, with their columns.

@@ -1,5 +1,7 @@
 #include "GridStage.h"
 
+using namespace zandor;
+
 namespace gridstage {
 
 /// The grid as it is filled from a bound model, and what can be done with columns filled so.

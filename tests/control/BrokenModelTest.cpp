@@ -4,6 +4,8 @@
 #include <map>
 #include <set>
 
+using namespace zandor;
+
 namespace {
 
 /// Runs a procedure of the canvas once for each member of the model that it uses, with a model

@@ -11,10 +11,10 @@
 class CanvasTest : public testing::Test {
 protected:
     using Back = TalvikDBxZandor::ZandorBackstage;
-    using String = platform::String;
+    using String = zandor::platform::String;
     using Texts = std::vector<std::string>;
     template <class T>
-    using Ref = platform::Ref<T>;
+    using Ref = zandor::platform::Ref<T>;
     using Tabulet = TalvikTabulet::Tabulet;
     using ColumnItem = TalvikTabulet::ColumnItem;
 
@@ -49,7 +49,7 @@ protected:
     const Ref<Tabulet>& element(std::int16_t index) { return Back::lstTable(control())(index); }
     bool slotIsFree(std::int32_t index) { return Back::mTableFreeList(control())->IsFree(index); }
 
-    platform::Bounds boundsOf(const std::string& name) { return stage->look(name).bounds; }
+    zandor::platform::Bounds boundsOf(const std::string& name) { return stage->look(name).bounds; }
     std::vector<String> selectedIn(std::int16_t index) { return look(index).selected; }
     Stage::Seen look(std::int16_t index) {
         return stage->look("lstTable(" + std::to_string(index) + ")");
@@ -76,7 +76,9 @@ protected:
         return point;
     }
 
-    static std::string utf8(platform::StringView text) { return platform::toUtf8(text); }
+    static std::string utf8(zandor::platform::StringView text) {
+        return zandor::platform::toUtf8(text);
+    }
 
     /// The boxes shown, in the form that report() and trace() give them.
     Texts told() const {
@@ -115,7 +117,7 @@ protected:
                       module);
     }
     /// What a host's model fails with in these tests.
-    static platform::RuntimeError broken() { return {1234, u"The host is broken"}; }
+    static zandor::platform::RuntimeError broken() { return {1234, u"The host is broken"}; }
     static std::string brokenIn(const std::string& procedure) {
         return report(procedure, 1234, "The host is broken");
     }

@@ -1,5 +1,7 @@
 #include "OrderedModel.h"
 
+using namespace zandor;
+
 namespace gridstage {
 
 /// The columns of the grid, which the model is to have in the same order.

@@ -1,6 +1,6 @@
 #include "GridStage.h"
 
-#include "basZandor.h"
+#include <Zandor/control/basZandor.h>
 
 namespace gridstage {
 

@@ -12,8 +12,8 @@
 /// ORDERS in slot 1 and CUSTOMERS in slot 2, without output columns.
 namespace gridstage {
 
-using platform::Ref;
-using platform::String;
+using zandor::platform::Ref;
+using zandor::platform::String;
 using Backstage = TalvikDBxZandor::ZandorBackstage;
 using TalvikDBxZandor::Event;
 
@@ -35,21 +35,23 @@ constexpr std::int32_t sortRow = 2;
 constexpr std::int32_t visibleRow = 3;
 constexpr std::int32_t criteriaRow = 4;
 
-inline Stage::Box report(platform::StringView procedure, const platform::RuntimeError& error,
-                         platform::StringView module = u"TalvikDBxZandor.Zandor") {
+inline Stage::Box report(zandor::platform::StringView procedure,
+                         const zandor::platform::RuntimeError& error,
+                         zandor::platform::StringView module = u"TalvikDBxZandor.Zandor") {
     return {u"Module:\t" + String(module) + u"\r\nFunction:\t" + String(procedure) +
-                u"\r\nError No:\t" + platform::decimal(error.Number) + u"\r\nError:\t" +
+                u"\r\nError No:\t" + zandor::platform::decimal(error.Number) + u"\r\nError:\t" +
                 error.Description,
             u"Unexpected Error:", 48};
 }
 
-inline platform::RuntimeError refusal() { return {1234, u"The host refuses."}; }
+inline zandor::platform::RuntimeError refusal() { return {1234, u"The host refuses."}; }
 
 /// The names of the enabled entries of a menu.
 inline std::vector<std::string> enabledIn(const std::vector<Stage::Entry>& entries) {
     std::vector<std::string> names;
     for (const auto& entry : entries)
-        if (entry.enabled && entry.caption != u"-") names.push_back(platform::toUtf8(entry.name));
+        if (entry.enabled && entry.caption != u"-")
+            names.push_back(zandor::platform::toUtf8(entry.name));
     return names;
 }
 
@@ -97,7 +99,7 @@ protected:
     void willChoose(const std::string& entry) {
         stage->onMenu = [this, entry](const std::vector<Stage::Entry>& shown) {
             menu = shown;
-            return platform::fromUtf8(entry);
+            return zandor::platform::fromUtf8(entry);
         };
     }
 

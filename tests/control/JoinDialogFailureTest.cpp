@@ -1,6 +1,8 @@
 #include "control/JoinScene.h"
 
-#include "frmJoinDefinition.h"
+#include "control/joins/frmJoinDefinition.h"
+
+using namespace zandor;
 
 namespace {
 

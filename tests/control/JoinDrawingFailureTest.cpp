@@ -1,5 +1,7 @@
 #include "control/JoinScene.h"
 
+using namespace zandor;
+
 namespace {
 
 constexpr std::int16_t square = 1;

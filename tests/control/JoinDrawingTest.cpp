@@ -1,5 +1,7 @@
 #include "control/JoinScene.h"
 
+using namespace zandor;
+
 namespace {
 
 constexpr float markSize = 140;

@@ -1,5 +1,7 @@
 #include "control/JoinScene.h"
 
+using namespace zandor;
+
 namespace {
 
 const Stage::String invalidCall = u"Invalid procedure call or argument";

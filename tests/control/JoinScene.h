@@ -13,14 +13,15 @@
 struct JoinScene : ::testing::Test {
     using Back = TalvikDBxZandor::ZandorBackstage;
     using Event = TalvikDBxZandor::Event;
-    using Record = platform::Ref<TalvikDBxZandor::clsJoinLine>;
-    using Item = platform::Ref<TalvikTabulet::ColumnItem>;
-    using String = platform::String;
+    using Record = zandor::platform::Ref<TalvikDBxZandor::clsJoinLine>;
+    using Item = zandor::platform::Ref<TalvikTabulet::ColumnItem>;
+    using String = zandor::platform::String;
 
     fake::Library library;
-    platform::Ref<fake::Model> model = library.newModel();
-    platform::Ref<fake::Table> orders = model->table(u"Orders", {u"Id", u"Customer", u"Total"});
-    platform::Ref<fake::Table> customers = model->table(u"Customers", {u"Number", u"Name"});
+    zandor::platform::Ref<fake::Model> model = library.newModel();
+    zandor::platform::Ref<fake::Table> orders =
+        model->table(u"Orders", {u"Id", u"Customer", u"Total"});
+    zandor::platform::Ref<fake::Table> customers = model->table(u"Customers", {u"Number", u"Name"});
     std::unique_ptr<Stage> stage = Stage::open(library);
     TalvikDBxZandor::Zandor& control = stage->control();
 
@@ -53,7 +54,7 @@ struct JoinScene : ::testing::Test {
         return table(index).ColumnItems().Item(position);
     }
     Record record(const String& key = u"1") { return Back::mJoinLines(control).Item(key); }
-    platform::Line& line(std::int16_t index = 1) { return *Back::linJoin(control)(index); }
+    zandor::platform::Line& line(std::int16_t index = 1) { return *Back::linJoin(control)(index); }
     std::int32_t joinCount() { return Back::mJoinLines(control).Count(); }
     bool isFree(std::int32_t number) { return Back::mJoinFreeList(control)->IsFree(number); }
 
@@ -87,7 +88,7 @@ struct JoinScene : ::testing::Test {
 inline Stage::Box errorBox(const Stage::String& module, const Stage::String& procedure,
                            std::int32_t number, const Stage::String& description) {
     return {u"Module:\t" + module + u"\r\nFunction:\t" + procedure + u"\r\nError No:\t" +
-                platform::decimal(number) + u"\r\nError:\t" + description,
+                zandor::platform::decimal(number) + u"\r\nError:\t" + description,
             u"Unexpected Error:", 48};
 }
 

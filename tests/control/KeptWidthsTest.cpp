@@ -1,5 +1,7 @@
 #include "GridStage.h"
 
+using namespace zandor;
+
 namespace gridstage {
 
 namespace {

@@ -1,5 +1,7 @@
 #include "control/ShellFixture.h"
 
+using namespace zandor;
+
 namespace {
 
 class TheLayout : public AControl {

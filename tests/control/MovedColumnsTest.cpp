@@ -1,5 +1,7 @@
 #include "OrderedModel.h"
 
+using namespace zandor;
+
 namespace gridstage {
 
 class AColumnMovedByHand : public GridTest {

@@ -12,10 +12,10 @@ public:
     void StandsBehind(const Ref<TalvikZandorLib::ZDColumnDefinition>& definition,
                       const Ref<TalvikZandorLib::ZDColumnDefinition>& predecessor) override {
         if (refuses) throw refusal();
-        platform::KeyedCollection<TalvikZandorLib::ZDColumnDefinition> ordered;
+        zandor::platform::KeyedCollection<TalvikZandorLib::ZDColumnDefinition> ordered;
         const auto add = [&](const auto& each) { ordered.Add(each, each->Key()); };
         if (!predecessor) add(definition);
-        for (const auto& each : platform::Each(definitions.items)) {
+        for (const auto& each : zandor::platform::Each(definitions.items)) {
             if (each != definition) add(each);
             if (each == predecessor) add(definition);
         }

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <functional>
 
+using namespace zandor;
+
 namespace {
 
 /// One table of four columns.

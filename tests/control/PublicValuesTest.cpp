@@ -1,6 +1,9 @@
-#include "control/Interface.h"
 #include "control/ShellFixture.h"
 #include "support/PublicInterface.h"
+
+#include <Zandor/Interface.h>
+
+using namespace zandor;
 
 using platform::Variant;
 using TalvikDBxZandor::automation::Member;

@@ -4,6 +4,8 @@
 #include <sstream>
 #include <utility>
 
+using namespace zandor;
+
 namespace gridstage {
 
 namespace {

@@ -9,8 +9,8 @@
 /// A control on a stage, with its traces off and nothing recorded yet.
 class AControl : public testing::Test {
 protected:
-    using String = platform::String;
-    using StringView = platform::StringView;
+    using String = zandor::platform::String;
+    using StringView = zandor::platform::StringView;
     using Backstage = TalvikDBxZandor::ZandorBackstage;
 
     AControl() {
@@ -19,10 +19,10 @@ protected:
     }
 
     TalvikDBxZandor::Zandor& zandor() { return stage->control(); }
-    platform::Toolkit& toolkit() { return stage->toolkit(); }
+    zandor::platform::Toolkit& toolkit() { return stage->toolkit(); }
     MSFlexGridLib::MSFlexGrid& grid() { return *Backstage::sprColumn(zandor()); }
-    platform::Frame& canvas() { return *Backstage::fraTable(zandor()); }
-    void bind(const platform::Ref<fake::Model>& model) { zandor().P_SET_Zandor(model); }
+    zandor::platform::Frame& canvas() { return *Backstage::fraTable(zandor()); }
+    void bind(const zandor::platform::Ref<fake::Model>& model) { zandor().P_SET_Zandor(model); }
     Stage::Seen look(const std::string& name) { return stage->look(name); }
 
     void forget() {

@@ -3,6 +3,8 @@
 #include <random>
 #include <set>
 
+using namespace zandor;
+
 namespace gridstage {
 
 /// What is shown of a model that its host has changed, once the host asks for it.

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+using namespace zandor;
+
 namespace {
 
 /// One table, two of its columns selected, and a focus that stays where it is: a table list that

@@ -1,5 +1,7 @@
 #include "GridStage.h"
 
+using namespace zandor;
+
 namespace gridstage {
 
 /// Three output columns: sorted, descending and not visible, and one as it was dropped.

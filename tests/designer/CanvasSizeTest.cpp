@@ -7,6 +7,8 @@
 #include <QMessageBox>
 #include <QTimer>
 
+using namespace zandor;
+
 namespace {
 
 constexpr int twipsPerPixel = 15;

@@ -6,8 +6,8 @@
 #include "designer/run/ParameterDialog.h"
 #include "designer/run/ResultTable.h"
 #include "designer/run/ResultsPanel.h"
-#include "platform/qt/GridModel.h"
-#include "platform/qt/QtToolkit.h"
+#include "frontends/qt/GridModel.h"
+#include "frontends/qt/QtToolkit.h"
 
 #include <QClipboard>
 #include <QDialogButtonBox>
@@ -21,6 +21,8 @@
 #include <QTranslator>
 #include <QTreeWidget>
 #include <QUndoStack>
+
+using namespace zandor;
 
 using platform::qt::GridWidget;
 using testing::ElementsAre;

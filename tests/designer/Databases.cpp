@@ -9,6 +9,8 @@
 #include <QSqlError>
 #include <QSqlQuery>
 
+using namespace zandor;
+
 QString sampleDatabase() { return QStringLiteral(ZANDOR_SAMPLE_DATABASE); }
 
 QStringList sampleTables() {

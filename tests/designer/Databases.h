@@ -13,10 +13,10 @@ QStringList sampleTables();
 
 /// The query that the designer opens with over the sample, or one of these tables; fails the test
 /// when it opens none.
-designer::OpenedQuery openedSample(const QStringList& tables = {});
+zandor::designer::OpenedQuery openedSample(const QStringList& tables = {});
 /// The query that the designer opens with over a database.
-reader::Result<designer::OpenedQuery> openDatabaseFile(const QString& file,
-                                                       const designer::FirstTables& wanted = {});
+zandor::reader::Result<zandor::designer::OpenedQuery>
+openDatabaseFile(const QString& file, const zandor::designer::FirstTables& wanted = {});
 
 class DatabaseFolder {
 public:

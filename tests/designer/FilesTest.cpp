@@ -1,9 +1,12 @@
 #include "OpenWindow.h"
 
 #include "designer/database/ConnectionDialog.h"
-#include "model/files/QueryDocument.h"
+
+#include <Zandor/QueryDocument.h>
 
 #include <QFile>
+
+using namespace zandor;
 
 using testing::ElementsAre;
 using testing::EndsWith;

@@ -1,14 +1,17 @@
 #include "OpenWindow.h"
 
 #include "designer/document/Document.h"
-#include "model/files/QueryDocument.h"
-#include "platform/qt/GridModel.h"
-#include "platform/qt/PaneHandle.h"
+#include "frontends/qt/GridModel.h"
+#include "frontends/qt/PaneHandle.h"
+
+#include <Zandor/QueryDocument.h>
 
 #include <QHeaderView>
 #include <QLabel>
 #include <QTableView>
 #include <QUndoStack>
+
+using namespace zandor;
 
 using platform::qt::GridWidget;
 

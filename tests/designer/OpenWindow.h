@@ -4,8 +4,8 @@
 #include "document/Answers.h"
 
 #include "designer/DesignerWindow.h"
-#include "platform/qt/GridWidget.h"
-#include "platform/qt/TabuletWidget.h"
+#include "frontends/qt/GridWidget.h"
+#include "frontends/qt/TabuletWidget.h"
 
 #include <gmock/gmock.h>
 
@@ -21,9 +21,9 @@ protected:
         QSettings().clear();
     }
 
-    void open(const designer::Arguments& arguments = {}) {
+    void open(const zandor::designer::Arguments& arguments = {}) {
         window.reset();
-        window = std::make_unique<designer::DesignerWindow>();
+        window = std::make_unique<zandor::designer::DesignerWindow>();
         EXPECT_EQ(window->openAtFirst(arguments, sampleDatabase()).value_or(QString()), QString());
         window->show();
         calm();
@@ -91,9 +91,9 @@ protected:
         throw std::runtime_error("no part " + name.toStdString());
     }
 
-    platform::qt::TabuletWidget* shownTable(const QString& title) {
+    zandor::platform::qt::TabuletWidget* shownTable(const QString& title) {
         for (QWidget* widget : window->drawing().control().findChildren<QWidget*>())
-            if (auto* table = dynamic_cast<platform::qt::TabuletWidget*>(widget);
+            if (auto* table = dynamic_cast<zandor::platform::qt::TabuletWidget*>(widget);
                 table && table->isVisible() && table->title() == title)
                 return table;
         return nullptr;
@@ -101,7 +101,7 @@ protected:
     std::vector<std::string> shownTables() {
         std::vector<std::string> titles;
         for (QWidget* widget : window->drawing().control().findChildren<QWidget*>())
-            if (const auto* table = dynamic_cast<platform::qt::TabuletWidget*>(widget);
+            if (const auto* table = dynamic_cast<zandor::platform::qt::TabuletWidget*>(widget);
                 table && table->isVisible())
                 titles.push_back(table->title().toStdString());
         return titles;
@@ -126,9 +126,9 @@ protected:
         calm();
     }
 
-    model::Query& query() { return *window->document().query(); }
+    zandor::model::Query& query() { return *window->document().query(); }
     std::string title() { return window->windowTitle().toStdString(); }
 
     DatabaseFolder folder;
-    std::unique_ptr<designer::DesignerWindow> window;
+    std::unique_ptr<zandor::designer::DesignerWindow> window;
 };

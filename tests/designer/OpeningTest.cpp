@@ -1,8 +1,10 @@
 #include "Databases.h"
 
-#include "platform/KeyedCollection.h"
+#include <Zandor/platform/KeyedCollection.h>
 
 #include <gmock/gmock.h>
+
+using namespace zandor;
 
 using testing::ElementsAre;
 using testing::HasSubstr;

@@ -4,10 +4,13 @@
 #include "designer/PlainBox.h"
 #include "designer/run/ResultTable.h"
 #include "designer/run/ResultsPanel.h"
-#include "model/files/QueryDocument.h"
+
+#include <Zandor/QueryDocument.h>
 
 #include <QHeaderView>
 #include <QLabel>
+
+using namespace zandor;
 
 using testing::HasSubstr;
 using testing::Not;

@@ -1,6 +1,6 @@
 #include "Databases.h"
 
-#include "model/files/QueryDocument.h"
+#include <Zandor/QueryDocument.h>
 
 #include <gmock/gmock.h>
 
@@ -8,6 +8,8 @@
 #include <QImage>
 #include <QProcess>
 #include <QProcessEnvironment>
+
+using namespace zandor;
 
 using testing::EndsWith;
 using testing::HasSubstr;

@@ -3,7 +3,8 @@
 #include "designer/Banner.h"
 #include "designer/database/ConnectionBanner.h"
 #include "designer/document/AutosaveSlot.h"
-#include "model/files/QueryDocument.h"
+
+#include <Zandor/QueryDocument.h>
 
 #include <QDir>
 #include <QLineEdit>
@@ -13,6 +14,8 @@
 #include <sqlite3.h>
 
 #include <cstdio>
+
+using namespace zandor;
 
 using designer::Banner;
 using platform::qt::GridWidget;

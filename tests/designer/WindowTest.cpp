@@ -5,10 +5,10 @@
 #include "designer/options/Languages.h"
 #include "designer/run/ResultsPanel.h"
 #include "designer/tables/RenameDialog.h"
-#include "platform/qt/CanvasItems.h"
-#include "platform/qt/GridModel.h"
-#include "platform/qt/GridWidget.h"
-#include "platform/qt/TabuletWidget.h"
+#include "frontends/qt/CanvasItems.h"
+#include "frontends/qt/GridModel.h"
+#include "frontends/qt/GridWidget.h"
+#include "frontends/qt/TabuletWidget.h"
 #include "support/QtHands.h"
 
 #include <gmock/gmock.h>
@@ -27,6 +27,8 @@
 #include <QTimer>
 #include <QTranslator>
 #include <QUrl>
+
+using namespace zandor;
 
 using platform::qt::Canvas;
 using platform::qt::GridWidget;

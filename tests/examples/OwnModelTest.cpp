@@ -1,14 +1,17 @@
 #include "ReportModel.h"
 
-#include "platform/qt/GridWidget.h"
-#include "platform/qt/QtToolkit.h"
-#include "platform/qt/TabuletWidget.h"
-#include "platform/qt/ZandorWidget.h"
+#include "frontends/qt/GridWidget.h"
+#include "frontends/qt/QtToolkit.h"
+#include "frontends/qt/TabuletWidget.h"
 #include "support/QtHands.h"
+
+#include <Zandor/ZandorWidget.h>
 
 #include <QAbstractItemView>
 
 #include <gtest/gtest.h>
+
+using namespace zandor;
 
 // The example's model under the user's hands.
 

@@ -1,8 +1,11 @@
 #include "InterfacePage.h"
 #include "Sources.h"
-#include "control/Interface.h"
+
+#include <Zandor/Interface.h>
 
 #include <gtest/gtest.h>
+
+using namespace zandor;
 
 using namespace TalvikDBxZandor;
 

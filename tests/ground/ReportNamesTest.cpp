@@ -1,12 +1,15 @@
 #include "Sources.h"
-#include "platform/String.h"
 #include "support/PublicInterface.h"
+
+#include <Zandor/platform/String.h>
 
 #include <gtest/gtest.h>
 
 #include <map>
 #include <regex>
 #include <sstream>
+
+using namespace zandor;
 
 // A plain getter cannot be made to fail, so no run shows the name that it would report under. The
 // names are read from the text instead.
@@ -19,7 +22,7 @@ using promised::Type;
 
 /// Where the accessors are written: inline in the class, in these two files otherwise.
 const std::string& accessorText() {
-    static const std::string text = sources::contentOf("src/control/Zandor.h") +
+    static const std::string text = sources::contentOf("src/control/include/Zandor/Zandor.h") +
                                     sources::contentOf("src/control/properties.cpp") +
                                     sources::contentOf("src/control/binding.cpp");
     return text;

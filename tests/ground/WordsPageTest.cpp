@@ -1,7 +1,10 @@
 #include "Sources.h"
-#include "platform/Words.h"
+
+#include <Zandor/platform/Words.h>
 
 #include <gtest/gtest.h>
+
+using namespace zandor;
 
 TEST(ThePageOfTheWords, ListsEveryWordWithItsDefault) {
     const std::string page = sources::contentOf("docs/words.md");

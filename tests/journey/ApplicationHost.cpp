@@ -8,6 +8,8 @@
 #include <QApplication>
 #include <QScreen>
 
+using namespace zandor;
+
 // The designer's own window, over what the command line names.
 
 int main(int argc, char** argv) {

@@ -1,10 +1,12 @@
 #include "Host.h"
 
-#include "model/Library.h"
-#include "model/reader/Connection.h"
-#include "model/reader/addTables.h"
+#include <Zandor/Library.h>
+#include <Zandor/reader/Connection.h>
+#include <Zandor/reader/addTables.h>
 
 #include <QApplication>
+
+using namespace zandor;
 
 // A window with nothing but the control on it, over some of the sample's tables.
 

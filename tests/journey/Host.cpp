@@ -3,9 +3,9 @@
 #include "Places.h"
 #include "QueryText.h"
 
-#include "platform/qt/ColumnListModel.h"
-#include "platform/qt/GridWidget.h"
-#include "platform/qt/TabuletWidget.h"
+#include "frontends/qt/ColumnListModel.h"
+#include "frontends/qt/GridWidget.h"
+#include "frontends/qt/TabuletWidget.h"
 
 #include <QApplication>
 #include <QComboBox>
@@ -22,6 +22,8 @@
 #include <cstdlib>
 
 #include <unistd.h>
+
+using namespace zandor;
 
 namespace {
 

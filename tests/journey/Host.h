@@ -1,7 +1,7 @@
 #pragma once
 
-#include "model/Query.h"
-#include "platform/qt/ZandorWidget.h"
+#include <Zandor/Query.h>
+#include <Zandor/ZandorWidget.h>
 
 #include <QPointer>
 #include <QSocketNotifier>
@@ -28,7 +28,7 @@
 ///     quit                ends the program
 class Host final : public QObject {
 public:
-    using Query = std::function<model::Query&()>;
+    using Query = std::function<zandor::model::Query&()>;
 
     /// The query of the moment is asked for each time.
     Host(QWidget& window, Query query);

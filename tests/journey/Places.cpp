@@ -1,11 +1,12 @@
 #include "Places.h"
 
-#include "platform/qt/CanvasItems.h"
-#include "platform/qt/CanvasView.h"
-#include "platform/qt/ColumnListModel.h"
-#include "platform/qt/GridWidget.h"
-#include "platform/qt/TabuletWidget.h"
-#include "platform/qt/Twips.h"
+#include "frontends/qt/CanvasItems.h"
+#include "frontends/qt/CanvasView.h"
+#include "frontends/qt/ColumnListModel.h"
+#include "frontends/qt/GridWidget.h"
+#include "frontends/qt/TabuletWidget.h"
+
+#include <Zandor/qt/Twips.h>
 
 #include <QAbstractButton>
 #include <QAbstractItemView>
@@ -14,6 +15,8 @@
 #include <QDialog>
 #include <QMenu>
 #include <QMenuBar>
+
+using namespace zandor;
 
 using platform::qt::Canvas;
 using platform::qt::CanvasLine;

@@ -1,6 +1,8 @@
 #include "QueryText.h"
 
-#include "platform/qt/Text.h"
+#include <Zandor/qt/Text.h>
+
+using namespace zandor;
 
 using platform::qt::toQt;
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/Query.h"
+#include <Zandor/Query.h>
 
 #include <QString>
 
@@ -9,4 +9,4 @@
 ///     table orders
 ///     join orders.customer_id = customers.id, type 0
 ///     column orders.id 'synonym' sort 0 visible [= 1]
-QString textOf(model::Query& query);
+QString textOf(zandor::model::Query& query);

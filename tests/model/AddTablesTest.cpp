@@ -1,7 +1,10 @@
-#include "model/reader/addTables.h"
 #include "model/TemporaryDatabase.h"
 
+#include <Zandor/reader/addTables.h>
+
 #include <gtest/gtest.h>
+
+using namespace zandor;
 
 using platform::Each;
 using platform::String;

@@ -3,6 +3,8 @@
 
 #include <vector>
 
+using namespace zandor;
+
 using platform::String;
 
 namespace {

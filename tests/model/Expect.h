@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/RuntimeError.h"
+#include <Zandor/platform/RuntimeError.h>
 
 #include <gtest/gtest.h>
 
@@ -9,7 +9,7 @@ template <class Call>
 std::int32_t errorOf(Call&& call) {
     try {
         call();
-    } catch (const platform::RuntimeError& error) {
+    } catch (const zandor::platform::RuntimeError& error) {
         return error.Number;
     }
     return 0;

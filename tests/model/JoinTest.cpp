@@ -1,6 +1,8 @@
 #include "model/Expect.h"
 #include "model/SmallQuery.h"
 
+using namespace zandor;
+
 TEST(AJoin, IsNormalWithEqualsAndHasNoEndsWhenNew) {
     model::Library library;
     const auto join = library.NewZDJoin();

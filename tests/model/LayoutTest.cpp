@@ -1,8 +1,10 @@
-#include "model/Layout.h"
+#include <Zandor/model/Layout.h>
 
 #include <gtest/gtest.h>
 
 #include <cstdlib>
+
+using namespace zandor;
 
 using namespace model::layout;
 

@@ -8,6 +8,8 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+using namespace zandor;
+
 namespace {
 
 class OpeningASqliteFile : public testing::Test {

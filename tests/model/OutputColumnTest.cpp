@@ -1,8 +1,11 @@
 #include "Expect.h"
 #include "SmallQuery.h"
-#include "model/sql/Builder.h"
+
+#include <Zandor/sql/Builder.h>
 
 #include <vector>
+
+using namespace zandor;
 
 using platform::String;
 using DefinitionRef = platform::Ref<TalvikZandorLib::ZDColumnDefinition>;

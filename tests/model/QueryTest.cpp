@@ -1,6 +1,8 @@
 #include "model/Expect.h"
 #include "model/SmallQuery.h"
 
+using namespace zandor;
+
 using platform::makeRef;
 using platform::Ref;
 

@@ -1,9 +1,12 @@
 #include "SmallQuery.h"
-#include "model/Snapshot.h"
+
+#include <Zandor/model/Snapshot.h>
 
 #include <gtest/gtest.h>
 
 #include <functional>
+
+using namespace zandor;
 
 using platform::Ref;
 

@@ -1,5 +1,5 @@
-#include "model/reader/Connection.h"
-#include "model/reader/addTables.h"
+#include <Zandor/reader/Connection.h>
+#include <Zandor/reader/addTables.h>
 
 #include <QFile>
 #include <QSqlQuery>
@@ -8,6 +8,8 @@
 #include <gtest/gtest.h>
 
 #include <map>
+
+using namespace zandor;
 
 namespace {
 

@@ -1,31 +1,33 @@
 #pragma once
 
-#include "model/Library.h"
+#include <Zandor/Library.h>
 
 #include <utility>
 
 /// A query with two tables of two columns, and short ways to what the tests need of it.
 struct SmallQuery {
-    using TableRef = platform::Ref<model::Table>;
+    using TableRef = zandor::platform::Ref<zandor::model::Table>;
 
-    model::Library library;
-    platform::Ref<model::Query> query = platform::makeRef<model::Query>();
+    zandor::model::Library library;
+    zandor::platform::Ref<zandor::model::Query> query =
+        zandor::platform::makeRef<zandor::model::Query>();
     TableRef orders = query->addTable(described(u"orders"));
     TableRef customers = query->addTable(described(u"customers"));
 
-    static model::TableDescription described(platform::String name) {
+    static zandor::model::TableDescription described(zandor::platform::String name) {
         return {u"",
                 std::move(name),
-                {{u"id", model::ColumnType::Integer, u"INTEGER", true},
-                 {u"name", model::ColumnType::Text, u"TEXT", false}}};
+                {{u"id", zandor::model::ColumnType::Integer, u"INTEGER", true},
+                 {u"name", zandor::model::ColumnType::Text, u"TEXT", false}}};
     }
 
-    static platform::Ref<model::Column> id(const TableRef& table) {
+    static zandor::platform::Ref<zandor::model::Column> id(const TableRef& table) {
         return table->columnNamed(u"id");
     }
 
     /// A filled join that stands in no query yet, made as the control makes it.
-    platform::Ref<TalvikZandorLib::ZDJoin> newJoin(const TableRef& left, const TableRef& right) {
+    zandor::platform::Ref<TalvikZandorLib::ZDJoin> newJoin(const TableRef& left,
+                                                           const TableRef& right) {
         auto join = library.NewZDJoin();
         join->LeftTable(left);
         join->LeftColumn(id(left));
@@ -36,7 +38,8 @@ struct SmallQuery {
         return join;
     }
 
-    platform::Ref<TalvikZandorLib::ZDColumnDefinition> newDefinition(const TableRef& table) {
+    zandor::platform::Ref<TalvikZandorLib::ZDColumnDefinition>
+    newDefinition(const TableRef& table) {
         auto definition = library.NewZDColumnDefinition();
         definition->Column(id(table));
         return definition;

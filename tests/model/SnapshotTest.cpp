@@ -1,9 +1,11 @@
-#include "model/Snapshot.h"
+#include <Zandor/model/Snapshot.h>
 
 #include "Expect.h"
 #include "SmallQuery.h"
 
 #include <functional>
+
+using namespace zandor;
 
 using platform::Ref;
 

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace zandor;
+
 using model::ColumnDescription;
 using model::ColumnType;
 using reader::ForeignKey;

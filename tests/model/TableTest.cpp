@@ -1,6 +1,8 @@
 #include "model/Expect.h"
 #include "model/SmallQuery.h"
 
+using namespace zandor;
+
 TEST(ATable, BeginsWithTheEntryForAllColumns) {
     SmallQuery small;
     auto& columns = small.orders->Columns();

@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace zandor;
+
 void writeSqlite(const QString& path, const QStringList& statements) {
     QSqlDatabase database = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), path);
     database.setDatabaseName(path);

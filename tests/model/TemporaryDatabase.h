@@ -1,7 +1,7 @@
 #pragma once
 
-#include "model/reader/Connection.h"
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
+#include <Zandor/reader/Connection.h>
 
 #include <QTemporaryDir>
 
@@ -14,12 +14,12 @@ public:
     explicit TemporaryDatabase(const QStringList& statements);
 
     QString path() const { return mDirectory.filePath(QStringLiteral("test.sqlite")); }
-    reader::DatabaseReader& reader() { return *mReader; }
+    zandor::reader::DatabaseReader& reader() { return *mReader; }
 
 private:
     QTemporaryDir mDirectory;
-    std::unique_ptr<reader::Connection> mConnection;
-    std::unique_ptr<reader::DatabaseReader> mReader;
+    std::unique_ptr<zandor::reader::Connection> mConnection;
+    std::unique_ptr<zandor::reader::DatabaseReader> mReader;
 };
 
 /// Writes statements into a database file, which is made when it is not there.

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
 
 #include <utility>
 

@@ -1,10 +1,11 @@
 #pragma once
 
-#include "platform/qt/GridModel.h"
-#include "platform/qt/GridWidget.h"
-#include "platform/qt/ZandorWidget.h"
+#include "frontends/qt/GridModel.h"
+#include "frontends/qt/GridWidget.h"
 #include "support/QtHands.h"
 #include "support/Sample.h"
+
+#include <Zandor/ZandorWidget.h>
 
 #include <QScrollBar>
 
@@ -120,7 +121,9 @@ private:
         EXPECT_FALSE(frame.isVisible()) << cell << ", after Escape";
     }
 
-    platform::qt::GridWidget& grid() { return *part<platform::qt::GridWidget>("sprColumn"); }
+    zandor::platform::qt::GridWidget& grid() {
+        return *part<zandor::platform::qt::GridWidget>("sprColumn");
+    }
 
     /// Of those that are filled.
     int lastColumnInSight() {

@@ -1,9 +1,11 @@
 #include "support/FakeModel.h"
 
-#include "platform/Numbers.h"
+#include <Zandor/platform/Numbers.h>
 
 #include <stdexcept>
 #include <unordered_set>
+
+using namespace zandor;
 
 namespace fake {
 

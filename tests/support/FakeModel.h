@@ -1,7 +1,7 @@
 #pragma once
 
-#include "platform/KeyedCollection.h"
-#include "platform/headless/Faults.h"
+#include <Zandor/headless/Faults.h>
+#include <Zandor/platform/KeyedCollection.h>
 
 #include <initializer_list>
 #include <memory>
@@ -12,12 +12,12 @@
 /// and builders of the objects, which are not recorded; the control uses their members, which are.
 namespace fake {
 
-using platform::Ref;
-using platform::String;
+using zandor::platform::Ref;
+using zandor::platform::String;
 
 /// Calls are named "ZDTable.Name" for a getter or method, "ZDTable.Left=" for a setter; of the
 /// collections "Tables.Count", "Tables.Item(position)", "Tables.Item(key)", "Joins.Remove".
-using Calls = std::shared_ptr<platform::headless::Faults>;
+using Calls = std::shared_ptr<zandor::platform::headless::Faults>;
 
 /// Every call that a model can get.
 const std::vector<std::string>& memberNames();
@@ -57,7 +57,7 @@ public:
         items.Remove(key);
     }
 
-    platform::KeyedCollection<T> items;
+    zandor::platform::KeyedCollection<T> items;
 
 private:
     std::string mName;
@@ -183,7 +183,7 @@ private:
 
 class Model : public TalvikZandorLib::Zandor, private Part {
 public:
-    explicit Model(Calls calls = std::make_shared<platform::headless::Faults>());
+    explicit Model(Calls calls = std::make_shared<zandor::platform::headless::Faults>());
     TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& Tables() override;
     TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDJoin>& Joins() override;
     TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDColumnDefinition>&
@@ -242,14 +242,14 @@ private:
 /// Makes empty models, joins and definitions that share one record of calls.
 class Library final : public TalvikZandorLib::Library, private Part {
 public:
-    explicit Library(Calls calls = std::make_shared<platform::headless::Faults>())
+    explicit Library(Calls calls = std::make_shared<zandor::platform::headless::Faults>())
         : Part(calls), calls(calls) {}
     Ref<TalvikZandorLib::Zandor> NewZandor() override;
     Ref<TalvikZandorLib::ZDJoin> NewZDJoin() override;
     Ref<TalvikZandorLib::ZDColumnDefinition> NewZDColumnDefinition() override;
 
     /// A model for a test to build, on the same record.
-    Ref<Model> newModel() const { return platform::makeRef<Model>(calls); }
+    Ref<Model> newModel() const { return zandor::platform::makeRef<Model>(calls); }
 
     const Calls calls;
 };

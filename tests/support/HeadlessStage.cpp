@@ -1,10 +1,13 @@
-#include "platform/headless/User.h"
 #include "support/Stage.h"
 #include "support/StageEvents.h"
+
+#include <Zandor/headless/User.h>
 
 #include <gtest/gtest.h>
 
 #include <optional>
+
+using namespace zandor;
 
 namespace {
 

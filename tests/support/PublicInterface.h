@@ -1,6 +1,6 @@
 #pragma once
 
-#include "control/Interface.h"
+#include <Zandor/Interface.h>
 
 #include <string_view>
 #include <variant>

@@ -1,19 +1,20 @@
-#include "platform/qt/Adapter.h"
-#include "platform/qt/CanvasItems.h"
-#include "platform/qt/ColumnListModel.h"
-#include "platform/qt/GridModel.h"
-#include "platform/qt/GridWidget.h"
-#include "platform/qt/MessageBox.h"
-#include "platform/qt/PickListWidget.h"
-#include "platform/qt/QtToolkit.h"
-#include "platform/qt/TabuletWidget.h"
-#include "platform/qt/Text.h"
-#include "platform/qt/ZandorWidget.h"
-#include "platform/qt/ZandorWindowMessage.h"
+#include "frontends/qt/Adapter.h"
+#include "frontends/qt/CanvasItems.h"
+#include "frontends/qt/ColumnListModel.h"
+#include "frontends/qt/GridModel.h"
+#include "frontends/qt/GridWidget.h"
+#include "frontends/qt/MessageBox.h"
+#include "frontends/qt/PickListWidget.h"
+#include "frontends/qt/QtToolkit.h"
+#include "frontends/qt/TabuletWidget.h"
+#include "frontends/qt/ZandorWindowMessage.h"
 #include "support/QtHands.h"
 #include "support/QtLook.h"
 #include "support/Stage.h"
 #include "support/StageEvents.h"
+
+#include <Zandor/ZandorWidget.h>
+#include <Zandor/qt/Text.h>
 
 #include <QAbstractItemView>
 #include <QApplication>
@@ -32,6 +33,8 @@
 #include <QtCore/qtestsupport_core.h>
 
 #include <gtest/gtest.h>
+
+using namespace zandor;
 
 namespace {
 

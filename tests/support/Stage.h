@@ -1,7 +1,7 @@
 #pragma once
 
-#include "comforts/Comforts.h"
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
+#include <Zandor/comforts/Comforts.h>
 
 #include <functional>
 #include <memory>
@@ -12,7 +12,7 @@
 /// that the same tests run on every toolkit. Everything is in twips.
 class Stage {
 public:
-    using String = platform::String;
+    using String = zandor::platform::String;
 
     struct Box {
         String text;
@@ -34,7 +34,7 @@ public:
 
     /// What a user sees of a constituent control; members that its kind lacks keep their zeros.
     struct Seen {
-        platform::Bounds bounds;
+        zandor::platform::Bounds bounds;
         bool visible = false;
         bool enabled = false;
         bool focused = false;
@@ -67,9 +67,9 @@ public:
     static std::unique_ptr<Stage> open(TalvikZandorLib::Library& library);
 
     virtual TalvikDBxZandor::Zandor& control() = 0;
-    virtual platform::Toolkit& toolkit() = 0;
+    virtual zandor::platform::Toolkit& toolkit() = 0;
     /// All off at first.
-    virtual comforts::Comforts& comforts() = 0;
+    virtual zandor::comforts::Comforts& comforts() = 0;
     /// Destroys the control (its closing boxes are recorded).
     virtual void closeControl() = 0;
 
@@ -158,5 +158,6 @@ public:
 
 /// A failed comparison of boxes reads as their texts.
 inline void PrintTo(const Stage::Box& box, std::ostream* out) {
-    *out << platform::toUtf8(box.title) << " [" << box.style << "] " << platform::toUtf8(box.text);
+    *out << zandor::platform::toUtf8(box.title) << " [" << box.style << "] "
+         << zandor::platform::toUtf8(box.text);
 }

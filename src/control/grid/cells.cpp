@@ -1,7 +1,8 @@
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
 
 #include "control/KeyNumber.h"
-#include "platform/Numbers.h"
+
+#include <Zandor/platform/Numbers.h>
 
 namespace TalvikDBxZandor {
 

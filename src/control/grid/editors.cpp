@@ -1,4 +1,4 @@
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
 
 namespace TalvikDBxZandor {
 

@@ -1,5 +1,6 @@
 #include "control/QueryPicture.h"
-#include "control/Zandor.h"
+
+#include <Zandor/Zandor.h>
 
 #include <unordered_set>
 

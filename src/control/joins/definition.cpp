@@ -1,8 +1,9 @@
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
 
+#include "control/joins/frmJoinDefinition.h"
 #include "control/joins/symbols.h"
-#include "frmJoinDefinition.h"
-#include "platform/Numbers.h"
+
+#include <Zandor/platform/Numbers.h>
 
 // How the control opens the join definition dialog.
 

@@ -1,6 +1,6 @@
-#include "control/Zandor.h"
+#include <Zandor/Zandor.h>
 
-#include "platform/Numbers.h"
+#include <Zandor/platform/Numbers.h>
 
 namespace TalvikDBxZandor {
 

@@ -4,7 +4,7 @@
 #include <QUrl>
 #include <QUrlQuery>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -117,4 +117,4 @@ QString nameOfDatabase(const QString& address) {
     return parts->database.isEmpty() ? parts->host : parts->database;
 }
 
-} // namespace designer
+} // namespace zandor::designer

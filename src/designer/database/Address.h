@@ -4,7 +4,7 @@
 
 #include <optional>
 
-namespace designer {
+namespace zandor::designer {
 
 enum class Engine { SQLite, PostgreSQL, MySQL, ODBC };
 
@@ -38,4 +38,4 @@ PartedAddress partPassword(const QString& address);
 /// What a title calls a database: the file's or the database's name, the data source.
 QString nameOfDatabase(const QString& address);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -5,7 +5,7 @@
 
 #include <QPushButton>
 
-namespace designer {
+namespace zandor::designer {
 
 ConnectionBanner::ConnectionBanner(Database& database, QWidget* parent)
     : Banner(parent), mDatabase(database) {
@@ -39,4 +39,4 @@ void ConnectionBanner::reconnect() {
     if (!opening.error.isEmpty()) say(inWords(opening.error));
 }
 
-} // namespace designer
+} // namespace zandor::designer

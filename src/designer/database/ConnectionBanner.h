@@ -3,7 +3,7 @@
 #include "designer/Banner.h"
 #include "designer/database/Database.h"
 
-namespace designer {
+namespace zandor::designer {
 
 /// There while the database is lost, or is no longer what was read of it; with a button that
 /// connects it afresh.
@@ -21,4 +21,4 @@ private:
     Database& mDatabase;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -20,7 +20,7 @@
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -218,4 +218,4 @@ void ConnectionDialog::open() {
     growToContent();
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -10,7 +10,7 @@ class QLineEdit;
 class QPushButton;
 class QSpinBox;
 
-namespace designer {
+namespace zandor::designer {
 
 class Database;
 class ErrorLine;
@@ -58,4 +58,4 @@ private:
     QPushButton* mOpen;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,14 +1,15 @@
 #include "designer/database/Database.h"
 
 #include "designer/database/Address.h"
-#include "model/reader/dialectOf.h"
+
+#include <Zandor/reader/dialectOf.h>
 
 #include <QCryptographicHash>
 #include <QFileInfo>
 #include <QSqlError>
 #include <QSqlQuery>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -155,4 +156,4 @@ std::optional<Database::Change> Database::changed() {
     return Change::altered;
 }
 
-} // namespace designer
+} // namespace zandor::designer

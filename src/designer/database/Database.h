@@ -2,8 +2,9 @@
 
 #include "designer/FileMark.h"
 #include "designer/database/RememberingReader.h"
-#include "model/reader/Connection.h"
-#include "model/sql/Dialect.h"
+
+#include <Zandor/reader/Connection.h>
+#include <Zandor/sql/Dialect.h>
 
 #include <QMutex>
 #include <QObject>
@@ -12,7 +13,7 @@
 #include <memory>
 #include <optional>
 
-namespace designer {
+namespace zandor::designer {
 
 /// Makes a connection to one database; keeps what it needs for it, so that it may be taken along to
 /// another thread.
@@ -103,4 +104,4 @@ private:
     bool mOutdated = false;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -2,11 +2,11 @@
 
 #include "designer/Colours.h"
 #include "designer/statement/ModelWords.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QEvent>
 
-namespace designer {
+namespace zandor::designer {
 
 ErrorLine::ErrorLine(QWidget* parent) : QLabel(parent) {
     setTextFormat(Qt::PlainText);
@@ -34,4 +34,4 @@ void ErrorLine::say(const QString& error) {
     setVisible(!error.isEmpty());
 }
 
-} // namespace designer
+} // namespace zandor::designer

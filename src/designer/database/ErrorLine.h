@@ -2,7 +2,7 @@
 
 #include <QLabel>
 
-namespace designer {
+namespace zandor::designer {
 
 /// A line of a dialog that says what went wrong: wrapped, to be selected and copied, and not there
 /// as long as there is nothing to say.
@@ -22,4 +22,4 @@ private:
     void colour();
 };
 
-} // namespace designer
+} // namespace zandor::designer

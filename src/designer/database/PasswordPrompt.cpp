@@ -10,7 +10,7 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 
-namespace designer {
+namespace zandor::designer {
 
 PasswordPrompt::PasswordPrompt(const QString& address, const QString& why, QWidget* window)
     : QDialog(window), mPassword(new QLineEdit(this)) {
@@ -45,4 +45,4 @@ PasswordPrompt::PasswordPrompt(const QString& address, const QString& why, QWidg
 
 QString PasswordPrompt::password() const { return mPassword->text(); }
 
-} // namespace designer
+} // namespace zandor::designer

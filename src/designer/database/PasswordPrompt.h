@@ -4,7 +4,7 @@
 
 class QLineEdit;
 
-namespace designer {
+namespace zandor::designer {
 
 /// Asks for the password of a database.
 class PasswordPrompt final : public QDialog {
@@ -20,4 +20,4 @@ private:
     QLineEdit* mPassword;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 using reader::ForeignKey;
 using reader::Result;
@@ -55,4 +55,4 @@ KnownTable& RememberingReader::entry(const TableId& id) {
     return found == mKnown.end() ? mKnown.emplace_back(KnownTable{id, {}, {}}) : *found;
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
 
 #include <optional>
 
-namespace designer {
+namespace zandor::designer {
 
 /// What was read about a table.
 struct KnownTable {
@@ -35,4 +35,4 @@ private:
     std::vector<KnownTable> mKnown; ///< some dozens, for a query has 16 tables
 };
 
-} // namespace designer
+} // namespace zandor::designer

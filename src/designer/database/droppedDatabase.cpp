@@ -5,7 +5,7 @@
 #include <QMimeData>
 #include <QUrl>
 
-namespace designer {
+namespace zandor::designer {
 
 std::optional<QString> droppedDatabase(const QMimeData& data) {
     const QList<QUrl> urls = data.urls();
@@ -19,4 +19,4 @@ std::optional<QString> droppedDatabase(const QMimeData& data) {
     return path;
 }
 
-} // namespace designer
+} // namespace zandor::designer

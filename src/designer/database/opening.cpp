@@ -7,7 +7,7 @@
 
 #include <QCoreApplication>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -23,7 +23,8 @@ reader::Result<Database::Tables> listOfTables(const Connector& connect) {
 /// connection belongs to the thread that made it.
 Opening openBy(const Connector& connect, const QString& name, QWidget* window, const Take& take) {
     auto tables = patiently<reader::Result<Database::Tables>>(
-        QCoreApplication::translate("designer::Opening", "Connecting to %1\u2026").arg(name),
+        QCoreApplication::translate("zandor::designer::Opening", "Connecting to %1\u2026")
+            .arg(name),
         window, [connect] { return listOfTables(connect); });
     if (!tables) return {};
     if (!*tables) return {false, tables->error()};
@@ -65,4 +66,4 @@ std::optional<QString> askForPassword(const QString& address, const QString& why
     return prompt.password();
 }
 
-} // namespace designer
+} // namespace zandor::designer

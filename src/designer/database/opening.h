@@ -4,7 +4,7 @@
 
 class QWidget;
 
-namespace designer {
+namespace zandor::designer {
 
 /// How opening a database ended. Neither opened nor with an error: the user has cancelled it.
 struct Opening {
@@ -25,4 +25,4 @@ Opening renewPatiently(Database& database, QWidget* window);
 /// when the user has none to give.
 std::optional<QString> askForPassword(const QString& address, const QString& why, QWidget* window);
 
-} // namespace designer
+} // namespace zandor::designer

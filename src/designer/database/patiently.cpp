@@ -1,6 +1,6 @@
 #include "designer/database/patiently.h"
 
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QCoreApplication>
 #include <QEventLoop>
@@ -11,7 +11,7 @@
 #include <QThreadPool>
 #include <QTimer>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -42,8 +42,9 @@ bool runPatiently(const QString& what, QWidget* window, std::function<void()> wo
     loop.exec(QEventLoop::ExcludeUserInputEvents);
     if (watcher.isFinished()) return true;
 
-    QProgressDialog dialog(QString(), QCoreApplication::translate("designer::Waiting", "Cancel"), 0,
-                           0, window);
+    QProgressDialog dialog(QString(),
+                           QCoreApplication::translate("zandor::designer::Waiting", "Cancel"), 0, 0,
+                           window);
     auto* const label = new QLabel(platform::qt::asSigns(what));
     label->setTextFormat(Qt::PlainText);
     dialog.setLabel(label);
@@ -55,4 +56,4 @@ bool runPatiently(const QString& what, QWidget* window, std::function<void()> wo
     return watcher.isFinished();
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -9,7 +9,7 @@
 
 class QWidget;
 
-namespace designer {
+namespace zandor::designer {
 
 /// Runs work that mostly waits on another thread.
 QFuture<void> startOnThread(std::function<void()> work);
@@ -29,4 +29,4 @@ std::optional<T> patiently(const QString& what, QWidget* window, std::function<T
     return std::move(*result);
 }
 
-} // namespace designer
+} // namespace zandor::designer

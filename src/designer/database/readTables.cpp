@@ -1,6 +1,6 @@
 #include "designer/database/readTables.h"
 
-namespace designer {
+namespace zandor::designer {
 
 using reader::TableId;
 
@@ -44,4 +44,4 @@ std::optional<QString> takeTables(Database& database, const TablesRead& read) {
     return read.tables.error();
 }
 
-} // namespace designer
+} // namespace zandor::designer

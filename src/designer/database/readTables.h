@@ -4,7 +4,7 @@
 
 class QWidget;
 
-namespace designer {
+namespace zandor::designer {
 
 /// Tables whose columns, and tables whose foreign keys are to be known.
 struct Wanted {
@@ -29,4 +29,4 @@ TablesRead readTables(const Connector& connect, const Wanted& wanted);
 /// Hands what was read to the database's reader; the error, when there is one. Tells of a loss.
 std::optional<QString> takeTables(Database& database, const TablesRead& read);
 
-} // namespace designer
+} // namespace zandor::designer

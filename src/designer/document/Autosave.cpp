@@ -5,7 +5,7 @@
 
 #include <QCoreApplication>
 
-namespace designer {
+namespace zandor::designer {
 
 Autosave::Autosave(Document& document, QueryFile& file, const QString& folder,
                    std::chrono::milliseconds delay)
@@ -94,4 +94,4 @@ void Autosave::tell(const QString& reason) {
     if (mDocument.isModified()) mTimer.start(); // there may be room again
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -9,7 +9,7 @@
 #include <chrono>
 #include <functional>
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 class QueryFile;
@@ -62,4 +62,4 @@ private:
     std::optional<QString> mFailure;
 };
 
-} // namespace designer
+} // namespace zandor::designer

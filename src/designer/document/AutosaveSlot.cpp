@@ -1,7 +1,8 @@
 #include "designer/document/AutosaveSlot.h"
 
 #include "designer/document/paths.h"
-#include "model/files/Replacement.h"
+
+#include <Zandor/files/Replacement.h>
 
 #include <QDir>
 #include <QFileInfo>
@@ -10,7 +11,7 @@
 #include <QStandardPaths>
 #include <QUuid>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -99,4 +100,4 @@ QString AutosaveSlot::setAside() {
     return QFile::rename(mFile, name) ? name : mFile;
 }
 
-} // namespace designer
+} // namespace zandor::designer

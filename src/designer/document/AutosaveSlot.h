@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/files/QueryDocument.h"
+#include <Zandor/QueryDocument.h>
 
 #include <QByteArray>
 #include <QDateTime>
@@ -11,7 +11,7 @@
 #include <optional>
 #include <vector>
 
-namespace designer {
+namespace zandor::designer {
 
 /// A query that was saved of itself, and where it belongs.
 struct Autosaved {
@@ -58,4 +58,4 @@ private:
     QLockFile mLock;
 };
 
-} // namespace designer
+} // namespace zandor::designer

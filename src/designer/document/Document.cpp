@@ -2,7 +2,7 @@
 
 #include "designer/document/Step.h"
 #include "designer/document/StepName.h"
-#include "platform/qt/ZandorWindowMessage.h"
+#include "frontends/qt/ZandorWindowMessage.h"
 
 #include <QAction>
 #include <QCoreApplication>
@@ -10,7 +10,7 @@
 #include <QKeySequence>
 #include <QUndoStack>
 
-namespace designer {
+namespace zandor::designer {
 
 Document::Document(QObject* parent)
     : QObject(parent), mQuery(platform::makeRef<model::Query>()), mKnown(*mQuery),
@@ -136,4 +136,4 @@ void Document::apply(const model::Change& change) {
     mStepped = true;
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "model/Query.h"
-#include "model/Snapshot.h"
+#include <Zandor/Query.h>
+#include <Zandor/model/Snapshot.h>
 
 #include <QObject>
 
@@ -10,7 +10,7 @@
 class QAction;
 class QUndoStack;
 
-namespace designer {
+namespace zandor::designer {
 
 /// The query that is being drawn, and the steps that led to it. Every change goes through here,
 /// so that it can be undone. What is selected in the drawing is part of no step.
@@ -81,4 +81,4 @@ private:
     bool mStepped = false; ///< a step was undone or done again, and nobody knows yet
 };
 
-} // namespace designer
+} // namespace zandor::designer

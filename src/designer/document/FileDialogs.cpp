@@ -12,7 +12,7 @@
 #include <QScopedValueRollback>
 #include <QStandardPaths>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -156,4 +156,4 @@ void FileDialogs::tell(const QString& title, const QString& error) {
     PlainBox::warn(&mWindow, title, inWords(error));
 }
 
-} // namespace designer
+} // namespace zandor::designer

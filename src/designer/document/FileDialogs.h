@@ -4,7 +4,7 @@
 
 class QWidget;
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 class QueryFile;
@@ -54,4 +54,4 @@ private:
     bool mAsking = false;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -3,13 +3,14 @@
 #include "designer/database/Address.h"
 #include "designer/document/Document.h"
 #include "designer/document/paths.h"
-#include "model/files/Replacement.h"
+
+#include <Zandor/files/Replacement.h>
 
 #include <QCryptographicHash>
 #include <QFile>
 #include <QFileInfo>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -128,4 +129,4 @@ void QueryFile::take(const QString& path, const files::QueryDocument& content) {
     emit changed();
 }
 
-} // namespace designer
+} // namespace zandor::designer

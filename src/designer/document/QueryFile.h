@@ -1,14 +1,15 @@
 #pragma once
 
 #include "designer/FileMark.h"
-#include "model/files/QueryDocument.h"
+
+#include <Zandor/QueryDocument.h>
 
 #include <QObject>
 #include <QString>
 
 #include <optional>
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 
@@ -72,4 +73,4 @@ private:
     std::shared_ptr<const files::Unknown> mUnknown;
 };
 
-} // namespace designer
+} // namespace zandor::designer

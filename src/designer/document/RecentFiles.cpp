@@ -4,7 +4,7 @@
 
 #include <QFileInfo>
 
-namespace designer {
+namespace zandor::designer {
 
 RecentFiles::RecentFiles(QSettings& settings, const QString& name, QObject* parent)
     : QObject(parent), mSettings(settings), mKey(QStringLiteral("recent/") + name) {}
@@ -32,4 +32,4 @@ bool RecentFiles::isThere(const QString& fileOrAddress) {
     return QFileInfo::exists(address->file);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -4,7 +4,7 @@
 #include <QSettings>
 #include <QStringList>
 
-namespace designer {
+namespace zandor::designer {
 
 /// The files, or databases, that were used last, the newest first; remembered in the settings. An
 /// address is remembered without its password.
@@ -32,4 +32,4 @@ private:
     const QString mKey;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,12 +1,12 @@
 #include "designer/document/RecentMenu.h"
 
 #include "designer/document/RecentFiles.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QDir>
 #include <QFontMetrics>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -47,4 +47,4 @@ void RecentMenu::fill() {
     connect(addAction(tr("&Clear list")), &QAction::triggered, &mRecent, &RecentFiles::clear);
 }
 
-} // namespace designer
+} // namespace zandor::designer

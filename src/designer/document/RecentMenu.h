@@ -2,7 +2,7 @@
 
 #include <QMenu>
 
-namespace designer {
+namespace zandor::designer {
 
 class RecentFiles;
 
@@ -22,4 +22,4 @@ private:
     RecentFiles& mRecent;
 };
 
-} // namespace designer
+} // namespace zandor::designer

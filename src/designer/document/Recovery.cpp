@@ -10,7 +10,7 @@
 #include <QLocale>
 #include <QPushButton>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -71,4 +71,4 @@ bool offerRecovery(QueryFile& file, Autosave& autosave, const QString& folder, Q
     return false;
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -3,7 +3,7 @@
 class QWidget;
 class QString;
 
-namespace designer {
+namespace zandor::designer {
 
 class Autosave;
 class QueryFile;
@@ -13,4 +13,4 @@ class QueryFile;
 /// Whether a query was recovered: its database is in the file then.
 bool offerRecovery(QueryFile& file, Autosave& autosave, const QString& folder, QWidget* window);
 
-} // namespace designer
+} // namespace zandor::designer

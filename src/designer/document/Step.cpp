@@ -1,6 +1,6 @@
 #include "designer/document/Step.h"
 
-namespace designer {
+namespace zandor::designer {
 
 Step::Step(const QString& name, model::Change change, Apply apply)
     : mChange(std::move(change)), mApply(std::move(apply)) {
@@ -19,4 +19,4 @@ void Step::redo() {
     mDone = true;
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,12 +1,12 @@
 #pragma once
 
-#include "model/Change.h"
+#include <Zandor/model/Change.h>
 
 #include <QUndoCommand>
 
 #include <functional>
 
-namespace designer {
+namespace zandor::designer {
 
 /// One change of the query that can be undone and done again.
 class Step final : public QUndoCommand {
@@ -26,4 +26,4 @@ private:
     bool mDone = true;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,12 +1,12 @@
 #include "designer/document/StepName.h"
 
-#include "model/Names.h"
+#include <Zandor/model/Names.h>
 
 #include <QCoreApplication>
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -168,4 +168,4 @@ QString StepName::definition(const DefinitionState& before, const DefinitionStat
 
 QString stepName(const model::Change& change) { return StepName::of(change); }
 
-} // namespace designer
+} // namespace zandor::designer

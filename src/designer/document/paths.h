@@ -1,12 +1,12 @@
 #pragma once
 
-#include "model/files/Error.h"
+#include <Zandor/files/Error.h>
 
 #include <QFile>
 
-namespace designer {
+namespace zandor::designer {
 
 /// A path as the system takes it.
 inline files::Path pathOf(const QString& path) { return QFile::encodeName(path).toStdString(); }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -9,7 +9,7 @@
 #include <QTextBrowser>
 #include <QTextTable>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -101,4 +101,4 @@ void HelpWindow::changeEvent(QEvent* event) {
     for (auto* browser : findChildren<QTextBrowser*>()) load(*browser);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -6,7 +6,7 @@ class QLineEdit;
 class QTabWidget;
 class QTextBrowser;
 
-namespace designer {
+namespace zandor::designer {
 
 /// The pages that one needs at hand while one draws, to be read beside the window.
 class HelpWindow final : public QDialog {
@@ -32,4 +32,4 @@ private:
     QLineEdit* mFind;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -5,7 +5,7 @@
 
 #include <QSettings>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -66,4 +66,4 @@ QVariantMap ControlOptions::properties() const {
     return result;
 }
 
-} // namespace designer
+} // namespace zandor::designer

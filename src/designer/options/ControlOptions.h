@@ -4,7 +4,7 @@
 
 class QSettings;
 
-namespace designer {
+namespace zandor::designer {
 
 struct ControlProperty;
 
@@ -32,4 +32,4 @@ private:
     QVariantMap mChosen; ///< by the property's first name
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,8 +1,9 @@
 #include "designer/options/ControlProperties.h"
 
 #include "designer/options/ControlTexts.h"
-#include "model/Library.h"
-#include "platform/qt/ZandorWidget.h"
+
+#include <Zandor/Library.h>
+#include <Zandor/ZandorWidget.h>
 
 #include <QCoreApplication>
 #include <QMetaProperty>
@@ -10,7 +11,7 @@
 #include <algorithm>
 #include <optional>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -115,4 +116,4 @@ QString wordsFor(const ControlProperty& property) {
     return controlTexts::useOf(property.name);
 }
 
-} // namespace designer
+} // namespace zandor::designer

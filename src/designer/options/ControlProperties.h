@@ -6,7 +6,7 @@
 
 #include <vector>
 
-namespace designer {
+namespace zandor::designer {
 
 /// A property of the control that a person may set.
 struct ControlProperty {
@@ -25,4 +25,4 @@ const std::vector<ControlProperty>& controlProperties();
 /// In the designer's language: what setting the property does.
 QString wordsFor(const ControlProperty& property);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -5,7 +5,7 @@
 #include <QCoreApplication>
 #include <QTranslator>
 
-namespace designer::controlTexts {
+namespace zandor::designer::controlTexts {
 
 namespace {
 
@@ -88,4 +88,4 @@ QString inLanguage(const Text& text, const char* code) {
     return translated.isEmpty() ? QString::fromLatin1(text.english) : translated;
 }
 
-} // namespace designer::controlTexts
+} // namespace zandor::designer::controlTexts

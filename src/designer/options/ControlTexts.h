@@ -7,7 +7,7 @@
 /// The texts that the control shows, for its LNG properties. English is what the control has of its
 /// own, but spelt right and with letters to choose the menu's entries by; the other languages are
 /// translations of it.
-namespace designer::controlTexts {
+namespace zandor::designer::controlTexts {
 
 struct Text {
     const char* property;
@@ -33,4 +33,4 @@ std::span<const Language> languages();
 /// A text in any of them, whatever the designer speaks.
 QString inLanguage(const Text& text, const char* code);
 
-} // namespace designer::controlTexts
+} // namespace zandor::designer::controlTexts

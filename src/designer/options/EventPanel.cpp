@@ -1,11 +1,12 @@
 #include "designer/options/EventPanel.h"
 
-#include "control/Interface.h"
 #include "designer/options/EventWords.h"
-#include "platform/qt/ShownText.h"
-#include "platform/qt/Text.h"
-#include "platform/qt/ZandorWidget.h"
-#include "platform/qt/ZandorWindowMessage.h"
+#include "frontends/qt/ShownText.h"
+#include "frontends/qt/ZandorWindowMessage.h"
+
+#include <Zandor/Interface.h>
+#include <Zandor/ZandorWidget.h>
+#include <Zandor/qt/Text.h>
 
 #include <QBoxLayout>
 #include <QClipboard>
@@ -18,7 +19,7 @@
 #include <QTime>
 #include <QTreeWidget>
 
-namespace designer {
+namespace zandor::designer {
 
 using platform::qt::asSigns;
 using platform::qt::asToolTip;
@@ -156,4 +157,4 @@ void EventPanel::offerButtons() {
     mCopy->setEnabled(any);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -6,7 +6,7 @@ class QPushButton;
 class QTreeWidget;
 class ZandorWidget;
 
-namespace designer {
+namespace zandor::designer {
 
 /// The control's events as they come, for those who want to know what a host is told. The newest is
 /// at the bottom; the oldest go when there are too many.
@@ -42,4 +42,4 @@ private:
     QPushButton* mCopy;
 };
 
-} // namespace designer
+} // namespace zandor::designer

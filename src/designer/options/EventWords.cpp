@@ -1,20 +1,20 @@
 #include "designer/options/EventWords.h"
 
-#include "model/ColumnDefinition.h"
-#include "model/Table.h"
-#include "platform/qt/Text.h"
+#include <Zandor/model/ColumnDefinition.h>
+#include <Zandor/model/Table.h>
+#include <Zandor/qt/Text.h>
 
 #include <QCoreApplication>
 
 #include <iterator>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
 using platform::qt::toQt;
 
-QString gone() { return QCoreApplication::translate("designer::EventWords", "(gone)"); }
+QString gone() { return QCoreApplication::translate("zandor::designer::EventWords", "(gone)"); }
 
 QString named(const auto& table, const auto& column) {
     return QStringLiteral("%1.%2").arg(table ? toQt(table->Name()) : gone(),
@@ -40,4 +40,4 @@ QString wordsFor(const platform::Ref<TalvikZandorLib::ZDJoin>& join) {
              named(join->RightTable(), join->RightColumn()));
 }
 
-} // namespace designer
+} // namespace zandor::designer

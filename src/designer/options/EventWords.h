@@ -1,10 +1,10 @@
 #pragma once
 
-#include "platform/TalvikZandorLib.h"
+#include <Zandor/TalvikZandorLib.h>
 
 #include <QString>
 
-namespace designer {
+namespace zandor::designer {
 
 /// "orders.total"; what is left of it when the column is no longer in the query.
 QString wordsFor(const platform::Ref<TalvikZandorLib::ZDColumnDefinition>& definition);
@@ -12,4 +12,4 @@ QString wordsFor(const platform::Ref<TalvikZandorLib::ZDColumnDefinition>& defin
 /// "orders.customer_id = customers.id".
 QString wordsFor(const platform::Ref<TalvikZandorLib::ZDJoin>& join);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,7 +1,7 @@
 #include "designer/options/FlagsPage.h"
 
 #include "designer/options/ControlOptions.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QBoxLayout>
 #include <QCheckBox>
@@ -11,7 +11,7 @@
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -95,4 +95,4 @@ void FlagsPage::warn() {
     }
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -9,7 +9,7 @@
 class QCheckBox;
 class QVBoxLayout;
 
-namespace designer {
+namespace zandor::designer {
 
 class ControlOptions;
 
@@ -46,4 +46,4 @@ private:
     std::vector<Offer> mOffers;
 };
 
-} // namespace designer
+} // namespace zandor::designer

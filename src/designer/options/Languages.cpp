@@ -4,7 +4,7 @@
 #include <QLibraryInfo>
 #include <QTranslator>
 
-namespace designer {
+namespace zandor::designer {
 
 bool loadCatalogue(QTranslator& translator, const QLocale& locale) {
     return translator.load(locale, QStringLiteral("zandor_designer"), QStringLiteral("_"),
@@ -22,4 +22,4 @@ void speak(const QLocale& locale) {
         QCoreApplication::installTranslator(qt);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -4,7 +4,7 @@
 
 class QTranslator;
 
-namespace designer {
+namespace zandor::designer {
 
 /// Loads the designer's texts in the first of a locale's languages that it speaks. False when it
 /// speaks none of them: its texts stay English then.
@@ -14,4 +14,4 @@ bool loadCatalogue(QTranslator& translator, const QLocale& locale);
 /// included. Call it before the first window is made, and not more than once.
 void speak(const QLocale& locale = QLocale::system());
 
-} // namespace designer
+} // namespace zandor::designer

@@ -10,7 +10,7 @@
 #include <QSettings>
 #include <QTabWidget>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -90,4 +90,4 @@ void OptionsDialog::offerApply() {
     mButtons->button(QDialogButtonBox::Apply)->setEnabled(collected() != mInForce);
 }
 
-} // namespace designer
+} // namespace zandor::designer

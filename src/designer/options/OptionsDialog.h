@@ -7,7 +7,7 @@
 class QDialogButtonBox;
 class QSettings;
 
-namespace designer {
+namespace zandor::designer {
 
 class FlagsPage;
 class TextsPage;
@@ -40,4 +40,4 @@ private:
     QDialogButtonBox* mButtons;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -3,7 +3,7 @@
 #include "designer/options/ControlOptions.h"
 #include "designer/options/ControlProperties.h"
 #include "designer/options/ControlTexts.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QBoxLayout>
 #include <QHeaderView>
@@ -13,7 +13,7 @@
 #include <QSignalBlocker>
 #include <QTableWidget>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -109,4 +109,4 @@ void TextsPage::fill(const char* language) {
     emit edited();
 }
 
-} // namespace designer
+} // namespace zandor::designer

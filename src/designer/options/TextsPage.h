@@ -4,7 +4,7 @@
 
 class QTableWidget;
 
-namespace designer {
+namespace zandor::designer {
 
 class ControlOptions;
 
@@ -27,4 +27,4 @@ private:
     QTableWidget* mTable;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -7,7 +7,7 @@
 #include <QSqlQuery>
 #include <QSqlRecord>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -18,7 +18,7 @@ QString clockFormat(const QTime& time) {
 
 /// A moment that Qt cannot hold, such as "infinity" or one before our era.
 QString unknownMoment() {
-    return QCoreApplication::translate("designer::CellReader", "(outside the calendar)");
+    return QCoreApplication::translate("zandor::designer::CellReader", "(outside the calendar)");
 }
 
 bool isNumber(const QMetaType& type) {
@@ -94,4 +94,4 @@ Cell CellReader::cell(int column) const {
     }
 }
 
-} // namespace designer
+} // namespace zandor::designer

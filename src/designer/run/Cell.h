@@ -7,7 +7,7 @@
 
 class QSqlQuery;
 
-namespace designer {
+namespace zandor::designer {
 
 /// A value of a result as text, in a form that does not depend on the user's language.
 struct Cell {
@@ -41,4 +41,4 @@ private:
     Row mRow;
 };
 
-} // namespace designer
+} // namespace zandor::designer

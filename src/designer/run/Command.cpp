@@ -1,13 +1,14 @@
 #include "designer/run/Command.h"
 
 #include "model/criteria/Literals.h"
-#include "model/reader/bindValue.h"
+
+#include <Zandor/reader/bindValue.h>
 
 #include <QCoreApplication>
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 using model::ColumnType;
 using model::sql::Dialect;
@@ -106,4 +107,4 @@ Command makeCommand(const model::sql::Text& text, Dialect dialect, const Answers
     return command;
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/sql/Builder.h"
+#include <Zandor/sql/Builder.h>
 
 #include <QMap>
 #include <QVariant>
@@ -8,7 +8,7 @@
 #include <optional>
 #include <vector>
 
-namespace designer {
+namespace zandor::designer {
 
 /// What is sent to the engine.
 struct Command {
@@ -44,4 +44,4 @@ bool fits(const Question& question, const QString& typed);
 Command makeCommand(const model::sql::Text& text, model::sql::Dialect dialect,
                     const Answers& answers, std::optional<qint64> limit);
 
-} // namespace designer
+} // namespace zandor::designer

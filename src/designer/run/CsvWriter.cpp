@@ -4,7 +4,7 @@
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -55,4 +55,4 @@ std::optional<QString> CsvWriter::writeLine() {
     return inWords(error);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,9 +1,10 @@
 #pragma once
 
 #include "designer/run/fetch.h"
-#include "model/files/Output.h"
 
-namespace designer {
+#include <Zandor/files/Output.h>
+
+namespace zandor::designer {
 
 /// Writes rows as comma-separated values as RFC 4180 words them: UTF-8, a header line, CRLF. A null
 /// is empty, an empty text a pair of quotes, a blob in Base64.
@@ -23,4 +24,4 @@ private:
     QByteArray mLine;
 };
 
-} // namespace designer
+} // namespace zandor::designer

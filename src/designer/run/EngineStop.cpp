@@ -7,7 +7,7 @@
 
 #include <cstring>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -99,4 +99,4 @@ void EngineStop::watch(const Connector& another, const QString& killing) {
     }
 }
 
-} // namespace designer
+} // namespace zandor::designer

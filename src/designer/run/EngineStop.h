@@ -6,7 +6,7 @@
 #include <mutex>
 #include <thread>
 
-namespace designer {
+namespace zandor::designer {
 
 /// Stops, on the engine itself, what runs over a connection: as soon as a flag is set or stop() is
 /// called. Made before the statement begins, and gone after its end, on the connection's thread.
@@ -38,4 +38,4 @@ private:
     std::thread mWatch; ///< only for a server
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -2,7 +2,7 @@
 
 #include "designer/statement/ModelWords.h"
 
-namespace designer {
+namespace zandor::designer {
 
 std::optional<QString> FileExport::begin(const QStringList& columns) {
     if (const auto error = mFile.open()) return inWords(error);
@@ -13,4 +13,4 @@ std::optional<QString> FileExport::add(const Row& row) { return mWriter.add(row)
 
 std::optional<QString> FileExport::finish() { return inWords(mFile.commit()); }
 
-} // namespace designer
+} // namespace zandor::designer

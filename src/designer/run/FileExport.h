@@ -2,9 +2,10 @@
 
 #include "designer/document/paths.h"
 #include "designer/run/CsvWriter.h"
-#include "model/files/Replacement.h"
 
-namespace designer {
+#include <Zandor/files/Replacement.h>
+
+namespace zandor::designer {
 
 /// Writes rows into a file of comma-separated values, which is there only when all of them are in
 /// it; until then one that was there before stays.
@@ -21,4 +22,4 @@ private:
     CsvWriter mWriter;
 };
 
-} // namespace designer
+} // namespace zandor::designer

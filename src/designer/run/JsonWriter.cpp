@@ -4,7 +4,7 @@
 
 #include <nlohmann/json.hpp>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -63,4 +63,4 @@ std::optional<QString> JsonWriter::write(std::string_view bytes) {
     return inWords(mOutput.write(bytes));
 }
 
-} // namespace designer
+} // namespace zandor::designer

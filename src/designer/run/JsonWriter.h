@@ -1,9 +1,10 @@
 #pragma once
 
 #include "designer/run/fetch.h"
-#include "model/files/Output.h"
 
-namespace designer {
+#include <Zandor/files/Output.h>
+
+namespace zandor::designer {
 
 /// Writes rows as an array of objects, an object a line: UTF-8. A blob is a text in Base64. Of
 /// columns with one name the later ones get "_2", "_3" behind it.
@@ -25,4 +26,4 @@ private:
     bool mAny = false;
 };
 
-} // namespace designer
+} // namespace zandor::designer

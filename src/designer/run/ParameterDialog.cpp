@@ -1,6 +1,6 @@
 #include "designer/run/ParameterDialog.h"
 
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QDialogButtonBox>
 #include <QEvent>
@@ -11,7 +11,7 @@
 #include <QScrollArea>
 #include <QScrollBar>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -122,4 +122,4 @@ void ParameterDialog::check() {
     mButtons->button(QDialogButtonBox::Ok)->setEnabled(complaint.isEmpty());
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -8,7 +8,7 @@ class QDialogButtonBox;
 class QLabel;
 class QLineEdit;
 
-namespace designer {
+namespace zandor::designer {
 
 /// Asks for the values of a query's parameters.
 class ParameterDialog final : public QDialog {
@@ -30,4 +30,4 @@ private:
     QDialogButtonBox* mButtons;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,6 +1,6 @@
 #include "designer/run/ResultModel.h"
 
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QApplication>
 #include <QFont>
@@ -12,7 +12,7 @@
 #include <map>
 #include <set>
 
-namespace designer {
+namespace zandor::designer {
 
 using platform::qt::asSigns;
 using platform::qt::asToolTip;
@@ -113,9 +113,8 @@ QVariant ResultModel::headerData(int section, Qt::Orientation orientation, int r
         return role == Qt::DisplayRole ? QVariant(QLocale().toString(section + 1)) : QVariant();
     if (role == Qt::DisplayRole) return asSigns(mColumns.value(section)).left(mostShown);
     if (role == Qt::ToolTipRole)
-        return asToolTip(
-            tr("%1\nClick to sort the rows that are shown; the query stays as it is.")
-                .arg(asSigns(mColumns.value(section))));
+        return asToolTip(tr("%1\nClick to sort the rows that are shown; the query stays as it is.")
+                             .arg(asSigns(mColumns.value(section))));
     return {};
 }
 
@@ -177,4 +176,4 @@ std::optional<QString> ResultModel::copied(const QItemSelection& selection) cons
     return text.join(u'\n');
 }
 
-} // namespace designer
+} // namespace zandor::designer

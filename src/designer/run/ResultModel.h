@@ -9,7 +9,7 @@
 
 #include <memory>
 
-namespace designer {
+namespace zandor::designer {
 
 /// The rows of a spool, of which only some pages are in memory.
 class ResultModel final : public QAbstractTableModel {
@@ -55,4 +55,4 @@ private:
     mutable QCache<qint64, std::vector<Row>> mPages;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -10,7 +10,7 @@
 #include <QStyledItemDelegate>
 #include <QToolTip>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -124,4 +124,4 @@ void ResultTable::copy() {
         emit tooMuchToCopy();
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -6,7 +6,7 @@
 
 #include <functional>
 
-namespace designer {
+namespace zandor::designer {
 
 /// The rows of a result, to be looked at and copied.
 class ResultTable final : public QTableView {
@@ -37,4 +37,4 @@ private:
     QAction* mCopy;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -8,7 +8,7 @@
 #include "designer/run/ParameterDialog.h"
 #include "designer/run/ResultTable.h"
 #include "designer/statement/ModelWords.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QAction>
 #include <QComboBox>
@@ -20,7 +20,7 @@
 #include <QStackedWidget>
 #include <QToolButton>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -321,4 +321,4 @@ QString ResultsPanel::seconds() const {
     return tr("%1 s").arg(QLocale().toString(static_cast<double>(mClock.elapsed()) / 1000, 'f', 1));
 }
 
-} // namespace designer
+} // namespace zandor::designer

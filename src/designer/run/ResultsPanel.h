@@ -14,7 +14,7 @@ class QProgressBar;
 class QStackedWidget;
 class QToolButton;
 
-namespace designer {
+namespace zandor::designer {
 
 class Database;
 class Document;
@@ -108,4 +108,4 @@ private:
     QToolButton* mAll;
 };
 
-} // namespace designer
+} // namespace zandor::designer

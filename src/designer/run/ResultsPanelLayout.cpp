@@ -18,7 +18,7 @@
 
 // What the panel looks like.
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -133,4 +133,4 @@ void ResultsPanel::setLimit(qint64 rows) {
     if (const int place = mLimit->findData(rows); place >= 0) mLimit->setCurrentIndex(place);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -9,7 +9,7 @@
 #include <cmath>
 #include <numeric>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -100,4 +100,4 @@ std::optional<RowOrder> sortedRows(Spool& spool, int column, Qt::SortOrder direc
     return keys.order(direction);
 }
 
-} // namespace designer
+} // namespace zandor::designer

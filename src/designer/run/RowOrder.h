@@ -7,7 +7,7 @@
 #include <optional>
 #include <vector>
 
-namespace designer {
+namespace zandor::designer {
 
 class Spool;
 
@@ -25,4 +25,4 @@ inline constexpr qint64 mostRowsSorted = 2'000'000;
 std::optional<RowOrder> sortedRows(Spool& spool, int column, Qt::SortOrder direction, qint64 count,
                                    const std::atomic<bool>& stop);
 
-} // namespace designer
+} // namespace zandor::designer

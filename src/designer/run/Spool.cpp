@@ -15,7 +15,7 @@
 #include <cstdlib>
 #include <cstring>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -125,7 +125,7 @@ std::optional<QString> Spool::begin(const QStringList& columns) {
     mColumns = columns;
     mFile = namelessFile(spoolFolder());
     if (mFile.isOpen()) return {};
-    return QCoreApplication::translate("designer::Spool",
+    return QCoreApplication::translate("zandor::designer::Spool",
                                        "No file for the rows can be made in \"%1\" (%2): set "
                                        "TMPDIR to a folder that you may write to.")
         .arg(spoolFolder(), qt_error_string(errno));
@@ -182,7 +182,7 @@ std::optional<QString> Spool::flush() {
         mNextLook = mEnd + betweenLooks;
         if (QStorageInfo(spoolFolder()).bytesAvailable() < roomLeftToOthers)
             mFailure = QCoreApplication::translate(
-                           "designer::Spool",
+                           "zandor::designer::Spool",
                            "The rows would fill the disk with the folder \"%1\": make room there, "
                            "or ask for fewer rows.")
                            .arg(spoolFolder());
@@ -199,4 +199,4 @@ std::optional<QString> Spool::written() const {
     return inWords(files::systemError("The rows cannot be written", errno));
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -5,7 +5,7 @@
 
 #include <mutex>
 
-namespace designer {
+namespace zandor::designer {
 
 /// How the files of spools are named where they have a name, before six letters and digits: for a
 /// moment on some systems, and for as long as they are read by versions before.
@@ -51,4 +51,4 @@ private:
     std::optional<QString> mFailure;
 };
 
-} // namespace designer
+} // namespace zandor::designer

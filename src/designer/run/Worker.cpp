@@ -1,6 +1,6 @@
 #include "designer/run/Worker.h"
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -47,4 +47,4 @@ void LetGo::operator()(Worker* worker) const {
         QObject::connect(worker, &QThread::finished, worker, &QObject::deleteLater);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -6,7 +6,7 @@
 
 #include <memory>
 
-namespace designer {
+namespace zandor::designer {
 
 /// A statement that runs on a thread of its own. Its signals come on the thread that made it.
 class Worker final : public QThread {
@@ -45,4 +45,4 @@ struct LetGo {
 };
 using WorkerPointer = std::unique_ptr<Worker, LetGo>;
 
-} // namespace designer
+} // namespace zandor::designer

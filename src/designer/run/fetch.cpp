@@ -5,7 +5,7 @@
 #include <QSqlError>
 #include <QSqlQuery>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -89,4 +89,4 @@ Outcome fetch(const Connector& connector, const Command& command, Sink& sink,
     return Fetch(connector, *connection, stop).run(command, sink);
 }
 
-} // namespace designer
+} // namespace zandor::designer

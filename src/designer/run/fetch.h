@@ -8,7 +8,7 @@
 
 #include <atomic>
 
-namespace designer {
+namespace zandor::designer {
 
 /// Takes the rows of a statement, one after the other. What a member returns is what went wrong,
 /// one line for a user; no further row comes then.
@@ -44,4 +44,4 @@ struct Outcome {
 Outcome fetch(const Connector& connector, const Command& command, Sink& sink,
               const std::atomic<bool>& stop);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -5,7 +5,7 @@
 #include <QPainter>
 #include <QPalette>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -41,4 +41,4 @@ private:
 
 QIcon shapeIcon(const QPolygonF& shape) { return QIcon(new ShapeEngine(shape)); }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -13,7 +13,7 @@
 #include <utility>
 #include <vector>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -79,4 +79,4 @@ void sweepSpools() {
     if (now != QDir::tempPath()) sweepSpools(QDir::tempPath());
 }
 
-} // namespace designer
+} // namespace zandor::designer

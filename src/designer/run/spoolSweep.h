@@ -2,7 +2,7 @@
 
 #include <QString>
 
-namespace designer {
+namespace zandor::designer {
 
 /// Removes the spools that runs of the designer have left in a folder: files of this user that are
 /// named as spools are and that no living process holds open. Where it cannot be told who holds
@@ -12,4 +12,4 @@ int sweepSpools(const QString& folder);
 /// In each folder that spools are made in.
 void sweepSpools();
 
-} // namespace designer
+} // namespace zandor::designer

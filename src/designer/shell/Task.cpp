@@ -10,7 +10,7 @@
 #include <cstdio>
 #include <utility>
 
-namespace designer::shell {
+namespace zandor::designer::shell {
 
 using model::sql::Dialect;
 using reader::Error;
@@ -120,4 +120,4 @@ void complain(const QString& what) {
     std::fputs(line.constData(), stderr);
 }
 
-} // namespace designer::shell
+} // namespace zandor::designer::shell

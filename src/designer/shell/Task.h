@@ -1,8 +1,8 @@
 #pragma once
 
-#include "model/files/Output.h"
-#include "model/reader/Result.h"
-#include "model/sql/Dialect.h"
+#include <Zandor/files/Output.h>
+#include <Zandor/reader/Result.h>
+#include <Zandor/sql/Dialect.h>
 
 #include <QMap>
 #include <QStringList>
@@ -13,7 +13,7 @@ class QCommandLineOption;
 class QCommandLineParser;
 
 /// What the designer does in a shell, without a window.
-namespace designer::shell {
+namespace zandor::designer::shell {
 
 enum class Format { csv, json };
 
@@ -54,4 +54,4 @@ int print(const QByteArray& text);
 /// Writes a line to the standard error stream, with the program's name before it.
 void complain(const QString& what);
 
-} // namespace designer::shell
+} // namespace zandor::designer::shell

@@ -6,7 +6,7 @@
 
 #include <termios.h>
 
-namespace designer::shell {
+namespace zandor::designer::shell {
 
 namespace {
 
@@ -49,4 +49,4 @@ std::optional<QString> askPassword(const QString& address) {
     return QString::fromLocal8Bit(line);
 }
 
-} // namespace designer::shell
+} // namespace zandor::designer::shell

@@ -4,10 +4,10 @@
 
 #include <optional>
 
-namespace designer::shell {
+namespace zandor::designer::shell {
 
 /// Asks the person at the terminal for a password, which is not shown. Nothing when there is no
 /// terminal, or no answer.
 std::optional<QString> askPassword(const QString& address);
 
-} // namespace designer::shell
+} // namespace zandor::designer::shell

@@ -1,10 +1,11 @@
 #include "designer/database/Address.h"
 #include "designer/document/paths.h"
 #include "designer/shell/Task.h"
-#include "model/files/QueryDocument.h"
-#include "model/sql/Builder.h"
 
-namespace designer::shell {
+#include <Zandor/QueryDocument.h>
+#include <Zandor/sql/Builder.h>
+
+namespace zandor::designer::shell {
 
 using model::sql::Dialect;
 
@@ -37,4 +38,4 @@ int printStatement(const Task& task) {
     return print(QByteArray::fromStdString(platform::toUtf8(text.text)) + '\n');
 }
 
-} // namespace designer::shell
+} // namespace zandor::designer::shell

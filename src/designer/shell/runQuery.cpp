@@ -6,13 +6,14 @@
 #include "designer/shell/Words.h"
 #include "designer/shell/askPassword.h"
 #include "designer/statement/ModelWords.h"
-#include "model/files/QueryDocument.h"
-#include "model/reader/dialectOf.h"
 #include "model/reader/serverError.h"
+
+#include <Zandor/QueryDocument.h>
+#include <Zandor/reader/dialectOf.h>
 
 #include <csignal>
 
-namespace designer::shell {
+namespace zandor::designer::shell {
 
 namespace {
 
@@ -134,4 +135,4 @@ int runQuery(const Task& task) {
     return exitCode(outcome);
 }
 
-} // namespace designer::shell
+} // namespace zandor::designer::shell

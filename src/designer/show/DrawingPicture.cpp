@@ -1,7 +1,7 @@
 #include "designer/show/DrawingPicture.h"
 
 #include "designer/canvasSize.h"
-#include "platform/qt/TabuletWidget.h"
+#include "frontends/qt/TabuletWidget.h"
 
 #include <QBuffer>
 #include <QImage>
@@ -12,7 +12,7 @@
 #include <algorithm>
 #include <limits>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -161,4 +161,4 @@ void DrawingPicture::paint(QPainter& painter, const QRectF& into) const {
     QSvgRenderer(svg()).render(&painter, place);
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "model/Library.h"
-#include "platform/qt/ZandorWidget.h"
+#include <Zandor/Library.h>
+#include <Zandor/ZandorWidget.h>
 
 #include <QByteArray>
 #include <QVariantMap>
@@ -10,7 +10,7 @@
 
 class QPainter;
 
-namespace designer {
+namespace zandor::designer {
 
 /// The whole drawing of a query as it is now, for a page: its tables and joins, whatever part of
 /// them a window shows, on white, without what only a mouse needs and without what is selected.
@@ -46,4 +46,4 @@ private:
     QSize mSize;
 };
 
-} // namespace designer
+} // namespace zandor::designer

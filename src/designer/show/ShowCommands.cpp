@@ -18,7 +18,7 @@
 #include <QSettings>
 #include <QStandardPaths>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -103,4 +103,4 @@ void ShowCommands::copy() {
     QGuiApplication::clipboard()->setImage(picture().image(scale));
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -6,7 +6,7 @@
 class QSettings;
 class QWidget;
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 class DrawingArea;
@@ -42,4 +42,4 @@ private:
     QWidget& mWindow;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -3,7 +3,8 @@
 #include "designer/document/paths.h"
 #include "designer/show/DrawingPicture.h"
 #include "designer/statement/ModelWords.h"
-#include "model/files/Replacement.h"
+
+#include <Zandor/files/Replacement.h>
 
 #include <QBuffer>
 #include <QCoreApplication>
@@ -14,7 +15,7 @@
 #include <QPdfWriter>
 #include <QPrinter>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -22,7 +23,7 @@ constexpr qreal pngScale = 2;
 constexpr int pixelsPerInch = 96; // of a logical pixel
 constexpr qreal pointsPerPixel = 72.0 / pixelsPerInch;
 
-QString tr(const char* text) { return QCoreApplication::translate("designer", text); }
+QString tr(const char* text) { return QCoreApplication::translate("zandor::designer", text); }
 
 bool writePng(const DrawingPicture& picture, QIODevice& file) {
     return picture.image(pngScale).save(&file, "PNG");
@@ -82,4 +83,4 @@ std::optional<QString> printPicture(const DrawingPicture& picture, QPrinter& pri
     return {};
 }
 
-} // namespace designer
+} // namespace zandor::designer

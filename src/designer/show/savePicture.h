@@ -6,7 +6,7 @@
 
 class QPrinter;
 
-namespace designer {
+namespace zandor::designer {
 
 class DrawingPicture;
 
@@ -18,4 +18,4 @@ std::optional<QString> savePicture(const DrawingPicture& picture, const QString&
 /// Onto one page, as large as fits, but never enlarged. Returns what went wrong.
 std::optional<QString> printPicture(const DrawingPicture& picture, QPrinter& printer);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,13 +1,14 @@
 #include "designer/statement/FindingPlace.h"
 
 #include "designer/canvasSize.h"
-#include "model/Layout.h"
-#include "platform/qt/Text.h"
-#include "platform/qt/ZandorWidget.h"
+
+#include <Zandor/ZandorWidget.h>
+#include <Zandor/model/Layout.h>
+#include <Zandor/qt/Text.h>
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -79,4 +80,4 @@ void showPlace(ZandorWidget& control, model::Query& query, const model::Finding&
         control.showCell(toQt(finding.definition), finding.row);
 }
 
-} // namespace designer
+} // namespace zandor::designer

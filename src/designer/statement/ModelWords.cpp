@@ -5,7 +5,7 @@
 
 #include <vector>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -240,4 +240,4 @@ QStringList knownMessages() {
     return result;
 }
 
-} // namespace designer
+} // namespace zandor::designer

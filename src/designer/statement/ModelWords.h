@@ -1,11 +1,11 @@
 #pragma once
 
-#include "model/files/Error.h"
+#include <Zandor/files/Error.h>
 
 #include <QString>
 #include <QStringList>
 
-namespace designer {
+namespace zandor::designer {
 
 /// A message of the query model, which speaks English, in the designer's language; as it stands
 /// when it is not one that the designer knows.
@@ -16,4 +16,4 @@ std::optional<QString> inWords(const std::optional<files::Error>& error);
 /// The messages that it knows, in English, with %1 and so on in the place of names and numbers.
 QStringList knownMessages();
 
-} // namespace designer
+} // namespace zandor::designer

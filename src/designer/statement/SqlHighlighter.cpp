@@ -4,7 +4,7 @@
 
 #include <QPalette>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -99,4 +99,4 @@ void SqlHighlighter::highlightBlock(const QString& text) {
     }
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -6,7 +6,7 @@
 
 class QPalette;
 
-namespace designer {
+namespace zandor::designer {
 
 /// Colours SQL as the dialects write it. Strings, quoted names and comments may go over lines.
 class SqlHighlighter final : public QSyntaxHighlighter {
@@ -33,4 +33,4 @@ private:
     QTextCharFormat mFormats[partCount];
 };
 
-} // namespace designer
+} // namespace zandor::designer

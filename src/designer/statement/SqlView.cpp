@@ -8,7 +8,7 @@
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 SqlView::SqlView(QWidget* parent)
     : QPlainTextEdit(parent), mHighlighter(new SqlHighlighter(document(), palette())) {
@@ -59,4 +59,4 @@ void SqlView::changeEvent(QEvent* event) {
     if (event->type() == QEvent::PaletteChange) mHighlighter->setPalette(palette());
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -2,7 +2,7 @@
 
 #include <QPlainTextEdit>
 
-namespace designer {
+namespace zandor::designer {
 
 class SqlHighlighter;
 
@@ -29,4 +29,4 @@ private:
     SqlHighlighter* mHighlighter;
 };
 
-} // namespace designer
+} // namespace zandor::designer

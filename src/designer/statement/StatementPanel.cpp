@@ -3,9 +3,10 @@
 #include "designer/document/Document.h"
 #include "designer/statement/ModelWords.h"
 #include "designer/statement/SqlView.h"
-#include "model/sql/Builder.h"
-#include "platform/qt/ShownText.h"
-#include "platform/qt/Text.h"
+#include "frontends/qt/ShownText.h"
+
+#include <Zandor/qt/Text.h>
+#include <Zandor/sql/Builder.h>
 
 #include <QBoxLayout>
 #include <QClipboard>
@@ -21,7 +22,7 @@
 #include <algorithm>
 #include <iterator>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -181,4 +182,4 @@ void StatementPanel::choose(int row) {
     emit findingChosen(finding);
 }
 
-} // namespace designer
+} // namespace zandor::designer

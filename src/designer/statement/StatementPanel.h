@@ -1,7 +1,7 @@
 #pragma once
 
-#include "model/Finding.h"
-#include "model/sql/Dialect.h"
+#include <Zandor/model/Finding.h>
+#include <Zandor/sql/Dialect.h>
 
 #include <QTimer>
 #include <QWidget>
@@ -10,7 +10,7 @@ class QComboBox;
 class QListWidget;
 class QPushButton;
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 class SqlView;
@@ -63,4 +63,4 @@ private:
     QListWidget* mList;
 };
 
-} // namespace designer
+} // namespace zandor::designer

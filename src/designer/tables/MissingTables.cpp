@@ -3,10 +3,11 @@
 #include "designer/DrawingArea.h"
 #include "designer/database/Database.h"
 #include "designer/document/Document.h"
-#include "model/Names.h"
-#include "platform/KeyedCollection.h"
 
-namespace designer {
+#include <Zandor/model/Names.h>
+#include <Zandor/platform/KeyedCollection.h>
+
+namespace zandor::designer {
 
 MissingTables::MissingTables(Document& document, Database& database, DrawingArea& area)
     : QObject(&area), mDocument(document), mDatabase(database), mArea(area) {
@@ -36,4 +37,4 @@ void MissingTables::mark() {
     mArea.control().setTableNotes(notes);
 }
 
-} // namespace designer
+} // namespace zandor::designer

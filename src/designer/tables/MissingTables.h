@@ -2,7 +2,7 @@
 
 #include <QObject>
 
-namespace designer {
+namespace zandor::designer {
 
 class Database;
 class Document;
@@ -24,4 +24,4 @@ private:
     DrawingArea& mArea;
 };
 
-} // namespace designer
+} // namespace zandor::designer

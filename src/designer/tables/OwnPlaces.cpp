@@ -4,7 +4,7 @@
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -33,4 +33,4 @@ void OwnPlaces::note() {
         mPlaces[table->Key()].push_back(placeOf(*table));
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/String.h"
+#include <Zandor/platform/String.h>
 
 #include <QObject>
 #include <QPoint>
@@ -8,7 +8,7 @@
 #include <map>
 #include <vector>
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 
@@ -32,4 +32,4 @@ private:
     std::map<platform::String, std::vector<QPoint>> mPlaces;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,7 +1,7 @@
 #include "designer/tables/RenameDialog.h"
 
 #include "designer/document/Document.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QComboBox>
 #include <QDialogButtonBox>
@@ -10,7 +10,7 @@
 #include <QLineEdit>
 #include <QPushButton>
 
-namespace designer {
+namespace zandor::designer {
 
 RenameDialog::RenameDialog(Document& document, QWidget* parent, const QString& key)
     : QDialog(parent), mDocument(document), mTables(new QComboBox), mName(new QLineEdit),
@@ -76,4 +76,4 @@ void RenameDialog::accept() {
     QDialog::accept();
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -6,7 +6,7 @@ class QComboBox;
 class QLabel;
 class QLineEdit;
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 
@@ -32,4 +32,4 @@ private:
     QLabel* mFault;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -9,9 +9,10 @@
 #include "designer/statement/ModelWords.h"
 #include "designer/tables/leftOutWords.h"
 #include "designer/tables/placeTables.h"
-#include "model/reader/addTables.h"
 
-namespace designer {
+#include <Zandor/reader/addTables.h>
+
+namespace zandor::designer {
 
 using platform::Each;
 using platform::Ref;
@@ -112,4 +113,4 @@ int TableAdding::canvasWidth() const {
     return std::max(mArea.width() * twipsPerPixel - besideCanvas, leastCanvasWidth);
 }
 
-} // namespace designer
+} // namespace zandor::designer

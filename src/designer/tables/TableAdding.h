@@ -5,7 +5,7 @@
 
 #include <QPoint>
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 class DrawingArea;
@@ -47,4 +47,4 @@ private:
     OwnPlaces mPlaces;
 };
 
-} // namespace designer
+} // namespace zandor::designer

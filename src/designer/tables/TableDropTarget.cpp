@@ -5,7 +5,7 @@
 
 #include <QDropEvent>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -40,4 +40,4 @@ bool TableDropTarget::eventFilter(QObject*, QEvent* event) {
     return true;
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,13 +1,13 @@
 #pragma once
 
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
 
 #include <QObject>
 #include <QPoint>
 
 #include <optional>
 
-namespace designer {
+namespace zandor::designer {
 
 class DrawingArea;
 
@@ -30,4 +30,4 @@ private:
     DrawingArea& mArea;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -5,7 +5,7 @@
 #include <QApplication>
 #include <QPainter>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -77,4 +77,4 @@ QSize TableItemDelegate::sizeHint(const QStyleOptionViewItem& option, const QMod
     return {iconSize, std::max(option.fontMetrics.height(), iconSize) + gap};
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -2,7 +2,7 @@
 
 #include <QStyledItemDelegate>
 
-namespace designer {
+namespace zandor::designer {
 
 /// Draws a table with its icon, and its schema, dimmed, behind the name.
 class TableItemDelegate final : public QStyledItemDelegate {
@@ -16,4 +16,4 @@ public:
     QSize sizeHint(const QStyleOptionViewItem& option, const QModelIndex& index) const override;
 };
 
-} // namespace designer
+} // namespace zandor::designer

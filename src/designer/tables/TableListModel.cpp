@@ -1,13 +1,13 @@
 #include "designer/tables/TableListModel.h"
 
 #include "designer/tables/tableMime.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QMimeData>
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 using platform::qt::asSigns;
 
@@ -92,4 +92,4 @@ QMimeData* TableListModel::mimeData(const QModelIndexList& indexes) const {
     return tablesAsMime(tables).release();
 }
 
-} // namespace designer
+} // namespace zandor::designer

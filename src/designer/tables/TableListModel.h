@@ -1,10 +1,10 @@
 #pragma once
 
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
 
 #include <QAbstractListModel>
 
-namespace designer {
+namespace zandor::designer {
 
 /// The tables of a database whose names have every word of a filter in them; first those that begin
 /// with the first word. One pass over all names for each change of the filter, and the view is told
@@ -42,4 +42,4 @@ private:
     QStringList mWords;
 };
 
-} // namespace designer
+} // namespace zandor::designer

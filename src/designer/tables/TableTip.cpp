@@ -2,7 +2,7 @@
 
 #include "designer/database/patiently.h"
 #include "designer/tables/TableListModel.h"
-#include "platform/qt/ShownText.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QCoreApplication>
 #include <QFuture>
@@ -10,7 +10,7 @@
 #include <QListView>
 #include <QToolTip>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -71,13 +71,14 @@ void TableTip::read(const reader::TableEntry& table, QPoint at) {
 
 QString tipText(const model::TableDescription& table, bool isView) {
     const auto text = [](const char* words) {
-        return QCoreApplication::translate("designer::TableTip", words);
+        return QCoreApplication::translate("zandor::designer::TableTip", words);
     };
     const QString name = inTip(table.name);
     QString tip =
         QStringLiteral("<p style='white-space:pre'><b>%1</b></p><table>")
-            .arg(isView ? text(QT_TRANSLATE_NOOP("designer::TableTip", "%1 (view)")).arg(name)
-                        : name);
+            .arg(isView
+                     ? text(QT_TRANSLATE_NOOP("zandor::designer::TableTip", "%1 (view)")).arg(name)
+                     : name);
     const std::size_t shown = std::min(table.columns.size(), mostColumns);
     for (std::size_t n = 0; n < shown; ++n) {
         const auto& column = table.columns[n];
@@ -89,9 +90,9 @@ QString tipText(const model::TableDescription& table, bool isView) {
     tip += QStringLiteral("</table>");
     if (shown < table.columns.size())
         tip += QStringLiteral("<p>%1</p>")
-                   .arg(text(QT_TRANSLATE_NOOP("designer::TableTip", "and %1 more"))
+                   .arg(text(QT_TRANSLATE_NOOP("zandor::designer::TableTip", "and %1 more"))
                             .arg(table.columns.size() - shown));
     return tip;
 }
 
-} // namespace designer
+} // namespace zandor::designer

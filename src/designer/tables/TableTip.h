@@ -6,7 +6,7 @@
 
 class QListView;
 
-namespace designer {
+namespace zandor::designer {
 
 class TableListModel;
 
@@ -33,4 +33,4 @@ private:
 /// The columns of a table for a tip; rich text.
 QString tipText(const model::TableDescription& table, bool isView);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -19,7 +19,7 @@
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 TablesPanel::TablesPanel(Database& database, QWidget* parent)
     : QWidget(parent), mDatabase(database), mModel(new TableListModel(this)),
@@ -169,4 +169,4 @@ void TablesPanel::showMenu(QPoint at) {
     menu.exec(mList->viewport()->mapToGlobal(at));
 }
 
-} // namespace designer
+} // namespace zandor::designer

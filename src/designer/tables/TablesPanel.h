@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
 
 #include <QWidget>
 
@@ -10,7 +10,7 @@ class QListView;
 class QStackedWidget;
 class QToolButton;
 
-namespace designer {
+namespace zandor::designer {
 
 class Database;
 class ErrorLine;
@@ -55,4 +55,4 @@ private:
     ErrorLine* mError;
 };
 
-} // namespace designer
+} // namespace zandor::designer

@@ -5,7 +5,7 @@
 
 #include <algorithm>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -29,7 +29,7 @@ QString leftOutWords(const std::vector<reader::LeftOut>& leftOut) {
             if (each.drawn == drawn) others << nameOf(each.other);
         others.sort(Qt::CaseInsensitive);
         sentences << QCoreApplication::translate(
-                         "designer::TableAdding",
+                         "zandor::designer::TableAdding",
                          "%1 and %2 are joined by %3. Not joined by %4: draw those yourself if you "
                          "need them.")
                          .arg(qtText(drawn.child.name), qtText(drawn.parent.name), nameOf(drawn),
@@ -38,4 +38,4 @@ QString leftOutWords(const std::vector<reader::LeftOut>& leftOut) {
     return sentences.join(u' ').simplified();
 }
 
-} // namespace designer
+} // namespace zandor::designer

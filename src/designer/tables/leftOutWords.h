@@ -1,12 +1,12 @@
 #pragma once
 
-#include "model/reader/addTables.h"
+#include <Zandor/reader/addTables.h>
 
 #include <QString>
 
-namespace designer {
+namespace zandor::designer {
 
 /// One line that says which foreign keys were not drawn and why; empty when all of them were.
 QString leftOutWords(const std::vector<reader::LeftOut>& leftOut);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,14 +1,15 @@
 #include "designer/tables/placeTables.h"
 
 #include "designer/document/Document.h"
-#include "model/Layout.h"
+
+#include <Zandor/model/Layout.h>
 
 #include <QCoreApplication>
 
 #include <algorithm>
 #include <limits>
 
-namespace designer {
+namespace zandor::designer {
 
 using model::layout::Box;
 using platform::Each;
@@ -86,7 +87,8 @@ void arrangeGrown(model::Query& query, const Tables& added, int canvasWidth) {
 }
 
 void arrangeTables(Document& document, int canvasWidth) {
-    const auto name = QCoreApplication::translate("designer::TableAdding", "Arrange tables");
+    const auto name =
+        QCoreApplication::translate("zandor::designer::TableAdding", "Arrange tables");
     document.change(name, [&](model::Query& query) {
         const Tables tables = tablesOf(query);
         // As it would have grown by itself.
@@ -97,4 +99,4 @@ void arrangeTables(Document& document, int canvasWidth) {
     });
 }
 
-} // namespace designer
+} // namespace zandor::designer

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "model/Query.h"
+#include <Zandor/Query.h>
 
 #include <QPoint>
 
-namespace designer {
+namespace zandor::designer {
 
 class Document;
 
@@ -21,4 +21,4 @@ void arrangeGrown(model::Query& query, const std::vector<platform::Ref<model::Ta
 /// Lays all tables of the document out anew by their joins, as one step. Twips.
 void arrangeTables(Document& document, int canvasWidth);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -4,7 +4,7 @@
 #include <QIODevice>
 #include <QMimeData>
 
-namespace designer {
+namespace zandor::designer {
 
 namespace {
 
@@ -37,4 +37,4 @@ std::vector<reader::TableId> tablesOfMime(const QMimeData& data) {
     return tables;
 }
 
-} // namespace designer
+} // namespace zandor::designer

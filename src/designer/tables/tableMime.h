@@ -1,10 +1,10 @@
 #pragma once
 
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
 
 class QMimeData;
 
-namespace designer {
+namespace zandor::designer {
 
 /// Tables as they are dragged from the list of tables to the drawing.
 std::unique_ptr<QMimeData> tablesAsMime(const std::vector<reader::TableId>& tables);
@@ -12,4 +12,4 @@ bool hasTables(const QMimeData& data);
 /// Empty for data of another kind, or from elsewhere that cannot be read.
 std::vector<reader::TableId> tablesOfMime(const QMimeData& data);
 
-} // namespace designer
+} // namespace zandor::designer

@@ -797,7 +797,7 @@
     </message>
 </context>
 <context>
-    <name>designer</name>
+    <name>zandor::designer</name>
     <message>
         <source>There is nothing to draw; add a table first.</source>
         <translation>Es gibt nichts zu zeichnen; fügen Sie zuerst eine Tabelle hinzu.</translation>
@@ -832,28 +832,28 @@
     </message>
 </context>
 <context>
-    <name>designer::Autosave</name>
+    <name>zandor::designer::Autosave</name>
     <message>
         <source>The changes cannot be kept safe in &quot;%1&quot; (%2); save the query yourself.</source>
         <translation>Die Änderungen können in „%1“ nicht gesichert werden (%2); speichern Sie die Abfrage selbst.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Banner</name>
+    <name>zandor::designer::Banner</name>
     <message>
         <source>Close</source>
         <translation>Schließen</translation>
     </message>
 </context>
 <context>
-    <name>designer::CellReader</name>
+    <name>zandor::designer::CellReader</name>
     <message>
         <source>(outside the calendar)</source>
         <translation>(außerhalb des Kalenders)</translation>
     </message>
 </context>
 <context>
-    <name>designer::ConnectionBanner</name>
+    <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
         <translation>&amp;Neu verbinden</translation>
@@ -876,7 +876,7 @@
     </message>
 </context>
 <context>
-    <name>designer::ConnectionDialog</name>
+    <name>zandor::designer::ConnectionDialog</name>
     <message>
         <source>Open database</source>
         <translation>Datenbank öffnen</translation>
@@ -955,7 +955,7 @@
     </message>
 </context>
 <context>
-    <name>designer::DatabaseCommands</name>
+    <name>zandor::designer::DatabaseCommands</name>
     <message>
         <source>Open SQLite &amp;file…</source>
         <translation>SQLite-&amp;Datei öffnen…</translation>
@@ -1002,7 +1002,7 @@
     </message>
 </context>
 <context>
-    <name>designer::DesignerWindow</name>
+    <name>zandor::designer::DesignerWindow</name>
     <message>
         <source>Tables</source>
         <translation>Tabellen</translation>
@@ -1157,7 +1157,7 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
-    <name>designer::Document</name>
+    <name>zandor::designer::Document</name>
     <message>
         <source>&amp;Undo</source>
         <translation>&amp;Rückgängig</translation>
@@ -1168,7 +1168,7 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
-    <name>designer::EventPanel</name>
+    <name>zandor::designer::EventPanel</name>
     <message>
         <source>Time</source>
         <translation>Zeit</translation>
@@ -1219,14 +1219,14 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
-    <name>designer::EventWords</name>
+    <name>zandor::designer::EventWords</name>
     <message>
         <source>(gone)</source>
         <translation>(gelöscht)</translation>
     </message>
 </context>
 <context>
-    <name>designer::FileDialogs</name>
+    <name>zandor::designer::FileDialogs</name>
     <message>
         <source>Zandor queries (*.json)</source>
         <translation>Zandor-Abfragen (*.json)</translation>
@@ -1305,7 +1305,7 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
-    <name>designer::FlagsPage</name>
+    <name>zandor::designer::FlagsPage</name>
     <message>
         <source>Join types offered</source>
         <translation>Angebotene Arten der Verknüpfung</translation>
@@ -1320,7 +1320,7 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
-    <name>designer::HelpWindow</name>
+    <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
         <translation>Hilfe</translation>
@@ -1339,7 +1339,7 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
-    <name>designer::Invitation</name>
+    <name>zandor::designer::Invitation</name>
     <message>
         <source>Drag a table here from the list of tables, or double-click it there.
 Then drag its columns into the grid below.</source>
@@ -1352,21 +1352,21 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::MissingTables</name>
+    <name>zandor::designer::MissingTables</name>
     <message>
         <source>There is no table &quot;%1&quot; in %2.</source>
         <translation>In %2 gibt es keine Tabelle „%1“.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Opening</name>
+    <name>zandor::designer::Opening</name>
     <message>
         <source>Connecting to %1…</source>
         <translation>Verbindung zu %1 wird hergestellt…</translation>
     </message>
 </context>
 <context>
-    <name>designer::OptionsDialog</name>
+    <name>zandor::designer::OptionsDialog</name>
     <message>
         <source>The entries of the context menu that are shown:</source>
         <translation>Diese Einträge zeigt das Kontextmenü:</translation>
@@ -1401,7 +1401,7 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::ParameterDialog</name>
+    <name>zandor::designer::ParameterDialog</name>
     <message>
         <source>Values for the query</source>
         <translation>Werte für die Abfrage</translation>
@@ -1416,7 +1416,7 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::PasswordPrompt</name>
+    <name>zandor::designer::PasswordPrompt</name>
     <message>
         <source>Password</source>
         <translation>Passwort</translation>
@@ -1435,14 +1435,14 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::QueryFile</name>
+    <name>zandor::designer::QueryFile</name>
     <message>
         <source>Untitled</source>
         <translation>Unbenannt</translation>
     </message>
 </context>
 <context>
-    <name>designer::Question</name>
+    <name>zandor::designer::Question</name>
     <message>
         <source>a pattern: * for any characters, ? for one</source>
         <translation>ein Muster: * für beliebige Zeichen, ? für eines</translation>
@@ -1477,7 +1477,7 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::RecentMenu</name>
+    <name>zandor::designer::RecentMenu</name>
     <message>
         <source>Open &amp;recent</source>
         <translation>&amp;Zuletzt geöffnet</translation>
@@ -1488,7 +1488,7 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Recovery</name>
+    <name>zandor::designer::Recovery</name>
     <message>
         <source>A query was drawn and never saved.</source>
         <translation>Eine Abfrage wurde gezeichnet und nie gespeichert.</translation>
@@ -1515,7 +1515,7 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::RenameDialog</name>
+    <name>zandor::designer::RenameDialog</name>
     <message>
         <source>Rename table</source>
         <translation>Tabelle umbenennen</translation>
@@ -1550,7 +1550,7 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
-    <name>designer::ResultModel</name>
+    <name>zandor::designer::ResultModel</name>
     <message>
         <source>(blob, %1 bytes)</source>
         <translation>(BLOB, %1 Bytes)</translation>
@@ -1563,7 +1563,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::ResultTable</name>
+    <name>zandor::designer::ResultTable</name>
     <message>
         <source>&amp;Copy</source>
         <translation>&amp;Kopieren</translation>
@@ -1590,7 +1590,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::ResultsPanel</name>
+    <name>zandor::designer::ResultsPanel</name>
     <message>
         <source>These are too many cells to copy; export the rows instead.</source>
         <translation>Das sind zu viele Zellen zum Kopieren; exportieren Sie stattdessen die Zeilen.</translation>
@@ -1745,7 +1745,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::ShowCommands</name>
+    <name>zandor::designer::ShowCommands</name>
     <message>
         <source>&amp;Export drawing…</source>
         <translation>Zeichnung e&amp;xportieren…</translation>
@@ -1792,7 +1792,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::Spool</name>
+    <name>zandor::designer::Spool</name>
     <message>
         <source>No file for the rows can be made in &quot;%1&quot; (%2): set TMPDIR to a folder that you may write to.</source>
         <translation>In „%1“ lässt sich keine Datei für die Zeilen anlegen (%2): Setzen Sie TMPDIR auf einen Ordner, in den Sie schreiben dürfen.</translation>
@@ -1803,7 +1803,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::StatementPanel</name>
+    <name>zandor::designer::StatementPanel</name>
     <message>
         <source>The dialect of SQL that the statement is written in</source>
         <translation>Der SQL-Dialekt, in dem die Anweisung geschrieben ist</translation>
@@ -1854,7 +1854,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::StepName</name>
+    <name>zandor::designer::StepName</name>
     <message>
         <source>Change the query</source>
         <translation>Abfrage ändern</translation>
@@ -2007,7 +2007,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::TableAdding</name>
+    <name>zandor::designer::TableAdding</name>
     <message>
         <source>Arrange tables</source>
         <translation>Tabellen anordnen</translation>
@@ -2042,7 +2042,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::TableListModel</name>
+    <name>zandor::designer::TableListModel</name>
     <message>
         <source>%1, view</source>
         <translation>%1, Sicht</translation>
@@ -2053,7 +2053,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::TableTip</name>
+    <name>zandor::designer::TableTip</name>
     <message>
         <source>%1 (view)</source>
         <translation>%1 (Sicht)</translation>
@@ -2064,7 +2064,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::TablesPanel</name>
+    <name>zandor::designer::TablesPanel</name>
     <message>
         <source>Filter tables</source>
         <translation>Tabellen filtern</translation>
@@ -2107,7 +2107,7 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::TextsPage</name>
+    <name>zandor::designer::TextsPage</name>
     <message>
         <source>Where it is used</source>
         <translation>Wo er steht</translation>
@@ -2130,14 +2130,14 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
-    <name>designer::Waiting</name>
+    <name>zandor::designer::Waiting</name>
     <message>
         <source>Cancel</source>
         <translation>Abbrechen</translation>
     </message>
 </context>
 <context>
-    <name>designer::shell</name>
+    <name>zandor::designer::shell</name>
     <message>
         <source>Password for %1: </source>
         <translation>Passwort für %1: </translation>

@@ -2,7 +2,7 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="en" sourcelanguage="en">
 <context>
-    <name>designer::StepName</name>
+    <name>zandor::designer::StepName</name>
     <message numerus="yes">
         <source>Delete %n table(s)</source>
         <translation>

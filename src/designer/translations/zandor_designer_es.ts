@@ -797,7 +797,7 @@
     </message>
 </context>
 <context>
-    <name>designer</name>
+    <name>zandor::designer</name>
     <message>
         <source>There is nothing to draw; add a table first.</source>
         <translation>No hay nada que dibujar; añada primero una tabla.</translation>
@@ -832,28 +832,28 @@
     </message>
 </context>
 <context>
-    <name>designer::Autosave</name>
+    <name>zandor::designer::Autosave</name>
     <message>
         <source>The changes cannot be kept safe in &quot;%1&quot; (%2); save the query yourself.</source>
         <translation>Los cambios no se pueden poner a salvo en «%1» (%2); guarde usted la consulta.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Banner</name>
+    <name>zandor::designer::Banner</name>
     <message>
         <source>Close</source>
         <translation>Cerrar</translation>
     </message>
 </context>
 <context>
-    <name>designer::CellReader</name>
+    <name>zandor::designer::CellReader</name>
     <message>
         <source>(outside the calendar)</source>
         <translation>(fuera del calendario)</translation>
     </message>
 </context>
 <context>
-    <name>designer::ConnectionBanner</name>
+    <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
         <translation>&amp;Reconectar</translation>
@@ -876,7 +876,7 @@
     </message>
 </context>
 <context>
-    <name>designer::ConnectionDialog</name>
+    <name>zandor::designer::ConnectionDialog</name>
     <message>
         <source>Open database</source>
         <translation>Abrir base de datos</translation>
@@ -955,7 +955,7 @@
     </message>
 </context>
 <context>
-    <name>designer::DatabaseCommands</name>
+    <name>zandor::designer::DatabaseCommands</name>
     <message>
         <source>Open SQLite &amp;file…</source>
         <translation>Abrir &amp;archivo SQLite…</translation>
@@ -1002,7 +1002,7 @@
     </message>
 </context>
 <context>
-    <name>designer::DesignerWindow</name>
+    <name>zandor::designer::DesignerWindow</name>
     <message>
         <source>Tables</source>
         <translation>Tablas</translation>
@@ -1157,7 +1157,7 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
-    <name>designer::Document</name>
+    <name>zandor::designer::Document</name>
     <message>
         <source>&amp;Undo</source>
         <translation>&amp;Deshacer</translation>
@@ -1168,7 +1168,7 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
-    <name>designer::EventPanel</name>
+    <name>zandor::designer::EventPanel</name>
     <message>
         <source>Time</source>
         <translation>Hora</translation>
@@ -1219,14 +1219,14 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
-    <name>designer::EventWords</name>
+    <name>zandor::designer::EventWords</name>
     <message>
         <source>(gone)</source>
         <translation>(eliminado)</translation>
     </message>
 </context>
 <context>
-    <name>designer::FileDialogs</name>
+    <name>zandor::designer::FileDialogs</name>
     <message>
         <source>Zandor queries (*.json)</source>
         <translation>Consultas de Zandor (*.json)</translation>
@@ -1305,7 +1305,7 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
-    <name>designer::FlagsPage</name>
+    <name>zandor::designer::FlagsPage</name>
     <message>
         <source>Join types offered</source>
         <translation>Tipos de combinación ofrecidos</translation>
@@ -1320,7 +1320,7 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
-    <name>designer::HelpWindow</name>
+    <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
         <translation>Ayuda</translation>
@@ -1339,7 +1339,7 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
-    <name>designer::Invitation</name>
+    <name>zandor::designer::Invitation</name>
     <message>
         <source>Drag a table here from the list of tables, or double-click it there.
 Then drag its columns into the grid below.</source>
@@ -1352,21 +1352,21 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::MissingTables</name>
+    <name>zandor::designer::MissingTables</name>
     <message>
         <source>There is no table &quot;%1&quot; in %2.</source>
         <translation>No hay ninguna tabla «%1» en %2.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Opening</name>
+    <name>zandor::designer::Opening</name>
     <message>
         <source>Connecting to %1…</source>
         <translation>Conectando con %1…</translation>
     </message>
 </context>
 <context>
-    <name>designer::OptionsDialog</name>
+    <name>zandor::designer::OptionsDialog</name>
     <message>
         <source>The entries of the context menu that are shown:</source>
         <translation>Entradas que muestra el menú contextual:</translation>
@@ -1401,7 +1401,7 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::ParameterDialog</name>
+    <name>zandor::designer::ParameterDialog</name>
     <message>
         <source>Values for the query</source>
         <translation>Valores para la consulta</translation>
@@ -1416,7 +1416,7 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::PasswordPrompt</name>
+    <name>zandor::designer::PasswordPrompt</name>
     <message>
         <source>Password</source>
         <translation>Contraseña</translation>
@@ -1435,14 +1435,14 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::QueryFile</name>
+    <name>zandor::designer::QueryFile</name>
     <message>
         <source>Untitled</source>
         <translation>Sin título</translation>
     </message>
 </context>
 <context>
-    <name>designer::Question</name>
+    <name>zandor::designer::Question</name>
     <message>
         <source>a pattern: * for any characters, ? for one</source>
         <translation>un patrón: * para cualquier texto, ? para un carácter</translation>
@@ -1477,7 +1477,7 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::RecentMenu</name>
+    <name>zandor::designer::RecentMenu</name>
     <message>
         <source>Open &amp;recent</source>
         <translation>Abrir &amp;recientes</translation>
@@ -1488,7 +1488,7 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Recovery</name>
+    <name>zandor::designer::Recovery</name>
     <message>
         <source>A query was drawn and never saved.</source>
         <translation>Se dibujó una consulta y nunca se guardó.</translation>
@@ -1515,7 +1515,7 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::RenameDialog</name>
+    <name>zandor::designer::RenameDialog</name>
     <message>
         <source>Rename table</source>
         <translation>Cambiar el nombre de la tabla</translation>
@@ -1550,7 +1550,7 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
-    <name>designer::ResultModel</name>
+    <name>zandor::designer::ResultModel</name>
     <message>
         <source>(blob, %1 bytes)</source>
         <translation>(blob, %1 bytes)</translation>
@@ -1563,7 +1563,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::ResultTable</name>
+    <name>zandor::designer::ResultTable</name>
     <message>
         <source>&amp;Copy</source>
         <translation>&amp;Copiar</translation>
@@ -1590,7 +1590,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::ResultsPanel</name>
+    <name>zandor::designer::ResultsPanel</name>
     <message>
         <source>These are too many cells to copy; export the rows instead.</source>
         <translation>Son demasiadas celdas para copiarlas; exporte las filas.</translation>
@@ -1745,7 +1745,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::ShowCommands</name>
+    <name>zandor::designer::ShowCommands</name>
     <message>
         <source>&amp;Export drawing…</source>
         <translation>&amp;Exportar el dibujo…</translation>
@@ -1792,7 +1792,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::Spool</name>
+    <name>zandor::designer::Spool</name>
     <message>
         <source>No file for the rows can be made in &quot;%1&quot; (%2): set TMPDIR to a folder that you may write to.</source>
         <translation>No se puede crear un archivo para las filas en «%1» (%2): ponga en TMPDIR una carpeta en la que pueda escribir.</translation>
@@ -1803,7 +1803,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::StatementPanel</name>
+    <name>zandor::designer::StatementPanel</name>
     <message>
         <source>The dialect of SQL that the statement is written in</source>
         <translation>El dialecto de SQL en que está escrita la instrucción</translation>
@@ -1854,7 +1854,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::StepName</name>
+    <name>zandor::designer::StepName</name>
     <message>
         <source>Change the query</source>
         <translation>Cambiar la consulta</translation>
@@ -2007,7 +2007,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::TableAdding</name>
+    <name>zandor::designer::TableAdding</name>
     <message>
         <source>Arrange tables</source>
         <translation>Organizar las tablas</translation>
@@ -2042,7 +2042,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::TableListModel</name>
+    <name>zandor::designer::TableListModel</name>
     <message>
         <source>%1, view</source>
         <translation>%1, vista</translation>
@@ -2053,7 +2053,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::TableTip</name>
+    <name>zandor::designer::TableTip</name>
     <message>
         <source>%1 (view)</source>
         <translation>%1 (vista)</translation>
@@ -2064,7 +2064,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::TablesPanel</name>
+    <name>zandor::designer::TablesPanel</name>
     <message>
         <source>Filter tables</source>
         <translation>Filtrar tablas</translation>
@@ -2107,7 +2107,7 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::TextsPage</name>
+    <name>zandor::designer::TextsPage</name>
     <message>
         <source>Where it is used</source>
         <translation>Dónde se usa</translation>
@@ -2130,14 +2130,14 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
-    <name>designer::Waiting</name>
+    <name>zandor::designer::Waiting</name>
     <message>
         <source>Cancel</source>
         <translation>Cancelar</translation>
     </message>
 </context>
 <context>
-    <name>designer::shell</name>
+    <name>zandor::designer::shell</name>
     <message>
         <source>Password for %1: </source>
         <translation>Contraseña para %1: </translation>

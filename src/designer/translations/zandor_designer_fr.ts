@@ -797,7 +797,7 @@
     </message>
 </context>
 <context>
-    <name>designer</name>
+    <name>zandor::designer</name>
     <message>
         <source>There is nothing to draw; add a table first.</source>
         <translation>Il n’y a rien à dessiner&#xa0;; ajoutez d’abord une table.</translation>
@@ -832,28 +832,28 @@
     </message>
 </context>
 <context>
-    <name>designer::Autosave</name>
+    <name>zandor::designer::Autosave</name>
     <message>
         <source>The changes cannot be kept safe in &quot;%1&quot; (%2); save the query yourself.</source>
         <translation>Les modifications ne peuvent pas être mises en sûreté dans «&#xa0;%1&#xa0;» (%2)&#xa0;; enregistrez vous-même la requête.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Banner</name>
+    <name>zandor::designer::Banner</name>
     <message>
         <source>Close</source>
         <translation>Fermer</translation>
     </message>
 </context>
 <context>
-    <name>designer::CellReader</name>
+    <name>zandor::designer::CellReader</name>
     <message>
         <source>(outside the calendar)</source>
         <translation>(hors calendrier)</translation>
     </message>
 </context>
 <context>
-    <name>designer::ConnectionBanner</name>
+    <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
         <translation>&amp;Reconnecter</translation>
@@ -876,7 +876,7 @@
     </message>
 </context>
 <context>
-    <name>designer::ConnectionDialog</name>
+    <name>zandor::designer::ConnectionDialog</name>
     <message>
         <source>Open database</source>
         <translation>Ouvrir une base de données</translation>
@@ -955,7 +955,7 @@
     </message>
 </context>
 <context>
-    <name>designer::DatabaseCommands</name>
+    <name>zandor::designer::DatabaseCommands</name>
     <message>
         <source>Open SQLite &amp;file…</source>
         <translation>Ouvrir un &amp;fichier SQLite…</translation>
@@ -1002,7 +1002,7 @@
     </message>
 </context>
 <context>
-    <name>designer::DesignerWindow</name>
+    <name>zandor::designer::DesignerWindow</name>
     <message>
         <source>Tables</source>
         <translation>Tables</translation>
@@ -1157,7 +1157,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
-    <name>designer::Document</name>
+    <name>zandor::designer::Document</name>
     <message>
         <source>&amp;Undo</source>
         <translation>&amp;Annuler</translation>
@@ -1168,7 +1168,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
-    <name>designer::EventPanel</name>
+    <name>zandor::designer::EventPanel</name>
     <message>
         <source>Time</source>
         <translation>Heure</translation>
@@ -1219,14 +1219,14 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
-    <name>designer::EventWords</name>
+    <name>zandor::designer::EventWords</name>
     <message>
         <source>(gone)</source>
         <translation>(supprimé)</translation>
     </message>
 </context>
 <context>
-    <name>designer::FileDialogs</name>
+    <name>zandor::designer::FileDialogs</name>
     <message>
         <source>Zandor queries (*.json)</source>
         <translation>Requêtes Zandor (*.json)</translation>
@@ -1305,7 +1305,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
-    <name>designer::FlagsPage</name>
+    <name>zandor::designer::FlagsPage</name>
     <message>
         <source>Join types offered</source>
         <translation>Types de jointure proposés</translation>
@@ -1320,7 +1320,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
-    <name>designer::HelpWindow</name>
+    <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
         <translation>Aide</translation>
@@ -1339,7 +1339,7 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
-    <name>designer::Invitation</name>
+    <name>zandor::designer::Invitation</name>
     <message>
         <source>Drag a table here from the list of tables, or double-click it there.
 Then drag its columns into the grid below.</source>
@@ -1352,21 +1352,21 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::MissingTables</name>
+    <name>zandor::designer::MissingTables</name>
     <message>
         <source>There is no table &quot;%1&quot; in %2.</source>
         <translation>Il n’y a pas de table «&#xa0;%1&#xa0;» dans %2.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Opening</name>
+    <name>zandor::designer::Opening</name>
     <message>
         <source>Connecting to %1…</source>
         <translation>Connexion à %1…</translation>
     </message>
 </context>
 <context>
-    <name>designer::OptionsDialog</name>
+    <name>zandor::designer::OptionsDialog</name>
     <message>
         <source>The entries of the context menu that are shown:</source>
         <translation>Entrées affichées dans le menu contextuel&#xa0;:</translation>
@@ -1401,7 +1401,7 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::ParameterDialog</name>
+    <name>zandor::designer::ParameterDialog</name>
     <message>
         <source>Values for the query</source>
         <translation>Valeurs pour la requête</translation>
@@ -1416,7 +1416,7 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::PasswordPrompt</name>
+    <name>zandor::designer::PasswordPrompt</name>
     <message>
         <source>Password</source>
         <translation>Mot de passe</translation>
@@ -1435,14 +1435,14 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::QueryFile</name>
+    <name>zandor::designer::QueryFile</name>
     <message>
         <source>Untitled</source>
         <translation>Sans titre</translation>
     </message>
 </context>
 <context>
-    <name>designer::Question</name>
+    <name>zandor::designer::Question</name>
     <message>
         <source>a pattern: * for any characters, ? for one</source>
         <translation>un motif&#xa0;: * pour des caractères quelconques,&#xa0;? pour un seul</translation>
@@ -1477,7 +1477,7 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::RecentMenu</name>
+    <name>zandor::designer::RecentMenu</name>
     <message>
         <source>Open &amp;recent</source>
         <translation>&amp;Récents</translation>
@@ -1488,7 +1488,7 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::Recovery</name>
+    <name>zandor::designer::Recovery</name>
     <message>
         <source>A query was drawn and never saved.</source>
         <translation>Une requête a été dessinée et jamais enregistrée.</translation>
@@ -1515,7 +1515,7 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::RenameDialog</name>
+    <name>zandor::designer::RenameDialog</name>
     <message>
         <source>Rename table</source>
         <translation>Renommer la table</translation>
@@ -1550,7 +1550,7 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
-    <name>designer::ResultModel</name>
+    <name>zandor::designer::ResultModel</name>
     <message>
         <source>(blob, %1 bytes)</source>
         <translation>(blob, %1 octets)</translation>
@@ -1563,7 +1563,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::ResultTable</name>
+    <name>zandor::designer::ResultTable</name>
     <message>
         <source>&amp;Copy</source>
         <translation>&amp;Copier</translation>
@@ -1590,7 +1590,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::ResultsPanel</name>
+    <name>zandor::designer::ResultsPanel</name>
     <message>
         <source>These are too many cells to copy; export the rows instead.</source>
         <translation>Ces cellules sont trop nombreuses pour être copiées&#xa0;; exportez plutôt les lignes.</translation>
@@ -1745,7 +1745,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::ShowCommands</name>
+    <name>zandor::designer::ShowCommands</name>
     <message>
         <source>&amp;Export drawing…</source>
         <translation>E&amp;xporter le dessin…</translation>
@@ -1792,7 +1792,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::Spool</name>
+    <name>zandor::designer::Spool</name>
     <message>
         <source>No file for the rows can be made in &quot;%1&quot; (%2): set TMPDIR to a folder that you may write to.</source>
         <translation>Impossible de créer un fichier pour les lignes dans «&#xa0;%1&#xa0;» (%2)&#xa0;: donnez à TMPDIR un dossier où vous pouvez écrire.</translation>
@@ -1803,7 +1803,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::StatementPanel</name>
+    <name>zandor::designer::StatementPanel</name>
     <message>
         <source>The dialect of SQL that the statement is written in</source>
         <translation>Le dialecte SQL dans lequel l’instruction est écrite</translation>
@@ -1854,7 +1854,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::StepName</name>
+    <name>zandor::designer::StepName</name>
     <message>
         <source>Change the query</source>
         <translation>Modifier la requête</translation>
@@ -2007,7 +2007,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::TableAdding</name>
+    <name>zandor::designer::TableAdding</name>
     <message>
         <source>Arrange tables</source>
         <translation>Disposer les tables</translation>
@@ -2042,7 +2042,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::TableListModel</name>
+    <name>zandor::designer::TableListModel</name>
     <message>
         <source>%1, view</source>
         <translation>%1, vue</translation>
@@ -2053,7 +2053,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::TableTip</name>
+    <name>zandor::designer::TableTip</name>
     <message>
         <source>%1 (view)</source>
         <translation>%1 (vue)</translation>
@@ -2064,7 +2064,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::TablesPanel</name>
+    <name>zandor::designer::TablesPanel</name>
     <message>
         <source>Filter tables</source>
         <translation>Filtrer les tables</translation>
@@ -2107,7 +2107,7 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::TextsPage</name>
+    <name>zandor::designer::TextsPage</name>
     <message>
         <source>Where it is used</source>
         <translation>Où il est utilisé</translation>
@@ -2130,14 +2130,14 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
-    <name>designer::Waiting</name>
+    <name>zandor::designer::Waiting</name>
     <message>
         <source>Cancel</source>
         <translation>Annuler</translation>
     </message>
 </context>
 <context>
-    <name>designer::shell</name>
+    <name>zandor::designer::shell</name>
     <message>
         <source>Password for %1: </source>
         <translation>Mot de passe pour %1&#xa0;: </translation>

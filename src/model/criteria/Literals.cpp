@@ -1,10 +1,10 @@
 #include "model/criteria/Literals.h"
 
-#include "model/Names.h"
+#include <Zandor/model/Names.h>
 
 #include <array>
 
-namespace model::criteria {
+namespace zandor::model::criteria {
 
 namespace {
 
@@ -256,4 +256,4 @@ String likePattern(StringView typed) {
     return out;
 }
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

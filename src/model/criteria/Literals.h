@@ -1,11 +1,11 @@
 #pragma once
 
-#include "model/sql/Expression.h"
+#include <Zandor/sql/Expression.h>
 
 #include <optional>
 
 /// Values as people type them.
-namespace model::criteria {
+namespace zandor::model::criteria {
 
 /// What a value of a type is called in a message: "a number", "a date (2024-12-31)".
 StringView nameOf(ColumnType type);
@@ -31,4 +31,4 @@ bool comparable(ColumnType left, ColumnType right);
 /// [*] for the character itself, in the form that sql::Like keeps.
 String likePattern(StringView typed);
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

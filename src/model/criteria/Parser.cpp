@@ -1,11 +1,12 @@
 #include "model/criteria/Parser.h"
 
-#include "model/Table.h"
 #include "model/criteria/Literals.h"
+
+#include <Zandor/model/Table.h>
 
 #include <algorithm>
 
-namespace model::criteria {
+namespace zandor::model::criteria {
 
 using sql::Node;
 
@@ -405,4 +406,4 @@ Reading read(StringView text, const sql::ColumnRef& subject, const Resolver& res
         .read();
 }
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

@@ -1,14 +1,15 @@
 #pragma once
 
-#include "model/criteria/References.h"
 #include "model/criteria/Tokens.h"
-#include "model/sql/Expression.h"
+
+#include <Zandor/model/References.h>
+#include <Zandor/sql/Expression.h>
 
 #include <optional>
 
 /// The language of criteria as people type them into a cell: a value, or a comparison, or several
 /// of them with And, Or and Not.
-namespace model::criteria {
+namespace zandor::model::criteria {
 
 /// A column as it stands in the statement.
 sql::ColumnRef columnRef(const Column& column, const Table& table);
@@ -39,4 +40,4 @@ struct Reading {
 Reading read(StringView text, const sql::ColumnRef& subject, const Resolver& resolver,
              const References& known = {});
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

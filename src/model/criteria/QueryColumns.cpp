@@ -1,6 +1,6 @@
 #include "model/criteria/QueryColumns.h"
 
-namespace model::criteria {
+namespace zandor::model::criteria {
 
 namespace {
 
@@ -28,4 +28,4 @@ std::vector<NamedColumn> QueryColumns::columnsNamed(StringView column) const {
     return found;
 }
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

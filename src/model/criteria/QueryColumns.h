@@ -1,9 +1,10 @@
 #pragma once
 
-#include "model/Table.h"
 #include "model/criteria/Parser.h"
 
-namespace model::criteria {
+#include <Zandor/model/Table.h>
+
+namespace zandor::model::criteria {
 
 /// The columns that criteria of one query may name: those of its tables.
 class QueryColumns final : public Resolver {
@@ -19,4 +20,4 @@ private:
     const TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& mTables;
 };
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

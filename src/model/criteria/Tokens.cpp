@@ -1,11 +1,11 @@
 #include "model/criteria/Tokens.h"
 
-#include "model/Names.h"
+#include <Zandor/model/Names.h>
 
 #include <algorithm>
 #include <optional>
 
-namespace model::criteria {
+namespace zandor::model::criteria {
 
 namespace {
 
@@ -168,4 +168,4 @@ bool isKeyword(const Token& token, StringView keyword) {
     return token.kind == TokenKind::word && sameName(token.text, keyword);
 }
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

@@ -1,11 +1,11 @@
 #pragma once
 
-#include "model/Description.h"
+#include <Zandor/model/Description.h>
 
 #include <variant>
 #include <vector>
 
-namespace model::criteria {
+namespace zandor::model::criteria {
 
 /// Why a criterion is no criterion. Positions count UTF-16 code units from 0.
 struct Error {
@@ -48,4 +48,4 @@ bool isBareName(StringView text);
 /// Whether a word is this keyword; letters count without regard to case.
 bool isKeyword(const Token& token, StringView keyword);
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

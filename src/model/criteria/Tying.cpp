@@ -1,8 +1,8 @@
 #include "model/criteria/Tying.h"
 
-#include "model/Table.h"
+#include <Zandor/model/Table.h>
 
-namespace model::criteria {
+namespace zandor::model::criteria {
 
 namespace {
 
@@ -55,4 +55,4 @@ void followNames(const ColumnDefinition& definition) {
     for (const auto& [row, criterium] : definition.criteria().rows()) followNames(*criterium);
 }
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

@@ -1,9 +1,10 @@
 #pragma once
 
-#include "model/ColumnDefinition.h"
 #include "model/criteria/Parser.h"
 
-namespace model::criteria {
+#include <Zandor/model/ColumnDefinition.h>
+
+namespace zandor::model::criteria {
 
 /// Ties the names in a definition's criteria to the columns that they name now. To be called
 /// before the tables of the query change; names that are tied already stay so.
@@ -13,4 +14,4 @@ void tie(const ColumnDefinition& definition, const Resolver& resolver);
 /// to have another name now.
 void followNames(const ColumnDefinition& definition);
 
-} // namespace model::criteria
+} // namespace zandor::model::criteria

@@ -4,7 +4,7 @@
 
 #include <cerrno>
 
-namespace files {
+namespace zandor::files {
 
 bool Descriptor::close() { return mNumber < 0 || ::close(std::exchange(mNumber, -1)) == 0; }
 
@@ -18,4 +18,4 @@ bool writeAll(int file, std::string_view bytes) {
     return true;
 }
 
-} // namespace files
+} // namespace zandor::files

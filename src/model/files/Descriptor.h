@@ -3,7 +3,7 @@
 #include <string_view>
 #include <utility>
 
-namespace files {
+namespace zandor::files {
 
 /// An open file by the system's number, closed when the object goes.
 class Descriptor {
@@ -28,4 +28,4 @@ private:
 /// Writes all of it; otherwise false, and why is in errno.
 bool writeAll(int file, std::string_view bytes);
 
-} // namespace files
+} // namespace zandor::files

@@ -1,9 +1,9 @@
-#include "model/files/Error.h"
+#include <Zandor/files/Error.h>
 
 #include <cerrno>
 #include <cstring>
 
-namespace files {
+namespace zandor::files {
 
 namespace {
 
@@ -36,4 +36,4 @@ std::string quoted(const Path& path) {
     return '"' + name + '"';
 }
 
-} // namespace files
+} // namespace zandor::files

@@ -4,7 +4,7 @@
 
 #include <algorithm>
 
-namespace files::json {
+namespace zandor::files::json {
 
 namespace {
 
@@ -113,4 +113,4 @@ std::string print(const Value& value) {
     return text;
 }
 
-} // namespace files::json
+} // namespace zandor::files::json

@@ -6,7 +6,7 @@
 #include <vector>
 
 /// JSON as a tree that loses nothing: members keep their order, numbers their digits.
-namespace files::json {
+namespace zandor::files::json {
 
 struct Value;
 struct Member;
@@ -37,4 +37,4 @@ Value number(std::int64_t value);
 /// written as they stand, in UTF-8. Ends with a line end.
 std::string print(const Value& value);
 
-} // namespace files::json
+} // namespace zandor::files::json

@@ -8,7 +8,7 @@
 #include <algorithm>
 #include <unordered_set>
 
-namespace files::json {
+namespace zandor::files::json {
 
 namespace {
 
@@ -158,4 +158,4 @@ Value read(std::string_view text) {
     return builder.result();
 }
 
-} // namespace files::json
+} // namespace zandor::files::json

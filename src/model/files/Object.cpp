@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <charconv>
 
-namespace files {
+namespace zandor::files {
 
 namespace {
 
@@ -113,4 +113,4 @@ std::optional<std::int64_t> wholeNumber(const json::Value& value, std::int64_t l
     return result;
 }
 
-} // namespace files
+} // namespace zandor::files

@@ -2,14 +2,15 @@
 
 #include "model/files/Json.h"
 #include "model/files/Refusal.h"
-#include "platform/String.h"
+
+#include <Zandor/platform/String.h>
 
 #include <cstdint>
 #include <limits>
 #include <optional>
 #include <span>
 
-namespace files {
+namespace zandor::files {
 
 /// A word of the file for each value of a code that counts from 0.
 using Words = std::span<const std::string_view>;
@@ -59,4 +60,4 @@ std::int16_t codeOf(const std::string& word, Words words, const Pointer& place);
 std::optional<std::int64_t> wholeNumber(const json::Value& value, std::int64_t least,
                                         std::int64_t greatest);
 
-} // namespace files
+} // namespace zandor::files

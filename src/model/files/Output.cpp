@@ -1,10 +1,10 @@
-#include "model/files/Output.h"
+#include <Zandor/files/Output.h>
 
 #include "model/files/Descriptor.h"
 
 #include <cerrno>
 
-namespace files {
+namespace zandor::files {
 
 std::optional<Error> Stream::write(std::string_view bytes) {
     if (mFailure) return mFailure;
@@ -18,4 +18,4 @@ std::optional<Error> Stream::flush() {
     return mFailure;
 }
 
-} // namespace files
+} // namespace zandor::files

@@ -1,6 +1,6 @@
 #include "model/files/Refusal.h"
 
-namespace files {
+namespace zandor::files {
 
 Pointer Pointer::operator/(std::string_view name) const {
     Pointer result;
@@ -38,4 +38,4 @@ void refuse(const Pointer& place, const std::string& reason, const std::string& 
     throw Refusal{place.text() + ' ' + reason, advice};
 }
 
-} // namespace files
+} // namespace zandor::files

@@ -3,7 +3,7 @@
 #include <string>
 #include <string_view>
 
-namespace files {
+namespace zandor::files {
 
 /// Thrown within the reading and writing of a file, and made an error there: what is wrong and
 /// where, and what to do about it.
@@ -34,4 +34,4 @@ std::string shown(std::string_view text);
 [[noreturn]] void refuse(const Pointer& place, const std::string& reason,
                          const std::string& advice = mendIt);
 
-} // namespace files
+} // namespace zandor::files

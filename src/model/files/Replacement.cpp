@@ -1,4 +1,4 @@
-#include "model/files/Replacement.h"
+#include <Zandor/files/Replacement.h>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -9,7 +9,7 @@
 #include <random>
 #include <system_error>
 
-namespace files {
+namespace zandor::files {
 
 namespace {
 
@@ -91,4 +91,4 @@ std::optional<Error> replaceFile(const Path& path, std::string_view content) {
     return file.commit();
 }
 
-} // namespace files
+} // namespace zandor::files

@@ -4,7 +4,7 @@
 
 #include <map>
 
-namespace files {
+namespace zandor::files {
 
 /// Members of the file that this version does not know, by the object that they stand in: "" the
 /// file itself, "lastKeys", then by keys "t1", "t1/source", "t1/place", "c1", "j1", "j1/left",
@@ -13,4 +13,4 @@ struct Unknown {
     std::map<std::string, json::Members> membersOf = {};
 };
 
-} // namespace files
+} // namespace zandor::files

@@ -1,7 +1,8 @@
 #include "model/files/Descriptor.h"
-#include "model/files/QueryDocument.h"
-#include "model/files/Replacement.h"
 #include "model/files/limits.h"
+
+#include <Zandor/QueryDocument.h>
+#include <Zandor/files/Replacement.h>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -9,7 +10,7 @@
 
 #include <cerrno>
 
-namespace files {
+namespace zandor::files {
 
 namespace {
 
@@ -52,4 +53,4 @@ Result<QueryDocument> loadQuery(const Path& path) {
     return document;
 }
 
-} // namespace files
+} // namespace zandor::files

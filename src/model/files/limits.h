@@ -4,7 +4,7 @@
 
 /// What a query file may have. The counts are far above what a person draws, and low enough that
 /// no file takes long or much memory.
-namespace files::limits {
+namespace zandor::files::limits {
 
 inline constexpr std::size_t fileSize = 64 * 1024 * 1024; ///< bytes
 inline constexpr std::size_t depth = 64;                  ///< arrays and objects within each other
@@ -16,4 +16,4 @@ inline constexpr std::size_t columns = 100'000; ///< of all tables
 inline constexpr std::size_t joins = 10'000;
 inline constexpr std::size_t definitions = 10'000;
 
-} // namespace files::limits
+} // namespace zandor::files::limits

@@ -1,13 +1,14 @@
 #include "model/files/migrations.h"
 
-#include "model/Record.h"
-#include "model/files/QueryDocument.h"
 #include "model/files/words.h"
+
+#include <Zandor/QueryDocument.h>
+#include <Zandor/model/Record.h>
 
 #include <algorithm>
 #include <array>
 
-namespace files {
+namespace zandor::files {
 
 namespace {
 
@@ -76,4 +77,4 @@ void migrate(json::Members& file, int version) {
         steps[step](file);
 }
 
-} // namespace files
+} // namespace zandor::files

@@ -1,14 +1,15 @@
 #include "model/files/JsonReader.h"
-#include "model/files/QueryDocument.h"
 #include "model/files/Unknown.h"
 #include "model/files/limits.h"
 #include "model/files/migrations.h"
 #include "model/files/words.h"
 
+#include <Zandor/QueryDocument.h>
+
 #include <algorithm>
 #include <functional>
 
-namespace files {
+namespace zandor::files {
 
 namespace {
 
@@ -201,4 +202,4 @@ Result<QueryDocument> fromJson(std::string_view text) {
     }
 }
 
-} // namespace files
+} // namespace zandor::files

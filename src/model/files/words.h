@@ -5,7 +5,7 @@
 #include <array>
 
 /// The words of the file, in the order of the codes that they stand for.
-namespace files::words {
+namespace zandor::files::words {
 
 inline constexpr std::string_view format = "zandor-query";
 
@@ -16,4 +16,4 @@ inline constexpr std::array<std::string_view, 4> joinTypes = {"inner", "left", "
 inline constexpr std::array<std::string_view, 6> comparisons = {"=", "<>", "<", ">", "<=", ">="};
 inline constexpr std::array<std::string_view, 3> sortOrders = {"none", "ascending", "descending"};
 
-} // namespace files::words
+} // namespace zandor::files::words

@@ -1,9 +1,10 @@
-#include "model/files/QueryDocument.h"
 #include "model/files/Unknown.h"
 #include "model/files/limits.h"
 #include "model/files/words.h"
 
-namespace files {
+#include <Zandor/QueryDocument.h>
+
+namespace zandor::files {
 
 namespace {
 
@@ -182,4 +183,4 @@ Result<std::string> toJson(const QueryDocument& document) {
     return text;
 }
 
-} // namespace files
+} // namespace zandor::files

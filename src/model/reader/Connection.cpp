@@ -1,4 +1,4 @@
-#include "model/reader/Connection.h"
+#include <Zandor/reader/Connection.h>
 
 #include "model/reader/sqliteError.h"
 
@@ -8,7 +8,7 @@
 #include <QSqlQuery>
 #include <QUuid>
 
-namespace reader {
+namespace zandor::reader {
 
 namespace {
 
@@ -77,4 +77,4 @@ bool answers(const Connection& connection) {
     return QSqlQuery(connection.database()).exec(QStringLiteral("SELECT 1"));
 }
 
-} // namespace reader
+} // namespace zandor::reader

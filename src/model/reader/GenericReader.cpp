@@ -1,7 +1,7 @@
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
 
-#include "model/Names.h"
-#include "model/reader/rows.h"
+#include <Zandor/model/Names.h>
+#include <Zandor/reader/rows.h>
 
 #include <QSqlDriver>
 #include <QSqlField>
@@ -10,7 +10,7 @@
 
 #include <algorithm>
 
-namespace reader {
+namespace zandor::reader {
 
 namespace {
 
@@ -110,4 +110,4 @@ std::unique_ptr<DatabaseReader> makeReader(const QSqlDatabase& database) {
     }
 }
 
-} // namespace reader
+} // namespace zandor::reader

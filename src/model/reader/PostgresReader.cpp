@@ -1,9 +1,10 @@
-#include "model/reader/DatabaseReader.h"
+#include <Zandor/DatabaseReader.h>
 
 #include "model/reader/columnType.h"
-#include "model/reader/rows.h"
 
-namespace reader {
+#include <Zandor/reader/rows.h>
+
+namespace zandor::reader {
 
 namespace {
 
@@ -153,4 +154,4 @@ std::unique_ptr<DatabaseReader> makePostgresReader(const QSqlDatabase& database)
     return std::make_unique<PostgresReader>(database);
 }
 
-} // namespace reader
+} // namespace zandor::reader

@@ -1,12 +1,12 @@
-#include "model/reader/addTables.h"
+#include <Zandor/reader/addTables.h>
 
-#include "model/Layout.h"
-#include "model/Names.h"
+#include <Zandor/model/Layout.h>
+#include <Zandor/model/Names.h>
 
 #include <algorithm>
 #include <optional>
 
-namespace reader {
+namespace zandor::reader {
 
 using model::layout::Box;
 using platform::Each;
@@ -190,4 +190,4 @@ Result<TableList> addTables(model::Query& query, DatabaseReader& reader,
     return added;
 }
 
-} // namespace reader
+} // namespace zandor::reader

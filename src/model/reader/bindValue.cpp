@@ -1,8 +1,8 @@
-#include "model/reader/bindValue.h"
+#include <Zandor/reader/bindValue.h>
 
 #include <QString>
 
-namespace reader {
+namespace zandor::reader {
 
 QVariant bindValue(const model::sql::Value& value, model::sql::Dialect dialect) {
     using model::ColumnType;
@@ -18,4 +18,4 @@ QVariant bindValue(const model::sql::Value& value, model::sql::Dialect dialect) 
     return text;
 }
 
-} // namespace reader
+} // namespace zandor::reader

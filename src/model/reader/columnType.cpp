@@ -5,7 +5,7 @@
 #include <string>
 #include <utility>
 
-namespace reader {
+namespace zandor::reader {
 
 using model::ColumnType;
 
@@ -85,4 +85,4 @@ ColumnType columnType(platform::StringView declared) {
     return ColumnType::Unknown;
 }
 
-} // namespace reader
+} // namespace zandor::reader

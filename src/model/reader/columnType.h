@@ -1,11 +1,11 @@
 #pragma once
 
-#include "model/Description.h"
+#include <Zandor/model/Description.h>
 
-namespace reader {
+namespace zandor::reader {
 
 /// What a type means that a database declares for a column: "VARCHAR(40)", "bigint", "TIMESTAMP
 /// WITH TIME ZONE". An unknown word is judged by SQLite's rules of affinity.
 model::ColumnType columnType(platform::StringView declared);
 
-} // namespace reader
+} // namespace zandor::reader

@@ -1,6 +1,6 @@
-#include "model/reader/dialectOf.h"
+#include <Zandor/reader/dialectOf.h>
 
-namespace reader {
+namespace zandor::reader {
 
 model::sql::Dialect dialectOf(const QSqlDatabase& database) {
     using model::sql::Dialect;
@@ -10,4 +10,4 @@ model::sql::Dialect dialectOf(const QSqlDatabase& database) {
     return driver == QLatin1String("QSQLITE") ? Dialect::SQLite : Dialect::Standard;
 }
 
-} // namespace reader
+} // namespace zandor::reader

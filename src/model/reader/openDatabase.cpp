@@ -1,7 +1,8 @@
-#include "model/reader/Connection.h"
+#include <Zandor/reader/Connection.h>
 
-#include "model/reader/rows.h"
 #include "model/reader/serverError.h"
+
+#include <Zandor/reader/rows.h>
 
 #include <QSqlQuery>
 #include <QUrl>
@@ -12,7 +13,7 @@
 #include <array>
 #include <optional>
 
-namespace reader {
+namespace zandor::reader {
 
 namespace {
 
@@ -123,4 +124,4 @@ Result<Connection> openDatabase(const QString& address, const QString& password)
     return openServer(*engine, url, password);
 }
 
-} // namespace reader
+} // namespace zandor::reader

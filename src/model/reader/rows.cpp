@@ -1,9 +1,9 @@
-#include "model/reader/rows.h"
+#include <Zandor/reader/rows.h>
 
 #include "model/reader/serverError.h"
 #include "model/reader/sqliteError.h"
 
-namespace reader {
+namespace zandor::reader {
 
 QString toQt(const platform::String& text) { return QString::fromStdU16String(text); }
 
@@ -38,4 +38,4 @@ Error databaseError(const QSqlDatabase& database, const QString& failed, const Q
     return serverError(failed, error);
 }
 
-} // namespace reader
+} // namespace zandor::reader

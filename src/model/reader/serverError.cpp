@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <array>
 
-namespace reader {
+namespace zandor::reader {
 
 namespace {
 
@@ -53,4 +53,4 @@ bool asksForPassword(const QString& message) {
                        [&](QLatin1String each) { return message.contains(each); });
 }
 
-} // namespace reader
+} // namespace zandor::reader

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "model/reader/Result.h"
+#include <Zandor/reader/Result.h>
 
 #include <QSqlError>
 
-namespace reader {
+namespace zandor::reader {
 
 /// An error of an engine behind a network: its own words in one line, and what to do about it as
 /// far as the words tell. `failed` is what could not be done, without a full stop.
@@ -13,4 +13,4 @@ Error serverError(const QString& failed, const QSqlError& error);
 /// Whether a message of openDatabase says that the server wants a password, or another one.
 bool asksForPassword(const QString& message);
 
-} // namespace reader
+} // namespace zandor::reader

@@ -1,6 +1,6 @@
 #include "model/reader/sqliteError.h"
 
-namespace reader {
+namespace zandor::reader {
 
 namespace {
 
@@ -28,4 +28,4 @@ Error sqliteError(const QString& failed, const QSqlError& error) {
                      advice(error.nativeErrorCode().toInt()))};
 }
 
-} // namespace reader
+} // namespace zandor::reader

@@ -1,13 +1,13 @@
 #pragma once
 
-#include "model/reader/Result.h"
+#include <Zandor/reader/Result.h>
 
 #include <QSqlError>
 
-namespace reader {
+namespace zandor::reader {
 
 /// `failed` is what could not be done, without a full stop; the driver's words and what to do about
 /// it are put behind.
 Error sqliteError(const QString& failed, const QSqlError& error);
 
-} // namespace reader
+} // namespace zandor::reader

@@ -1,14 +1,15 @@
-#include "model/sql/Builder.h"
+#include <Zandor/sql/Builder.h>
 
-#include "model/Names.h"
 #include "model/criteria/QueryColumns.h"
 #include "model/sql/JoinTrees.h"
 #include "model/sql/NameCheck.h"
 
+#include <Zandor/model/Names.h>
+
 #include <algorithm>
 #include <map>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 namespace {
 
@@ -163,4 +164,4 @@ bool Text::runnable() const {
                                          [](const Finding& finding) { return finding.isError(); });
 }
 
-} // namespace model::sql
+} // namespace zandor::model::sql

@@ -1,10 +1,10 @@
-#include "model/sql/Dialect.h"
+#include <Zandor/sql/Dialect.h>
 
 #include "model/sql/ReservedWords.h"
 
 #include <algorithm>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 namespace {
 
@@ -175,4 +175,4 @@ String placeholder(ColumnType type, Dialect dialect) {
     return u"?";
 }
 
-} // namespace model::sql
+} // namespace zandor::model::sql

@@ -1,6 +1,6 @@
-#include "model/sql/Expression.h"
+#include <Zandor/sql/Expression.h>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 namespace {
 
@@ -23,4 +23,4 @@ Node joined(std::vector<Node> terms) {
 Node allOf(std::vector<Node> terms) { return joined<And>(std::move(terms)); }
 Node anyOf(std::vector<Node> terms) { return joined<Or>(std::move(terms)); }
 
-} // namespace model::sql
+} // namespace zandor::model::sql

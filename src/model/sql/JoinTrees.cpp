@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <numeric>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 namespace {
 
@@ -349,4 +349,4 @@ private:
 
 JoinTrees joinTrees(Query& query, Findings& findings) { return Joiner(query, findings).run(); }
 
-} // namespace model::sql
+} // namespace zandor::model::sql

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "model/Finding.h"
-#include "model/Query.h"
-#include "model/sql/Statement.h"
+#include <Zandor/Query.h>
+#include <Zandor/model/Finding.h>
+#include <Zandor/sql/Statement.h>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 /// The tables of a query joined as drawn: one tree for each set of tables that joins reach.
 struct JoinTrees {
@@ -24,4 +24,4 @@ struct JoinTrees {
 /// leave open which rows are kept, and for tables that no join reaches.
 JoinTrees joinTrees(Query& query, Findings& findings);
 
-} // namespace model::sql
+} // namespace zandor::model::sql

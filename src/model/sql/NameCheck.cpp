@@ -1,6 +1,6 @@
 #include "model/sql/NameCheck.h"
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 namespace {
 
@@ -50,4 +50,4 @@ Findings uncarriedNames(Query& query, Dialect dialect) {
     return findings;
 }
 
-} // namespace model::sql
+} // namespace zandor::model::sql

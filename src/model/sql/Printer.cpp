@@ -4,7 +4,7 @@
 
 #include <algorithm>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 namespace {
 
@@ -372,4 +372,4 @@ std::variant<Printed, Refusal> print(const Statement& statement, Dialect dialect
     }
 }
 
-} // namespace model::sql
+} // namespace zandor::model::sql

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "model/sql/Dialect.h"
+#include <Zandor/sql/Dialect.h>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 /// Whether values leave beside the statement, for running it, or within it, for showing it.
 enum class ValueForm { bound, literal };
@@ -27,4 +27,4 @@ struct Refusal {
 /// The statement in a dialect, one clause a line. The same statement gives the same text.
 std::variant<Printed, Refusal> print(const Statement& statement, Dialect dialect, ValueForm form);
 
-} // namespace model::sql
+} // namespace zandor::model::sql

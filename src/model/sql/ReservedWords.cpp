@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <iterator>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 namespace {
 
@@ -108,4 +108,4 @@ bool isReserved(platform::StringView word) {
     return std::binary_search(std::begin(words), std::end(words), platform::StringView(lower));
 }
 
-} // namespace model::sql
+} // namespace zandor::model::sql

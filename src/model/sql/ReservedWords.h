@@ -1,11 +1,11 @@
 #pragma once
 
-#include "platform/String.h"
+#include <Zandor/platform/String.h>
 
-namespace model::sql {
+namespace zandor::model::sql {
 
 /// Whether a word is reserved in any of the dialects. One list for all: a name in needless quotes
 /// reads the same, one without the quotes it needs does not.
 bool isReserved(platform::StringView word);
 
-} // namespace model::sql
+} // namespace zandor::model::sql

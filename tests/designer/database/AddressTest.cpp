@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace zandor;
+
 using designer::Address;
 using designer::Engine;
 using designer::parseAddress;

@@ -15,6 +15,8 @@
 #include <QSqlDatabase>
 #include <QStandardItemModel>
 
+using namespace zandor;
+
 using designer::ConnectionDialog;
 using designer::Database;
 using designer::ErrorLine;

@@ -12,6 +12,8 @@
 #include <cstdio>
 #include <thread>
 
+using namespace zandor;
+
 using designer::Database;
 using reader::TableId;
 

@@ -7,6 +7,8 @@
 #include <QMimeData>
 #include <QUrl>
 
+using namespace zandor;
+
 namespace {
 
 std::optional<QString> dropped(const QList<QUrl>& urls) {

@@ -1,5 +1,5 @@
 #include "Answers.h"
-#include "reader/OneServer.h"
+#include "model/reader/OneServer.h"
 
 #include "designer/database/ConnectionBanner.h"
 #include "designer/database/opening.h"
@@ -11,6 +11,8 @@
 #include <QPushButton>
 #include <QToolButton>
 #include <QVBoxLayout>
+
+using namespace zandor;
 
 using designer::Database;
 

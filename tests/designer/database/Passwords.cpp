@@ -1,5 +1,5 @@
 #include "Answers.h"
-#include "reader/OneServer.h"
+#include "model/reader/OneServer.h"
 
 #include "designer/database/ConnectionDialog.h"
 #include "designer/database/Database.h"
@@ -17,6 +17,8 @@
 #include <QPushButton>
 #include <QSettings>
 #include <QStandardPaths>
+
+using namespace zandor;
 
 using designer::Database;
 using designer::PasswordPrompt;

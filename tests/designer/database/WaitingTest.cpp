@@ -16,6 +16,8 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+using namespace zandor;
+
 using designer::Database;
 using designer::Opening;
 

@@ -1,9 +1,11 @@
 #include "../OpenWindow.h"
-#include "reader/OneServer.h"
+#include "model/reader/OneServer.h"
 
 #include "designer/database/ConnectionBanner.h"
 
 #include <QLabel>
+
+using namespace zandor;
 
 namespace {
 

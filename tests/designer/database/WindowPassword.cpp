@@ -1,11 +1,13 @@
 #include "../OpenWindow.h"
-#include "reader/OneServer.h"
+#include "model/reader/OneServer.h"
 
 #include "designer/statement/StatementPanel.h"
 #include "designer/tables/TablesPanel.h"
 
 #include <QDirIterator>
 #include <QLabel>
+
+using namespace zandor;
 
 namespace {
 

@@ -13,6 +13,8 @@
 
 #include <csignal>
 
+using namespace zandor;
+
 namespace {
 
 using designer::Autosave;

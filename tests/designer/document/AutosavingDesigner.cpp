@@ -9,6 +9,8 @@
 
 #include <cstdio>
 
+using namespace zandor;
+
 // autosaving_designer FOLDER PATH TABLE [once-asked]: adds a table to a query that belongs to a
 // file, says "saved" when that was saved of itself, and goes on until it is killed. With the last
 // word it is not saved before somebody asks the program to end.

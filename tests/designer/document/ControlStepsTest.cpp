@@ -1,14 +1,16 @@
 #include "Drawing.h"
 
 #include "designer/DrawingArea.h"
-#include "platform/qt/GridModel.h"
-#include "platform/qt/GridWidget.h"
-#include "platform/qt/QtToolkit.h"
-#include "platform/qt/TabuletWidget.h"
+#include "frontends/qt/GridModel.h"
+#include "frontends/qt/GridWidget.h"
+#include "frontends/qt/QtToolkit.h"
+#include "frontends/qt/TabuletWidget.h"
 #include "support/QtHands.h"
 
 #include <QMenu>
 #include <QTimer>
+
+using namespace zandor;
 
 // What a user does on the control becomes steps.
 

@@ -1,7 +1,8 @@
 #pragma once
 
 #include "designer/document/Document.h"
-#include "model/Library.h"
+
+#include <Zandor/Library.h>
 
 #include <QCoreApplication>
 #include <QUndoStack>
@@ -10,36 +11,37 @@
 
 /// A document over a small query, and short ways to draw in it as the control does.
 struct Drawing {
-    using TableRef = platform::Ref<model::Table>;
-    using JoinRef = platform::Ref<TalvikZandorLib::ZDJoin>;
-    using DefinitionRef = platform::Ref<TalvikZandorLib::ZDColumnDefinition>;
+    using TableRef = zandor::platform::Ref<zandor::model::Table>;
+    using JoinRef = zandor::platform::Ref<TalvikZandorLib::ZDJoin>;
+    using DefinitionRef = zandor::platform::Ref<TalvikZandorLib::ZDColumnDefinition>;
 
     explicit Drawing(int tables = 2) {
-        const auto query = platform::makeRef<model::Query>();
+        const auto query = zandor::platform::makeRef<zandor::model::Query>();
         const std::u16string names[] = {u"customers", u"orders"};
         for (int n = 0; n < tables; ++n)
-            query->addTable(described(n < 2 ? names[n] : u"table" + platform::decimal(n)));
+            query->addTable(described(n < 2 ? names[n] : u"table" + zandor::platform::decimal(n)));
         document.setQuery(query);
     }
 
-    static model::TableDescription described(platform::String name) {
+    static zandor::model::TableDescription described(zandor::platform::String name) {
         return {u"",
                 std::move(name),
-                {{u"id", model::ColumnType::Integer, u"INTEGER", true},
-                 {u"status", model::ColumnType::Text, u"TEXT", false}}};
+                {{u"id", zandor::model::ColumnType::Integer, u"INTEGER", true},
+                 {u"status", zandor::model::ColumnType::Text, u"TEXT", false}}};
     }
 
-    model::Query& query() { return *document.query(); }
-    TableRef table(const platform::String& name) { return query().tableNamed(name); }
+    zandor::model::Query& query() { return *document.query(); }
+    TableRef table(const zandor::platform::String& name) { return query().tableNamed(name); }
 
-    JoinRef join(const platform::String& left, const platform::String& right) {
+    JoinRef join(const zandor::platform::String& left, const zandor::platform::String& right) {
         const auto join = library.NewZDJoin();
         join->LeftColumn(table(left)->columnNamed(u"id"));
         join->RightColumn(table(right)->columnNamed(u"id"));
         return query().AddJoin(join);
     }
 
-    DefinitionRef define(const platform::String& from, const platform::String& column) {
+    DefinitionRef define(const zandor::platform::String& from,
+                         const zandor::platform::String& column) {
         const auto definition = library.NewZDColumnDefinition();
         definition->Column(table(from)->columnNamed(column));
         return query().AddColumnDefinition(definition);
@@ -50,8 +52,8 @@ struct Drawing {
         return steps.index() == 0 ? QString() : steps.command(steps.index() - 1)->text();
     }
 
-    model::Library library;
-    designer::Document document;
+    zandor::model::Library library;
+    zandor::designer::Document document;
     QUndoStack& steps = document.steps();
 };
 

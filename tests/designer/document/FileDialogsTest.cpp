@@ -7,6 +7,8 @@
 
 #include <QTemporaryDir>
 
+using namespace zandor;
+
 namespace {
 
 class TheFileDialogs : public testing::Test {

@@ -11,6 +11,8 @@
 #include <fcntl.h>
 #include <sys/stat.h>
 
+using namespace zandor;
+
 namespace {
 
 using designer::QueryFile;

@@ -4,6 +4,8 @@
 
 #include <QFile>
 
+using namespace zandor;
+
 namespace {
 
 constexpr int mostBytes = 20 * 1024; // more than any buffer on the way

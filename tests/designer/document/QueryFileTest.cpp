@@ -5,6 +5,8 @@
 #include <QFile>
 #include <QTemporaryDir>
 
+using namespace zandor;
+
 namespace {
 
 using designer::QueryFile;

@@ -4,6 +4,8 @@
 #include <map>
 #include <random>
 
+using namespace zandor;
+
 namespace {
 
 /// Draws at random, through the interface that the control uses and through that of the panels.

@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace zandor;
+
 namespace {
 
 class RecentlyUsed : public testing::Test {

@@ -4,6 +4,8 @@
 
 #include <QAction>
 
+using namespace zandor;
+
 namespace {
 
 std::string text(const QString& name) { return name.toStdString(); }

@@ -14,6 +14,8 @@
 #include <QTextBrowser>
 #include <QTextTable>
 
+using namespace zandor;
+
 using designer::HelpWindow;
 using testing::HasSubstr;
 

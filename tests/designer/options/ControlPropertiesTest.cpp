@@ -11,6 +11,8 @@
 #include <QSettings>
 #include <QTemporaryDir>
 
+using namespace zandor;
+
 using designer::ControlOptions;
 using designer::ControlProperty;
 using testing::Contains;

@@ -2,7 +2,7 @@
 
 #include "designer/DrawingArea.h"
 #include "designer/document/Document.h"
-#include "platform/qt/ZandorWindowMessage.h"
+#include "frontends/qt/ZandorWindowMessage.h"
 #include "support/PublicInterface.h"
 #include "support/QtHands.h"
 
@@ -14,6 +14,8 @@
 #include <QRegularExpression>
 #include <QScrollBar>
 #include <QTreeWidget>
+
+using namespace zandor;
 
 using testing::ElementsAre;
 using Row = std::vector<std::string>;

@@ -9,6 +9,8 @@
 
 #include <set>
 
+using namespace zandor;
+
 using testing::HasSubstr;
 using testing::Not;
 

@@ -16,6 +16,8 @@
 #include <QTableWidget>
 #include <QTemporaryDir>
 
+using namespace zandor;
+
 using designer::ControlOptions;
 using designer::ControlProperty;
 

@@ -13,6 +13,8 @@
 
 #include <cstdio>
 
+using namespace zandor;
+
 int main(int argc, char** argv) {
     const QApplication application(argc, argv);
     designer::speak();

@@ -3,6 +3,8 @@
 
 #include <gmock/gmock.h>
 
+using namespace zandor;
+
 using designer::makeCommand;
 using designer::questions;
 using designer::statementFor;

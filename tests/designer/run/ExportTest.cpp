@@ -8,6 +8,8 @@
 #include <QDir>
 #include <QFile>
 
+using namespace zandor;
+
 using designer::Database;
 using designer::FileExport;
 using designer::Outcome;

@@ -8,6 +8,8 @@
 
 #include <thread>
 
+using namespace zandor;
+
 using designer::Command;
 using designer::Database;
 using designer::Outcome;

@@ -1,6 +1,6 @@
 #include "Queries.h"
 #include "designer/database/Answers.h"
-#include "reader/OneServer.h"
+#include "model/reader/OneServer.h"
 
 #include "designer/document/Document.h"
 #include "designer/run/ResultTable.h"
@@ -13,6 +13,8 @@
 #include <QLabel>
 
 #include <thread>
+
+using namespace zandor;
 
 using designer::Command;
 using designer::Database;

@@ -11,6 +11,8 @@
 #include <QLineEdit>
 #include <QPushButton>
 
+using namespace zandor;
+
 using designer::ParameterDialog;
 using model::sql::Dialect;
 

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace zandor;
+
 platform::Ref<model::Query> draw(const QString& address, const QStringList& tables,
                                  const std::vector<Drawn>& columns) {
     auto query = platform::makeRef<model::Query>();

@@ -14,25 +14,25 @@ struct Drawn {
 };
 
 /// A query over tables of a database, without joins; a table named twice is in it twice.
-platform::Ref<model::Query> draw(const QString& address, const QStringList& tables,
-                                 const std::vector<Drawn>& columns = {});
-void addColumn(model::Query& query, const Drawn& column);
+zandor::platform::Ref<zandor::model::Query> draw(const QString& address, const QStringList& tables,
+                                                 const std::vector<Drawn>& columns = {});
+void addColumn(zandor::model::Query& query, const Drawn& column);
 
 /// The statements of a table "numbers" with the whole numbers below `count` in "n", a text in
 /// "word" and nothing in "missing".
 QStringList numbersTable(int count);
 
 /// A query over the table "numbers" that finds no row, which takes the engine minutes to see.
-platform::Ref<model::Query> drawForMinutes(const QString& address);
+zandor::platform::Ref<zandor::model::Query> drawForMinutes(const QString& address);
 
 /// Keeps rows as texts.
-class Keeper final : public designer::Sink {
+class Keeper final : public zandor::designer::Sink {
 public:
     std::optional<QString> begin(const QStringList& names) override {
         columns = names;
         return {};
     }
-    std::optional<QString> add(const designer::Row& row) override;
+    std::optional<QString> add(const zandor::designer::Row& row) override;
     std::optional<QString> finish() override {
         finished = true;
         return {};
@@ -40,11 +40,12 @@ public:
 
     QStringList columns;
     QStringList rows; ///< cells with " | " between, the kind's first letter before each
-    std::vector<designer::Row> cells;
+    std::vector<zandor::designer::Row> cells;
     bool finished = false;
     int refuseAfter = -1; ///< rows
 };
 
 /// The command for a query without parameters.
-designer::Command commandFor(const platform::Ref<model::Query>& query, model::sql::Dialect dialect,
-                             std::optional<qint64> limit = {});
+zandor::designer::Command commandFor(const zandor::platform::Ref<zandor::model::Query>& query,
+                                     zandor::model::sql::Dialect dialect,
+                                     std::optional<qint64> limit = {});

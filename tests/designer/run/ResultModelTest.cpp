@@ -10,6 +10,8 @@
 #include <QFile>
 #include <QScrollBar>
 
+using namespace zandor;
+
 using designer::ResultModel;
 using designer::ResultTable;
 using designer::Row;

@@ -18,6 +18,8 @@
 #include <QPlainTextEdit>
 #include <QToolButton>
 
+using namespace zandor;
+
 using designer::ResultsPanel;
 using testing::HasSubstr;
 using testing::MatchesRegex;

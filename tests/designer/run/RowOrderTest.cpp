@@ -6,6 +6,8 @@
 
 #include <QElapsedTimer>
 
+using namespace zandor;
+
 using designer::Cell;
 using designer::RowOrder;
 using designer::sortedRows;

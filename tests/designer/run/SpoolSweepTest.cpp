@@ -11,6 +11,8 @@
 #include <filesystem>
 #include <unistd.h>
 
+using namespace zandor;
+
 using designer::sweepSpools;
 
 namespace {

@@ -10,6 +10,8 @@
 #include <limits>
 #include <thread>
 
+using namespace zandor;
+
 using designer::Row;
 using designer::Spool;
 using Kind = designer::Cell::Kind;

@@ -3,6 +3,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace zandor;
+
 using designer::Cell;
 using designer::Row;
 using Kind = designer::Cell::Kind;

@@ -1,10 +1,12 @@
 #include "Program.h"
 
-#include "model/files/QueryDocument.h"
+#include <Zandor/QueryDocument.h>
 
 #include <gtest/gtest.h>
 
 #include <QProcessEnvironment>
+
+using namespace zandor;
 
 std::unique_ptr<QProcess> start(const QStringList& arguments,
                                 const QMap<QString, QString>& environment) {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "model/Query.h"
+#include <Zandor/Query.h>
 
 #include <QMap>
 #include <QProcess>
@@ -23,5 +23,5 @@ Ended end(QProcess& program);
 Ended runProgram(const QStringList& arguments, const QMap<QString, QString>& environment = {});
 
 /// Saves a query with the address of its database.
-void save(const QString& path, const platform::Ref<model::Query>& query,
+void save(const QString& path, const zandor::platform::Ref<zandor::model::Query>& query,
           const QString& database = {});

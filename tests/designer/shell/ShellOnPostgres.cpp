@@ -1,7 +1,7 @@
 #include "Databases.h"
 #include "Program.h"
 #include "designer/run/Queries.h"
-#include "reader/OneServer.h"
+#include "model/reader/OneServer.h"
 
 #include <gmock/gmock.h>
 
@@ -9,6 +9,8 @@
 #include <QThread>
 
 #include <csignal>
+
+using namespace zandor;
 
 using testing::HasSubstr;
 

@@ -13,6 +13,8 @@
 
 #include <csignal>
 
+using namespace zandor;
+
 using testing::HasSubstr;
 using testing::StartsWith;
 

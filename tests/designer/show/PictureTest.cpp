@@ -12,6 +12,8 @@
 #include <QPrinter>
 #include <QSvgRenderer>
 
+using namespace zandor;
+
 using testing::HasSubstr;
 
 namespace {

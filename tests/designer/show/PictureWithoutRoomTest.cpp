@@ -6,6 +6,8 @@
 
 #include <QFile>
 
+using namespace zandor;
+
 namespace {
 
 class APictureFile : public WithoutRoom {

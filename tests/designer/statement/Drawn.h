@@ -1,23 +1,24 @@
 #pragma once
 
 #include "designer/document/Document.h"
-#include "model/Library.h"
+
+#include <Zandor/Library.h>
 
 #include <QCoreApplication>
 #include <QElapsedTimer>
 
 /// A document with a small query in it, and short ways to go on.
 struct Drawn {
-    static model::TableDescription description(const platform::String& name) {
+    static zandor::model::TableDescription description(const zandor::platform::String& name) {
         return {u"",
                 name,
-                {{u"id", model::ColumnType::Integer, u"INTEGER", true},
-                 {u"customer_id", model::ColumnType::Integer, u"INTEGER", false},
-                 {u"name", model::ColumnType::Text, u"TEXT", false}}};
+                {{u"id", zandor::model::ColumnType::Integer, u"INTEGER", true},
+                 {u"customer_id", zandor::model::ColumnType::Integer, u"INTEGER", false},
+                 {u"name", zandor::model::ColumnType::Text, u"TEXT", false}}};
     }
 
-    platform::Ref<model::Table> table(const platform::String& name, float left = 150,
-                                      float top = 150) {
+    zandor::platform::Ref<zandor::model::Table> table(const zandor::platform::String& name,
+                                                      float left = 150, float top = 150) {
         const auto result = query->addTable(description(name));
         result->Left(left);
         result->Top(top);
@@ -26,9 +27,9 @@ struct Drawn {
         return result;
     }
 
-    platform::Ref<TalvikZandorLib::ZDJoin> join(const platform::Ref<model::Table>& left,
-                                                const platform::Ref<model::Table>& right,
-                                                std::int16_t type = 0) {
+    zandor::platform::Ref<TalvikZandorLib::ZDJoin>
+    join(const zandor::platform::Ref<zandor::model::Table>& left,
+         const zandor::platform::Ref<zandor::model::Table>& right, std::int16_t type = 0) {
         const auto result = library.NewZDJoin();
         result->LeftColumn(left->columnNamed(u"customer_id"));
         result->RightColumn(right->columnNamed(u"id"));
@@ -36,9 +37,9 @@ struct Drawn {
         return query->AddJoin(result);
     }
 
-    platform::Ref<TalvikZandorLib::ZDColumnDefinition>
-    output(const platform::Ref<model::Table>& table, const platform::String& column,
-           const platform::String& criterion = {}) {
+    zandor::platform::Ref<TalvikZandorLib::ZDColumnDefinition>
+    output(const zandor::platform::Ref<zandor::model::Table>& table,
+           const zandor::platform::String& column, const zandor::platform::String& criterion = {}) {
         const auto result = library.NewZDColumnDefinition();
         result->Column(table->columnNamed(column));
         if (!criterion.empty()) result->AddCriterium(criterion, u"4");
@@ -47,9 +48,10 @@ struct Drawn {
 
     void finish() { document.setQuery(query); }
 
-    model::Library library;
-    platform::Ref<model::Query> query = platform::makeRef<model::Query>();
-    designer::Document document;
+    zandor::model::Library library;
+    zandor::platform::Ref<zandor::model::Query> query =
+        zandor::platform::makeRef<zandor::model::Query>();
+    zandor::designer::Document document;
 };
 
 /// Lets the event loop run until something is so; false when it does not come about.

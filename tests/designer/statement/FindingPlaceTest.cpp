@@ -2,10 +2,12 @@
 
 #include "designer/DrawingArea.h"
 #include "designer/statement/FindingPlace.h"
-#include "platform/qt/GridModel.h"
-#include "platform/qt/GridWidget.h"
+#include "frontends/qt/GridModel.h"
+#include "frontends/qt/GridWidget.h"
 
 #include <gmock/gmock.h>
+
+using namespace zandor;
 
 namespace {
 

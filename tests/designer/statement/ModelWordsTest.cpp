@@ -8,6 +8,8 @@
 #include <QRegularExpression>
 #include <QTranslator>
 
+using namespace zandor;
+
 using designer::inWords;
 
 namespace {

@@ -9,6 +9,8 @@
 #include <QTextDocument>
 #include <QTextLayout>
 
+using namespace zandor;
+
 using designer::SqlHighlighter;
 using testing::ElementsAre;
 using Painted = std::pair<std::string, SqlHighlighter::Part>;

@@ -7,6 +7,8 @@
 
 #include <random>
 
+using namespace zandor;
+
 using designer::SqlView;
 
 TEST(TheSqlView, KeepsTheSelectionWhereTheTextStaysTheSame) {

@@ -13,6 +13,8 @@
 #include <QPlainTextEdit>
 #include <QPushButton>
 
+using namespace zandor;
+
 using model::Finding;
 using model::sql::Dialect;
 using testing::HasSubstr;

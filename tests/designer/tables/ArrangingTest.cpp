@@ -4,6 +4,8 @@
 
 #include <gmock/gmock.h>
 
+using namespace zandor;
+
 using designer::arrangeTables;
 
 namespace {

@@ -6,7 +6,8 @@
 #include "designer/database/Database.h"
 #include "designer/document/Document.h"
 #include "designer/tables/TableAdding.h"
-#include "platform/KeyedCollection.h"
+
+#include <Zandor/platform/KeyedCollection.h>
 
 #include <gtest/gtest.h>
 
@@ -19,21 +20,21 @@ protected:
     Drawing() {
         area.resize(1200, 800);
         area.show();
-        QObject::connect(&adding, &designer::TableAdding::refused,
+        QObject::connect(&adding, &zandor::designer::TableAdding::refused,
                          [this](const QString& why) { refused << why; });
-        QObject::connect(&adding, &designer::TableAdding::added,
+        QObject::connect(&adding, &zandor::designer::TableAdding::added,
                          [this](const QString& name) { added << name; });
     }
 
     void openSample() { ASSERT_EQ(database.open(sampleDatabase()), std::nullopt); }
 
     void add(const QStringList& names, std::optional<QPoint> place = {}) {
-        std::vector<reader::TableId> tables;
+        std::vector<zandor::reader::TableId> tables;
         for (const QString& name : names) tables.push_back({u"", name.toStdU16String()});
         adding.add(tables, place);
     }
 
-    model::Query& query() { return *document.query(); }
+    zandor::model::Query& query() { return *document.query(); }
 
     QRect place(const QString& name) {
         const auto table = query().tableNamed(name.toStdU16String());
@@ -44,7 +45,8 @@ protected:
     /// Names and places of all tables.
     std::vector<std::pair<std::string, QRect>> places() {
         std::vector<std::pair<std::string, QRect>> all;
-        for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(query().Tables())) {
+        for (const auto& table :
+             zandor::platform::Each<TalvikZandorLib::ZDTable>(query().Tables())) {
             const QString name = QString::fromStdU16String(table->Name());
             all.emplace_back(name.toStdString(), place(name));
         }
@@ -53,17 +55,17 @@ protected:
 
     std::vector<std::string> joins() {
         std::vector<std::string> all;
-        for (const auto& join : platform::Each<TalvikZandorLib::ZDJoin>(query().Joins()))
-            all.push_back(platform::toUtf8(
+        for (const auto& join : zandor::platform::Each<TalvikZandorLib::ZDJoin>(query().Joins()))
+            all.push_back(zandor::platform::toUtf8(
                 join->LeftTable()->Name() + u"." + join->LeftColumn()->Name() + u" = " +
                 join->RightTable()->Name() + u"." + join->RightColumn()->Name()));
         return all;
     }
 
-    designer::Database database;
-    designer::Document document;
-    designer::DrawingArea area{document};
-    designer::TableAdding adding{document, database, area};
+    zandor::designer::Database database;
+    zandor::designer::Document document;
+    zandor::designer::DrawingArea area{document};
+    zandor::designer::TableAdding adding{document, database, area};
     QStringList refused;
     QStringList added;
 };

@@ -4,6 +4,8 @@
 
 #include <QFile>
 
+using namespace zandor;
+
 using testing::ElementsAre;
 using testing::IsEmpty;
 

@@ -3,13 +3,15 @@
 
 #include "designer/tables/TableDropTarget.h"
 #include "designer/tables/tableMime.h"
-#include "platform/qt/CanvasItems.h"
-#include "platform/qt/TabuletWidget.h"
+#include "frontends/qt/CanvasItems.h"
+#include "frontends/qt/TabuletWidget.h"
 
 #include <gmock/gmock.h>
 
 #include <QDrag>
 #include <QMimeData>
+
+using namespace zandor;
 
 using testing::ElementsAre;
 

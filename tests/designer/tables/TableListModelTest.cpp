@@ -5,6 +5,8 @@
 
 #include <QMimeData>
 
+using namespace zandor;
+
 using designer::TableListModel;
 using reader::TableId;
 using testing::ElementsAre;

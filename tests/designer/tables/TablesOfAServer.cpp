@@ -1,6 +1,6 @@
 #include "Drawing.h"
 #include "database/Answers.h"
-#include "reader/OneServer.h"
+#include "model/reader/OneServer.h"
 
 #include "designer/tables/TablesPanel.h"
 
@@ -9,6 +9,8 @@
 #include <QHelpEvent>
 #include <QListView>
 #include <QToolTip>
+
+using namespace zandor;
 
 using reader::TableId;
 using testing::ElementsAre;

@@ -15,6 +15,8 @@
 #include <QToolButton>
 #include <QToolTip>
 
+using namespace zandor;
+
 using designer::Database;
 using designer::TablesPanel;
 using testing::ElementsAre;

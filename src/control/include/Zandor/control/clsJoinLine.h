@@ -1,0 +1,93 @@
+#pragma once
+
+#include <Zandor/control/basZandor.h>
+#include <Zandor/platform/Variant.h>
+
+namespace TalvikDBxZandor {
+
+/// The canvas record of one join. A plain record: no setter checks its value; handles, codes and
+/// indexes are stored as they come. Indexes of -1 mean that no drawing element is allotted yet.
+class clsJoinLine {
+public:
+    static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.clsJoinLine";
+    using String = platform::String;
+
+    explicit clsJoinLine(platform::MessageBoxes& boxes) : mBoxes(&boxes) {}
+
+    // clang-format off
+    std::int32_t LeftTablehwnd() const { return Get(u"P_GET LeftTablehwnd", &Fields::LeftTablehwnd); }
+    void LeftTablehwnd(std::int32_t v) { Let(u"P_LET LeftTablehwnd", &Fields::LeftTablehwnd, v); }
+    std::int32_t RightTablehwnd() const { return Get(u"P_GET RightTablehwnd", &Fields::RightTablehwnd); }
+    void RightTablehwnd(std::int32_t v) { Let(u"P_LET RightTablehwnd", &Fields::RightTablehwnd, v); }
+    String LeftColumnText() const { return Get(u"P_GET LeftColumnText", &Fields::LeftColumnText); }
+    void LeftColumnText(const String& v) { Let(u"P_LET LeftColumnText", &Fields::LeftColumnText, v); }
+    String RightColumnText() const { return Get(u"P_GET RightColumnText", &Fields::RightColumnText); }
+    void RightColumnText(const String& v) { Let(u"P_LET RightColumnText", &Fields::RightColumnText, v); }
+    std::int32_t CompareOperator() const { return Get(u"P_GET CompareOperator", &Fields::CompareOperator); }
+    void CompareOperator(std::int32_t v) { Let(u"P_LET CompareOperator", &Fields::CompareOperator, v); }
+    std::int32_t JoinType() const { return Get(u"P_GET JoinType", &Fields::JoinType); }
+    void JoinType(std::int32_t v) { Let(u"P_LET JoinType", &Fields::JoinType, v); }
+    String LeftTableName() const { return Get(u"P_GET LeftTableName", &Fields::LeftTableName); }
+    void LeftTableName(const String& v) { Let(u"P_LET LeftTableName", &Fields::LeftTableName, v); }
+    String LeftColumnName() const { return Get(u"P_GET LeftColumnName", &Fields::LeftColumnName); }
+    void LeftColumnName(const String& v) { Let(u"P_LET LeftColumnName", &Fields::LeftColumnName, v); }
+    String RightTableName() const { return Get(u"P_GET RightTableName", &Fields::RightTableName); }
+    void RightTableName(const String& v) { Let(u"P_LET RightTableName", &Fields::RightTableName, v); }
+    String RightColumnName() const { return Get(u"P_GET RightColumnName", &Fields::RightColumnName); }
+    void RightColumnName(const String& v) { Let(u"P_LET RightColumnName", &Fields::RightColumnName, v); }
+    std::int32_t JoinLineIndex() const { return Get(u"P_GET JoinLineIndex", &Fields::JoinLineIndex); }
+    void JoinLineIndex(std::int32_t v) { Let(u"P_LET JoinLineIndex", &Fields::JoinLineIndex, v); }
+    std::int32_t LeftConnectorIndex() const { return Get(u"P_GET LeftConnectorIndex", &Fields::LeftConnectorIndex); }
+    void LeftConnectorIndex(std::int32_t v) { Let(u"P_LET LeftConnectorIndex", &Fields::LeftConnectorIndex, v); }
+    std::int32_t RightConnectorIndex() const { return Get(u"P_GET RightConnectorIndex", &Fields::RightConnectorIndex); }
+    void RightConnectorIndex(std::int32_t v) { Let(u"P_LET RightConnectorIndex", &Fields::RightConnectorIndex, v); }
+    std::int16_t Index() const { return Get(u"P_GET Index", &Fields::Index); }
+    void Index(std::int16_t v) { Let(u"P_LET Index", &Fields::Index, v); }
+    platform::Variant Tag() const { return Get(u"P_GET Tag", &Fields::Tag); }
+    void Tag(const platform::Variant& v) { Let(u"P_LET Tag", &Fields::Tag, v); }
+    // clang-format on
+
+    /// Takes over all fifteen fields of another record.
+    void CopyFields(const clsJoinLine& other) { mFields = other.mFields; }
+
+    /// Whether a side names a column of this name, without copying the name: drawing asks this
+    /// once for every entry of a table.
+    bool IsLeftColumn(platform::StringView name) const { return mFields.LeftColumnName == name; }
+    bool IsRightColumn(platform::StringView name) const { return mFields.RightColumnName == name; }
+
+private:
+    struct Fields {
+        std::int32_t JoinType = 0;
+        std::int32_t CompareOperator = 0;
+        String LeftColumnName;
+        String LeftColumnText;
+        String RightColumnText;
+        String RightColumnName;
+        String LeftTableName;
+        String RightTableName;
+        std::int32_t LeftTablehwnd = 0;
+        std::int32_t RightTablehwnd = 0;
+        std::int32_t JoinLineIndex = -1;
+        std::int32_t LeftConnectorIndex = -1;
+        std::int32_t RightConnectorIndex = -1;
+        std::int16_t Index = 0;
+        platform::Variant Tag;
+    };
+
+    template <class T>
+    T Get(platform::StringView procedure, T Fields::*field) const {
+        T result{};
+        basZandor::Guard(*mBoxes, ModuleName, procedure, [&] { result = mFields.*field; });
+        return result;
+    }
+
+    template <class T>
+    void Let(platform::StringView procedure, T Fields::*field, const T& value) {
+        basZandor::Guard(*mBoxes, ModuleName, procedure, [&] { mFields.*field = value; });
+    }
+
+    platform::MessageBoxes* mBoxes;
+    Fields mFields;
+};
+
+} // namespace TalvikDBxZandor

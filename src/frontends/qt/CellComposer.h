@@ -1,0 +1,34 @@
+#pragma once
+
+#include "frontends/qt/FocusTracker.h"
+
+class QInputMethodEvent;
+class QInputMethodQueryEvent;
+
+namespace zandor::platform::qt {
+
+/// A text that an input method composes while the grid has the focus. The cell's editor opens for
+/// it and shows it; the focus stays with the grid until the text is whole, for an input method
+/// breaks off when the focus moves.
+class CellComposer {
+public:
+    explicit CellComposer(FocusTracker& focus) : mFocus(focus) {}
+
+    bool isComposing() const { return box(); }
+    /// nullptr while nothing is composed.
+    QWidget* box() const { return mBox && mBox->isVisible() ? mBox.data() : nullptr; }
+    /// Opens by `open` what is to have the text. False when nothing has asked for the focus then.
+    bool begin(const std::function<void()>& open);
+    void goOn(QInputMethodEvent& event);
+    /// The focus has gone elsewhere.
+    void breakOff();
+    /// Answers an input method for the box, in the coordinates of a widget.
+    void answer(QInputMethodQueryEvent& query, const QWidget& asked) const;
+
+private:
+    FocusTracker& mFocus;
+    QPointer<QWidget> mBox;
+    QString mBefore; ///< what stood in the box
+};
+
+} // namespace zandor::platform::qt

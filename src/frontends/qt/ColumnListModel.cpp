@@ -1,0 +1,59 @@
+#include "frontends/qt/ColumnListModel.h"
+
+#include "frontends/qt/ShownText.h"
+
+#include <Zandor/qt/Text.h>
+
+#include <utility>
+
+namespace zandor::platform::qt {
+
+int ColumnListModel::rowCount(const QModelIndex& parent) const {
+    return parent.isValid() ? 0 : static_cast<int>(mRows.size());
+}
+
+QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
+    if (!index.isValid() || index.row() >= rowCount()) return {};
+    if (role == Qt::DisplayRole) return mRows[static_cast<std::size_t>(index.row())].shown;
+    if (role == pictureRole && picture(index.row())) return static_cast<int>(*picture(index.row()));
+    if (role == outputRole) return at(index.row()).comesOut;
+    if (role == Qt::AccessibleDescriptionRole) return description(at(index.row()));
+    return {};
+}
+
+QVariant ColumnListModel::description(const Row& row) const {
+    QStringList parts;
+    if (row.picture == Picture::key) parts += mKeyColumn;
+    if (row.comesOut) parts += mComesOut;
+    return parts.isEmpty() ? QVariant() : parts.join(QStringLiteral(", "));
+}
+
+void ColumnListModel::append(const QString& text) {
+    const int row = rowCount();
+    beginInsertRows({}, row, row);
+    mRows.push_back({text, asSigns(text), {}});
+    endInsertRows();
+}
+
+void ColumnListModel::setPicture(int row, std::optional<Picture> picture) {
+    if (std::exchange(at(row).picture, picture) == picture) return;
+    Q_EMIT dataChanged(index(row), index(row), {pictureRole, Qt::AccessibleDescriptionRole});
+}
+
+void ColumnListModel::setComesOut(int row, bool comesOut) {
+    if (std::exchange(at(row).comesOut, comesOut) == comesOut) return;
+    Q_EMIT dataChanged(index(row), index(row), {outputRole, Qt::AccessibleDescriptionRole});
+}
+
+void ColumnListModel::setWords(const Words& words) {
+    mKeyColumn = toQt(words.KeyColumn);
+    mComesOut = toQt(words.ComesOut);
+}
+
+void ColumnListModel::clear() {
+    beginResetModel();
+    mRows.clear();
+    endResetModel();
+}
+
+} // namespace zandor::platform::qt

@@ -1,0 +1,53 @@
+#pragma once
+
+#include <QPoint>
+#include <QString>
+
+#include <functional>
+#include <memory>
+#include <optional>
+#include <utility>
+
+namespace zandor::platform::qt {
+
+/// Names of the menu entries that have a key of their own.
+namespace menuentry {
+inline constexpr char showJoin[] = "mnuJoinShowDefinition";
+inline constexpr char deleteJoin[] = "mnuJoinDelete";
+inline constexpr char deleteTable[] = "mnuTableDefinitionDelete";
+inline constexpr char deleteColumn[] = "mnuColumnDefinitionDelete";
+} // namespace menuentry
+
+/// How the control's menu opens when it is a key that asks for it. The key acts through the gesture
+/// that opens the menu for the mouse, so that the control prepares the entries in the same way.
+class KeyboardMenu {
+public:
+    struct Request {
+        std::optional<QPoint> at; ///< on the screen; none: at the mouse
+        QString entry;            ///< chosen without showing the menu; empty: the user chooses
+    };
+    using Gesture = std::function<void()>;
+
+    void openAt(QPoint at, const Gesture& gesture) { run({at, {}}, gesture); }
+
+    /// Chooses an entry, unless it is disabled or hidden.
+    void choose(const char* entry, const Gesture& gesture) {
+        run({{}, QString::fromLatin1(entry)}, gesture);
+    }
+
+    /// For the menu as it opens. A request holds for one opening.
+    Request take() { return std::exchange(*mRequest, {}); }
+
+private:
+    void run(Request request, const Gesture& gesture) {
+        // Held, because the gesture may end the control.
+        const std::shared_ptr<Request> held = mRequest;
+        *held = std::move(request);
+        gesture();
+        *held = {};
+    }
+
+    std::shared_ptr<Request> mRequest = std::make_shared<Request>();
+};
+
+} // namespace zandor::platform::qt

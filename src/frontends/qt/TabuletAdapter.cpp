@@ -1,0 +1,335 @@
+#include "frontends/qt/TabuletAdapter.h"
+
+#include "frontends/qt/ColumnListModel.h"
+#include "frontends/qt/DragSession.h"
+#include "frontends/qt/Fonts.h"
+#include "frontends/qt/KeyCodes.h"
+#include "frontends/qt/KeyboardMenu.h"
+
+#include <Zandor/platform/RuntimeError.h>
+#include <Zandor/qt/Text.h>
+
+#include <algorithm>
+#include <atomic>
+
+namespace zandor::platform::qt {
+
+namespace {
+
+std::int32_t nextHandle() {
+    static std::atomic<std::int32_t> last{0};
+    return ++last;
+}
+
+} // namespace
+
+/// An entry outlives its list where somebody still holds it; it then keeps what it last said.
+class TabuletAdapter::Entry final : public TableEntry, public std::enable_shared_from_this<Entry> {
+public:
+    Entry(TabuletAdapter& table, int row, const String& key, const String& text)
+        : mTable(&table), mRow(row), mKey(key), mText(text) {}
+
+    void detach() {
+        mSelected = Selected();
+        mTable = nullptr;
+    }
+
+    const String& Text() const override { return mText; }
+    const String& Key() const override { return mKey; }
+
+    bool Selected() const override {
+        return live() ? list().selectionModel()->isSelected(index()) : mSelected;
+    }
+
+    void Selected(bool value) override {
+        mSelected = value;
+        if (mTable && value) mTable->mEntryTaken = true;
+        if (live())
+            list().selectionModel()->select(index(), value ? QItemSelectionModel::Select
+                                                           : QItemSelectionModel::Deselect);
+    }
+
+    void Image(std::int16_t value) override {
+        if (!live()) return;
+        const auto& images = mTable->mImages;
+        mTable->mWidget->model().setPicture(mRow, images ? images->Image(value) : std::nullopt);
+    }
+
+    void ComesOut(bool value) override {
+        if (live()) mTable->mWidget->model().setComesOut(mRow, value);
+    }
+
+    void Refresh() override {
+        if (live()) list().update(index());
+    }
+
+    void EnsureVisible() override {
+        if (live()) list().scrollTo(index());
+    }
+
+    TalvikTabulet::Point LeftEdgePoint() const override {
+        if (mTable) mTable->mSurroundings.asked.east = weak_from_this();
+        return edge(0);
+    }
+    TalvikTabulet::Point RightEdgePoint() const override {
+        if (mTable) mTable->mSurroundings.asked.west = weak_from_this();
+        return edge(1);
+    }
+
+    const TalvikTabulet::Tabulet* table() const override { return mTable; }
+
+private:
+    bool live() const { return mTable && mTable->mWidget; }
+    ColumnListView& list() const { return mTable->mWidget->list(); }
+    QModelIndex index() const { return mTable->mWidget->model().index(mRow); }
+
+    TalvikTabulet::Point edge(float side) const {
+        if (!live()) throw errors::objectNotSet();
+        const Bounds box = mTable->bounds();
+        const ColumnListView& view = list();
+        const float row = static_cast<float>(view.rowHeight());
+        const float middle = static_cast<float>(view.y() + view.firstEntry()) +
+                             row * (static_cast<float>(mRow) + 0.5F);
+        return {box.Left + side * box.Width, box.Top + middle * twipsPerPixel};
+    }
+
+    TabuletAdapter* mTable;
+    const int mRow;
+    const String mKey;
+    const String mText;
+    bool mSelected = false;
+};
+
+std::int32_t TabuletAdapter::Entries::Count() const {
+    return static_cast<std::int32_t>(items.size());
+}
+
+const Ref<TalvikTabulet::ColumnItem>& TabuletAdapter::Entries::Item(std::int32_t position) const {
+    if (position < 1 || position > Count()) throw errors::subscriptOutOfRange();
+    return items[static_cast<std::size_t>(position) - 1];
+}
+
+Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Add(const String& key, const String& text) {
+    auto entry = std::make_shared<Entry>(mTable, Count(), key, text);
+    if (mTable.mWidget) mTable.mWidget->model().append(toQt(text));
+    return items.emplace_back(std::move(entry));
+}
+
+TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus,
+                               TabuletSurroundings& surroundings, std::int16_t index,
+                               const TalvikTabulet::TabuletEvents& events)
+    : Adapter(widget, focus), mSurroundings(surroundings), mDrags(surroundings.drags),
+      mIndex(index), mHandle(nextHandle()), mEvents(events) {
+    widget->setListener(this);
+    mFocus.watch(&widget->list(), [this] {
+        if (mEvents.GotFocus) mEvents.GotFocus(mIndex);
+    });
+}
+
+TabuletAdapter::~TabuletAdapter() { leave(); }
+
+void TabuletAdapter::leave() {
+    Terminate();
+    mDrags.forget(this);
+    if (mSurroundings.current == this) mSurroundings.current = nullptr;
+    if (!mWidget) return;
+    mWidget->setListener(nullptr);
+    mFocus.forget(&mWidget->list());
+    dropWidget();
+}
+
+void TabuletAdapter::Unload() { leave(); }
+
+void TabuletAdapter::Text(const String& value) {
+    mText = value;
+    if (mWidget) mWidget->setTitle(toQt(value));
+}
+
+void TabuletAdapter::Visible(bool value) {
+    mVisible = value;
+    show(value);
+}
+
+void TabuletAdapter::Activated(bool value) {
+    if (value && mSurroundings.current && mSurroundings.current != this)
+        mSurroundings.current->Activated(false);
+    if (value)
+        mSurroundings.current = this;
+    else if (mSurroundings.current == this)
+        mSurroundings.current = nullptr;
+    if (mWidget) mWidget->setCurrent(value);
+}
+
+void TabuletAdapter::Font(const platform::Font& value) {
+    if (mWidget) setFont(*mWidget, value);
+}
+
+Ref<TalvikTabulet::ColumnItem> TabuletAdapter::ColumnAt(float X, float Y) const {
+    if (!mWidget) return {};
+    const QPoint at(static_cast<int>(std::floor(X / twipsPerPixel)),
+                    static_cast<int>(std::floor(Y / twipsPerPixel)));
+    const ColumnListView& view = mWidget->list();
+    const QPoint inside = view.viewport()->mapFrom(mWidget.data(), at);
+    if (!view.viewport()->rect().contains(inside)) return {};
+    const QModelIndex index = view.indexAt(inside);
+    if (!index.isValid()) return {};
+    return mEntries.items[static_cast<std::size_t>(index.row())];
+}
+
+void TabuletAdapter::ZOrder() {
+    if (mWidget) mWidget->raise();
+}
+
+void TabuletAdapter::Drag(std::int16_t action) {
+    if (action != 1 || !mWidget) return;
+    QStringList names;
+    for (const auto& entry : mEntries.items)
+        if (entry->Selected()) names += toQt(entry->Text());
+    mDrags.request(&mWidget->list(), this, names);
+}
+
+void TabuletAdapter::Complete() {
+    if (!mWidget) return;
+    // Laid out at once: the ends of join lines depend on how far the list is scrolled.
+    mWidget->list().doItemsLayout();
+    mWidget->update();
+}
+
+void TabuletAdapter::Terminate() {
+    for (const auto& entry : mEntries.items) static_cast<Entry&>(*entry).detach();
+    mEntries.items.clear();
+    if (mWidget) mWidget->model().clear();
+}
+
+void TabuletAdapter::report(const TalvikTabulet::TabuletEvents::Mouse& handler, int row,
+                            std::int16_t button, std::int16_t shift) {
+    if (!handler || row >= mEntries.Count()) return;
+    // A copy: the handler may end the table.
+    Ref<TalvikTabulet::ColumnItem> entry;
+    if (row >= 0) entry = mEntries.Item(row + 1);
+    handler(mIndex, entry, button, shift);
+}
+
+void TabuletAdapter::entryPressed(int row, std::int16_t button, std::int16_t shift) {
+    report(mEvents.ColumnMouseDown, row, button, shift);
+}
+
+void TabuletAdapter::entryMoved(int row, std::int16_t buttons, std::int16_t shift) {
+    DragSession& drags = mDrags;
+    report(mEvents.ColumnMouseMove, row, buttons, shift);
+    drags.runRequested();
+}
+
+void TabuletAdapter::entryReleased(int row, std::int16_t button, std::int16_t shift) {
+    report(mEvents.ColumnMouseUp, row, button, shift);
+}
+
+void TabuletAdapter::entryDoubleClicked(int row) {
+    mSurroundings.comforts.entryDoubleClicked(mIndex, row + 1);
+}
+
+void TabuletAdapter::menuKey(int row, QPoint at) {
+    mSurroundings.menu.openAt(at, [&] { entryReleased(row, buttonState(Qt::RightButton), 0); });
+}
+
+void TabuletAdapter::deleteKey(int row) {
+    mSurroundings.menu.choose(menuentry::deleteTable,
+                              [&] { entryReleased(row, buttonState(Qt::RightButton), 0); });
+}
+
+void TabuletAdapter::selectionChanged() {
+    if (mEvents.SelectionChanged) mEvents.SelectionChanged(mIndex);
+}
+
+void TabuletAdapter::listScrolled() {
+    if (mEvents.Scroll) mEvents.Scroll(mIndex);
+}
+
+void TabuletAdapter::closeClicked() {
+    if (mEvents.CloseClick) mEvents.CloseClick(mIndex);
+}
+
+void TabuletAdapter::gestureBegan() { mGestureStart = bounds(); }
+
+void TabuletAdapter::gestureMoved(Qt::Edges edges, QPointF way) {
+    if (!mWidget) return;
+    Bounds box = mGestureStart;
+    const float right = toTwips(way.x());
+    const float down = toTwips(way.y());
+    if (!edges) {
+        box.Left += right;
+        box.Top += down;
+    }
+    // A box may be smaller than the smallest by its model; the user then cannot shrink it more.
+    const QSize smallest = mWidget->smallest();
+    const float width = std::min(toTwips(smallest.width()), box.Width);
+    const float height = std::min(toTwips(smallest.height()), box.Height);
+    if (edges & Qt::RightEdge) box.Width = std::max(box.Width + right, width);
+    if (edges & Qt::BottomEdge) box.Height = std::max(box.Height + down, height);
+    if (edges & Qt::LeftEdge) {
+        const float by = std::min(right, box.Width - width);
+        box.Left += by;
+        box.Width -= by;
+    }
+    if (edges & Qt::TopEdge) {
+        const float by = std::min(down, box.Height - height);
+        box.Top += by;
+        box.Height -= by;
+    }
+    if (box == bounds()) return;
+    setBounds(box);
+    if (mEvents.Moving) mEvents.Moving(mIndex);
+}
+
+void TabuletAdapter::gestureEnded(Qt::Edges edges) {
+    const TalvikTabulet::TabuletEvents& events = mEvents;
+    const std::int16_t index = mIndex;
+    const QPointer<TabuletWidget> alive = mWidget;
+    const Bounds left = bounds();
+    // Near a corner an edge takes its neighbour along, which may have stayed where it was.
+    const bool cornerMoved = left.Left != mGestureStart.Left || left.Top != mGestureStart.Top;
+    if ((!edges || cornerMoved) && events.Moved) events.Moved(index);
+    if (!edges || !alive || !alive->property(controlProperty).isValid()) return;
+    if (cornerMoved) keepOppositeEdges(left);
+    if (events.Resized) events.Resized(index);
+}
+
+/// The control brings a corner that was pulled out of sight back; the other edges are to stay.
+void TabuletAdapter::keepOppositeEdges(const Bounds& left) {
+    Bounds box = bounds();
+    if (box.Left != left.Left) box.Width = std::max(left.Left + left.Width - box.Left, 0.0F);
+    if (box.Top != left.Top) box.Height = std::max(left.Top + left.Height - box.Top, 0.0F);
+    if (box != bounds()) setBounds(box);
+}
+
+bool TabuletAdapter::draggedOver(const QMimeData* data, QPointF at, std::int16_t state) {
+    constexpr std::int16_t entering = 0;
+    constexpr std::int16_t leaving = 1;
+    if (data ? !mDrags.accepts(data) : !mDrags.source()) return false;
+    if (state == entering) mSurroundings.comforts.dragCame(mIndex);
+    mEntryTaken = false;
+    const QPointer<TabuletWidget> alive = mWidget;
+    if (mEvents.DragOver)
+        mEvents.DragOver(mIndex, mDrags.source(), toTwips(at.x()), toTwips(at.y()), state);
+    // The control answers by selecting the entry under the mouse if it can be dropped on. The drop
+    // goes to the control either way; the cursor tells the user beforehand.
+    if (!alive || !alive->property(controlProperty).isValid()) return true;
+    mDrags.showWhetherDropCounts(state == leaving || mEntryTaken);
+    if (state == leaving) mSurroundings.comforts.dragGone();
+    return true;
+}
+
+bool TabuletAdapter::dropped(const QMimeData* data, QPointF at) {
+    if (!mDrags.accepts(data)) return false;
+    // The comforts outlive the table, which may be gone once the host has heard of the drop.
+    auto& comforts = mSurroundings.comforts;
+    mDrags.drop([this, &comforts, alive = mWidget, at, taken = mEntryTaken] {
+        if (!alive) return;
+        if (alive->property(controlProperty).isValid() && mEvents.DragDrop)
+            mEvents.DragDrop(mIndex, mDrags.source(), toTwips(at.x()), toTwips(at.y()));
+        if (alive) taken ? comforts.dragTaken() : comforts.dragGone();
+    });
+    return true;
+}
+
+} // namespace zandor::platform::qt

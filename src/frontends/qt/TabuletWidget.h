@@ -1,0 +1,107 @@
+#pragma once
+
+#include "frontends/qt/ColumnListView.h"
+#include "frontends/qt/DragScroller.h"
+
+#include <Zandor/platform/Words.h>
+
+#include <QAbstractButton>
+#include <QWidget>
+
+namespace zandor::platform::qt {
+
+class Canvas;
+class ColumnListModel;
+
+class TabuletListener : public EntryListener {
+public:
+    virtual void closeClicked() = 0;
+    /// The right button has come up over the title.
+    virtual void titleClicked() = 0;
+    /// A move (no edge) or a resize by one or two edges begins.
+    virtual void gestureBegan() = 0;
+    /// The mouse is `way` logical pixels from where the gesture began.
+    virtual void gestureMoved(Qt::Edges edges, QPointF way) = 0;
+    virtual void gestureEnded(Qt::Edges edges) = 0;
+    /// Without data it is the drag that has come before. State 0 enters, 1 leaves, 2 is over.
+    virtual bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) = 0;
+    virtual bool dropped(const QMimeData* data, QPointF at) = 0;
+};
+
+/// A table as a box: title bar with name and close button, list of columns, a border to resize by.
+class TabuletWidget : public QWidget {
+    Q_OBJECT
+
+public:
+    /// The slot orders the tables for the keyboard.
+    TabuletWidget(int slot, Canvas& canvas);
+
+    int slot() const { return mSlot; }
+
+    void setListener(TabuletListener* listener);
+    void setWords(const Words& words);
+    ColumnListView& list() const { return *mList; }
+    ColumnListModel& model() const { return *mModel; }
+    QAbstractButton& closeButton() const { return *mClose; }
+
+    void setTitle(const QString& title);
+    /// As it is shown.
+    const QString& title() const { return mTitle; }
+    /// What is wrong with the table, as a sign in its title and a tooltip over it; empty: nothing.
+    void setNote(const QString& note);
+    const QString& note() const { return mNote; }
+    void setCurrent(bool current);
+    bool isCurrent() const { return mCurrent; }
+
+    /// Top of the list inside the box, the same at every size.
+    int listTop() const { return mTitleHeight; }
+    /// The smallest box that still shows its name and one entry.
+    QSize smallest() const;
+    QRect titleBar() const;
+
+protected:
+    bool event(QEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+    void changeEvent(QEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+    void dragEnterEvent(QDragEnterEvent* event) override;
+    void dragMoveEvent(QDragMoveEvent* event) override;
+    void dragLeaveEvent(QDragLeaveEvent* event) override;
+    void dropEvent(QDropEvent* event) override;
+
+private:
+    enum class Gesture { none, move, resize };
+
+    void measure();
+    QRect titlePlace() const;
+    QFont titleFont() const;
+    void arrange();
+    Qt::Edges edgesAt(QPoint at) const;
+    void endGesture();
+    bool moveOrResize(const QKeyEvent& event);
+    void scrollUnderDrag(QPoint direction);
+
+    Canvas& mCanvas;
+    const int mSlot;
+    TabuletListener* mListener = nullptr;
+    ColumnListModel* mModel;
+    ColumnListView* mList;
+    QAbstractButton* mClose;
+    QString mTitle;
+    QString mNote;
+    bool mCurrent = false;
+    int mTitleHeight = 0;
+    Gesture mGesture = Gesture::none;
+    Qt::Edges mEdges;
+    QPointF mPressedAt;
+    QPointF mDraggedAt;
+    bool mMoved = false;
+    DragScroller mScroller;
+};
+
+} // namespace zandor::platform::qt

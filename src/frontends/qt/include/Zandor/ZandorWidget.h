@@ -1,0 +1,349 @@
+#pragma once
+
+#include <Zandor/Zandor.h>
+#include <Zandor/comforts/Field.h>
+#include <Zandor/comforts/Flags.h>
+
+#include <QMap>
+#include <QWidget>
+
+#include <memory>
+#include <vector>
+
+Q_DECLARE_METATYPE(zandor::platform::Ref<TalvikZandorLib::Zandor>)
+Q_DECLARE_METATYPE(zandor::platform::Ref<TalvikZandorLib::ZDJoin>)
+Q_DECLARE_METATYPE(zandor::platform::Ref<TalvikZandorLib::ZDTable>)
+Q_DECLARE_METATYPE(zandor::platform::Ref<TalvikZandorLib::ZDColumn>)
+Q_DECLARE_METATYPE(zandor::platform::Ref<TalvikZandorLib::ZDColumnDefinition>)
+
+namespace zandor::platform::qt {
+class QtToolkit;
+}
+
+/// The query designer as a widget, to be put into any layout. Its properties, methods and signals
+/// are the control's own under their own names; integers are 16-bit ones, and a value outside
+/// -32768 to 32767 is refused as error 6 in a message box, the property staying as it was.
+///
+/// To the Tab key of the window around, the widget is a single stop; docs/keyboard.md lists its
+/// keys.
+///
+/// The library outlives the widget. With DebugSwitch nonzero (its default) the widget shows trace
+/// boxes, one of them while it is destroyed.
+///
+/// The widget may be deleted at any time, by `delete` and by deleteLater(): in a slot of any of its
+/// signals, in a call of the model, while a message box, the join dialog, the menu or a drag of it
+/// stands open, which then close. The one exception is the widget's own resizing, in which Qt does
+/// not let any widget be deleted.
+class ZandorWidget : public QWidget {
+    Q_OBJECT
+    // One property a line.
+    // clang-format off
+    Q_PROPERTY(QString LNGJoinForm READ LNGJoinForm WRITE setLNGJoinForm)
+    Q_PROPERTY(QString LNGJoinLeftTable READ LNGJoinLeftTable WRITE setLNGJoinLeftTable)
+    Q_PROPERTY(QString LNGJoinLeftColumn READ LNGJoinLeftColumn WRITE setLNGJoinLeftColumn)
+    Q_PROPERTY(QString LNGJoinRightTable READ LNGJoinRightTable WRITE setLNGJoinRightTable)
+    Q_PROPERTY(QString LNGJoinRightColumn READ LNGJoinRightColumn WRITE setLNGJoinRightColumn)
+    Q_PROPERTY(QString LNGJoinType READ LNGJoinType WRITE setLNGJoinType)
+    Q_PROPERTY(QString LNGJoinTypeNormal READ LNGJoinTypeNormal WRITE setLNGJoinTypeNormal)
+    Q_PROPERTY(QString LNGJoinTypeLeftOuter READ LNGJoinTypeLeftOuter WRITE setLNGJoinTypeLeftOuter)
+    Q_PROPERTY(QString LNGJoinTypeRightOuter READ LNGJoinTypeRightOuter WRITE setLNGJoinTypeRightOuter)
+    Q_PROPERTY(QString LNGJoinTypeBothOuter READ LNGJoinTypeBothOuter WRITE setLNGJoinTypeBothOuter)
+    Q_PROPERTY(QString LNGJoinOk READ LNGJoinOk WRITE setLNGJoinOk)
+    Q_PROPERTY(QString LNGJoinCancel READ LNGJoinCancel WRITE setLNGJoinCancel)
+    Q_PROPERTY(QString LNGMnuShowJoinDef READ LNGMnuShowJoinDef WRITE setLNGMnuShowJoinDef)
+    Q_PROPERTY(QString LNGMnuDelJoin READ LNGMnuDelJoin WRITE setLNGMnuDelJoin)
+    Q_PROPERTY(QString LNGMnuCopyCol READ LNGMnuCopyCol WRITE setLNGMnuCopyCol)
+    Q_PROPERTY(QString LNGMnuCreateJoin READ LNGMnuCreateJoin WRITE setLNGMnuCreateJoin)
+    Q_PROPERTY(QString LNGMnuDelTable READ LNGMnuDelTable WRITE setLNGMnuDelTable)
+    Q_PROPERTY(QString LNGMnuPasteCol READ LNGMnuPasteCol WRITE setLNGMnuPasteCol)
+    Q_PROPERTY(QString LNGMnuDelCol READ LNGMnuDelCol WRITE setLNGMnuDelCol)
+    Q_PROPERTY(QString LNGSpreadField READ LNGSpreadField WRITE setLNGSpreadField)
+    Q_PROPERTY(QString LNGSpreadSynonym READ LNGSpreadSynonym WRITE setLNGSpreadSynonym)
+    Q_PROPERTY(QString LNGSpreadSort READ LNGSpreadSort WRITE setLNGSpreadSort)
+    Q_PROPERTY(QString LNGSpreadVisible READ LNGSpreadVisible WRITE setLNGSpreadVisible)
+    Q_PROPERTY(QString LNGSpreadCriteria READ LNGSpreadCriteria WRITE setLNGSpreadCriteria)
+    Q_PROPERTY(QString LNGSpreadOr READ LNGSpreadOr WRITE setLNGSpreadOr)
+    Q_PROPERTY(bool LNGMnuShowJoinDefVis READ LNGMnuShowJoinDefVis WRITE setLNGMnuShowJoinDefVis)
+    Q_PROPERTY(bool LNGMnuDelJoinVis READ LNGMnuDelJoinVis WRITE setLNGMnuDelJoinVis)
+    Q_PROPERTY(bool LNGMnuCopyColVis READ LNGMnuCopyColVis WRITE setLNGMnuCopyColVis)
+    Q_PROPERTY(bool LNGMnuCreateJoinVis READ LNGMnuCreateJoinVis WRITE setLNGMnuCreateJoinVis)
+    Q_PROPERTY(bool LNGMnuDelTableVis READ LNGMnuDelTableVis WRITE setLNGMnuDelTableVis)
+    Q_PROPERTY(bool LNGMnuPasteColVis READ LNGMnuPasteColVis WRITE setLNGMnuPasteColVis)
+    Q_PROPERTY(bool LNGMnuDelColVis READ LNGMnuDelColVis WRITE setLNGMnuDelColVis)
+    Q_PROPERTY(bool LNGMnuSep1Vis READ LNGMnuSep1Vis WRITE setLNGMnuSep1Vis)
+    Q_PROPERTY(bool LNGMnuSep2Vis READ LNGMnuSep2Vis WRITE setLNGMnuSep2Vis)
+    Q_PROPERTY(int MXHorzFrameSize READ MXHorzFrameSize WRITE setMXHorzFrameSize)
+    Q_PROPERTY(int MXVertFrameSize READ MXVertFrameSize WRITE setMXVertFrameSize)
+    Q_PROPERTY(QString DeletedTable READ DeletedTable WRITE setDeletedTable)
+    Q_PROPERTY(int DebugSwitch READ DebugSwitch WRITE setDebugSwitch)
+    Q_PROPERTY(int JoinModifyDisabled READ JoinModifyDisabled WRITE setJoinModifyDisabled)
+    Q_PROPERTY(int VisibleFrameLeft READ VisibleFrameLeft WRITE setVisibleFrameLeft)
+    Q_PROPERTY(int VisibleFrameTop READ VisibleFrameTop WRITE setVisibleFrameTop)
+    Q_PROPERTY(ZandorModel Zandor READ model WRITE setModel)
+    Q_PROPERTY(int HorizMaxScrollPos READ HorizMaxScrollPos WRITE setHorizMaxScrollPos)
+    Q_PROPERTY(int VertMaxScrollPos READ VertMaxScrollPos WRITE setVertMaxScrollPos)
+    Q_PROPERTY(int HorizontalScrollbarPos READ HorizontalScrollbarPos WRITE setHorizontalScrollbarPos)
+    Q_PROPERTY(int VerticalScrollbarPos READ VerticalScrollbarPos WRITE setVerticalScrollbarPos)
+    Q_PROPERTY(bool OnlyJoin READ OnlyJoin WRITE setOnlyJoin)
+    Q_PROPERTY(bool UseJoinTypeNormal READ UseJoinTypeNormal WRITE setUseJoinTypeNormal)
+    Q_PROPERTY(bool UseJoinTypeLeft READ UseJoinTypeLeft WRITE setUseJoinTypeLeft)
+    Q_PROPERTY(bool UseJoinTypeRight READ UseJoinTypeRight WRITE setUseJoinTypeRight)
+    Q_PROPERTY(bool UseJoinTypeBoth READ UseJoinTypeBoth WRITE setUseJoinTypeBoth)
+    Q_PROPERTY(bool UseJoinCompareOperatorEquals READ UseJoinCompareOperatorEquals WRITE setUseJoinCompareOperatorEquals)
+    Q_PROPERTY(bool UseJoinCompareOperatorNotEquals READ UseJoinCompareOperatorNotEquals WRITE setUseJoinCompareOperatorNotEquals)
+    Q_PROPERTY(bool UseJoinCompareOperatorLess READ UseJoinCompareOperatorLess WRITE setUseJoinCompareOperatorLess)
+    Q_PROPERTY(bool UseJoinCompareOperatorGreater READ UseJoinCompareOperatorGreater WRITE setUseJoinCompareOperatorGreater)
+    Q_PROPERTY(bool UseJoinCompareOperatorLessEquals READ UseJoinCompareOperatorLessEquals WRITE setUseJoinCompareOperatorLessEquals)
+    Q_PROPERTY(bool UseJoinCompareOperatorGreaterEquals READ UseJoinCompareOperatorGreaterEquals WRITE setUseJoinCompareOperatorGreaterEquals)
+    Q_PROPERTY(bool UseJoinCompareOperatorLE READ UseJoinCompareOperatorLE WRITE setUseJoinCompareOperatorLE)
+    Q_PROPERTY(bool UseJoinCompareOperatorGE READ UseJoinCompareOperatorGE WRITE setUseJoinCompareOperatorGE)
+    Q_PROPERTY(ZDJoin lastjoin READ lastjoin)
+    Q_PROPERTY(ZDTable activetable READ activetable)
+    Q_PROPERTY(ZDColumn ActiveColumn READ ActiveColumn)
+    // clang-format on
+
+public:
+    using ZandorModel = zandor::platform::Ref<TalvikZandorLib::Zandor>;
+    using ZDJoin = zandor::platform::Ref<TalvikZandorLib::ZDJoin>;
+    using ZDTable = zandor::platform::Ref<TalvikZandorLib::ZDTable>;
+    using ZDColumn = zandor::platform::Ref<TalvikZandorLib::ZDColumn>;
+    using ZDColumnDefinition = zandor::platform::Ref<TalvikZandorLib::ZDColumnDefinition>;
+
+    explicit ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent = nullptr);
+    ~ZandorWidget() override;
+
+    /// The control behind the widget, for hosts that prefer its C++ interface.
+    TalvikDBxZandor::Zandor& control() { return *mControl; }
+    zandor::platform::qt::QtToolkit& toolkit() { return *mToolkit; }
+
+    /// What people expect beyond the bare control; all off at first.
+    const zandor::comforts::Flags& comforts() const;
+    void setComforts(const zandor::comforts::Flags& flags);
+
+    /// With the comfort of typing kept, what stands in an open editor goes into its cell, and the
+    /// editor closes; ColumnModified is emitted when that changes anything. The widget does so
+    /// by itself when the user turns to something else in its window, shortcuts included; hosts
+    /// that are about to run, save or close the query for another reason call it first.
+    void takeOver();
+    /// With that comfort, writes what stands in an open text editor into the definition of the same
+    /// key of another model, such as a copy that is kept safe; the editor stays open and the query
+    /// as it is. Returns whether there was anything that is not in the query yet.
+    bool writeTyping(const ZandorModel& copy);
+
+    /// Marks tables on the canvas, by their names, as ones that something is wrong with; the note
+    /// says what, as a tooltip and to screen readers. Tables that are not named lose their mark,
+    /// and one that comes later has none.
+    void setTableNotes(const QMap<QString, QString>& notes);
+
+    /// What there is to say about cells of the grid, each shown at its cell, as a mark and in the
+    /// tooltip; cells that are not named have nothing. Stays until it is set anew, and goes with
+    /// the cells when their columns move.
+    void setFindings(std::vector<zandor::comforts::Finding> findings);
+    /// Makes a cell of the grid the current one, in view and with the focus: the row of the grid,
+    /// and the column of the definition with a key. False when it is not there.
+    bool showCell(const QString& definition, int row);
+
+    /// Brings what is shown to what the bound model has now: for a host that has changed the model
+    /// itself, or has bound another one and wants nothing left of the one before. What is the same
+    /// stays as it is, with scroll positions, selections, focus, and an open editor with its text.
+    /// No signals, no traces. See TalvikDBxZandor::Zandor::ShowAnew.
+    void showAnew();
+
+    QSize sizeHint() const override;
+    QSize minimumSizeHint() const override;
+
+    using QWidget::repaint;
+    using QWidget::update;
+
+    QString LNGJoinForm() const;
+    void setLNGJoinForm(const QString& value);
+    QString LNGJoinLeftTable() const;
+    void setLNGJoinLeftTable(const QString& value);
+    QString LNGJoinLeftColumn() const;
+    void setLNGJoinLeftColumn(const QString& value);
+    QString LNGJoinRightTable() const;
+    void setLNGJoinRightTable(const QString& value);
+    QString LNGJoinRightColumn() const;
+    void setLNGJoinRightColumn(const QString& value);
+    QString LNGJoinType() const;
+    void setLNGJoinType(const QString& value);
+    QString LNGJoinTypeNormal() const;
+    void setLNGJoinTypeNormal(const QString& value);
+    QString LNGJoinTypeLeftOuter() const;
+    void setLNGJoinTypeLeftOuter(const QString& value);
+    QString LNGJoinTypeRightOuter() const;
+    void setLNGJoinTypeRightOuter(const QString& value);
+    QString LNGJoinTypeBothOuter() const;
+    void setLNGJoinTypeBothOuter(const QString& value);
+    QString LNGJoinOk() const;
+    void setLNGJoinOk(const QString& value);
+    QString LNGJoinCancel() const;
+    void setLNGJoinCancel(const QString& value);
+    QString LNGMnuShowJoinDef() const;
+    void setLNGMnuShowJoinDef(const QString& value);
+    QString LNGMnuDelJoin() const;
+    void setLNGMnuDelJoin(const QString& value);
+    QString LNGMnuCopyCol() const;
+    void setLNGMnuCopyCol(const QString& value);
+    QString LNGMnuCreateJoin() const;
+    void setLNGMnuCreateJoin(const QString& value);
+    QString LNGMnuDelTable() const;
+    void setLNGMnuDelTable(const QString& value);
+    QString LNGMnuPasteCol() const;
+    void setLNGMnuPasteCol(const QString& value);
+    QString LNGMnuDelCol() const;
+    void setLNGMnuDelCol(const QString& value);
+    QString LNGSpreadField() const;
+    void setLNGSpreadField(const QString& value);
+    QString LNGSpreadSynonym() const;
+    void setLNGSpreadSynonym(const QString& value);
+    QString LNGSpreadSort() const;
+    void setLNGSpreadSort(const QString& value);
+    QString LNGSpreadVisible() const;
+    void setLNGSpreadVisible(const QString& value);
+    QString LNGSpreadCriteria() const;
+    void setLNGSpreadCriteria(const QString& value);
+    QString LNGSpreadOr() const;
+    void setLNGSpreadOr(const QString& value);
+    bool LNGMnuShowJoinDefVis() const;
+    void setLNGMnuShowJoinDefVis(bool value);
+    bool LNGMnuDelJoinVis() const;
+    void setLNGMnuDelJoinVis(bool value);
+    bool LNGMnuCopyColVis() const;
+    void setLNGMnuCopyColVis(bool value);
+    bool LNGMnuCreateJoinVis() const;
+    void setLNGMnuCreateJoinVis(bool value);
+    bool LNGMnuDelTableVis() const;
+    void setLNGMnuDelTableVis(bool value);
+    bool LNGMnuPasteColVis() const;
+    void setLNGMnuPasteColVis(bool value);
+    bool LNGMnuDelColVis() const;
+    void setLNGMnuDelColVis(bool value);
+    bool LNGMnuSep1Vis() const;
+    void setLNGMnuSep1Vis(bool value);
+    bool LNGMnuSep2Vis() const;
+    void setLNGMnuSep2Vis(bool value);
+    int MXHorzFrameSize() const;
+    void setMXHorzFrameSize(int value);
+    int MXVertFrameSize() const;
+    void setMXVertFrameSize(int value);
+    QString DeletedTable() const;
+    void setDeletedTable(const QString& value);
+    int DebugSwitch() const;
+    void setDebugSwitch(int value);
+    int JoinModifyDisabled() const;
+    void setJoinModifyDisabled(int value);
+    int VisibleFrameLeft() const;
+    void setVisibleFrameLeft(int value);
+    int VisibleFrameTop() const;
+    void setVisibleFrameTop(int value);
+    int HorizMaxScrollPos() const;
+    void setHorizMaxScrollPos(int value);
+    int VertMaxScrollPos() const;
+    void setVertMaxScrollPos(int value);
+    int HorizontalScrollbarPos() const;
+    void setHorizontalScrollbarPos(int value);
+    int VerticalScrollbarPos() const;
+    void setVerticalScrollbarPos(int value);
+    bool OnlyJoin() const;
+    void setOnlyJoin(bool value);
+    bool UseJoinTypeNormal() const;
+    void setUseJoinTypeNormal(bool value);
+    bool UseJoinTypeLeft() const;
+    void setUseJoinTypeLeft(bool value);
+    bool UseJoinTypeRight() const;
+    void setUseJoinTypeRight(bool value);
+    bool UseJoinTypeBoth() const;
+    void setUseJoinTypeBoth(bool value);
+    bool UseJoinCompareOperatorEquals() const;
+    void setUseJoinCompareOperatorEquals(bool value);
+    bool UseJoinCompareOperatorNotEquals() const;
+    void setUseJoinCompareOperatorNotEquals(bool value);
+    bool UseJoinCompareOperatorLess() const;
+    void setUseJoinCompareOperatorLess(bool value);
+    bool UseJoinCompareOperatorGreater() const;
+    void setUseJoinCompareOperatorGreater(bool value);
+    bool UseJoinCompareOperatorLessEquals() const;
+    void setUseJoinCompareOperatorLessEquals(bool value);
+    bool UseJoinCompareOperatorGreaterEquals() const;
+    void setUseJoinCompareOperatorGreaterEquals(bool value);
+    bool UseJoinCompareOperatorLE() const;
+    void setUseJoinCompareOperatorLE(bool value);
+    bool UseJoinCompareOperatorGE() const;
+    void setUseJoinCompareOperatorGE(bool value);
+    /// The query model; never nothing.
+    ZandorModel model() const;
+    void setModel(const ZandorModel& model);
+    /// Always nothing: the signals carry the object concerned.
+    ZDJoin lastjoin() const;
+    ZDTable activetable() const;
+    ZDColumn ActiveColumn() const;
+
+    Q_INVOKABLE void Terminate();
+    Q_INVOKABLE void SelectColumnNames(const QString& TabName, const QString& ColName);
+    Q_INVOKABLE void SetCurrentTable(const QString& TabName);
+
+    /// Painting anew is for the control to lay itself out and close an open editor, as when it is
+    /// first shown. Painting that its own work causes is not, nor is the painting of a part.
+    void update();
+    void repaint();
+
+    // Beside the interface
+    /// The share of the height that the canvas has above the grid; half of it at first. Kept
+    /// within 0.05 and 0.95.
+    double upperPaneShare() const;
+    void setUpperPaneShare(double share);
+    /// What is shown and spoken that no property says. At first it is what the translators that
+    /// are installed have for it, in this class's context; another language that the application
+    /// takes is followed until a host sets words of its own. See docs/words.md.
+    const zandor::platform::Words& words() const;
+    void setWords(const zandor::platform::Words& words);
+    /// Back to what the translators have, for a host that has set its own.
+    void resetWords();
+
+Q_SIGNALS:
+    /// DeletedTable has the name.
+    void TableDeleted();
+    void TableMoved();
+    void Activate();
+    void ColumnCreated(const ZDColumnDefinition& definition);
+    void ColumnModified(const ZDColumnDefinition& definition);
+    void ColumnRemoved(const ZDColumnDefinition& definition);
+    void Error(const QString& text, int number);
+    void JoinCreated(const ZDJoin& join);
+    void JoinModified(const ZDJoin& join);
+    void JoinRemoved(const ZDJoin& join);
+
+    // Beside the interface
+    /// The user has moved the divider of the panes.
+    void upperPaneShareChanged(double share);
+    /// The user wants another name for the table of a key. Comes when the menu has closed.
+    void renameRequested(const QString& key);
+
+protected:
+    bool event(QEvent* event) override;
+    void changeEvent(QEvent* event) override;
+    bool focusNextPrevChild(bool next) override;
+    void focusInEvent(QFocusEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+
+private:
+    class Events;
+    class House;
+
+    void queuePaint();
+    void moveDivider(int down);
+    void say(const zandor::platform::Words& words);
+    void setInteger(zandor::platform::StringView procedure, int value,
+                    void (*set)(TalvikDBxZandor::Zandor&, std::int16_t));
+
+    std::shared_ptr<House> mHouse;
+    zandor::platform::qt::QtToolkit* mToolkit;
+    TalvikDBxZandor::Zandor* mControl = nullptr;
+    bool mPaintQueued = false;
+    bool mOwnWords = false; ///< the host has set them
+};

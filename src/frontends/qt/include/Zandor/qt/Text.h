@@ -1,0 +1,20 @@
+#pragma once
+
+#include <Zandor/platform/String.h>
+
+#include <QString>
+
+namespace zandor::platform::qt {
+
+inline QString toQt(StringView text) {
+    return QString::fromUtf16(text.data(), static_cast<qsizetype>(text.size()));
+}
+
+inline String fromQt(const QString& text) { return text.toStdU16String(); }
+
+/// "lstTable(3)": the name under which an element of a control array is known.
+inline QString elementName(StringView name, int index) {
+    return toQt(name) + u'(' + QString::number(index) + u')';
+}
+
+} // namespace zandor::platform::qt

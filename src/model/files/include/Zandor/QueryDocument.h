@@ -1,0 +1,49 @@
+#pragma once
+
+#include <Zandor/Query.h>
+#include <Zandor/files/Error.h>
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+
+/// Queries as files. The format is described in docs/file-format.md.
+namespace zandor::files {
+
+/// What a file has beyond what this version knows.
+struct Unknown;
+
+/// A query as a file holds it. A document made from a query alone has nothing beyond it. What the
+/// file said beyond this version's knowledge belongs to the object it stood at, by that object's
+/// key, and is written again as long as the object is there.
+struct QueryDocument {
+    QueryDocument() = default;
+    QueryDocument(platform::Ref<model::Query> query) : query(std::move(query)) {}
+
+    platform::Ref<model::Query> query = platform::makeRef<model::Query>();
+    /// Address of the database that the query asks, for the program that opens the file; empty:
+    /// none is known. Written as it stands, so it must not have a password in it.
+    platform::String database = {};
+    std::shared_ptr<const Unknown> unknown = {};
+};
+
+/// The version that is written; older ones are read.
+inline constexpr int currentVersion = 2;
+
+/// The document as JSON. Refused when a text in the query has half a character (an unpaired
+/// surrogate) or the query goes beyond the limits of a file: what is written can be read again,
+/// and is the same then.
+Result<std::string> toJson(const QueryDocument& document);
+
+/// The document that a text holds: UTF-8, of this version or an older one. Refuses everything else
+/// and says in which line or under which JSON pointer the fault is.
+Result<QueryDocument> fromJson(std::string_view text);
+
+/// Writes the file as a Replacement: on a failure the old file is as it was and no other is left.
+/// Nothing on success.
+std::optional<Error> saveQuery(const Path& path, const QueryDocument& document);
+
+Result<QueryDocument> loadQuery(const Path& path);
+
+} // namespace zandor::files

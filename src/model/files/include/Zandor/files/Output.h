@@ -1,0 +1,43 @@
+#pragma once
+
+#include <Zandor/files/Error.h>
+
+#include <optional>
+#include <string_view>
+
+namespace zandor::files {
+
+/// Where bytes go, one piece after the other.
+class Output {
+public:
+    virtual ~Output() = default;
+    /// Some of what was written may wait for its way until flush(). What went wrong, with this
+    /// piece or with one before.
+    virtual std::optional<Error> write(std::string_view bytes) = 0;
+    /// Lets nothing wait.
+    virtual std::optional<Error> flush() = 0;
+};
+
+/// An open file, pipe or terminal as an output. It is left open.
+class Stream final : public Output {
+public:
+    static constexpr std::size_t usuallyWaiting = 64 * 1024;
+    static constexpr std::size_t nothingWaits = 0;
+
+    /// `refusal` is how an error begins: "The output cannot be written". As many bytes wait at
+    /// most.
+    Stream(int file, std::string refusal, std::size_t mostWaiting = usuallyWaiting)
+        : mFile(file), mRefusal(std::move(refusal)), mMostWaiting(mostWaiting) {}
+
+    std::optional<Error> write(std::string_view bytes) override;
+    std::optional<Error> flush() override;
+
+private:
+    const int mFile;
+    const std::string mRefusal;
+    const std::size_t mMostWaiting;
+    std::string mWaiting;
+    std::optional<Error> mFailure;
+};
+
+} // namespace zandor::files

@@ -1,0 +1,161 @@
+#include <Zandor/model/Record.h>
+
+#include <Zandor/model/Column.h>
+#include <Zandor/model/ColumnDefinition.h>
+#include <Zandor/model/Names.h>
+
+#include <algorithm>
+#include <unordered_map>
+#include <unordered_set>
+
+namespace zandor::model {
+
+std::optional<std::int32_t> keyNumber(StringView key, char16_t letter) {
+    constexpr std::size_t mostCharacters = 11;
+    if (key.size() < 2 || key.size() > mostCharacters || key[0] != letter || key[1] == u'0')
+        return {};
+    std::int64_t number = 0;
+    for (const char16_t c : key.substr(1)) {
+        if (c < u'0' || c > u'9') return {};
+        number = number * 10 + (c - u'0');
+    }
+    if (number > greatestKeyNumber) return {};
+    return static_cast<std::int32_t>(number);
+}
+
+namespace {
+
+std::string at(const char* list, std::size_t position) {
+    return list + ('/' + std::to_string(position)) + '/';
+}
+
+/// Walks a record and keeps the first fault that it meets.
+class Check {
+public:
+    explicit Check(const QueryRecord& record) : mRecord(record) {}
+
+    std::optional<RecordFault> run() {
+        lastKey("table", mRecord.lastKeys.table);
+        lastKey("column", mRecord.lastKeys.column);
+        lastKey("join", mRecord.lastKeys.join);
+        lastKey("definition", mRecord.lastKeys.definition);
+        for (std::size_t n = 0; n < mRecord.tables.size() && !mFault; ++n)
+            table(mRecord.tables[n], at("tables", n));
+        for (std::size_t n = 0; n < mRecord.joins.size() && !mFault; ++n)
+            join(mRecord.joins[n], at("joins", n));
+        for (std::size_t n = 0; n < mRecord.definitions.size() && !mFault; ++n)
+            definition(mRecord.definitions[n], at("definitions", n));
+        return mFault;
+    }
+
+private:
+    void fault(const std::string& path, std::string reason) {
+        if (!mFault) mFault = RecordFault{path, std::move(reason)};
+    }
+
+    void lastKey(const char* kind, std::int32_t last) {
+        if (last < 0 || last > greatestKeyNumber)
+            fault(std::string("lastKeys/") + kind,
+                  "is not from 0 to " + std::to_string(greatestKeyNumber));
+    }
+
+    /// One that was given, whether its object is still there or not.
+    void given(const String& key, char16_t letter, std::int32_t last, const std::string& path) {
+        const auto number = keyNumber(key, letter);
+        if (!number)
+            fault(path, std::string("is not the letter ") + static_cast<char>(letter) +
+                            " and a number from 1 to " + std::to_string(greatestKeyNumber));
+        else if (*number > last)
+            fault(path, "is beyond the last key " + std::to_string(last) + " of its kind");
+    }
+
+    void key(const String& key, char16_t letter, std::int32_t last, const std::string& path) {
+        given(key, letter, last, path);
+        if (!mFault && !mKeys.insert(key).second) fault(path, "is used before already");
+    }
+
+    void table(const TableRecord& table, const std::string& path) {
+        key(table.key, u't', mRecord.lastKeys.table, path + "key");
+        if (table.name.empty()) fault(path + "name", "is empty");
+        if (table.sourceName.empty()) fault(path + "source/name", "is empty");
+        if (!mNames.insert(foldedName(table.name)).second)
+            fault(path + "name", "is the name of another table too");
+        if (table.columns.empty() || table.columns.front().description.name != Column::allColumns)
+            fault(path + "columns", "does not begin with the entry \"*\"");
+        for (std::size_t n = 0; n < table.columns.size() && !mFault; ++n) {
+            const ColumnRecord& column = table.columns[n];
+            key(column.key, u'c', mRecord.lastKeys.column, path + at("columns", n) + "key");
+            mTableOf.emplace(column.key, table.key);
+        }
+    }
+
+    void end(const EndRecord& end, const std::string& path) {
+        if (!end.table.empty() && !(end.table.front() == u't' && mKeys.contains(end.table)))
+            fault(path + "/table", "is the key of no table");
+        if (end.column.empty()) return;
+        const auto column = mTableOf.find(end.column);
+        if (column == mTableOf.end() || column->second != end.table)
+            fault(path + "/column", "is the key of no column of that table");
+    }
+
+    void join(const JoinRecord& join, const std::string& path) {
+        key(join.key, u'j', mRecord.lastKeys.join, path + "key");
+        end(join.left, path + "left");
+        end(join.right, path + "right");
+        if (join.type < 0 || join.type > 3) fault(path + "type", "is no type of join");
+        if (join.comparison < 0 || join.comparison > 5)
+            fault(path + "operator", "is no comparison");
+    }
+
+    void definition(const DefinitionRecord& definition, const std::string& path) {
+        key(definition.key, u'x', mRecord.lastKeys.definition, path + "key");
+        if (!definition.column.empty() && !mTableOf.contains(definition.column))
+            fault(path + "column", "is the key of no column");
+        if (definition.sortOrder < 0 || definition.sortOrder > 2)
+            fault(path + "sort", "is no sort order");
+        if (definition.width < 0 || definition.width > ColumnDefinition::greatestWidth)
+            fault(path + "width",
+                  "is not from 0 to " + std::to_string(ColumnDefinition::greatestWidth));
+        std::int32_t before = Criteria::firstRow - 1;
+        for (std::size_t n = 0; n < definition.criteria.size() && !mFault; ++n) {
+            const std::int16_t row = definition.criteria[n].row;
+            if (row <= before)
+                fault(path + at("criteria", n) + "row",
+                      n == 0 ? "is less than the first row, " + std::to_string(Criteria::firstRow)
+                             : "does not come behind the row before it");
+            before = row;
+            names(definition.criteria[n], path + at("criteria", n));
+        }
+    }
+
+    void names(const CriterionRecord& criterion, const std::string& path) {
+        std::int32_t end = 0;
+        for (std::size_t n = 0; n < criterion.names.size() && !mFault; ++n) {
+            const NameRecord& name = criterion.names[n];
+            const std::string place = path + at("names", n);
+            const bool inOrder = name.begin >= end && name.tableEnd >= name.begin;
+            if (!inOrder || static_cast<std::size_t>(name.tableEnd) > criterion.text.size())
+                fault(place + "at", "is no place in the text behind the name before it");
+            end = name.tableEnd;
+            if (name.table.empty() && name.column.empty()) continue;
+            given(name.table, u't', mRecord.lastKeys.table, place + "table");
+            given(name.column, u'c', mRecord.lastKeys.column, place + "column");
+            const auto column = mTableOf.find(name.column);
+            const bool gone = column == mTableOf.end() && !mKeys.contains(name.table);
+            if (!gone && (column == mTableOf.end() || column->second != name.table))
+                fault(place + "column", "is the key of no column of that table");
+        }
+    }
+
+    const QueryRecord& mRecord;
+    std::unordered_set<String> mKeys;
+    std::unordered_set<String> mNames;
+    std::unordered_map<String, String> mTableOf; ///< by the key of a column
+    std::optional<RecordFault> mFault;
+};
+
+} // namespace
+
+std::optional<RecordFault> faultOf(const QueryRecord& record) { return Check(record).run(); }
+
+} // namespace zandor::model

@@ -1,0 +1,59 @@
+#pragma once
+
+#include <Zandor/model/Criteria.h>
+#include <Zandor/model/Place.h>
+
+namespace zandor::model {
+
+class Query;
+
+/// One output column. It names its column by key, which reads as nothing once the table was
+/// deleted or the query is gone.
+class ColumnDefinition final : public TalvikZandorLib::ZDColumnDefinition,
+                               public TalvikZandorLib::SizedDefinition {
+public:
+    /// The column under its name in the grid, "table.column" (see FieldColumn); place() leads to
+    /// the column itself.
+    Ref<TalvikZandorLib::ZDColumn> Column() const override;
+    /// Any column, by itself or by its name in the grid, as long as the definition is new. Once it
+    /// has its key it stays with its query: a column of another query is error 5, and nothing is
+    /// error 91.
+    void Column(const Ref<TalvikZandorLib::ZDColumn>& value) override;
+    String Synonym() const override { return mSynonym; }
+    void Synonym(const String& value) override { mSynonym = value; }
+    std::int16_t SortOrder() const override { return mSortOrder; }
+    /// Error 380 outside 0 to 2.
+    void SortOrder(std::int16_t value) override;
+    bool Visible() const override { return mVisible; }
+    void Visible(bool value) override { mVisible = value; }
+    std::int32_t Width() const override { return mWidth; }
+    /// Error 380 outside 0 to greatestWidth.
+    void Width(std::int32_t value) override;
+    /// Empty until the definition was added to a query; then "x" and a number, kept for good.
+    String Key() const override { return mKey; }
+    class Criteria& Criteria() override {
+        return mCriteria;
+    }
+    bool HasCriterium(const String& key) const override { return mCriteria.Contains(key); }
+    void AddCriterium(const String& text, const String& key) override { mCriteria.Add(text, key); }
+
+    const class Criteria& criteria() const { return mCriteria; }
+    const ColumnPlace& place() const { return mPlace; }
+    /// Raised by its criteria too.
+    Revision& revision() { return *mRevision; }
+
+private:
+    friend class Query; ///< gives the key
+
+    // Shared with the criteria, which may be held longer.
+    const std::shared_ptr<Revision> mRevision = std::make_shared<Revision>();
+    Revised<ColumnPlace> mPlace{*mRevision};
+    Revised<String> mSynonym{*mRevision};
+    Revised<std::int16_t> mSortOrder{*mRevision};
+    Revised<bool> mVisible{*mRevision, true};
+    Revised<std::int32_t> mWidth{*mRevision};
+    String mKey;
+    model::Criteria mCriteria{mRevision};
+};
+
+} // namespace zandor::model

@@ -1,0 +1,67 @@
+#pragma once
+
+#include <Zandor/model/References.h>
+
+#include <map>
+
+namespace zandor::model {
+
+using platform::Ref;
+using platform::String;
+
+/// The criterion of one row.
+class RowCriterium final : public TalvikZandorLib::ZDCriterium {
+public:
+    /// `revision` is that of the definition, raised also after the criterium was removed from it.
+    explicit RowCriterium(std::shared_ptr<Revision> revision, String text = {})
+        : mRevision(std::move(revision)), mText(*mRevision, std::move(text)) {}
+    String Criterium() const override { return mText; }
+    /// The names in a new text mean what they name when the query is next read or changed.
+    void Criterium(const String& value) override { tie(value, {}); }
+
+    /// What names in the text are tied to already.
+    const criteria::References& references() const { return mReferences; }
+    /// The text with the places of its names.
+    void tie(String text, criteria::References references) {
+        mText = std::move(text);
+        mReferences = std::move(references);
+    }
+
+private:
+    const std::shared_ptr<Revision> mRevision;
+    Revised<String> mText;
+    Revised<criteria::References> mReferences{*mRevision};
+};
+
+/// The criteria of one definition by grid row, 4 to 32767. Keys are rows in decimal: "4", "5".
+///
+/// Rows mean something across definitions (criteria of one row hold together), so a criterium keeps
+/// its row: by position, a row without one reads as an empty criterium that belongs to nobody.
+class Criteria final : public TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDCriterium> {
+public:
+    static constexpr std::int16_t firstRow = 4;
+
+    /// `revision` is that of the definition.
+    explicit Criteria(std::shared_ptr<Revision> revision) : mRevision(std::move(revision)) {}
+
+    /// Rows from the first to the last one that has a criterium.
+    std::int32_t Count() const override;
+    Ref<TalvikZandorLib::ZDCriterium> Item(std::int32_t position) const override;
+    Ref<TalvikZandorLib::ZDCriterium> Item(const String& key) const override;
+    void Remove(const String& key) override;
+
+    bool Contains(const String& key) const;
+    /// Error 457 when the row has a criterium, error 5 when the key is no row; nothing is added
+    /// then.
+    void Add(const String& text, const String& key);
+    void clear();
+
+    /// The criteria that there are, in the order of their rows.
+    const std::map<std::int16_t, Ref<RowCriterium>>& rows() const { return mRows; }
+
+private:
+    const std::shared_ptr<Revision> mRevision;
+    std::map<std::int16_t, Ref<RowCriterium>> mRows;
+};
+
+} // namespace zandor::model

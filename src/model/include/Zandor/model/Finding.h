@@ -1,0 +1,43 @@
+#pragma once
+
+#include <Zandor/platform/String.h>
+
+#include <vector>
+
+namespace zandor::model {
+
+/// Something about a query that a person should know, and where it is.
+struct Finding {
+    enum class Kind {
+        noTables,
+        definitionWithoutColumn,
+        sortOnAllColumns,
+        duplicateOutputName,
+        cartesianProduct,
+        incomparableJoin,
+        ambiguousOuterJoin,
+        badCriterion,
+        nameNotCarried,
+        notInDialect,
+    };
+
+    Kind kind;
+    platform::String text; ///< one line
+    // Keys of what is concerned, empty where there is none.
+    platform::String table{};
+    platform::String join{};
+    platform::String definition{};
+    std::int16_t row = 0;     ///< grid row of a criterion
+    std::size_t position = 0; ///< in the criterion's text, UTF-16 code units from 0
+
+    /// Whether the statement would not say what the user drew, or could not be written.
+    bool isError() const {
+        return kind == Kind::noTables || kind == Kind::badCriterion ||
+               kind == Kind::nameNotCarried || kind == Kind::notInDialect ||
+               kind == Kind::definitionWithoutColumn;
+    }
+};
+
+using Findings = std::vector<Finding>;
+
+} // namespace zandor::model

@@ -1,0 +1,69 @@
+#pragma once
+
+#include <Zandor/model/Items.h>
+
+/// How joins and definitions name their tables and columns: by key within one query's tables. A
+/// place holds no table, so nothing owns in a circle, and it may outlive the query.
+namespace zandor::model {
+
+using platform::Ref;
+using platform::String;
+
+class Column;
+class Table;
+
+/// The tables of one query.
+using Tables = Items<Table, TalvikZandorLib::ZDTable>;
+
+class TablePlace {
+public:
+    TablePlace() = default;
+    TablePlace(std::weak_ptr<const Tables> home, String key)
+        : mHome(std::move(home)), mKey(std::move(key)) {}
+
+    /// The table, or nothing when it was deleted or its query is gone.
+    Ref<Table> table() const;
+    /// Whether no table was ever named.
+    bool empty() const { return mKey.empty(); }
+    const String& key() const { return mKey; }
+    /// Whether both are of one query.
+    bool sameHome(const TablePlace& other) const;
+    bool isIn(const std::shared_ptr<const Tables>& tables) const;
+
+    friend bool operator==(const TablePlace& left, const TablePlace& right) {
+        return left.mKey == right.mKey && left.sameHome(right);
+    }
+
+private:
+    std::weak_ptr<const Tables> mHome;
+    String mKey;
+};
+
+class ColumnPlace {
+public:
+    ColumnPlace() = default;
+    ColumnPlace(TablePlace table, String key) : mTable(std::move(table)), mKey(std::move(key)) {}
+
+    /// The column, or nothing when its table was deleted or its query is gone.
+    Ref<Column> column() const;
+    bool empty() const { return mKey.empty(); }
+    const String& key() const { return mKey; }
+    const TablePlace& table() const { return mTable; }
+
+    /// Error 91 when no column is named; error 5 when it is not, or no longer, a column of these
+    /// tables.
+    void require(const std::shared_ptr<const Tables>& tables) const;
+
+    friend bool operator==(const ColumnPlace&, const ColumnPlace&) = default;
+
+private:
+    TablePlace mTable;
+    String mKey;
+};
+
+/// The place of a table or column; an empty one for nothing. Error 5 for an object of another
+/// model library.
+TablePlace placeOf(const Ref<TalvikZandorLib::ZDTable>& table);
+ColumnPlace placeOf(const Ref<TalvikZandorLib::ZDColumn>& column);
+
+} // namespace zandor::model

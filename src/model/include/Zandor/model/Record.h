@@ -1,0 +1,123 @@
+#pragma once
+
+#include <Zandor/model/Description.h>
+
+#include <cstdint>
+#include <optional>
+
+/// A query as plain values: everything that makes it the query it is, and no objects. Two queries
+/// are the same when their records are equal. Which entries the user has selected in a list at the
+/// moment (ZDColumn::activated) is the control's and not recorded.
+namespace zandor::model {
+
+struct ColumnRecord {
+    String key = {};
+    ColumnDescription description = {};
+    bool selected = false;
+
+    friend bool operator==(const ColumnRecord&, const ColumnRecord&) = default;
+};
+
+struct TableRecord {
+    String key = {};
+    String name = {};
+    String schema = {};
+    String sourceName = {};
+    std::int32_t left = -1;
+    std::int32_t top = -1;
+    std::int32_t width = 0;
+    std::int32_t height = 0;
+    std::int16_t selected = 0;
+    std::vector<ColumnRecord> columns = {}; ///< the first is the entry "*"
+
+    friend bool operator==(const TableRecord&, const TableRecord&) = default;
+};
+
+/// Keys of one end of a join. The column is empty when none is set, and so is the table when the
+/// end reads as nothing.
+struct EndRecord {
+    String table = {};
+    String column = {};
+
+    friend bool operator==(const EndRecord&, const EndRecord&) = default;
+};
+
+struct JoinRecord {
+    String key = {};
+    EndRecord left = {};
+    EndRecord right = {};
+    std::int16_t type = 0;       ///< as ZDJoin::JoinType
+    std::int16_t comparison = 0; ///< as ZDJoin::CompareOperator
+
+    friend bool operator==(const JoinRecord&, const JoinRecord&) = default;
+};
+
+/// What a name in a criterion's text means (see criteria::Reference). The keys may be those of a
+/// table that is gone; both are empty for what was no name of a column when it was typed.
+struct NameRecord {
+    std::int32_t begin = 0;
+    std::int32_t tableEnd = 0;
+    String table = {};
+    String column = {};
+
+    friend bool operator==(const NameRecord&, const NameRecord&) = default;
+};
+
+struct CriterionRecord {
+    std::int16_t row = 0;
+    String text = {};
+    std::vector<NameRecord> names = {}; ///< known by now, in the order of the text
+
+    friend bool operator==(const CriterionRecord&, const CriterionRecord&) = default;
+};
+
+struct DefinitionRecord {
+    String key = {};
+    String column = {}; ///< key; empty when the definition reads as having none
+    String synonym = {};
+    std::int16_t sortOrder = 0;
+    bool visible = true;
+    std::int32_t width = 0;                     ///< as SizedDefinition::Width
+    std::vector<CriterionRecord> criteria = {}; ///< in the order of their rows
+
+    friend bool operator==(const DefinitionRecord&, const DefinitionRecord&) = default;
+};
+
+/// The number of the newest key of each kind, whether its object is still there or not.
+struct LastKeys {
+    std::int32_t table = 0;
+    std::int32_t column = 0;
+    std::int32_t join = 0;
+    std::int32_t definition = 0;
+
+    friend bool operator==(const LastKeys&, const LastKeys&) = default;
+};
+
+struct QueryRecord {
+    LastKeys lastKeys = {};
+    std::vector<TableRecord> tables = {};
+    std::vector<JoinRecord> joins = {};
+    std::vector<DefinitionRecord> definitions = {};
+
+    friend bool operator==(const QueryRecord&, const QueryRecord&) = default;
+};
+
+/// Numbers of keys end here, so that a query made from a record has room for new ones.
+inline constexpr std::int32_t greatestKeyNumber = 1'000'000'000;
+
+/// The number of a key that is `letter` and a number from 1 to the greatest, or nothing: one number
+/// has one key, without a leading zero.
+std::optional<std::int32_t> keyNumber(StringView key, char16_t letter);
+
+/// Why a record is none of a query.
+struct RecordFault {
+    /// Names of the record's members and positions from 0: "tables/0/columns/3/key".
+    std::string path;
+    /// Ends a sentence that the place begins: "is the key of another table too".
+    std::string reason;
+};
+
+/// The first fault of a record, or nothing.
+std::optional<RecordFault> faultOf(const QueryRecord& record);
+
+} // namespace zandor::model

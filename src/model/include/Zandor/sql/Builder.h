@@ -1,0 +1,37 @@
+#pragma once
+
+#include "model/sql/Printer.h"
+
+#include <Zandor/Query.h>
+#include <Zandor/model/Finding.h>
+
+#include <optional>
+
+namespace zandor::model::sql {
+
+struct Built {
+    std::optional<Statement> statement; ///< nothing when the query has no tables
+    Findings findings;
+};
+
+/// The statement that a query draws. A criterion or definition that cannot be used is left out and
+/// named among the findings.
+Built build(Query& query);
+
+/// What a host shows: the findings of the query and, for a dialect, of its names and joins.
+Findings validate(Query& query, Dialect dialect);
+
+struct Text {
+    String text; ///< empty when there is none
+    std::vector<Binding> bindings;
+    Findings findings;
+
+    /// Whether the statement can be run: it is there and says what was drawn.
+    bool runnable() const;
+};
+
+/// The query as a statement of a dialect, of no more rows than `limit`.
+Text statementText(Query& query, Dialect dialect, ValueForm form,
+                   std::optional<std::int64_t> limit = {});
+
+} // namespace zandor::model::sql

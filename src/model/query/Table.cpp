@@ -1,0 +1,45 @@
+#include <Zandor/model/Table.h>
+
+#include <Zandor/model/Names.h>
+#include <Zandor/platform/Numbers.h>
+
+namespace zandor::model {
+
+Table::Table(TablePlace place, String name, String schema, String sourceName,
+             platform::KeyedCollection<TalvikZandorLib::ZDColumn> columns)
+    : mPlace(std::move(place)), mName(mRevision, std::move(name)), mSchema(std::move(schema)),
+      mSourceName(std::move(sourceName)), mColumns(std::move(columns)) {}
+
+void Table::Left(float value) { mLeft = platform::toLong(value); }
+void Table::Top(float value) { mTop = platform::toLong(value); }
+void Table::Width(float value) { mWidth = platform::toLong(value); }
+void Table::Height(float value) { mHeight = platform::toLong(value); }
+
+Ref<Column> Table::column(const String& key) const {
+    if (!mColumns.Contains(key)) return {};
+    return std::static_pointer_cast<Column>(mColumns.Item(key));
+}
+
+Ref<Column> Table::columnNamed(platform::StringView name) const {
+    Ref<Column> alike;
+    // A column that is really called "*" stands behind the entry, so the entry is passed over.
+    for (std::int32_t position = 2; position <= mColumns.Count(); ++position) {
+        const auto column = std::static_pointer_cast<Column>(mColumns.Item(position));
+        if (column->description().name == name) return column;
+        if (!alike && sameName(column->description().name, name)) alike = column;
+    }
+    return alike;
+}
+
+bool Table::isAllColumns(const Column& column) const {
+    return column.Key() == mColumns.Item(1)->Key();
+}
+
+Ref<Table> tableNamed(const TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& tables,
+                      platform::StringView name) {
+    for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(tables))
+        if (sameName(table->Name(), name)) return std::static_pointer_cast<Table>(table);
+    return {};
+}
+
+} // namespace zandor::model

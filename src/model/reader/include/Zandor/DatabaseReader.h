@@ -1,0 +1,61 @@
+#pragma once
+
+#include <Zandor/model/Description.h>
+#include <Zandor/reader/Result.h>
+
+#include <QSqlDatabase>
+
+#include <memory>
+
+namespace zandor::reader {
+
+using platform::String;
+
+/// A table or view by name; an empty schema is the database's default one.
+struct TableId {
+    String schema;
+    String name;
+
+    friend bool operator==(const TableId&, const TableId&) = default;
+};
+
+struct TableEntry {
+    TableId id;
+    bool isView = false;
+
+    friend bool operator==(const TableEntry&, const TableEntry&) = default;
+};
+
+/// The names as the foreign key words them, which may differ in case from the names of the tables.
+struct ForeignKey {
+    TableId child;
+    TableId parent;
+    std::vector<std::pair<String, String>> columns; ///< child's and parent's, pair by pair
+
+    friend bool operator==(const ForeignKey&, const ForeignKey&) = default;
+};
+
+/// Reads the structure of a database, nothing of its rows: first what tables there are, then the
+/// columns of those that are asked for.
+class DatabaseReader {
+public:
+    virtual ~DatabaseReader() = default;
+    /// Tables and views in the order of their names; none of the database's own.
+    virtual Result<std::vector<TableEntry>> tables() = 0;
+    /// The columns of a table or view in their order. A table that is not there is an error.
+    virtual Result<model::TableDescription> table(const TableId& id) = 0;
+    /// The foreign keys that a table declares, in the order of their declaration; none for a table
+    /// that is not there. One that names no column of the parent means the parent's primary key;
+    /// it is left out when that does not fit.
+    virtual Result<std::vector<ForeignKey>> foreignKeys(const TableId& child) = 0;
+};
+
+/// Readers of an open database, which stays open as long as the reader is used.
+std::unique_ptr<DatabaseReader> makeSqliteReader(const QSqlDatabase& database);
+std::unique_ptr<DatabaseReader> makePostgresReader(const QSqlDatabase& database);
+/// Knows of any engine what its Qt driver tells: tables, columns, primary keys; no foreign keys.
+std::unique_ptr<DatabaseReader> makeGenericReader(const QSqlDatabase& database);
+/// The one for the database's engine.
+std::unique_ptr<DatabaseReader> makeReader(const QSqlDatabase& database);
+
+} // namespace zandor::reader

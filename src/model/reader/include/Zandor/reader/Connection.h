@@ -1,0 +1,48 @@
+#pragma once
+
+#include <Zandor/reader/Result.h>
+
+#include <QSqlDatabase>
+
+namespace zandor::reader {
+
+/// An open database under a connection name of its own, closed when the object goes.
+class Connection {
+public:
+    /// Takes over an open database that nobody else uses.
+    explicit Connection(QSqlDatabase database) : mDatabase(std::move(database)) {}
+    Connection(Connection&& other) noexcept { std::swap(mDatabase, other.mDatabase); }
+    Connection& operator=(Connection&& other) noexcept {
+        std::swap(mDatabase, other.mDatabase);
+        return *this;
+    }
+    ~Connection();
+
+    const QSqlDatabase& database() const { return mDatabase; }
+
+private:
+    QSqlDatabase mDatabase;
+};
+
+/// Opens an SQLite file for reading only; the file is never written or created. Needs a
+/// QCoreApplication.
+Result<Connection> openSqlite(const QString& path);
+
+/// Opens a database for reading only: a path of an SQLite file, or an address
+///
+///     postgresql://user@host:port/database        also postgres://
+///     mysql://user@host:port/database             also mariadb://
+///     odbc://user@data-source
+///
+/// each part but the scheme as far as the engine needs it. Behind a "?" an address may have the
+/// options sslmode, sslrootcert, sslcert, sslkey, connect_timeout (seconds; 10 unless given) and
+/// application_name of PostgreSQL, and host, the folder of the server's socket, which takes the
+/// place of the host. The password is `password`, or that of the address when it is empty; no
+/// message shows it. Needs a QCoreApplication.
+Result<Connection> openDatabase(const QString& address, const QString& password = {});
+
+/// Whether the engine still answers; after a failure this tells a connection that has broken down
+/// from a statement that was refused. Takes a way to the server and back.
+bool answers(const Connection& connection);
+
+} // namespace zandor::reader

@@ -1,0 +1,29 @@
+#pragma once
+
+#include <Zandor/platform/String.h>
+#include <Zandor/reader/Result.h>
+
+#include <QSqlDatabase>
+#include <QSqlError>
+#include <QSqlQuery>
+#include <QVariant>
+
+#include <functional>
+#include <optional>
+
+namespace zandor::reader {
+
+QString toQt(const platform::String& text);
+platform::String textAt(const QSqlQuery& row, int column);
+
+/// Calls `use` for every row of a statement; the error when it fails. `what` is what is being read,
+/// as the beginning of a sentence.
+std::optional<Error> readRows(const QSqlDatabase& database, const QString& what,
+                              const QString& statement, const QVariantList& parameters,
+                              const std::function<void(const QSqlQuery&)>& use);
+
+/// The engine's words about a failure with what to do about it. `failed` is what could not be done,
+/// without a full stop.
+Error databaseError(const QSqlDatabase& database, const QString& failed, const QSqlError& error);
+
+} // namespace zandor::reader

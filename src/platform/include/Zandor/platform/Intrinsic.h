@@ -1,0 +1,171 @@
+#pragma once
+
+#include <Zandor/platform/Control.h>
+
+#include <functional>
+#include <memory>
+#include <vector>
+
+/// The intrinsic controls that the control is built of. Event parameters keep their classic
+/// meaning: Button 1 left, 2 right, 4 middle, added up; Shift 1 shift, 2 control, 4 alt, added up;
+/// X and Y in twips in the coordinates of the control that reports.
+namespace zandor::platform {
+
+inline constexpr std::int16_t leftButton = 1;
+inline constexpr std::int16_t rightButton = 2;
+inline constexpr std::int16_t keyEscape = 27;
+
+using MouseEvent = std::function<void(std::int16_t Button, std::int16_t Shift, float X, float Y)>;
+using KeyEvent = std::function<void(std::int16_t KeyCode, std::int16_t Shift)>;
+using PlainEvent = std::function<void()>;
+
+struct FrameEvents {
+    MouseEvent MouseDown;
+    MouseEvent MouseUp;
+};
+
+class Frame : public Control {
+public:
+    /// As set last, whatever is true of the containers.
+    virtual bool Visible() const = 0;
+    virtual void Visible(bool value) = 0;
+    /// Brings the frame before its siblings.
+    virtual void ZOrder() = 0;
+};
+
+struct CommandButtonEvents {
+    PlainEvent Click;
+    PlainEvent GotFocus;
+};
+
+class CommandButton : public Control {
+public:
+    virtual void Caption(const String& value) = 0;
+    virtual void Enabled(bool value) = 0;
+    /// Enter in a sibling input presses the default button.
+    virtual void Default(bool value) = 0;
+    virtual void Font(const platform::Font& value) = 0;
+};
+
+class ComboBox : public Control {
+public:
+    /// The chosen position, 0-based; -1 when nothing is chosen.
+    virtual std::int16_t ListIndex() const = 0;
+    /// Error 380 outside -1 to the last position; the choice then stays.
+    virtual void ListIndex(std::int16_t value) = 0;
+    virtual String Text() const = 0;
+    virtual void Clear() = 0;
+    virtual void AddItem(const String& text) = 0;
+    virtual void Enabled(bool value) = 0;
+    virtual void Font(const platform::Font& value) = 0;
+    virtual void SetFocus() = 0;
+    /// Shows the list, with the chosen item as its current one, as soon as its user's hands are
+    /// free for it. A list that has dropped down so takes Enter for its current item; Escape, and
+    /// Tab with its current item chosen, close it and reach the box.
+    virtual void DropDown() = 0;
+};
+
+class TextBox : public Control {
+public:
+    virtual String Text() const = 0;
+    virtual void Text(const String& value) = 0;
+    virtual void SetFocus() = 0;
+};
+
+class Label : public Control {
+public:
+    virtual void Caption(const String& value) = 0;
+    virtual void Font(const platform::Font& value) = 0;
+};
+
+enum class Orientation { horizontal, vertical };
+
+struct ScrollBarEvents {
+    PlainEvent Change;
+    PlainEvent GotFocus;
+};
+
+/// A scroll bar from 0 to Max. Change fires whenever Value changes, whoever changed it.
+class ScrollBar : public Control {
+public:
+    virtual std::int16_t Max() const = 0;
+    /// A Max below Value moves Value down to it. Error 380 for a negative one.
+    virtual void Max(std::int16_t value) = 0;
+    virtual std::int16_t Value() const = 0;
+    /// Error 380 outside 0 to Max; the position then stays.
+    virtual void Value(std::int16_t value) = 0;
+    virtual void LargeChange(std::int16_t value) = 0;
+    virtual void Enabled(bool value) = 0;
+};
+
+/// Short texts at a line, from its first end to its second, and the whole in a sentence. Empty ones
+/// are not shown.
+struct LineNotes {
+    String First;
+    String Middle;
+    String Second;
+    String Sentence;
+
+    friend bool operator==(const LineNotes&, const LineNotes&) = default;
+};
+
+/// A line painted by the canvas, below every table. Coordinates in canvas twips.
+class Line {
+public:
+    virtual ~Line() = default;
+    virtual float X1() const = 0;
+    virtual float Y1() const = 0;
+    virtual float X2() const = 0;
+    virtual float Y2() const = 0;
+    virtual void setEnds(float X1, float Y1, float X2, float Y2) = 0;
+    /// In logical pixels; 1 is plain, 2 highlighted.
+    virtual void BorderWidth(std::int16_t value) = 0;
+    virtual void Visible(bool value) = 0;
+    /// A line has none at first.
+    virtual void Notes(const LineNotes& value) = 0;
+};
+
+inline constexpr std::int16_t shapeSquare = 1;
+inline constexpr std::int16_t shapeCircle = 3;
+
+/// A mark painted by the canvas, below every table.
+class Shape : public Control {
+public:
+    virtual void ShapeStyle(std::int16_t value) = 0;
+    virtual void Visible(bool value) = 0;
+};
+
+class MenuEntry {
+public:
+    virtual ~MenuEntry() = default;
+    virtual void Caption(const String& value) = 0;
+    virtual void Enabled(bool value) = 0;
+    virtual void Visible(bool value) = 0;
+};
+
+/// A menu that is only ever popped up. Its entries stand in the order of their making.
+class PopupMenu {
+public:
+    virtual ~PopupMenu() = default;
+    /// Caption "-" makes a separator. An ampersand marks the mnemonic.
+    virtual std::unique_ptr<MenuEntry> makeEntry(const Design& design, PlainEvent Click) = 0;
+    /// Fires the menu's own click, shows it at the mouse and returns when it has closed; the
+    /// chosen entry's handler has run by then.
+    virtual void PopupMenuAtMouse() = 0;
+};
+
+struct DialogEvents {
+    /// The user closes the window by its frame or with Escape.
+    PlainEvent Close;
+};
+
+/// A modal dialog window; labels, inputs and buttons are made with it as their container.
+class Dialog : public Control {
+public:
+    virtual void Caption(const String& value) = 0;
+    /// Returns when the dialog has been hidden.
+    virtual void ShowModal() = 0;
+    virtual void Hide() = 0;
+};
+
+} // namespace zandor::platform

@@ -1,0 +1,22 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+namespace zandor::platform {
+
+/// Text as both kinds of host speak it: UTF-16 code units, compared binary.
+using String = std::u16string;
+using StringView = std::u16string_view;
+
+/// `value` in decimal digits, with a minus sign when negative and no blank.
+String decimal(std::int64_t value);
+
+/// UTF-16 from UTF-8; a malformed sequence becomes U+FFFD.
+String fromUtf8(std::string_view text);
+
+/// UTF-8 from UTF-16; an unpaired surrogate becomes U+FFFD.
+std::string toUtf8(StringView text);
+
+} // namespace zandor::platform

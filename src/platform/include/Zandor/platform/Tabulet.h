@@ -1,0 +1,113 @@
+#pragma once
+
+#include <Zandor/platform/Control.h>
+#include <Zandor/platform/ImageList.h>
+#include <Zandor/platform/Ref.h>
+
+#include <functional>
+
+/// The table-list control: a frame with a title bar, a close button and a scrollable list of
+/// columns, which the user moves by its title and resizes by its border.
+namespace TalvikTabulet {
+
+namespace platform = zandor::platform;
+
+using platform::Ref;
+using platform::String;
+
+struct Point {
+    float X = 0;
+    float Y = 0;
+};
+
+/// One entry of the list.
+class ColumnItem {
+public:
+    virtual ~ColumnItem() = default;
+    virtual const String& Text() const = 0;
+    /// The column's name is the entry's text.
+    const String& ColumnItemName() const { return Text(); }
+    virtual const String& Key() const = 0;
+    virtual bool Selected() const = 0;
+    virtual void Selected(bool value) = 0;
+    /// The number of the image beside the text, from the list that the table list has then; 0, or
+    /// one that the list has not: none. The control marks a column with 1.
+    virtual void Image(std::int16_t value) = 0;
+    /// Whether the column is shown as one that comes out in the query's rows.
+    virtual void ComesOut(bool value) = 0;
+    /// First follow-up of a changed selection: shows the entry as it now is.
+    virtual void Refresh() = 0;
+    /// Second follow-up: scrolls the list so that the entry is in view.
+    virtual void EnsureVisible() = 0;
+    /// On the left, respectively right, edge of the list at the middle of the entry's row, in
+    /// canvas twips; also when the row is scrolled out of view.
+    virtual Point LeftEdgePoint() const = 0;
+    virtual Point RightEdgePoint() const = 0;
+};
+
+class ColumnList {
+public:
+    virtual ~ColumnList() = default;
+    virtual std::int32_t Count() const = 0;
+    /// Position is 1-based; error 9 outside 1 to Count.
+    virtual const Ref<ColumnItem>& Item(std::int32_t position) const = 0;
+    virtual Ref<ColumnItem> Add(const String& key, const String& text) = 0;
+};
+
+class Tabulet : public platform::Control {
+public:
+    /// The default property: the table's display name in the title bar.
+    virtual const String& Text() const = 0;
+    virtual void Text(const String& value) = 0;
+    virtual const String& Tag() const = 0;
+    virtual void Tag(const String& value) = 0;
+    virtual bool Visible() const = 0;
+    virtual void Visible(bool value) = 0;
+    virtual void Activated(bool value) = 0;
+    virtual void Font(const platform::Font& value) = 0;
+    /// What the images of its entries are taken from; it has none at first.
+    virtual void Images(const Ref<platform::ImageList>& value) = 0;
+    /// Unique among the live table lists of the process, never 0.
+    virtual std::int32_t TableHandle() const = 0;
+    virtual ColumnList& ColumnItems() = 0;
+    /// The entry under a point in the table list's own coordinates (twips), or nothing.
+    virtual Ref<ColumnItem> ColumnAt(float X, float Y) const = 0;
+    virtual void ZOrder() = 0;
+    /// Error 5 when the control cannot take the focus now.
+    virtual void SetFocus() = 0;
+    /// 1 begins a drag with the table list as its source.
+    virtual void Drag(std::int16_t action) = 0;
+    /// The list has been filled, or is to be shown afresh.
+    virtual void Complete() = 0;
+    /// Releases what the table list holds: its entries.
+    virtual void Terminate() = 0;
+    /// The element has been unloaded: the table list leaves the canvas for good and reports nothing
+    /// more. Whoever still holds it, or one of its entries, can read its texts.
+    virtual void Unload() = 0;
+};
+
+/// What a table list tells; every event carries the element's index first.
+struct TabuletEvents {
+    using Plain = std::function<void(std::int16_t Index)>;
+    using Mouse = std::function<void(std::int16_t Index, const Ref<ColumnItem>& Column,
+                                     std::int16_t Button, std::int16_t Shift)>;
+
+    Plain CloseClick;
+    Plain GotFocus;
+    Mouse ColumnMouseDown;
+    Mouse ColumnMouseMove;
+    Mouse ColumnMouseUp;
+    /// The user has changed the selection otherwise than by pressing an entry.
+    Plain SelectionChanged;
+    std::function<void(std::int16_t Index, platform::Control* Source, float X, float Y,
+                       std::int16_t State)>
+        DragOver;
+    std::function<void(std::int16_t Index, platform::Control* Source, float X, float Y)> DragDrop;
+    /// While the user moves or resizes the table list; Moved or Resized follows at the end.
+    Plain Moving;
+    Plain Moved;
+    Plain Resized;
+    Plain Scroll;
+};
+
+} // namespace TalvikTabulet

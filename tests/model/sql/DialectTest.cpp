@@ -1,0 +1,170 @@
+#include <Zandor/sql/Dialect.h>
+
+#include "model/sql/ReservedWords.h"
+
+#include <gtest/gtest.h>
+
+using namespace zandor;
+
+using namespace model::sql;
+using model::ColumnType;
+using platform::toUtf8;
+
+namespace {
+
+std::string quoted(platform::StringView name, Dialect dialect) {
+    return toUtf8(identifier(name, dialect));
+}
+
+std::string refused(const platform::String& name, Dialect dialect) {
+    return toUtf8(cannotCarry(name, dialect).value_or(u""));
+}
+
+std::string written(ColumnType type, platform::String text, Dialect dialect) {
+    return toUtf8(literal({type, std::move(text)}, dialect));
+}
+
+} // namespace
+
+TEST(AnIdentifier, StandsBareWhenItIsPlain) {
+    for (const Dialect dialect : allDialects)
+        for (const auto* name : {u"orders", u"_x1", u"order_lines"})
+            EXPECT_EQ(quoted(name, dialect), toUtf8(name));
+}
+
+TEST(AnIdentifier, IsQuotedWhenItIsNot) {
+    for (const auto* name : {u"", u"two words", u"1st", u"a.b", u"a-b", u"größe", u"a;b", u"a?b"}) {
+        const std::string text = toUtf8(name);
+        EXPECT_EQ(quoted(name, Dialect::SQLite), '"' + text + '"');
+        EXPECT_EQ(quoted(name, Dialect::PostgreSQL), '"' + text + '"');
+        EXPECT_EQ(quoted(name, Dialect::Standard), '"' + text + '"');
+        EXPECT_EQ(quoted(name, Dialect::MySQL), '`' + text + '`');
+        EXPECT_EQ(quoted(name, Dialect::SqlServer), '[' + text + ']');
+    }
+}
+
+TEST(AnIdentifier, HasItsQuotationMarksDoubled) {
+    EXPECT_EQ(quoted(u"a\"b`c]d[e", Dialect::SQLite), "\"a\"\"b`c]d[e\"");
+    EXPECT_EQ(quoted(u"a\"b`c]d[e", Dialect::PostgreSQL), "\"a\"\"b`c]d[e\"");
+    EXPECT_EQ(quoted(u"a\"b`c]d[e", Dialect::Standard), "\"a\"\"b`c]d[e\"");
+    EXPECT_EQ(quoted(u"a\"b`c]d[e", Dialect::MySQL), "`a\"b``c]d[e`");
+    EXPECT_EQ(quoted(u"a\"b`c]d[e", Dialect::SqlServer), "[a\"b`c]]d[e]");
+}
+
+TEST(AnIdentifier, KeepsItsCapitalsOnPostgres) {
+    EXPECT_EQ(quoted(u"Orders", Dialect::PostgreSQL), "\"Orders\"");
+    EXPECT_EQ(quoted(u"Orders", Dialect::SQLite), "Orders");
+}
+
+TEST(AnIdentifier, IsQuotedWhenAnyDialectReservesIt) {
+    for (const auto* name : {u"select", u"SELECT", u"Order", u"user", u"rank", u"top", u"rlike",
+                             u"ilike", u"glob", u"year", u"count", u"zone"}) {
+        EXPECT_TRUE(isReserved(name)) << toUtf8(name);
+        for (const Dialect dialect : allDialects)
+            EXPECT_NE(quoted(name, dialect), toUtf8(name)) << toUtf8(name);
+    }
+    for (const auto* name : {u"name", u"status", u"title", u"quantity", u"city", u"selects", u""})
+        EXPECT_FALSE(isReserved(name)) << toUtf8(name);
+}
+
+TEST(AName, IsNotCarriedWhenItIsTooLong) {
+    const auto name = [](std::size_t length) { return platform::String(length, u'n'); };
+    const std::string beginning = "The name \"" + std::string(40, 'n') + "…\" is too long for ";
+    EXPECT_EQ(refused(name(63), Dialect::PostgreSQL), "");
+    EXPECT_EQ(refused(name(64), Dialect::PostgreSQL),
+              beginning + "PostgreSQL, which takes 63 bytes (one for a letter from A to Z, more "
+                          "for most others): choose a shorter one.");
+    EXPECT_EQ(refused(name(64), Dialect::MySQL), "");
+    EXPECT_EQ(refused(name(65), Dialect::MySQL),
+              beginning + "MySQL/MariaDB, which takes 64 characters: choose a shorter one.");
+    EXPECT_EQ(refused(name(128), Dialect::SqlServer), "");
+    EXPECT_EQ(refused(name(129), Dialect::SqlServer),
+              beginning + "SQL Server, which takes 128 characters: choose a shorter one.");
+    EXPECT_EQ(refused(name(129), Dialect::Standard),
+              beginning + "Standard SQL, which takes 128 characters: choose a shorter one.");
+    EXPECT_EQ(refused(name(5000), Dialect::SQLite), "");
+}
+
+TEST(AName, IsMeasuredInBytesOnPostgres) {
+    EXPECT_EQ(refused(platform::String(31, u'ö') + u"n", Dialect::PostgreSQL), "");
+    EXPECT_NE(refused(platform::String(32, u'ö'), Dialect::PostgreSQL), "");
+    EXPECT_EQ(refused(platform::String(64, u'ö'), Dialect::MySQL), "");
+}
+
+TEST(AName, IsNotCarriedWithACharacterThatIsNone) {
+    for (const Dialect dialect : allDialects) {
+        const std::string who = toUtf8(nameOf(dialect));
+        EXPECT_EQ(refused(platform::String(u"a\0b", 3), dialect),
+                  who + " takes no name with the character zero in it: choose another one.");
+        EXPECT_EQ(refused(u"", dialect), who + " takes no name that is empty: write one.");
+        for (const platform::String& torn :
+             {platform::String(u"a\xD83D"), platform::String(u"\xDE00z"),
+              platform::String(u"\xD83D\xD83D\xDE00")})
+            EXPECT_EQ(refused(torn, dialect),
+                      who + " takes no name with half a character in it: type it afresh.");
+    }
+}
+
+TEST(AName, IsNotCarriedByMySqlWhenItLiesBeyondTheBasicPlaneOrEndsWithABlank) {
+    EXPECT_EQ(
+        refused(u"a😀", Dialect::MySQL),
+        "The name \"a😀\" has a rare character in it that MySQL/MariaDB does not take, such as "
+        "an emoji: write it without.");
+    EXPECT_EQ(
+        refused(u"a ", Dialect::MySQL),
+        "The name \"a \" ends with a blank, which MySQL/MariaDB does not take: write it without.");
+    EXPECT_EQ(refused(u"a😀", Dialect::PostgreSQL), "");
+}
+
+TEST(AName, IsShortenedInAMessageBetweenTwoCharacters) {
+    const platform::String name = platform::String(39, u'n') + u"😀" + platform::String(99, u'n');
+    EXPECT_EQ(refused(name, Dialect::Standard),
+              "The name \"" + std::string(39, 'n') +
+                  "…\" is too long for Standard SQL, which takes 128 characters: choose a shorter "
+                  "one.");
+}
+
+TEST(ALiteral, OfTextHasItsApostrophesDoubled) {
+    const platform::String hostile = u"'; drop table x; --";
+    for (const Dialect dialect :
+         {Dialect::SQLite, Dialect::PostgreSQL, Dialect::MySQL, Dialect::Standard})
+        EXPECT_EQ(written(ColumnType::Text, hostile, dialect), "'''; drop table x; --'");
+    EXPECT_EQ(written(ColumnType::Text, hostile, Dialect::SqlServer), "N'''; drop table x; --'");
+}
+
+TEST(ALiteral, OfTextHasItsBackslashesDoubledOnMySqlOnly) {
+    EXPECT_EQ(written(ColumnType::Text, u"a\\'", Dialect::MySQL), "'a\\\\'''");
+    EXPECT_EQ(written(ColumnType::Text, u"a\\'", Dialect::PostgreSQL), "'a\\'''");
+}
+
+TEST(ALiteral, OfAMomentSaysWhatItIsWhereTheEngineKnows) {
+    EXPECT_EQ(written(ColumnType::Date, u"2024-05-01", Dialect::SQLite), "'2024-05-01'");
+    EXPECT_EQ(written(ColumnType::Date, u"2024-05-01", Dialect::PostgreSQL), "DATE '2024-05-01'");
+    EXPECT_EQ(written(ColumnType::Time, u"10:30:00", Dialect::MySQL), "TIME '10:30:00'");
+    EXPECT_EQ(written(ColumnType::Timestamp, u"2024-05-01 10:30:00", Dialect::Standard),
+              "TIMESTAMP '2024-05-01 10:30:00'");
+    EXPECT_EQ(written(ColumnType::Timestamp, u"2024-05-01 10:30:00", Dialect::SqlServer),
+              "CAST('2024-05-01 10:30:00' AS datetime2)");
+}
+
+TEST(ALiteral, OfABooleanIsADigitOnSqlServer) {
+    EXPECT_EQ(written(ColumnType::Boolean, u"true", Dialect::SqlServer), "1");
+    EXPECT_EQ(written(ColumnType::Boolean, u"false", Dialect::SqlServer), "0");
+    EXPECT_EQ(written(ColumnType::Boolean, u"true", Dialect::SQLite), "TRUE");
+    EXPECT_EQ(written(ColumnType::Boolean, u"false", Dialect::Standard), "FALSE");
+}
+
+TEST(APlaceholder, IsAQuestionMarkWithItsTypeOnPostgres) {
+    for (const Dialect dialect : allDialects)
+        if (dialect != Dialect::PostgreSQL) {
+            EXPECT_EQ(toUtf8(placeholder(ColumnType::Date, dialect)), "?");
+        }
+    EXPECT_EQ(toUtf8(placeholder(ColumnType::Date, Dialect::PostgreSQL)), "CAST(? AS date)");
+    EXPECT_EQ(toUtf8(placeholder(ColumnType::Integer, Dialect::PostgreSQL)), "CAST(? AS bigint)");
+    EXPECT_EQ(toUtf8(placeholder(ColumnType::Text, Dialect::PostgreSQL)), "?");
+}
+
+TEST(APattern, HasItsBracketsEscapedOnSqlServer) {
+    EXPECT_EQ(toUtf8(likePattern(u"a[b]%", Dialect::SqlServer)), "a\\[b]%");
+    EXPECT_EQ(toUtf8(likePattern(u"a[b]%", Dialect::SQLite)), "a[b]%");
+}

@@ -1,5 +1,0 @@
-#include "qt/strict_host/StrictHost.h"
-
-#include <gtest/gtest.h>
-
-TEST(AStrictHost, EmbedsTheWidgetAndHearsItsSignals) { EXPECT_EQ(strict::errorsHeard(), 1); }
