@@ -1,6 +1,6 @@
 #include "comforts/Door.h"
 
-#include "control/KeyNumber.h"
+#include <Zandor/control/KeyNumber.h>
 
 #include <algorithm>
 #include <set>

@@ -1,4 +1,4 @@
-#include "control/KeyNumber.h"
+#include <Zandor/control/KeyNumber.h>
 
 #include <Zandor/platform/Numbers.h>
 

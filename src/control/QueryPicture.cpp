@@ -1,6 +1,6 @@
 #include "control/QueryPicture.h"
 
-#include "control/KeyNumber.h"
+#include <Zandor/control/KeyNumber.h>
 
 #include <Zandor/control/ModelList.h>
 

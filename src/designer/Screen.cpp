@@ -1,5 +1,6 @@
 #include "designer/Screen.h"
 
+#include <QIcon>
 #include <QLoggingCategory>
 
 namespace zandor::designer {
@@ -34,7 +35,9 @@ std::unique_ptr<QApplication> makeApplication(int& argc, char** argv, bool offsc
     // Where the settings and what is kept safe stand.
     QCoreApplication::setOrganizationName(QStringLiteral("Zandor"));
     QCoreApplication::setApplicationName(QStringLiteral("zandor-designer"));
+    QGuiApplication::setDesktopFileName(QStringLiteral("zandor-designer"));
     auto application = std::make_unique<QApplication>(argc, argv);
+    QApplication::setWindowIcon(QIcon(QStringLiteral(":/zandor-designer.svg")));
     if (!decided) {
         QLoggingCategory::setFilterRules({});
         qunsetenv("QT_QPA_PLATFORM"); // programs started from here decide for themselves

@@ -4,6 +4,7 @@
 #include "designer/document/AutosaveSlot.h"
 #include "designer/document/paths.h"
 #include "designer/options/Languages.h"
+#include "designer/placeOfSample.h"
 #include "designer/run/spoolSweep.h"
 #include "designer/show/DrawingPicture.h"
 #include "designer/show/savePicture.h"
@@ -82,7 +83,7 @@ int main(int argc, char** argv) {
     if (!arguments->drawing.isEmpty()) return drawQuery(*arguments);
     designer::sweepSpools();
     designer::DesignerWindow window;
-    const QString sample = QStringLiteral(ZANDOR_SAMPLE_DATABASE);
+    const QString sample = designer::placeOfSample();
     const bool stays = arguments->screenshot.isEmpty() && !designer::isOffscreen();
     if (const auto error = window.openAtFirst(*arguments, sample)) {
         // Names that are not in the database were typed in a shell, where somebody reads this.

@@ -1,7 +1,8 @@
 #include "Invariants.h"
 
-#include "control/KeyNumber.h"
 #include "support/Backstage.h"
+
+#include <Zandor/control/KeyNumber.h>
 
 #include <algorithm>
 #include <bitset>

@@ -4,8 +4,6 @@
 
 #include <regex>
 
-using namespace zandor;
-
 // Text from files and databases is shown as it is, whoever writes the next dialog.
 
 TEST(TheDesigner, ShowsNoMessageBoxesButPlainOnes) {

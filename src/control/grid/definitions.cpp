@@ -1,6 +1,6 @@
 #include <Zandor/Zandor.h>
 
-#include "control/KeyNumber.h"
+#include <Zandor/control/KeyNumber.h>
 
 #include <algorithm>
 

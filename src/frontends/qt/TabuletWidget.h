@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/qt/export.h>
+
 #include "frontends/qt/ColumnListView.h"
 #include "frontends/qt/DragScroller.h"
 
@@ -13,7 +15,7 @@ namespace zandor::platform::qt {
 class Canvas;
 class ColumnListModel;
 
-class TabuletListener : public EntryListener {
+class ZANDOR_WIDGETS_EXPORT TabuletListener : public EntryListener {
 public:
     virtual void closeClicked() = 0;
     /// The right button has come up over the title.
@@ -29,7 +31,7 @@ public:
 };
 
 /// A table as a box: title bar with name and close button, list of columns, a border to resize by.
-class TabuletWidget : public QWidget {
+class ZANDOR_WIDGETS_EXPORT TabuletWidget : public QWidget {
     Q_OBJECT
 
 public:

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/qt/export.h>
+
 #include <QEvent>
 #include <QString>
 
@@ -10,7 +12,7 @@
 ///
 ///     if (event->type() == ZandorWindowMessage::typeOf("TALVIKDISABLEVELT"))
 ///         ... static_cast<ZandorWindowMessage*>(event)->wParam() ...
-class ZandorWindowMessage : public QEvent {
+class ZANDOR_WIDGETS_EXPORT ZandorWindowMessage : public QEvent {
 public:
     ZandorWindowMessage(Type type, std::uintptr_t wParam, std::int32_t* lParam)
         : QEvent(type), mWParam(wParam), mLParam(lParam) {}

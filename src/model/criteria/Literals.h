@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/model/export.h>
 #include <Zandor/sql/Expression.h>
 
 #include <optional>
@@ -8,27 +9,27 @@
 namespace zandor::model::criteria {
 
 /// What a value of a type is called in a message: "a number", "a date (2024-12-31)".
-StringView nameOf(ColumnType type);
+ZANDOR_MODEL_EXPORT StringView nameOf(ColumnType type);
 /// What is said of something typed that is no value of a type, ending with a way to write one.
-StringView refusalOf(ColumnType type);
-bool isNumber(ColumnType type);
+ZANDOR_MODEL_EXPORT StringView refusalOf(ColumnType type);
+ZANDOR_MODEL_EXPORT bool isNumber(ColumnType type);
 
 /// The value that a text is for a column of a type, canonical, or nothing when it is none.
 /// Numbers: sign, digits, point, exponent. Dates: year-month-day, checked against the calendar.
 /// Times: hour:minute, seconds if need be. Timestamps: a date, with a time behind it (blank or T
 /// between) or midnight. Booleans: true, false, yes, no, 1, 0. A column of an unknown type takes
 /// numbers as numbers and all else as text; a blob takes no typed value.
-std::optional<sql::Value> literal(StringView text, ColumnType type);
+ZANDOR_MODEL_EXPORT std::optional<sql::Value> literal(StringView text, ColumnType type);
 
 /// The date, time or timestamp that a text between # signs is, for a column of a type; nothing for
 /// a column that holds something else.
-std::optional<sql::Value> momentLiteral(StringView text, ColumnType type);
+ZANDOR_MODEL_EXPORT std::optional<sql::Value> momentLiteral(StringView text, ColumnType type);
 
 /// Whether the engines can compare columns of these types with one meaning.
-bool comparable(ColumnType left, ColumnType right);
+ZANDOR_MODEL_EXPORT bool comparable(ColumnType left, ColumnType right);
 
 /// A pattern as typed, with * and % for any run, ? and _ for any one character, and a bracketed
 /// [*] for the character itself, in the form that sql::Like keeps.
-String likePattern(StringView typed);
+ZANDOR_MODEL_EXPORT String likePattern(StringView typed);
 
 } // namespace zandor::model::criteria

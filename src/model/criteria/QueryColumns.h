@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/model/export.h>
+
 #include "model/criteria/Parser.h"
 
 #include <Zandor/model/Table.h>
@@ -7,7 +9,7 @@
 namespace zandor::model::criteria {
 
 /// The columns that criteria of one query may name: those of its tables.
-class QueryColumns final : public Resolver {
+class ZANDOR_MODEL_EXPORT QueryColumns final : public Resolver {
 public:
     /// `tables` must outlive the object.
     explicit QueryColumns(const TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& tables)

@@ -1,12 +1,14 @@
 #pragma once
 
+#include <Zandor/files/export.h>
+
 #include <string_view>
 #include <utility>
 
 namespace zandor::files {
 
 /// An open file by the system's number, closed when the object goes.
-class Descriptor {
+class ZANDOR_FILES_EXPORT Descriptor {
 public:
     explicit Descriptor(int number = -1) : mNumber(number) {}
     Descriptor(Descriptor&& other) noexcept : mNumber(std::exchange(other.mNumber, -1)) {}
@@ -26,6 +28,6 @@ private:
 };
 
 /// Writes all of it; otherwise false, and why is in errno.
-bool writeAll(int file, std::string_view bytes);
+ZANDOR_FILES_EXPORT bool writeAll(int file, std::string_view bytes);
 
 } // namespace zandor::files

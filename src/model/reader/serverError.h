@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/reader/Result.h>
+#include <Zandor/reader/export.h>
 
 #include <QSqlError>
 
@@ -8,9 +9,9 @@ namespace zandor::reader {
 
 /// An error of an engine behind a network: its own words in one line, and what to do about it as
 /// far as the words tell. `failed` is what could not be done, without a full stop.
-Error serverError(const QString& failed, const QSqlError& error);
+ZANDOR_READER_EXPORT Error serverError(const QString& failed, const QSqlError& error);
 
 /// Whether a message of openDatabase says that the server wants a password, or another one.
-bool asksForPassword(const QString& message);
+ZANDOR_READER_EXPORT bool asksForPassword(const QString& message);
 
 } // namespace zandor::reader

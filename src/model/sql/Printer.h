@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/model/export.h>
 #include <Zandor/sql/Dialect.h>
 
 namespace zandor::model::sql {
@@ -25,6 +26,7 @@ struct Refusal {
 };
 
 /// The statement in a dialect, one clause a line. The same statement gives the same text.
-std::variant<Printed, Refusal> print(const Statement& statement, Dialect dialect, ValueForm form);
+ZANDOR_MODEL_EXPORT std::variant<Printed, Refusal> print(const Statement& statement,
+                                                         Dialect dialect, ValueForm form);
 
 } // namespace zandor::model::sql

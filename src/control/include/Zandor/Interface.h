@@ -2,6 +2,7 @@
 
 #include <Zandor/Zandor.h>
 #include <Zandor/platform/Variant.h>
+#include <Zandor/platform/export.h>
 
 #include <span>
 
@@ -47,8 +48,8 @@ struct EventMember {
 
 /// In the order fields, property procedures, methods; dispatch ids ascend in the first and the last
 /// group and descend in the second.
-std::span<const Member> members();
+ZANDOR_CONTROL_EXPORT std::span<const Member> members();
 
-std::span<const EventMember> events();
+ZANDOR_CONTROL_EXPORT std::span<const EventMember> events();
 
 } // namespace TalvikDBxZandor::automation

@@ -13,6 +13,7 @@
 #include <Zandor/platform/KeyedCollection.h>
 #include <Zandor/platform/Toolkit.h>
 #include <Zandor/platform/Words.h>
+#include <Zandor/platform/export.h>
 
 #include <optional>
 
@@ -38,7 +39,7 @@ struct DefinitionPicture;
 /// too, keeps toolkit, events and control in one house, and hands the control a weak reference to
 /// it: it calls `End`, lets go of the house, and the house stays until the last procedure has
 /// returned. Without such a keeper the control is destroyed while no procedure runs.
-class Zandor {
+class ZANDOR_CONTROL_EXPORT Zandor {
 public:
     static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.Zandor";
 

@@ -6,6 +6,7 @@
 #include <Zandor/model/Join.h>
 #include <Zandor/model/Record.h>
 #include <Zandor/model/Table.h>
+#include <Zandor/model/export.h>
 
 namespace zandor::model {
 
@@ -15,7 +16,8 @@ namespace zandor::model {
 /// Keys are a letter and a number ("t1" tables, "c1" columns, "j1" joins, "x1" definitions) and are
 /// never given twice in a query, not even after the object was deleted. Only a change that is
 /// undone takes the keys back that it gave.
-class Query final : public TalvikZandorLib::Zandor, public TalvikZandorLib::OrderedDefinitions {
+class ZANDOR_MODEL_EXPORT Query final : public TalvikZandorLib::Zandor,
+                                        public TalvikZandorLib::OrderedDefinitions {
 public:
     Query() = default;
     Query(const Query&) = delete;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/platform/Ref.h>
+#include <Zandor/platform/export.h>
 
 /// What the control asks of the host's query model. A host implements these classes over its own;
 /// an exception thrown from any of them is reported to the user and ends the procedure that called.
@@ -29,7 +30,7 @@ public:
     virtual void Remove(const String& key) = 0;
 };
 
-class ZDColumn {
+class ZANDOR_CONTROL_EXPORT ZDColumn {
 public:
     virtual ~ZDColumn() = default;
     virtual String Name() const = 0;
@@ -44,7 +45,7 @@ public:
 
 /// Placement is in twips; a negative Left or Top, and a Width or Height of 0 or less, leave the
 /// place, respectively the size, to the control.
-class ZDTable {
+class ZANDOR_CONTROL_EXPORT ZDTable {
 public:
     virtual ~ZDTable() = default;
     virtual String Name() const = 0;
@@ -65,7 +66,7 @@ public:
 
 /// JoinType: 0 normal, 1 left outer, 2 right outer, 3 both outer.
 /// CompareOperator: 0 "=", 1 "<>", 2 "<", 3 ">", 4 "<=", 5 ">=".
-class ZDJoin {
+class ZANDOR_CONTROL_EXPORT ZDJoin {
 public:
     virtual ~ZDJoin() = default;
     virtual Ref<ZDTable> LeftTable() const = 0;
@@ -83,7 +84,7 @@ public:
     virtual String Key() const = 0;
 };
 
-class ZDCriterium {
+class ZANDOR_CONTROL_EXPORT ZDCriterium {
 public:
     virtual ~ZDCriterium() = default;
     virtual String Criterium() const = 0;
@@ -91,7 +92,7 @@ public:
 };
 
 /// One output column. SortOrder: 0 none, 1 ascending, 2 descending.
-class ZDColumnDefinition {
+class ZANDOR_CONTROL_EXPORT ZDColumnDefinition {
 public:
     virtual ~ZDColumnDefinition() = default;
     virtual Ref<ZDColumn> Column() const = 0;
@@ -111,7 +112,7 @@ public:
 };
 
 /// The query.
-class Zandor {
+class ZANDOR_CONTROL_EXPORT Zandor {
 public:
     virtual ~Zandor() = default;
     virtual Collection<ZDTable>& Tables() = 0;
@@ -128,7 +129,7 @@ public:
 /// What a query may be besides: one whose definitions have an order, which is to be that of the
 /// grid's columns. The control asks for it by a cast of the query and never requires it; where it
 /// is missing, columns stand where they were dropped and cannot be moved.
-class OrderedDefinitions {
+class ZANDOR_CONTROL_EXPORT OrderedDefinitions {
 public:
     virtual ~OrderedDefinitions() = default;
     /// A definition of the query now stands right behind another one of it, or before all others
@@ -140,7 +141,7 @@ public:
 /// What a definition may be besides: one that keeps how wide its column of the grid is. It is asked
 /// for by a cast of the definition and never required; where it is missing, a width that somebody
 /// gives a column lasts as long as the control shows the query.
-class SizedDefinition {
+class ZANDOR_CONTROL_EXPORT SizedDefinition {
 public:
     virtual ~SizedDefinition() = default;
     /// In twips; 0 leaves the width to the control, and so does anything less. A wider column than
@@ -152,7 +153,7 @@ public:
 };
 
 /// Makes the model objects that the control needs of its own accord.
-class Library {
+class ZANDOR_CONTROL_EXPORT Library {
 public:
     virtual ~Library() = default;
     virtual Ref<Zandor> NewZandor() = 0;

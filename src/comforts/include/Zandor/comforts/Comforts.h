@@ -7,6 +7,7 @@
 #include <Zandor/platform/Tabulet.h>
 #include <Zandor/platform/Toolkit.h>
 #include <Zandor/platform/Words.h>
+#include <Zandor/platform/export.h>
 
 #include <map>
 #include <memory>
@@ -32,7 +33,7 @@ class Door;
 ///
 /// No member throws. A failure is reported in a message box, as the control's own are. Each may
 /// end with the control, and with the comforts themselves, when the host is told something.
-class Comforts {
+class ZANDOR_CONTROL_EXPORT Comforts {
 public:
     static constexpr platform::StringView ModuleName = u"comforts.Comforts";
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/TalvikZandorLib.h>
+#include <Zandor/platform/export.h>
 
 namespace TalvikDBxZandor {
 
@@ -29,7 +30,7 @@ struct EventArguments {
 };
 
 /// The host's end of the events.
-class ZandorEvents {
+class ZANDOR_CONTROL_EXPORT ZandorEvents {
 public:
     virtual ~ZandorEvents() = default;
     virtual void Raise(Event event, const EventArguments& arguments) = 0;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/platform/Toolkit.h>
+#include <Zandor/platform/export.h>
 
 #include <memory>
 
@@ -33,7 +34,7 @@ inline void require(bool stillThere) {
 ///   table list, `Draws` for a join, `mBinding` for a binding, ColData for a grid column.
 /// - One expression calls the model once: between two calls there must be a check.
 /// - No `catch (...)` of its own: `quietly` is for what may fail in silence.
-class Life final : public platform::MessageBoxes {
+class ZANDOR_CONTROL_EXPORT Life final : public platform::MessageBoxes {
 public:
     /// `keeper` holds all that the control needs; each procedure keeps it until it has returned.
     Life(platform::MessageBoxes& boxes, std::weak_ptr<void> keeper)

@@ -2,12 +2,13 @@
 
 #include <Zandor/TalvikZandorLib.h>
 #include <Zandor/control/basZandor.h>
+#include <Zandor/platform/export.h>
 
 namespace TalvikDBxZandor {
 
 /// One dragged or copied column. It holds its four objects until it ends, whatever became of the
 /// table: a table list that has been unloaded, and its entries, still say their texts.
-class clsDragColumn {
+class ZANDOR_CONTROL_EXPORT clsDragColumn {
 public:
     static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.clsDragColumn";
 

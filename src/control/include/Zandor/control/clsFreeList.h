@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/platform/Toolkit.h>
+#include <Zandor/platform/export.h>
 
 #include <vector>
 
@@ -10,7 +11,7 @@ namespace platform = zandor::platform;
 
 /// Hands out the lowest free index of a fixed range and takes indexes back. Every failure is
 /// reported in a box; the member then returns its result as it stood and changes no count.
-class clsFreeList {
+class ZANDOR_CONTROL_EXPORT clsFreeList {
 public:
     // The module name lacks the "DBx" of its siblings; reports have always read so.
     static constexpr platform::StringView ModuleName = u"TalvikZandor.clsFreeList";

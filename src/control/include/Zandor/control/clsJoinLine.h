@@ -2,12 +2,13 @@
 
 #include <Zandor/control/basZandor.h>
 #include <Zandor/platform/Variant.h>
+#include <Zandor/platform/export.h>
 
 namespace TalvikDBxZandor {
 
 /// The canvas record of one join. A plain record: no setter checks its value; handles, codes and
 /// indexes are stored as they come. Indexes of -1 mean that no drawing element is allotted yet.
-class clsJoinLine {
+class ZANDOR_CONTROL_EXPORT clsJoinLine {
 public:
     static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.clsJoinLine";
     using String = platform::String;

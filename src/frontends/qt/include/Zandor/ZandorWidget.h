@@ -3,6 +3,7 @@
 #include <Zandor/Zandor.h>
 #include <Zandor/comforts/Field.h>
 #include <Zandor/comforts/Flags.h>
+#include <Zandor/qt/export.h>
 
 #include <QMap>
 #include <QWidget>
@@ -34,7 +35,7 @@ class QtToolkit;
 /// signals, in a call of the model, while a message box, the join dialog, the menu or a drag of it
 /// stands open, which then close. The one exception is the widget's own resizing, in which Qt does
 /// not let any widget be deleted.
-class ZandorWidget : public QWidget {
+class ZANDOR_WIDGETS_EXPORT ZandorWidget : public QWidget {
     Q_OBJECT
     // One property a line.
     // clang-format off

@@ -2,6 +2,7 @@
 
 #include <Zandor/Query.h>
 #include <Zandor/files/Error.h>
+#include <Zandor/files/export.h>
 
 #include <memory>
 #include <optional>
@@ -17,7 +18,7 @@ struct Unknown;
 /// A query as a file holds it. A document made from a query alone has nothing beyond it. What the
 /// file said beyond this version's knowledge belongs to the object it stood at, by that object's
 /// key, and is written again as long as the object is there.
-struct QueryDocument {
+struct ZANDOR_FILES_EXPORT QueryDocument {
     QueryDocument() = default;
     QueryDocument(platform::Ref<model::Query> query) : query(std::move(query)) {}
 
@@ -34,16 +35,16 @@ inline constexpr int currentVersion = 2;
 /// The document as JSON. Refused when a text in the query has half a character (an unpaired
 /// surrogate) or the query goes beyond the limits of a file: what is written can be read again,
 /// and is the same then.
-Result<std::string> toJson(const QueryDocument& document);
+ZANDOR_FILES_EXPORT Result<std::string> toJson(const QueryDocument& document);
 
 /// The document that a text holds: UTF-8, of this version or an older one. Refuses everything else
 /// and says in which line or under which JSON pointer the fault is.
-Result<QueryDocument> fromJson(std::string_view text);
+ZANDOR_FILES_EXPORT Result<QueryDocument> fromJson(std::string_view text);
 
 /// Writes the file as a Replacement: on a failure the old file is as it was and no other is left.
 /// Nothing on success.
-std::optional<Error> saveQuery(const Path& path, const QueryDocument& document);
+ZANDOR_FILES_EXPORT std::optional<Error> saveQuery(const Path& path, const QueryDocument& document);
 
-Result<QueryDocument> loadQuery(const Path& path);
+ZANDOR_FILES_EXPORT Result<QueryDocument> loadQuery(const Path& path);
 
 } // namespace zandor::files

@@ -3,11 +3,12 @@
 #include <Zandor/model/Description.h>
 #include <Zandor/model/FieldColumn.h>
 #include <Zandor/model/Place.h>
+#include <Zandor/model/export.h>
 
 namespace zandor::model {
 
 /// A column of a table in the query. Its key is unique in the whole query.
-class Column final : public TalvikZandorLib::ZDColumn {
+class ZANDOR_MODEL_EXPORT Column final : public TalvikZandorLib::ZDColumn {
 public:
     /// The name of the entry that stands for all columns of its table.
     static constexpr platform::StringView allColumns = u"*";

@@ -2,6 +2,7 @@
 
 #include <Zandor/model/Criteria.h>
 #include <Zandor/model/Place.h>
+#include <Zandor/model/export.h>
 
 namespace zandor::model {
 
@@ -9,8 +10,8 @@ class Query;
 
 /// One output column. It names its column by key, which reads as nothing once the table was
 /// deleted or the query is gone.
-class ColumnDefinition final : public TalvikZandorLib::ZDColumnDefinition,
-                               public TalvikZandorLib::SizedDefinition {
+class ZANDOR_MODEL_EXPORT ColumnDefinition final : public TalvikZandorLib::ZDColumnDefinition,
+                                                   public TalvikZandorLib::SizedDefinition {
 public:
     /// The column under its name in the grid, "table.column" (see FieldColumn); place() leads to
     /// the column itself.

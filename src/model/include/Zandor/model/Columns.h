@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Layout.h>
+#include <Zandor/model/export.h>
 
 namespace zandor::model::layout {
 
@@ -9,8 +10,8 @@ namespace zandor::model::layout {
 /// across each other as far as a search among the neighbours of an arrangement finds it. The same
 /// tables and links always give the same boxes. Tables that have a place in `standing` are moved
 /// from it only where something is gained.
-std::vector<Box> arrangeInColumns(const std::vector<Size>& sizes, const std::vector<Link>& links,
-                                  std::int32_t canvasWidth,
-                                  const std::vector<std::optional<Place>>& standing = {});
+ZANDOR_MODEL_EXPORT std::vector<Box>
+arrangeInColumns(const std::vector<Size>& sizes, const std::vector<Link>& links,
+                 std::int32_t canvasWidth, const std::vector<std::optional<Place>>& standing = {});
 
 } // namespace zandor::model::layout

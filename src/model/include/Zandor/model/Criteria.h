@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/References.h>
+#include <Zandor/model/export.h>
 
 #include <map>
 
@@ -10,7 +11,7 @@ using platform::Ref;
 using platform::String;
 
 /// The criterion of one row.
-class RowCriterium final : public TalvikZandorLib::ZDCriterium {
+class ZANDOR_MODEL_EXPORT RowCriterium final : public TalvikZandorLib::ZDCriterium {
 public:
     /// `revision` is that of the definition, raised also after the criterium was removed from it.
     explicit RowCriterium(std::shared_ptr<Revision> revision, String text = {})
@@ -37,7 +38,8 @@ private:
 ///
 /// Rows mean something across definitions (criteria of one row hold together), so a criterium keeps
 /// its row: by position, a row without one reads as an empty criterium that belongs to nobody.
-class Criteria final : public TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDCriterium> {
+class ZANDOR_MODEL_EXPORT Criteria final
+    : public TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDCriterium> {
 public:
     static constexpr std::int16_t firstRow = 4;
 

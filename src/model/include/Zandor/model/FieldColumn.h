@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/TalvikZandorLib.h>
+#include <Zandor/model/export.h>
 
 namespace zandor::model {
 
@@ -9,7 +10,7 @@ class Column;
 /// A column as the grid of output columns names it: "orders.total", under the name that its table
 /// has at the moment, so that equal columns of two tables can be told apart. In everything else it
 /// is the column, which it is a part of.
-class FieldColumn final : public TalvikZandorLib::ZDColumn {
+class ZANDOR_MODEL_EXPORT FieldColumn final : public TalvikZandorLib::ZDColumn {
 public:
     explicit FieldColumn(Column& column) : mColumn(column) {}
     FieldColumn(const FieldColumn&) = delete;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Place.h>
+#include <Zandor/model/export.h>
 
 namespace zandor::model {
 
@@ -11,7 +12,7 @@ class Query;
 ///
 /// A new join takes any ends, and Query::AddJoin judges them. Once it has its key it stays with its
 /// query: an end of another query is error 5, and nothing as an end error 91.
-class Join final : public TalvikZandorLib::ZDJoin {
+class ZANDOR_MODEL_EXPORT Join final : public TalvikZandorLib::ZDJoin {
 public:
     Ref<TalvikZandorLib::ZDTable> LeftTable() const override;
     /// Setting another table than before empties the column of that end.

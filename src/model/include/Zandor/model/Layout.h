@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/model/export.h>
+
 #include <cstddef>
 #include <cstdint>
 #include <optional>
@@ -32,7 +34,7 @@ struct Box {
 
 /// The size of a table with this many entries, the longest of which (or the title) has this many
 /// characters: all entries show up to ten, behind that the list scrolls.
-Size fittedSize(std::size_t entries, std::size_t longestText);
+ZANDOR_MODEL_EXPORT Size fittedSize(std::size_t entries, std::size_t longestText);
 
 /// A pair of tables that a join connects: positions from 0 in `sizes`, or behind them in `taken`.
 using Link = std::pair<std::size_t, std::size_t>;
@@ -43,15 +45,18 @@ using Link = std::pair<std::size_t, std::size_t>;
 /// they stand in columns by their joins (arrangeInColumns); otherwise to the right of what they are
 /// joined to, or to the left of it, and where neither is free in the cells, as large as the largest
 /// table, of a grid.
-std::vector<Box> arrange(const std::vector<Size>& sizes, const std::vector<Link>& links,
-                         const std::vector<Box>& taken, std::int32_t canvasWidth);
+ZANDOR_MODEL_EXPORT std::vector<Box> arrange(const std::vector<Size>& sizes,
+                                             const std::vector<Link>& links,
+                                             const std::vector<Box>& taken,
+                                             std::int32_t canvasWidth);
 
 /// Boxes for all tables of a drawing that has grown: in columns, as above, but so that those with a
 /// place in `standing` move no further than it is worth, for somebody knows by now where they are,
 /// and that all columns begin at the top, where they are seen. A table is new where `standing` has
 /// nothing, or ends before it.
-std::vector<Box> arrangeAgain(const std::vector<Size>& sizes, const std::vector<Link>& links,
-                              const std::vector<std::optional<Place>>& standing,
-                              std::int32_t canvasWidth);
+ZANDOR_MODEL_EXPORT std::vector<Box> arrangeAgain(const std::vector<Size>& sizes,
+                                                  const std::vector<Link>& links,
+                                                  const std::vector<std::optional<Place>>& standing,
+                                                  std::int32_t canvasWidth);
 
 } // namespace zandor::model::layout

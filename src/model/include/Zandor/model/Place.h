@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Items.h>
+#include <Zandor/model/export.h>
 
 /// How joins and definitions name their tables and columns: by key within one query's tables. A
 /// place holds no table, so nothing owns in a circle, and it may outlive the query.
@@ -15,7 +16,7 @@ class Table;
 /// The tables of one query.
 using Tables = Items<Table, TalvikZandorLib::ZDTable>;
 
-class TablePlace {
+class ZANDOR_MODEL_EXPORT TablePlace {
 public:
     TablePlace() = default;
     TablePlace(std::weak_ptr<const Tables> home, String key)
@@ -39,7 +40,7 @@ private:
     String mKey;
 };
 
-class ColumnPlace {
+class ZANDOR_MODEL_EXPORT ColumnPlace {
 public:
     ColumnPlace() = default;
     ColumnPlace(TablePlace table, String key) : mTable(std::move(table)), mKey(std::move(key)) {}
@@ -63,7 +64,7 @@ private:
 
 /// The place of a table or column; an empty one for nothing. Error 5 for an object of another
 /// model library.
-TablePlace placeOf(const Ref<TalvikZandorLib::ZDTable>& table);
-ColumnPlace placeOf(const Ref<TalvikZandorLib::ZDColumn>& column);
+ZANDOR_MODEL_EXPORT TablePlace placeOf(const Ref<TalvikZandorLib::ZDTable>& table);
+ZANDOR_MODEL_EXPORT ColumnPlace placeOf(const Ref<TalvikZandorLib::ZDColumn>& column);
 
 } // namespace zandor::model

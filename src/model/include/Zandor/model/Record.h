@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Description.h>
+#include <Zandor/model/export.h>
 
 #include <cstdint>
 #include <optional>
@@ -107,7 +108,7 @@ inline constexpr std::int32_t greatestKeyNumber = 1'000'000'000;
 
 /// The number of a key that is `letter` and a number from 1 to the greatest, or nothing: one number
 /// has one key, without a leading zero.
-std::optional<std::int32_t> keyNumber(StringView key, char16_t letter);
+ZANDOR_MODEL_EXPORT std::optional<std::int32_t> keyNumber(StringView key, char16_t letter);
 
 /// Why a record is none of a query.
 struct RecordFault {
@@ -118,6 +119,6 @@ struct RecordFault {
 };
 
 /// The first fault of a record, or nothing.
-std::optional<RecordFault> faultOf(const QueryRecord& record);
+ZANDOR_MODEL_EXPORT std::optional<RecordFault> faultOf(const QueryRecord& record);
 
 } // namespace zandor::model

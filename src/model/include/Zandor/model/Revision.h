@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/model/export.h>
+
 #include <cstdint>
 #include <list>
 #include <memory>
@@ -11,7 +13,7 @@ class Revision;
 
 /// Which objects of a query have changed, and when: the longer ago, the further behind. To ask it
 /// takes as long as there are answers, however large the query is.
-class ChangeLog {
+class ZANDOR_MODEL_EXPORT ChangeLog {
 public:
     /// Counts the changes; 0 is before the first.
     using Moment = std::uint64_t;
@@ -34,7 +36,7 @@ private:
 
 /// An object's place in the log of its query. One that stands in no query yet has no log, and is
 /// changed without a trace.
-class Revision {
+class ZANDOR_MODEL_EXPORT Revision {
 public:
     Revision() = default;
     Revision(const Revision&) = delete;

@@ -2,6 +2,7 @@
 
 #include <Zandor/model/Change.h>
 #include <Zandor/model/Items.h>
+#include <Zandor/model/export.h>
 
 #include <unordered_map>
 
@@ -11,7 +12,7 @@ class Query;
 
 /// Remembers a query, and tells what is different later. Columns of tables are not looked at: they
 /// never change.
-class Snapshot {
+class ZANDOR_MODEL_EXPORT Snapshot {
 public:
     explicit Snapshot(Query& query) { update(query); }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Column.h>
+#include <Zandor/model/export.h>
 
 namespace zandor::model {
 
@@ -8,7 +9,7 @@ class Query;
 
 /// A database table as it stands in the query: the same one may stand there several times, each
 /// time under a name of its own. Its first column is the entry for all columns, "*".
-class Table final : public TalvikZandorLib::ZDTable {
+class ZANDOR_MODEL_EXPORT Table final : public TalvikZandorLib::ZDTable {
 public:
     /// Query::addTable makes tables. `columns` are the items that Columns() gives.
     Table(TablePlace place, String name, String schema, String sourceName,
@@ -64,7 +65,8 @@ private:
 };
 
 /// The table of a name as databases compare names, or nothing.
-Ref<Table> tableNamed(const TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& tables,
-                      platform::StringView name);
+ZANDOR_MODEL_EXPORT Ref<Table>
+tableNamed(const TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& tables,
+           platform::StringView name);
 
 } // namespace zandor::model

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/model/export.h>
+
 #include "model/sql/Printer.h"
 
 #include <Zandor/Query.h>
@@ -16,12 +18,12 @@ struct Built {
 
 /// The statement that a query draws. A criterion or definition that cannot be used is left out and
 /// named among the findings.
-Built build(Query& query);
+ZANDOR_MODEL_EXPORT Built build(Query& query);
 
 /// What a host shows: the findings of the query and, for a dialect, of its names and joins.
-Findings validate(Query& query, Dialect dialect);
+ZANDOR_MODEL_EXPORT Findings validate(Query& query, Dialect dialect);
 
-struct Text {
+struct ZANDOR_MODEL_EXPORT Text {
     String text; ///< empty when there is none
     std::vector<Binding> bindings;
     Findings findings;
@@ -31,7 +33,7 @@ struct Text {
 };
 
 /// The query as a statement of a dialect, of no more rows than `limit`.
-Text statementText(Query& query, Dialect dialect, ValueForm form,
-                   std::optional<std::int64_t> limit = {});
+ZANDOR_MODEL_EXPORT Text statementText(Query& query, Dialect dialect, ValueForm form,
+                                       std::optional<std::int64_t> limit = {});
 
 } // namespace zandor::model::sql

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/model/export.h>
 #include <Zandor/sql/Statement.h>
 
 namespace zandor::model::sql {
@@ -10,21 +11,21 @@ inline constexpr Dialect allDialects[] = {Dialect::SQLite, Dialect::PostgreSQL, 
                                           Dialect::SqlServer, Dialect::Standard};
 
 /// "SQLite", "PostgreSQL", "MySQL/MariaDB", "SQL Server", "Standard SQL".
-StringView nameOf(Dialect dialect);
+ZANDOR_MODEL_EXPORT StringView nameOf(Dialect dialect);
 
 /// A name as the dialect writes it, in quotes where it needs them.
-String identifier(StringView name, Dialect dialect);
+ZANDOR_MODEL_EXPORT String identifier(StringView name, Dialect dialect);
 
 /// Why the dialect cannot carry a name, in one line, or nothing when it can.
-std::optional<String> cannotCarry(StringView name, Dialect dialect);
+ZANDOR_MODEL_EXPORT std::optional<String> cannotCarry(StringView name, Dialect dialect);
 
 /// A value written out, in the dialect's quotes.
-String literal(const Value& value, Dialect dialect);
+ZANDOR_MODEL_EXPORT String literal(const Value& value, Dialect dialect);
 
 /// A pattern as sql::Like keeps it, as the dialect's LIKE reads it.
-String likePattern(StringView pattern, Dialect dialect);
+ZANDOR_MODEL_EXPORT String likePattern(StringView pattern, Dialect dialect);
 
 /// A placeholder for a value of a type that is handed over beside the statement.
-String placeholder(ColumnType type, Dialect dialect);
+ZANDOR_MODEL_EXPORT String placeholder(ColumnType type, Dialect dialect);
 
 } // namespace zandor::model::sql

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Description.h>
+#include <Zandor/model/export.h>
 
 #include <memory>
 #include <variant>
@@ -101,7 +102,7 @@ Node make(Part part) {
 
 /// The terms under one And, respectively Or; a single term stands for itself. Terms that are of
 /// the same kind themselves are taken apart. Nothing for no terms.
-Node allOf(std::vector<Node> terms);
-Node anyOf(std::vector<Node> terms);
+ZANDOR_MODEL_EXPORT Node allOf(std::vector<Node> terms);
+ZANDOR_MODEL_EXPORT Node anyOf(std::vector<Node> terms);
 
 } // namespace zandor::model::sql

@@ -2,6 +2,7 @@
 
 #include <Zandor/model/Description.h>
 #include <Zandor/reader/Result.h>
+#include <Zandor/reader/export.h>
 
 #include <QSqlDatabase>
 
@@ -37,7 +38,7 @@ struct ForeignKey {
 
 /// Reads the structure of a database, nothing of its rows: first what tables there are, then the
 /// columns of those that are asked for.
-class DatabaseReader {
+class ZANDOR_READER_EXPORT DatabaseReader {
 public:
     virtual ~DatabaseReader() = default;
     /// Tables and views in the order of their names; none of the database's own.
@@ -51,11 +52,13 @@ public:
 };
 
 /// Readers of an open database, which stays open as long as the reader is used.
-std::unique_ptr<DatabaseReader> makeSqliteReader(const QSqlDatabase& database);
-std::unique_ptr<DatabaseReader> makePostgresReader(const QSqlDatabase& database);
+ZANDOR_READER_EXPORT std::unique_ptr<DatabaseReader> makeSqliteReader(const QSqlDatabase& database);
+ZANDOR_READER_EXPORT std::unique_ptr<DatabaseReader>
+makePostgresReader(const QSqlDatabase& database);
 /// Knows of any engine what its Qt driver tells: tables, columns, primary keys; no foreign keys.
-std::unique_ptr<DatabaseReader> makeGenericReader(const QSqlDatabase& database);
+ZANDOR_READER_EXPORT std::unique_ptr<DatabaseReader>
+makeGenericReader(const QSqlDatabase& database);
 /// The one for the database's engine.
-std::unique_ptr<DatabaseReader> makeReader(const QSqlDatabase& database);
+ZANDOR_READER_EXPORT std::unique_ptr<DatabaseReader> makeReader(const QSqlDatabase& database);
 
 } // namespace zandor::reader

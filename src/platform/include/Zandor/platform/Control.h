@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/platform/String.h>
+#include <Zandor/platform/export.h>
 
 namespace zandor::platform {
 
@@ -22,7 +23,7 @@ struct Font {
 };
 
 /// Anything that stands somewhere in its container.
-class Control {
+class ZANDOR_CONTROL_EXPORT Control {
 public:
     Control() = default;
     Control(const Control&) = delete;

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/platform/export.h>
+
 #include <cstdint>
 #include <optional>
 
@@ -9,7 +11,7 @@ namespace zandor::platform {
 enum class Picture { key };
 
 /// Images for other controls, which know them by their numbers from 1 on.
-class ImageList {
+class ZANDOR_CONTROL_EXPORT ImageList {
 public:
     virtual ~ImageList() = default;
     /// What the image of a number shows; nothing where there is no such image.

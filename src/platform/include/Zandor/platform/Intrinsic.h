@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/platform/Control.h>
+#include <Zandor/platform/export.h>
 
 #include <functional>
 #include <memory>
@@ -24,7 +25,7 @@ struct FrameEvents {
     MouseEvent MouseUp;
 };
 
-class Frame : public Control {
+class ZANDOR_CONTROL_EXPORT Frame : public Control {
 public:
     /// As set last, whatever is true of the containers.
     virtual bool Visible() const = 0;
@@ -38,7 +39,7 @@ struct CommandButtonEvents {
     PlainEvent GotFocus;
 };
 
-class CommandButton : public Control {
+class ZANDOR_CONTROL_EXPORT CommandButton : public Control {
 public:
     virtual void Caption(const String& value) = 0;
     virtual void Enabled(bool value) = 0;
@@ -47,7 +48,7 @@ public:
     virtual void Font(const platform::Font& value) = 0;
 };
 
-class ComboBox : public Control {
+class ZANDOR_CONTROL_EXPORT ComboBox : public Control {
 public:
     /// The chosen position, 0-based; -1 when nothing is chosen.
     virtual std::int16_t ListIndex() const = 0;
@@ -65,14 +66,14 @@ public:
     virtual void DropDown() = 0;
 };
 
-class TextBox : public Control {
+class ZANDOR_CONTROL_EXPORT TextBox : public Control {
 public:
     virtual String Text() const = 0;
     virtual void Text(const String& value) = 0;
     virtual void SetFocus() = 0;
 };
 
-class Label : public Control {
+class ZANDOR_CONTROL_EXPORT Label : public Control {
 public:
     virtual void Caption(const String& value) = 0;
     virtual void Font(const platform::Font& value) = 0;
@@ -86,7 +87,7 @@ struct ScrollBarEvents {
 };
 
 /// A scroll bar from 0 to Max. Change fires whenever Value changes, whoever changed it.
-class ScrollBar : public Control {
+class ZANDOR_CONTROL_EXPORT ScrollBar : public Control {
 public:
     virtual std::int16_t Max() const = 0;
     /// A Max below Value moves Value down to it. Error 380 for a negative one.
@@ -110,7 +111,7 @@ struct LineNotes {
 };
 
 /// A line painted by the canvas, below every table. Coordinates in canvas twips.
-class Line {
+class ZANDOR_CONTROL_EXPORT Line {
 public:
     virtual ~Line() = default;
     virtual float X1() const = 0;
@@ -129,13 +130,13 @@ inline constexpr std::int16_t shapeSquare = 1;
 inline constexpr std::int16_t shapeCircle = 3;
 
 /// A mark painted by the canvas, below every table.
-class Shape : public Control {
+class ZANDOR_CONTROL_EXPORT Shape : public Control {
 public:
     virtual void ShapeStyle(std::int16_t value) = 0;
     virtual void Visible(bool value) = 0;
 };
 
-class MenuEntry {
+class ZANDOR_CONTROL_EXPORT MenuEntry {
 public:
     virtual ~MenuEntry() = default;
     virtual void Caption(const String& value) = 0;
@@ -144,7 +145,7 @@ public:
 };
 
 /// A menu that is only ever popped up. Its entries stand in the order of their making.
-class PopupMenu {
+class ZANDOR_CONTROL_EXPORT PopupMenu {
 public:
     virtual ~PopupMenu() = default;
     /// Caption "-" makes a separator. An ampersand marks the mnemonic.
@@ -160,7 +161,7 @@ struct DialogEvents {
 };
 
 /// A modal dialog window; labels, inputs and buttons are made with it as their container.
-class Dialog : public Control {
+class ZANDOR_CONTROL_EXPORT Dialog : public Control {
 public:
     virtual void Caption(const String& value) = 0;
     /// Returns when the dialog has been hidden.

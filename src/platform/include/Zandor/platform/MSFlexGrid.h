@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/platform/Intrinsic.h>
+#include <Zandor/platform/export.h>
 
 /// The grid of output columns. Rows and columns count from 0, sizes and positions are twips in
 /// the grid's own coordinates.
@@ -15,7 +16,7 @@ inline constexpr std::int16_t alignCenterCenter = 4;
 
 /// A row outside the grid is error 30009, a column error 30010; TextMatrix answers either with
 /// error 381. A refused call changes nothing.
-class MSFlexGrid : public platform::Control {
+class ZANDOR_CONTROL_EXPORT MSFlexGrid : public platform::Control {
 public:
     virtual void Visible(bool value) = 0;
     virtual void Font(const platform::Font& value) = 0;

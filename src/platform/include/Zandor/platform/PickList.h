@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/platform/Control.h>
+#include <Zandor/platform/export.h>
 
 #include <functional>
 #include <vector>
@@ -9,7 +10,7 @@ namespace zandor::platform {
 
 /// A list that drops down over a place of the control, below a box whose text filters it: the items
 /// that hold the text, in whatever case, are left. Escape and a loss of the focus close it.
-class PickList : public Control {
+class ZANDOR_CONTROL_EXPORT PickList : public Control {
 public:
     /// Shows the items over a place, with `typed` in the box and the focus in it. The item to begin
     /// with is the one at a position from 0 on if it is left, else the first.

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/platform/export.h>
+
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -11,12 +13,12 @@ using String = std::u16string;
 using StringView = std::u16string_view;
 
 /// `value` in decimal digits, with a minus sign when negative and no blank.
-String decimal(std::int64_t value);
+ZANDOR_CONTROL_EXPORT String decimal(std::int64_t value);
 
 /// UTF-16 from UTF-8; a malformed sequence becomes U+FFFD.
-String fromUtf8(std::string_view text);
+ZANDOR_CONTROL_EXPORT String fromUtf8(std::string_view text);
 
 /// UTF-8 from UTF-16; an unpaired surrogate becomes U+FFFD.
-std::string toUtf8(StringView text);
+ZANDOR_CONTROL_EXPORT std::string toUtf8(StringView text);
 
 } // namespace zandor::platform

@@ -3,6 +3,7 @@
 #include <Zandor/platform/Control.h>
 #include <Zandor/platform/ImageList.h>
 #include <Zandor/platform/Ref.h>
+#include <Zandor/platform/export.h>
 
 #include <functional>
 
@@ -21,7 +22,7 @@ struct Point {
 };
 
 /// One entry of the list.
-class ColumnItem {
+class ZANDOR_CONTROL_EXPORT ColumnItem {
 public:
     virtual ~ColumnItem() = default;
     virtual const String& Text() const = 0;
@@ -45,7 +46,7 @@ public:
     virtual Point RightEdgePoint() const = 0;
 };
 
-class ColumnList {
+class ZANDOR_CONTROL_EXPORT ColumnList {
 public:
     virtual ~ColumnList() = default;
     virtual std::int32_t Count() const = 0;
@@ -54,7 +55,7 @@ public:
     virtual Ref<ColumnItem> Add(const String& key, const String& text) = 0;
 };
 
-class Tabulet : public platform::Control {
+class ZANDOR_CONTROL_EXPORT Tabulet : public platform::Control {
 public:
     /// The default property: the table's display name in the title bar.
     virtual const String& Text() const = 0;

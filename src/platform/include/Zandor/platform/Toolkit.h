@@ -5,6 +5,7 @@
 #include <Zandor/platform/MSFlexGrid.h>
 #include <Zandor/platform/PickList.h>
 #include <Zandor/platform/Tabulet.h>
+#include <Zandor/platform/export.h>
 
 namespace zandor::platform {
 
@@ -12,7 +13,7 @@ inline constexpr std::int32_t styleOkOnly = 0;
 inline constexpr std::int32_t styleExclamation = 48;
 inline constexpr std::int32_t styleSystemModal = 4096;
 
-class MessageBoxes {
+class ZANDOR_CONTROL_EXPORT MessageBoxes {
 public:
     virtual ~MessageBoxes() = default;
     /// Shows a modal box with an OK button and returns when the user has closed it.
@@ -21,7 +22,7 @@ public:
 
 /// All that one control asks of a user-interface toolkit. The toolkit outlives everything that it
 /// makes. Design-time controls are made once, in the order in which they stack.
-class Toolkit : public MessageBoxes {
+class ZANDOR_CONTROL_EXPORT Toolkit : public MessageBoxes {
 public:
     virtual std::unique_ptr<Frame> makeFrame(const Design& design, FrameEvents events) = 0;
     virtual std::unique_ptr<CommandButton> makeCommandButton(const Design& design,

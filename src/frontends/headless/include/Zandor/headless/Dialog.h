@@ -1,10 +1,11 @@
 #pragma once
 
 #include <Zandor/headless/Element.h>
+#include <Zandor/headless/export.h>
 
 namespace zandor::platform::headless {
 
-class Dialog final : public Placed<platform::Dialog> {
+class ZANDOR_HEADLESS_EXPORT Dialog final : public Placed<platform::Dialog> {
 public:
     Dialog(Toolkit& toolkit, const Design& design, DialogEvents events);
     void Caption(const String& value) override;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/headless/export.h>
 #include <Zandor/platform/Intrinsic.h>
 
 #include <string>
@@ -18,7 +19,7 @@ struct Look {
 };
 
 /// A thing that the toolkit finds by name: "hsbTable", "lstTable(3)" for a control array's element.
-class Object {
+class ZANDOR_HEADLESS_EXPORT Object {
 public:
     Object(Toolkit& toolkit, std::string name);
     Object(const Object&) = delete;
@@ -40,7 +41,7 @@ private:
 };
 
 /// A thing that stands in a container, or is a window of its own when it has none.
-class Element : public Object {
+class ZANDOR_HEADLESS_EXPORT Element : public Object {
 public:
     Element(Toolkit& toolkit, const Design& design, Element* container);
     ~Element() override;
@@ -98,6 +99,6 @@ public:
 };
 
 /// "lstTable(3)"
-std::string elementName(StringView name, std::int16_t index);
+ZANDOR_HEADLESS_EXPORT std::string elementName(StringView name, std::int16_t index);
 
 } // namespace zandor::platform::headless

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/headless/export.h>
+
 #include <exception>
 #include <functional>
 #include <map>
@@ -9,7 +11,7 @@
 namespace zandor::platform::headless {
 
 /// Makes named calls fail, and remembers which were made. Calls are named "owner.member".
-class Faults {
+class ZANDOR_HEADLESS_EXPORT Faults {
 public:
     /// The nth call of that name from now on throws `error` and does nothing else; the ones before
     /// and after it work. Arming a name again replaces what was armed.

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/headless/Element.h>
+#include <Zandor/headless/export.h>
 #include <Zandor/platform/MSFlexGrid.h>
 
 namespace zandor::platform::headless {
@@ -9,7 +10,7 @@ inline constexpr float gridRowHeight = 240;
 inline constexpr float gridColWidth = 960;
 
 /// A grid of one fixed row and one fixed column.
-class Grid final : public Placed<MSFlexGridLib::MSFlexGrid> {
+class ZANDOR_HEADLESS_EXPORT Grid final : public Placed<MSFlexGridLib::MSFlexGrid> {
 public:
     Grid(Toolkit& toolkit, const Design& design, Element* container, std::int32_t rows,
          std::int32_t cols, MSFlexGridLib::GridEvents events);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/headless/Element.h>
+#include <Zandor/headless/export.h>
 
 namespace zandor::platform::headless {
 
@@ -15,7 +16,7 @@ inline constexpr float buttonHeight = 315;
 inline constexpr float labelWidth = 1800;
 inline constexpr float labelHeight = 255;
 
-class Frame final : public Placed<platform::Frame> {
+class ZANDOR_HEADLESS_EXPORT Frame final : public Placed<platform::Frame> {
 public:
     Frame(Toolkit& toolkit, const Design& design, Element* container, FrameEvents events);
     bool Visible() const override;
@@ -25,14 +26,14 @@ public:
     const FrameEvents events;
 };
 
-class Label final : public Placed<platform::Label> {
+class ZANDOR_HEADLESS_EXPORT Label final : public Placed<platform::Label> {
 public:
     Label(Toolkit& toolkit, const Design& design, Element* container);
     void Caption(const String& value) override;
     void Font(const platform::Font& value) override;
 };
 
-class CommandButton final : public Placed<platform::CommandButton> {
+class ZANDOR_HEADLESS_EXPORT CommandButton final : public Placed<platform::CommandButton> {
 public:
     CommandButton(Toolkit& toolkit, const Design& design, Element* container,
                   CommandButtonEvents events);
@@ -54,13 +55,13 @@ private:
 };
 
 /// A control that takes what the user types.
-class Input {
+class ZANDOR_HEADLESS_EXPORT Input {
 public:
     virtual ~Input() = default;
     virtual void keyDown(std::int16_t keyCode, std::int16_t shift) = 0;
 };
 
-class ComboBox final : public Placed<platform::ComboBox>, public Input {
+class ZANDOR_HEADLESS_EXPORT ComboBox final : public Placed<platform::ComboBox>, public Input {
 public:
     ComboBox(Toolkit& toolkit, const Design& design, Element* container, std::vector<String> items,
              KeyEvent KeyDown);
@@ -88,7 +89,7 @@ private:
     KeyEvent mKeyDown;
 };
 
-class TextBox final : public Placed<platform::TextBox>, public Input {
+class ZANDOR_HEADLESS_EXPORT TextBox final : public Placed<platform::TextBox>, public Input {
 public:
     TextBox(Toolkit& toolkit, const Design& design, Element* container, KeyEvent KeyDown);
     String Text() const override;
@@ -105,7 +106,7 @@ private:
     bool mAllSelected = false;
 };
 
-class ScrollBar final : public Placed<platform::ScrollBar> {
+class ZANDOR_HEADLESS_EXPORT ScrollBar final : public Placed<platform::ScrollBar> {
 public:
     ScrollBar(Toolkit& toolkit, const Design& design, Element* container, Orientation orientation,
               ScrollBarEvents events);
@@ -133,7 +134,7 @@ private:
     ScrollBarEvents mEvents;
 };
 
-class Line final : public platform::Line, public Element {
+class ZANDOR_HEADLESS_EXPORT Line final : public platform::Line, public Element {
 public:
     Line(Toolkit& toolkit, const Design& design, Element* container);
     float X1() const override;
@@ -158,7 +159,7 @@ private:
     std::int16_t mBorderWidth = 1;
 };
 
-class Shape final : public Placed<platform::Shape> {
+class ZANDOR_HEADLESS_EXPORT Shape final : public Placed<platform::Shape> {
 public:
     Shape(Toolkit& toolkit, const Design& design, Element* container);
     void ShapeStyle(std::int16_t value) override;

@@ -1,10 +1,11 @@
 #pragma once
 
 #include <Zandor/headless/Element.h>
+#include <Zandor/headless/export.h>
 
 namespace zandor::platform::headless {
 
-class MenuEntry final : public platform::MenuEntry, public Object {
+class ZANDOR_HEADLESS_EXPORT MenuEntry final : public platform::MenuEntry, public Object {
 public:
     MenuEntry(Toolkit& toolkit, const Design& design, PlainEvent Click);
     void Caption(const String& value) override;
@@ -16,7 +17,7 @@ public:
     const PlainEvent Click;
 };
 
-class PopupMenu final : public platform::PopupMenu, public Object {
+class ZANDOR_HEADLESS_EXPORT PopupMenu final : public platform::PopupMenu, public Object {
 public:
     PopupMenu(Toolkit& toolkit, const Design& design, PlainEvent Click);
     ~PopupMenu() override;

@@ -1,12 +1,13 @@
 #pragma once
 
 #include <Zandor/headless/Element.h>
+#include <Zandor/headless/export.h>
 #include <Zandor/platform/PickList.h>
 
 namespace zandor::platform::headless {
 
 /// Its look's text is what stands in the box; all items stay in sight whatever that is.
-class PickList final : public Placed<platform::PickList> {
+class ZANDOR_HEADLESS_EXPORT PickList final : public Placed<platform::PickList> {
 public:
     PickList(Toolkit& toolkit, const Design& design, Element* container, PickListEvents events);
     void Open(const Bounds& over, const std::vector<String>& items, const String& typed,

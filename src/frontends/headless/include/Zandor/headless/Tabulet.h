@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/headless/Element.h>
+#include <Zandor/headless/export.h>
 #include <Zandor/platform/Tabulet.h>
 
 namespace zandor::platform::headless {
@@ -11,7 +12,7 @@ inline constexpr float tabuletTitleHeight = 300;
 inline constexpr float tabuletBorder = 45;
 inline constexpr float tabuletRowHeight = 225;
 
-class ColumnItem final : public TalvikTabulet::ColumnItem {
+class ZANDOR_HEADLESS_EXPORT ColumnItem final : public TalvikTabulet::ColumnItem {
 public:
     ColumnItem(Tabulet& table, std::int32_t position, String key, String text);
     const String& Text() const override;
@@ -54,7 +55,8 @@ private:
     bool mDrawnSelected = false;
 };
 
-class Tabulet final : public Placed<TalvikTabulet::Tabulet>, private TalvikTabulet::ColumnList {
+class ZANDOR_HEADLESS_EXPORT Tabulet final : public Placed<TalvikTabulet::Tabulet>,
+                                             private TalvikTabulet::ColumnList {
 public:
     Tabulet(Toolkit& toolkit, const Design& design, Element* container, std::int16_t index,
             const TalvikTabulet::TabuletEvents& events);

@@ -9,6 +9,7 @@
 #include <Zandor/headless/Menu.h>
 #include <Zandor/headless/PickList.h>
 #include <Zandor/headless/Tabulet.h>
+#include <Zandor/headless/export.h>
 #include <Zandor/platform/Toolkit.h>
 
 #include <map>
@@ -32,7 +33,7 @@ struct WindowMessage {
 };
 
 /// The control's own surface, which stands in its host's window.
-class Surface final : public Element {
+class ZANDOR_HEADLESS_EXPORT Surface final : public Element {
 public:
     explicit Surface(Toolkit& toolkit);
     void resize(float width, float height) { place({0, 0, width, height}); }
@@ -41,7 +42,7 @@ public:
 
 /// A toolkit without a screen. It keeps everything that a user could see, for tests to look at; the
 /// user's side is the class User. Single-threaded, as every toolkit is.
-class Toolkit : public platform::Toolkit {
+class ZANDOR_HEADLESS_EXPORT Toolkit : public platform::Toolkit {
 public:
     Toolkit();
     ~Toolkit() override;

@@ -1,13 +1,14 @@
 #pragma once
 
 #include <Zandor/headless/Toolkit.h>
+#include <Zandor/headless/export.h>
 
 namespace zandor::platform::headless {
 
 /// The user's hands. Only what a user could reach can be touched: something that does not exist, is
 /// not shown, or lies outside an open dialog or menu is a std::logic_error. What is shown but
 /// disabled can be touched without effect. Places are twips, entries count from 1.
-class User {
+class ZANDOR_HEADLESS_EXPORT User {
 public:
     explicit User(Toolkit& toolkit) : mToolkit(toolkit) {}
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/files/export.h>
 #include <Zandor/model/Result.h>
 
 #include <filesystem>
@@ -22,9 +23,9 @@ using Result = model::Result<T, Error>;
 
 /// "The file "a" cannot be saved (No space left on device); make room on the disk, …", by what
 /// failed and the number of the system's error.
-Error systemError(const std::string& failed, int number);
+ZANDOR_FILES_EXPORT Error systemError(const std::string& failed, int number);
 
 /// The path within a message of one line.
-std::string quoted(const Path& path);
+ZANDOR_FILES_EXPORT std::string quoted(const Path& path);
 
 } // namespace zandor::files

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/files/Error.h>
+#include <Zandor/files/export.h>
 
 #include <optional>
 #include <string_view>
@@ -8,7 +9,7 @@
 namespace zandor::files {
 
 /// Where bytes go, one piece after the other.
-class Output {
+class ZANDOR_FILES_EXPORT Output {
 public:
     virtual ~Output() = default;
     /// Some of what was written may wait for its way until flush(). What went wrong, with this
@@ -19,7 +20,7 @@ public:
 };
 
 /// An open file, pipe or terminal as an output. It is left open.
-class Stream final : public Output {
+class ZANDOR_FILES_EXPORT Stream final : public Output {
 public:
     static constexpr std::size_t usuallyWaiting = 64 * 1024;
     static constexpr std::size_t nothingWaits = 0;

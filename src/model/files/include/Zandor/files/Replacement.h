@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/files/export.h>
+
 #include "model/files/Descriptor.h"
 
 #include <Zandor/files/Output.h>
@@ -11,7 +13,7 @@ namespace zandor::files {
 /// was written goes with the object. A link stays a link, and the file's permissions stay.
 ///
 /// Whatever this program writes for its user is written so.
-class Replacement final : public Output {
+class ZANDOR_FILES_EXPORT Replacement final : public Output {
 public:
     explicit Replacement(const Path& path);
     Replacement(const Replacement&) = delete;
@@ -36,6 +38,6 @@ private:
 };
 
 /// All at once.
-std::optional<Error> replaceFile(const Path& path, std::string_view content);
+ZANDOR_FILES_EXPORT std::optional<Error> replaceFile(const Path& path, std::string_view content);
 
 } // namespace zandor::files

@@ -1,13 +1,14 @@
 #pragma once
 
 #include <Zandor/reader/Result.h>
+#include <Zandor/reader/export.h>
 
 #include <QSqlDatabase>
 
 namespace zandor::reader {
 
 /// An open database under a connection name of its own, closed when the object goes.
-class Connection {
+class ZANDOR_READER_EXPORT Connection {
 public:
     /// Takes over an open database that nobody else uses.
     explicit Connection(QSqlDatabase database) : mDatabase(std::move(database)) {}
@@ -26,7 +27,7 @@ private:
 
 /// Opens an SQLite file for reading only; the file is never written or created. Needs a
 /// QCoreApplication.
-Result<Connection> openSqlite(const QString& path);
+ZANDOR_READER_EXPORT Result<Connection> openSqlite(const QString& path);
 
 /// Opens a database for reading only: a path of an SQLite file, or an address
 ///
@@ -39,10 +40,11 @@ Result<Connection> openSqlite(const QString& path);
 /// application_name of PostgreSQL, and host, the folder of the server's socket, which takes the
 /// place of the host. The password is `password`, or that of the address when it is empty; no
 /// message shows it. Needs a QCoreApplication.
-Result<Connection> openDatabase(const QString& address, const QString& password = {});
+ZANDOR_READER_EXPORT Result<Connection> openDatabase(const QString& address,
+                                                     const QString& password = {});
 
 /// Whether the engine still answers; after a failure this tells a connection that has broken down
 /// from a statement that was refused. Takes a way to the server and back.
-bool answers(const Connection& connection);
+ZANDOR_READER_EXPORT bool answers(const Connection& connection);
 
 } // namespace zandor::reader

@@ -2,6 +2,7 @@
 
 #include <Zandor/DatabaseReader.h>
 #include <Zandor/Query.h>
+#include <Zandor/reader/export.h>
 
 namespace zandor::reader {
 
@@ -26,7 +27,7 @@ struct LeftOut {
 ///
 /// The tables are placed and sized for a canvas of `canvasWidth` twips, clear of the tables that
 /// have a place.
-Result<std::vector<platform::Ref<model::Table>>>
+ZANDOR_READER_EXPORT Result<std::vector<platform::Ref<model::Table>>>
 addTables(model::Query& query, DatabaseReader& reader, const std::vector<TableId>& names,
           std::int32_t canvasWidth, std::vector<LeftOut>* leftOut = nullptr);
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/reader/export.h>
 #include <Zandor/sql/Dialect.h>
 
 #include <QSqlDatabase>
@@ -7,6 +8,6 @@
 namespace zandor::reader {
 
 /// The dialect that the engine of an open database reads.
-model::sql::Dialect dialectOf(const QSqlDatabase& database);
+ZANDOR_READER_EXPORT model::sql::Dialect dialectOf(const QSqlDatabase& database);
 
 } // namespace zandor::reader

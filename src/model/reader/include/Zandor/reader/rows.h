@@ -2,6 +2,7 @@
 
 #include <Zandor/platform/String.h>
 #include <Zandor/reader/Result.h>
+#include <Zandor/reader/export.h>
 
 #include <QSqlDatabase>
 #include <QSqlError>
@@ -13,17 +14,18 @@
 
 namespace zandor::reader {
 
-QString toQt(const platform::String& text);
-platform::String textAt(const QSqlQuery& row, int column);
+ZANDOR_READER_EXPORT QString toQt(const platform::String& text);
+ZANDOR_READER_EXPORT platform::String textAt(const QSqlQuery& row, int column);
 
 /// Calls `use` for every row of a statement; the error when it fails. `what` is what is being read,
 /// as the beginning of a sentence.
-std::optional<Error> readRows(const QSqlDatabase& database, const QString& what,
-                              const QString& statement, const QVariantList& parameters,
-                              const std::function<void(const QSqlQuery&)>& use);
+ZANDOR_READER_EXPORT std::optional<Error>
+readRows(const QSqlDatabase& database, const QString& what, const QString& statement,
+         const QVariantList& parameters, const std::function<void(const QSqlQuery&)>& use);
 
 /// The engine's words about a failure with what to do about it. `failed` is what could not be done,
 /// without a full stop.
-Error databaseError(const QSqlDatabase& database, const QString& failed, const QSqlError& error);
+ZANDOR_READER_EXPORT Error databaseError(const QSqlDatabase& database, const QString& failed,
+                                         const QSqlError& error);
 
 } // namespace zandor::reader

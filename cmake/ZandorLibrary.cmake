@@ -1,0 +1,65 @@
+# What the libraries of the package have in common.
+include(GNUInstallDirs)
+include(GenerateExportHeader)
+
+# Warnings are the business of whoever works on this tree, not of a program that adds it.
+add_library(zandor_warnings INTERFACE)
+if(PROJECT_IS_TOP_LEVEL)
+    # GCC 12 takes every u"x" + text for an overlapping copy once it optimises.
+    target_compile_options(zandor_warnings INTERFACE
+        $<$<CXX_COMPILER_ID:GNU>:-Wno-restrict>
+        -Wall -Wextra $<$<BOOL:${ZANDOR_WERROR}>:-Werror>)
+endif()
+
+# zandor_library(NAME
+#     HEADERS the folders below src/ that hold its houses' include/Zandor
+#     HOUSE   the folder of Zandor/ that its export header stands in
+#     SOURCES files
+#     NEEDS   what its headers need, OWN what its sources alone need)
+#
+# Makes the library zandor_name, known as Zandor::NAME here and where it is installed.
+function(zandor_library name)
+    cmake_parse_arguments(PARSE_ARGV 1 given "" "HOUSE" "HEADERS;SOURCES;NEEDS;OWN")
+    string(TOLOWER ${name} lower)
+    string(TOUPPER ${name} upper)
+    set(target zandor_${lower})
+
+    add_library(${target} ${given_SOURCES})
+    add_library(Zandor::${name} ALIAS ${target})
+    target_compile_features(${target} PUBLIC cxx_std_20)
+    target_link_libraries(${target}
+        PUBLIC ${given_NEEDS}
+        PRIVATE "$<BUILD_INTERFACE:${given_OWN}>" $<BUILD_INTERFACE:zandor_warnings>)
+
+    set(generated ${CMAKE_CURRENT_BINARY_DIR}/include)
+    generate_export_header(${target}
+        BASE_NAME zandor_${lower}
+        EXPORT_FILE_NAME ${generated}/Zandor/${given_HOUSE}/export.h)
+    get_target_property(type ${target} TYPE)
+    if(type STREQUAL STATIC_LIBRARY)
+        target_compile_definitions(${target} PUBLIC ZANDOR_${upper}_STATIC_DEFINE)
+    endif()
+
+    target_include_directories(${target}
+        PUBLIC $<BUILD_INTERFACE:${generated}>
+        PRIVATE ${PROJECT_SOURCE_DIR}/src)
+    foreach(folder IN LISTS given_HEADERS)
+        target_include_directories(${target}
+            PUBLIC $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/src/${folder}/include>)
+    endforeach()
+    set_target_properties(${target} PROPERTIES
+        CXX_EXTENSIONS OFF
+        CXX_VISIBILITY_PRESET hidden
+        VISIBILITY_INLINES_HIDDEN ON
+        POSITION_INDEPENDENT_CODE ON
+        VERSION ${PROJECT_VERSION}
+        SOVERSION ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR}
+        DEBUG_POSTFIX d
+        OUTPUT_NAME Zandor${name}
+        EXPORT_NAME ${name})
+
+    if(ZANDOR_INSTALL)
+        zandor_install(${name} ${target} ${generated}
+            HEADERS ${given_HEADERS} NEEDS ${given_NEEDS})
+    endif()
+endfunction()
