@@ -1,7 +1,8 @@
 #include "must.h"
 
 #include "model/criteria/QueryColumns.h"
-#include "model/sql/Printer.h"
+
+#include <Zandor/sql/Printer.h>
 
 #include <Zandor/sql/Builder.h>
 

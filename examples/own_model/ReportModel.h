@@ -13,8 +13,10 @@
 /// A failure is an exception, of any kind: the designer shows its text and goes on.
 namespace report {
 
-using zandor::platform::Ref;
-using zandor::platform::String;
+namespace platform = zandor::platform;
+
+using platform::Ref;
+using platform::String;
 
 /// A list of the report as a collection of handles.
 template <class Interface>
@@ -27,8 +29,7 @@ public:
 
     std::int32_t Count() const override { return static_cast<std::int32_t>(mCount()); }
     Ref<Interface> Item(std::int32_t position) const override { // from 1
-        if (position < 1 || position > Count())
-            throw zandor::platform::errors::subscriptOutOfRange();
+        if (position < 1 || position > Count()) throw platform::errors::subscriptOutOfRange();
         return mMake(static_cast<std::size_t>(position) - 1);
     }
     Ref<Interface> Item(const String& key) const override { return mMake(find(key)); }
@@ -38,7 +39,7 @@ private:
     std::size_t find(const String& key) const {
         for (std::size_t at = 0; at < mCount(); ++at)
             if (mMake(at)->Key() == key) return at;
-        throw zandor::platform::errors::invalidProcedureCall();
+        throw platform::errors::invalidProcedureCall();
     }
 
     std::function<std::size_t()> mCount;
@@ -52,8 +53,8 @@ public:
     Column(std::shared_ptr<Source> source, std::size_t position)
         : source(std::move(source)), position(position) {}
 
-    String Name() const override { return zandor::platform::fromUtf8(field().name); }
-    String Key() const override { return zandor::platform::fromUtf8(field().name); }
+    String Name() const override { return platform::fromUtf8(field().name); }
+    String Key() const override { return platform::fromUtf8(field().name); }
     bool Marker() const override { return field().key; }
     bool Selected() const override { return field().marked; }
     void Selected(bool value) override { field().marked = value; }
@@ -71,8 +72,8 @@ class Table final : public TalvikZandorLib::ZDTable {
 public:
     explicit Table(std::shared_ptr<Source> source);
 
-    String Name() const override { return zandor::platform::fromUtf8(source->name); }
-    String Key() const override { return u't' + zandor::platform::decimal(source->id); }
+    String Name() const override { return platform::fromUtf8(source->name); }
+    String Key() const override { return u't' + platform::decimal(source->id); }
     std::int32_t Left() const override { return source->left; }
     std::int32_t Top() const override { return source->top; }
     std::int32_t Width() const override { return source->width; }
@@ -109,7 +110,7 @@ public:
         return static_cast<std::int16_t>(link->comparison);
     }
     void CompareOperator(std::int16_t value) override { link->comparison = value; }
-    String Key() const override { return u'j' + zandor::platform::decimal(link->id); }
+    String Key() const override { return u'j' + platform::decimal(link->id); }
 
     const std::shared_ptr<Link> link;
 };
@@ -120,7 +121,7 @@ public:
 
     String Criterium() const override;
     void Criterium(const String& value) override;
-    String Key() const { return zandor::platform::decimal(mRow); }
+    String Key() const { return platform::decimal(mRow); }
 
 private:
     std::shared_ptr<Output> mOutput;
@@ -149,14 +150,14 @@ public:
 
     Ref<TalvikZandorLib::ZDColumn> Column() const override;
     void Column(const Ref<TalvikZandorLib::ZDColumn>& value) override;
-    String Synonym() const override { return zandor::platform::fromUtf8(output->title); }
-    void Synonym(const String& value) override { output->title = zandor::platform::toUtf8(value); }
+    String Synonym() const override { return platform::fromUtf8(output->title); }
+    void Synonym(const String& value) override { output->title = platform::toUtf8(value); }
     std::int16_t SortOrder() const override { return static_cast<std::int16_t>(output->order); }
     void SortOrder(std::int16_t value) override { output->order = value; }
     bool Visible() const override { return output->shown; }
     void Visible(bool value) override { output->shown = value; }
     /// The one key whose form matters: "x" and a number.
-    String Key() const override { return u'x' + zandor::platform::decimal(output->id); }
+    String Key() const override { return u'x' + platform::decimal(output->id); }
     TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDCriterium>& Criteria() override {
         return mConditions;
     }
@@ -199,13 +200,13 @@ private:
 class Library final : public TalvikZandorLib::Library {
 public:
     Ref<TalvikZandorLib::Zandor> NewZandor() override {
-        return zandor::platform::makeRef<Model>(std::make_shared<Report>());
+        return platform::makeRef<Model>(std::make_shared<Report>());
     }
     Ref<TalvikZandorLib::ZDJoin> NewZDJoin() override {
-        return zandor::platform::makeRef<Join>(std::make_shared<Link>());
+        return platform::makeRef<Join>(std::make_shared<Link>());
     }
     Ref<TalvikZandorLib::ZDColumnDefinition> NewZDColumnDefinition() override {
-        return zandor::platform::makeRef<Definition>(std::make_shared<Output>());
+        return platform::makeRef<Definition>(std::make_shared<Output>());
     }
 };
 // [library]

@@ -1,5 +1,6 @@
 #include "comforts/Door.h"
-#include "control/joins/symbols.h"
+
+#include <Zandor/control/symbols.h>
 
 #include <Zandor/comforts/Comforts.h>
 

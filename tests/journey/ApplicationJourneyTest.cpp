@@ -185,7 +185,8 @@ TEST_F(ADesignersDay, ShowsWhereAFindingIs) {
               [&] { return designer->query().filter("column ").size() == column; });
     }
     designer->click("entry customers name");
-    designer->click("row findings Two output columns are named id: give one of them a synonym.");
+    designer->click("row findings Two output columns are named id, so that nobody can tell them "
+                    "apart: give one of them a synonym.");
     await("its column is selected",
           [&] { return designer->ask("selected orders") == QStringList("id"); });
     designer->picture("application-5-finding");

@@ -1,7 +1,8 @@
 #include <Zandor/Zandor.h>
 
 #include "control/joins/frmJoinDefinition.h"
-#include "control/joins/symbols.h"
+
+#include <Zandor/control/symbols.h>
 
 #include <Zandor/platform/Numbers.h>
 

@@ -1,7 +1,8 @@
 #pragma once
 
 #include "designer/run/fetch.h"
-#include "model/files/Descriptor.h"
+
+#include <Zandor/files/Descriptor.h>
 
 #include <mutex>
 

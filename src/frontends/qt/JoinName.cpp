@@ -1,8 +1,9 @@
 #include "frontends/qt/JoinName.h"
 
-#include "control/joins/symbols.h"
 #include "frontends/qt/LineEnds.h"
 #include "frontends/qt/ShownText.h"
+
+#include <Zandor/control/symbols.h>
 
 #include <Zandor/Zandor.h>
 #include <Zandor/platform/KeyedCollection.h>

@@ -1,4 +1,4 @@
-#include "model/files/Descriptor.h"
+#include <Zandor/files/Descriptor.h>
 
 #include <unistd.h>
 

@@ -1,6 +1,6 @@
 #include <Zandor/files/Output.h>
 
-#include "model/files/Descriptor.h"
+#include <Zandor/files/Descriptor.h>
 
 #include <cerrno>
 

@@ -1,5 +1,6 @@
-#include "model/files/Descriptor.h"
 #include "model/files/limits.h"
+
+#include <Zandor/files/Descriptor.h>
 
 #include <Zandor/QueryDocument.h>
 #include <Zandor/files/Replacement.h>

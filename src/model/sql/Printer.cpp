@@ -1,4 +1,4 @@
-#include "model/sql/Printer.h"
+#include <Zandor/sql/Printer.h>
 
 #include "model/criteria/Tokens.h"
 

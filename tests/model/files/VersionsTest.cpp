@@ -33,7 +33,7 @@ TEST(AFileOfTheCurrentVersion, IsWrittenAsItWasRead) {
 }
 
 TEST(ThePageAboutTheFormat, ShowsAFileAsItIsWritten) {
-    const std::string page = contentOf(testFile("../../docs/file-format.md"));
+    const std::string page = contentOf(testFile("../../../docs/file-format.md"));
     const std::string begin = "```json\n";
     const auto at = page.find(begin);
     ASSERT_NE(at, std::string::npos);

@@ -2,7 +2,7 @@
 
 #include <Zandor/model/export.h>
 
-#include "model/sql/Printer.h"
+#include <Zandor/sql/Printer.h>
 
 #include <Zandor/Query.h>
 #include <Zandor/model/Finding.h>

@@ -2,7 +2,7 @@
 
 #include <Zandor/files/export.h>
 
-#include "model/files/Descriptor.h"
+#include <Zandor/files/Descriptor.h>
 
 #include <Zandor/files/Output.h>
 
