@@ -167,8 +167,9 @@ void Door::popUpOver(std::int16_t table) {
 }
 
 std::unique_ptr<platform::MenuEntry>
-Door::addMenuEntry(platform::StringView name, const String& caption, platform::PlainEvent click) {
-    return control().mnuZandor->makeEntry({.Name = name, .Caption = caption}, std::move(click));
+Door::addTableEntry(platform::StringView name, const String& caption, platform::PlainEvent click) {
+    return control().mnuZandor->makeEntry({.Name = name, .Caption = caption}, std::move(click),
+                                          control().mnuTableDefinitionSep.get());
 }
 
 platform::String Door::keyOfActiveTable() const {

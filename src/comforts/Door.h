@@ -108,9 +108,9 @@ public:
     void drawJoins() { control().DrawJoins(); }
     /// Opens the menu as over the list of the table in a slot.
     void popUpOver(std::int16_t table);
-    /// At the menu's end.
+    /// In the menu, as the last of the entries that are about tables.
     std::unique_ptr<platform::MenuEntry>
-    addMenuEntry(platform::StringView name, const String& caption, platform::PlainEvent click);
+    addTableEntry(platform::StringView name, const String& caption, platform::PlainEvent click);
     String keyOfActiveTable() const;
 
     // Tables

@@ -17,7 +17,7 @@ bool Comforts::titleClicked(std::int16_t table) {
 void Comforts::offerRename() {
     if (!mDoor || !mFlags.HasTitleMenu || mRename) return;
     act(u"offerRename", [&](Door& door) {
-        mRename = door.addMenuEntry(u"mnuTableRename", mWords.Rename, [this] {
+        mRename = door.addTableEntry(u"mnuTableRename", mWords.Rename, [this] {
             if (!mDoor) return;
             const String key = mDoor->keyOfActiveTable();
             if (const auto asked = RenameRequested) asked(key);

@@ -133,10 +133,12 @@ TalvikTabulet::TabuletEvents Zandor::TableEvents() {
 void Zandor::MakeMenu() {
     const auto entry = [this](platform::StringView name, platform::StringView caption,
                               void (Zandor::*click)()) {
-        return Part<platform::MenuEntry>(
-            mLife, mnuZandor->makeEntry({.Name = name, .Caption = caption}, [this, click] {
-                if (click) (this->*click)();
-            }));
+        return Part<platform::MenuEntry>(mLife, mnuZandor->makeEntry(
+                                                    {.Name = name, .Caption = caption},
+                                                    [this, click] {
+                                                        if (click) (this->*click)();
+                                                    },
+                                                    nullptr));
     };
     mnuJoinShowDefinition = entry(u"mnuJoinShowDefinition", u"Show &Join Definition",
                                   &Zandor::mnuJoinShowDefinition_Click);

@@ -9,6 +9,7 @@
 #include <QResizeEvent>
 
 #include <algorithm>
+#include <utility>
 
 namespace zandor::designer {
 
@@ -20,7 +21,10 @@ DrawingArea::DrawingArea(Document& document, QWidget* parent)
     connect(&document, &Document::outdated, this, &DrawingArea::showAnew);
     // What the control did it has shown, but not all that came of it: it takes the columns of more
     // tables than one out of the grid, say, and leaves blank columns before one dropped far out.
-    connect(&document, &Document::changed, this, [this] { mControl->showAnew(); });
+    connect(&document, &Document::changed, this, [this] {
+        growCanvas();
+        mControl->showAnew();
+    });
     makeControl();
 }
 
@@ -110,6 +114,17 @@ void DrawingArea::resizeEvent(QResizeEvent* event) {
     // Before the control lays itself out for its new size.
     fitCanvas();
     mControl->resize(event->size());
+}
+
+/// Lets the canvas reach to a table that was pulled behind the grid. It does not become smaller, for
+/// what is seen of it would move under the user's hands.
+void DrawingArea::growCanvas() {
+    const std::pair before(mControl->MXHorzFrameSize(), mControl->MXVertFrameSize());
+    fitCanvas();
+    mControl->setMXHorzFrameSize(std::max(mControl->MXHorzFrameSize(), before.first));
+    mControl->setMXVertFrameSize(std::max(mControl->MXVertFrameSize(), before.second));
+    if (std::pair(mControl->MXHorzFrameSize(), mControl->MXVertFrameSize()) != before)
+        mControl->control().UserControl_Resize();
 }
 
 /// Makes the canvas as large as its tables need, and never smaller than what can be seen of it.

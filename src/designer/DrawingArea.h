@@ -52,6 +52,7 @@ private:
     void showAnew();
     void makeControl();
     void fitCanvas();
+    void growCanvas();
 
     Document& mDocument;
     model::Library mLibrary; ///< outlives every control

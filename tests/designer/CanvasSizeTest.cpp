@@ -1,5 +1,7 @@
 #include "designer/DrawingArea.h"
 #include "designer/document/Document.h"
+#include "frontends/qt/TabuletWidget.h"
+#include "support/QtHands.h"
 
 #include <gtest/gtest.h>
 
@@ -56,6 +58,23 @@ TEST_F(TheDesignersCanvas, CanBeScrolledToATableBehindTheGrid) {
     const int upperHalf = 800 * twipsPerPixel / 2;
     ASSERT_GT(7000 + 2000, upperHalf);
     EXPECT_GE(control().VertMaxScrollPos(), 7000 + 2000 - upperHalf);
+}
+
+TEST_F(TheDesignersCanvas, CanBeScrolledToATableThatIsPulledBehindTheGrid) {
+    show(300, 300, {1200, 800});
+    ASSERT_EQ(control().VertMaxScrollPos(), 0);
+    auto& box = *dynamic_cast<platform::qt::TabuletWidget*>(
+        control().findChild<QWidget*>(QStringLiteral("lstTable(1)")));
+    const QPointF title = QRectF(box.titleBar()).center();
+    const QPointF below = title + QPointF(0, 1000);
+    hands::mouse(box, QEvent::MouseButtonPress, title, Qt::LeftButton, Qt::LeftButton);
+    hands::mouse(box, QEvent::MouseMove, below, Qt::NoButton, Qt::LeftButton);
+    hands::mouse(box, QEvent::MouseButtonRelease, title, Qt::LeftButton);
+    for (int n = 0; n < 3; ++n) QCoreApplication::processEvents();
+    const auto table = document.query()->tableNamed(u"orders");
+    const int upperPane = static_cast<int>(800 * twipsPerPixel * control().upperPaneShare());
+    ASSERT_GT(table->Top() + table->Height(), upperPane);
+    EXPECT_GE(control().VertMaxScrollPos(), table->Top() + table->Height() - upperPane);
 }
 
 TEST_F(TheDesignersCanvas, EndsWhereTheControlsNumbersEnd) {

@@ -1,6 +1,7 @@
 #include "OpenWindow.h"
 
 #include "designer/Banner.h"
+#include "designer/EndingSignals.h"
 #include "designer/database/ConnectionBanner.h"
 #include "designer/document/AutosaveSlot.h"
 
@@ -81,6 +82,15 @@ TEST_F(ASafeWindow, KeepsTheQueryWhenTheSessionEnds) {
     add("payments");
     alignas(QSessionManager) char manager[sizeof(QSessionManager)] = {}; // nobody asks it anything
     emit qGuiApp->commitDataRequest(reinterpret_cast<QSessionManager&>(manager));
+    EXPECT_EQ(QDir(autosaves()).entryList({"*.autosave"}).size(), 1);
+    window->document().setModified(false);
+}
+
+TEST_F(ASafeWindow, KeepsTheQueryWhenItIsAskedToEnd) {
+    open();
+    window->keepSafe(autosaves());
+    add("payments");
+    emit window->findChild<designer::EndingSignals*>()->ending();
     EXPECT_EQ(QDir(autosaves()).entryList({"*.autosave"}).size(), 1);
     window->document().setModified(false);
 }

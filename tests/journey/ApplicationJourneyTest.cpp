@@ -4,6 +4,7 @@
 
 #include "support/PostgresServer.h"
 
+#include <QFile>
 #include <QFileInfo>
 #include <QSqlError>
 #include <QSqlQuery>
@@ -161,6 +162,18 @@ TEST_F(ADesignersDay, GoesOnAfterAPowerFailure) {
     designer->click("button Recover");
     await("the query is there again", [&] { return designer->query() == drawn; });
     quitWithoutSaving();
+}
+
+// Nobody sees what a program says that was started from a desktop.
+TEST_F(ADesignersDay, BeginsWithAWindowEvenIfItsFileCannotBeOpened) {
+    QFile broken(home.filePath("broken.json"));
+    ASSERT_TRUE(broken.open(QIODevice::WriteOnly));
+    broken.write("{");
+    broken.close();
+    Program program(QStringLiteral(ZANDOR_DESIGNER), {broken.fileName()},
+                    home.environment() + QStringList(screen.variable()));
+    await("its window is there", [this] { return screen.shows("Zandor"); });
+    program.kill();
 }
 
 TEST_F(ADesignersDay, ShowsWhereAFindingIs) {

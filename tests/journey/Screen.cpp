@@ -9,6 +9,12 @@ Screen::Screen(QSize size)
                "-noreset"}),
       mNumber(mServer.line()) {}
 
+bool Screen::shows(const QString& title) {
+    return Program(QStringLiteral("xdotool"), {"search", "--onlyvisible", "--name", title},
+                   {variable()})
+        .endsWell();
+}
+
 void Screen::click(QPoint at, int button) {
     move(at);
     ++mEffort.clicks;

@@ -22,6 +22,9 @@ public:
     /// "DISPLAY=:7", for programs that are to stand on this screen.
     QString variable() const { return QStringLiteral("DISPLAY=:") + mNumber; }
 
+    /// Whether a window stands on it whose title has this text.
+    bool shows(const QString& title);
+
     void move(QPoint to) { use({"mousemove", number(to.x()), number(to.y())}); }
     const Effort& effort() const { return mEffort; }
 

@@ -2,6 +2,8 @@
 
 #include <Zandor/headless/Toolkit.h>
 
+#include <algorithm>
+
 namespace zandor::platform::headless {
 
 MenuEntry::MenuEntry(Toolkit& toolkit, const Design& design, PlainEvent Click)
@@ -33,10 +35,14 @@ PopupMenu::PopupMenu(Toolkit& toolkit, const Design& design, PlainEvent Click)
 
 PopupMenu::~PopupMenu() = default;
 
-std::unique_ptr<platform::MenuEntry> PopupMenu::makeEntry(const Design& design, PlainEvent Click) {
+std::unique_ptr<platform::MenuEntry> PopupMenu::makeEntry(const Design& design, PlainEvent Click,
+                                                          const platform::MenuEntry* before) {
     called("makeEntry");
     auto entry = std::make_unique<MenuEntry>(mToolkit, design, std::move(Click));
-    mEntries.push_back(entry->name());
+    const auto place =
+        before ? std::ranges::find(mEntries, static_cast<const MenuEntry*>(before)->name())
+               : mEntries.end();
+    mEntries.insert(place, entry->name());
     return entry;
 }
 

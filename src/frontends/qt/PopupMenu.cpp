@@ -15,6 +15,7 @@ namespace {
 class EntryAdapter final : public MenuEntry {
 public:
     explicit EntryAdapter(QAction* action) : mAction(action) {}
+    QAction* action() const { return mAction; }
 
     void Caption(const String& value) override {
         if (!mAction) return;
@@ -42,8 +43,11 @@ PopupMenuAdapter::PopupMenuAdapter(QWidget& surface, KeyboardMenu& keys, const D
     mMenu.setProperty(ownerProperty, QVariant::fromValue(const_cast<void*>(owner)));
 }
 
-std::unique_ptr<MenuEntry> PopupMenuAdapter::makeEntry(const Design& design, PlainEvent Click) {
-    QAction* action = mMenu.addAction(QString());
+std::unique_ptr<MenuEntry> PopupMenuAdapter::makeEntry(const Design& design, PlainEvent Click,
+                                                       const MenuEntry* before) {
+    auto* const action = new QAction(&mMenu);
+    mMenu.insertAction(before ? static_cast<const EntryAdapter*>(before)->action() : nullptr,
+                       action);
     action->setObjectName(toQt(design.Name));
     mHandlers.emplace_back(action, std::move(Click));
     auto entry = std::make_unique<EntryAdapter>(action);

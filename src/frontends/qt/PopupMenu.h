@@ -13,7 +13,8 @@ public:
     PopupMenuAdapter(QWidget& surface, KeyboardMenu& keys, const Design& design, PlainEvent Click,
                      const void* owner);
 
-    std::unique_ptr<MenuEntry> makeEntry(const Design& design, PlainEvent Click) override;
+    std::unique_ptr<MenuEntry> makeEntry(const Design& design, PlainEvent Click,
+                                         const MenuEntry* before) override;
     void PopupMenuAtMouse() override;
 
 private:

@@ -168,7 +168,7 @@ TEST_F(AnAutosave, TellsEachTimeThatItCannotWriteAndWhenItCanAgain) {
     QObject::connect(autosave.get(), &Autosave::worked, [&] { worked = true; });
     drawing.table(u"orders")->Left(100);
     drawing.document.settle();
-    EXPECT_TRUE(comesTrue([&] { return told.size() >= 3; })) << "it is tried again of itself";
+    ASSERT_TRUE(comesTrue([&] { return told.size() >= 3; })) << "it is tried again of itself";
     EXPECT_EQ(told[0],
               QStringLiteral("The changes cannot be kept safe in \"%1\" (Not a directory); "
                              "save the query yourself.")

@@ -13,12 +13,15 @@ struct Menu : Bench {
     std::unique_ptr<platform::MenuEntry> paste = entry(u"mnuPaste", u"&Paste");
 
     std::unique_ptr<platform::MenuEntry> entry(platform::StringView name,
-                                               platform::StringView caption) {
-        return menu->makeEntry({.Name = name, .Caption = caption},
-                               [this, called = platform::toUtf8(name)] {
-                                   EXPECT_FALSE(toolkit.menuOpen());
-                                   log += called + " ";
-                               });
+                                               platform::StringView caption,
+                                               const platform::MenuEntry* before = nullptr) {
+        return menu->makeEntry(
+            {.Name = name, .Caption = caption},
+            [this, called = platform::toUtf8(name)] {
+                EXPECT_FALSE(toolkit.menuOpen());
+                log += called + " ";
+            },
+            before);
     }
     void choose(const std::string& name) {
         toolkit.onMenu = [this, name](const headless::PopupMenu&) {
@@ -52,11 +55,14 @@ TEST(APopupMenu, LetsOnlyEnabledAndVisibleEntriesBeChosen) {
     EXPECT_THROW(m.choose("mnuNone"), std::logic_error);
 }
 
-TEST(APopupMenu, ShowsItsEntriesInTheOrderOfTheirMaking) {
+TEST(APopupMenu, ShowsItsEntriesInTheOrderOfTheirMakingUnlessOneIsToStandBeforeAnother) {
     Menu m;
     m.copy->Caption(u"Kopieren");
     EXPECT_EQ(m.look<headless::PopupMenu>("mnuZandor").entries(),
               (std::vector<std::string>{"mnuCopy", "mnuSep", "mnuPaste"}));
+    const auto move = m.entry(u"mnuMove", u"&Move", m.line.get());
+    EXPECT_EQ(m.look<headless::PopupMenu>("mnuZandor").entries(),
+              (std::vector<std::string>{"mnuCopy", "mnuMove", "mnuSep", "mnuPaste"}));
     EXPECT_EQ(m.look<headless::MenuEntry>("mnuCopy").look().text, u"Kopieren");
 }
 

@@ -1,3 +1,5 @@
+#include "frontends/qt/Fonts.h"
+#include "frontends/qt/Around.h"
 #include "frontends/qt/Desk.h"
 #include "frontends/qt/GridCells.h"
 
@@ -6,6 +8,7 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QDialog>
+#include <QFontInfo>
 #include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
@@ -13,21 +16,6 @@
 using namespace zandor;
 
 namespace {
-
-enum class Where { application, window, widget };
-enum class When { beforeBinding, afterBinding };
-
-struct Case {
-    Where where;
-    When when;
-};
-
-void PrintTo(const Case& c, std::ostream* out) {
-    *out << (c.where == Where::application ? "the application"
-             : c.where == Where::window    ? "the window"
-                                           : "the widget")
-         << (c.when == When::beforeBinding ? " before binding" : " after binding");
-}
 
 /// A font that is set somewhere around the control, at some time.
 class AFont : public Desk, public testing::WithParamInterface<Case> {
@@ -52,9 +40,9 @@ protected:
     void lay(qreal points) {
         host.resize(widget->size());
         host.show();
-        if (GetParam().when == When::beforeBinding) set(points);
+        if (GetParam().when == When::before) set(points);
         bind();
-        if (GetParam().when == When::afterBinding) set(points);
+        if (GetParam().when == When::after) set(points);
     }
 
     int textWidth(const char* text) {
@@ -177,10 +165,27 @@ TEST_P(AFont, LeavesWhatIsAskedForInTwipsTrue) {
         }
 }
 
-INSTANTIATE_TEST_SUITE_P(Of, AFont,
-                         testing::Values(Case{Where::application, When::beforeBinding},
-                                         Case{Where::application, When::afterBinding},
-                                         Case{Where::window, When::beforeBinding},
-                                         Case{Where::window, When::afterBinding},
-                                         Case{Where::widget, When::beforeBinding},
-                                         Case{Where::widget, When::afterBinding}));
+INSTANTIATE_TEST_SUITE_P(Of, AFont, testing::ValuesIn(everywhere));
+
+TEST(ASizeOfAFont, InPointsIsKeptToTheFraction) {
+    QFont font;
+    for (const float points : {8.25F, 9.5F, 9.75F, 10.0F, 12.5F}) {
+        font.setPointSizeF(static_cast<qreal>(points));
+        EXPECT_FLOAT_EQ(platform::qt::fromQt(font).Size, points);
+        EXPECT_FLOAT_EQ(static_cast<float>(
+                            platform::qt::toQt(platform::qt::fromQt(font), QFont()).pointSizeF()),
+                        points);
+    }
+}
+
+TEST(ASizeOfAFont, InPixelsIsAsLargeInPoints) {
+    for (int pixels = 9; pixels <= 32; ++pixels) {
+        QFont font;
+        font.setPixelSize(pixels);
+        const platform::Font told = platform::qt::fromQt(font);
+        EXPECT_FLOAT_EQ(told.Size, static_cast<float>(QFontInfo(font).pointSizeF()));
+        const QFont back = platform::qt::toQt(told, QFont());
+        EXPECT_EQ(QFontInfo(back).pixelSize(), pixels);
+        EXPECT_EQ(platform::qt::toQt(told, font).pixelSize(), pixels) << "it stays one in pixels";
+    }
+}

@@ -98,7 +98,7 @@ TEST_F(TheJoinDialog, AndAllElseHaveOneSizeWhereTheFontIsGivenInPixels) {
         settle();
         const auto check = [pixels](const QWidget& whole) {
             for (const auto* part : whole.findChildren<QWidget*>())
-                EXPECT_EQ(QFontInfo(part->font()).pixelSize(), pixels)
+                EXPECT_EQ(part->font().pixelSize(), pixels)
                     << part->metaObject()->className() << " " << part->objectName().toStdString();
         };
         check(host);

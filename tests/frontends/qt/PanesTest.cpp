@@ -129,7 +129,9 @@ protected:
         QTimer::singleShot(0, [&] {
             auto* menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
             if (!menu) return;
+            all.clear();
             for (QAction* action : menu->actions()) {
+                all += action->objectName();
                 if (action->isVisible() && action->isEnabled() && !action->isSeparator())
                     entries += action->objectName();
                 if (action->objectName() == choose) menu->setActiveAction(action);
@@ -145,6 +147,8 @@ protected:
         settle();
         return entries;
     }
+
+    QStringList all; ///< the entries of the last menu, also those that are not shown
 };
 
 } // namespace
@@ -161,6 +165,8 @@ TEST_F(ATitle, OpensTheMenuOfItsListForItsTable) {
     bind();
     EXPECT_EQ(entriesOf(table(2)), QStringList({"mnuTableDefinitionCopy",
                                                 "mnuTableDefinitionDelete", "mnuTableRename"}));
+    EXPECT_EQ(all.mid(all.indexOf("mnuTableDefinitionDelete"), 3),
+              QStringList({"mnuTableDefinitionDelete", "mnuTableRename", "mnuTableDefinitionSep"}));
     EXPECT_TRUE(table(2).isCurrent());
     entriesOf(table(3), "mnuTableDefinitionDelete");
     EXPECT_EQ(widget->DeletedTable(), "ORDER_LINES_OF_ALL_THE_YEARS_TOGETHER");

@@ -144,12 +144,14 @@ public:
     virtual void Visible(bool value) = 0;
 };
 
-/// A menu that is only ever popped up. Its entries stand in the order of their making.
+/// A menu that is only ever popped up.
 class ZANDOR_CONTROL_EXPORT PopupMenu {
 public:
     virtual ~PopupMenu() = default;
-    /// Caption "-" makes a separator. An ampersand marks the mnemonic.
-    virtual std::unique_ptr<MenuEntry> makeEntry(const Design& design, PlainEvent Click) = 0;
+    /// Caption "-" makes a separator. An ampersand marks the mnemonic. The entry stands right
+    /// before another one of this menu, or at its end.
+    virtual std::unique_ptr<MenuEntry> makeEntry(const Design& design, PlainEvent Click,
+                                                 const MenuEntry* before) = 0;
     /// Fires the menu's own click, shows it at the mouse and returns when it has closed; the
     /// chosen entry's handler has run by then.
     virtual void PopupMenuAtMouse() = 0;

@@ -21,7 +21,8 @@ class ZANDOR_HEADLESS_EXPORT PopupMenu final : public platform::PopupMenu, publi
 public:
     PopupMenu(Toolkit& toolkit, const Design& design, PlainEvent Click);
     ~PopupMenu() override;
-    std::unique_ptr<platform::MenuEntry> makeEntry(const Design& design, PlainEvent Click) override;
+    std::unique_ptr<platform::MenuEntry> makeEntry(const Design& design, PlainEvent Click,
+                                                   const platform::MenuEntry* before) override;
     void PopupMenuAtMouse() override;
 
     /// The names of its entries, in their order.
