@@ -73,7 +73,7 @@ public:
         files::QueryDocument document(query);
         document.database = address.toStdU16String();
         if (const auto error = files::saveQuery(file().toStdString(), document))
-            qFatal("%s", error->text.c_str());
+            qFatal("%s", error->text().c_str());
     }
 
     QString file() const { return mFolder.filePath(QStringLiteral("query.json")); }

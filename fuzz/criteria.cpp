@@ -50,7 +50,7 @@ void print(const model::sql::Node& condition) {
         for (const sql::ValueForm form : {sql::ValueForm::bound, sql::ValueForm::literal}) {
             const auto printed = sql::print(statement, dialect, form);
             if (const auto* refusal = std::get_if<sql::Refusal>(&printed)) {
-                must(isOneLine(refusal->message), "a refusal of one line");
+                must(isOneLine(refusal->message.text()), "a refusal of one line");
                 continue;
             }
             const auto& text = std::get<sql::Printed>(printed).text;
@@ -72,7 +72,7 @@ void use(const String& text, int type, model::sql::Dialect dialect) {
     must(!(reading.error && reading.condition), "an error or a condition");
     if (reading.error) {
         must(reading.error->position <= text.size(), "a position in the text");
-        must(isOneLine(reading.error->message), "an error of one line");
+        must(isOneLine(reading.error->message.text()), "an error of one line");
     }
     if (reading.condition) print(reading.condition);
 
@@ -84,7 +84,7 @@ void use(const String& text, int type, model::sql::Dialect dialect) {
     must(statement.runnable() || !statement.findings.empty(), "a statement or a reason");
     query->renameTable(table, u"an Or [other");
     for (const auto& finding : model::sql::build(*query).findings)
-        must(isOneLine(finding.text), "a finding of one line");
+        must(isOneLine(finding.text()), "a finding of one line");
 }
 
 } // namespace

@@ -62,7 +62,7 @@ reader::Result<Arguments> readArguments(const QStringList& arguments) {
         return reader::Error{QStringLiteral("--as-shown goes with --picture only.")};
     result.dark = parser.isSet(dark);
     const auto task = shell::taskOf(parser);
-    if (!task) return reader::Error{task.error()};
+    if (!task) return task.failure();
     result.task = *task;
     const bool window = !result.file.isEmpty() || !result.tables.isEmpty() ||
                         !result.screenshot.isEmpty() || !result.picture.isEmpty();

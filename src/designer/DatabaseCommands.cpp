@@ -7,7 +7,6 @@
 #include "designer/document/QueryFile.h"
 #include "designer/document/RecentFiles.h"
 #include "designer/document/RecentMenu.h"
-#include "designer/statement/ModelWords.h"
 
 #include <QFileDialog>
 #include <QMenu>
@@ -57,7 +56,7 @@ void DatabaseCommands::openAddress(const QString& address) {
     if (!mFiles.mayLose()) return;
     const Opening opening = openAskingForPassword(mDatabase, address, &mWindow);
     if (!opening.error.isEmpty())
-        PlainBox::warn(&mWindow, tr("Open database"), inWords(opening.error));
+        PlainBox::warn(&mWindow, tr("Open database"), opening.error);
     if (opening.opened) begin();
 }
 
@@ -75,7 +74,7 @@ void DatabaseCommands::followFile() {
     if (mDatabase.isOpen()) mDatabase.close(); // the query is not to run on another one
     PlainBox box(
         QMessageBox::Warning, tr("Open database"),
-        tr("The query is open, but not its database. %1").arg(inWords(opening.error)).trimmed(),
+        tr("The query is open, but not its database. %1").arg(opening.error).trimmed(),
         QMessageBox::Close, &mWindow);
     const auto* again = box.addButton(tr("&Try again"), QMessageBox::AcceptRole);
     const auto* another = box.addButton(tr("&Choose database\u2026"), QMessageBox::AcceptRole);
@@ -106,7 +105,7 @@ void DatabaseCommands::askForConnection() {
 
 void DatabaseCommands::reconnect() {
     const Opening opening = renewPatiently(mDatabase, &mWindow);
-    if (!opening.error.isEmpty()) PlainBox::warn(&mWindow, tr("Reconnect"), inWords(opening.error));
+    if (!opening.error.isEmpty()) PlainBox::warn(&mWindow, tr("Reconnect"), opening.error);
 }
 
 } // namespace zandor::designer

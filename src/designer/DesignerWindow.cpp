@@ -333,7 +333,7 @@ std::optional<QString> DesignerWindow::openAtFirst(const Arguments& arguments,
     const auto opened =
         openQuery(mDatabase.reader(), mDatabase.tables(),
                   {arguments.tables, isSample, address, mDrawing->width() * twipsPerPixel});
-    if (!opened) return opened.error();
+    if (!opened) return inWords(opened.failure());
     mDocument.setQuery(opened->query);
     mAdding->takeAsArranged();
     tell(opened->message);
@@ -365,11 +365,11 @@ void DesignerWindow::saveForTheEnd() {
 
 void DesignerWindow::offerAgain(const QString& error, const Arguments& arguments,
                                 const QString& sample) {
-    mNotOpened->say(inWords(error));
+    mNotOpened->say(error);
     mAgain->disconnect();
     connect(mAgain, &QPushButton::clicked, this, [this, arguments, sample] {
         if (const auto again = openAtFirst(arguments, sample))
-            mNotOpened->say(inWords(*again));
+            mNotOpened->say(*again);
         else
             mNotOpened->hide();
     });

@@ -44,7 +44,7 @@ void DrawingArea::showFindings(const model::Findings& findings) {
     for (const model::Finding& finding : findings)
         if (finding.kind == model::Finding::Kind::badCriterion)
             mFindings.push_back(
-                {finding.definition, finding.row, fromQt(inWords(toQt(finding.text)))});
+                {finding.definition, finding.row, fromQt(inWords(finding.message))});
     mControl->setFindings(mFindings);
 }
 

@@ -43,14 +43,14 @@ Result<OpenedQuery> openQuery(reader::DatabaseReader& schema,
     const bool example = wanted.example && wanted.names.isEmpty();
     const QStringList names = example ? exampleTables() : wanted.names;
     const auto chosen = named(names, present, wanted.database);
-    if (!chosen) return Error{chosen.error()};
+    if (!chosen) return chosen.failure();
 
     OpenedQuery opened;
     opened.query = platform::makeRef<model::Query>();
     std::vector<reader::LeftOut> leftOut;
     const auto added =
         reader::addTables(*opened.query, schema, *chosen, wanted.canvasWidth, &leftOut);
-    if (!added) return Error{added.error()};
+    if (!added) return added.failure();
     if (opened.query->Joins().Count() > mostJoins)
         return Error{tr("These tables have %1 joins, and the canvas takes %2; choose fewer tables "
                         "with --tables.")

@@ -40,7 +40,7 @@ int failed(const QString& why) {
 /// Draws the tables and joins of a query's file into another file.
 int drawQuery(const designer::Arguments& arguments) {
     const auto document = files::loadQuery(designer::pathOf(arguments.drawing));
-    if (!document) return refuse(QString::fromStdString(document.error()));
+    if (!document) return refuse(designer::inWords(document.failure()));
     using designer::DrawingPicture;
     const DrawingPicture picture(*document->query, {},
                                  arguments.asShown ? DrawingPicture::Rows::asDrawn

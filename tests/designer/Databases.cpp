@@ -34,7 +34,7 @@ designer::OpenedQuery openedSample(const QStringList& tables) {
 reader::Result<designer::OpenedQuery> openDatabaseFile(const QString& file,
                                                        const designer::FirstTables& wanted) {
     designer::Database database;
-    if (const auto error = database.open(file)) return reader::Error{*error};
+    if (const auto error = database.open(file)) return *error;
     return designer::openQuery(database.reader(), database.tables(), wanted);
 }
 

@@ -1,7 +1,6 @@
 #include "designer/database/ConnectionBanner.h"
 
 #include "designer/database/opening.h"
-#include "designer/statement/ModelWords.h"
 
 #include <QPushButton>
 
@@ -19,7 +18,7 @@ ConnectionBanner::ConnectionBanner(Database& database, QWidget* parent)
 
 void ConnectionBanner::showLoss(const QString& message) {
     say(tr("The connection to %1 is lost. Your query is kept.").arg(mDatabase.name()),
-        inWords(message));
+        message);
 }
 
 void ConnectionBanner::showChange(Database::Change change) {
@@ -36,7 +35,7 @@ void ConnectionBanner::showChange(Database::Change change) {
 
 void ConnectionBanner::reconnect() {
     const Opening opening = renewPatiently(mDatabase, window());
-    if (!opening.error.isEmpty()) say(inWords(opening.error));
+    if (!opening.error.isEmpty()) say(opening.error);
 }
 
 } // namespace zandor::designer

@@ -39,31 +39,31 @@ std::optional<QByteArray> structureOf(const reader::Connection& connection) {
 Database::Database(QObject* parent) : QObject(parent) {}
 Database::~Database() = default;
 
-std::optional<QString> Database::open(const QString& address, const QString& password) {
+std::optional<reader::Error> Database::open(const QString& address, const QString& password) {
     return take(address, password, {});
 }
 
-std::optional<QString> Database::open(const QString& address, const QString& password,
+std::optional<reader::Error> Database::open(const QString& address, const QString& password,
                                       Tables tables) {
     return take(address, password, std::move(tables));
 }
 
-std::optional<QString> Database::renew() { return take(QString(mAddress), QString(mPassword), {}); }
+std::optional<reader::Error> Database::renew() { return take(QString(mAddress), QString(mPassword), {}); }
 
-std::optional<QString> Database::renew(Tables tables) {
+std::optional<reader::Error> Database::renew(Tables tables) {
     return take(QString(mAddress), QString(mPassword), std::move(tables));
 }
 
-std::optional<QString> Database::take(const QString& address, const QString& password,
+std::optional<reader::Error> Database::take(const QString& address, const QString& password,
                                       std::optional<Tables> tables) {
     const PartedAddress parted = partPassword(address);
     const QString& secret = password.isEmpty() ? parted.password : password;
     auto connection = reader::openDatabase(parted.address, secret);
-    if (!connection) return connection.error();
+    if (!connection) return connection.failure();
     auto reader = std::make_unique<RememberingReader>(reader::makeReader(connection->database()));
     if (!tables) {
         auto read = reader->tables();
-        if (!read) return read.error();
+        if (!read) return read.failure();
         tables = std::move(*read);
     }
     // The reader goes before the connection that it reads over.

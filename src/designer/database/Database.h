@@ -34,12 +34,12 @@ public:
     /// list of its tables; emits opened(). A password in the address is taken out of it. On an
     /// error the one before stays. Returns what went wrong. Waits for the server: windows call
     /// openPatiently() instead.
-    std::optional<QString> open(const QString& address, const QString& password = {});
+    std::optional<reader::Error> open(const QString& address, const QString& password = {});
     /// The same with a list of tables that was read already.
-    std::optional<QString> open(const QString& address, const QString& password, Tables tables);
+    std::optional<reader::Error> open(const QString& address, const QString& password, Tables tables);
     /// Connects afresh to the same database and reads everything again; emits opened().
-    std::optional<QString> renew();
-    std::optional<QString> renew(Tables tables);
+    std::optional<reader::Error> renew();
+    std::optional<reader::Error> renew(Tables tables);
     bool isOpen() const { return mConnection.has_value(); }
     /// From now on there is none; emits opened().
     void close();
@@ -64,7 +64,7 @@ public:
     static Connector connectorTo(const QString& address, const QString& password);
 
     /// Tells everybody, once until the connection is renewed, that it has broken down; `message` is
-    /// the engine's. A file cannot be lost.
+    /// what the engine said, or why it was not reached. A file cannot be lost.
     void sayLost(const QString& message);
     /// That it answers again, over whatever connection; emits found() when it was lost.
     void sayFound();
@@ -89,7 +89,7 @@ signals:
 
 private:
     std::optional<Change> changed();
-    std::optional<QString> take(const QString& address, const QString& password,
+    std::optional<reader::Error> take(const QString& address, const QString& password,
                                 std::optional<Tables> tables);
 
     QString mAddress;

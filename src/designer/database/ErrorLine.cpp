@@ -1,7 +1,6 @@
 #include "designer/database/ErrorLine.h"
 
 #include "designer/Colours.h"
-#include "designer/statement/ModelWords.h"
 #include "frontends/qt/ShownText.h"
 
 #include <QEvent>
@@ -30,7 +29,7 @@ void ErrorLine::changeEvent(QEvent* event) {
 }
 
 void ErrorLine::say(const QString& error) {
-    setText(platform::qt::asSigns(inWords(error)));
+    setText(platform::qt::asSigns(error));
     setVisible(!error.isEmpty());
 }
 

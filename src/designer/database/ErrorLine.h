@@ -12,7 +12,6 @@ class ErrorLine final : public QLabel {
 public:
     explicit ErrorLine(QWidget* parent = nullptr);
 
-    /// What is a message of the model is said in the designer's language.
     void say(const QString& error);
 
 protected:

@@ -3,6 +3,7 @@
 #include "designer/database/Address.h"
 #include "designer/database/PasswordPrompt.h"
 #include "designer/database/patiently.h"
+#include "designer/statement/ModelWords.h"
 #include "model/reader/serverError.h"
 
 #include <QCoreApplication>
@@ -11,12 +12,16 @@ namespace zandor::designer {
 
 namespace {
 
-using Take = std::function<std::optional<QString>(Database::Tables)>;
+using Take = std::function<std::optional<reader::Error>(Database::Tables)>;
 
 reader::Result<Database::Tables> listOfTables(const Connector& connect) {
     const auto connection = connect();
-    if (!connection) return reader::Error{connection.error()};
+    if (!connection) return connection.failure();
     return reader::makeReader(connection->database())->tables();
+}
+
+Opening refused(const reader::Error& error) {
+    return {false, inWords(error), reader::asksForPassword(error)};
 }
 
 /// Lets a thread find out whether the database can be opened, and opens it here when it can: a
@@ -27,9 +32,9 @@ Opening openBy(const Connector& connect, const QString& name, QWidget* window, c
             .arg(name),
         window, [connect] { return listOfTables(connect); });
     if (!tables) return {};
-    if (!*tables) return {false, tables->error()};
+    if (!*tables) return refused(tables->failure());
     const auto error = take(std::move(**tables));
-    return error ? Opening{false, *error} : Opening{true, {}};
+    return error ? refused(*error) : Opening{true};
 }
 
 } // namespace
@@ -52,7 +57,7 @@ Opening openAskingForPassword(Database& database, const QString& address, QWidge
     QString password = parted.password;
     while (true) {
         Opening opening = openPatiently(database, parted.address, password, window);
-        if (!reader::asksForPassword(opening.error)) return opening;
+        if (!opening.asksForPassword) return opening;
         const QString why = password.isEmpty() ? QString() : opening.error;
         const auto given = askForPassword(parted.address, why, window);
         if (!given) return {};

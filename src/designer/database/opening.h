@@ -9,7 +9,8 @@ namespace zandor::designer {
 /// How opening a database ended. Neither opened nor with an error: the user has cancelled it.
 struct Opening {
     bool opened = false;
-    QString error;
+    QString error = {};           ///< in words for the user
+    bool asksForPassword = false; ///< the server wants one, or another one
 };
 
 /// Database::open for windows: the server is tried on another thread, and the user may cancel.

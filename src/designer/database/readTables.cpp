@@ -1,5 +1,7 @@
 #include "designer/database/readTables.h"
 
+#include "designer/statement/ModelWords.h"
+
 namespace zandor::designer {
 
 using reader::TableId;
@@ -16,32 +18,32 @@ Wanted unknownOf(Database& database, const Wanted& wanted) {
 TablesRead readTables(const Connector& connect, const Wanted& wanted) {
     std::vector<KnownTable> known;
     const auto connection = connect();
-    if (!connection) return {reader::Error{connection.error()}, true};
+    if (!connection) return {connection.failure(), true};
     const auto reader = reader::makeReader(connection->database());
-    const auto failed = [&](const QString& error) {
-        return TablesRead{reader::Error{error}, !reader::answers(*connection)};
+    const auto failed = [&](const reader::Error& error) {
+        return TablesRead{error, !reader::answers(*connection)};
     };
     for (const TableId& id : wanted.columns) {
         auto description = reader->table(id);
-        if (!description) return failed(description.error());
+        if (!description) return failed(description.failure());
         known.push_back({id, std::move(*description), {}});
     }
     for (const TableId& id : wanted.foreignKeys) {
         auto keys = reader->foreignKeys(id);
-        if (!keys) return failed(keys.error());
+        if (!keys) return failed(keys.failure());
         known.push_back({id, {}, std::move(*keys)});
     }
     return {std::move(known)};
 }
 
-std::optional<QString> takeTables(Database& database, const TablesRead& read) {
+std::optional<reader::Error> takeTables(Database& database, const TablesRead& read) {
     if (read.tables) {
         database.reader().remember(*read.tables);
         database.sayFound();
         return {};
     }
-    if (read.lost) database.sayLost(read.tables.error());
-    return read.tables.error();
+    if (read.lost) database.sayLost(inWords(read.tables.failure()));
+    return read.tables.failure();
 }
 
 } // namespace zandor::designer

@@ -27,6 +27,6 @@ Wanted unknownOf(Database& database, const Wanted& wanted);
 TablesRead readTables(const Connector& connect, const Wanted& wanted);
 
 /// Hands what was read to the database's reader; the error, when there is one. Tells of a loss.
-std::optional<QString> takeTables(Database& database, const TablesRead& read);
+std::optional<reader::Error> takeTables(Database& database, const TablesRead& read);
 
 } // namespace zandor::designer

@@ -2,6 +2,7 @@
 
 #include "designer/document/Document.h"
 #include "designer/document/QueryFile.h"
+#include "designer/statement/ModelWords.h"
 
 #include <QCoreApplication>
 
@@ -62,11 +63,11 @@ void Autosave::save() {
     if (!content) return remove();
     if (!mSlot) {
         auto made = AutosaveSlot::made(mFolder);
-        if (!made) return tell(QString::fromStdString(made.error()));
+        if (!made) return tell(inWords(made.failure()));
         mSlot = std::move(*made);
     }
     const auto bytes = Autosaved{mFile.path(), *content, mFile.origin()}.bytes();
-    if (!bytes) return tell(QString::fromStdString(bytes.error()));
+    if (!bytes) return tell(inWords(bytes.failure()));
     mWriter.start([this, file = mSlot->file(), content = *bytes] {
         const auto error = AutosaveSlot::write(file, content);
         QMetaObject::invokeMethod(this, [this, error] {

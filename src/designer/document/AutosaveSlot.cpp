@@ -1,6 +1,7 @@
 #include "designer/document/AutosaveSlot.h"
 
 #include "designer/document/paths.h"
+#include "designer/statement/ModelWords.h"
 
 #include <Zandor/files/Replacement.h>
 
@@ -24,7 +25,7 @@ const QString queryMember = QStringLiteral("query");
 
 files::Result<QByteArray> Autosaved::bytes() const {
     const auto text = files::toJson(content);
-    if (!text) return files::Error{text.error()};
+    if (!text) return text.failure();
     return QJsonDocument(QJsonObject{{fileMember, path},
                                      {originMember, QString::fromLatin1(origin.toHex())},
                                      {queryMember, QString::fromStdString(*text)}})
@@ -34,7 +35,7 @@ files::Result<QByteArray> Autosaved::bytes() const {
 files::Result<Autosaved> Autosaved::read(const QByteArray& bytes) {
     const QJsonObject object = QJsonDocument::fromJson(bytes).object();
     const auto content = files::fromJson(object.value(queryMember).toString().toStdString());
-    if (!content) return files::Error{content.error()};
+    if (!content) return content.failure();
     return Autosaved{object.value(fileMember).toString(), *content,
                      QByteArray::fromHex(object.value(originMember).toString().toLatin1())};
 }
@@ -88,7 +89,8 @@ files::Result<Autosaved> AutosaveSlot::read() const {
 std::optional<QString> AutosaveSlot::write(const QString& file, const QByteArray& bytes) {
     const auto error = files::replaceFile(pathOf(file), bytes.toStdString());
     if (!error) return {};
-    return QString::fromStdString(error->reason.empty() ? error->text : error->reason);
+    const std::string said = error->reason();
+    return said.empty() ? inWords(*error) : QString::fromStdString(said);
 }
 
 void AutosaveSlot::remove() { QFile::remove(mFile); }

@@ -4,7 +4,6 @@
 #include "designer/document/Document.h"
 #include "designer/document/QueryFile.h"
 #include "designer/document/RecentFiles.h"
-#include "designer/statement/ModelWords.h"
 
 #include <QFileDialog>
 #include <QFileInfo>
@@ -153,7 +152,7 @@ FileDialogs::Whose FileDialogs::ask(const QString& detail, const QString& mine,
 }
 
 void FileDialogs::tell(const QString& title, const QString& error) {
-    PlainBox::warn(&mWindow, title, inWords(error));
+    PlainBox::warn(&mWindow, title, error);
 }
 
 } // namespace zandor::designer

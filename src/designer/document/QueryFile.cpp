@@ -3,6 +3,7 @@
 #include "designer/database/Address.h"
 #include "designer/document/Document.h"
 #include "designer/document/paths.h"
+#include "designer/statement/ModelWords.h"
 
 #include <Zandor/files/Replacement.h>
 
@@ -59,7 +60,7 @@ std::optional<QString> QueryFile::open(const QString& path) {
     const auto mark = FileMark::of(path);
     const QByteArray origin = digestOf(path);
     const auto content = files::loadQuery(pathOf(path));
-    if (!content) return QString::fromStdString(content.error());
+    if (!content) return inWords(content.failure());
     mMark = mark;
     mOrigin = origin;
     take(QFileInfo(path).absoluteFilePath(), *content);
@@ -68,9 +69,9 @@ std::optional<QString> QueryFile::open(const QString& path) {
 
 std::optional<QString> QueryFile::saveAs(const QString& path) {
     const auto text = files::toJson(content());
-    if (!text) return QString::fromStdString(text.error());
+    if (!text) return inWords(text.failure());
     if (const auto error = files::replaceFile(pathOf(path), *text))
-        return QString::fromStdString(error->text);
+        return inWords(*error);
     mMark = FileMark::of(path);
     mOrigin = digest(QByteArray::fromStdString(*text));
     mPath = QFileInfo(path).absoluteFilePath();

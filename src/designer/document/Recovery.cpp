@@ -44,7 +44,7 @@ public:
                         "cannot be read. They stay in the file \"%1\".")
                          .arg(path),
                      QMessageBox::Ok, window);
-        box.setInformativeText(inWords(error));
+        box.setInformativeText(error);
         box.exec();
     }
 };
@@ -56,7 +56,7 @@ bool offerRecovery(QueryFile& file, Autosave& autosave, const QString& folder, Q
         const auto saved = slot->read();
         if (!saved) {
             // It may be of a later version of the designer, which can.
-            Recovery::tell(QString::fromStdString(saved.error()), slot->setAside(), window);
+            Recovery::tell(inWords(saved.failure()), slot->setAside(), window);
             continue;
         }
         switch (Recovery::ask(saved->path, slot->saved(), window)) {

@@ -94,7 +94,7 @@ std::optional<Command> ResultsPanel::command(std::optional<qint64> limit) {
         for (const model::Finding& finding : text.findings)
             if (finding.isError())
                 lines << QStringLiteral("\u2022 ") +
-                             inWords(QString::fromStdU16String(finding.text));
+                             inWords(finding.message);
         showMessage(lines.join(u'\n'));
         return {};
     }
@@ -204,7 +204,7 @@ void ResultsPanel::finish(const Outcome& outcome) {
                             : tr("Cancelled. Rows that came: %1 \u00b7 %2").arg(rows, seconds()));
         break;
     case Outcome::End::unreachable:
-        showMessage(inWords(outcome.message));
+        showMessage(outcome.message);
         mDatabase.sayLost(outcome.message);
         break;
     case Outcome::End::refused: showMessage(outcome.message); break;

@@ -1,6 +1,7 @@
 #include "designer/run/fetch.h"
 
 #include "designer/run/EngineStop.h"
+#include "designer/statement/ModelWords.h"
 
 #include <QSqlError>
 #include <QSqlQuery>
@@ -85,7 +86,7 @@ Outcome fetch(const Connector& connector, const Command& command, Sink& sink,
               const std::atomic<bool>& stop) {
     const auto connection = connector();
     if (stop) return {Outcome::End::cancelled};
-    if (!connection) return {Outcome::End::unreachable, connection.error()};
+    if (!connection) return {Outcome::End::unreachable, inWords(connection.failure())};
     return Fetch(connector, *connection, stop).run(command, sink);
 }
 

@@ -35,7 +35,7 @@ struct Outcome {
     };
 
     End end = End::complete;
-    QString message = {}; ///< the engine's words or ours
+    QString message = {}; ///< the engine's words, or ours in the designer's language
     qint64 rows = 0;      ///< that the sink took
 };
 

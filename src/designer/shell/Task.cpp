@@ -111,7 +111,7 @@ int print(const QByteArray& text) {
 
 files::Stream standardOutput() {
     // On a terminal one sees each row as it comes.
-    return {STDOUT_FILENO, "The output cannot be written",
+    return {STDOUT_FILENO, model::say<files::MessageCode::outputNotWritten>(),
             isatty(STDOUT_FILENO) ? files::Stream::nothingWaits : files::Stream::usuallyWaiting};
 }
 

@@ -1,6 +1,7 @@
 #include "designer/database/Address.h"
 #include "designer/document/paths.h"
 #include "designer/shell/Task.h"
+#include "designer/statement/ModelWords.h"
 
 #include <Zandor/QueryDocument.h>
 #include <Zandor/sql/Builder.h>
@@ -27,12 +28,12 @@ Dialect dialectFor(const QString& database) {
 
 int printStatement(const Task& task) {
     const auto document = files::loadQuery(pathOf(task.query));
-    if (!document) return complain(QString::fromStdString(document.error())), unusable;
+    if (!document) return complain(inWords(document.failure())), unusable;
     const Dialect dialect =
         task.dialect ? *task.dialect : dialectFor(QString::fromStdU16String(document->database));
     const auto text = statementText(*document->query, dialect, model::sql::ValueForm::literal);
     for (const model::Finding& finding : text.findings)
-        complain(QString::fromStdU16String(finding.text));
+        complain(inWords(finding.message));
     // One with something left out would not say what was drawn.
     if (!text.runnable()) return failed;
     return print(QByteArray::fromStdString(platform::toUtf8(text.text)) + '\n');

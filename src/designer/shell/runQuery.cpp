@@ -45,13 +45,13 @@ reader::Result<Opened> openDatabase(const QString& address) {
     auto [bare, password] = partPassword(address);
     auto connection = reader::openDatabase(bare, password);
     for (int tries = 0; !connection && tries < mostTries; ++tries) {
-        if (!reader::asksForPassword(connection.error())) break;
+        if (!reader::asksForPassword(connection.failure())) break;
         const auto typed = askPassword(bare);
         if (!typed) break;
         password = *typed;
         connection = reader::openDatabase(bare, password);
     }
-    if (!connection) return reader::Error{connection.error()};
+    if (!connection) return connection.failure();
     const auto dialect = reader::dialectOf(connection->database());
     const auto first = std::make_shared<std::optional<reader::Connection>>(std::move(*connection));
     const Connector others = Database::connectorTo(bare, password);
@@ -105,7 +105,7 @@ std::unique_ptr<Sink> makeWriter(Format format, files::Output& out) {
 
 int runQuery(const Task& task) {
     const auto document = files::loadQuery(pathOf(task.query));
-    if (!document) return complain(QString::fromStdString(document.error())), unusable;
+    if (!document) return complain(inWords(document.failure())), unusable;
     const QString address =
         task.database.isEmpty() ? QString::fromStdU16String(document->database) : task.database;
     if (address.isEmpty())
@@ -113,12 +113,12 @@ int runQuery(const Task& task) {
                unusable;
     heedSignals();
     const auto opened = openDatabase(address);
-    if (!opened) return complain(opened.error()), unusable;
+    if (!opened) return complain(inWords(opened.failure())), unusable;
 
     const auto text = statementFor(*document->query, opened->dialect, task.limit);
     if (!text.runnable()) {
         for (const model::Finding& finding : text.findings)
-            if (finding.isError()) complain(QString::fromStdU16String(finding.text));
+            if (finding.isError()) complain(inWords(finding.message));
         return failed;
     }
     if (const auto wrong = complaint(questions(text), task.values))

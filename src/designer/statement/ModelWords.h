@@ -1,19 +1,20 @@
 #pragma once
 
 #include <Zandor/files/Error.h>
+#include <Zandor/reader/Result.h>
 
 #include <QString>
-#include <QStringList>
+
+#include <optional>
 
 namespace zandor::designer {
 
-/// A message of the query model, which speaks English, in the designer's language; as it stands
-/// when it is not one that the designer knows.
-QString inWords(const QString& message);
+/// What the query model, a file or a reader has to say, in the designer's language. May be called
+/// from any thread.
+QString inWords(const model::Message& message);
+QString inWords(const files::Error& error);
+QString inWords(const reader::Error& error);
 /// Of a file that could not be written; nothing for nothing.
 std::optional<QString> inWords(const std::optional<files::Error>& error);
-
-/// The messages that it knows, in English, with %1 and so on in the place of names and numbers.
-QStringList knownMessages();
 
 } // namespace zandor::designer

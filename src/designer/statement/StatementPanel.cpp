@@ -139,7 +139,7 @@ void StatementPanel::showNow() {
     } else if (text.isEmpty()) {
         QStringList why{tr("%1 cannot say this query:").arg(shownName(dialect()))};
         for (const model::Finding& finding : written.findings)
-            if (finding.isError()) why << inWords(toQt(finding.text));
+            if (finding.isError()) why << inWords(finding.message);
         instead = why.join(QStringLiteral("\n\n"));
     }
     mView->setPlaceholderText(instead);
@@ -165,7 +165,7 @@ void StatementPanel::showFindings(const model::Findings& findings) {
         auto* const item =
             new QListWidgetItem(style()->standardIcon(error ? QStyle::SP_MessageBoxCritical
                                                             : QStyle::SP_MessageBoxWarning),
-                                platform::qt::asSigns(inWords(toQt(finding.text))), mList);
+                                platform::qt::asSigns(inWords(finding.message)), mList);
         item->setData(Qt::AccessibleTextRole,
                       (error ? tr("Error: %1") : tr("Warning: %1")).arg(item->text()));
     }

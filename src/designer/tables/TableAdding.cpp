@@ -98,7 +98,7 @@ bool TableAdding::fits(const std::vector<TableId>& tables) {
     const auto copy = model::Query::restored(mDocument.query()->record());
     const auto added = reader::addTables(*copy, mDatabase.reader(), tables, canvasWidth());
     if (!added) {
-        emit refused(inWords(added.error()));
+        emit refused(inWords(added.failure()));
         return false;
     }
     if (copy->Joins().Count() <= mostJoins) return true;

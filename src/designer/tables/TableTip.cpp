@@ -1,6 +1,7 @@
 #include "designer/tables/TableTip.h"
 
 #include "designer/database/patiently.h"
+#include "designer/statement/ModelWords.h"
 #include "designer/tables/TableListModel.h"
 #include "frontends/qt/ShownText.h"
 
@@ -53,7 +54,7 @@ bool TableTip::eventFilter(QObject*, QEvent* event) {
 void TableTip::show(const reader::TableEntry& table, QPoint at) {
     const auto columns = mDatabase.reader().table(table.id);
     QToolTip::showText(
-        at, columns ? tipText(*columns, table.isView) : platform::qt::asToolTip(columns.error()),
+        at, columns ? tipText(*columns, table.isView) : platform::qt::asToolTip(inWords(columns.failure())),
         mList.viewport());
 }
 

@@ -168,34 +168,49 @@ bool isNumber(ColumnType type) {
     return type == ColumnType::Integer || type == ColumnType::Decimal;
 }
 
-StringView nameOf(ColumnType type) {
+Message nameOf(ColumnType type) {
     switch (type) {
-    case ColumnType::Text: return u"a text";
+    case ColumnType::Text: return say<MessageCode::aText>();
     case ColumnType::Integer:
-    case ColumnType::Decimal: return u"a number";
-    case ColumnType::Date: return u"a date (2024-12-31)";
-    case ColumnType::Time: return u"a time (23:59)";
-    case ColumnType::Timestamp: return u"a date and time (2024-12-31 23:59)";
-    case ColumnType::Boolean: return u"true or false";
-    case ColumnType::Blob: return u"Is Null, a column or a parameter";
+    case ColumnType::Decimal: return say<MessageCode::aNumber>();
+    case ColumnType::Date: return say<MessageCode::aDate>();
+    case ColumnType::Time: return say<MessageCode::aTime>();
+    case ColumnType::Timestamp: return say<MessageCode::aTimestamp>();
+    case ColumnType::Boolean: return say<MessageCode::aBoolean>();
+    case ColumnType::Blob: return say<MessageCode::noValue>();
     case ColumnType::Unknown: break;
     }
-    return u"a value";
+    return say<MessageCode::aValue>();
 }
 
-StringView refusalOf(ColumnType type) {
+Message missingOf(ColumnType type) {
+    switch (type) {
+    case ColumnType::Text: return say<MessageCode::textMissing>();
+    case ColumnType::Integer:
+    case ColumnType::Decimal: return say<MessageCode::numberMissing>();
+    case ColumnType::Date: return say<MessageCode::dateMissing>();
+    case ColumnType::Time: return say<MessageCode::timeMissing>();
+    case ColumnType::Timestamp: return say<MessageCode::timestampMissing>();
+    case ColumnType::Boolean: return say<MessageCode::booleanMissing>();
+    case ColumnType::Blob: return say<MessageCode::noValueMissing>();
+    case ColumnType::Unknown: break;
+    }
+    return say<MessageCode::valueMissing>();
+}
+
+Message refusalOf(ColumnType type) {
     switch (type) {
     case ColumnType::Integer:
-    case ColumnType::Decimal: return u"this is no number, write it like 12 or 1.5";
-    case ColumnType::Date: return u"this is no date, write it like 2024-12-31";
-    case ColumnType::Time: return u"this is no time, write it like 23:59";
-    case ColumnType::Timestamp: return u"this is no date and time, write it like 2024-12-31 23:59";
-    case ColumnType::Boolean: return u"write true or false here";
-    case ColumnType::Blob: return u"only Is Null, a column or a parameter can stand here";
+    case ColumnType::Decimal: return say<MessageCode::notANumber>();
+    case ColumnType::Date: return say<MessageCode::notADate>();
+    case ColumnType::Time: return say<MessageCode::notATime>();
+    case ColumnType::Timestamp: return say<MessageCode::notATimestamp>();
+    case ColumnType::Boolean: return say<MessageCode::notABoolean>();
+    case ColumnType::Blob: return say<MessageCode::valueRefused>();
     case ColumnType::Text:
     case ColumnType::Unknown: break;
     }
-    return u"only dates and times stand between two #";
+    return say<MessageCode::notAMoment>();
 }
 
 std::optional<sql::Value> literal(StringView text, ColumnType type) {

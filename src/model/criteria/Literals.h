@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/model/Messages.h>
 #include <Zandor/model/export.h>
 #include <Zandor/sql/Expression.h>
 
@@ -9,9 +10,11 @@
 namespace zandor::model::criteria {
 
 /// What a value of a type is called in a message: "a number", "a date (2024-12-31)".
-ZANDOR_MODEL_EXPORT StringView nameOf(ColumnType type);
+Message nameOf(ColumnType type);
+/// That a value of a type is missing.
+Message missingOf(ColumnType type);
 /// What is said of something typed that is no value of a type, ending with a way to write one.
-ZANDOR_MODEL_EXPORT StringView refusalOf(ColumnType type);
+Message refusalOf(ColumnType type);
 ZANDOR_MODEL_EXPORT bool isNumber(ColumnType type);
 
 /// The value that a text is for a column of a type, canonical, or nothing when it is none.

@@ -13,7 +13,6 @@ using sql::Node;
 namespace {
 
 constexpr int deepestNesting = 100;
-constexpr StringView decimalPoint = u"decimals are written with a point, as in 1.5";
 
 class Parser {
 public:
@@ -26,7 +25,7 @@ public:
         try {
             if (peek().kind != TokenKind::end) mReading.condition = disjunction();
             if (peek().kind != TokenKind::end)
-                fail(u"put And or Or between two conditions, or quotes around a text");
+                fail<MessageCode::jointMissing>();
         } catch (Error& error) {
             mReading.condition = {};
             mReading.error = std::move(error);
@@ -41,7 +40,7 @@ private:
     public:
         explicit Nesting(Parser& parser) : mParser(parser) {
             if (++mParser.mDepth > deepestNesting)
-                mParser.fail(u"this is nested too deep, 100 levels are the most");
+                mParser.fail<MessageCode::nestedTooDeep>();
         }
         ~Nesting() { --mParser.mDepth; }
 
@@ -66,15 +65,14 @@ private:
         take();
         return true;
     }
-    [[noreturn]] void fail(StringView what) const {
-        if (atDecimalComma()) throw errorAt(peek().begin, decimalPoint);
-        throw errorAt(peek().begin, what);
+    template <MessageCode code, class... Arguments>
+    [[noreturn]] void fail(const Arguments&... arguments) const {
+        if (atDecimalComma()) throw Error{peek().begin, say<MessageCode::decimalComma>()};
+        throw Error{peek().begin, say<code>(arguments...)};
     }
     /// For want of a value.
     [[noreturn]] void failMissing(const Token& token) const {
-        String what(nameOf(mSubjectColumn.type));
-        what += u" is missing";
-        throw errorAt(token.begin, what);
+        throw Error{token.begin, missingOf(mSubjectColumn.type)};
     }
     /// For a value that is none of the column's.
     [[noreturn]] void failValue(const Token& token) const {
@@ -83,9 +81,10 @@ private:
         if (number && comma != String::npos) {
             String point = token.text;
             point[comma] = u'.';
-            if (literal(point, ColumnType::Decimal)) throw errorAt(token.begin, decimalPoint);
+            if (literal(point, ColumnType::Decimal))
+                throw Error{token.begin, say<MessageCode::decimalComma>()};
         }
-        throw errorAt(token.begin, refusalOf(mSubjectColumn.type));
+        throw Error{token.begin, refusalOf(mSubjectColumn.type)};
     }
     /// Whether digits stand on both sides of a comma that no list has, as in 1,5.
     bool atDecimalComma() const {
@@ -127,7 +126,7 @@ private:
             const Nesting nesting(*this);
             take();
             Node inner = disjunction();
-            if (!takeKind(TokenKind::close)) fail(u"a closing ) is missing");
+            if (!takeKind(TokenKind::close)) fail<MessageCode::closingMissing>(u")");
             return inner;
         }
         if (at(u"Like")) return like(negated);
@@ -135,7 +134,7 @@ private:
         if (at(u"In") && peek(1).kind == TokenKind::open) return in(negated);
         if (negated) {
             take();
-            fail(u"after In comes a list in parentheses, as in In (1, 2)");
+            fail<MessageCode::listMissing>();
         }
         if (at(u"Is")) return isNull();
         auto comparison = sql::Comparison::equal;
@@ -156,15 +155,14 @@ private:
         take();
         const bool negated = takeKeyword(u"Not");
         if (!takeKeyword(u"Null"))
-            fail(u"after Is comes Null or Not Null, and a text that begins so needs quotes");
+            fail<MessageCode::nullMissing>();
         return sql::make(sql::IsNull{negated, mSubject});
     }
 
     Node like(bool negated) {
         const Token word = take();
         if (!takesAnyText())
-            throw errorAt(word.begin,
-                          u"Like works only on columns that hold text, use =, < or > here");
+            throw Error{word.begin, say<MessageCode::likeOnNoText>()};
         const Token first = peek();
         const bool qualified = first.kind == TokenKind::bracketed && peek(1).kind == TokenKind::dot;
         Node asked;
@@ -172,8 +170,7 @@ private:
             asked = first.kind == TokenKind::bracketed ? bracketedName() : takeParameter();
         const auto* parameter = asked ? std::get_if<sql::Parameter>(&asked->node) : nullptr;
         if (qualified || (asked && !parameter))
-            throw errorAt(first.begin,
-                          u"after Like comes a pattern, as in Like 'A*', not a column");
+            throw Error{first.begin, say<MessageCode::columnForPattern>()};
         if (parameter) {
             sql::Parameter pattern = *parameter;
             pattern.pattern = true;
@@ -181,7 +178,7 @@ private:
         }
         const String typed = first.kind == TokenKind::quoted ? take().text : barePattern();
         if (first.kind != TokenKind::quoted && typed.empty())
-            fail(u"after Like comes a pattern, as in Like 'A*'");
+            fail<MessageCode::patternMissing>();
         return sql::make(sql::Like{negated, mSubject,
                                    sql::make(sql::Value{ColumnType::Text, likePattern(typed)})});
     }
@@ -189,7 +186,7 @@ private:
     Node between(bool negated) {
         Node low = operand();
         if (!takeKeyword(u"And"))
-            fail(u"Between needs And and a second value, as in Between 1 And 5");
+            fail<MessageCode::secondValueMissing>();
         Node high = operand();
         return sql::make(sql::Between{negated, mSubject, std::move(low), std::move(high)});
     }
@@ -199,7 +196,7 @@ private:
         take();
         std::vector<Node> list{operand()};
         while (takeKind(TokenKind::comma)) list.push_back(operand());
-        if (!takeKind(TokenKind::close)) fail(u"a comma or a closing ) is missing");
+        if (!takeKind(TokenKind::close)) fail<MessageCode::listNotClosed>();
         return sql::make(sql::In{negated, mSubject, std::move(list)});
     }
 
@@ -234,8 +231,7 @@ private:
     Node bareValue() {
         const Token first = peek();
         if (at(u"Null"))
-            fail(u"nothing is equal to Null, write Is Null for a missing value or 'Null' for the "
-                 u"word");
+            fail<MessageCode::equalToNull>();
         const String typed = bareText();
         if (typed.empty()) failMissing(first);
         const auto value = literal(typed, mSubjectColumn.type);
@@ -276,7 +272,7 @@ private:
         if (!isBareName(name)) {
             // A text may begin with a colon; other values cannot.
             if (takesAnyText()) return {};
-            throw errorAt(token.begin + 1, u"a parameter needs a name, as in :year");
+            throw Error{token.begin + 1, say<MessageCode::parameterNameMissing>()};
         }
         take();
         return sql::make(sql::Parameter{std::move(name), mSubjectColumn.type});
@@ -292,13 +288,11 @@ private:
             take();
             const Token second = take();
             if (second.kind != TokenKind::bracketed && second.kind != TokenKind::word)
-                throw errorAt(second.begin, u"the name of a column is missing behind the point");
+                throw Error{second.begin, say<MessageCode::columnNameMissing>()};
             const auto found = lookUp({first.begin, first.end}, first.text, second.text);
-            if (!found) {
-                String what = u"the query has no column ";
-                what += first.text + u"." + second.text;
-                throw errorAt(first.begin, what);
-            }
+            if (!found)
+                throw Error{first.begin,
+                            say<MessageCode::noSuchColumn>(first.text + u"." + second.text)};
             return columnNode(first, *found);
         }
         if (first.kind != TokenKind::word) return {};
@@ -327,11 +321,10 @@ private:
             return sql::make(sql::Parameter{token.text, mSubjectColumn.type});
         }
         const auto found = mResolver.columnsNamed(token.text);
-        if (found.size() > 1) {
-            String what = u"several tables have this column, write the table too, as in [" +
-                          found.front().column.table + u"].[" + token.text + u"]";
-            throw errorAt(token.begin, what);
-        }
+        if (found.size() > 1)
+            throw Error{token.begin,
+                        say<MessageCode::ambiguousColumn>(u"[" + found.front().column.table +
+                                                          u"].[" + token.text + u"]")};
         Reference reference{token.begin, token.begin};
         if (found.size() == 1) reference.column = found.front().place;
         mReading.references.push_back(std::move(reference));
@@ -364,7 +357,7 @@ private:
         if (known.column.empty()) return {};
         const auto column = known.column.column();
         if (!column)
-            throw errorAt(known.begin, u"the table of this column was deleted from the query");
+            throw Error{known.begin, say<MessageCode::tableOfColumnGone>()};
         return columnRef(*column, *known.column.table().table());
     }
 
@@ -377,11 +370,9 @@ private:
     }
 
     Node columnNode(const Token& token, const sql::ColumnRef& column) {
-        if (!comparable(column.type, mSubjectColumn.type)) {
-            String what = u"compare it with a column that holds ";
-            what += nameOf(mSubjectColumn.type);
-            throw errorAt(token.begin, what);
-        }
+        if (!comparable(column.type, mSubjectColumn.type))
+            throw Error{token.begin,
+                        say<MessageCode::incomparableColumn>(nameOf(mSubjectColumn.type))};
         return sql::make(column);
     }
 

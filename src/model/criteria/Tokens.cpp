@@ -20,14 +20,14 @@ bool isSpecial(char16_t c) { return StringView(u"'\"()[],=<>!").find(c) != Strin
 /// A character that text cannot carry to any engine.
 std::optional<Error> unusable(StringView text) {
     if (text.size() > longestText)
-        return errorAt(longestText, u"a criterion has at most 10000 characters");
+        return Error{longestText, say<MessageCode::criterionTooLong>()};
     for (std::size_t i = 0; i < text.size(); ++i) {
         const char16_t c = text[i];
-        if (c == 0) return errorAt(i, u"the character zero cannot stand in a criterion");
+        if (c == 0) return Error{i, say<MessageCode::zeroInCriterion>()};
         if (c < 0xD800 || c > 0xDFFF) continue;
         const bool paired =
             c < 0xDC00 && i + 1 < text.size() && text[i + 1] >= 0xDC00 && text[i + 1] <= 0xDFFF;
-        if (!paired) return errorAt(i, u"half a character stands here, type it afresh");
+        if (!paired) return Error{i, say<MessageCode::halfCharacterInCriterion>()};
         ++i;
     }
     return {};
@@ -52,15 +52,15 @@ private:
 
     std::optional<Error> next() {
         switch (mText[mAt]) {
-        case u'\'': return delimited(TokenKind::quoted, u'\'', u"a closing ' is missing");
-        case u'"': return delimited(TokenKind::quoted, u'"', u"a closing \" is missing");
+        case u'\'': return delimited(TokenKind::quoted, u'\'');
+        case u'"': return delimited(TokenKind::quoted, u'"');
         case u'[': return bracketed();
-        case u'#': return delimited(TokenKind::dated, u'#', u"a closing # is missing");
+        case u'#': return delimited(TokenKind::dated, u'#');
         case u'(': return single(TokenKind::open);
         case u')': return single(TokenKind::close);
         case u',': return single(TokenKind::comma);
-        case u']': return errorAt(mAt, u"a [ before this ] is missing");
-        case u'!': return errorAt(mAt, u"write <> for unequal");
+        case u']': return Error{mAt, say<MessageCode::openingMissing>()};
+        case u'!': return Error{mAt, say<MessageCode::foreignUnequal>()};
         case u'=':
         case u'<':
         case u'>': return comparison();
@@ -84,7 +84,7 @@ private:
     }
 
     /// A text between two of the same character; two of them inside stand for one.
-    std::optional<Error> delimited(TokenKind kind, char16_t close, StringView missing) {
+    std::optional<Error> delimited(TokenKind kind, char16_t close) {
         const std::size_t begin = mAt++;
         String text;
         for (; mAt < mText.size(); ++mAt) {
@@ -97,14 +97,13 @@ private:
             }
             text.push_back(mText[mAt]);
         }
-        return errorAt(mText.size(), missing);
+        return Error{mText.size(), say<MessageCode::closingMissing>(StringView(&close, 1))};
     }
 
     std::optional<Error> bracketed() {
-        if (auto error = delimited(TokenKind::bracketed, u']', u"a closing ] is missing"))
-            return error;
+        if (auto error = delimited(TokenKind::bracketed, u']')) return error;
         if (mTokens.back().text.empty())
-            return errorAt(mTokens.back().begin + 1, u"a name is missing between the brackets");
+            return Error{mTokens.back().begin + 1, say<MessageCode::nameMissing>()};
         return {};
     }
 
@@ -137,14 +136,6 @@ private:
 };
 
 } // namespace
-
-Error errorAt(std::size_t position, StringView what) {
-    String message = u"At character " + platform::decimal(static_cast<std::int64_t>(position) + 1);
-    message += u": ";
-    message += what;
-    message += u'.';
-    return {position, oneLine(std::move(message))};
-}
 
 std::variant<std::vector<Token>, Error> tokens(StringView text) {
     if (auto error = unusable(text)) return *error;

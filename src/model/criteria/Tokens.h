@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Description.h>
+#include <Zandor/model/Messages.h>
 
 #include <variant>
 #include <vector>
@@ -10,11 +11,8 @@ namespace zandor::model::criteria {
 /// Why a criterion is no criterion. Positions count UTF-16 code units from 0.
 struct Error {
     std::size_t position = 0;
-    String message; ///< one line: where, and what was expected
+    Message message; ///< what was expected, as part of a sentence
 };
-
-/// The error at a position, worded with the position as people count, from 1.
-Error errorAt(std::size_t position, StringView what);
 
 enum class TokenKind {
     word,      ///< bare characters: a keyword, a number, a date, part of a text, table.column

@@ -5,35 +5,40 @@
 
 namespace zandor::files {
 
+using model::Message;
+using model::say;
+
 namespace {
 
-std::string advice(int number) {
+Message advice(int number) {
     switch (number) {
     case ENOENT:
-    case ENOTDIR: return "check the path";
-    case ENAMETOOLONG: return "choose a shorter name";
+    case ENOTDIR: return say<MessageCode::checkPath>();
+    case ENAMETOOLONG: return say<MessageCode::shorterName>();
     case EACCES:
-    case EPERM: return "ask the owner for permission, or choose another folder";
+    case EPERM: return say<MessageCode::askOwnerOfFolder>();
     case ENOSPC:
-    case EDQUOT: return "make room on the disk, or choose another one";
-    case EFBIG: return "choose another disk";
-    case EROFS: return "choose a folder on another disk";
-    default: return "try again, or choose another folder";
+    case EDQUOT: return say<MessageCode::makeRoom>();
+    case EFBIG: return say<MessageCode::anotherDisk>();
+    case EROFS: return say<MessageCode::folderOnAnotherDisk>();
+    default: return say<MessageCode::tryAgain>();
     }
 }
 
 } // namespace
 
-Error systemError(const std::string& failed, int number) {
-    const std::string reason = std::strerror(number);
-    return {failed + " (" + reason + "); " + advice(number) + '.', reason};
+Error::Error(std::string_view words) : message(say<model::MessageCode::asItStands>(words)) {}
+
+std::string Error::text() const { return platform::toUtf8(message.text()); }
+
+std::string Error::reason() const {
+    if (!message.is(MessageCode::refusedBySystem)) return {};
+    return platform::toUtf8(std::get<platform::String>(message.arguments()[1].content));
 }
 
-std::string quoted(const Path& path) {
-    std::string name = path.string();
-    for (char& c : name)
-        if (static_cast<unsigned char>(c) < 0x20 || c == 0x7f) c = '?';
-    return '"' + name + '"';
+Error systemError(Message failed, int number) {
+    return say<MessageCode::refusedBySystem>(std::move(failed), std::strerror(number),
+                                             advice(number));
 }
 
 } // namespace zandor::files

@@ -12,15 +12,16 @@ namespace zandor::files::json {
 
 namespace {
 
-/// "line 3, column 8" of the byte at an offset. Columns count characters from 1.
-std::string placeOf(std::string_view text, std::size_t offset) {
+/// What is wrong at the byte at an offset. Columns count characters from 1.
+model::Message brokenAt(std::string_view text, std::size_t offset,
+                        const model::MessageArgument& reason) {
     const std::string_view before = text.substr(0, std::min(offset, text.size()));
     const auto line = std::count(before.begin(), before.end(), '\n') + 1;
     const std::string_view start = before.substr(before.rfind('\n') + 1);
     const auto column = std::count_if(start.begin(), start.end(), [](char c) {
         return (static_cast<unsigned char>(c) & 0xC0) != 0x80; // no byte within a character
     });
-    return "Line " + std::to_string(line) + ", column " + std::to_string(column + 1);
+    return model::say<MessageCode::brokenGrammar>(line, column + 1, reason);
 }
 
 /// The parser's words about what is wrong, without its prefix and without the text it read, which
@@ -75,16 +76,18 @@ public:
         Frame& frame = mOpen.back();
         frame.name = name;
         check(name);
-        if (!frame.names.insert(name).second) refuse(place(), "stands there twice");
+        if (!frame.names.insert(name).second) refuse<MessageCode::standsTwice>(place());
         return true;
     }
 
     bool parse_error(std::size_t position, const std::string&,
                      const nlohmann::detail::exception& error) override {
         constexpr int numberTooLarge = 406;
-        const std::string reason =
-            error.id == numberTooLarge ? "a number is too large" : complaint(error.what());
-        throw Refusal{placeOf(mText, position == 0 ? 0 : position - 1) + ": " + reason, mendIt};
+        const model::MessageArgument reason =
+            error.id == numberTooLarge
+                ? model::MessageArgument(model::say<MessageCode::numberTooLarge>())
+                : model::MessageArgument(complaint(error.what()));
+        throw Refusal{brokenAt(mText, position == 0 ? 0 : position - 1, reason)};
     }
 
 private:
@@ -106,14 +109,13 @@ private:
 
     void check(const std::string& text) const {
         if (text.size() > limits::textLength && utf16Length(text) > limits::textLength)
-            refuse(place(), "is longer than " + std::to_string(limits::textLength) + " characters");
-        if (text.find('\0') != std::string::npos) refuse(place(), "has a NUL character in it");
+            refuse<MessageCode::textTooLong>(place(), limits::textLength);
+        if (text.find('\0') != std::string::npos) refuse<MessageCode::zeroInText>(place());
     }
 
     bool open(Value value) {
         if (mOpen.size() == limits::depth)
-            refuse(place(),
-                   "is nested more than " + std::to_string(limits::depth) + " levels deep");
+            refuse<MessageCode::levelsTooDeep>(place(), limits::depth);
         mOpen.push_back({std::move(value), {}, {}});
         return true;
     }
@@ -126,8 +128,7 @@ private:
 
     bool add(Value value) {
         if (++mCount > limits::values)
-            refuse(place(),
-                   "is one value too many: a file may have " + std::to_string(limits::values));
+            refuse<MessageCode::tooManyValues>(place(), limits::values);
         if (mOpen.empty()) {
             mRoot = std::move(value);
             return true;
@@ -151,8 +152,9 @@ private:
 
 Value read(std::string_view text) {
     if (text.size() > limits::fileSize)
-        refuse({}, "is larger than " + std::to_string(limits::fileSize / 1024 / 1024) + " MiB",
-               "Choose a query file");
+        throw Refusal{model::say<MessageCode::fileTooLarge>(Pointer().shown(),
+                                                            limits::fileSize / 1024 / 1024),
+                      model::say<MessageCode::chooseQueryFile>()};
     Builder builder(text);
     nlohmann::json::sax_parse(text.begin(), text.end(), &builder);
     return builder.result();

@@ -7,43 +7,44 @@ namespace zandor::files {
 
 namespace {
 
-template <class Content>
-Content as(json::Value value, const Pointer& place, const char* reason) {
+/// Refuses with the message of the code what is something else.
+template <class Content, MessageCode code>
+Content as(json::Value value, const Pointer& place) {
     Content* content = std::get_if<Content>(&value.content);
-    if (!content) refuse(place, reason);
+    if (!content) refuse<code>(place);
     return std::move(*content);
 }
 
 } // namespace
 
 Object::Object(json::Value value, Pointer place)
-    : mMembers(as<json::Members>(std::move(value), place, "is not an object")),
+    : mMembers(as<json::Members, MessageCode::notAnObject>(std::move(value), place)),
       mPlace(std::move(place)) {}
 
 platform::String Object::text(std::string_view name, std::optional<platform::String> missing) {
     auto value = take(name);
     if (!value && missing) return *missing;
-    if (!value) refuse(mPlace / name, "is missing");
-    return platform::fromUtf8(as<std::string>(std::move(*value), mPlace / name, "is not a text"));
+    if (!value) refuse<MessageCode::isMissing>(mPlace / name);
+    return platform::fromUtf8(as<std::string, MessageCode::notAText>(std::move(*value), mPlace / name));
 }
 
 platform::String Object::textOrNull(std::string_view name) {
     auto value = take(name);
     if (!value || std::holds_alternative<json::Null>(value->content)) return {};
     return platform::fromUtf8(
-        as<std::string>(std::move(*value), mPlace / name, "is neither a text nor null"));
+        as<std::string, MessageCode::notATextOrNull>(std::move(*value), mPlace / name));
 }
 
 bool Object::flag(std::string_view name, bool missing) {
     auto value = take(name);
-    return value ? as<bool>(std::move(*value), mPlace / name, "is not true or false") : missing;
+    return value ? as<bool, MessageCode::notTrueOrFalse>(std::move(*value), mPlace / name) : missing;
 }
 
 std::int16_t Object::word(std::string_view name, Words words, std::int16_t missing) {
     auto value = take(name);
     if (!value) return missing;
     const Pointer place = mPlace / name;
-    return codeOf(as<std::string>(std::move(*value), place, "is not a text"), words, place);
+    return codeOf(as<std::string, MessageCode::notAText>(std::move(*value), place), words, place);
 }
 
 Object Object::object(std::string_view name) { return {required(name), mPlace / name}; }
@@ -54,9 +55,9 @@ Object Object::objectOrNone(std::string_view name) {
 }
 
 json::Items Object::list(std::string_view name, std::size_t most) {
-    auto items = as<json::Items>(required(name), mPlace / name, "is not a list");
+    auto items = as<json::Items, MessageCode::notAList>(required(name), mPlace / name);
     if (items.size() > most)
-        refuse(mPlace / name, "has more than " + std::to_string(most) + " entries");
+        refuse<MessageCode::tooManyEntries>(mPlace / name, most);
     return items;
 }
 
@@ -77,7 +78,7 @@ std::optional<json::Value> Object::take(std::string_view name) {
 
 json::Value Object::required(std::string_view name) {
     auto value = take(name);
-    if (!value) refuse(mPlace / name, "is missing");
+    if (!value) refuse<MessageCode::isMissing>(mPlace / name);
     return std::move(*value);
 }
 
@@ -85,11 +86,9 @@ std::int64_t Object::whole(std::string_view name, std::optional<std::int64_t> mi
                            std::int64_t least, std::int64_t greatest) {
     const auto value = take(name);
     if (!value && missing) return *missing;
-    if (!value) refuse(mPlace / name, "is missing");
+    if (!value) refuse<MessageCode::isMissing>(mPlace / name);
     const auto number = wholeNumber(*value, least, greatest);
-    if (!number)
-        refuse(mPlace / name, "is not a whole number from " + std::to_string(least) + " to " +
-                                  std::to_string(greatest));
+    if (!number) refuse<MessageCode::notAWholeNumber>(mPlace / name, least, greatest);
     return *number;
 }
 
@@ -99,7 +98,7 @@ std::int16_t codeOf(const std::string& word, Words words, const Pointer& place) 
     std::string known;
     for (const std::string_view each : words)
         known += (known.empty() ? "\"" : ", \"") + std::string(each) + '"';
-    refuse(place, "is \"" + shown(word) + "\" and none of " + known);
+    refuse<MessageCode::unknownWord>(place, shown(word), known);
 }
 
 std::optional<std::int64_t> wholeNumber(const json::Value& value, std::int64_t least,

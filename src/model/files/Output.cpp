@@ -13,7 +13,7 @@ std::optional<Error> Stream::write(std::string_view bytes) {
 }
 
 std::optional<Error> Stream::flush() {
-    if (!mFailure && !writeAll(mFile, mWaiting)) mFailure = systemError(mRefusal, errno);
+    if (!mFailure && !writeAll(mFile, mWaiting)) mFailure = systemError(mFailed, errno);
     mWaiting.clear();
     return mFailure;
 }

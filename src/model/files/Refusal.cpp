@@ -5,7 +5,7 @@ namespace zandor::files {
 Pointer Pointer::operator/(std::string_view name) const {
     Pointer result;
     result.mText = mText + '/';
-    for (const char c : shown(name)) {
+    for (const char c : files::shown(name)) {
         if (c == '~')
             result.mText += "~0";
         else if (c == '/')
@@ -16,12 +16,12 @@ Pointer Pointer::operator/(std::string_view name) const {
     return result;
 }
 
-std::string Pointer::text() const {
+model::MessageArgument Pointer::shown() const {
     constexpr std::size_t most = 150;
     constexpr std::size_t end = 50;
-    if (mText.empty()) return "The file";
-    if (mText.size() <= most) return mText;
-    return mText.substr(0, most - end) + "..." + mText.substr(mText.size() - end);
+    if (mText.empty()) return model::say<MessageCode::theFile>();
+    if (mText.size() <= most) return {mText};
+    return {mText.substr(0, most - end) + "..." + mText.substr(mText.size() - end)};
 }
 
 std::string shown(std::string_view text) {
@@ -34,8 +34,11 @@ std::string shown(std::string_view text) {
     return result;
 }
 
-void refuse(const Pointer& place, const std::string& reason, const std::string& advice) {
-    throw Refusal{place.text() + ' ' + reason, advice};
+std::string nameOf(const Path& path) {
+    std::string name = path.string();
+    for (char& c : name)
+        if (static_cast<unsigned char>(c) < 0x20 || c == 0x7f) c = '?';
+    return name;
 }
 
 } // namespace zandor::files

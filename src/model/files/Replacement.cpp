@@ -1,5 +1,7 @@
 #include <Zandor/files/Replacement.h>
 
+#include "model/files/Refusal.h"
+
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -35,7 +37,9 @@ Path resolved(const Path& path) {
     return end;
 }
 
-std::string refusal(const Path& path) { return "The file " + quoted(path) + " cannot be saved"; }
+model::Message notSaved(const Path& path) {
+    return model::say<MessageCode::fileNotSaved>(nameOf(path));
+}
 
 /// Some file systems have no such thing as waiting for the disk.
 bool isOnDisk(int file) { return ::fsync(file) == 0 || errno == EINVAL; }
@@ -53,16 +57,16 @@ std::optional<Error> Replacement::open() {
     const bool replaces = ::stat(mTarget.c_str(), &old) == 0;
     if (!replaces && errno != ENOENT) return refused(errno);
     if (replaces && !S_ISREG(old.st_mode))
-        return Error{quoted(mPath) + " is not a file; choose another name."};
+        return Error{model::say<MessageCode::noFileToSave>(nameOf(mPath))};
     if (replaces && ::access(mTarget.c_str(), W_OK) != 0)
-        return Error{"The file " + quoted(mPath) + " is write-protected; save under another name."};
+        return Error{model::say<MessageCode::writeProtected>(nameOf(mPath))};
 
     const Path beside = nameBeside(mTarget);
     constexpr mode_t everybody = 0666; // less what the user's mask forbids
     mFile = Descriptor(::open(beside.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, everybody));
     if (!mFile.isOpen()) return refused(errno);
     mBeside = beside;
-    mStream.emplace(mFile.number(), refusal(mPath));
+    mStream.emplace(mFile.number(), notSaved(mPath));
     // Without the permissions of the old file the new one is not its like; without its owner it is.
     if (replaces && ::fchmod(mFile.number(), old.st_mode & 07777) != 0) return refused(errno);
     return {};
@@ -82,7 +86,7 @@ std::optional<Error> Replacement::commit() {
     return {};
 }
 
-Error Replacement::refused(int number) const { return systemError(refusal(mPath), number); }
+Error Replacement::refused(int number) const { return systemError(notSaved(mPath), number); }
 
 std::optional<Error> replaceFile(const Path& path, std::string_view content) {
     Replacement file(path);

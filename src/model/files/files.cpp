@@ -1,3 +1,4 @@
+#include "model/files/Refusal.h"
 #include "model/files/limits.h"
 
 #include <Zandor/files/Descriptor.h>
@@ -16,14 +17,14 @@ namespace zandor::files {
 namespace {
 
 Error unread(const Path& path, int number) {
-    return systemError("The file " + quoted(path) + " cannot be read", number);
+    return systemError(model::say<MessageCode::fileNotRead>(nameOf(path)), number);
 }
 
 } // namespace
 
 std::optional<Error> saveQuery(const Path& path, const QueryDocument& document) {
     const auto text = toJson(document);
-    if (!text) return Error{text.error()};
+    if (!text) return text.failure();
     return replaceFile(path, *text);
 }
 
@@ -34,7 +35,7 @@ Result<QueryDocument> loadQuery(const Path& path) {
     struct stat state = {};
     if (::fstat(file.number(), &state) != 0) return unread(path, errno);
     if (!S_ISREG(state.st_mode))
-        return Error{quoted(path) + " is not a file; choose a query file."};
+        return Error{model::say<MessageCode::noFileToRead>(nameOf(path))};
 
     std::string text;
     // One byte more than a file may have, by which the reader sees that it has too many.
@@ -50,7 +51,8 @@ Result<QueryDocument> loadQuery(const Path& path) {
     }
     auto document = fromJson(text);
     if (!document)
-        return Error{"The file " + quoted(path) + " cannot be used: " + document.error()};
+        return Error{
+            model::say<MessageCode::fileNotUsed>(nameOf(path), document.failure().message)};
     return document;
 }
 

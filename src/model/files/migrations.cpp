@@ -28,7 +28,7 @@ void numberToWord(json::Members& join, std::string_view name, Words words, const
     if (!value) return;
     const auto greatest = static_cast<std::int64_t>(words.size()) - 1;
     const auto code = wholeNumber(*value, 0, greatest);
-    if (!code) refuse(place / name, "is not a whole number from 0 to " + std::to_string(greatest));
+    if (!code) refuse<MessageCode::notAWholeNumber>(place / name, 0, greatest);
     value->content = std::string(words[static_cast<std::size_t>(*code)]);
 }
 

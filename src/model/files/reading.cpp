@@ -80,8 +80,7 @@ void Reader::table(Object object) {
     auto columns = object.list("columns", limits::columnsOfTable);
     mColumns += columns.size();
     if (mColumns > limits::columns)
-        refuse(object.place() / "columns",
-               "makes the columns of all tables more than " + std::to_string(limits::columns));
+        refuse<MessageCode::tooManyColumns>(object.place() / "columns", limits::columns);
     each(std::move(columns), object.place() / "columns",
          [&](Object each) { table.columns.push_back(column(std::move(each))); });
 
@@ -132,7 +131,7 @@ std::vector<model::NameRecord> Reader::names(Object& criterion) {
              name.begin = each.integer<std::int32_t>("at");
              const auto length = each.integer<std::int32_t>("tableLength", 0);
              if (length < 0 || length > longest)
-                 refuse(each.place() / "tableLength", "is no length of a name in the text");
+                 refuse<MessageCode::notALength>(each.place() / "tableLength");
              name.tableEnd = std::min<std::int64_t>(name.begin, longest) + length;
              name.table = each.textOrNull("table");
              name.column = each.textOrNull("column");
@@ -162,23 +161,26 @@ void Reader::definition(Object object) {
 /// Takes the members that say what the file is; refuses what is no query of a version that is
 /// known.
 json::Value current(json::Value file) {
-    constexpr const char* choose = "Choose a query file";
+    const auto choose = model::say<MessageCode::chooseQueryFile>();
     auto* members = std::get_if<json::Members>(&file.content);
-    if (!members) refuse({}, "is not an object", choose);
+    if (!members)
+        throw Refusal{model::say<MessageCode::notAnObject>(Pointer().shown()), choose};
     const json::Value* format = json::find(*members, "format");
     const auto* name = format ? std::get_if<std::string>(&format->content) : nullptr;
     if (!name || *name != words::format)
-        refuse(Pointer() / "format", "is not \"" + std::string(words::format) + '"', choose);
+        throw Refusal{model::say<MessageCode::notTheFormat>((Pointer() / "format").shown(),
+                                                            words::format),
+                      choose};
 
     Object object(std::move(file), {});
     object.text("format");
     const auto version = object.integer<std::int32_t>("version");
-    if (version < 1) refuse(Pointer() / "version", "is less than 1");
+    const Pointer place = Pointer() / "version";
+    if (version < 1) refuse<MessageCode::versionTooSmall>(place);
     if (version > currentVersion)
-        refuse(Pointer() / "version",
-               "is " + std::to_string(version) + " and newer than " +
-                   std::to_string(currentVersion) + ", the newest that can be read here",
-               "Open the file with a newer version of this program");
+        throw Refusal{
+            model::say<MessageCode::versionTooNew>(place.shown(), version, currentVersion),
+            model::say<MessageCode::newerProgram>()};
     json::Members rest = std::move(object).unknown();
     migrate(rest, version);
     return {std::move(rest)};
@@ -191,14 +193,14 @@ Result<QueryDocument> fromJson(std::string_view text) {
         Reader reader;
         reader.read(current(json::read(text)));
         if (const auto fault = model::faultOf(reader.record))
-            throw Refusal{'/' + fault->path + ' ' + fault->reason, mendIt};
+            throw Refusal{fault->message};
         QueryDocument document(model::Query::restored(reader.record));
         document.database = std::move(reader.database);
         if (!reader.unknown.membersOf.empty())
             document.unknown = std::make_shared<const Unknown>(std::move(reader.unknown));
         return document;
     } catch (const Refusal& refusal) {
-        return Error{refusal.fault + ". " + refusal.advice + '.'};
+        return refusal.error();
     }
 }
 

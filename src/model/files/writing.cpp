@@ -14,8 +14,8 @@ using platform::String;
 json::Value textOf(const String& text, const Pointer& place) {
     std::string utf8 = platform::toUtf8(text);
     if (platform::fromUtf8(utf8) != text)
-        refuse(place, "has half a character in it (an unpaired surrogate)",
-               "Type that text afresh and save again");
+        throw Refusal{model::say<MessageCode::halfCharacterInText>(place.shown()),
+                      model::say<MessageCode::typeAfresh>()};
     return {std::move(utf8)};
 }
 
@@ -173,13 +173,13 @@ Result<std::string> toJson(const QueryDocument& document) {
     try {
         text = json::print(Writer(document.unknown.get()).file(record, document.database));
     } catch (const Refusal& refusal) {
-        return Error{refusal.fault + ". " + refusal.advice + '.'};
+        return refusal.error();
     }
     // Better no file than one that cannot be read, whatever the reason.
     const auto again = fromJson(text);
-    if (!again) return Error{"The query could not be read again: " + again.error()};
+    if (!again) return Error{model::say<MessageCode::notReadAgain>(again.failure().message)};
     if (again->query->record() != record || again->database != document.database)
-        return Error{"The query would not be the same when read again. Report this, please."};
+        return Error{model::say<MessageCode::notTheSameAgain>()};
     return text;
 }
 

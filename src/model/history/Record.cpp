@@ -49,39 +49,39 @@ public:
     }
 
 private:
-    void fault(const std::string& path, std::string reason) {
-        if (!mFault) mFault = RecordFault{path, std::move(reason)};
+    template <MessageCode code, class... Arguments>
+    void fault(const std::string& path, const Arguments&... arguments) {
+        if (!mFault) mFault = RecordFault{path, say<code>('/' + path, arguments...)};
     }
 
     void lastKey(const char* kind, std::int32_t last) {
         if (last < 0 || last > greatestKeyNumber)
-            fault(std::string("lastKeys/") + kind,
-                  "is not from 0 to " + std::to_string(greatestKeyNumber));
+            fault<MessageCode::notInRange>(std::string("lastKeys/") + kind, 0,
+                                              greatestKeyNumber);
     }
 
     /// One that was given, whether its object is still there or not.
     void given(const String& key, char16_t letter, std::int32_t last, const std::string& path) {
         const auto number = keyNumber(key, letter);
         if (!number)
-            fault(path, std::string("is not the letter ") + static_cast<char>(letter) +
-                            " and a number from 1 to " + std::to_string(greatestKeyNumber));
+            fault<MessageCode::notAKey>(path, StringView(&letter, 1), greatestKeyNumber);
         else if (*number > last)
-            fault(path, "is beyond the last key " + std::to_string(last) + " of its kind");
+            fault<MessageCode::keyNeverGiven>(path, last);
     }
 
     void key(const String& key, char16_t letter, std::int32_t last, const std::string& path) {
         given(key, letter, last, path);
-        if (!mFault && !mKeys.insert(key).second) fault(path, "is used before already");
+        if (!mFault && !mKeys.insert(key).second) fault<MessageCode::keyUsedTwice>(path);
     }
 
     void table(const TableRecord& table, const std::string& path) {
         key(table.key, u't', mRecord.lastKeys.table, path + "key");
-        if (table.name.empty()) fault(path + "name", "is empty");
-        if (table.sourceName.empty()) fault(path + "source/name", "is empty");
+        if (table.name.empty()) fault<MessageCode::nameEmpty>(path + "name");
+        if (table.sourceName.empty()) fault<MessageCode::nameEmpty>(path + "source/name");
         if (!mNames.insert(foldedName(table.name)).second)
-            fault(path + "name", "is the name of another table too");
+            fault<MessageCode::nameOfTwoTables>(path + "name");
         if (table.columns.empty() || table.columns.front().description.name != Column::allColumns)
-            fault(path + "columns", "does not begin with the entry \"*\"");
+            fault<MessageCode::allColumnsMissing>(path + "columns");
         for (std::size_t n = 0; n < table.columns.size() && !mFault; ++n) {
             const ColumnRecord& column = table.columns[n];
             key(column.key, u'c', mRecord.lastKeys.column, path + at("columns", n) + "key");
@@ -91,38 +91,39 @@ private:
 
     void end(const EndRecord& end, const std::string& path) {
         if (!end.table.empty() && !(end.table.front() == u't' && mKeys.contains(end.table)))
-            fault(path + "/table", "is the key of no table");
+            fault<MessageCode::keyOfNoTable>(path + "/table");
         if (end.column.empty()) return;
         const auto column = mTableOf.find(end.column);
         if (column == mTableOf.end() || column->second != end.table)
-            fault(path + "/column", "is the key of no column of that table");
+            fault<MessageCode::keyOfNoColumnThere>(path + "/column");
     }
 
     void join(const JoinRecord& join, const std::string& path) {
         key(join.key, u'j', mRecord.lastKeys.join, path + "key");
         end(join.left, path + "left");
         end(join.right, path + "right");
-        if (join.type < 0 || join.type > 3) fault(path + "type", "is no type of join");
+        if (join.type < 0 || join.type > 3) fault<MessageCode::noJoinType>(path + "type");
         if (join.comparison < 0 || join.comparison > 5)
-            fault(path + "operator", "is no comparison");
+            fault<MessageCode::noComparison>(path + "operator");
     }
 
     void definition(const DefinitionRecord& definition, const std::string& path) {
         key(definition.key, u'x', mRecord.lastKeys.definition, path + "key");
         if (!definition.column.empty() && !mTableOf.contains(definition.column))
-            fault(path + "column", "is the key of no column");
+            fault<MessageCode::keyOfNoColumn>(path + "column");
         if (definition.sortOrder < 0 || definition.sortOrder > 2)
-            fault(path + "sort", "is no sort order");
+            fault<MessageCode::noSortOrder>(path + "sort");
         if (definition.width < 0 || definition.width > ColumnDefinition::greatestWidth)
-            fault(path + "width",
-                  "is not from 0 to " + std::to_string(ColumnDefinition::greatestWidth));
+            fault<MessageCode::notInRange>(path + "width", 0,
+                                              ColumnDefinition::greatestWidth);
         std::int32_t before = Criteria::firstRow - 1;
         for (std::size_t n = 0; n < definition.criteria.size() && !mFault; ++n) {
             const std::int16_t row = definition.criteria[n].row;
-            if (row <= before)
-                fault(path + at("criteria", n) + "row",
-                      n == 0 ? "is less than the first row, " + std::to_string(Criteria::firstRow)
-                             : "does not come behind the row before it");
+            if (row <= before && n == 0)
+                fault<MessageCode::rowTooSmall>(path + at("criteria", n) + "row",
+                                                Criteria::firstRow);
+            else if (row <= before)
+                fault<MessageCode::rowOutOfOrder>(path + at("criteria", n) + "row");
             before = row;
             names(definition.criteria[n], path + at("criteria", n));
         }
@@ -135,7 +136,7 @@ private:
             const std::string place = path + at("names", n);
             const bool inOrder = name.begin >= end && name.tableEnd >= name.begin;
             if (!inOrder || static_cast<std::size_t>(name.tableEnd) > criterion.text.size())
-                fault(place + "at", "is no place in the text behind the name before it");
+                fault<MessageCode::placeOutOfOrder>(place + "at");
             end = name.tableEnd;
             if (name.table.empty() && name.column.empty()) continue;
             given(name.table, u't', mRecord.lastKeys.table, place + "table");
@@ -143,7 +144,7 @@ private:
             const auto column = mTableOf.find(name.column);
             const bool gone = column == mTableOf.end() && !mKeys.contains(name.table);
             if (!gone && (column == mTableOf.end() || column->second != name.table))
-                fault(place + "column", "is the key of no column of that table");
+                fault<MessageCode::keyOfNoColumnThere>(place + "column");
         }
     }
 

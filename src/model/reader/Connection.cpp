@@ -8,34 +8,30 @@
 #include <QSqlQuery>
 #include <QUuid>
 
+#include <optional>
+
 namespace zandor::reader {
+
+using model::say;
 
 namespace {
 
 /// Nothing when the file may be one of SQLite, as far as its kind and its first bytes tell. The
 /// driver would open a file of any content and complain at the first query only.
-QString complaintAboutFile(const QString& path) {
-    const QString named = QStringLiteral("\"%1\"").arg(path);
+std::optional<Error> complaintAboutFile(const QString& path) {
+    const platform::String name = path.toStdU16String();
     const QFileInfo info(path);
-    if (!info.exists()) return QStringLiteral("There is no file %1; check the path.").arg(named);
-    if (info.isDir())
-        return QStringLiteral("%1 is a folder; choose a database file in it.").arg(named);
-    if (!info.isFile())
-        return QStringLiteral("%1 is a device, not a file; choose a database file.").arg(named);
+    if (!info.exists()) return say<MessageCode::noDatabaseFile>(name);
+    if (info.isDir()) return say<MessageCode::folderForDatabase>(name);
+    if (!info.isFile()) return say<MessageCode::deviceForDatabase>(name);
 
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly))
-        return QStringLiteral("The file %1 cannot be read (%2); ask its owner for permission.")
-            .arg(named, file.errorString());
+        return say<MessageCode::databaseFileNotRead>(name, file.errorString().toStdU16String());
     const QByteArray signature("SQLite format 3\0", 16);
     const QByteArray start = file.read(signature.size());
-    if (start.isEmpty())
-        return QStringLiteral("The file %1 is empty; choose a file that holds a database.")
-            .arg(named);
-    if (start != signature)
-        return QStringLiteral("The file %1 is not an SQLite database, or it is encrypted; choose "
-                              "another file.")
-            .arg(named);
+    if (start.isEmpty()) return say<MessageCode::databaseFileEmpty>(name);
+    if (start != signature) return say<MessageCode::notADatabaseFile>(name);
     return {};
 }
 
@@ -49,18 +45,17 @@ Connection::~Connection() {
 }
 
 Result<Connection> openSqlite(const QString& path) {
-    const QString complaint = complaintAboutFile(path);
-    if (!complaint.isEmpty()) return Error{complaint};
+    if (auto complaint = complaintAboutFile(path)) return std::move(*complaint);
     if (!QSqlDatabase::isDriverAvailable(QStringLiteral("QSQLITE")))
-        return Error{QStringLiteral("The Qt driver for SQLite is missing; install it (Debian: "
-                                    "apt install libqt6sql6-sqlite).")};
+        return Error{say<MessageCode::driverMissing>("SQLite", "libqt6sql6-sqlite")};
 
     Connection connection(QSqlDatabase::addDatabase(
         QStringLiteral("QSQLITE"), QUuid::createUuid().toString(QUuid::WithoutBraces)));
     QSqlDatabase database = connection.database();
     database.setDatabaseName(path);
     database.setConnectOptions(QStringLiteral("QSQLITE_OPEN_READONLY;QSQLITE_BUSY_TIMEOUT=500"));
-    const QString opening = QStringLiteral("The database \"%1\" cannot be opened").arg(path);
+    const auto opening =
+        say<MessageCode::databaseNotOpened>(QStringLiteral("\"%1\"").arg(path).toStdU16String());
     if (!database.open()) return sqliteError(opening, database.lastError());
 
     // Opening touches nothing; these read the first page and the schema.

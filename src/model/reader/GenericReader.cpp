@@ -63,8 +63,7 @@ private:
 Result<std::vector<TableEntry>> GenericReader::tables() {
     // A driver says of a failure here nothing but an empty list.
     if (!mDatabase.isOpen())
-        return Error{QStringLiteral("The list of tables cannot be read (the connection is "
-                                    "closed): open the database afresh.")};
+        return Error{model::say<MessageCode::connectionClosed>()};
     std::vector<TableEntry> entries;
     for (const QString& name : mDatabase.tables(QSql::Tables))
         entries.push_back({{{}, name.toStdU16String()}, false});
@@ -80,9 +79,7 @@ Result<std::vector<TableEntry>> GenericReader::tables() {
 Result<model::TableDescription> GenericReader::table(const TableId& id) {
     const QSqlRecord record = mDatabase.record(nameOf(id));
     if (record.isEmpty())
-        return Error{QStringLiteral("The table \"%1\" is not in the database; read the list of "
-                                    "tables afresh.")
-                         .arg(nameOf(id))};
+        return Error{model::say<MessageCode::noSuchTable>(nameOf(id).toStdU16String())};
     const QSqlIndex key = mDatabase.primaryIndex(nameOf(id));
     model::TableDescription description{id.schema, id.name, {}};
     for (int n = 0; n < record.count(); ++n) {

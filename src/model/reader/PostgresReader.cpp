@@ -61,7 +61,7 @@ model::ColumnType typeOf(const QString& base, const QString& category, bool buil
 Result<std::vector<TableEntry>> PostgresReader::tables() {
     std::vector<TableEntry> entries;
     const auto error = readRows(
-        mDatabase, QStringLiteral("The list of tables"),
+        mDatabase, model::say<MessageCode::tablesNotRead>(),
         QStringLiteral("SELECT %1, c.relname, c.relkind IN ('v', 'm') "
                        "FROM pg_catalog.pg_class c "
                        "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
@@ -79,9 +79,8 @@ Result<std::vector<TableEntry>> PostgresReader::tables() {
 Result<model::TableDescription> PostgresReader::table(const TableId& id) {
     model::TableDescription description{id.schema, id.name, {}};
     bool found = false;
-    const QString what = QStringLiteral("The table \"%1\"").arg(toQt(id.name));
     const auto error = readRows(
-        mDatabase, what,
+        mDatabase, model::say<MessageCode::tableNotRead>(id.name),
         // A table without columns is one row without a name.
         QStringLiteral(
             "SELECT a.attname, pg_catalog.format_type(a.atttypid, a.atttypmod), "
@@ -111,15 +110,14 @@ Result<model::TableDescription> PostgresReader::table(const TableId& id) {
         });
     if (error) return *error;
     if (!found)
-        return Error{
-            QStringLiteral("%1 is not in the database; read the list of tables afresh.").arg(what)};
+        return Error{model::say<MessageCode::noSuchTable>(id.name)};
     return description;
 }
 
 Result<std::vector<ForeignKey>> PostgresReader::foreignKeys(const TableId& child) {
     std::vector<ForeignKey> keys;
     const auto error = readRows(
-        mDatabase, QStringLiteral("The foreign keys of \"%1\"").arg(toQt(child.name)),
+        mDatabase, model::say<MessageCode::foreignKeysNotRead>(child.name),
         // A key to a partitioned table stands there once more for every partition: those are left
         // out. One that a partition has from its parent is its own.
         QStringLiteral("SELECT pair.position, %2, p.relname, ca.attname, pa.attname "

@@ -28,7 +28,7 @@ private:
 };
 
 Result<std::vector<TableEntry>> SqliteReader::tables() {
-    const QString what = QStringLiteral("The list of tables");
+    const auto failed = model::say<MessageCode::tablesNotRead>();
     const QString order = QStringLiteral(" AND name NOT LIKE 'sqlite\\_%' ESCAPE '\\' "
                                          "ORDER BY name COLLATE NOCASE, name");
     std::vector<TableEntry> entries;
@@ -37,7 +37,7 @@ Result<std::vector<TableEntry>> SqliteReader::tables() {
         entries.push_back({{{}, textAt(row, 0)}, row.value(1).toBool()});
     };
     // Neither a view nor a virtual table has a page of its own.
-    auto error = readRows(mDatabase, what,
+    auto error = readRows(mDatabase, failed,
                           QStringLiteral("SELECT name, type = 'view', rootpage FROM sqlite_master "
                                          "WHERE type IN ('table', 'view')") +
                               order,
@@ -50,7 +50,7 @@ Result<std::vector<TableEntry>> SqliteReader::tables() {
         // of all tables for it.
         entries.clear();
         error =
-            readRows(mDatabase, what,
+            readRows(mDatabase, failed,
                      QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list WHERE "
                                     "schema = 'main' AND type IN ('table', 'view', 'virtual')") +
                          order,
@@ -63,9 +63,8 @@ Result<std::vector<TableEntry>> SqliteReader::tables() {
 Result<model::TableDescription> SqliteReader::table(const TableId& id) {
     model::TableDescription description{id.schema, id.name, {}};
     constexpr int hiddenInVirtualTable = 1; // generated columns, 2 and 3, are like any other
-    const QString named = QStringLiteral("The table \"%1\"").arg(toQt(id.name));
     const auto error =
-        readRows(mDatabase, named,
+        readRows(mDatabase, model::say<MessageCode::tableNotRead>(id.name),
                  QStringLiteral("SELECT name, type, pk, hidden FROM pragma_table_xinfo(?, ?)"),
                  {toQt(id.name), schemaOf(id)}, [&](const QSqlQuery& row) {
                      if (row.value(3).toInt() == hiddenInVirtualTable) return;
@@ -75,15 +74,14 @@ Result<model::TableDescription> SqliteReader::table(const TableId& id) {
                  });
     if (error) return *error;
     if (description.columns.empty())
-        return Error{QStringLiteral("%1 is not in the database; read the list of tables afresh.")
-                         .arg(named)};
+        return Error{model::say<MessageCode::noSuchTable>(id.name)};
     return description;
 }
 
 Result<std::vector<String>> SqliteReader::primaryKey(const TableId& id) const {
     std::vector<String> columns;
     const auto error = readRows(
-        mDatabase, QStringLiteral("The primary key of \"%1\"").arg(toQt(id.name)),
+        mDatabase, model::say<MessageCode::primaryKeyNotRead>(id.name),
         QStringLiteral("SELECT name FROM pragma_table_xinfo(?, ?) WHERE pk > 0 ORDER BY pk"),
         {toQt(id.name), schemaOf(id)},
         [&](const QSqlQuery& row) { columns.push_back(textAt(row, 0)); });
@@ -94,7 +92,7 @@ Result<std::vector<String>> SqliteReader::primaryKey(const TableId& id) const {
 Result<std::vector<ForeignKey>> SqliteReader::foreignKeys(const TableId& child) {
     std::vector<ForeignKey> keys;
     const auto error = readRows(
-        mDatabase, QStringLiteral("The foreign keys of \"%1\"").arg(toQt(child.name)),
+        mDatabase, model::say<MessageCode::foreignKeysNotRead>(child.name),
         // SQLite numbers them backwards.
         QStringLiteral("SELECT seq, \"table\", \"from\", \"to\" FROM pragma_foreign_key_list(?, ?) "
                        "ORDER BY id DESC, seq"),
@@ -109,7 +107,7 @@ Result<std::vector<ForeignKey>> SqliteReader::foreignKeys(const TableId& child) 
     for (ForeignKey& key : keys) {
         if (key.columns.front().second.empty()) {
             const auto parent = primaryKey(key.parent);
-            if (!parent) return Error{parent.error()};
+            if (!parent) return parent.failure();
             if (parent->size() != key.columns.size()) continue;
             for (std::size_t n = 0; n < parent->size(); ++n) key.columns[n].second = (*parent)[n];
         }

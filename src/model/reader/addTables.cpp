@@ -50,7 +50,7 @@ Result<std::vector<Relation>> relations(DatabaseReader& reader, const std::vecto
     for (std::size_t child = 0; child < sources.size(); ++child) {
         if (instancesOf(sources[child], sources).front() != child) continue;
         auto keys = reader.foreignKeys(sources[child]);
-        if (!keys) return Error{keys.error()};
+        if (!keys) return keys.failure();
         for (ForeignKey& key : *keys) {
             auto parents = instancesOf(key.parent, sources);
             std::erase(parents, child);
@@ -169,7 +169,7 @@ Result<TableList> addTables(model::Query& query, DatabaseReader& reader,
     std::vector<model::TableDescription> descriptions;
     for (const TableId& name : names) {
         auto description = reader.table(name);
-        if (!description) return Error{description.error()};
+        if (!description) return description.failure();
         descriptions.push_back(std::move(*description));
     }
     const TableList present = tablesOf(query);
@@ -177,7 +177,7 @@ Result<TableList> addTables(model::Query& query, DatabaseReader& reader,
     for (const auto& table : present) sources.push_back({table->schema(), table->sourceName()});
     sources.insert(sources.end(), names.begin(), names.end());
     auto found = relations(reader, sources, present.size());
-    if (!found) return Error{found.error()};
+    if (!found) return found.failure();
 
     TableList added;
     for (const auto& description : descriptions) added.push_back(query.addTable(description));

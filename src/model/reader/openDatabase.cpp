@@ -15,6 +15,8 @@
 
 namespace zandor::reader {
 
+using model::say;
+
 namespace {
 
 struct Engine {
@@ -40,7 +42,7 @@ constexpr std::array<Engine, 5> engines = {{
      "SQL_ATTR_ACCESS_MODE=SQL_MODE_READ_ONLY;SQL_ATTR_LOGIN_TIMEOUT=10", nullptr},
 }};
 
-const QString example = QStringLiteral("write it like postgresql://user@host:5432/database");
+const platform::String example = u"postgresql://user@host:5432/database";
 
 /// The options of an address as the driver of PostgreSQL takes them, or what is wrong with them.
 /// They go into a line that the driver makes, so only known names get there, and values in quotes.
@@ -54,13 +56,11 @@ Result<QString> postgresOptions(const QUrlQuery& query) {
     for (auto [name, value] : query.queryItems(QUrl::FullyDecoded)) {
         if (name == QStringLiteral("host")) continue;
         if (!known.contains(name))
-            return Error{QStringLiteral("The address has an unknown option \"%1\"; known are %2 "
-                                        "and host.")
-                             .arg(name.simplified(), known.join(QStringLiteral(", ")))};
+            return Error{say<MessageCode::unknownOption>(
+                name.simplified().toStdU16String(),
+                known.join(QStringLiteral(", ")).toStdU16String())};
         if (value.contains(u';'))
-            return Error{QStringLiteral("The option %1 of the address has a semicolon in it; use "
-                                        "a value without one.")
-                             .arg(name)};
+            return Error{say<MessageCode::semicolonInOption>(name.toStdU16String())};
         timed = timed || name == QStringLiteral("connect_timeout");
         value.replace(u'\\', QStringLiteral("\\\\")).replace(u'\'', QStringLiteral("\\'"));
         options += QStringLiteral("%1='%2';").arg(name, value);
@@ -72,14 +72,12 @@ Result<QString> postgresOptions(const QUrlQuery& query) {
 Result<Connection> openServer(const Engine& engine, const QUrl& url, const QString& password) {
     const QString driver = QLatin1String(engine.driver);
     if (!QSqlDatabase::isDriverAvailable(driver))
-        return Error{QStringLiteral("The Qt driver for %1 is missing; install it (Debian: apt "
-                                    "install %2).")
-                         .arg(QLatin1String(engine.name), QLatin1String(engine.package))};
+        return Error{say<MessageCode::driverMissing>(engine.name, engine.package)};
     QString options = QLatin1String(engine.options);
     const QUrlQuery query(url.query());
     if (driver == QStringLiteral("QPSQL")) {
         const auto made = postgresOptions(query);
-        if (!made) return Error{made.error()};
+        if (!made) return made.failure();
         options = *made;
     }
 
@@ -93,8 +91,8 @@ Result<Connection> openServer(const Engine& engine, const QUrl& url, const QStri
     database.setUserName(url.userName());
     database.setPassword(password.isEmpty() ? url.password() : password);
     database.setConnectOptions(options);
-    const QString opening = QStringLiteral("The database %1 cannot be opened")
-                                .arg(url.toDisplayString(QUrl::RemoveQuery).simplified());
+    const auto opening = say<MessageCode::databaseNotOpened>(
+        url.toDisplayString(QUrl::RemoveQuery).simplified().toStdU16String());
     if (!database.open()) return serverError(opening, database.lastError());
     if (engine.readOnly) {
         QSqlQuery statement(database);
@@ -115,12 +113,9 @@ Result<Connection> openDatabase(const QString& address, const QString& password)
     });
     // Not the address itself: what cannot be read may have a password at any place.
     if (!url.isValid())
-        return Error{QStringLiteral("The address of the database cannot be read; %1, with %XX for "
-                                    "a character that means something else there.")
-                         .arg(example)};
+        return Error{say<MessageCode::addressNotRead>(example)};
     if (engine == engines.end())
-        return Error{
-            QStringLiteral("There is no kind of database \"%1\"; %2.").arg(url.scheme(), example)};
+        return Error{say<MessageCode::unknownEngine>(url.scheme().toStdU16String(), example)};
     return openServer(*engine, url, password);
 }
 

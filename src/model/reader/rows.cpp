@@ -11,7 +11,7 @@ platform::String textAt(const QSqlQuery& row, int column) {
     return row.value(column).toString().toStdU16String();
 }
 
-std::optional<Error> readRows(const QSqlDatabase& database, const QString& what,
+std::optional<Error> readRows(const QSqlDatabase& database, const model::Message& failed,
                               const QString& statement, const QVariantList& parameters,
                               const std::function<void(const QSqlQuery&)>& use) {
     QSqlQuery query(database);
@@ -29,11 +29,10 @@ std::optional<Error> readRows(const QSqlDatabase& database, const QString& what,
     while (done && query.next()) use(query);
     // A failure between two rows ends the loop like the last row does.
     if (done && !query.lastError().isValid()) return {};
-    return databaseError(database, QStringLiteral("%1 cannot be read").arg(what),
-                         query.lastError());
+    return databaseError(database, failed, query.lastError());
 }
 
-Error databaseError(const QSqlDatabase& database, const QString& failed, const QSqlError& error) {
+Error databaseError(const QSqlDatabase& database, const model::Message& failed, const QSqlError& error) {
     if (database.driverName() == QStringLiteral("QSQLITE")) return sqliteError(failed, error);
     return serverError(failed, error);
 }

@@ -1,56 +1,61 @@
 #include "model/reader/serverError.h"
 
+#include <Zandor/reader/rows.h>
+
 #include <algorithm>
 #include <array>
 
 namespace zandor::reader {
 
+using model::say;
+
 namespace {
 
 struct Advice {
     const char* words; ///< what the engine says, or a part of it
-    const char* advice;
+    model::Message (*advice)();
 };
 
 /// An engine that was not reached, or turns one away, gives no code but only its words.
 constexpr std::array<Advice, 14> byWords = {{
-    {"no password supplied", "give a password"},
-    {"password authentication failed", "check the user name and the password"},
-    {"Access denied for user", "check the user name and the password"},
-    {"no pg_hba.conf entry", "ask the server's administrator to let you in"},
-    {"could not translate host name", "check the name of the host"},
-    {"Unknown MySQL server host", "check the name of the host"},
-    {"Connection refused", "see that the server runs, and check host and port"},
-    {"No such file or directory", "see that the server runs, and check host and port"},
-    {"Can't connect to", "see that the server runs, and check host and port"},
-    {"timeout expired", "see that the server can be reached, and check host and port"},
-    {"Unknown database", "check the name of the database"},
-    {"ermission denied", "ask the owner for permission"},
-    {"role \"", "check the user name"},
-    {"database \"", "check the name of the database"},
+    {"no password supplied", say<MessageCode::givePassword>},
+    {"password authentication failed", say<MessageCode::checkPassword>},
+    {"Access denied for user", say<MessageCode::checkPassword>},
+    {"no pg_hba.conf entry", say<MessageCode::askAdministrator>},
+    {"could not translate host name", say<MessageCode::checkHost>},
+    {"Unknown MySQL server host", say<MessageCode::checkHost>},
+    {"Connection refused", say<MessageCode::checkServer>},
+    {"No such file or directory", say<MessageCode::checkServer>},
+    {"Can't connect to", say<MessageCode::checkServer>},
+    {"timeout expired", say<MessageCode::checkNetwork>},
+    {"Unknown database", say<MessageCode::checkDatabase>},
+    {"ermission denied", say<MessageCode::askOwner>},
+    {"role \"", say<MessageCode::checkUser>},
+    {"database \"", say<MessageCode::checkDatabase>},
 }};
 
 } // namespace
 
-Error serverError(const QString& failed, const QSqlError& error) {
+Error serverError(const model::Message& failed, const QSqlError& error) {
     QString said = error.databaseText().simplified();
     if (said.isEmpty()) said = error.driverText().simplified();
-    QString advice = QStringLiteral("open the database afresh");
-    for (const Advice& each : byWords)
-        if (said.contains(QLatin1String(each.words))) {
-            advice = QLatin1String(each.advice);
-            break;
-        }
-    return {QStringLiteral("%1 (%2): %3.").arg(failed, said, advice)};
+    const auto known = std::ranges::find_if(byWords, [&](const Advice& each) {
+        return said.contains(QLatin1String(each.words));
+    });
+    return say<MessageCode::refusedByEngine>(failed, said.toStdU16String(),
+                                             known == byWords.end() ? say<MessageCode::openAfresh>()
+                                                                    : known->advice());
 }
 
-bool asksForPassword(const QString& message) {
+bool asksForPassword(const Error& error) {
+    if (!error.message.is(MessageCode::refusedByEngine)) return false;
+    const QString said = toQt(std::get<platform::String>(error.message.arguments()[1].content));
     // The first one begins so in all languages.
     static const std::array<QLatin1String, 3> words = {
         QLatin1String("fe_sendauth"), QLatin1String("password authentication failed"),
         QLatin1String("Access denied for user")};
     return std::any_of(words.begin(), words.end(),
-                       [&](QLatin1String each) { return message.contains(each); });
+                       [&](QLatin1String each) { return said.contains(each); });
 }
 
 } // namespace zandor::reader

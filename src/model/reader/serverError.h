@@ -9,9 +9,9 @@ namespace zandor::reader {
 
 /// An error of an engine behind a network: its own words in one line, and what to do about it as
 /// far as the words tell. `failed` is what could not be done, without a full stop.
-ZANDOR_READER_EXPORT Error serverError(const QString& failed, const QSqlError& error);
+ZANDOR_READER_EXPORT Error serverError(const model::Message& failed, const QSqlError& error);
 
-/// Whether a message of openDatabase says that the server wants a password, or another one.
-ZANDOR_READER_EXPORT bool asksForPassword(const QString& message);
+/// Whether an error of openDatabase says that the server wants a password, or another one.
+ZANDOR_READER_EXPORT bool asksForPassword(const Error& error);
 
 } // namespace zandor::reader

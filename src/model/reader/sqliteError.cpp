@@ -2,30 +2,30 @@
 
 namespace zandor::reader {
 
+using model::say;
+
 namespace {
 
 /// By the result codes of SQLite.
-QString advice(int code) {
+model::Message advice(int code) {
     switch (code & 0xff) { // an extended code has the plain one in its low byte
     case 5:
-    case 6: return QStringLiteral("another program is writing to it; try again in a moment");
+    case 6: return say<MessageCode::databaseBusy>();
     case 8:
-    case 14:
-        return QStringLiteral("see that you may read the file and its folder; a database in WAL "
-                              "mode also needs permission to write to the folder");
-    case 11: return QStringLiteral("the file is damaged; restore it from a copy");
-    case 26: return QStringLiteral("it is damaged or encrypted; choose another file");
-    default: return QStringLiteral("open the database afresh");
+    case 14: return say<MessageCode::checkPermissions>();
+    case 11: return say<MessageCode::databaseDamaged>();
+    case 26: return say<MessageCode::databaseUnreadable>();
+    default: return say<MessageCode::openAfresh>();
     }
 }
 
 } // namespace
 
-Error sqliteError(const QString& failed, const QSqlError& error) {
+Error sqliteError(const model::Message& failed, const QSqlError& error) {
     const QString said = error.databaseText().simplified();
-    return {QStringLiteral("%1 (%2): %3.")
-                .arg(failed, said.isEmpty() ? error.driverText().simplified() : said,
-                     advice(error.nativeErrorCode().toInt()))};
+    const QString words = said.isEmpty() ? error.driverText().simplified() : said;
+    return say<MessageCode::refusedByEngine>(failed, words.toStdU16String(),
+                                             advice(error.nativeErrorCode().toInt()));
 }
 
 } // namespace zandor::reader

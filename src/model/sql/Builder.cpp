@@ -19,8 +19,7 @@ public:
 
     Built build() {
         if (mQuery.Tables().Count() == 0) {
-            mBuilt.findings.push_back(
-                {Finding::Kind::noTables, u"The query has no tables: add one first."});
+            mBuilt.findings.push_back({Finding::Kind::noTables, say<MessageCode::noTables>()});
             return std::move(mBuilt);
         }
         JoinTrees trees = joinTrees(mQuery, mBuilt.findings);
@@ -36,14 +35,13 @@ public:
         if (Node criteria = anyOf(std::move(rows))) where.push_back(std::move(criteria));
         mStatement.where = allOf(std::move(where));
         mBuilt.statement = std::move(mStatement);
-        for (Finding& finding : mBuilt.findings) finding.text = oneLine(std::move(finding.text));
         return std::move(mBuilt);
     }
 
 private:
-    void report(Finding::Kind kind, const ColumnDefinition& definition, String text,
+    void report(Finding::Kind kind, const ColumnDefinition& definition, Message message,
                 std::int16_t row = 0, std::size_t position = 0) {
-        Finding finding{kind, std::move(text)};
+        Finding finding{kind, std::move(message)};
         finding.definition = definition.Key();
         finding.row = row;
         finding.position = position;
@@ -54,8 +52,7 @@ private:
         const Ref<Column> column = definition.place().column();
         if (!column) {
             report(Finding::Kind::definitionWithoutColumn, definition,
-                   u"The table of an output column is no longer in the query: delete the "
-                   u"output column, or choose another field for it.");
+                   say<MessageCode::definitionWithoutColumn>());
             return;
         }
         const Ref<Table> table = definition.place().table().table();
@@ -79,14 +76,11 @@ private:
         if (definition.Visible()) mStatement.items.push_back({AllColumns{table}, {}});
         if (definition.SortOrder() != 0)
             report(Finding::Kind::sortOnAllColumns, definition,
-                   table + u".* stands for all columns and cannot be sorted by: add the column "
-                           u"that is to decide, and sort by that.");
+                   say<MessageCode::sortOnAllColumns>(table));
         for (const auto& [row, criterium] : definition.criteria().rows())
             if (!criteria::isBlank(criterium->Criterium()))
                 report(Finding::Kind::badCriterion, definition,
-                       table + u".* stands for all columns and cannot have a criterion: add the "
-                               u"column that is meant, and write the criterion there.",
-                       row);
+                       say<MessageCode::criterionOnAllColumns>(table), row);
     }
 
     void addCriterion(const ColumnDefinition& definition, const ColumnRef& subject,
@@ -95,8 +89,10 @@ private:
             criteria::read(criterium.Criterium(), subject, mColumns, criterium.references());
         if (reading.error)
             report(Finding::Kind::badCriterion, definition,
-                   subject.table + u"." + subject.column + u": " + reading.error->message, row,
-                   reading.error->position);
+                   say<MessageCode::badCriterion>(subject.table + u"." + subject.column,
+                                                  reading.error->position + 1,
+                                                  std::move(reading.error->message)),
+                   row, reading.error->position);
         if (reading.condition) mRows[row].push_back(std::move(reading.condition));
     }
 
@@ -112,8 +108,7 @@ private:
                 [&](const auto& other) { return sameName(other.second, mNames[i].second); });
             if (seen)
                 report(Finding::Kind::duplicateOutputName, *mNames[i].first,
-                       u"Two output columns are named " + mNames[i].second +
-                           u", so that nobody can tell them apart: give one of them a synonym.");
+                       say<MessageCode::duplicateOutputName>(mNames[i].second));
         }
     }
 
@@ -137,7 +132,6 @@ Text statementText(Query& query, Dialect dialect, ValueForm form,
     built.statement->limit = limit;
     Findings names = uncarriedNames(query, dialect);
     if (!names.empty()) {
-        for (Finding& finding : names) finding.text = oneLine(std::move(finding.text));
         result.findings.insert(result.findings.end(), names.begin(), names.end());
         return result;
     }
@@ -145,7 +139,7 @@ Text statementText(Query& query, Dialect dialect, ValueForm form,
     if (auto* refusal = std::get_if<Refusal>(&printed)) {
         Finding finding{refusal->reason == Refusal::Reason::name ? Finding::Kind::nameNotCarried
                                                                  : Finding::Kind::notInDialect,
-                        oneLine(std::move(refusal->message))};
+                        std::move(refusal->message)};
         finding.join = std::move(refusal->join);
         result.findings.push_back(std::move(finding));
         return result;

@@ -72,6 +72,12 @@ String moment(StringView text, StringView keyword, StringView serverType, Dialec
     return String(keyword) + u" " + quoted;
 }
 
+/// The engines have one name in all languages.
+MessageArgument argumentOf(Dialect dialect) {
+    if (dialect == Dialect::Standard) return say<MessageCode::standardSql>();
+    return nameOf(dialect);
+}
+
 } // namespace
 
 StringView nameOf(Dialect dialect) {
@@ -92,38 +98,28 @@ String identifier(StringView name, Dialect dialect) {
     return u"\"" + doubled(name, u'"') + u"\"";
 }
 
-std::optional<String> cannotCarry(StringView name, Dialect dialect) {
-    const String reader(nameOf(dialect));
-    const auto anyName = [&](StringView with, StringView advice) {
-        return reader + u" takes no name " + String(with) + u": " + String(advice) + u'.';
-    };
-    if (name.empty()) return anyName(u"that is empty", u"write one");
-    if (name.find(u'\0') != StringView::npos)
-        return anyName(u"with the character zero in it", u"choose another one");
-    if (isTorn(name)) return anyName(u"with half a character in it", u"type it afresh");
-    const auto thisName = [&](StringView why) {
-        return u"The name \"" + shortened(name) + u"\" " + String(why);
-    };
-    const auto tooLong = [&](std::size_t length, std::size_t most, StringView unit) {
-        if (length <= most) return std::optional<String>();
-        return std::optional(thisName(u"is too long for ") + reader + u", which takes " +
-                             platform::decimal(static_cast<std::int64_t>(most)) + u" " +
-                             String(unit) + u": choose a shorter one.");
+std::optional<Message> cannotCarry(StringView name, Dialect dialect) {
+    const MessageArgument reader = argumentOf(dialect);
+    if (name.empty()) return say<MessageCode::emptyName>(reader);
+    if (name.find(u'\0') != StringView::npos) return say<MessageCode::zeroInName>(reader);
+    if (isTorn(name)) return say<MessageCode::halfCharacterInName>(reader);
+    constexpr std::size_t mostBytes = 63;
+    const auto ofMost = [&](std::size_t most) -> std::optional<Message> {
+        if (name.size() <= most) return {};
+        return say<MessageCode::nameOfTooManyCharacters>(shortened(name), reader, most);
     };
     switch (dialect) {
     case Dialect::PostgreSQL:
-        return tooLong(platform::toUtf8(name).size(), 63,
-                       u"bytes (one for a letter from A to Z, more for most others)");
+        if (platform::toUtf8(name).size() <= mostBytes) return {};
+        return say<MessageCode::nameOfTooManyBytes>(shortened(name), reader, mostBytes);
     case Dialect::MySQL:
         if (std::any_of(name.begin(), name.end(), isHighSurrogate))
-            return thisName(u"has a rare character in it that ") + reader +
-                   u" does not take, such as an emoji: write it without.";
+            return say<MessageCode::rareCharacterInName>(shortened(name), reader);
         if (name.back() == u' ')
-            return thisName(u"ends with a blank, which ") + reader +
-                   u" does not take: write it without.";
-        return tooLong(name.size(), 64, u"characters");
+            return say<MessageCode::blankBehindName>(shortened(name), reader);
+        return ofMost(64);
     case Dialect::SqlServer:
-    case Dialect::Standard: return tooLong(name.size(), 128, u"characters");
+    case Dialect::Standard: return ofMost(128);
     case Dialect::SQLite: break;
     }
     return {};

@@ -56,11 +56,8 @@ private:
         const String leftName = leftTable->Name() + u"." + leftColumn->Name();
         const String rightName = rightTable->Name() + u"." + rightColumn->Name();
         if (!criteria::comparable(leftType, rightType))
-            report(
-                Finding::Kind::incomparableJoin, join.Key(),
-                leftName + u" and " + rightName +
-                    u" hold different kinds of values, so that their join finds nothing or fails: "
-                    u"join columns that hold the same.");
+            report(Finding::Kind::incomparableJoin, join.Key(),
+                   say<MessageCode::incomparableJoin>(leftName, rightName));
         Node condition = make(Compare{static_cast<Comparison>(join.CompareOperator()),
                                       make(criteria::columnRef(*leftColumn, *leftTable)),
                                       make(criteria::columnRef(*rightColumn, *rightTable))});
@@ -73,8 +70,8 @@ private:
         mEdges.push_back(std::move(edge));
     }
 
-    void report(Finding::Kind kind, const String& join, String text) {
-        Finding finding{kind, std::move(text)};
+    void report(Finding::Kind kind, const String& join, Message message) {
+        Finding finding{kind, std::move(message)};
         finding.join = join;
         mFindings.push_back(std::move(finding));
     }
@@ -101,10 +98,8 @@ private:
         for (const Edge& edge : mEdges)
             if (edge.type != normal && mGroupOf[edge.left] == mGroupOf[edge.right])
                 report(Finding::Kind::ambiguousOuterJoin, edge.key,
-                       u"The outer join between " + mTables[edge.left]->Name() + u" and " +
-                           mTables[edge.right]->Name() +
-                           u" keeps no more rows than a normal one, for normal joins connect these "
-                           u"tables too: make it a normal join, or make the others outer ones.");
+                       say<MessageCode::uselessOuterJoin>(mTables[edge.left]->Name(),
+                                                          mTables[edge.right]->Name()));
     }
 
     SourceNode leaf(std::size_t table) const {
@@ -225,10 +220,8 @@ private:
 
     void reportConflict(const Edge& edge) {
         report(Finding::Kind::ambiguousOuterJoin, edge.key,
-               u"The outer joins around " + mTables[edge.left]->Name() + u" and " +
-                   mTables[edge.right]->Name() +
-                   u" contradict each other, and the one drawn first decides which rows are kept: "
-                   u"let all of them keep the rows of the same table.");
+               say<MessageCode::contradictingOuterJoins>(mTables[edge.left]->Name(),
+                                                         mTables[edge.right]->Name()));
     }
 
     /// Whether other rows would come out if the joins were carried out in another order. That is so
@@ -247,9 +240,7 @@ private:
         const std::size_t met = otherSide(*meeting, group);
         if (kind == JoinKind::fullOuter && !several && !isFilledWithin(met, joined)) return;
         report(Finding::Kind::ambiguousOuterJoin, meeting->key,
-               u"The outer joins around " + mTables[mGroups[met].front()]->Name() +
-                   u" can be read in several ways, each with other rows: change the type of one "
-                   u"of them.");
+               say<MessageCode::openOuterJoins>(mTables[mGroups[met].front()]->Name()));
     }
 
     /// Whether one of the joined groups fills another.
@@ -325,11 +316,8 @@ private:
         const String first = firstTable(mResult.trees.front());
         for (std::size_t i = 1; i < mResult.trees.size(); ++i) {
             const String other = firstTable(mResult.trees[i]);
-            Finding finding{
-                Finding::Kind::cartesianProduct,
-                u"No join connects " + other + u" with " + first +
-                    u", so that every row of one comes with every row of the other: draw a "
-                    u"join between them, or delete one."};
+            Finding finding{Finding::Kind::cartesianProduct,
+                            say<MessageCode::cartesianProduct>(other, first)};
             for (const auto& table : mTables)
                 if (table->Name() == other) finding.table = table->Key();
             mFindings.push_back(std::move(finding));

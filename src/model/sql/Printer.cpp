@@ -158,15 +158,12 @@ private:
         if (mDialect == Dialect::MySQL)
             throw Refusal{
                 Refusal::Reason::join,
-                u"MySQL/MariaDB has no join that keeps all rows of both tables: let this one "
-                u"keep those of one table.",
+                say<MessageCode::noFullJoin>(),
                 join.key};
         if (mDialect == Dialect::PostgreSQL && !hasEquality(*join.on))
             throw Refusal{
                 Refusal::Reason::join,
-                u"PostgreSQL keeps all rows of both tables only where a join asks for equal "
-                u"values: choose the operator =, or let the join keep the rows of one "
-                u"table.",
+                say<MessageCode::unequalFullJoin>(),
                 join.key};
     }
 
@@ -175,8 +172,7 @@ private:
         if (mDialect == Dialect::SQLite && depth(where) > deepest)
             throw Refusal{
                 Refusal::Reason::size,
-                u"These are more conditions than SQLite takes, which is about 900: write a "
-                u"long list of values as In (1, 2, 3)."};
+                say<MessageCode::tooManyConditions>()};
     }
 
     void tableRef(const TableRef& table) {

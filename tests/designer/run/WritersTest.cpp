@@ -95,9 +95,10 @@ TEST(RowsAsJson, KeepColumnsOfOneNameApart) {
 }
 
 TEST(RowsAsJson, SayWhenTheyCannotBeWritten) {
-    files::Stream closed(-1, "The rows cannot be written", files::Stream::nothingWaits);
+    files::Stream closed(-1, model::say<files::MessageCode::outputNotWritten>(),
+                         files::Stream::nothingWaits);
     designer::JsonWriter writer(closed);
     EXPECT_EQ(writer.begin({"a"}),
-              "The rows cannot be written (Bad file descriptor); try again, or "
+              "The output cannot be written (Bad file descriptor); try again, or "
               "choose another folder.");
 }

@@ -42,5 +42,5 @@ void save(const QString& path, const platform::Ref<model::Query>& query, const Q
     files::QueryDocument document(query);
     document.database = database.toStdU16String();
     const auto error = files::saveQuery(path.toStdString(), document);
-    EXPECT_FALSE(error) << error->text;
+    EXPECT_FALSE(error) << error->text();
 }

@@ -54,9 +54,13 @@ protected:
     std::unique_ptr<designer::DrawingArea> area;
 };
 
+model::Message said(const char16_t* words) {
+    return model::say<model::MessageCode::asItStands>(words);
+}
+
 model::Finding at(const char16_t* table, const platform::String& joinKey = {},
                   const platform::String& definition = {}) {
-    model::Finding finding{model::Finding::Kind::badCriterion, u""};
+    model::Finding finding{model::Finding::Kind::badCriterion, {}};
     finding.table = table;
     finding.join = joinKey;
     finding.definition = definition;
@@ -94,8 +98,8 @@ TEST_F(ThePlaceOfAFinding, IsTheCellOfACriterion) {
 TEST_F(ThePlaceOfAFinding, IsMarkedInItsCell) {
     model::Finding finding = at(u"", u"", output->Key());
     finding.row = 4;
-    finding.text = u"There is no end.";
-    model::Finding other{model::Finding::Kind::cartesianProduct, u"Too many rows."};
+    finding.message = said(u"There is no end.");
+    model::Finding other{model::Finding::Kind::cartesianProduct, said(u"Too many rows.")};
     area->showFindings({other, finding});
     EXPECT_EQ(grid().model().note(4, 1), "There is no end.");
     // The mark outlives the control that is made when the query is changed from elsewhere.

@@ -1,16 +1,24 @@
 #include "designer/statement/ModelWords.h"
 
+#include <Zandor/QueryDocument.h>
+#include <Zandor/reader/Connection.h>
+#include <Zandor/sql/Builder.h>
+
 #include <gtest/gtest.h>
 
 #include <QCoreApplication>
-#include <QDirIterator>
 #include <QFile>
-#include <QRegularExpression>
+#include <QProcess>
+#include <QTemporaryDir>
 #include <QTranslator>
+#include <QXmlStreamReader>
+
+#include <set>
 
 using namespace zandor;
 
 using designer::inWords;
+using model::say;
 
 namespace {
 
@@ -26,92 +34,106 @@ public:
     }
 };
 
-/// What the sources of a folder say in texts of their own that begin in a certain way.
-QStringList textsOf(const QString& folder, const QString& beginning) {
-    const QRegularExpression texts("[u({ ]\"(" + beginning + "[^\"\\\\]*)");
-    QStringList result;
-    QDirIterator files(QStringLiteral(SOURCE_ROOT "/src/model/") + folder, {"*.cpp"});
-    while (files.hasNext()) {
-        QFile file(files.next());
-        EXPECT_TRUE(file.open(QIODevice::ReadOnly));
-        QString source = QString::fromUtf8(file.readAll());
-        source.replace(QRegularExpression("\"\\s*u?\""), ""); // a text in two pieces
-        for (auto all = texts.globalMatch(source); all.hasNext();) result << all.next().captured(1);
-    }
-    return result;
+std::set<std::string> textsOfTheTables() {
+    std::set<std::string> texts;
+    for (const auto& each : model::messageTexts) texts.insert(each.english);
+    for (const auto& each : files::messageTexts) texts.insert(each.english);
+    for (const auto& each : reader::messageTexts) texts.insert(each.english);
+    return texts;
 }
 
-bool isKnown(const QString& text) {
-    static const QRegularExpression placeholder(QStringLiteral("\\\\%[1-9]"));
-    for (const QString& message : designer::knownMessages()) {
-        if (message.contains(text)) return true;
-        const QString shape = QRegularExpression::escape(message).replace(placeholder, ".");
-        if (QRegularExpression(QRegularExpression::anchoredPattern(shape)).match(text).hasMatch())
-            return true;
+/// What lupdate takes from the sources of the model for the context "Model", as it is called for
+/// the catalogues.
+std::set<std::string> textsForTranslators() {
+    const QTemporaryDir folder;
+    const QString file = folder.filePath(QStringLiteral("texts.ts"));
+    QStringList arguments = QStringLiteral(LUPDATE_OPTIONS).split(u' ');
+    arguments << QStringLiteral(SOURCE_ROOT "/src/model") << QStringLiteral("-ts") << file;
+    EXPECT_EQ(QProcess::execute(QStringLiteral(LUPDATE), arguments), 0);
+    QFile found(file);
+    EXPECT_TRUE(found.open(QIODevice::ReadOnly));
+    std::set<std::string> texts;
+    bool ours = false;
+    for (QXmlStreamReader xml(&found); !xml.atEnd();) {
+        if (xml.readNext() != QXmlStreamReader::StartElement) continue;
+        if (xml.name() == QLatin1String("name"))
+            ours = xml.readElementText() == QLatin1String("Model");
+        else if (xml.name() == QLatin1String("source") && ours)
+            texts.insert(xml.readElementText().toStdString());
     }
-    return false;
+    return texts;
 }
 
 } // namespace
 
+TEST(TheModelsWords, AreAllFoundByTheTranslatorsTool) {
+    EXPECT_EQ(textsForTranslators(), textsOfTheTables());
+}
+
 TEST(TheModelsWords, AreTranslatedAroundTheNamesInThem) {
     const Marking translations;
-    EXPECT_EQ(inWords("Two output columns are named id, so that nobody can tell them apart: give "
-                      "one of them a synonym.")
-                  .toStdString(),
-              "<Two output columns are named id, so that nobody can tell them apart: give one of "
-              "them a synonym.>");
-    EXPECT_EQ(inWords("No join connects a with b, so that every row of one comes with every row of "
-                      "the other: draw a join between them, or delete one.")
-                  .toStdString(),
-              "<No join connects a with b, so that every row of one comes with every row of the "
-              "other: draw a join between them, or delete one.>");
+    const auto query = platform::makeRef<model::Query>();
+    const model::TableDescription table{
+        u"", u"orders", {{u"id", model::ColumnType::Integer}}};
+    query->addTable(table);
+    query->addTable({u"", u"items", {{u"id", model::ColumnType::Integer}}});
+    const auto findings = model::sql::validate(*query, model::sql::Dialect::SQLite);
+    ASSERT_EQ(findings.size(), 1u);
+    EXPECT_EQ(inWords(findings[0].message).toStdString(),
+              "<No join connects items with orders, so that every row of one comes with every row "
+              "of the other: draw a join between them, or delete one.>");
+    EXPECT_EQ(findings[0].text(),
+              u"No join connects items with orders, so that every row of one comes with every row "
+              u"of the other: draw a join between them, or delete one.");
 }
 
 TEST(TheModelsWords, AreTranslatedWithinOneAnother) {
     const Marking translations;
-    EXPECT_EQ(inWords("orders.id: At character 3: a number is missing.").toStdString(),
-              "<orders.id: At character 3: <a number is missing>.>");
-    EXPECT_EQ(
-        inWords("a.b: At character 1: compare it with a column that holds a text.").toStdString(),
-        "<a.b: At character 1: <compare it with a column that holds <a text>>.>");
+    const auto query = platform::makeRef<model::Query>();
+    const auto table = query->addTable({u"", u"orders", {{u"id", model::ColumnType::Integer}}});
+    const auto definition = platform::makeRef<model::ColumnDefinition>();
+    definition->Column(table->columnNamed(u"id"));
+    query->AddColumnDefinition(definition);
+    definition->AddCriterium(u">", u"4");
+    const auto findings = model::sql::validate(*query, model::sql::Dialect::SQLite);
+    ASSERT_EQ(findings.size(), 1u);
+    EXPECT_EQ(inWords(findings[0].message).toStdString(),
+              "<orders.id: At character 2: <a number is missing>.>");
 }
 
-TEST(TheModelsWords, AreTranslatedAroundWhatTheEngineSays) {
+TEST(TheModelsWords, AreTranslatedForABrokenFile) {
     const Marking translations;
-    EXPECT_EQ(
-        inWords("The database \"a.db\" cannot be opened (Connection refused (111)): check the "
-                "name of the host.")
-            .toStdString(),
-        "<<The database \"a.db\" cannot be opened> (Connection refused (111)): <check the name "
-        "of the host>.>");
+    const auto broken = files::fromJson("{\"format\": \"zandor-query\", \"version\": 2}");
+    ASSERT_FALSE(broken);
+    EXPECT_EQ(inWords(broken.failure()).toStdString(),
+              "<</tables is missing>. <Mend the file there, or restore it from a copy>.>");
+    const auto none = files::fromJson("[]");
+    ASSERT_FALSE(none);
+    EXPECT_EQ(inWords(none.failure()).toStdString(),
+              "<<<The file> is not an object>. <Choose a query file>.>");
 }
 
-TEST(TheModelsWords, KeepNamesThatLookLikePlaceholders) {
-    EXPECT_EQ(
-        inWords("No join connects %2 with %1, so that every row of one comes with every row of "
-                "the other: draw a join between them, or delete one.")
-            .toStdString(),
-        "No join connects %2 with %1, so that every row of one comes with every row of the other: "
-        "draw a join between them, or delete one.");
-}
-
-TEST(TheModelsWords, LeaveWhatNobodyKnows) {
+TEST(TheModelsWords, AreTranslatedAroundWhatTheSystemSays) {
     const Marking translations;
-    EXPECT_EQ(inWords("near \"FORM\": syntax error"), "near \"FORM\": syntax error");
+    const auto unread = files::loadQuery("/nowhere/a.json");
+    ASSERT_FALSE(unread);
+    EXPECT_EQ(unread.failure().reason(), "No such file or directory");
+    EXPECT_EQ(inWords(unread.failure()).toStdString(),
+              "<<The file \"/nowhere/a.json\" cannot be read> (No such file or directory); "
+              "<check the path>.>");
 }
 
-TEST(TheModelsWords, AreAllKnown) {
-    const QStringList said = textsOf("criteria", "[A-Za-z]+ [^\"]");
-    EXPECT_GE(said.size(), 35);
-    for (QString text : said) {
-        if (text.endsWith(", as in [")) text.chop(1); // the names in brackets are put in
-        if (text.startsWith("At character ")) continue;
-        EXPECT_TRUE(isKnown(text)) << text.toStdString();
-    }
-    for (const QString& text : textsOf("reader", "(open|check|see that|ask|give|the file) "))
-        EXPECT_TRUE(isKnown(text)) << text.toStdString();
-    const QStringList sentences = textsOf("sql", "(The|These|Two|No|PostgreSQL|MySQL/MariaDB) ");
-    EXPECT_GE(sentences.size(), 9);
-    for (const QString& text : sentences) EXPECT_TRUE(isKnown(text)) << text.toStdString();
+TEST(TheModelsWords, AreTranslatedForAReader) {
+    const Marking translations;
+    const auto opened = reader::openSqlite(QStringLiteral("/nowhere/a.sqlite"));
+    ASSERT_FALSE(opened);
+    EXPECT_EQ(inWords(opened.failure()).toStdString(),
+              "<There is no file \"/nowhere/a.sqlite\"; check the path.>");
+    EXPECT_EQ(opened.error(), "There is no file \"/nowhere/a.sqlite\"; check the path.");
+}
+
+TEST(TheModelsWords, LeaveWordsOfOthersAsTheyStand) {
+    EXPECT_EQ(inWords(reader::Error(QStringLiteral("near \"FORM\": syntax error"))),
+              "near \"FORM\": syntax error");
+    EXPECT_EQ(inWords(files::Error(std::string_view("no %1 lock"))), "no %1 lock");
 }

@@ -14,6 +14,7 @@ TEST(ARecord, WithAFaultMakesNoQuery) {
     const auto fault = model::faultOf(record);
     ASSERT_TRUE(fault);
     EXPECT_EQ(fault->path, "tables/1/name");
+    EXPECT_EQ(fault->message, model::say<model::MessageCode::nameOfTwoTables>("/tables/1/name"));
 }
 
 TEST(ARecord, ThatIsNotTheSameIsNotEqual) {

@@ -13,7 +13,7 @@ namespace fs = std::filesystem;
 
 std::string errorOfSaving(const fs::path& path, const files::QueryDocument& document) {
     const auto error = files::saveQuery(path, document);
-    return error ? error->text : std::string();
+    return error ? error->text() : std::string();
 }
 
 class AQuerysFile : public WithoutRoom {};

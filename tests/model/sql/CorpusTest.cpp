@@ -82,7 +82,7 @@ TEST(TheCorpus, HasTheFindingsItExpects) {
         for (const auto& finding : drawn.findings) expected += parts(finding);
         std::string found;
         for (const auto& finding : model::sql::validate(*query, Dialect::SQLite))
-            found += parts({corpus::nameOf(finding.kind), toUtf8(finding.text), finding.row,
+            found += parts({corpus::nameOf(finding.kind), toUtf8(finding.text()), finding.row,
                             static_cast<int>(finding.position)});
         EXPECT_EQ(found, expected);
     }

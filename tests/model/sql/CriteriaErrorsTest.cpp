@@ -2,8 +2,7 @@
 
 using namespace zandor;
 
-// Every way to go wrong says where, counting from 1, and what was expected; the position that goes
-// with it counts from 0.
+// Every way to go wrong says where, counting from 0, and what was expected.
 
 namespace {
 
@@ -15,8 +14,7 @@ protected:
         ASSERT_TRUE(reading.error.has_value()) << platform::toUtf8(text);
         EXPECT_FALSE(reading.condition);
         EXPECT_EQ(reading.error->position, position) << platform::toUtf8(text);
-        EXPECT_EQ(platform::toUtf8(reading.error->message),
-                  "At character " + std::to_string(position + 1) + ": " + what + ".");
+        EXPECT_EQ(platform::toUtf8(reading.error->message.text()), what);
     }
 };
 

@@ -36,11 +36,13 @@ struct AllTypes {
     }
 
     /// The condition that a text sets to a column, as SQLite would be shown it; "blank" for none,
-    /// the error's text for a bad one.
+    /// the error and its place, counted from 1, for a bad one.
     std::string condition(zandor::platform::StringView column,
                           zandor::platform::StringView text) const {
         auto reading = read(column, text);
-        if (reading.error) return zandor::platform::toUtf8(reading.error->message);
+        if (reading.error)
+            return "At character " + std::to_string(reading.error->position + 1) + ": " +
+                   zandor::platform::toUtf8(reading.error->message.text()) + ".";
         if (!reading.condition) return "blank";
         zandor::model::sql::Statement statement;
         statement.items.push_back({zandor::model::sql::AllColumns{u"t"}, {}});
@@ -50,7 +52,7 @@ struct AllTypes {
         const auto printed = zandor::model::sql::print(
             statement, zandor::model::sql::Dialect::SQLite, zandor::model::sql::ValueForm::literal);
         if (const auto* refusal = std::get_if<zandor::model::sql::Refusal>(&printed))
-            return zandor::platform::toUtf8(refusal->message);
+            return zandor::platform::toUtf8(refusal->message.text());
         std::string sql =
             zandor::platform::toUtf8(std::get<zandor::model::sql::Printed>(printed).text);
         sql.erase(0, sql.find("WHERE ") + 6);

@@ -17,7 +17,7 @@ std::string quoted(platform::StringView name, Dialect dialect) {
 }
 
 std::string refused(const platform::String& name, Dialect dialect) {
-    return toUtf8(cannotCarry(name, dialect).value_or(u""));
+    return toUtf8(cannotCarry(name, dialect).value_or(model::Message()).text());
 }
 
 std::string written(ColumnType type, platform::String text, Dialect dialect) {

@@ -202,7 +202,7 @@ TEST_F(AFinding, OnANameThatIsNotCarriedNamesTheDefinitionOrTheJoin) {
     EXPECT_EQ(findings[0].join, join->Key());
     EXPECT_EQ(findings[1].definition, column->Key());
     EXPECT_EQ(findings[2].definition, synonym->Key());
-    EXPECT_EQ(toUtf8(findings[2].text),
+    EXPECT_EQ(toUtf8(findings[2].text()),
               "MySQL/MariaDB takes no name with the character zero in it: choose another one.");
     for (const auto& finding : findings) EXPECT_EQ(finding.kind, Finding::Kind::nameNotCarried);
 }

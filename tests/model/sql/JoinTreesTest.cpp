@@ -159,7 +159,7 @@ TEST(OuterJoins, ThatReadOneWayOnlyAreNotAmbiguous) {
             model::Findings findings;
             from({tables, joins}, &findings);
             EXPECT_TRUE(findings.empty())
-                << tables << ' ' << joins[0] << ' ' << joins[1] << ": " << toUtf8(findings[0].text);
+                << tables << ' ' << joins[0] << ' ' << joins[1] << ": " << toUtf8(findings[0].text());
         }
     }
 }

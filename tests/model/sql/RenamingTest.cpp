@@ -41,7 +41,7 @@ protected:
     std::string where() {
         const auto printed = model::sql::statementText(*query, Dialect::SQLite, ValueForm::literal);
         for (const auto& finding : printed.findings)
-            if (finding.isError()) return toUtf8(finding.text);
+            if (finding.isError()) return toUtf8(finding.text());
         const std::string sql = toUtf8(printed.text);
         return sql.substr(sql.find("WHERE ") + 6);
     }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include <Zandor/platform/String.h>
+#include <Zandor/model/Messages.h>
 
 #include <vector>
 
@@ -22,13 +22,16 @@ struct Finding {
     };
 
     Kind kind;
-    platform::String text; ///< one line
+    Message message;
     // Keys of what is concerned, empty where there is none.
     platform::String table{};
     platform::String join{};
     platform::String definition{};
     std::int16_t row = 0;     ///< grid row of a criterion
     std::size_t position = 0; ///< in the criterion's text, UTF-16 code units from 0
+
+    /// The message in English: one line.
+    platform::String text() const { return message.text(); }
 
     /// Whether the statement would not say what the user drew, or could not be written.
     bool isError() const {

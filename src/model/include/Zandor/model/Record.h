@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Description.h>
+#include <Zandor/model/Messages.h>
 #include <Zandor/model/export.h>
 
 #include <cstdint>
@@ -114,8 +115,9 @@ ZANDOR_MODEL_EXPORT std::optional<std::int32_t> keyNumber(StringView key, char16
 struct RecordFault {
     /// Names of the record's members and positions from 0: "tables/0/columns/3/key".
     std::string path;
-    /// Ends a sentence that the place begins: "is the key of another table too".
-    std::string reason;
+    /// Its first argument is the place as a JSON pointer: "/tables/0/columns/3/key is used before
+    /// already".
+    Message message;
 };
 
 /// The first fault of a record, or nothing.

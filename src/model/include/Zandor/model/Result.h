@@ -5,8 +5,9 @@
 
 namespace zandor::model {
 
-/// A value, or the error that kept it from being made. An error has a `text`: one line that says
-/// what went wrong and what to do about it, ready to be shown to a user.
+/// A value, or the error that kept it from being made. An error has a message, whose words are made
+/// where it is shown, and a `text()`: one line in English that says what went wrong and what to do
+/// about it.
 template <class T, class Error>
 class Result {
 public:
@@ -25,8 +26,10 @@ public:
     /// The error's text; empty for a result that holds a value.
     auto error() const {
         const Error* error = std::get_if<Error>(&mContent);
-        return error ? error->text : decltype(error->text)();
+        return error ? error->text() : decltype(error->text())();
     }
+    /// Only for a result that holds an error: the error itself, with its code.
+    const Error& failure() const { return std::get<Error>(mContent); }
 
 private:
     std::variant<T, Error> mContent;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/model/Messages.h>
 #include <Zandor/model/export.h>
 #include <Zandor/sql/Statement.h>
 
@@ -16,8 +17,8 @@ ZANDOR_MODEL_EXPORT StringView nameOf(Dialect dialect);
 /// A name as the dialect writes it, in quotes where it needs them.
 ZANDOR_MODEL_EXPORT String identifier(StringView name, Dialect dialect);
 
-/// Why the dialect cannot carry a name, in one line, or nothing when it can.
-ZANDOR_MODEL_EXPORT std::optional<String> cannotCarry(StringView name, Dialect dialect);
+/// Why the dialect cannot carry a name, or nothing when it can.
+ZANDOR_MODEL_EXPORT std::optional<Message> cannotCarry(StringView name, Dialect dialect);
 
 /// A value written out, in the dialect's quotes.
 ZANDOR_MODEL_EXPORT String literal(const Value& value, Dialect dialect);

@@ -16,12 +16,12 @@ struct Printed {
     std::vector<Binding> bindings; ///< in the order of the placeholders; parameters in either form
 };
 
-/// Why a dialect cannot say a statement, in one line.
+/// Why a dialect cannot say a statement.
 struct Refusal {
     enum class Reason { name, join, size };
 
     Reason reason;
-    String message;
+    Message message;
     String join{}; ///< key of the query's join that is refused
 };
 

@@ -1,21 +1,31 @@
 #pragma once
 
+#include <Zandor/files/Messages.h>
 #include <Zandor/files/export.h>
+#include <Zandor/model/Messages.h>
 #include <Zandor/model/Result.h>
 
 #include <filesystem>
 #include <string>
+#include <string_view>
 
 namespace zandor::files {
 
 /// The path of the file as saved or loaded.
 using Path = std::filesystem::path;
 
-/// What went wrong, where, and what to do about it: one line of UTF-8, ready to be shown to a user.
-struct Error {
-    std::string text;
-    /// The system's own words alone, when it was the system that refused.
-    std::string reason = {};
+/// What went wrong, where, and what to do about it.
+struct ZANDOR_FILES_EXPORT Error {
+    Error(model::Message message) : message(std::move(message)) {}
+    /// Somebody else's words, which are shown as they stand: UTF-8.
+    explicit Error(std::string_view words);
+
+    model::Message message;
+
+    /// The message in English: one line of UTF-8.
+    std::string text() const;
+    /// The system's own words alone, in UTF-8; empty when it was not the system that refused.
+    std::string reason() const;
 };
 
 template <class T>
@@ -23,9 +33,6 @@ using Result = model::Result<T, Error>;
 
 /// "The file "a" cannot be saved (No space left on device); make room on the disk, …", by what
 /// failed and the number of the system's error.
-ZANDOR_FILES_EXPORT Error systemError(const std::string& failed, int number);
-
-/// The path within a message of one line.
-ZANDOR_FILES_EXPORT std::string quoted(const Path& path);
+ZANDOR_FILES_EXPORT Error systemError(model::Message failed, int number);
 
 } // namespace zandor::files

@@ -25,17 +25,17 @@ public:
     static constexpr std::size_t usuallyWaiting = 64 * 1024;
     static constexpr std::size_t nothingWaits = 0;
 
-    /// `refusal` is how an error begins: "The output cannot be written". As many bytes wait at
-    /// most.
-    Stream(int file, std::string refusal, std::size_t mostWaiting = usuallyWaiting)
-        : mFile(file), mRefusal(std::move(refusal)), mMostWaiting(mostWaiting) {}
+    /// `failed` is what an error says of a failure, without a full stop: "The output cannot be
+    /// written". As many bytes wait at most.
+    Stream(int file, model::Message failed, std::size_t mostWaiting = usuallyWaiting)
+        : mFile(file), mFailed(std::move(failed)), mMostWaiting(mostWaiting) {}
 
     std::optional<Error> write(std::string_view bytes) override;
     std::optional<Error> flush() override;
 
 private:
     const int mFile;
-    const std::string mRefusal;
+    const model::Message mFailed;
     const std::size_t mMostWaiting;
     std::string mWaiting;
     std::optional<Error> mFailure;

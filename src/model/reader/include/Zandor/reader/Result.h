@@ -1,14 +1,24 @@
 #pragma once
 
+#include <Zandor/model/Messages.h>
 #include <Zandor/model/Result.h>
+#include <Zandor/reader/Messages.h>
+#include <Zandor/reader/export.h>
 
 #include <QString>
 
 namespace zandor::reader {
 
-/// What went wrong and what to do about it: one line, ready to be shown to a user.
-struct Error {
-    QString text;
+/// What went wrong and what to do about it.
+struct ZANDOR_READER_EXPORT Error {
+    Error(model::Message message) : message(std::move(message)) {}
+    /// Somebody else's words, which are shown as they stand.
+    explicit Error(const QString& words);
+
+    model::Message message;
+
+    /// The message in English: one line.
+    QString text() const;
 };
 
 /// A value, or the error that kept it from being read.

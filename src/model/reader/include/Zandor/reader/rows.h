@@ -17,15 +17,15 @@ namespace zandor::reader {
 ZANDOR_READER_EXPORT QString toQt(const platform::String& text);
 ZANDOR_READER_EXPORT platform::String textAt(const QSqlQuery& row, int column);
 
-/// Calls `use` for every row of a statement; the error when it fails. `what` is what is being read,
-/// as the beginning of a sentence.
+/// Calls `use` for every row of a statement; the error when it fails. `failed` is what could not be
+/// done then, without a full stop.
 ZANDOR_READER_EXPORT std::optional<Error>
-readRows(const QSqlDatabase& database, const QString& what, const QString& statement,
+readRows(const QSqlDatabase& database, const model::Message& failed, const QString& statement,
          const QVariantList& parameters, const std::function<void(const QSqlQuery&)>& use);
 
 /// The engine's words about a failure with what to do about it. `failed` is what could not be done,
 /// without a full stop.
-ZANDOR_READER_EXPORT Error databaseError(const QSqlDatabase& database, const QString& failed,
+ZANDOR_READER_EXPORT Error databaseError(const QSqlDatabase& database, const model::Message& failed,
                                          const QSqlError& error);
 
 } // namespace zandor::reader

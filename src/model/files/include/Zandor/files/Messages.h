@@ -1,0 +1,25 @@
+#pragma once
+
+#include <Zandor/model/Message.h>
+
+namespace zandor::files {
+
+/// The codes of files/messages.def.
+enum class MessageCode : std::uint16_t {
+#define ZANDOR_MESSAGE(code, english) code,
+#include <Zandor/files/messages.def>
+#undef ZANDOR_MESSAGE
+};
+
+/// All of files/messages.def, in the order of the codes.
+inline constexpr model::MessageText messageTexts[] = {
+#define ZANDOR_MESSAGE(code, english) {#code, english},
+#include <Zandor/files/messages.def>
+#undef ZANDOR_MESSAGE
+};
+
+constexpr model::MessageText textOf(MessageCode code) {
+    return messageTexts[static_cast<std::size_t>(code)];
+}
+
+} // namespace zandor::files
