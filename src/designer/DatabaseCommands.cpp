@@ -55,8 +55,7 @@ void DatabaseCommands::begin() {
 void DatabaseCommands::openAddress(const QString& address) {
     if (!mFiles.mayLose()) return;
     const Opening opening = openAskingForPassword(mDatabase, address, &mWindow);
-    if (!opening.error.isEmpty())
-        PlainBox::warn(&mWindow, tr("Open database"), opening.error);
+    if (!opening.error.isEmpty()) PlainBox::warn(&mWindow, tr("Open database"), opening.error);
     if (opening.opened) begin();
 }
 
@@ -72,10 +71,9 @@ void DatabaseCommands::followFile() {
     const Opening opening = openAskingForPassword(mDatabase, *address, &mWindow);
     if (opening.opened) return;
     if (mDatabase.isOpen()) mDatabase.close(); // the query is not to run on another one
-    PlainBox box(
-        QMessageBox::Warning, tr("Open database"),
-        tr("The query is open, but not its database. %1").arg(opening.error).trimmed(),
-        QMessageBox::Close, &mWindow);
+    PlainBox box(QMessageBox::Warning, tr("Open database"),
+                 tr("The query is open, but not its database. %1").arg(opening.error).trimmed(),
+                 QMessageBox::Close, &mWindow);
     const auto* again = box.addButton(tr("&Try again"), QMessageBox::AcceptRole);
     const auto* another = box.addButton(tr("&Choose database\u2026"), QMessageBox::AcceptRole);
     box.exec();

@@ -26,9 +26,7 @@ std::vector<model::MessageText> allTexts() {
 }
 
 /// Shows where each text was put in.
-platform::String marked(const char* english) {
-    return u"<" + platform::fromUtf8(english) + u">";
-}
+platform::String marked(const char* english) { return u"<" + platform::fromUtf8(english) + u">"; }
 
 } // namespace
 

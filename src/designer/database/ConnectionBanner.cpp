@@ -17,8 +17,7 @@ ConnectionBanner::ConnectionBanner(Database& database, QWidget* parent)
 }
 
 void ConnectionBanner::showLoss(const QString& message) {
-    say(tr("The connection to %1 is lost. Your query is kept.").arg(mDatabase.name()),
-        message);
+    say(tr("The connection to %1 is lost. Your query is kept.").arg(mDatabase.name()), message);
 }
 
 void ConnectionBanner::showChange(Database::Change change) {

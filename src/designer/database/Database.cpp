@@ -44,18 +44,20 @@ std::optional<reader::Error> Database::open(const QString& address, const QStrin
 }
 
 std::optional<reader::Error> Database::open(const QString& address, const QString& password,
-                                      Tables tables) {
+                                            Tables tables) {
     return take(address, password, std::move(tables));
 }
 
-std::optional<reader::Error> Database::renew() { return take(QString(mAddress), QString(mPassword), {}); }
+std::optional<reader::Error> Database::renew() {
+    return take(QString(mAddress), QString(mPassword), {});
+}
 
 std::optional<reader::Error> Database::renew(Tables tables) {
     return take(QString(mAddress), QString(mPassword), std::move(tables));
 }
 
 std::optional<reader::Error> Database::take(const QString& address, const QString& password,
-                                      std::optional<Tables> tables) {
+                                            std::optional<Tables> tables) {
     const PartedAddress parted = partPassword(address);
     const QString& secret = password.isEmpty() ? parted.password : password;
     auto connection = reader::openDatabase(parted.address, secret);

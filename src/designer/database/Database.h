@@ -36,7 +36,8 @@ public:
     /// openPatiently() instead.
     std::optional<reader::Error> open(const QString& address, const QString& password = {});
     /// The same with a list of tables that was read already.
-    std::optional<reader::Error> open(const QString& address, const QString& password, Tables tables);
+    std::optional<reader::Error> open(const QString& address, const QString& password,
+                                      Tables tables);
     /// Connects afresh to the same database and reads everything again; emits opened().
     std::optional<reader::Error> renew();
     std::optional<reader::Error> renew(Tables tables);
@@ -90,7 +91,7 @@ signals:
 private:
     std::optional<Change> changed();
     std::optional<reader::Error> take(const QString& address, const QString& password,
-                                std::optional<Tables> tables);
+                                      std::optional<Tables> tables);
 
     QString mAddress;
     QString mPassword;

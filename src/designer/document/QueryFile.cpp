@@ -70,8 +70,7 @@ std::optional<QString> QueryFile::open(const QString& path) {
 std::optional<QString> QueryFile::saveAs(const QString& path) {
     const auto text = files::toJson(content());
     if (!text) return inWords(text.failure());
-    if (const auto error = files::replaceFile(pathOf(path), *text))
-        return inWords(*error);
+    if (const auto error = files::replaceFile(pathOf(path), *text)) return inWords(*error);
     mMark = FileMark::of(path);
     mOrigin = digest(QByteArray::fromStdString(*text));
     mPath = QFileInfo(path).absoluteFilePath();

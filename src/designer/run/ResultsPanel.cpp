@@ -92,9 +92,7 @@ std::optional<Command> ResultsPanel::command(std::optional<qint64> limit) {
     if (!text.runnable()) {
         QStringList lines(tr("The query cannot be run yet:"));
         for (const model::Finding& finding : text.findings)
-            if (finding.isError())
-                lines << QStringLiteral("\u2022 ") +
-                             inWords(finding.message);
+            if (finding.isError()) lines << QStringLiteral("\u2022 ") + inWords(finding.message);
         showMessage(lines.join(u'\n'));
         return {};
     }

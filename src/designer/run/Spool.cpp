@@ -197,8 +197,8 @@ std::optional<QString> Spool::written() const {
     const std::string_view bytes(mPending.constData(), static_cast<std::size_t>(mPending.size()));
     if (files::writeAll(mFile.number(), bytes)) return {};
     const int why = errno;
-    const QString failed = QCoreApplication::translate("zandor::designer::Spool",
-                                                       "The rows cannot be written");
+    const QString failed =
+        QCoreApplication::translate("zandor::designer::Spool", "The rows cannot be written");
     return inWords(files::systemError(
         model::say<model::MessageCode::asItStands>(failed.toStdU16String()), why));
 }

@@ -32,8 +32,7 @@ int printStatement(const Task& task) {
     const Dialect dialect =
         task.dialect ? *task.dialect : dialectFor(QString::fromStdU16String(document->database));
     const auto text = statementText(*document->query, dialect, model::sql::ValueForm::literal);
-    for (const model::Finding& finding : text.findings)
-        complain(inWords(finding.message));
+    for (const model::Finding& finding : text.findings) complain(inWords(finding.message));
     // One with something left out would not say what was drawn.
     if (!text.runnable()) return failed;
     return print(QByteArray::fromStdString(platform::toUtf8(text.text)) + '\n');

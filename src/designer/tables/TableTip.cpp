@@ -53,9 +53,10 @@ bool TableTip::eventFilter(QObject*, QEvent* event) {
 
 void TableTip::show(const reader::TableEntry& table, QPoint at) {
     const auto columns = mDatabase.reader().table(table.id);
-    QToolTip::showText(
-        at, columns ? tipText(*columns, table.isView) : platform::qt::asToolTip(inWords(columns.failure())),
-        mList.viewport());
+    QToolTip::showText(at,
+                       columns ? tipText(*columns, table.isView)
+                               : platform::qt::asToolTip(inWords(columns.failure())),
+                       mList.viewport());
 }
 
 void TableTip::read(const reader::TableEntry& table, QPoint at) {

@@ -24,8 +24,7 @@ public:
     Reading read() {
         try {
             if (peek().kind != TokenKind::end) mReading.condition = disjunction();
-            if (peek().kind != TokenKind::end)
-                fail<MessageCode::jointMissing>();
+            if (peek().kind != TokenKind::end) fail<MessageCode::jointMissing>();
         } catch (Error& error) {
             mReading.condition = {};
             mReading.error = std::move(error);
@@ -39,8 +38,7 @@ private:
     class Nesting {
     public:
         explicit Nesting(Parser& parser) : mParser(parser) {
-            if (++mParser.mDepth > deepestNesting)
-                mParser.fail<MessageCode::nestedTooDeep>();
+            if (++mParser.mDepth > deepestNesting) mParser.fail<MessageCode::nestedTooDeep>();
         }
         ~Nesting() { --mParser.mDepth; }
 
@@ -154,15 +152,13 @@ private:
     Node isNull() {
         take();
         const bool negated = takeKeyword(u"Not");
-        if (!takeKeyword(u"Null"))
-            fail<MessageCode::nullMissing>();
+        if (!takeKeyword(u"Null")) fail<MessageCode::nullMissing>();
         return sql::make(sql::IsNull{negated, mSubject});
     }
 
     Node like(bool negated) {
         const Token word = take();
-        if (!takesAnyText())
-            throw Error{word.begin, say<MessageCode::likeOnNoText>()};
+        if (!takesAnyText()) throw Error{word.begin, say<MessageCode::likeOnNoText>()};
         const Token first = peek();
         const bool qualified = first.kind == TokenKind::bracketed && peek(1).kind == TokenKind::dot;
         Node asked;
@@ -177,16 +173,14 @@ private:
             return sql::make(sql::Like{negated, mSubject, sql::make(std::move(pattern))});
         }
         const String typed = first.kind == TokenKind::quoted ? take().text : barePattern();
-        if (first.kind != TokenKind::quoted && typed.empty())
-            fail<MessageCode::patternMissing>();
+        if (first.kind != TokenKind::quoted && typed.empty()) fail<MessageCode::patternMissing>();
         return sql::make(sql::Like{negated, mSubject,
                                    sql::make(sql::Value{ColumnType::Text, likePattern(typed)})});
     }
 
     Node between(bool negated) {
         Node low = operand();
-        if (!takeKeyword(u"And"))
-            fail<MessageCode::secondValueMissing>();
+        if (!takeKeyword(u"And")) fail<MessageCode::secondValueMissing>();
         Node high = operand();
         return sql::make(sql::Between{negated, mSubject, std::move(low), std::move(high)});
     }
@@ -230,8 +224,7 @@ private:
 
     Node bareValue() {
         const Token first = peek();
-        if (at(u"Null"))
-            fail<MessageCode::equalToNull>();
+        if (at(u"Null")) fail<MessageCode::equalToNull>();
         const String typed = bareText();
         if (typed.empty()) failMissing(first);
         const auto value = literal(typed, mSubjectColumn.type);
@@ -356,8 +349,7 @@ private:
     static std::optional<sql::ColumnRef> columnOf(const Reference& known) {
         if (known.column.empty()) return {};
         const auto column = known.column.column();
-        if (!column)
-            throw Error{known.begin, say<MessageCode::tableOfColumnGone>()};
+        if (!column) throw Error{known.begin, say<MessageCode::tableOfColumnGone>()};
         return columnRef(*column, *known.column.table().table());
     }
 

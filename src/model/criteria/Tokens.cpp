@@ -19,8 +19,7 @@ bool isSpecial(char16_t c) { return StringView(u"'\"()[],=<>!").find(c) != Strin
 
 /// A character that text cannot carry to any engine.
 std::optional<Error> unusable(StringView text) {
-    if (text.size() > longestText)
-        return Error{longestText, say<MessageCode::criterionTooLong>()};
+    if (text.size() > longestText) return Error{longestText, say<MessageCode::criterionTooLong>()};
     for (std::size_t i = 0; i < text.size(); ++i) {
         const char16_t c = text[i];
         if (c == 0) return Error{i, say<MessageCode::zeroInCriterion>()};

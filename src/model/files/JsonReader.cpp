@@ -127,8 +127,7 @@ private:
     }
 
     bool add(Value value) {
-        if (++mCount > limits::values)
-            refuse<MessageCode::tooManyValues>(place(), limits::values);
+        if (++mCount > limits::values) refuse<MessageCode::tooManyValues>(place(), limits::values);
         if (mOpen.empty()) {
             mRoot = std::move(value);
             return true;

@@ -25,7 +25,8 @@ platform::String Object::text(std::string_view name, std::optional<platform::Str
     auto value = take(name);
     if (!value && missing) return *missing;
     if (!value) refuse<MessageCode::isMissing>(mPlace / name);
-    return platform::fromUtf8(as<std::string, MessageCode::notAText>(std::move(*value), mPlace / name));
+    return platform::fromUtf8(
+        as<std::string, MessageCode::notAText>(std::move(*value), mPlace / name));
 }
 
 platform::String Object::textOrNull(std::string_view name) {
@@ -37,7 +38,8 @@ platform::String Object::textOrNull(std::string_view name) {
 
 bool Object::flag(std::string_view name, bool missing) {
     auto value = take(name);
-    return value ? as<bool, MessageCode::notTrueOrFalse>(std::move(*value), mPlace / name) : missing;
+    return value ? as<bool, MessageCode::notTrueOrFalse>(std::move(*value), mPlace / name)
+                 : missing;
 }
 
 std::int16_t Object::word(std::string_view name, Words words, std::int16_t missing) {
@@ -56,8 +58,7 @@ Object Object::objectOrNone(std::string_view name) {
 
 json::Items Object::list(std::string_view name, std::size_t most) {
     auto items = as<json::Items, MessageCode::notAList>(required(name), mPlace / name);
-    if (items.size() > most)
-        refuse<MessageCode::tooManyEntries>(mPlace / name, most);
+    if (items.size() > most) refuse<MessageCode::tooManyEntries>(mPlace / name, most);
     return items;
 }
 

@@ -34,8 +34,7 @@ Result<QueryDocument> loadQuery(const Path& path) {
     if (!file.isOpen()) return unread(path, errno);
     struct stat state = {};
     if (::fstat(file.number(), &state) != 0) return unread(path, errno);
-    if (!S_ISREG(state.st_mode))
-        return Error{model::say<MessageCode::noFileToRead>(nameOf(path))};
+    if (!S_ISREG(state.st_mode)) return Error{model::say<MessageCode::noFileToRead>(nameOf(path))};
 
     std::string text;
     // One byte more than a file may have, by which the reader sees that it has too many.

@@ -163,14 +163,13 @@ void Reader::definition(Object object) {
 json::Value current(json::Value file) {
     const auto choose = model::say<MessageCode::chooseQueryFile>();
     auto* members = std::get_if<json::Members>(&file.content);
-    if (!members)
-        throw Refusal{model::say<MessageCode::notAnObject>(Pointer().shown()), choose};
+    if (!members) throw Refusal{model::say<MessageCode::notAnObject>(Pointer().shown()), choose};
     const json::Value* format = json::find(*members, "format");
     const auto* name = format ? std::get_if<std::string>(&format->content) : nullptr;
     if (!name || *name != words::format)
-        throw Refusal{model::say<MessageCode::notTheFormat>((Pointer() / "format").shown(),
-                                                            words::format),
-                      choose};
+        throw Refusal{
+            model::say<MessageCode::notTheFormat>((Pointer() / "format").shown(), words::format),
+            choose};
 
     Object object(std::move(file), {});
     object.text("format");
@@ -192,8 +191,7 @@ Result<QueryDocument> fromJson(std::string_view text) {
     try {
         Reader reader;
         reader.read(current(json::read(text)));
-        if (const auto fault = model::faultOf(reader.record))
-            throw Refusal{fault->message};
+        if (const auto fault = model::faultOf(reader.record)) throw Refusal{fault->message};
         QueryDocument document(model::Query::restored(reader.record));
         document.database = std::move(reader.database);
         if (!reader.unknown.membersOf.empty())

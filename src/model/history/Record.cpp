@@ -56,8 +56,7 @@ private:
 
     void lastKey(const char* kind, std::int32_t last) {
         if (last < 0 || last > greatestKeyNumber)
-            fault<MessageCode::notInRange>(std::string("lastKeys/") + kind, 0,
-                                              greatestKeyNumber);
+            fault<MessageCode::notInRange>(std::string("lastKeys/") + kind, 0, greatestKeyNumber);
     }
 
     /// One that was given, whether its object is still there or not.
@@ -114,8 +113,7 @@ private:
         if (definition.sortOrder < 0 || definition.sortOrder > 2)
             fault<MessageCode::noSortOrder>(path + "sort");
         if (definition.width < 0 || definition.width > ColumnDefinition::greatestWidth)
-            fault<MessageCode::notInRange>(path + "width", 0,
-                                              ColumnDefinition::greatestWidth);
+            fault<MessageCode::notInRange>(path + "width", 0, ColumnDefinition::greatestWidth);
         std::int32_t before = Criteria::firstRow - 1;
         for (std::size_t n = 0; n < definition.criteria.size() && !mFault; ++n) {
             const std::int16_t row = definition.criteria[n].row;

@@ -62,8 +62,7 @@ private:
 
 Result<std::vector<TableEntry>> GenericReader::tables() {
     // A driver says of a failure here nothing but an empty list.
-    if (!mDatabase.isOpen())
-        return Error{model::say<MessageCode::connectionClosed>()};
+    if (!mDatabase.isOpen()) return Error{model::say<MessageCode::connectionClosed>()};
     std::vector<TableEntry> entries;
     for (const QString& name : mDatabase.tables(QSql::Tables))
         entries.push_back({{{}, name.toStdU16String()}, false});

@@ -109,8 +109,7 @@ Result<model::TableDescription> PostgresReader::table(const TableId& id) {
                  textAt(row, 1), row.value(5).toBool()});
         });
     if (error) return *error;
-    if (!found)
-        return Error{model::say<MessageCode::noSuchTable>(id.name)};
+    if (!found) return Error{model::say<MessageCode::noSuchTable>(id.name)};
     return description;
 }
 

@@ -73,8 +73,7 @@ Result<model::TableDescription> SqliteReader::table(const TableId& id) {
                          {textAt(row, 0), columnType(type), type, row.value(2).toInt() > 0});
                  });
     if (error) return *error;
-    if (description.columns.empty())
-        return Error{model::say<MessageCode::noSuchTable>(id.name)};
+    if (description.columns.empty()) return Error{model::say<MessageCode::noSuchTable>(id.name)};
     return description;
 }
 

@@ -56,9 +56,9 @@ Result<QString> postgresOptions(const QUrlQuery& query) {
     for (auto [name, value] : query.queryItems(QUrl::FullyDecoded)) {
         if (name == QStringLiteral("host")) continue;
         if (!known.contains(name))
-            return Error{say<MessageCode::unknownOption>(
-                name.simplified().toStdU16String(),
-                known.join(QStringLiteral(", ")).toStdU16String())};
+            return Error{
+                say<MessageCode::unknownOption>(name.simplified().toStdU16String(),
+                                                known.join(QStringLiteral(", ")).toStdU16String())};
         if (value.contains(u';'))
             return Error{say<MessageCode::semicolonInOption>(name.toStdU16String())};
         timed = timed || name == QStringLiteral("connect_timeout");
@@ -112,8 +112,7 @@ Result<Connection> openDatabase(const QString& address, const QString& password)
         return url.scheme() == QLatin1String(each.scheme);
     });
     // Not the address itself: what cannot be read may have a password at any place.
-    if (!url.isValid())
-        return Error{say<MessageCode::addressNotRead>(example)};
+    if (!url.isValid()) return Error{say<MessageCode::addressNotRead>(example)};
     if (engine == engines.end())
         return Error{say<MessageCode::unknownEngine>(url.scheme().toStdU16String(), example)};
     return openServer(*engine, url, password);

@@ -32,7 +32,8 @@ std::optional<Error> readRows(const QSqlDatabase& database, const model::Message
     return databaseError(database, failed, query.lastError());
 }
 
-Error databaseError(const QSqlDatabase& database, const model::Message& failed, const QSqlError& error) {
+Error databaseError(const QSqlDatabase& database, const model::Message& failed,
+                    const QSqlError& error) {
     if (database.driverName() == QStringLiteral("QSQLITE")) return sqliteError(failed, error);
     return serverError(failed, error);
 }

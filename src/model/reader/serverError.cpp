@@ -39,9 +39,8 @@ constexpr std::array<Advice, 14> byWords = {{
 Error serverError(const model::Message& failed, const QSqlError& error) {
     QString said = error.databaseText().simplified();
     if (said.isEmpty()) said = error.driverText().simplified();
-    const auto known = std::ranges::find_if(byWords, [&](const Advice& each) {
-        return said.contains(QLatin1String(each.words));
-    });
+    const auto known = std::ranges::find_if(
+        byWords, [&](const Advice& each) { return said.contains(QLatin1String(each.words)); });
     return say<MessageCode::refusedByEngine>(failed, said.toStdU16String(),
                                              known == byWords.end() ? say<MessageCode::openAfresh>()
                                                                     : known->advice());

@@ -115,8 +115,7 @@ std::optional<Message> cannotCarry(StringView name, Dialect dialect) {
     case Dialect::MySQL:
         if (std::any_of(name.begin(), name.end(), isHighSurrogate))
             return say<MessageCode::rareCharacterInName>(shortened(name), reader);
-        if (name.back() == u' ')
-            return say<MessageCode::blankBehindName>(shortened(name), reader);
+        if (name.back() == u' ') return say<MessageCode::blankBehindName>(shortened(name), reader);
         return ofMost(64);
     case Dialect::SqlServer:
     case Dialect::Standard: return ofMost(128);

@@ -156,23 +156,15 @@ private:
     void check(const JoinSource& join) const {
         if (join.kind != JoinKind::fullOuter) return;
         if (mDialect == Dialect::MySQL)
-            throw Refusal{
-                Refusal::Reason::join,
-                say<MessageCode::noFullJoin>(),
-                join.key};
+            throw Refusal{Refusal::Reason::join, say<MessageCode::noFullJoin>(), join.key};
         if (mDialect == Dialect::PostgreSQL && !hasEquality(*join.on))
-            throw Refusal{
-                Refusal::Reason::join,
-                say<MessageCode::unequalFullJoin>(),
-                join.key};
+            throw Refusal{Refusal::Reason::join, say<MessageCode::unequalFullJoin>(), join.key};
     }
 
     void check(const Expression& where) const {
         constexpr std::size_t deepest = 950; // SQLite takes 1000
         if (mDialect == Dialect::SQLite && depth(where) > deepest)
-            throw Refusal{
-                Refusal::Reason::size,
-                say<MessageCode::tooManyConditions>()};
+            throw Refusal{Refusal::Reason::size, say<MessageCode::tooManyConditions>()};
     }
 
     void tableRef(const TableRef& table) {

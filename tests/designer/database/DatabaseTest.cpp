@@ -77,7 +77,8 @@ TEST_F(ADatabase, StaysAsItIsWhenAnotherCannotBeOpened) {
     QObject::connect(&database, &Database::opened, [&] { ++opened; });
     const auto error = database.open(folder.path(QStringLiteral("none.sqlite")));
     ASSERT_TRUE(error);
-    EXPECT_TRUE(error->message.is(reader::MessageCode::noDatabaseFile)) << error->text().toStdString();
+    EXPECT_TRUE(error->message.is(reader::MessageCode::noDatabaseFile))
+        << error->text().toStdString();
     EXPECT_EQ(opened, 0);
     EXPECT_EQ(database.address(), path);
     EXPECT_TRUE(database.reader().table({u"", u"a"}));

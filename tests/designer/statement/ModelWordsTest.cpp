@@ -73,8 +73,7 @@ TEST(TheModelsWords, AreAllFoundByTheTranslatorsTool) {
 TEST(TheModelsWords, AreTranslatedAroundTheNamesInThem) {
     const Marking translations;
     const auto query = platform::makeRef<model::Query>();
-    const model::TableDescription table{
-        u"", u"orders", {{u"id", model::ColumnType::Integer}}};
+    const model::TableDescription table{u"", u"orders", {{u"id", model::ColumnType::Integer}}};
     query->addTable(table);
     query->addTable({u"", u"items", {{u"id", model::ColumnType::Integer}}});
     const auto findings = model::sql::validate(*query, model::sql::Dialect::SQLite);

@@ -49,7 +49,7 @@ protected:
         const auto findings = model::sql::validate(*query, dialect);
         if (findings.size() == 1) return findings.front();
         ADD_FAILURE() << findings.size() << " findings";
-        return {Finding::Kind::noTables, u""};
+        return {Finding::Kind::noTables, {}};
     }
 
     bool runnable(Dialect dialect) {
@@ -90,8 +90,8 @@ TEST_F(AFinding, OnADefinitionWithoutItsColumnNamesTheDefinition) {
     EXPECT_EQ(only().kind, Finding::Kind::definitionWithoutColumn);
     EXPECT_EQ(only().definition, u"x9");
     EXPECT_TRUE(only().isError());
-    EXPECT_EQ(toUtf8(only().text), "The table of an output column is no longer in the query: "
-                                   "delete the output column, or choose another field for it.");
+    EXPECT_EQ(toUtf8(only().text()), "The table of an output column is no longer in the query: "
+                                     "delete the output column, or choose another field for it.");
 }
 
 TEST_F(AFinding, OnASortOfAllColumnsNamesTheDefinition) {
@@ -226,7 +226,7 @@ TEST_F(AFinding, OnAFullJoinThatTheDialectLacksNamesTheJoin) {
 TEST_F(AFinding, IsOneLineWhateverIsInTheNames) {
     added(u"a\nb");
     added(u"c\r\n\u2028d");
-    EXPECT_EQ(toUtf8(only().text),
+    EXPECT_EQ(toUtf8(only().text()),
               "No join connects c   d with a b, so that every row of one comes "
               "with every row of the other: draw a join between them, or "
               "delete one.");

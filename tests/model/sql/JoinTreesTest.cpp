@@ -158,8 +158,8 @@ TEST(OuterJoins, ThatReadOneWayOnlyAreNotAmbiguous) {
         for (std::string tables : {"abc", "acb", "bac", "bca", "cab", "cba"}) {
             model::Findings findings;
             from({tables, joins}, &findings);
-            EXPECT_TRUE(findings.empty())
-                << tables << ' ' << joins[0] << ' ' << joins[1] << ": " << toUtf8(findings[0].text());
+            EXPECT_TRUE(findings.empty()) << tables << ' ' << joins[0] << ' ' << joins[1] << ": "
+                                          << toUtf8(findings[0].text());
         }
     }
 }

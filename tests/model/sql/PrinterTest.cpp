@@ -56,7 +56,8 @@ Statement where(Node condition) {
 
 std::string text(const Statement& statement, Dialect dialect, ValueForm form = ValueForm::bound) {
     const auto printed = print(statement, dialect, form);
-    if (const auto* refusal = std::get_if<Refusal>(&printed)) return toUtf8(refusal->message.text());
+    if (const auto* refusal = std::get_if<Refusal>(&printed))
+        return toUtf8(refusal->message.text());
     return toUtf8(std::get<Printed>(printed).text);
 }
 
