@@ -49,8 +49,10 @@ function(zandor_install name target generated)
     list(JOIN modules ", " modules)
     string(TOLOWER "zandor-${name}" module)
     set(postfix $<$<CONFIG:Debug>:d>)
+    # From where the file lies, so that the whole can be installed anywhere.
+    file(RELATIVE_PATH up /prefix/${CMAKE_INSTALL_LIBDIR}/pkgconfig /prefix)
     file(GENERATE OUTPUT ${CMAKE_CURRENT_BINARY_DIR}/$<CONFIG>/${module}.pc CONTENT
-"prefix=${CMAKE_INSTALL_PREFIX}
+"prefix=\${pcfiledir}/${up}
 libdir=\${prefix}/${CMAKE_INSTALL_LIBDIR}
 includedir=\${prefix}/${CMAKE_INSTALL_INCLUDEDIR}
 
