@@ -65,6 +65,7 @@ public:
     /// Of all tables on the canvas, by their slots.
     std::vector<Field> fields() const;
     bool has(const Field& field) const;
+    bool hasTables() const { return !tables().empty(); }
     /// Nothing where the model has dropped the table behind an element.
     Ref<TalvikZandorLib::ZDTable> tableOf(const TalvikTabulet::Tabulet& element);
     /// Whether the model keeps the order of its definitions, so that columns can be moved.

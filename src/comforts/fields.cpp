@@ -22,6 +22,10 @@ bool Comforts::gridPressed(std::int16_t button, float X, float Y) {
     });
 }
 
+bool Comforts::hasFieldsToOffer() const {
+    return mFlags.OffersFields && mDoor && mDoor->isOpen() && mDoor->hasTables();
+}
+
 bool Comforts::fieldClicked(std::int32_t column) {
     if (!mFlags.OffersFields) return false;
     return act(u"fieldClicked",

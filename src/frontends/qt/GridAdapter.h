@@ -63,7 +63,7 @@ private:
     QWidget* composer() const override { return mComposer.box(); }
     void left() override { mComposer.breakOff(); }
     bool editKey() override { return mComforts.cellOpened(); }
-    bool offersFields() const override { return mComforts.flags().OffersFields; }
+    bool offersFields() const override { return mComforts.hasFieldsToOffer(); }
     void fieldClicked(int col) override { mComforts.fieldClicked(col); }
     bool columnMovable(int col) override { return mComforts.columnMovable(col); }
     void columnMoved(int col, int position) override { mComforts.columnMoved(col, position); }

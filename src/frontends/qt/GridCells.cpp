@@ -130,7 +130,10 @@ void FieldTitles::paintSection(QPainter* painter, const QRect& place, int sectio
     painter->restore();
     if (mGrid.offeredColumn() == section + 1) {
         painter->save();
-        painter->setPen(palette().color(QPalette::PlaceholderText));
+        // The placeholder's colour is one for cells, and hard to read on a header.
+        QColor quiet = palette().color(QPalette::ButtonText);
+        quiet.setAlphaF(0.65F);
+        painter->setPen(quiet);
         const QRect inside = place.adjusted(cellMargin, 0, -cellMargin, 0);
         painter->drawText(inside, static_cast<int>(Qt::AlignCenter) | Qt::TextSingleLine,
                           fontMetrics().elidedText(mGrid.offer(), Qt::ElideRight, inside.width()));
@@ -138,6 +141,13 @@ void FieldTitles::paintSection(QPainter* painter, const QRect& place, int sectio
     }
     if (mGrid.currentRow() == 0 && mGrid.currentCol() == section + 1)
         paintCurrentFrame(*painter, place, palette(), mGrid.view().hasFocus());
+}
+
+void FieldTitles::initStyleOptionForIndex(QStyleOptionHeader* option, int section) const {
+    GridHeader::initStyleOptionForIndex(option, section);
+    // The view's own way cuts a centred text on both sides.
+    const int room = std::max(1, sectionSize(section) - 2 * cellMargin);
+    option->text = option->fontMetrics.elidedText(option->text, Qt::ElideRight, room);
 }
 
 void RowTitles::paintSection(QPainter* painter, const QRect& place, int section) const {

@@ -60,6 +60,7 @@ public:
 protected:
     void paintEvent(QPaintEvent* event) override;
     void paintSection(QPainter* painter, const QRect& place, int section) const override;
+    void initStyleOptionForIndex(QStyleOptionHeader* option, int section) const override;
 
 private:
     const GridWidget& mGrid;

@@ -344,6 +344,11 @@ int GridWidget::offeredColumn() const {
     return last + 1;
 }
 
+void GridWidget::offerAnew() {
+    const int offered = offeredColumn();
+    if (std::exchange(mOffered, offered) != offered) mTitles->viewport()->update();
+}
+
 void GridWidget::walkTo(int row, int col) {
     setCurrentCell(row, std::clamp(col, 1, mModel->cols() - 1));
     showCurrentCell();

@@ -82,6 +82,8 @@ public:
     const QString& offer() const { return mOffer; }
     /// That column; 0 where they cannot.
     int offeredColumn() const;
+    /// Tables may have come or gone, on which it depends whether there is anything to offer.
+    void offerAnew();
 
     void bringUpToDate() const;
     /// Scrolls as little as brings the current cell into view.
@@ -142,6 +144,7 @@ private:
     QString mOffer;
     Sample mSample;
     int mResized = 0; ///< the column whose border the mouse drags
+    int mOffered = 0; ///< as it was painted, as far as is known
     bool mStale = false;
     bool mRefreshing = false;
     bool mLabelWidthSet = false;

@@ -10,7 +10,9 @@
 #include <QApplication>
 #include <QDialog>
 #include <QKeyEvent>
+#include <QMouseEvent>
 #include <QScopedValueRollback>
+#include <QStyleHints>
 #include <QStyleOptionButton>
 
 #include <limits>
@@ -130,6 +132,7 @@ void ChoiceBox::wheelEvent(QWheelEvent* event) {
 }
 
 void ChoiceBox::dropDown() {
+    leaveMouse();
     mDrops = true;
     queueDrop();
 }
@@ -158,20 +161,49 @@ void ChoiceBox::hidePopup() {
 
 void ChoiceBox::hideEvent(QHideEvent* event) {
     mDrops = false;
-    qApp->removeEventFilter(this);
+    leaveMouse();
     QComboBox::hideEvent(event);
 }
 
 bool ChoiceBox::eventFilter(QObject* watched, QEvent* event) {
     if (mDrops && event->type() == QEvent::MouseButtonRelease) {
-        qApp->removeEventFilter(this);
+        if (!mClicked.isValid()) {
+            mClickedAt = static_cast<QMouseEvent*>(event)->globalPosition().toPoint();
+            mClicked.start();
+        }
         queueDrop();
     }
+    if (isSecondClick(*event)) return true;
     const bool keys =
         event->type() == QEvent::KeyPress || event->type() == QEvent::ShortcutOverride;
     if (watched == mList && mDroppedItself && keys && keyInList(static_cast<QKeyEvent&>(*event)))
         return true;
     return QComboBox::eventFilter(watched, event);
+}
+
+/// Of a double click where one would do: it chooses nothing from the list that has come below it,
+/// and does not close it.
+bool ChoiceBox::isSecondClick(const QEvent& event) {
+    if (!mClicked.isValid()) return false;
+    switch (event.type()) {
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonDblClick: {
+        const QPointF at = static_cast<const QMouseEvent&>(event).globalPosition();
+        mSecondIsDown = !mClicked.hasExpired(QApplication::doubleClickInterval()) &&
+                        (at.toPoint() - mClickedAt).manhattanLength() <=
+                            QGuiApplication::styleHints()->mouseDoubleClickDistance();
+        if (!mSecondIsDown) leaveMouse();
+        return mSecondIsDown;
+    }
+    case QEvent::MouseButtonRelease: return mSecondIsDown;
+    default: return false;
+    }
+}
+
+void ChoiceBox::leaveMouse() {
+    qApp->removeEventFilter(this);
+    mClicked.invalidate();
+    mSecondIsDown = false;
 }
 
 /// The keys that close a list together with its box.

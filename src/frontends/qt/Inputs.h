@@ -8,6 +8,7 @@
 #include <QAbstractButton>
 #include <QAbstractItemView>
 #include <QComboBox>
+#include <QElapsedTimer>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPointer>
@@ -62,11 +63,16 @@ protected:
 private:
     void queueDrop();
     void drop();
+    bool isSecondClick(const QEvent& event);
+    void leaveMouse();
     bool keyInList(QKeyEvent& key);
 
     bool mWalking = false;
     bool mDrops = false;         ///< as soon as it can
     bool mDroppedItself = false; ///< and is down
+    QPoint mClickedAt;           ///< on the screen, to open it
+    QElapsedTimer mClicked;      ///< since then, while a second click may follow
+    bool mSecondIsDown = false;
     QPointer<QAbstractItemView> mList;
 };
 

@@ -198,6 +198,7 @@ void ZandorWidget::showAnew() {
     const bool had = hasKeyboard();
     const QPointer<ZandorWidget> alive = this;
     mControl->ShowAnew();
+    if (alive) mToolkit->grid()->offerAnew();
     // The part that had it may have gone.
     if (alive && had && !hasKeyboard()) mToolkit->navigation().enter(true);
 }

@@ -4,6 +4,7 @@
 
 #include <QAccessible>
 #include <QComboBox>
+#include <QHeaderView>
 #include <QInputMethodEvent>
 #include <QListView>
 #include <QPushButton>
@@ -15,6 +16,17 @@ using namespace zandor;
 // What only a real window shows of the comforts.
 
 namespace {
+
+/// Counts how often a widget paints itself.
+class Paints : public QObject {
+public:
+    explicit Paints(QWidget& widget) { widget.installEventFilter(this); }
+    bool eventFilter(QObject*, QEvent* event) override {
+        seen += event->type() == QEvent::Paint;
+        return false;
+    }
+    int seen = 0;
+};
 
 class Comforts : public KeyDesk {
 protected:
@@ -277,6 +289,48 @@ TEST_F(Comforts, TakeAnItemOfADroppedListByTabAndGoOn) {
     EXPECT_EQ(model->definitionAt(2).sortOrder, 2);
     EXPECT_EQ(grid().currentCol(), 3);
     EXPECT_TRUE(child<QWidget>("fraSortOrder").isVisible());
+}
+
+TEST_F(Comforts, TakeNothingOfADroppedListByTheSecondOfTwoQuickClicks) {
+    const int interval = QApplication::doubleClickInterval();
+    QApplication::setDoubleClickInterval(60'000);
+    click(sortRow, 2); // ascending
+    ASSERT_TRUE(list());
+    const QPoint at = grid().mapToGlobal(grid().cellRect(sortRow, 2).center());
+    const auto clickList = [&](QPoint screen) {
+        QWidget& items = *list()->viewport();
+        hands::click(items, items.mapFromGlobal(screen));
+        settle();
+    };
+    clickList(at);
+    EXPECT_TRUE(list());
+    EXPECT_TRUE(child<QWidget>("fraSortOrder").isVisible());
+    // One that comes as soon, but is meant.
+    const QRect item = list()->visualRect(list()->model()->index(2, 0));
+    clickList(list()->viewport()->mapToGlobal(item.center()));
+    EXPECT_EQ(model->definitionAt(2).sortOrder, 2);
+    EXPECT_FALSE(child<QWidget>("fraSortOrder").isVisible());
+    QApplication::setDoubleClickInterval(interval);
+}
+
+TEST_F(Comforts, OfferNoFieldWhereNoTableIs) {
+    EXPECT_EQ(grid().offeredColumn(), 4);
+    widget->setModel(std::shared_ptr<TalvikZandorLib::Zandor>(library.newModel()));
+    settle();
+    EXPECT_EQ(grid().offeredColumn(), 0);
+}
+
+TEST_F(Comforts, OfferFieldsAsSoonAsATableIs) {
+    const auto fresh = library.newModel();
+    widget->setModel(std::shared_ptr<TalvikZandorLib::Zandor>(fresh));
+    widget->showAnew();
+    settle();
+    Paints paints(*grid().view().horizontalHeader()->viewport());
+    fresh->table(u"TOWNS", {u"*", u"NAME"})->place(300, 300, 2000, 2000);
+    widget->showAnew();
+    settle();
+    EXPECT_EQ(grid().offeredColumn(), 1);
+    EXPECT_GT(paints.seen, 0);
 }
 
 TEST_F(Comforts, LetAnInputMethodTypeInACell) {

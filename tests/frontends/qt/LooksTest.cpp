@@ -1,5 +1,8 @@
 #include "frontends/qt/CanvasItems.h"
 #include "frontends/qt/Desk.h"
+#include "frontends/qt/GridCells.h"
+
+#include <Zandor/qt/Twips.h>
 
 #include <QApplication>
 #include <QDeadlineTimer>
@@ -73,6 +76,23 @@ TEST_F(Looks, ShowACellTooLongForItsColumnInATooltip) {
     auto& header = *grid().view().horizontalHeader()->viewport();
     EXPECT_EQ(toolTipAt(header, header.mapFrom(&grid(), grid().cellRect(0, 2).center())),
               "A.FIELD.NAME.THAT.IS.FAR.TOO.LONG");
+}
+
+TEST_F(Looks, OfAFieldTooLongForItsColumnEndInAnEllipsis) {
+    bind();
+    show();
+    auto& titles = *grid().view().horizontalHeader();
+    grid().model().setWidth(1, 40 * platform::qt::twipsPerPixel);
+    const auto title = [&](const QString& text) {
+        grid().model().setText(0, 1, text);
+        grid().touch();
+        settle();
+        return titles.grab({0, 0, 40, titles.height()}).toImage();
+    };
+    const QImage shown = title("ORDERS.ORDER_ID");
+    EXPECT_EQ(shown, title(titles.fontMetrics().elidedText("ORDERS.ORDER_ID", Qt::ElideRight,
+                                                           40 - 2 * platform::qt::cellMargin)));
+    EXPECT_NE(shown, title("ORDERS"));
 }
 
 TEST_F(Looks, HaveNoSeamBetweenTheCanvasAndWhatLiesBeyondIt) {

@@ -66,6 +66,8 @@ public:
     bool gridPressed(std::int16_t button, float X, float Y);
     /// A click with the left button that was no drag.
     bool fieldClicked(std::int32_t column);
+    /// Whether a blank column has anything to offer: with no table there is no field.
+    bool hasFieldsToOffer() const;
     /// A key asks for the current cell's editor.
     bool cellOpened();
 
