@@ -4,6 +4,7 @@
 #include "designer/Colours.h"
 #include "designer/DatabaseCommands.h"
 #include "designer/EndingSignals.h"
+#include "designer/GridHint.h"
 #include "designer/Invitation.h"
 #include "designer/OpenedQuery.h"
 #include "designer/PlainBox.h"
@@ -281,6 +282,7 @@ void DesignerWindow::makeMenus() {
 void DesignerWindow::connectParts() {
     mAdding = new TableAdding(mDocument, mDatabase, *mDrawing);
     auto* const target = new TableDropTarget(*mDrawing);
+    new GridHint(mDocument, *mDrawing);
     new Invitation(mDocument, mDatabase, *mDrawing);
     new MissingTables(mDocument, mDatabase, *mDrawing);
     connect(mTables, &TablesPanel::chosen, mAdding,

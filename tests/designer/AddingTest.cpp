@@ -47,6 +47,28 @@ TEST_F(ATableOfThePanel, IsInvitedOnAnEmptyDrawing) {
     EXPECT_FALSE(invitation().isVisible());
 }
 
+TEST_F(ATableOfThePanel, SaysBelowHowItsColumnsAreChosen) {
+    open({.file = sampleDatabase()});
+    QLabel& hint = *window->findChild<QLabel*>("gridHint");
+    EXPECT_FALSE(hint.isVisible());
+    add("orders");
+    EXPECT_TRUE(hint.isVisible());
+    const auto& grid = part<QWidget>("sprColumn");
+    const QRect cells(grid.mapTo(&window->drawing(), QPoint()), grid.size());
+    EXPECT_TRUE(cells.contains(hint.geometry()));
+    EXPECT_GE(hint.height(), hint.heightForWidth(hint.width()));
+    EXPECT_NE(window->drawing().childAt(hint.geometry().center()), &hint);
+    window->document().change("Add", [](zandor::model::Query& drawn) {
+        const auto definition = zandor::platform::makeRef<zandor::model::ColumnDefinition>();
+        definition->Column(drawn.tableNamed(u"orders")->columnNamed(u"id"));
+        drawn.AddColumnDefinition(definition);
+    });
+    EXPECT_FALSE(hint.isVisible());
+    command("undo");
+    EXPECT_TRUE(hint.isVisible());
+    window->document().setModified(false);
+}
+
 TEST_F(ATableOfThePanel, IsInvitedWhenADatabaseIsNamedAtTheStart) {
     open({.file = sampleDatabase()});
     EXPECT_THAT(shownTables(), IsEmpty());

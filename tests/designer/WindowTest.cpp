@@ -244,6 +244,13 @@ TEST_F(TheDesignersWindow, UndoesWhatWasDoneWithTheControl) {
     window->document().setModified(false);
 }
 
+TEST_F(TheDesignersWindow, RedoesByBothKeysThatPeopleKnow) {
+    open({.tables = {"orders"}});
+    const auto keys = window->findChild<QAction*>("redo")->shortcuts();
+    EXPECT_TRUE(keys.contains(QKeySequence(Qt::CTRL | Qt::Key_Y)));
+    EXPECT_TRUE(keys.contains(QKeySequence(Qt::CTRL | Qt::SHIFT | Qt::Key_Z)));
+}
+
 TEST_F(TheDesignersWindow, GivesTheControlTheOptionsThatAreChosen) {
     open();
     QVariantMap options = window->drawing().options();

@@ -46,6 +46,11 @@ TEST(ATableSize, GrowsWithItsLongestTextWithinBounds) {
     EXPECT_EQ(fittedSize(3, 60).width, fittedSize(3, 1000000).width);
 }
 
+TEST(ATableSize, HasRoomForTheScrollBarBesideTheTexts) {
+    EXPECT_EQ(fittedSize(10, 15).width, fittedSize(3, 15).width);
+    EXPECT_GT(fittedSize(11, 15).width, fittedSize(10, 15).width);
+}
+
 TEST(TheLayout, BeginsAtTheMargin) {
     const auto boxes = arrange({cell}, {}, {}, 16000);
     ASSERT_EQ(boxes.size(), 1U);

@@ -58,7 +58,8 @@ QAction* Document::makeUndoAction(QObject* parent) {
 
 QAction* Document::makeRedoAction(QObject* parent) {
     QAction* action = mSteps->createRedoAction(parent, tr("&Redo"));
-    action->setShortcut(QKeySequence::Redo);
+    // A desktop knows one of them; people know the other as well.
+    action->setShortcuts({Qt::CTRL | Qt::SHIFT | Qt::Key_Z, Qt::CTRL | Qt::Key_Y});
     disconnect(action, &QAction::triggered, mSteps, nullptr); // which does not settle
     connect(action, &QAction::triggered, this, &Document::redo);
     return action;

@@ -63,6 +63,14 @@ model::sql::Text statementFor(model::Query& query, Dialect dialect, std::optiona
     return statementText(query, dialect, model::sql::ValueForm::bound, said);
 }
 
+bool comparesTexts(const model::sql::Text& text) {
+    return std::any_of(text.bindings.begin(), text.bindings.end(), [](const auto& binding) {
+        if (const auto* parameter = std::get_if<Parameter>(&binding))
+            return parameter->type == ColumnType::Text && !parameter->pattern;
+        return std::get<Value>(binding).type == ColumnType::Text;
+    });
+}
+
 std::vector<Question> questions(const model::sql::Text& text) {
     std::vector<Question> result;
     for (const auto& binding : text.bindings) {

@@ -31,6 +31,9 @@ using Answers = QMap<QString, QString>;
 model::sql::Text statementFor(model::Query& query, model::sql::Dialect dialect,
                               std::optional<qint64> limit);
 
+/// Whether rows depend on a text, in a criterion or asked for; in patterns it counts too.
+bool comparesTexts(const model::sql::Text& text);
+
 /// The parameters in the order in which the statement uses them first.
 std::vector<Question> questions(const model::sql::Text& text);
 

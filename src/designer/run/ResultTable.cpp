@@ -6,6 +6,7 @@
 #include <QHeaderView>
 #include <QHelpEvent>
 #include <QKeyEvent>
+#include <QPainter>
 #include <QSignalBlocker>
 #include <QStyledItemDelegate>
 #include <QToolTip>
@@ -107,6 +108,21 @@ void ResultTable::fitColumns() {
     resizeColumnsToContents();
     for (int column = 0; column < mModel->columnCount(); ++column)
         if (columnWidth(column) > widestColumn) setColumnWidth(column, widestColumn);
+}
+
+void ResultTable::setEmptyText(const QString& text) {
+    mEmptyText = text;
+    setAccessibleDescription(text);
+    viewport()->update();
+}
+
+void ResultTable::paintEvent(QPaintEvent* event) {
+    QTableView::paintEvent(event);
+    if (mModel->rowCount() > 0 || mEmptyText.isEmpty()) return;
+    QPainter painter(viewport());
+    painter.setPen(palette().color(QPalette::PlaceholderText));
+    painter.drawText(viewport()->rect().adjusted(roomInARow, 0, -roomInARow, 0),
+                     Qt::AlignCenter | Qt::TextWordWrap, mEmptyText);
 }
 
 // By itself a view copies the current cell only.

@@ -21,6 +21,9 @@ public:
     /// The arrow in the header; -1 for none. Sorts nothing.
     void showSorting(int column, Qt::SortOrder direction = Qt::AscendingOrder);
     QAction* copyAction() { return mCopy; }
+    /// What is said in the middle while there are no rows; empty for nothing.
+    void setEmptyText(const QString& text);
+    const QString& emptyText() const { return mEmptyText; }
 
 signals:
     /// More cells are selected than can be copied.
@@ -28,6 +31,7 @@ signals:
 
 protected:
     void keyPressEvent(QKeyEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
 
 private:
     void copy();
@@ -35,6 +39,7 @@ private:
 
     ResultModel* mModel;
     QAction* mCopy;
+    QString mEmptyText;
 };
 
 } // namespace zandor::designer

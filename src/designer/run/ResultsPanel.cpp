@@ -97,6 +97,7 @@ std::optional<Command> ResultsPanel::command(std::optional<qint64> limit) {
         return {};
     }
     if (!answerAll(questions(text))) return {};
+    mComparesTexts = comparesTexts(text);
     return makeCommand(text, dialect, mAnswers, limit);
 }
 
@@ -192,6 +193,7 @@ void ResultsPanel::finish(const Outcome& outcome) {
     case Outcome::End::complete:
         setStatus(exporting ? tr("Exported to %1. Rows: %2 \u00b7 %3").arg(file, rows, seconds())
                             : tr("Rows: %1 \u00b7 %2").arg(rows, seconds()));
+        if (!exporting && outcome.rows == 0) mTable->setEmptyText(whyEmpty());
         break;
     case Outcome::End::limited:
         setStatus(tr("First %1 rows; there are more \u00b7 %2").arg(rows, seconds()));
@@ -228,6 +230,14 @@ void ResultsPanel::askForFile() {
     exportTo(named ? path : path + QLatin1String(".csv"));
 }
 
+QString ResultsPanel::whyEmpty() const {
+    const QString none = tr("The query finds no rows.");
+    if (!mComparesTexts) return none;
+    return none + u'\n' +
+           tr("A text has to be the same as a whole, and on most databases in capital and small "
+              "letters: Like *berlin* finds Berlin wherever it stands.");
+}
+
 /// Of another query or database there are no rows yet. What is being exported still is wanted.
 void ResultsPanel::forget() {
     if (mFile.isEmpty()) stopped();
@@ -255,6 +265,7 @@ void ResultsPanel::queryChanged() {
 void ResultsPanel::showSpool() {
     mTable->showSorting(-1);
     mTable->rows().setSpool(mSpool);
+    mTable->setEmptyText({});
     mSorting.clear();
     mOutdated = false;
 }

@@ -69,6 +69,7 @@ private:
     void askForFile();
     void runAll();
     void forget();
+    QString whyEmpty() const;
     platform::String asked();
     void queryChanged();
     void showSpool();
@@ -83,6 +84,7 @@ private:
     QString mAddress; ///< where the rows that are shown came from
     QMap<QString, QString> mAnswers;
     QString mStatement;      ///< that ran last
+    bool mComparesTexts = false; ///< the query that ran last
     platform::String mAsked; ///< by the query whose rows are shown
     QString mFile;           ///< that is being exported to; empty otherwise
     std::shared_ptr<Spool> mSpool;

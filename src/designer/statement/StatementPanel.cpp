@@ -29,13 +29,16 @@ namespace {
 using model::sql::Dialect;
 using platform::qt::toQt;
 
+constexpr int aroundFinding = 4; // logical pixels
+
 QString shownName(Dialect dialect) { return toQt(model::sql::nameOf(dialect)); }
 
 } // namespace
 
 StatementPanel::StatementPanel(Document& document, QWidget* parent)
     : QWidget(parent), mDocument(document), mDialects(new QComboBox),
-      mCopy(new QPushButton(tr("Copy"))), mView(new SqlView), mList(new QListWidget) {
+      mCopy(new QPushButton(tr("Copy"))), mView(new SqlView), mList(new QListWidget),
+      mParts(new QSplitter(Qt::Vertical)) {
     mDialects->addItem({});
     for (const Dialect dialect : model::sql::allDialects) mDialects->addItem(shownName(dialect));
     mDialects->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
@@ -63,17 +66,18 @@ StatementPanel::StatementPanel(Document& document, QWidget* parent)
     top->addWidget(mDialects, 1);
     top->addStretch();
     top->addWidget(mCopy);
-    auto* const parts = new QSplitter(Qt::Vertical);
-    parts->addWidget(mView);
-    parts->addWidget(mList);
-    parts->setChildrenCollapsible(false);
-    parts->setStretchFactor(0, 3);
-    parts->setStretchFactor(1, 1);
+    mParts->addWidget(mView);
+    mParts->addWidget(mList);
+    mParts->setChildrenCollapsible(false);
+    mParts->setStretchFactor(0, 1);
+    mParts->setStretchFactor(1, 0);
+    mList->setMinimumHeight(mList->fontMetrics().height() + 2 * aroundFinding);
+    connect(mParts, &QSplitter::splitterMoved, this, [this] { mIsDivided = true; });
     auto* const layout = new QVBoxLayout(this);
     layout->setContentsMargins({});
     layout->setSpacing(0);
     layout->addLayout(top);
-    layout->addWidget(parts, 1);
+    layout->addWidget(mParts, 1);
 
     setFocusProxy(mView);
     mSoon.setSingleShot(true);
@@ -119,6 +123,9 @@ bool StatementPanel::event(QEvent* event) {
 }
 
 bool StatementPanel::eventFilter(QObject* watched, QEvent* event) {
+    // Only then it knows how its findings wrap.
+    if (watched == mList && event->type() == QEvent::Resize)
+        QMetaObject::invokeMethod(this, &StatementPanel::divide, Qt::QueuedConnection);
     if (watched == mList && event->type() == QEvent::KeyPress) {
         const int key = static_cast<QKeyEvent*>(event)->key();
         if (key == Qt::Key_Return || key == Qt::Key_Enter || key == Qt::Key_Space)
@@ -171,8 +178,24 @@ void StatementPanel::showFindings(const model::Findings& findings) {
     }
     mList->setCurrentRow(std::min(current, mList->count() - 1));
     mList->setVisible(!mFindings.empty());
+    divide();
     mList->verticalScrollBar()->setValue(scrolled);
     emit findingsChanged(mFindings);
+}
+
+/// The findings have the room that they need, up to a half, until somebody gives them another.
+void StatementPanel::divide() {
+    if (mIsDivided || mFindings.empty()) return;
+    const QListWidgetItem* const last = mList->item(mList->count() - 1);
+    const int bottom = mList->visualItemRect(last).bottom() + mList->verticalScrollBar()->value();
+    const int room = mParts->height() - mParts->handleWidth();
+    const int needed = std::min(bottom + 2 * mList->frameWidth() + aroundFinding, room / 2);
+    mParts->setSizes({room - needed, needed});
+}
+
+void StatementPanel::resizeEvent(QResizeEvent* event) {
+    QWidget::resizeEvent(event);
+    divide();
 }
 
 void StatementPanel::choose(int row) {

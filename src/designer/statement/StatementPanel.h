@@ -9,6 +9,7 @@
 class QComboBox;
 class QListWidget;
 class QPushButton;
+class QSplitter;
 
 namespace zandor::designer {
 
@@ -44,11 +45,13 @@ protected:
     bool event(QEvent* event) override;
     bool eventFilter(QObject* watched, QEvent* event) override;
     void showEvent(QShowEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
 
 private:
     void queue();
     void showNow();
     void showFindings(const model::Findings& findings);
+    void divide();
     void choose(int row);
 
     Document& mDocument;
@@ -56,11 +59,13 @@ private:
     model::Findings mFindings; ///< in the order of the list
     QTimer mSoon;
     bool mOutdated = true;
+    bool mIsDivided = false; ///< by hand
 
     QComboBox* mDialects;
     QPushButton* mCopy;
     SqlView* mView;
     QListWidget* mList;
+    QSplitter* mParts;
 };
 
 } // namespace zandor::designer

@@ -126,6 +126,7 @@ void FieldTitles::paintEvent(QPaintEvent* event) {
 
 void FieldTitles::paintSection(QPainter* painter, const QRect& place, int section) const {
     painter->save();
+    painter->setLayoutDirection(asItReads);
     GridHeader::paintSection(painter, place, section);
     painter->restore();
     if (mGrid.offeredColumn() == section + 1) {

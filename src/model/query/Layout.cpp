@@ -103,13 +103,15 @@ private:
 
 Size fittedSize(std::size_t entries, std::size_t longestText) {
     constexpr std::int32_t character = 105;
-    constexpr std::int32_t besideText = 750; // border, key mark and scroll bar
+    constexpr std::int32_t besideText = 750; // border, key mark and output mark
+    constexpr std::int32_t scrollBar = 210;
     constexpr std::int32_t entry = 270;
     constexpr std::int32_t aroundEntries = 480; // title bar and border
     constexpr std::size_t mostEntries = 10;
     const auto text = static_cast<std::int32_t>(std::min<std::size_t>(longestText, 100));
     const auto shown = static_cast<std::int32_t>(std::clamp<std::size_t>(entries, 2, mostEntries));
-    return {std::clamp(besideText + text * character, 1800, 3300), aroundEntries + shown * entry};
+    const std::int32_t beside = entries > mostEntries ? besideText + scrollBar : besideText;
+    return {std::clamp(beside + text * character, 1800, 3300), aroundEntries + shown * entry};
 }
 
 std::vector<Box> arrange(const std::vector<Size>& sizes, const std::vector<Link>& links,

@@ -67,6 +67,23 @@ protected:
 
 } // namespace
 
+TEST_F(TheResultsPanel, SaysThatAQueryFindsNothingAndHowTextsAreCompared) {
+    open({"CREATE TABLE words (n INTEGER, word TEXT)", "INSERT INTO words VALUES (1, 'Berlin')"});
+    show({"words"}, {{"words.word", {"berlin"}}});
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_THAT(table().emptyText().toStdString(), StartsWith("The query finds no rows.\nA text "));
+    show({"words"}, {{"words.n", {"2"}}});
+    EXPECT_EQ(table().emptyText(), "");
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(table().emptyText(), "The query finds no rows.");
+    show({"words"}, {{"words.n", {"1"}}});
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(table().emptyText(), "");
+}
+
 TEST_F(TheResultsPanel, ShowsTheRowsOfTheDrawnQuery) {
     open(numbersTable(3000));
     show({"numbers"}, {{"numbers.n", {"< 20"}, 2}, {"numbers.missing"}});

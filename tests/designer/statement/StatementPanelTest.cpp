@@ -146,6 +146,19 @@ TEST_F(TheStatementPanel, SaysWhyThereIsNoStatement) {
     EXPECT_EQ(list().count(), 1);
 }
 
+TEST_F(TheStatementPanel, GivesFindingsNoMoreRoomThanTheyNeed) {
+    panel.resize(900, 400);
+    drawFaults();
+    const auto needed = [&] {
+        return list().visualItemRect(list().item(list().count() - 1)).bottom();
+    };
+    EXPECT_TRUE(soon([&] { return list().viewport()->height() >= needed(); }));
+    EXPECT_LT(list().height(), needed() + 30);
+    EXPECT_GT(view().height(), list().height());
+    panel.resize(900, 160);
+    EXPECT_TRUE(soon([&] { return list().height() <= view().height() + 1; }));
+}
+
 TEST_F(TheStatementPanel, ListsErrorsBeforeWarningsEachWithItsMark) {
     drawFaults();
     EXPECT_TRUE(list().isVisible());
@@ -160,7 +173,8 @@ TEST_F(TheStatementPanel, ListsErrorsBeforeWarningsEachWithItsMark) {
               "orders.name: At character 5: after Like comes a pattern, as in Like 'A*'.");
     EXPECT_EQ(list().item(1)->text(), "No join connects customers with orders, so that every row "
                                       "of one comes with every row of the other: draw a join "
-                                      "between them, or delete one.");
+                                      "between them, add the table that lies between, or "
+                                      "delete one.");
     EXPECT_EQ(list().item(2)->text(),
               "orders.* stands for all columns and cannot be sorted by: add "
               "the column that is to decide, and sort by that.");
