@@ -2,6 +2,7 @@
 
 #include <Zandor/Zandor.h>
 #include <Zandor/comforts/Field.h>
+#include <Zandor/control/rows.h>
 
 #include <optional>
 
@@ -10,13 +11,7 @@ namespace zandor::comforts {
 /// The editors that stand over a cell.
 enum class Editor { none, text, sortOrder, visibility };
 
-/// The rows of the grid that mean something of their own; criteria fill all from the first on.
-namespace row {
-inline constexpr std::int32_t field = 0;
-inline constexpr std::int32_t synonym = 1;
-inline constexpr std::int32_t sort = 2;
-inline constexpr std::int32_t visible = 3;
-} // namespace row
+namespace row = TalvikDBxZandor::row;
 
 /// The way from the comforts into the control: all of its procedures that they act by, and no more.
 ///

@@ -1,6 +1,7 @@
 #include <Zandor/Zandor.h>
 
 #include <Zandor/control/KeyNumber.h>
+#include <Zandor/control/rows.h>
 
 #include <algorithm>
 
@@ -62,9 +63,9 @@ bool Zandor::InsertColumnDefinition(const String& fieldName, std::int32_t column
         for (std::int32_t i = sprColumn->Cols() - 2; i >= column; --i)
             sprColumn->ColPosition(i, i + 1);
         sprColumn->Col(column);
-        sprColumn->Row(3);
+        sprColumn->Row(row::visible);
         SetCell(mWords.Visible, alignCenterCenter);
-        sprColumn->Row(0);
+        sprColumn->Row(row::field);
         SetCell(fieldName, alignCenterCenter);
         FitColumn(column, fieldName);
         result = true;
@@ -176,6 +177,19 @@ void Zandor::mnuColumnDefinitionDelete_Click() {
 
 void Zandor::mnuTableDefinitionCopy_Click() {
     Guard(u"mnuTableDefinitionCopy_Click", [&] { GetDragColumns(mActiveTableIndex); });
+}
+
+/// Joins the first copied column to the entry selected in the active table.
+void Zandor::mnuTableDefinitionPaste_Click() {
+    Guard(u"mnuTableDefinitionPaste_Click", [&] {
+        if (mDragColumns.empty()) return;
+        const Ref<clsDragColumn> source = mDragColumns.front();
+        if (source->TableIndex() == mActiveTableIndex) return;
+        const auto table = Hold(lstTable(mActiveTableIndex));
+        const Ref<ColumnItem> target = FirstSelected(*table);
+        if (!target || IsAllColumns(*target) || IsAllColumns(*source->Column())) return;
+        JoinTo(*source, table, target);
+    });
 }
 
 void Zandor::mnuTableDefinitionDelete_Click() {

@@ -1,15 +1,20 @@
 #include <Zandor/Zandor.h>
 
+#include <Zandor/control/rows.h>
+
 namespace TalvikDBxZandor {
 
 using TalvikZandorLib::ZDColumnDefinition;
 
 namespace {
 
-constexpr std::int32_t synonymRow = 1;
-constexpr std::int32_t sortRow = 2;
-constexpr std::int32_t visibleRow = 3;
-constexpr std::int32_t firstCriteriaRow = 4;
+/// Escape takes an editor's input back and the editor away.
+template <class TakeBack>
+void discard(std::int16_t keyCode, const Part<platform::Frame>& frame, TakeBack takeBack) {
+    if (keyCode != platform::keyEscape) return;
+    takeBack();
+    frame->Visible(false);
+}
 
 } // namespace
 
@@ -31,9 +36,9 @@ void Zandor::sprColumn_MouseDown(std::int16_t Button, std::int16_t, float X, flo
 void Zandor::EditCell() {
     const std::int32_t row = sprColumn->Row();
     const String text = sprColumn->Text();
-    if (row == sortRow)
+    if (row == row::sort)
         GetSortOrder(text);
-    else if (row == visibleRow)
+    else if (row == row::visible)
         GetVisibility(text);
     else
         GetTextValue(text);
@@ -69,6 +74,20 @@ public:
         mControl.SetCell(text, alignment);
     }
 
+    /// What a list has chosen goes to the definition of the current cell and into the cell.
+    template <class Store>
+    static void choose(Zandor& control, const Part<platform::ComboBox>& list,
+                       const Part<platform::Frame>& frame, Store store) {
+        if (control.Definitions().Count() != 0) {
+            const EditedCell cell(control);
+            const auto definition = control.DefinitionOf(cell.column());
+            store(definition);
+            control.Raise(Event::ColumnModified, {.Definition = definition});
+            cell.set(list->Text(), MSFlexGridLib::alignCenterCenter);
+        }
+        frame->Visible(false);
+    }
+
 private:
     const Zandor& mControl;
     const std::int32_t mRow;
@@ -79,27 +98,17 @@ private:
 
 void Zandor::cmdSetSortOrder_Click() {
     Guard(u"cmdSetSortOrder_Click", [&] {
-        if (Definitions().Count() != 0) {
-            const EditedCell cell(*this);
-            const auto definition = DefinitionOf(cell.column());
+        EditedCell::choose(*this, cobSortOrder, fraSortOrder, [&](const auto& definition) {
             definition->SortOrder(cobSortOrder->ListIndex());
-            Raise(Event::ColumnModified, {.Definition = definition});
-            cell.set(cobSortOrder->Text(), MSFlexGridLib::alignCenterCenter);
-        }
-        fraSortOrder->Visible(false);
+        });
     });
 }
 
 void Zandor::cmdSetVisibility_Click() {
     Guard(u"cmdSetVisibility_Click", [&] {
-        if (Definitions().Count() != 0) {
-            const EditedCell cell(*this);
-            const auto definition = DefinitionOf(cell.column());
+        EditedCell::choose(*this, cobVisibility, fraVisibility, [&](const auto& definition) {
             definition->Visible(cobVisibility->ListIndex() == 0);
-            Raise(Event::ColumnModified, {.Definition = definition});
-            cell.set(cobVisibility->Text(), MSFlexGridLib::alignCenterCenter);
-        }
-        fraVisibility->Visible(false);
+        });
     });
 }
 
@@ -110,7 +119,7 @@ void Zandor::cmdSetTextValue_Click() {
             const auto definition = DefinitionOf(cell.column());
             const String text = txtValue->Text();
             // A drop under an open editor makes the new column's field current: nothing to write.
-            if (cell.row() == synonymRow || cell.row() >= firstCriteriaRow) {
+            if (cell.row() == row::synonym || cell.row() >= row::firstCriteria) {
                 if (StoreText(definition, cell.row(), text))
                     Raise(Event::ColumnModified, {.Definition = definition});
                 cell.set(text, MSFlexGridLib::alignLeftCenter);
@@ -123,7 +132,7 @@ void Zandor::cmdSetTextValue_Click() {
 /// Writes the text of a synonym or criteria row. False when there was nothing to change.
 bool Zandor::StoreText(const Held<ZDColumnDefinition>& definition, std::int32_t row,
                        const String& text) {
-    if (row == synonymRow) {
+    if (row == row::synonym) {
         definition->Synonym(text);
         return true;
     }
@@ -142,27 +151,17 @@ bool Zandor::StoreText(const Held<ZDColumnDefinition>& definition, std::int32_t 
 }
 
 void Zandor::cobSortOrder_KeyDown(std::int16_t KeyCode, std::int16_t) {
-    Guard(u"cobSortOrder_KeyDown", [&] {
-        if (KeyCode != platform::keyEscape) return;
-        cobSortOrder->ListIndex(0);
-        fraSortOrder->Visible(false);
-    });
+    Guard(u"cobSortOrder_KeyDown",
+          [&] { discard(KeyCode, fraSortOrder, [&] { cobSortOrder->ListIndex(0); }); });
 }
 
 void Zandor::cobVisibility_KeyDown(std::int16_t KeyCode, std::int16_t) {
-    Guard(u"cobVisibility_KeyDown", [&] {
-        if (KeyCode != platform::keyEscape) return;
-        cobVisibility->ListIndex(0);
-        fraVisibility->Visible(false);
-    });
+    Guard(u"cobVisibility_KeyDown",
+          [&] { discard(KeyCode, fraVisibility, [&] { cobVisibility->ListIndex(0); }); });
 }
 
 void Zandor::txtValue_KeyDown(std::int16_t KeyCode, std::int16_t) {
-    Guard(u"txtValue_KeyDown", [&] {
-        if (KeyCode != platform::keyEscape) return;
-        txtValue->Text({});
-        fraValue->Visible(false);
-    });
+    Guard(u"txtValue_KeyDown", [&] { discard(KeyCode, fraValue, [&] { txtValue->Text({}); }); });
 }
 
 } // namespace TalvikDBxZandor

@@ -1,5 +1,7 @@
 #include <Zandor/Zandor.h>
 
+#include <Zandor/control/rows.h>
+
 namespace TalvikDBxZandor {
 
 void Zandor::PopupZandorMenu(std::int16_t source, float X, float Y) {
@@ -43,7 +45,7 @@ void Zandor::CheckMenus(std::int16_t source, float X, float Y) {
             std::int32_t column = 0;
             std::int32_t row = 0;
             basZandor::SpreadHitTest(mLife, column, row, *sprColumn, mPopupX, mPopupY);
-            if (column >= 1 && !sprColumn->TextMatrix(0, column).empty())
+            if (column >= 1 && !sprColumn->TextMatrix(row::field, column).empty())
                 mnuColumnDefinitionDelete->Enabled(true);
         }
         if (const auto checked = mHooks.MenuChecked) checked(source);

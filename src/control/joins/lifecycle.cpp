@@ -140,19 +140,6 @@ bool Zandor::RemoveJoin(const Ref<clsJoinLine> record) {
     return result;
 }
 
-/// Joins the first copied column to the entry selected in the active table.
-void Zandor::mnuTableDefinitionPaste_Click() {
-    Guard(u"mnuTableDefinitionPaste_Click", [&] {
-        if (mDragColumns.empty()) return;
-        const Ref<clsDragColumn> source = mDragColumns.front();
-        if (source->TableIndex() == mActiveTableIndex) return;
-        const auto table = Hold(lstTable(mActiveTableIndex));
-        const Ref<ColumnItem> target = FirstSelected(*table);
-        if (!target || IsAllColumns(*target) || IsAllColumns(*source->Column())) return;
-        JoinTo(*source, table, target);
-    });
-}
-
 void Zandor::mnuJoinDelete_Click() {
     Guard(u"mnuJoinDelete_Click", [&] {
         Ref<clsJoinLine> record;

@@ -2,6 +2,7 @@
 
 #include "frontends/qt/CanvasAccessible.h"
 #include "frontends/qt/ShownText.h"
+#include "frontends/qt/mixed.h"
 
 #include <Zandor/qt/Text.h>
 #include <Zandor/qt/Twips.h>
@@ -27,14 +28,6 @@ QPointF pixelPoint(float x, float y) {
         return static_cast<qreal>(pixels > -rim ? std::min(pixels, rim) : -rim);
     };
     return {pixel(x), pixel(y)};
-}
-
-QColor between(const QColor& one, const QColor& other, qreal share) {
-    const auto mix = [share](int a, int b) {
-        return static_cast<int>(std::lround(a + (b - a) * share));
-    };
-    return {mix(one.red(), other.red()), mix(one.green(), other.green()),
-            mix(one.blue(), other.blue())};
 }
 
 } // namespace
@@ -184,8 +177,8 @@ void CanvasLine::paintAbove(QPainter& painter, const QPalette& palette) const {
     const QColor text = palette.color(QPalette::WindowText);
     painter.setFont(plateFont());
     for (const Plate& plate : all) {
-        painter.setPen(QPen(
-            highlighted ? palette.color(QPalette::Highlight) : between(window, text, 0.45), 1));
+        painter.setPen(
+            QPen(highlighted ? palette.color(QPalette::Highlight) : mixed(window, text, 0.45), 1));
         painter.setBrush(palette.color(QPalette::Base));
         const QRectF inner = plate.place.adjusted(0.5, 0.5, -0.5, -0.5);
         painter.drawRoundedRect(inner, inner.height() / 2.5, inner.height() / 2.5);
@@ -197,8 +190,8 @@ void CanvasLine::paintAbove(QPainter& painter, const QPalette& palette) const {
 void CanvasLine::paint(QPainter& painter, const QPalette& palette) const {
     const bool highlighted = mBorderWidth > 1 || focused();
     const QColor colour = highlighted ? palette.color(QPalette::Highlight)
-                                      : between(palette.color(QPalette::Window),
-                                                palette.color(QPalette::WindowText), 0.6);
+                                      : mixed(palette.color(QPalette::Window),
+                                              palette.color(QPalette::WindowText), 0.6);
     if (focused()) {
         QColor halo = palette.color(QPalette::Active, QPalette::Highlight);
         halo.setAlphaF(0.35F);
@@ -246,7 +239,7 @@ void CanvasShape::paint(QPainter& painter, const QPalette& palette) const {
     const QRectF box(pixelPoint(mBounds.Left, mBounds.Top),
                      pixelPoint(mBounds.Left + mBounds.Width, mBounds.Top + mBounds.Height));
     const QColor outline =
-        between(palette.color(QPalette::Window), palette.color(QPalette::WindowText), 0.6);
+        mixed(palette.color(QPalette::Window), palette.color(QPalette::WindowText), 0.6);
     const QColor focus = palette.color(QPalette::Active, QPalette::Highlight);
     painter.setPen(QPen(focused() ? focus : outline, 1.2));
     painter.setBrush(focused() ? focus : palette.color(QPalette::Base));

@@ -6,6 +6,7 @@
 #include "frontends/qt/ElisionToolTip.h"
 #include "frontends/qt/KeyCodes.h"
 #include "frontends/qt/ShownText.h"
+#include "frontends/qt/mixed.h"
 
 #include <Zandor/qt/Text.h>
 
@@ -26,14 +27,6 @@ constexpr int border = 4;       ///< resizes the box; its outermost pixel is the
 constexpr int keyStep = 10;     ///< 150 twips
 constexpr int cornerReach = 14; ///< how far a corner reaches along its edges
 
-QColor blend(const QColor& one, const QColor& other, double share) {
-    const auto mix = [share](int a, int b) {
-        return static_cast<int>(std::lround(a + (b - a) * share));
-    };
-    return {mix(one.red(), other.red()), mix(one.green(), other.green()),
-            mix(one.blue(), other.blue())};
-}
-
 struct TitleColours {
     QColor back;
     QColor text;
@@ -49,8 +42,8 @@ TitleColours titleColours(const TabuletWidget& box) {
     if (focused)
         return {highlight, palette.color(QPalette::Active, QPalette::HighlightedText), highlight};
     if (box.isCurrent())
-        return {blend(window, highlight, 0.3), windowText, blend(window, highlight, 0.7)};
-    return {blend(window, windowText, 0.08), windowText, blend(window, windowText, 0.35)};
+        return {mixed(window, highlight, 0.3), windowText, mixed(window, highlight, 0.7)};
+    return {mixed(window, windowText, 0.08), windowText, mixed(window, windowText, 0.35)};
 }
 
 /// The cross in the title bar.
@@ -69,7 +62,7 @@ protected:
         const TitleColours colours = titleColours(mBox);
         if (underMouse()) {
             painter.setPen(Qt::NoPen);
-            painter.setBrush(blend(colours.back, colours.text, isDown() ? 0.35 : 0.2));
+            painter.setBrush(mixed(colours.back, colours.text, isDown() ? 0.35 : 0.2));
             painter.drawRoundedRect(rect(), 3, 3);
         }
         const QPointF middle = QRectF(rect()).center();
