@@ -163,7 +163,7 @@ void Door::clearNotes() {
 
 void Door::popUpOver(std::int16_t table) {
     control().lstTable_GotFocus(table);
-    if (isOpen()) control().PopupZandorMenu(0, 0, 0);
+    if (isOpen()) control().PopupZandorMenu(TalvikDBxZandor::menuSource::table, 0, 0);
 }
 
 std::unique_ptr<platform::MenuEntry>

@@ -28,7 +28,8 @@ void Comforts::offerRename() {
 }
 
 void Comforts::menuChecked(std::int16_t source) {
-    if (mRename) mRename->Visible(mFlags.HasTitleMenu && source == 0);
+    if (mRename)
+        mRename->Visible(mFlags.HasTitleMenu && source == TalvikDBxZandor::menuSource::table);
 }
 
 } // namespace zandor::comforts

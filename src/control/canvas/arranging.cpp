@@ -124,7 +124,7 @@ void Zandor::fraTable_MouseDown(std::int16_t, std::int16_t, float X, float Y) {
 void Zandor::fraTable_MouseUp(std::int16_t Button, std::int16_t, float X, float Y) {
     // Reports under the table list's name; hosts know it so.
     Guard(u"lstTable_MouseUp", [&] {
-        if (Button == platform::rightButton) PopupZandorMenu(1, X, Y);
+        if (Button == platform::rightButton) PopupZandorMenu(menuSource::canvas, X, Y);
     });
 }
 

@@ -67,7 +67,7 @@ void Zandor::lstTable_ColumnMouseMove(std::int16_t Index, const Ref<ColumnItem>&
 void Zandor::lstTable_ColumnMouseUp(std::int16_t, const Ref<ColumnItem>&, std::int16_t Button,
                                     std::int16_t) {
     Guard(u"lstTable_ColumnMouseUp", [&] {
-        if (Button == platform::rightButton) PopupZandorMenu(0, 0, 0);
+        if (Button == platform::rightButton) PopupZandorMenu(menuSource::table, 0, 0);
     });
 }
 

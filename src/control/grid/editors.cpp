@@ -46,7 +46,7 @@ void Zandor::EditCell() {
 
 void Zandor::sprColumn_MouseUp(std::int16_t Button, std::int16_t, float X, float Y) {
     Guard(u"sprColumn_MouseUp", [&] {
-        if (Button == platform::rightButton) PopupZandorMenu(2, X, Y);
+        if (Button == platform::rightButton) PopupZandorMenu(menuSource::grid, X, Y);
     });
 }
 

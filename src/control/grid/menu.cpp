@@ -25,7 +25,7 @@ void Zandor::CheckMenus(std::int16_t source, float X, float Y) {
         MakeGetValueFieldsInvisible();
         SwitchSpecialMenusOff();
 
-        if (source == 0) {
+        if (source == menuSource::table) {
             mnuTableDefinitionCopy->Enabled(true);
             mnuTableDefinitionPaste->Enabled(false);
             if (!mDragColumns.empty()) {
@@ -34,13 +34,13 @@ void Zandor::CheckMenus(std::int16_t source, float X, float Y) {
                     mnuTableDefinitionPaste->Enabled(true);
             }
             mnuTableDefinitionDelete->Enabled(true);
-        } else if (source == 1) {
+        } else if (source == menuSource::canvas) {
             Ref<clsJoinLine> hit;
             if (JoinHitTest(hit, X, Y)) {
                 mnuJoinShowDefinition->Enabled(true);
                 mnuJoinDelete->Enabled(true);
             }
-        } else if (source == 2) {
+        } else if (source == menuSource::grid) {
             mnuColumnDefinitionPaste->Enabled(!mDragColumns.empty());
             std::int32_t column = 0;
             std::int32_t row = 0;

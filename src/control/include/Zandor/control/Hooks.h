@@ -8,6 +8,13 @@ namespace TalvikDBxZandor {
 
 namespace platform = zandor::platform;
 
+/// What the menu opens over. No entry is made ready for any other number.
+namespace menuSource {
+inline constexpr std::int16_t table = 0;
+inline constexpr std::int16_t canvas = 1;
+inline constexpr std::int16_t grid = 2;
+} // namespace menuSource
+
 /// A join that has just been placed on the canvas, with the names that stand there.
 struct PlacedJoin {
     platform::String LeftTable;
@@ -28,8 +35,7 @@ struct Hooks {
     platform::PlainEvent Bound;          ///< the model is shown afresh
     std::function<void(std::int32_t column)> CellWritten; ///< of the grid, with its alignment
     std::function<void(const PlacedJoin& join, platform::Line& line)> JoinPlaced;
-    /// The entries of the menu are ready for the place that it opens over: 0 a table, 1 the canvas,
-    /// 2 the grid.
+    /// The entries of the menu are ready for what it opens over, one of menuSource.
     std::function<void(std::int16_t source)> MenuChecked;
 };
 
