@@ -287,7 +287,7 @@ void ZandorWidget::setInteger(platform::StringView procedure, int value,
                                       [&] { set(*mControl, platform::toInteger(value)); });
 }
 
-// The properties: one line a getter, one line a setter.
+// The properties of the table: one line a getter, one line a setter.
 
 #define FIELD_TEXT(name)                                                                           \
     QString ZandorWidget::name() const { return toQt(mControl->name); }                            \
@@ -311,64 +311,7 @@ void ZandorWidget::setInteger(platform::StringView procedure, int value,
                    [](Zandor& zandor, std::int16_t v) { zandor.name(v); });                        \
     }
 
-FIELD_TEXT(LNGJoinForm)
-FIELD_TEXT(LNGJoinLeftTable)
-FIELD_TEXT(LNGJoinLeftColumn)
-FIELD_TEXT(LNGJoinRightTable)
-FIELD_TEXT(LNGJoinRightColumn)
-FIELD_TEXT(LNGJoinType)
-FIELD_TEXT(LNGJoinTypeNormal)
-FIELD_TEXT(LNGJoinTypeLeftOuter)
-FIELD_TEXT(LNGJoinTypeRightOuter)
-FIELD_TEXT(LNGJoinTypeBothOuter)
-FIELD_TEXT(LNGJoinOk)
-FIELD_TEXT(LNGJoinCancel)
-FIELD_TEXT(LNGMnuShowJoinDef)
-FIELD_TEXT(LNGMnuDelJoin)
-FIELD_TEXT(LNGMnuCopyCol)
-FIELD_TEXT(LNGMnuCreateJoin)
-FIELD_TEXT(LNGMnuDelTable)
-FIELD_TEXT(LNGMnuPasteCol)
-FIELD_TEXT(LNGMnuDelCol)
-FIELD_TEXT(LNGSpreadField)
-FIELD_TEXT(LNGSpreadSynonym)
-FIELD_TEXT(LNGSpreadSort)
-FIELD_TEXT(LNGSpreadVisible)
-FIELD_TEXT(LNGSpreadCriteria)
-FIELD_TEXT(LNGSpreadOr)
-FIELD_FLAG(LNGMnuShowJoinDefVis)
-FIELD_FLAG(LNGMnuDelJoinVis)
-FIELD_FLAG(LNGMnuCopyColVis)
-FIELD_FLAG(LNGMnuCreateJoinVis)
-FIELD_FLAG(LNGMnuDelTableVis)
-FIELD_FLAG(LNGMnuPasteColVis)
-FIELD_FLAG(LNGMnuDelColVis)
-FIELD_FLAG(LNGMnuSep1Vis)
-FIELD_FLAG(LNGMnuSep2Vis)
-FIELD_NUMBER(MXHorzFrameSize)
-FIELD_NUMBER(MXVertFrameSize)
-FIELD_TEXT(DeletedTable)
-PROPERTY_NUMBER(DebugSwitch)
-PROPERTY_NUMBER(JoinModifyDisabled)
-PROPERTY_NUMBER(VisibleFrameLeft)
-PROPERTY_NUMBER(VisibleFrameTop)
-PROPERTY_NUMBER(HorizMaxScrollPos)
-PROPERTY_NUMBER(VertMaxScrollPos)
-PROPERTY_NUMBER(HorizontalScrollbarPos)
-PROPERTY_NUMBER(VerticalScrollbarPos)
-PROPERTY_FLAG(OnlyJoin)
-PROPERTY_FLAG(UseJoinTypeNormal)
-PROPERTY_FLAG(UseJoinTypeLeft)
-PROPERTY_FLAG(UseJoinTypeRight)
-PROPERTY_FLAG(UseJoinTypeBoth)
-PROPERTY_FLAG(UseJoinCompareOperatorEquals)
-PROPERTY_FLAG(UseJoinCompareOperatorNotEquals)
-PROPERTY_FLAG(UseJoinCompareOperatorLess)
-PROPERTY_FLAG(UseJoinCompareOperatorGreater)
-PROPERTY_FLAG(UseJoinCompareOperatorLessEquals)
-PROPERTY_FLAG(UseJoinCompareOperatorGreaterEquals)
-PROPERTY_FLAG(UseJoinCompareOperatorLE)
-PROPERTY_FLAG(UseJoinCompareOperatorGE)
+ZANDOR_WIDGET_PROPERTIES(FIELD_TEXT, FIELD_FLAG, FIELD_NUMBER, PROPERTY_FLAG, PROPERTY_NUMBER)
 
 ZandorWidget::ZandorModel ZandorWidget::model() const { return mControl->P_GET_Zandor(); }
 void ZandorWidget::setModel(const ZandorModel& model) { mControl->P_SET_Zandor(model); }

@@ -4,6 +4,7 @@
 #include <Zandor/comforts/Field.h>
 #include <Zandor/comforts/Flags.h>
 #include <Zandor/qt/export.h>
+#include <Zandor/qt/properties.h>
 
 #include <QMap>
 #include <QWidget>
@@ -37,71 +38,12 @@ class QtToolkit;
 /// not let any widget be deleted.
 class ZANDOR_WIDGETS_EXPORT ZandorWidget : public QWidget {
     Q_OBJECT
-    // One property a line.
-    // clang-format off
-    Q_PROPERTY(QString LNGJoinForm READ LNGJoinForm WRITE setLNGJoinForm)
-    Q_PROPERTY(QString LNGJoinLeftTable READ LNGJoinLeftTable WRITE setLNGJoinLeftTable)
-    Q_PROPERTY(QString LNGJoinLeftColumn READ LNGJoinLeftColumn WRITE setLNGJoinLeftColumn)
-    Q_PROPERTY(QString LNGJoinRightTable READ LNGJoinRightTable WRITE setLNGJoinRightTable)
-    Q_PROPERTY(QString LNGJoinRightColumn READ LNGJoinRightColumn WRITE setLNGJoinRightColumn)
-    Q_PROPERTY(QString LNGJoinType READ LNGJoinType WRITE setLNGJoinType)
-    Q_PROPERTY(QString LNGJoinTypeNormal READ LNGJoinTypeNormal WRITE setLNGJoinTypeNormal)
-    Q_PROPERTY(QString LNGJoinTypeLeftOuter READ LNGJoinTypeLeftOuter WRITE setLNGJoinTypeLeftOuter)
-    Q_PROPERTY(QString LNGJoinTypeRightOuter READ LNGJoinTypeRightOuter WRITE setLNGJoinTypeRightOuter)
-    Q_PROPERTY(QString LNGJoinTypeBothOuter READ LNGJoinTypeBothOuter WRITE setLNGJoinTypeBothOuter)
-    Q_PROPERTY(QString LNGJoinOk READ LNGJoinOk WRITE setLNGJoinOk)
-    Q_PROPERTY(QString LNGJoinCancel READ LNGJoinCancel WRITE setLNGJoinCancel)
-    Q_PROPERTY(QString LNGMnuShowJoinDef READ LNGMnuShowJoinDef WRITE setLNGMnuShowJoinDef)
-    Q_PROPERTY(QString LNGMnuDelJoin READ LNGMnuDelJoin WRITE setLNGMnuDelJoin)
-    Q_PROPERTY(QString LNGMnuCopyCol READ LNGMnuCopyCol WRITE setLNGMnuCopyCol)
-    Q_PROPERTY(QString LNGMnuCreateJoin READ LNGMnuCreateJoin WRITE setLNGMnuCreateJoin)
-    Q_PROPERTY(QString LNGMnuDelTable READ LNGMnuDelTable WRITE setLNGMnuDelTable)
-    Q_PROPERTY(QString LNGMnuPasteCol READ LNGMnuPasteCol WRITE setLNGMnuPasteCol)
-    Q_PROPERTY(QString LNGMnuDelCol READ LNGMnuDelCol WRITE setLNGMnuDelCol)
-    Q_PROPERTY(QString LNGSpreadField READ LNGSpreadField WRITE setLNGSpreadField)
-    Q_PROPERTY(QString LNGSpreadSynonym READ LNGSpreadSynonym WRITE setLNGSpreadSynonym)
-    Q_PROPERTY(QString LNGSpreadSort READ LNGSpreadSort WRITE setLNGSpreadSort)
-    Q_PROPERTY(QString LNGSpreadVisible READ LNGSpreadVisible WRITE setLNGSpreadVisible)
-    Q_PROPERTY(QString LNGSpreadCriteria READ LNGSpreadCriteria WRITE setLNGSpreadCriteria)
-    Q_PROPERTY(QString LNGSpreadOr READ LNGSpreadOr WRITE setLNGSpreadOr)
-    Q_PROPERTY(bool LNGMnuShowJoinDefVis READ LNGMnuShowJoinDefVis WRITE setLNGMnuShowJoinDefVis)
-    Q_PROPERTY(bool LNGMnuDelJoinVis READ LNGMnuDelJoinVis WRITE setLNGMnuDelJoinVis)
-    Q_PROPERTY(bool LNGMnuCopyColVis READ LNGMnuCopyColVis WRITE setLNGMnuCopyColVis)
-    Q_PROPERTY(bool LNGMnuCreateJoinVis READ LNGMnuCreateJoinVis WRITE setLNGMnuCreateJoinVis)
-    Q_PROPERTY(bool LNGMnuDelTableVis READ LNGMnuDelTableVis WRITE setLNGMnuDelTableVis)
-    Q_PROPERTY(bool LNGMnuPasteColVis READ LNGMnuPasteColVis WRITE setLNGMnuPasteColVis)
-    Q_PROPERTY(bool LNGMnuDelColVis READ LNGMnuDelColVis WRITE setLNGMnuDelColVis)
-    Q_PROPERTY(bool LNGMnuSep1Vis READ LNGMnuSep1Vis WRITE setLNGMnuSep1Vis)
-    Q_PROPERTY(bool LNGMnuSep2Vis READ LNGMnuSep2Vis WRITE setLNGMnuSep2Vis)
-    Q_PROPERTY(int MXHorzFrameSize READ MXHorzFrameSize WRITE setMXHorzFrameSize)
-    Q_PROPERTY(int MXVertFrameSize READ MXVertFrameSize WRITE setMXVertFrameSize)
-    Q_PROPERTY(QString DeletedTable READ DeletedTable WRITE setDeletedTable)
-    Q_PROPERTY(int DebugSwitch READ DebugSwitch WRITE setDebugSwitch)
-    Q_PROPERTY(int JoinModifyDisabled READ JoinModifyDisabled WRITE setJoinModifyDisabled)
-    Q_PROPERTY(int VisibleFrameLeft READ VisibleFrameLeft WRITE setVisibleFrameLeft)
-    Q_PROPERTY(int VisibleFrameTop READ VisibleFrameTop WRITE setVisibleFrameTop)
+    ZANDOR_WIDGET_PROPERTIES(ZANDOR_DECLARE_TEXT, ZANDOR_DECLARE_FLAG, ZANDOR_DECLARE_NUMBER,
+                             ZANDOR_DECLARE_FLAG, ZANDOR_DECLARE_NUMBER)
     Q_PROPERTY(ZandorModel Zandor READ model WRITE setModel)
-    Q_PROPERTY(int HorizMaxScrollPos READ HorizMaxScrollPos WRITE setHorizMaxScrollPos)
-    Q_PROPERTY(int VertMaxScrollPos READ VertMaxScrollPos WRITE setVertMaxScrollPos)
-    Q_PROPERTY(int HorizontalScrollbarPos READ HorizontalScrollbarPos WRITE setHorizontalScrollbarPos)
-    Q_PROPERTY(int VerticalScrollbarPos READ VerticalScrollbarPos WRITE setVerticalScrollbarPos)
-    Q_PROPERTY(bool OnlyJoin READ OnlyJoin WRITE setOnlyJoin)
-    Q_PROPERTY(bool UseJoinTypeNormal READ UseJoinTypeNormal WRITE setUseJoinTypeNormal)
-    Q_PROPERTY(bool UseJoinTypeLeft READ UseJoinTypeLeft WRITE setUseJoinTypeLeft)
-    Q_PROPERTY(bool UseJoinTypeRight READ UseJoinTypeRight WRITE setUseJoinTypeRight)
-    Q_PROPERTY(bool UseJoinTypeBoth READ UseJoinTypeBoth WRITE setUseJoinTypeBoth)
-    Q_PROPERTY(bool UseJoinCompareOperatorEquals READ UseJoinCompareOperatorEquals WRITE setUseJoinCompareOperatorEquals)
-    Q_PROPERTY(bool UseJoinCompareOperatorNotEquals READ UseJoinCompareOperatorNotEquals WRITE setUseJoinCompareOperatorNotEquals)
-    Q_PROPERTY(bool UseJoinCompareOperatorLess READ UseJoinCompareOperatorLess WRITE setUseJoinCompareOperatorLess)
-    Q_PROPERTY(bool UseJoinCompareOperatorGreater READ UseJoinCompareOperatorGreater WRITE setUseJoinCompareOperatorGreater)
-    Q_PROPERTY(bool UseJoinCompareOperatorLessEquals READ UseJoinCompareOperatorLessEquals WRITE setUseJoinCompareOperatorLessEquals)
-    Q_PROPERTY(bool UseJoinCompareOperatorGreaterEquals READ UseJoinCompareOperatorGreaterEquals WRITE setUseJoinCompareOperatorGreaterEquals)
-    Q_PROPERTY(bool UseJoinCompareOperatorLE READ UseJoinCompareOperatorLE WRITE setUseJoinCompareOperatorLE)
-    Q_PROPERTY(bool UseJoinCompareOperatorGE READ UseJoinCompareOperatorGE WRITE setUseJoinCompareOperatorGE)
     Q_PROPERTY(ZDJoin lastjoin READ lastjoin)
     Q_PROPERTY(ZDTable activetable READ activetable)
     Q_PROPERTY(ZDColumn ActiveColumn READ ActiveColumn)
-    // clang-format on
 
 public:
     using ZandorModel = zandor::platform::Ref<TalvikZandorLib::Zandor>;
@@ -156,122 +98,6 @@ public:
     using QWidget::repaint;
     using QWidget::update;
 
-    QString LNGJoinForm() const;
-    void setLNGJoinForm(const QString& value);
-    QString LNGJoinLeftTable() const;
-    void setLNGJoinLeftTable(const QString& value);
-    QString LNGJoinLeftColumn() const;
-    void setLNGJoinLeftColumn(const QString& value);
-    QString LNGJoinRightTable() const;
-    void setLNGJoinRightTable(const QString& value);
-    QString LNGJoinRightColumn() const;
-    void setLNGJoinRightColumn(const QString& value);
-    QString LNGJoinType() const;
-    void setLNGJoinType(const QString& value);
-    QString LNGJoinTypeNormal() const;
-    void setLNGJoinTypeNormal(const QString& value);
-    QString LNGJoinTypeLeftOuter() const;
-    void setLNGJoinTypeLeftOuter(const QString& value);
-    QString LNGJoinTypeRightOuter() const;
-    void setLNGJoinTypeRightOuter(const QString& value);
-    QString LNGJoinTypeBothOuter() const;
-    void setLNGJoinTypeBothOuter(const QString& value);
-    QString LNGJoinOk() const;
-    void setLNGJoinOk(const QString& value);
-    QString LNGJoinCancel() const;
-    void setLNGJoinCancel(const QString& value);
-    QString LNGMnuShowJoinDef() const;
-    void setLNGMnuShowJoinDef(const QString& value);
-    QString LNGMnuDelJoin() const;
-    void setLNGMnuDelJoin(const QString& value);
-    QString LNGMnuCopyCol() const;
-    void setLNGMnuCopyCol(const QString& value);
-    QString LNGMnuCreateJoin() const;
-    void setLNGMnuCreateJoin(const QString& value);
-    QString LNGMnuDelTable() const;
-    void setLNGMnuDelTable(const QString& value);
-    QString LNGMnuPasteCol() const;
-    void setLNGMnuPasteCol(const QString& value);
-    QString LNGMnuDelCol() const;
-    void setLNGMnuDelCol(const QString& value);
-    QString LNGSpreadField() const;
-    void setLNGSpreadField(const QString& value);
-    QString LNGSpreadSynonym() const;
-    void setLNGSpreadSynonym(const QString& value);
-    QString LNGSpreadSort() const;
-    void setLNGSpreadSort(const QString& value);
-    QString LNGSpreadVisible() const;
-    void setLNGSpreadVisible(const QString& value);
-    QString LNGSpreadCriteria() const;
-    void setLNGSpreadCriteria(const QString& value);
-    QString LNGSpreadOr() const;
-    void setLNGSpreadOr(const QString& value);
-    bool LNGMnuShowJoinDefVis() const;
-    void setLNGMnuShowJoinDefVis(bool value);
-    bool LNGMnuDelJoinVis() const;
-    void setLNGMnuDelJoinVis(bool value);
-    bool LNGMnuCopyColVis() const;
-    void setLNGMnuCopyColVis(bool value);
-    bool LNGMnuCreateJoinVis() const;
-    void setLNGMnuCreateJoinVis(bool value);
-    bool LNGMnuDelTableVis() const;
-    void setLNGMnuDelTableVis(bool value);
-    bool LNGMnuPasteColVis() const;
-    void setLNGMnuPasteColVis(bool value);
-    bool LNGMnuDelColVis() const;
-    void setLNGMnuDelColVis(bool value);
-    bool LNGMnuSep1Vis() const;
-    void setLNGMnuSep1Vis(bool value);
-    bool LNGMnuSep2Vis() const;
-    void setLNGMnuSep2Vis(bool value);
-    int MXHorzFrameSize() const;
-    void setMXHorzFrameSize(int value);
-    int MXVertFrameSize() const;
-    void setMXVertFrameSize(int value);
-    QString DeletedTable() const;
-    void setDeletedTable(const QString& value);
-    int DebugSwitch() const;
-    void setDebugSwitch(int value);
-    int JoinModifyDisabled() const;
-    void setJoinModifyDisabled(int value);
-    int VisibleFrameLeft() const;
-    void setVisibleFrameLeft(int value);
-    int VisibleFrameTop() const;
-    void setVisibleFrameTop(int value);
-    int HorizMaxScrollPos() const;
-    void setHorizMaxScrollPos(int value);
-    int VertMaxScrollPos() const;
-    void setVertMaxScrollPos(int value);
-    int HorizontalScrollbarPos() const;
-    void setHorizontalScrollbarPos(int value);
-    int VerticalScrollbarPos() const;
-    void setVerticalScrollbarPos(int value);
-    bool OnlyJoin() const;
-    void setOnlyJoin(bool value);
-    bool UseJoinTypeNormal() const;
-    void setUseJoinTypeNormal(bool value);
-    bool UseJoinTypeLeft() const;
-    void setUseJoinTypeLeft(bool value);
-    bool UseJoinTypeRight() const;
-    void setUseJoinTypeRight(bool value);
-    bool UseJoinTypeBoth() const;
-    void setUseJoinTypeBoth(bool value);
-    bool UseJoinCompareOperatorEquals() const;
-    void setUseJoinCompareOperatorEquals(bool value);
-    bool UseJoinCompareOperatorNotEquals() const;
-    void setUseJoinCompareOperatorNotEquals(bool value);
-    bool UseJoinCompareOperatorLess() const;
-    void setUseJoinCompareOperatorLess(bool value);
-    bool UseJoinCompareOperatorGreater() const;
-    void setUseJoinCompareOperatorGreater(bool value);
-    bool UseJoinCompareOperatorLessEquals() const;
-    void setUseJoinCompareOperatorLessEquals(bool value);
-    bool UseJoinCompareOperatorGreaterEquals() const;
-    void setUseJoinCompareOperatorGreaterEquals(bool value);
-    bool UseJoinCompareOperatorLE() const;
-    void setUseJoinCompareOperatorLE(bool value);
-    bool UseJoinCompareOperatorGE() const;
-    void setUseJoinCompareOperatorGE(bool value);
     /// The query model; never nothing.
     ZandorModel model() const;
     void setModel(const ZandorModel& model);
