@@ -42,7 +42,7 @@ void DrawingArea::setOptions(const QVariantMap& options) {
 void DrawingArea::showFindings(const model::Findings& findings) {
     mFindings.clear();
     for (const model::Finding& finding : findings)
-        if (finding.kind == model::Finding::Kind::badCriterion)
+        if (finding.row > 0)
             mFindings.push_back(
                 {finding.definition, finding.row, fromQt(inWords(finding.message))});
     mControl->setFindings(mFindings);
@@ -116,8 +116,8 @@ void DrawingArea::resizeEvent(QResizeEvent* event) {
     mControl->resize(event->size());
 }
 
-/// Lets the canvas reach to a table that was pulled behind the grid. It does not become smaller, for
-/// what is seen of it would move under the user's hands.
+/// Lets the canvas reach to a table that was pulled behind the grid. It does not become smaller,
+/// for what is seen of it would move under the user's hands.
 void DrawingArea::growCanvas() {
     const std::pair before(mControl->MXHorzFrameSize(), mControl->MXVertFrameSize());
     fitCanvas();

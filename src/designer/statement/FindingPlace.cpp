@@ -76,8 +76,7 @@ void showPlace(ZandorWidget& control, model::Query& query, const model::Finding&
         control.SetCurrentTable(toQt(table->Name()));
     }
     // The cell comes last, for it is where one goes on typing.
-    if (finding.kind == model::Finding::Kind::badCriterion)
-        control.showCell(toQt(finding.definition), finding.row);
+    if (finding.row > 0) control.showCell(toQt(finding.definition), finding.row);
 }
 
 } // namespace zandor::designer

@@ -14,6 +14,19 @@ namespace {
 
 constexpr int deepestNesting = 100;
 
+/// Whether somebody may have meant a pattern: "100 %" is no such text.
+bool looksLikePattern(StringView text) {
+    const auto isWord = [&](std::size_t at) {
+        if (at >= text.size()) return false;
+        const char16_t c = text[at];
+        return (c >= u'A' && c <= u'Z') || (c >= u'a' && c <= u'z') || c >= 0x80;
+    };
+    if (text.find(u'*') != StringView::npos) return true;
+    for (std::size_t at = text.find(u'%'); at != StringView::npos; at = text.find(u'%', at + 1))
+        if (isWord(at + 1) || (at > 0 && isWord(at - 1))) return true;
+    return false;
+}
+
 class Parser {
 public:
     Parser(StringView text, std::vector<Token> tokens, const sql::ColumnRef& subject,
@@ -28,6 +41,7 @@ public:
         } catch (Error& error) {
             mReading.condition = {};
             mReading.error = std::move(error);
+            mReading.warning.reset();
             keepKnown();
         }
         return std::move(mReading);
@@ -229,6 +243,8 @@ private:
         if (typed.empty()) failMissing(first);
         const auto value = literal(typed, mSubjectColumn.type);
         if (!value) failValue(first);
+        if (value->type == ColumnType::Text && !mReading.warning && looksLikePattern(typed))
+            mReading.warning = Error{first.begin, say<MessageCode::patternWithoutLike>()};
         return sql::make(*value);
     }
 
@@ -384,7 +400,7 @@ private:
 Reading read(StringView text, const sql::ColumnRef& subject, const Resolver& resolver,
              const References& known) {
     auto scanned = tokens(text);
-    if (auto* error = std::get_if<Error>(&scanned)) return {{}, std::move(*error), known};
+    if (auto* error = std::get_if<Error>(&scanned)) return {{}, std::move(*error), {}, known};
     return Parser(text, std::move(std::get<std::vector<Token>>(scanned)), subject, resolver, known)
         .read();
 }

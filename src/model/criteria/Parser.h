@@ -31,7 +31,8 @@ public:
 struct Reading {
     sql::Node condition; ///< nothing for a blank text and on an error
     std::optional<Error> error;
-    References references; ///< on an error those before it, and the known ones behind it
+    std::optional<Error> warning; ///< it can be read, and may mean something else than it looks
+    References references;        ///< on an error those before it, and the known ones behind it
 };
 
 /// Reads the condition that a text sets to a column. Whatever is typed becomes a tree of values,

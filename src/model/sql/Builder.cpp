@@ -87,12 +87,14 @@ private:
                       std::int16_t row, const RowCriterium& criterium) {
         auto reading =
             criteria::read(criterium.Criterium(), subject, mColumns, criterium.references());
-        if (reading.error)
-            report(Finding::Kind::badCriterion, definition,
+        const auto reportAt = [&](Finding::Kind kind, criteria::Error& found) {
+            report(kind, definition,
                    say<MessageCode::badCriterion>(subject.table + u"." + subject.column,
-                                                  reading.error->position + 1,
-                                                  std::move(reading.error->message)),
-                   row, reading.error->position);
+                                                  found.position + 1, std::move(found.message)),
+                   row, found.position);
+        };
+        if (reading.error) reportAt(Finding::Kind::badCriterion, *reading.error);
+        if (reading.warning) reportAt(Finding::Kind::patternWithoutLike, *reading.warning);
         if (reading.condition) mRows[row].push_back(std::move(reading.condition));
     }
 

@@ -80,10 +80,12 @@ TEST(TheModelsWords, AreTranslatedAroundTheNamesInThem) {
     ASSERT_EQ(findings.size(), 1u);
     EXPECT_EQ(inWords(findings[0].message).toStdString(),
               "<No join connects items with orders, so that every row of one comes with every row "
-              "of the other: draw a join between them, or delete one.>");
+              "of the other: draw a join between them, add the table that lies between, or delete "
+              "one.>");
     EXPECT_EQ(findings[0].text(),
               u"No join connects items with orders, so that every row of one comes with every row "
-              u"of the other: draw a join between them, or delete one.");
+              u"of the other: draw a join between them, add the table that lies between, or delete "
+              u"one.");
 }
 
 TEST(TheModelsWords, AreTranslatedWithinOneAnother) {

@@ -144,6 +144,7 @@ std::string nameOf(model::Finding::Kind kind) {
     case Kind::sortOnAllColumns: return "sortOnAllColumns";
     case Kind::duplicateOutputName: return "duplicateOutputName";
     case Kind::cartesianProduct: return "cartesianProduct";
+    case Kind::patternWithoutLike: return "patternWithoutLike";
     case Kind::incomparableJoin: return "incomparableJoin";
     case Kind::ambiguousOuterJoin: return "ambiguousOuterJoin";
     case Kind::badCriterion: return "badCriterion";

@@ -92,7 +92,22 @@ TEST_F(AValue, OfATimestampColumnIsADayWithOrWithoutATime) {
     EXPECT_EQ(condition(u"moment", u"2024-05-01"), "t.moment = '2024-05-01 00:00:00'");
     EXPECT_EQ(condition(u"moment", u"#2024-5-1 1:30#"), "t.moment = '2024-05-01 01:30:00'");
     EXPECT_EQ(condition(u"moment", u"2024-05-01 25:00"),
-              "At character 1: this is no date and time, write it like 2024-12-31 23:59.");
+              "At character 1: this is no date and time, write it like 2024-12-31 or "
+              "2024-12-31 23:59.");
+}
+
+TEST_F(AValue, ThatLooksLikeAPatternIsWarnedOf) {
+    for (const auto* text : {u"berlin*", u"*", u"%berlin%", u"<> 50%off", u"5 Or In (a, b*)"})
+        EXPECT_TRUE(read(u"text", text).warning) << platform::toUtf8(text);
+    EXPECT_TRUE(read(u"anything", u"berlin*").warning);
+    EXPECT_EQ(read(u"text", u"a Or b*").warning->position, 5U);
+    for (const auto* text : {u"100%", u"100 %", u"'berlin*'", u"Like berlin*", u"What?", u"a_b"})
+        EXPECT_FALSE(read(u"text", text).warning) << platform::toUtf8(text);
+}
+
+TEST_F(AValue, ThatCannotBeReadIsNotWarnedOfBesides) {
+    EXPECT_FALSE(read(u"text", u"berlin* )").warning);
+    EXPECT_FALSE(read(u"whole", u"5*").warning);
 }
 
 TEST_F(AValue, OfABooleanColumnIsOneOfSixWords) {

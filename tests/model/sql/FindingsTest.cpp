@@ -228,6 +228,6 @@ TEST_F(AFinding, IsOneLineWhateverIsInTheNames) {
     added(u"c\r\n\u2028d");
     EXPECT_EQ(toUtf8(only().text()),
               "No join connects c   d with a b, so that every row of one comes "
-              "with every row of the other: draw a join between them, or "
-              "delete one.");
+              "with every row of the other: draw a join between them, add "
+              "the table that lies between, or delete one.");
 }

@@ -17,6 +17,7 @@ struct Finding {
         incomparableJoin,
         ambiguousOuterJoin,
         badCriterion,
+        patternWithoutLike,
         nameNotCarried,
         notInDialect,
     };
@@ -27,7 +28,7 @@ struct Finding {
     platform::String table{};
     platform::String join{};
     platform::String definition{};
-    std::int16_t row = 0;     ///< grid row of a criterion
+    std::int16_t row = 0;     ///< grid row of a criterion; 0 where it is about none
     std::size_t position = 0; ///< in the criterion's text, UTF-16 code units from 0
 
     /// The message in English: one line.
