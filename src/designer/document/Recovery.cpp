@@ -15,7 +15,7 @@ namespace zandor::designer {
 namespace {
 
 class Recovery {
-    Q_DECLARE_TR_FUNCTIONS(designer::Recovery)
+    Q_DECLARE_TR_FUNCTIONS(zandor::designer::Recovery)
 
 public:
     enum class Answer { recover, discard, later };

@@ -56,7 +56,7 @@ bool sameObjects(const std::vector<Placed>& gone, const std::vector<Placed>& com
 }
 
 class StepName {
-    Q_DECLARE_TR_FUNCTIONS(designer::StepName)
+    Q_DECLARE_TR_FUNCTIONS(zandor::designer::StepName)
 
 public:
     static QString of(const Change& change);

@@ -35,7 +35,7 @@ std::optional<QVariant> answerValue(const Parameter& parameter, const QString& t
 }
 
 class Words {
-    Q_DECLARE_TR_FUNCTIONS(designer::Question)
+    Q_DECLARE_TR_FUNCTIONS(zandor::designer::Question)
 };
 
 QString wanted(const Parameter& use) {

@@ -305,82 +305,6 @@
         <translation>Die Abfrage hat keine Tabellen: Fügen Sie zuerst eine hinzu.</translation>
     </message>
     <message>
-        <source>An output column has no column of the query: delete it.</source>
-        <translation>Zu einer Ausgabespalte gehört keine Spalte der Abfrage: Löschen Sie sie.</translation>
-    </message>
-    <message>
-        <source>%1.* cannot be sorted: sort one of its columns.</source>
-        <translation>%1.* lässt sich nicht sortieren: Sortieren Sie nach einer ihrer Spalten.</translation>
-    </message>
-    <message>
-        <source>%1.* cannot have a criterion: give one to one of its columns.</source>
-        <translation>%1.* kann kein Kriterium haben: Geben Sie es einer ihrer Spalten.</translation>
-    </message>
-    <message>
-        <source>Two output columns are named %1: give one of them a synonym.</source>
-        <translation>Zwei Ausgabespalten heißen %1: Geben Sie einer von ihnen ein Synonym.</translation>
-    </message>
-    <message>
-        <source>%1 and %2 hold different kinds of values: the join will find nothing or fail.</source>
-        <translation>%1 und %2 enthalten Werte verschiedener Art: Die Verknüpfung wird nichts finden oder scheitern.</translation>
-    </message>
-    <message>
-        <source>The outer join between %1 and %2 has no effect: normal joins connect them too.</source>
-        <translation>Die äußere Verknüpfung zwischen %1 und %2 bewirkt nichts: Normale Verknüpfungen verbinden sie ebenfalls.</translation>
-    </message>
-    <message>
-        <source>The outer joins around %1 and %2 contradict each other: the one drawn first decides which rows are kept.</source>
-        <translation>Die äußeren Verknüpfungen um %1 und %2 widersprechen einander: Die zuerst gezeichnete bestimmt, welche Zeilen bleiben.</translation>
-    </message>
-    <message>
-        <source>The outer joins around %1 can be read in several ways: change the type of one of them.</source>
-        <translation>Die äußeren Verknüpfungen um %1 lassen sich verschieden verstehen: Ändern Sie die Art einer von ihnen.</translation>
-    </message>
-    <message>
-        <source>No join connects %1 with %2: every row of one comes with every row of the other.</source>
-        <translation>Keine Verknüpfung verbindet %1 mit %2: Jede Zeile der einen kommt mit jeder Zeile der anderen.</translation>
-    </message>
-    <message>
-        <source>MySQL/MariaDB has no full outer join: make it a left or a right one.</source>
-        <translation>MySQL/MariaDB kennt keine beidseitige äußere Verknüpfung: Machen Sie eine linke oder rechte daraus.</translation>
-    </message>
-    <message>
-        <source>PostgreSQL joins both outer only on equal columns: use the operator =, or make it a left or a right outer join.</source>
-        <translation>PostgreSQL verknüpft beidseitig außen nur bei gleichen Spalten: Nehmen Sie den Operator = oder eine linke oder rechte äußere Verknüpfung.</translation>
-    </message>
-    <message>
-        <source>SQLite takes about 900 conditions in a row: use In for a long list.</source>
-        <translation>SQLite nimmt etwa 900 Bedingungen hintereinander: Nehmen Sie In für eine lange Liste.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry an empty name.</source>
-        <translation>%1 nimmt keinen leeren Namen an.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry a name with the character zero in it.</source>
-        <translation>%1 nimmt keinen Namen an, der das Zeichen null enthält.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry a name with half a character in it.</source>
-        <translation>%1 nimmt keinen Namen an, der ein halbes Zeichen enthält.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 bytes.</source>
-        <translation>%1 nimmt den Namen „%2“ nicht an, er hat mehr als %3 Bytes.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 characters.</source>
-        <translation>%1 nimmt den Namen „%2“ nicht an, er hat mehr als %3 Zeichen.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has a character beyond U+FFFF.</source>
-        <translation>%1 nimmt den Namen „%2“ nicht an, er enthält ein Zeichen jenseits von U+FFFF.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it ends with a blank.</source>
-        <translation>%1 nimmt den Namen „%2“ nicht an, er endet mit einem Leerzeichen.</translation>
-    </message>
-    <message>
         <source>%1: At character %2: %3.</source>
         <translation>%1: Bei Zeichen %2: %3.</translation>
     </message>
@@ -685,10 +609,6 @@
         <translation>das ist keine Uhrzeit, schreiben Sie sie wie 23:59</translation>
     </message>
     <message>
-        <source>this is no date and time, write it like 2024-12-31 23:59</source>
-        <translation>das ist nicht Datum und Uhrzeit, schreiben Sie beides wie 2024-12-31 23:59</translation>
-    </message>
-    <message>
         <source>write true or false here</source>
         <translation>schreiben Sie hier true oder false</translation>
     </message>
@@ -729,10 +649,6 @@
         <translation>Die Ausgabe kann nicht geschrieben werden</translation>
     </message>
     <message>
-        <source>The rows cannot be written</source>
-        <translation>Die Zeilen können nicht geschrieben werden</translation>
-    </message>
-    <message>
         <source>check the path</source>
         <translation>prüfen Sie den Pfad</translation>
     </message>
@@ -756,12 +672,297 @@
         <source>try again, or choose another folder</source>
         <translation>versuchen Sie es noch einmal oder wählen Sie einen anderen Ordner</translation>
     </message>
-</context>
-<context>
-    <name>QObject</name>
     <message>
-        <source>Remove the table</source>
-        <translation>Tabelle entfernen</translation>
+        <source>choose a shorter name</source>
+        <translation>wählen Sie einen kürzeren Namen</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be used: %2</source>
+        <translation>Die Datei „%1“ kann nicht verwendet werden: %2</translation>
+    </message>
+    <message>
+        <source>%1. %2.</source>
+        <translation>%1. %2.</translation>
+    </message>
+    <message>
+        <source>Mend the file there, or restore it from a copy</source>
+        <translation>Berichtigen Sie die Datei an dieser Stelle oder stellen Sie sie aus einer Kopie wieder her</translation>
+    </message>
+    <message>
+        <source>Choose a query file</source>
+        <translation>Wählen Sie eine Abfragedatei</translation>
+    </message>
+    <message>
+        <source>Open the file with a newer version of this program</source>
+        <translation>Öffnen Sie die Datei mit einer neueren Version dieses Programms</translation>
+    </message>
+    <message>
+        <source>Type that text afresh and save again</source>
+        <translation>Tippen Sie diesen Text neu und speichern Sie noch einmal</translation>
+    </message>
+    <message>
+        <source>The query could not be read again: %1</source>
+        <translation>Die Abfrage konnte nicht wieder gelesen werden: %1</translation>
+    </message>
+    <message>
+        <source>The query would not be the same when read again. Report this, please.</source>
+        <translation>Die Abfrage wäre nach dem Wiederlesen nicht dieselbe. Bitte melden Sie das.</translation>
+    </message>
+    <message>
+        <source>The file</source>
+        <translation>Die Datei</translation>
+    </message>
+    <message>
+        <source>Line %1, column %2: %3</source>
+        <translation>Zeile %1, Spalte %2: %3</translation>
+    </message>
+    <message>
+        <source>a number is too large</source>
+        <translation>eine Zahl ist zu groß</translation>
+    </message>
+    <message>
+        <source>%1 stands there twice</source>
+        <translation>%1 steht dort zweimal</translation>
+    </message>
+    <message>
+        <source>%1 is longer than %2 characters</source>
+        <translation>%1 ist länger als %2 Zeichen</translation>
+    </message>
+    <message>
+        <source>%1 has a NUL character in it</source>
+        <translation>%1 enthält ein NUL-Zeichen</translation>
+    </message>
+    <message>
+        <source>%1 is nested more than %2 levels deep</source>
+        <translation>%1 ist mehr als %2 Ebenen tief verschachtelt</translation>
+    </message>
+    <message>
+        <source>%1 is one value too many: a file may have %2</source>
+        <translation>%1 ist ein Wert zu viel: Eine Datei darf %2 haben</translation>
+    </message>
+    <message>
+        <source>%1 is larger than %2 MiB</source>
+        <translation>%1 ist größer als %2 MiB</translation>
+    </message>
+    <message>
+        <source>%1 is not an object</source>
+        <translation>%1 ist kein Objekt</translation>
+    </message>
+    <message>
+        <source>%1 is not a text</source>
+        <translation>%1 ist kein Text</translation>
+    </message>
+    <message>
+        <source>%1 is neither a text nor null</source>
+        <translation>%1 ist weder ein Text noch null</translation>
+    </message>
+    <message>
+        <source>%1 is not true or false</source>
+        <translation>%1 ist weder true noch false</translation>
+    </message>
+    <message>
+        <source>%1 is not a list</source>
+        <translation>%1 ist keine Liste</translation>
+    </message>
+    <message>
+        <source>%1 has more than %2 entries</source>
+        <translation>%1 hat mehr als %2 Einträge</translation>
+    </message>
+    <message>
+        <source>%1 is missing</source>
+        <translation>%1 fehlt</translation>
+    </message>
+    <message>
+        <source>%1 is not a whole number from %2 to %3</source>
+        <translation>%1 ist keine ganze Zahl von %2 bis %3</translation>
+    </message>
+    <message>
+        <source>%1 is &quot;%2&quot; and none of %3</source>
+        <translation>%1 ist „%2“ und keines von %3</translation>
+    </message>
+    <message>
+        <source>%1 makes the columns of all tables more than %2</source>
+        <translation>%1 bringt die Spalten aller Tabellen auf mehr als %2</translation>
+    </message>
+    <message>
+        <source>%1 is no length of a name in the text</source>
+        <translation>%1 ist keine Länge eines Namens im Text</translation>
+    </message>
+    <message>
+        <source>%1 is not &quot;%2&quot;</source>
+        <translation>%1 ist nicht „%2“</translation>
+    </message>
+    <message>
+        <source>%1 is less than 1</source>
+        <translation>%1 ist kleiner als 1</translation>
+    </message>
+    <message>
+        <source>%1 is %2 and newer than %3, the newest that can be read here</source>
+        <translation>%1 ist %2 und neuer als %3, die neueste Version, die sich hier lesen lässt</translation>
+    </message>
+    <message>
+        <source>%1 has half a character in it (an unpaired surrogate)</source>
+        <translation>%1 enthält ein halbes Zeichen (ein Surrogat ohne Gegenstück)</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>The table of an output column is no longer in the query: delete the output column, or choose another field for it.</source>
+        <translation>Die Tabelle einer Ausgabespalte ist nicht mehr in der Abfrage: Löschen Sie die Ausgabespalte oder wählen Sie ein anderes Feld für sie.</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns and cannot be sorted by: add the column that is to decide, and sort by that.</source>
+        <translation>%1.* steht für alle Spalten, danach lässt sich nicht sortieren: Fügen Sie die Spalte hinzu, die entscheiden soll, und sortieren Sie nach ihr.</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns and cannot have a criterion: add the column that is meant, and write the criterion there.</source>
+        <translation>%1.* steht für alle Spalten und kann kein Kriterium haben: Fügen Sie die Spalte hinzu, die gemeint ist, und schreiben Sie das Kriterium dorthin.</translation>
+    </message>
+    <message>
+        <source>Two output columns are named %1, so that nobody can tell them apart: give one of them a synonym.</source>
+        <translation>Zwei Ausgabespalten heißen %1, sodass niemand sie unterscheiden kann: Geben Sie einer von ihnen ein Synonym.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 hold different kinds of values, so that their join finds nothing or fails: join columns that hold the same.</source>
+        <translation>%1 und %2 enthalten verschiedene Arten von Werten, sodass ihre Verknüpfung nichts findet oder scheitert: Verknüpfen Sie Spalten, die Werte derselben Art enthalten.</translation>
+    </message>
+    <message>
+        <source>The outer join between %1 and %2 keeps no more rows than a normal one, for normal joins connect these tables too: make it a normal join, or make the others outer ones.</source>
+        <translation>Die äußere Verknüpfung zwischen %1 und %2 behält nicht mehr Zeilen als eine normale, denn auch normale Verknüpfungen verbinden diese Tabellen: Machen Sie eine normale Verknüpfung daraus oder aus den anderen äußere.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 and %2 contradict each other, and the one drawn first decides which rows are kept: let all of them keep the rows of the same table.</source>
+        <translation>Die äußeren Verknüpfungen um %1 und %2 widersprechen sich, und die zuerst gezeichnete entscheidet, welche Zeilen bleiben: Lassen Sie alle die Zeilen derselben Tabelle behalten.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 can be read in several ways, each with other rows: change the type of one of them.</source>
+        <translation>Die äußeren Verknüpfungen um %1 lassen sich auf mehrere Weisen lesen, jede mit anderen Zeilen: Ändern Sie die Art einer von ihnen.</translation>
+    </message>
+    <message>
+        <source>No join connects %1 with %2, so that every row of one comes with every row of the other: draw a join between them, add the table that lies between, or delete one.</source>
+        <translation>Keine Verknüpfung verbindet %1 mit %2, sodass jede Zeile der einen mit jeder Zeile der anderen kommt: Zeichnen Sie eine Verknüpfung zwischen ihnen, fügen Sie die Tabelle hinzu, die dazwischen liegt, oder löschen Sie eine der beiden.</translation>
+    </message>
+    <message>
+        <source>Standard SQL</source>
+        <translation>Standard-SQL</translation>
+    </message>
+    <message>
+        <source>MySQL/MariaDB has no join that keeps all rows of both tables: let this one keep those of one table.</source>
+        <translation>MySQL/MariaDB hat keine Verknüpfung, die alle Zeilen beider Tabellen behält: Lassen Sie diese hier nur die Zeilen einer Tabelle behalten.</translation>
+    </message>
+    <message>
+        <source>PostgreSQL keeps all rows of both tables only where a join asks for equal values: choose the operator =, or let the join keep the rows of one table.</source>
+        <translation>PostgreSQL behält alle Zeilen beider Tabellen nur, wo eine Verknüpfung gleiche Werte verlangt: Wählen Sie den Operator = oder lassen Sie die Verknüpfung nur die Zeilen einer Tabelle behalten.</translation>
+    </message>
+    <message>
+        <source>These are more conditions than SQLite takes, which is about 900: write a long list of values as In (1, 2, 3).</source>
+        <translation>Das sind mehr Bedingungen, als SQLite nimmt, nämlich etwa 900: Schreiben Sie eine lange Liste von Werten als In (1, 2, 3).</translation>
+    </message>
+    <message>
+        <source>%1 takes no name that is empty: write one.</source>
+        <translation>%1 nimmt keinen leeren Namen: Schreiben Sie einen.</translation>
+    </message>
+    <message>
+        <source>%1 takes no name with the character zero in it: choose another one.</source>
+        <translation>%1 nimmt keinen Namen, in dem das Zeichen null steht: Wählen Sie einen anderen.</translation>
+    </message>
+    <message>
+        <source>%1 takes no name with half a character in it: type it afresh.</source>
+        <translation>%1 nimmt keinen Namen, in dem ein halbes Zeichen steht: Tippen Sie ihn neu.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; is too long for %2, which takes %3 bytes (one for a letter from A to Z, more for most others): choose a shorter one.</source>
+        <translation>Der Name „%1“ ist zu lang für %2, das %3 Bytes nimmt (eines für einen Buchstaben von A bis Z, mehr für die meisten anderen Zeichen): Wählen Sie einen kürzeren.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; is too long for %2, which takes %3 characters: choose a shorter one.</source>
+        <translation>Der Name „%1“ ist zu lang für %2, das %3 Zeichen nimmt: Wählen Sie einen kürzeren.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; has a rare character in it that %2 does not take, such as an emoji: write it without.</source>
+        <translation>Der Name „%1“ enthält ein seltenes Zeichen, das %2 nicht nimmt, etwa ein Emoji: Schreiben Sie ihn ohne.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; ends with a blank, which %2 does not take: write it without.</source>
+        <translation>Der Name „%1“ endet mit einem Leerzeichen, was %2 nicht nimmt: Schreiben Sie ihn ohne.</translation>
+    </message>
+    <message>
+        <source>* and % are ordinary characters here, write Like before a pattern, or quotes around a text</source>
+        <translation>* und % sind hier gewöhnliche Zeichen, schreiben Sie Like vor ein Muster oder Anführungszeichen um einen Text</translation>
+    </message>
+    <message>
+        <source>a value</source>
+        <translation>ein Wert</translation>
+    </message>
+    <message>
+        <source>this is no date and time, write it like 2024-12-31 or 2024-12-31 23:59</source>
+        <translation>das ist keine Angabe von Datum und Uhrzeit, schreiben Sie sie wie 2024-12-31 oder 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>%1 is not from %2 to %3</source>
+        <translation>%1 liegt nicht im Bereich von %2 bis %3</translation>
+    </message>
+    <message>
+        <source>%1 is not the letter %2 and a number from 1 to %3</source>
+        <translation>%1 ist nicht der Buchstabe %2 und eine Zahl von 1 bis %3</translation>
+    </message>
+    <message>
+        <source>%1 is beyond the last key %2 of its kind</source>
+        <translation>%1 liegt hinter dem letzten Schlüssel %2 seiner Art</translation>
+    </message>
+    <message>
+        <source>%1 is used before already</source>
+        <translation>%1 wird vorher schon verwendet</translation>
+    </message>
+    <message>
+        <source>%1 is empty</source>
+        <translation>%1 ist leer</translation>
+    </message>
+    <message>
+        <source>%1 is the name of another table too</source>
+        <translation>%1 ist auch der Name einer anderen Tabelle</translation>
+    </message>
+    <message>
+        <source>%1 does not begin with the entry &quot;*&quot;</source>
+        <translation>%1 beginnt nicht mit dem Eintrag „*“</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no table</source>
+        <translation>%1 ist der Schlüssel keiner Tabelle</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no column</source>
+        <translation>%1 ist der Schlüssel keiner Spalte</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no column of that table</source>
+        <translation>%1 ist der Schlüssel keiner Spalte dieser Tabelle</translation>
+    </message>
+    <message>
+        <source>%1 is no type of join</source>
+        <translation>%1 ist keine Art der Verknüpfung</translation>
+    </message>
+    <message>
+        <source>%1 is no comparison</source>
+        <translation>%1 ist kein Vergleich</translation>
+    </message>
+    <message>
+        <source>%1 is no sort order</source>
+        <translation>%1 ist keine Sortierung</translation>
+    </message>
+    <message>
+        <source>%1 is less than the first row, %2</source>
+        <translation>%1 ist kleiner als die erste Zeile, %2</translation>
+    </message>
+    <message>
+        <source>%1 does not come behind the row before it</source>
+        <translation>%1 kommt nicht hinter der Zeile davor</translation>
+    </message>
+    <message>
+        <source>%1 is no place in the text behind the name before it</source>
+        <translation>%1 ist keine Stelle im Text hinter dem Namen davor</translation>
     </message>
 </context>
 <context>
@@ -794,6 +995,99 @@
     <message>
         <source>Re&amp;name…</source>
         <translation>&amp;Umbenennen…</translation>
+    </message>
+    <message>
+        <source>(None)</source>
+        <comment>no sort order</comment>
+        <translation>(Keine)</translation>
+    </message>
+    <message>
+        <source>Ascending</source>
+        <translation>Aufsteigend</translation>
+    </message>
+    <message>
+        <source>Descending</source>
+        <translation>Absteigend</translation>
+    </message>
+    <message>
+        <source>Visible</source>
+        <comment>an output column</comment>
+        <translation>Sichtbar</translation>
+    </message>
+    <message>
+        <source>Not Visible</source>
+        <translation>Nicht sichtbar</translation>
+    </message>
+    <message>
+        <source>Invisible</source>
+        <translation>Unsichtbar</translation>
+    </message>
+    <message>
+        <source>&amp;Set</source>
+        <comment>the button of a cell&apos;s editor</comment>
+        <translation>&amp;Setzen</translation>
+    </message>
+    <message>
+        <source>Remove the table</source>
+        <translation>Tabelle entfernen</translation>
+    </message>
+    <message>
+        <source>key column</source>
+        <comment>an entry of a table</comment>
+        <translation>Schlüsselspalte</translation>
+    </message>
+    <message>
+        <source>comes out</source>
+        <comment>an entry of a table, in the rows</comment>
+        <translation>wird ausgegeben</translation>
+    </message>
+    <message>
+        <source>Add field…</source>
+        <translation>Feld hinzufügen…</translation>
+    </message>
+    <message>
+        <source>Type to find a field</source>
+        <translation>Tippen Sie, um ein Feld zu finden</translation>
+    </message>
+    <message>
+        <source>Field</source>
+        <translation>Feld</translation>
+    </message>
+    <message>
+        <source>Fields</source>
+        <translation>Felder</translation>
+    </message>
+    <message>
+        <source>column %1</source>
+        <translation>Spalte %1</translation>
+    </message>
+    <message>
+        <source>Tables and joins</source>
+        <translation>Tabellen und Verknüpfungen</translation>
+    </message>
+    <message>
+        <source>Output columns</source>
+        <translation>Ausgabespalten</translation>
+    </message>
+    <message>
+        <source>Scroll across</source>
+        <translation>Waagerecht blättern</translation>
+    </message>
+    <message>
+        <source>Scroll down</source>
+        <translation>Senkrecht blättern</translation>
+    </message>
+    <message>
+        <source>Back to the origin</source>
+        <translation>Zurück zum Anfang</translation>
+    </message>
+    <message>
+        <source>Divider of canvas and grid</source>
+        <translation>Trennleiste zwischen Zeichenfläche und Raster</translation>
+    </message>
+    <message>
+        <source>Drag to give the canvas or the grid more room</source>
+        <translation>Ziehen Sie, um der Zeichenfläche oder dem Raster mehr Platz zu geben</translation>
     </message>
 </context>
 <context>
@@ -1320,6 +1614,13 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
+    <name>zandor::designer::GridHint</name>
+    <message>
+        <source>Double-click a column of a table, or drag it here, to choose what comes out. Until then all columns do.</source>
+        <translation>Klicken Sie doppelt auf eine Spalte einer Tabelle oder ziehen Sie sie hierher, um zu wählen, was ausgegeben wird. Bis dahin sind es alle Spalten.</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
@@ -1512,6 +1813,10 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>&amp;Ask later</source>
         <translation>&amp;Später fragen</translation>
+    </message>
+    <message>
+        <source>The designer ended unexpectedly, and the changes that were kept safe cannot be read. They stay in the file &quot;%1&quot;.</source>
+        <translation>Das Programm wurde unerwartet beendet, und die gesicherten Änderungen können nicht gelesen werden. Sie bleiben in der Datei „%1“.</translation>
     </message>
 </context>
 <context>
@@ -1743,6 +2048,14 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
         <source>Stop what is running, on the database too (Esc)</source>
         <translation>Abbrechen, was gerade läuft, auch in der Datenbank (Esc)</translation>
     </message>
+    <message>
+        <source>The query finds no rows.</source>
+        <translation>Die Abfrage findet keine Zeilen.</translation>
+    </message>
+    <message>
+        <source>A text has to be the same as a whole, and on most databases in capital and small letters: Like *berlin* finds Berlin wherever it stands.</source>
+        <translation>Ein Text muss als Ganzes gleich sein, bei den meisten Datenbanken auch in Groß- und Kleinbuchstaben: Like *berlin* findet Berlin, wo immer es steht.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -1800,6 +2113,10 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>The rows would fill the disk with the folder &quot;%1&quot;: make room there, or ask for fewer rows.</source>
         <translation>Die Zeilen würden den Datenträger mit dem Ordner „%1“ füllen: Schaffen Sie dort Platz oder verlangen Sie weniger Zeilen.</translation>
+    </message>
+    <message>
+        <source>The rows cannot be written</source>
+        <translation>Die Zeilen können nicht geschrieben werden</translation>
     </message>
 </context>
 <context>
@@ -2005,6 +2322,10 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
             <numerusform>%n Spalten verschieben</numerusform>
         </translation>
     </message>
+    <message>
+        <source>Resize column %1</source>
+        <translation>Breite der Spalte %1 ändern</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::TableAdding</name>
@@ -2193,89 +2514,6 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
         <translation>Einen Dialekt „%1“ gibt es nicht; bekannt sind sqlite, postgresql, mysql, sqlserver und standard.</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::Canvas</name>
-    <message>
-        <source>Tables and joins</source>
-        <translation>Tabellen und Verknüpfungen</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::CanvasScrollBar</name>
-    <message>
-        <source>Scroll across</source>
-        <translation>Waagerecht blättern</translation>
-    </message>
-    <message>
-        <source>Scroll down</source>
-        <translation>Senkrecht blättern</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::ColumnListModel</name>
-    <message>
-        <source>key column</source>
-        <translation>Schlüsselspalte</translation>
-    </message>
-    <message>
-        <source>comes out</source>
-        <translation>wird ausgegeben</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::FieldTitles</name>
-    <message>
-        <source>Add field…</source>
-        <translation>Feld hinzufügen…</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::GridModel</name>
-    <message>
-        <source>column %1</source>
-        <translation>Spalte %1</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::GridWidget</name>
-    <message>
-        <source>Output columns</source>
-        <translation>Ausgabespalten</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::HomeButton</name>
-    <message>
-        <source>Back to the origin</source>
-        <translation>Zurück zum Anfang</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::PaneHandle</name>
-    <message>
-        <source>Divider of canvas and grid</source>
-        <translation>Trennleiste zwischen Zeichenfläche und Raster</translation>
-    </message>
-    <message>
-        <source>Drag to give the canvas or the grid more room</source>
-        <translation>Ziehen Sie, um der Zeichenfläche oder dem Raster mehr Platz zu geben</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::PickListWidget</name>
-    <message>
-        <source>Type to find a field</source>
-        <translation>Tippen Sie, um ein Feld zu finden</translation>
-    </message>
-    <message>
-        <source>Field</source>
-        <translation>Feld</translation>
-    </message>
-    <message>
-        <source>Fields</source>
-        <translation>Felder</translation>
     </message>
 </context>
 </TS>

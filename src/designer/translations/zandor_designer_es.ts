@@ -305,82 +305,6 @@
         <translation>La consulta no tiene tablas: añada primero una.</translation>
     </message>
     <message>
-        <source>An output column has no column of the query: delete it.</source>
-        <translation>Una columna de salida no corresponde a ninguna columna de la consulta: elimínela.</translation>
-    </message>
-    <message>
-        <source>%1.* cannot be sorted: sort one of its columns.</source>
-        <translation>%1.* no se puede ordenar: ordene por una de sus columnas.</translation>
-    </message>
-    <message>
-        <source>%1.* cannot have a criterion: give one to one of its columns.</source>
-        <translation>%1.* no puede tener un criterio: póngalo en una de sus columnas.</translation>
-    </message>
-    <message>
-        <source>Two output columns are named %1: give one of them a synonym.</source>
-        <translation>Dos columnas de salida se llaman %1: dé un sinónimo a una de ellas.</translation>
-    </message>
-    <message>
-        <source>%1 and %2 hold different kinds of values: the join will find nothing or fail.</source>
-        <translation>%1 y %2 contienen valores de distinto tipo: la combinación no encontrará nada o fallará.</translation>
-    </message>
-    <message>
-        <source>The outer join between %1 and %2 has no effect: normal joins connect them too.</source>
-        <translation>La combinación externa entre %1 y %2 no tiene efecto: también las unen combinaciones normales.</translation>
-    </message>
-    <message>
-        <source>The outer joins around %1 and %2 contradict each other: the one drawn first decides which rows are kept.</source>
-        <translation>Las combinaciones externas en torno a %1 y %2 se contradicen: la primera que se dibujó decide qué filas se conservan.</translation>
-    </message>
-    <message>
-        <source>The outer joins around %1 can be read in several ways: change the type of one of them.</source>
-        <translation>Las combinaciones externas en torno a %1 se pueden leer de varias maneras: cambie el tipo de una de ellas.</translation>
-    </message>
-    <message>
-        <source>No join connects %1 with %2: every row of one comes with every row of the other.</source>
-        <translation>Ninguna combinación une %1 con %2: cada fila de una sale con cada fila de la otra.</translation>
-    </message>
-    <message>
-        <source>MySQL/MariaDB has no full outer join: make it a left or a right one.</source>
-        <translation>MySQL/MariaDB no tiene combinación externa por ambos lados: hágala izquierda o derecha.</translation>
-    </message>
-    <message>
-        <source>PostgreSQL joins both outer only on equal columns: use the operator =, or make it a left or a right outer join.</source>
-        <translation>PostgreSQL solo combina por ambos lados columnas iguales: use el operador =, o haga la combinación externa izquierda o derecha.</translation>
-    </message>
-    <message>
-        <source>SQLite takes about 900 conditions in a row: use In for a long list.</source>
-        <translation>SQLite admite unas 900 condiciones seguidas: use In para una lista larga.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry an empty name.</source>
-        <translation>%1 no admite un nombre vacío.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry a name with the character zero in it.</source>
-        <translation>%1 no admite un nombre que contenga el carácter cero.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry a name with half a character in it.</source>
-        <translation>%1 no admite un nombre que contenga medio carácter.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 bytes.</source>
-        <translation>%1 no admite el nombre «%2», tiene más de %3 bytes.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 characters.</source>
-        <translation>%1 no admite el nombre «%2», tiene más de %3 caracteres.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has a character beyond U+FFFF.</source>
-        <translation>%1 no admite el nombre «%2», contiene un carácter más allá de U+FFFF.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it ends with a blank.</source>
-        <translation>%1 no admite el nombre «%2», termina en un espacio.</translation>
-    </message>
-    <message>
         <source>%1: At character %2: %3.</source>
         <translation>%1: en el carácter %2: %3.</translation>
     </message>
@@ -685,10 +609,6 @@
         <translation>esto no es una hora, escríbala como 23:59</translation>
     </message>
     <message>
-        <source>this is no date and time, write it like 2024-12-31 23:59</source>
-        <translation>esto no es una fecha con hora, escríbala como 2024-12-31 23:59</translation>
-    </message>
-    <message>
         <source>write true or false here</source>
         <translation>escriba aquí true o false</translation>
     </message>
@@ -729,10 +649,6 @@
         <translation>No se puede escribir la salida</translation>
     </message>
     <message>
-        <source>The rows cannot be written</source>
-        <translation>No se pueden escribir las filas</translation>
-    </message>
-    <message>
         <source>check the path</source>
         <translation>compruebe la ruta</translation>
     </message>
@@ -756,12 +672,297 @@
         <source>try again, or choose another folder</source>
         <translation>inténtelo de nuevo o elija otra carpeta</translation>
     </message>
-</context>
-<context>
-    <name>QObject</name>
     <message>
-        <source>Remove the table</source>
-        <translation>Quitar la tabla</translation>
+        <source>choose a shorter name</source>
+        <translation>elija un nombre más corto</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be used: %2</source>
+        <translation>No se puede usar el archivo «%1»: %2</translation>
+    </message>
+    <message>
+        <source>%1. %2.</source>
+        <translation>%1. %2.</translation>
+    </message>
+    <message>
+        <source>Mend the file there, or restore it from a copy</source>
+        <translation>Corrija ahí el archivo o restáurelo desde una copia</translation>
+    </message>
+    <message>
+        <source>Choose a query file</source>
+        <translation>Elija un archivo de consulta</translation>
+    </message>
+    <message>
+        <source>Open the file with a newer version of this program</source>
+        <translation>Abra el archivo con una versión más reciente de este programa</translation>
+    </message>
+    <message>
+        <source>Type that text afresh and save again</source>
+        <translation>Escriba de nuevo ese texto y vuelva a guardar</translation>
+    </message>
+    <message>
+        <source>The query could not be read again: %1</source>
+        <translation>No se pudo volver a leer la consulta: %1</translation>
+    </message>
+    <message>
+        <source>The query would not be the same when read again. Report this, please.</source>
+        <translation>La consulta no sería la misma al volver a leerla. Comunique este fallo, por favor.</translation>
+    </message>
+    <message>
+        <source>The file</source>
+        <translation>El archivo</translation>
+    </message>
+    <message>
+        <source>Line %1, column %2: %3</source>
+        <translation>Línea %1, columna %2: %3</translation>
+    </message>
+    <message>
+        <source>a number is too large</source>
+        <translation>un número es demasiado grande</translation>
+    </message>
+    <message>
+        <source>%1 stands there twice</source>
+        <translation>%1 aparece dos veces</translation>
+    </message>
+    <message>
+        <source>%1 is longer than %2 characters</source>
+        <translation>%1 tiene más de %2 caracteres</translation>
+    </message>
+    <message>
+        <source>%1 has a NUL character in it</source>
+        <translation>%1 contiene un carácter NUL</translation>
+    </message>
+    <message>
+        <source>%1 is nested more than %2 levels deep</source>
+        <translation>%1 está a más de %2 niveles de profundidad</translation>
+    </message>
+    <message>
+        <source>%1 is one value too many: a file may have %2</source>
+        <translation>%1 es un valor de más: un archivo puede tener %2</translation>
+    </message>
+    <message>
+        <source>%1 is larger than %2 MiB</source>
+        <translation>%1 ocupa más de %2 MiB</translation>
+    </message>
+    <message>
+        <source>%1 is not an object</source>
+        <translation>%1 no es un objeto</translation>
+    </message>
+    <message>
+        <source>%1 is not a text</source>
+        <translation>%1 no es un texto</translation>
+    </message>
+    <message>
+        <source>%1 is neither a text nor null</source>
+        <translation>%1 no es ni un texto ni null</translation>
+    </message>
+    <message>
+        <source>%1 is not true or false</source>
+        <translation>%1 no es true ni false</translation>
+    </message>
+    <message>
+        <source>%1 is not a list</source>
+        <translation>%1 no es una lista</translation>
+    </message>
+    <message>
+        <source>%1 has more than %2 entries</source>
+        <translation>%1 tiene más de %2 entradas</translation>
+    </message>
+    <message>
+        <source>%1 is missing</source>
+        <translation>Falta %1</translation>
+    </message>
+    <message>
+        <source>%1 is not a whole number from %2 to %3</source>
+        <translation>%1 no es un número entero entre %2 y %3</translation>
+    </message>
+    <message>
+        <source>%1 is &quot;%2&quot; and none of %3</source>
+        <translation>%1 es «%2» y no es ninguno de estos valores: %3</translation>
+    </message>
+    <message>
+        <source>%1 makes the columns of all tables more than %2</source>
+        <translation>%1 hace que todas las tablas juntas tengan más de %2 columnas</translation>
+    </message>
+    <message>
+        <source>%1 is no length of a name in the text</source>
+        <translation>%1 no es una longitud posible para un nombre del texto</translation>
+    </message>
+    <message>
+        <source>%1 is not &quot;%2&quot;</source>
+        <translation>%1 no es «%2»</translation>
+    </message>
+    <message>
+        <source>%1 is less than 1</source>
+        <translation>%1 es menor que 1</translation>
+    </message>
+    <message>
+        <source>%1 is %2 and newer than %3, the newest that can be read here</source>
+        <translation>%1 es %2 y más reciente que %3, la versión más reciente que se puede leer aquí</translation>
+    </message>
+    <message>
+        <source>%1 has half a character in it (an unpaired surrogate)</source>
+        <translation>%1 contiene medio carácter (un sustituto sin pareja)</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>The table of an output column is no longer in the query: delete the output column, or choose another field for it.</source>
+        <translation>La tabla de una columna de salida ya no está en la consulta: elimine la columna de salida o elija otro campo para ella.</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns and cannot be sorted by: add the column that is to decide, and sort by that.</source>
+        <translation>%1.* representa todas las columnas y no sirve para ordenar: añada la columna que debe decidir el orden y ordene por ella.</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns and cannot have a criterion: add the column that is meant, and write the criterion there.</source>
+        <translation>%1.* representa todas las columnas y no puede tener un criterio: añada la columna a la que se refiere y escriba allí el criterio.</translation>
+    </message>
+    <message>
+        <source>Two output columns are named %1, so that nobody can tell them apart: give one of them a synonym.</source>
+        <translation>Dos columnas de salida se llaman %1 y nadie puede distinguirlas: dé un sinónimo a una de ellas.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 hold different kinds of values, so that their join finds nothing or fails: join columns that hold the same.</source>
+        <translation>%1 y %2 contienen valores de distinto tipo, así que su combinación no encuentra nada o falla: combine columnas que contengan lo mismo.</translation>
+    </message>
+    <message>
+        <source>The outer join between %1 and %2 keeps no more rows than a normal one, for normal joins connect these tables too: make it a normal join, or make the others outer ones.</source>
+        <translation>La combinación externa entre %1 y %2 no conserva más filas que una normal, porque estas tablas también están unidas por combinaciones normales: conviértala en normal o convierta las otras en externas.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 and %2 contradict each other, and the one drawn first decides which rows are kept: let all of them keep the rows of the same table.</source>
+        <translation>Las combinaciones externas en torno a %1 y %2 se contradicen, y la que se dibujó primero decide qué filas se conservan: haga que todas conserven las filas de la misma tabla.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 can be read in several ways, each with other rows: change the type of one of them.</source>
+        <translation>Las combinaciones externas en torno a %1 se pueden entender de varias maneras, cada una con otras filas: cambie el tipo de una de ellas.</translation>
+    </message>
+    <message>
+        <source>No join connects %1 with %2, so that every row of one comes with every row of the other: draw a join between them, add the table that lies between, or delete one.</source>
+        <translation>Ninguna combinación une %1 con %2, así que cada fila de una sale con cada fila de la otra: dibuje una combinación entre ellas, añada la tabla que está en medio o elimine una.</translation>
+    </message>
+    <message>
+        <source>Standard SQL</source>
+        <translation>SQL estándar</translation>
+    </message>
+    <message>
+        <source>MySQL/MariaDB has no join that keeps all rows of both tables: let this one keep those of one table.</source>
+        <translation>MySQL/MariaDB no tiene ninguna combinación que conserve todas las filas de ambas tablas: haga que esta conserve las de una sola tabla.</translation>
+    </message>
+    <message>
+        <source>PostgreSQL keeps all rows of both tables only where a join asks for equal values: choose the operator =, or let the join keep the rows of one table.</source>
+        <translation>PostgreSQL solo conserva todas las filas de ambas tablas si la combinación pide valores iguales: elija el operador = o haga que la combinación conserve las filas de una sola tabla.</translation>
+    </message>
+    <message>
+        <source>These are more conditions than SQLite takes, which is about 900: write a long list of values as In (1, 2, 3).</source>
+        <translation>Son más condiciones de las que admite SQLite, unas 900: escriba una lista larga de valores como In (1, 2, 3).</translation>
+    </message>
+    <message>
+        <source>%1 takes no name that is empty: write one.</source>
+        <translation>%1 no admite nombres vacíos: escriba uno.</translation>
+    </message>
+    <message>
+        <source>%1 takes no name with the character zero in it: choose another one.</source>
+        <translation>%1 no admite nombres que contengan el carácter cero: elija otro.</translation>
+    </message>
+    <message>
+        <source>%1 takes no name with half a character in it: type it afresh.</source>
+        <translation>%1 no admite nombres que contengan medio carácter: escríbalo de nuevo.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; is too long for %2, which takes %3 bytes (one for a letter from A to Z, more for most others): choose a shorter one.</source>
+        <translation>El nombre «%1» es demasiado largo para %2, que admite %3 bytes (uno por cada letra de la A a la Z, más por casi todos los demás caracteres): elija uno más corto.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; is too long for %2, which takes %3 characters: choose a shorter one.</source>
+        <translation>El nombre «%1» es demasiado largo para %2, que admite %3 caracteres: elija uno más corto.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; has a rare character in it that %2 does not take, such as an emoji: write it without.</source>
+        <translation>El nombre «%1» contiene un carácter poco común que %2 no admite, como un emoji: escríbalo sin él.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; ends with a blank, which %2 does not take: write it without.</source>
+        <translation>El nombre «%1» termina con un espacio, que %2 no admite: escríbalo sin él.</translation>
+    </message>
+    <message>
+        <source>* and % are ordinary characters here, write Like before a pattern, or quotes around a text</source>
+        <translation>* y % son aquí caracteres normales, escriba Like delante de un patrón, o comillas alrededor de un texto</translation>
+    </message>
+    <message>
+        <source>a value</source>
+        <translation>un valor</translation>
+    </message>
+    <message>
+        <source>this is no date and time, write it like 2024-12-31 or 2024-12-31 23:59</source>
+        <translation>esto no es una fecha con hora, escríbala como 2024-12-31 o 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>%1 is not from %2 to %3</source>
+        <translation>%1 no está entre %2 y %3</translation>
+    </message>
+    <message>
+        <source>%1 is not the letter %2 and a number from 1 to %3</source>
+        <translation>%1 no es la letra %2 seguida de un número entre 1 y %3</translation>
+    </message>
+    <message>
+        <source>%1 is beyond the last key %2 of its kind</source>
+        <translation>%1 va más allá de la última clave de su tipo, %2</translation>
+    </message>
+    <message>
+        <source>%1 is used before already</source>
+        <translation>%1 ya se ha usado antes</translation>
+    </message>
+    <message>
+        <source>%1 is empty</source>
+        <translation>%1 está vacío</translation>
+    </message>
+    <message>
+        <source>%1 is the name of another table too</source>
+        <translation>%1 es también el nombre de otra tabla</translation>
+    </message>
+    <message>
+        <source>%1 does not begin with the entry &quot;*&quot;</source>
+        <translation>%1 no empieza con la entrada «*»</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no table</source>
+        <translation>%1 no es la clave de ninguna tabla</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no column</source>
+        <translation>%1 no es la clave de ninguna columna</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no column of that table</source>
+        <translation>%1 no es la clave de ninguna columna de esa tabla</translation>
+    </message>
+    <message>
+        <source>%1 is no type of join</source>
+        <translation>%1 no es un tipo de combinación</translation>
+    </message>
+    <message>
+        <source>%1 is no comparison</source>
+        <translation>%1 no es una comparación</translation>
+    </message>
+    <message>
+        <source>%1 is no sort order</source>
+        <translation>%1 no es un tipo de orden</translation>
+    </message>
+    <message>
+        <source>%1 is less than the first row, %2</source>
+        <translation>%1 es menor que la primera fila, %2</translation>
+    </message>
+    <message>
+        <source>%1 does not come behind the row before it</source>
+        <translation>%1 no viene después de la fila anterior</translation>
+    </message>
+    <message>
+        <source>%1 is no place in the text behind the name before it</source>
+        <translation>%1 no es un lugar del texto situado después del nombre anterior</translation>
     </message>
 </context>
 <context>
@@ -794,6 +995,99 @@
     <message>
         <source>Re&amp;name…</source>
         <translation>Cambiar el &amp;nombre…</translation>
+    </message>
+    <message>
+        <source>(None)</source>
+        <comment>no sort order</comment>
+        <translation>(Ninguno)</translation>
+    </message>
+    <message>
+        <source>Ascending</source>
+        <translation>Ascendente</translation>
+    </message>
+    <message>
+        <source>Descending</source>
+        <translation>Descendente</translation>
+    </message>
+    <message>
+        <source>Visible</source>
+        <comment>an output column</comment>
+        <translation>Visible</translation>
+    </message>
+    <message>
+        <source>Not Visible</source>
+        <translation>No visible</translation>
+    </message>
+    <message>
+        <source>Invisible</source>
+        <translation>Invisible</translation>
+    </message>
+    <message>
+        <source>&amp;Set</source>
+        <comment>the button of a cell&apos;s editor</comment>
+        <translation>&amp;Fijar</translation>
+    </message>
+    <message>
+        <source>Remove the table</source>
+        <translation>Quitar la tabla</translation>
+    </message>
+    <message>
+        <source>key column</source>
+        <comment>an entry of a table</comment>
+        <translation>columna clave</translation>
+    </message>
+    <message>
+        <source>comes out</source>
+        <comment>an entry of a table, in the rows</comment>
+        <translation>columna de salida</translation>
+    </message>
+    <message>
+        <source>Add field…</source>
+        <translation>Añadir campo…</translation>
+    </message>
+    <message>
+        <source>Type to find a field</source>
+        <translation>Escriba para buscar un campo</translation>
+    </message>
+    <message>
+        <source>Field</source>
+        <translation>Campo</translation>
+    </message>
+    <message>
+        <source>Fields</source>
+        <translation>Campos</translation>
+    </message>
+    <message>
+        <source>column %1</source>
+        <translation>columna %1</translation>
+    </message>
+    <message>
+        <source>Tables and joins</source>
+        <translation>Tablas y combinaciones</translation>
+    </message>
+    <message>
+        <source>Output columns</source>
+        <translation>Columnas de salida</translation>
+    </message>
+    <message>
+        <source>Scroll across</source>
+        <translation>Desplazamiento horizontal</translation>
+    </message>
+    <message>
+        <source>Scroll down</source>
+        <translation>Desplazamiento vertical</translation>
+    </message>
+    <message>
+        <source>Back to the origin</source>
+        <translation>Volver al origen</translation>
+    </message>
+    <message>
+        <source>Divider of canvas and grid</source>
+        <translation>Divisor entre el lienzo y la cuadrícula</translation>
+    </message>
+    <message>
+        <source>Drag to give the canvas or the grid more room</source>
+        <translation>Arrastre para dar más espacio al lienzo o a la cuadrícula</translation>
     </message>
 </context>
 <context>
@@ -1320,6 +1614,13 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
+    <name>zandor::designer::GridHint</name>
+    <message>
+        <source>Double-click a column of a table, or drag it here, to choose what comes out. Until then all columns do.</source>
+        <translation>Haga doble clic en una columna de una tabla, o arrástrela aquí, para elegir qué sale. Hasta entonces salen todas las columnas.</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
@@ -1512,6 +1813,10 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>&amp;Ask later</source>
         <translation>&amp;Preguntar más tarde</translation>
+    </message>
+    <message>
+        <source>The designer ended unexpectedly, and the changes that were kept safe cannot be read. They stay in the file &quot;%1&quot;.</source>
+        <translation>El programa terminó de forma inesperada y no se pueden leer los cambios puestos a salvo. Siguen en el archivo «%1».</translation>
     </message>
 </context>
 <context>
@@ -1743,6 +2048,14 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
         <source>Stop what is running, on the database too (Esc)</source>
         <translation>Detener lo que se está ejecutando, también en la base de datos (Esc)</translation>
     </message>
+    <message>
+        <source>The query finds no rows.</source>
+        <translation>La consulta no encuentra ninguna fila.</translation>
+    </message>
+    <message>
+        <source>A text has to be the same as a whole, and on most databases in capital and small letters: Like *berlin* finds Berlin wherever it stands.</source>
+        <translation>Un texto tiene que coincidir entero y, en la mayoría de las bases de datos, también en mayúsculas y minúsculas: Like *berlin* encuentra Berlin esté donde esté.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -1800,6 +2113,10 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>The rows would fill the disk with the folder &quot;%1&quot;: make room there, or ask for fewer rows.</source>
         <translation>Las filas llenarían el disco de la carpeta «%1»: haga sitio allí, o pida menos filas.</translation>
+    </message>
+    <message>
+        <source>The rows cannot be written</source>
+        <translation>No se pueden escribir las filas</translation>
     </message>
 </context>
 <context>
@@ -2005,6 +2322,10 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
             <numerusform>Mover %n columnas</numerusform>
         </translation>
     </message>
+    <message>
+        <source>Resize column %1</source>
+        <translation>Cambiar el ancho de la columna %1</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::TableAdding</name>
@@ -2193,89 +2514,6 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
         <translation>No existe el dialecto «%1»; se conocen sqlite, postgresql, mysql, sqlserver y standard.</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::Canvas</name>
-    <message>
-        <source>Tables and joins</source>
-        <translation>Tablas y combinaciones</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::CanvasScrollBar</name>
-    <message>
-        <source>Scroll across</source>
-        <translation>Desplazamiento horizontal</translation>
-    </message>
-    <message>
-        <source>Scroll down</source>
-        <translation>Desplazamiento vertical</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::ColumnListModel</name>
-    <message>
-        <source>key column</source>
-        <translation>columna clave</translation>
-    </message>
-    <message>
-        <source>comes out</source>
-        <translation>columna de salida</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::FieldTitles</name>
-    <message>
-        <source>Add field…</source>
-        <translation>Añadir campo…</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::GridModel</name>
-    <message>
-        <source>column %1</source>
-        <translation>columna %1</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::GridWidget</name>
-    <message>
-        <source>Output columns</source>
-        <translation>Columnas de salida</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::HomeButton</name>
-    <message>
-        <source>Back to the origin</source>
-        <translation>Volver al origen</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::PaneHandle</name>
-    <message>
-        <source>Divider of canvas and grid</source>
-        <translation>Divisor entre el lienzo y la cuadrícula</translation>
-    </message>
-    <message>
-        <source>Drag to give the canvas or the grid more room</source>
-        <translation>Arrastre para dar más espacio al lienzo o a la cuadrícula</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::PickListWidget</name>
-    <message>
-        <source>Type to find a field</source>
-        <translation>Escriba para buscar un campo</translation>
-    </message>
-    <message>
-        <source>Field</source>
-        <translation>Campo</translation>
-    </message>
-    <message>
-        <source>Fields</source>
-        <translation>Campos</translation>
     </message>
 </context>
 </TS>

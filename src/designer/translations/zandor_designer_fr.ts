@@ -305,82 +305,6 @@
         <translation>La requête n’a aucune table&#xa0;: ajoutez-en d’abord une.</translation>
     </message>
     <message>
-        <source>An output column has no column of the query: delete it.</source>
-        <translation>Une colonne de sortie ne correspond à aucune colonne de la requête&#xa0;: supprimez-la.</translation>
-    </message>
-    <message>
-        <source>%1.* cannot be sorted: sort one of its columns.</source>
-        <translation>%1.* ne peut pas être trié&#xa0;: triez selon l’une de ses colonnes.</translation>
-    </message>
-    <message>
-        <source>%1.* cannot have a criterion: give one to one of its columns.</source>
-        <translation>%1.* ne peut pas avoir de critère&#xa0;: donnez-le à l’une de ses colonnes.</translation>
-    </message>
-    <message>
-        <source>Two output columns are named %1: give one of them a synonym.</source>
-        <translation>Deux colonnes de sortie se nomment %1&#xa0;: donnez un synonyme à l’une d’elles.</translation>
-    </message>
-    <message>
-        <source>%1 and %2 hold different kinds of values: the join will find nothing or fail.</source>
-        <translation>%1 et %2 contiennent des valeurs de types différents&#xa0;: la jointure ne trouvera rien ou échouera.</translation>
-    </message>
-    <message>
-        <source>The outer join between %1 and %2 has no effect: normal joins connect them too.</source>
-        <translation>La jointure externe entre %1 et %2 est sans effet&#xa0;: des jointures normales les relient aussi.</translation>
-    </message>
-    <message>
-        <source>The outer joins around %1 and %2 contradict each other: the one drawn first decides which rows are kept.</source>
-        <translation>Les jointures externes autour de %1 et %2 se contredisent&#xa0;: la première dessinée décide des lignes conservées.</translation>
-    </message>
-    <message>
-        <source>The outer joins around %1 can be read in several ways: change the type of one of them.</source>
-        <translation>Les jointures externes autour de %1 peuvent se lire de plusieurs façons&#xa0;: changez le type de l’une d’elles.</translation>
-    </message>
-    <message>
-        <source>No join connects %1 with %2: every row of one comes with every row of the other.</source>
-        <translation>Aucune jointure ne relie %1 à %2&#xa0;: chaque ligne de l’une vient avec chaque ligne de l’autre.</translation>
-    </message>
-    <message>
-        <source>MySQL/MariaDB has no full outer join: make it a left or a right one.</source>
-        <translation>MySQL/MariaDB n’a pas de jointure externe des deux côtés&#xa0;: faites-en une jointure gauche ou droite.</translation>
-    </message>
-    <message>
-        <source>PostgreSQL joins both outer only on equal columns: use the operator =, or make it a left or a right outer join.</source>
-        <translation>PostgreSQL ne fait de jointure externe des deux côtés que sur des colonnes égales&#xa0;: utilisez l’opérateur =, ou faites-en une jointure externe gauche ou droite.</translation>
-    </message>
-    <message>
-        <source>SQLite takes about 900 conditions in a row: use In for a long list.</source>
-        <translation>SQLite accepte environ 900 conditions à la suite&#xa0;: utilisez In pour une longue liste.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry an empty name.</source>
-        <translation>%1 n’accepte pas un nom vide.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry a name with the character zero in it.</source>
-        <translation>%1 n’accepte pas un nom qui contient le caractère zéro.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry a name with half a character in it.</source>
-        <translation>%1 n’accepte pas un nom qui contient un demi-caractère.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 bytes.</source>
-        <translation>%1 n’accepte pas le nom «&#xa0;%2&#xa0;», il compte plus de %3 octets.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has more than %3 characters.</source>
-        <translation>%1 n’accepte pas le nom «&#xa0;%2&#xa0;», il compte plus de %3 caractères.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it has a character beyond U+FFFF.</source>
-        <translation>%1 n’accepte pas le nom «&#xa0;%2&#xa0;», il contient un caractère au-delà de U+FFFF.</translation>
-    </message>
-    <message>
-        <source>%1 cannot carry the name &quot;%2&quot;, it ends with a blank.</source>
-        <translation>%1 n’accepte pas le nom «&#xa0;%2&#xa0;», il se termine par une espace.</translation>
-    </message>
-    <message>
         <source>%1: At character %2: %3.</source>
         <translation>%1&#xa0;: au caractère %2&#xa0;: %3.</translation>
     </message>
@@ -685,10 +609,6 @@
         <translation>ce n’est pas une heure, écrivez-la comme 23:59</translation>
     </message>
     <message>
-        <source>this is no date and time, write it like 2024-12-31 23:59</source>
-        <translation>ce n’est pas une date avec une heure, écrivez-les comme 2024-12-31 23:59</translation>
-    </message>
-    <message>
         <source>write true or false here</source>
         <translation>écrivez ici true ou false</translation>
     </message>
@@ -729,10 +649,6 @@
         <translation>La sortie ne peut pas être écrite</translation>
     </message>
     <message>
-        <source>The rows cannot be written</source>
-        <translation>Les lignes ne peuvent pas être écrites</translation>
-    </message>
-    <message>
         <source>check the path</source>
         <translation>vérifiez le chemin</translation>
     </message>
@@ -756,12 +672,297 @@
         <source>try again, or choose another folder</source>
         <translation>réessayez, ou choisissez un autre dossier</translation>
     </message>
-</context>
-<context>
-    <name>QObject</name>
     <message>
-        <source>Remove the table</source>
-        <translation>Retirer la table</translation>
+        <source>choose a shorter name</source>
+        <translation>choisissez un nom plus court</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be used: %2</source>
+        <translation>Le fichier «&#xa0;%1&#xa0;» ne peut pas être utilisé&#xa0;: %2</translation>
+    </message>
+    <message>
+        <source>%1. %2.</source>
+        <translation>%1. %2.</translation>
+    </message>
+    <message>
+        <source>Mend the file there, or restore it from a copy</source>
+        <translation>Corrigez le fichier à cet endroit, ou restaurez-le à partir d’une copie</translation>
+    </message>
+    <message>
+        <source>Choose a query file</source>
+        <translation>Choisissez un fichier de requête</translation>
+    </message>
+    <message>
+        <source>Open the file with a newer version of this program</source>
+        <translation>Ouvrez le fichier avec une version plus récente de ce programme</translation>
+    </message>
+    <message>
+        <source>Type that text afresh and save again</source>
+        <translation>Saisissez ce texte à nouveau, puis réessayez d’enregistrer</translation>
+    </message>
+    <message>
+        <source>The query could not be read again: %1</source>
+        <translation>La requête n’a pas pu être relue&#xa0;: %1</translation>
+    </message>
+    <message>
+        <source>The query would not be the same when read again. Report this, please.</source>
+        <translation>La requête ne serait plus la même une fois relue. Merci de signaler ce problème.</translation>
+    </message>
+    <message>
+        <source>The file</source>
+        <translation>Le fichier</translation>
+    </message>
+    <message>
+        <source>Line %1, column %2: %3</source>
+        <translation>Ligne %1, colonne %2&#xa0;: %3</translation>
+    </message>
+    <message>
+        <source>a number is too large</source>
+        <translation>un nombre est trop grand</translation>
+    </message>
+    <message>
+        <source>%1 stands there twice</source>
+        <translation>%1 y figure deux fois</translation>
+    </message>
+    <message>
+        <source>%1 is longer than %2 characters</source>
+        <translation>%1 dépasse %2 caractères</translation>
+    </message>
+    <message>
+        <source>%1 has a NUL character in it</source>
+        <translation>%1 contient un caractère NUL</translation>
+    </message>
+    <message>
+        <source>%1 is nested more than %2 levels deep</source>
+        <translation>%1 est imbriqué sur plus de %2 niveaux</translation>
+    </message>
+    <message>
+        <source>%1 is one value too many: a file may have %2</source>
+        <translation>%1 est une valeur de trop&#xa0;: un fichier peut en contenir %2</translation>
+    </message>
+    <message>
+        <source>%1 is larger than %2 MiB</source>
+        <translation>%1 dépasse %2 Mio</translation>
+    </message>
+    <message>
+        <source>%1 is not an object</source>
+        <translation>%1 n’est pas un objet</translation>
+    </message>
+    <message>
+        <source>%1 is not a text</source>
+        <translation>%1 n’est pas un texte</translation>
+    </message>
+    <message>
+        <source>%1 is neither a text nor null</source>
+        <translation>%1 n’est ni un texte ni null</translation>
+    </message>
+    <message>
+        <source>%1 is not true or false</source>
+        <translation>%1 n’est ni true ni false</translation>
+    </message>
+    <message>
+        <source>%1 is not a list</source>
+        <translation>%1 n’est pas une liste</translation>
+    </message>
+    <message>
+        <source>%1 has more than %2 entries</source>
+        <translation>%1 a plus de %2 entrées</translation>
+    </message>
+    <message>
+        <source>%1 is missing</source>
+        <translation>%1 manque</translation>
+    </message>
+    <message>
+        <source>%1 is not a whole number from %2 to %3</source>
+        <translation>%1 n’est pas un nombre entier de %2 à %3</translation>
+    </message>
+    <message>
+        <source>%1 is &quot;%2&quot; and none of %3</source>
+        <translation>%1 vaut «&#xa0;%2&#xa0;», et non l’un des mots %3</translation>
+    </message>
+    <message>
+        <source>%1 makes the columns of all tables more than %2</source>
+        <translation>%1 porte le nombre total de colonnes des tables à plus de %2</translation>
+    </message>
+    <message>
+        <source>%1 is no length of a name in the text</source>
+        <translation>%1 n’est pas la longueur d’un nom du texte</translation>
+    </message>
+    <message>
+        <source>%1 is not &quot;%2&quot;</source>
+        <translation>%1 n’est pas «&#xa0;%2&#xa0;»</translation>
+    </message>
+    <message>
+        <source>%1 is less than 1</source>
+        <translation>%1 est inférieur à 1</translation>
+    </message>
+    <message>
+        <source>%1 is %2 and newer than %3, the newest that can be read here</source>
+        <translation>%1 vaut %2, une version plus récente que %3, la dernière qui peut être lue ici</translation>
+    </message>
+    <message>
+        <source>%1 has half a character in it (an unpaired surrogate)</source>
+        <translation>%1 contient un demi-caractère (un substitut Unicode isolé)</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>The table of an output column is no longer in the query: delete the output column, or choose another field for it.</source>
+        <translation>La table d’une colonne de sortie n’est plus dans la requête&#xa0;: supprimez la colonne de sortie, ou choisissez-lui un autre champ.</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns and cannot be sorted by: add the column that is to decide, and sort by that.</source>
+        <translation>%1.* représente toutes les colonnes et ne peut pas servir au tri&#xa0;: ajoutez la colonne qui doit décider de l’ordre, et triez selon celle-ci.</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns and cannot have a criterion: add the column that is meant, and write the criterion there.</source>
+        <translation>%1.* représente toutes les colonnes et ne peut pas avoir de critère&#xa0;: ajoutez la colonne voulue, et écrivez-y le critère.</translation>
+    </message>
+    <message>
+        <source>Two output columns are named %1, so that nobody can tell them apart: give one of them a synonym.</source>
+        <translation>Deux colonnes de sortie s’appellent %1, si bien que rien ne les distingue&#xa0;: donnez un synonyme à l’une d’elles.</translation>
+    </message>
+    <message>
+        <source>%1 and %2 hold different kinds of values, so that their join finds nothing or fails: join columns that hold the same.</source>
+        <translation>%1 et %2 contiennent des valeurs de types différents, si bien que leur jointure ne trouve rien ou échoue&#xa0;: reliez des colonnes qui contiennent le même type de valeurs.</translation>
+    </message>
+    <message>
+        <source>The outer join between %1 and %2 keeps no more rows than a normal one, for normal joins connect these tables too: make it a normal join, or make the others outer ones.</source>
+        <translation>La jointure externe entre %1 et %2 ne garde pas plus de lignes qu’une jointure normale, car des jointures normales relient aussi ces tables&#xa0;: faites-en une jointure normale, ou rendez les autres externes.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 and %2 contradict each other, and the one drawn first decides which rows are kept: let all of them keep the rows of the same table.</source>
+        <translation>Les jointures externes autour de %1 et de %2 se contredisent, et la première dessinée décide des lignes gardées&#xa0;: faites en sorte que toutes gardent les lignes de la même table.</translation>
+    </message>
+    <message>
+        <source>The outer joins around %1 can be read in several ways, each with other rows: change the type of one of them.</source>
+        <translation>Les jointures externes autour de %1 peuvent se lire de plusieurs façons, chacune donnant d’autres lignes&#xa0;: changez le type de l’une d’elles.</translation>
+    </message>
+    <message>
+        <source>No join connects %1 with %2, so that every row of one comes with every row of the other: draw a join between them, add the table that lies between, or delete one.</source>
+        <translation>Aucune jointure ne relie %1 et %2, si bien que chaque ligne de l’une est combinée avec chaque ligne de l’autre&#xa0;: dessinez une jointure entre elles, ajoutez la table qui se trouve entre les deux, ou supprimez l’une d’elles.</translation>
+    </message>
+    <message>
+        <source>Standard SQL</source>
+        <translation>SQL standard</translation>
+    </message>
+    <message>
+        <source>MySQL/MariaDB has no join that keeps all rows of both tables: let this one keep those of one table.</source>
+        <translation>MySQL/MariaDB n’a pas de jointure qui garde toutes les lignes des deux tables&#xa0;: faites en sorte que celle-ci garde celles d’une seule table.</translation>
+    </message>
+    <message>
+        <source>PostgreSQL keeps all rows of both tables only where a join asks for equal values: choose the operator =, or let the join keep the rows of one table.</source>
+        <translation>PostgreSQL ne garde toutes les lignes des deux tables que si la jointure demande des valeurs égales&#xa0;: choisissez l’opérateur =, ou faites en sorte que la jointure garde les lignes d’une seule table.</translation>
+    </message>
+    <message>
+        <source>These are more conditions than SQLite takes, which is about 900: write a long list of values as In (1, 2, 3).</source>
+        <translation>Ces conditions sont plus nombreuses que SQLite ne l’accepte, soit environ 900&#xa0;: écrivez une longue liste de valeurs sous la forme In (1, 2, 3).</translation>
+    </message>
+    <message>
+        <source>%1 takes no name that is empty: write one.</source>
+        <translation>%1 n’accepte pas de nom vide&#xa0;: écrivez un nom.</translation>
+    </message>
+    <message>
+        <source>%1 takes no name with the character zero in it: choose another one.</source>
+        <translation>%1 n’accepte pas de nom qui contient le caractère zéro&#xa0;: choisissez un autre nom.</translation>
+    </message>
+    <message>
+        <source>%1 takes no name with half a character in it: type it afresh.</source>
+        <translation>%1 n’accepte pas de nom qui contient un demi-caractère&#xa0;: saisissez le nom à nouveau.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; is too long for %2, which takes %3 bytes (one for a letter from A to Z, more for most others): choose a shorter one.</source>
+        <translation>Le nom «&#xa0;%1&#xa0;» est trop long pour %2, qui accepte %3 octets (un pour une lettre de A à Z, plus pour la plupart des autres caractères)&#xa0;: choisissez un nom plus court.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; is too long for %2, which takes %3 characters: choose a shorter one.</source>
+        <translation>Le nom «&#xa0;%1&#xa0;» est trop long pour %2, qui accepte %3 caractères&#xa0;: choisissez un nom plus court.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; has a rare character in it that %2 does not take, such as an emoji: write it without.</source>
+        <translation>Le nom «&#xa0;%1&#xa0;» contient un caractère rare que %2 n’accepte pas, comme un emoji&#xa0;: écrivez le nom sans ce caractère.</translation>
+    </message>
+    <message>
+        <source>The name &quot;%1&quot; ends with a blank, which %2 does not take: write it without.</source>
+        <translation>Le nom «&#xa0;%1&#xa0;» se termine par un espace, ce que %2 n’accepte pas&#xa0;: écrivez le nom sans cet espace.</translation>
+    </message>
+    <message>
+        <source>* and % are ordinary characters here, write Like before a pattern, or quotes around a text</source>
+        <translation>* et % sont ici des caractères ordinaires, écrivez Like devant un motif, ou mettez des guillemets autour d’un texte</translation>
+    </message>
+    <message>
+        <source>a value</source>
+        <translation>une valeur</translation>
+    </message>
+    <message>
+        <source>this is no date and time, write it like 2024-12-31 or 2024-12-31 23:59</source>
+        <translation>ce n’est pas une date et une heure, écrivez-les comme 2024-12-31 ou 2024-12-31 23:59</translation>
+    </message>
+    <message>
+        <source>%1 is not from %2 to %3</source>
+        <translation>%1 n’est pas compris entre %2 et %3</translation>
+    </message>
+    <message>
+        <source>%1 is not the letter %2 and a number from 1 to %3</source>
+        <translation>%1 n’est pas la lettre %2 suivie d’un nombre de 1 à %3</translation>
+    </message>
+    <message>
+        <source>%1 is beyond the last key %2 of its kind</source>
+        <translation>%1 dépasse %2, la dernière clé de son genre</translation>
+    </message>
+    <message>
+        <source>%1 is used before already</source>
+        <translation>%1 est déjà utilisé plus haut</translation>
+    </message>
+    <message>
+        <source>%1 is empty</source>
+        <translation>%1 est vide</translation>
+    </message>
+    <message>
+        <source>%1 is the name of another table too</source>
+        <translation>%1 est aussi le nom d’une autre table</translation>
+    </message>
+    <message>
+        <source>%1 does not begin with the entry &quot;*&quot;</source>
+        <translation>%1 ne commence pas par l’entrée «&#xa0;*&#xa0;»</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no table</source>
+        <translation>%1 n’est la clé d’aucune table</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no column</source>
+        <translation>%1 n’est la clé d’aucune colonne</translation>
+    </message>
+    <message>
+        <source>%1 is the key of no column of that table</source>
+        <translation>%1 n’est la clé d’aucune colonne de cette table</translation>
+    </message>
+    <message>
+        <source>%1 is no type of join</source>
+        <translation>%1 n’est pas un type de jointure</translation>
+    </message>
+    <message>
+        <source>%1 is no comparison</source>
+        <translation>%1 n’est pas une comparaison</translation>
+    </message>
+    <message>
+        <source>%1 is no sort order</source>
+        <translation>%1 n’est pas un ordre de tri</translation>
+    </message>
+    <message>
+        <source>%1 is less than the first row, %2</source>
+        <translation>%1 est inférieur à la première ligne, %2</translation>
+    </message>
+    <message>
+        <source>%1 does not come behind the row before it</source>
+        <translation>%1 ne vient pas après la ligne précédente</translation>
+    </message>
+    <message>
+        <source>%1 is no place in the text behind the name before it</source>
+        <translation>%1 n’est pas un endroit du texte situé après le nom précédent</translation>
     </message>
 </context>
 <context>
@@ -794,6 +995,99 @@
     <message>
         <source>Re&amp;name…</source>
         <translation>Re&amp;nommer…</translation>
+    </message>
+    <message>
+        <source>(None)</source>
+        <comment>no sort order</comment>
+        <translation>(Aucun)</translation>
+    </message>
+    <message>
+        <source>Ascending</source>
+        <translation>Croissant</translation>
+    </message>
+    <message>
+        <source>Descending</source>
+        <translation>Décroissant</translation>
+    </message>
+    <message>
+        <source>Visible</source>
+        <comment>an output column</comment>
+        <translation>Visible</translation>
+    </message>
+    <message>
+        <source>Not Visible</source>
+        <translation>Non visible</translation>
+    </message>
+    <message>
+        <source>Invisible</source>
+        <translation>Invisible</translation>
+    </message>
+    <message>
+        <source>&amp;Set</source>
+        <comment>the button of a cell&apos;s editor</comment>
+        <translation>&amp;OK</translation>
+    </message>
+    <message>
+        <source>Remove the table</source>
+        <translation>Retirer la table</translation>
+    </message>
+    <message>
+        <source>key column</source>
+        <comment>an entry of a table</comment>
+        <translation>colonne clé</translation>
+    </message>
+    <message>
+        <source>comes out</source>
+        <comment>an entry of a table, in the rows</comment>
+        <translation>colonne de sortie</translation>
+    </message>
+    <message>
+        <source>Add field…</source>
+        <translation>Ajouter un champ…</translation>
+    </message>
+    <message>
+        <source>Type to find a field</source>
+        <translation>Tapez pour trouver un champ</translation>
+    </message>
+    <message>
+        <source>Field</source>
+        <translation>Champ</translation>
+    </message>
+    <message>
+        <source>Fields</source>
+        <translation>Champs</translation>
+    </message>
+    <message>
+        <source>column %1</source>
+        <translation>colonne %1</translation>
+    </message>
+    <message>
+        <source>Tables and joins</source>
+        <translation>Tables et jointures</translation>
+    </message>
+    <message>
+        <source>Output columns</source>
+        <translation>Colonnes de sortie</translation>
+    </message>
+    <message>
+        <source>Scroll across</source>
+        <translation>Défilement horizontal</translation>
+    </message>
+    <message>
+        <source>Scroll down</source>
+        <translation>Défilement vertical</translation>
+    </message>
+    <message>
+        <source>Back to the origin</source>
+        <translation>Retour à l’origine</translation>
+    </message>
+    <message>
+        <source>Divider of canvas and grid</source>
+        <translation>Séparateur entre la zone de dessin et la grille</translation>
+    </message>
+    <message>
+        <source>Drag to give the canvas or the grid more room</source>
+        <translation>Faites glisser pour donner plus de place à la zone de dessin ou à la grille</translation>
     </message>
 </context>
 <context>
@@ -1320,6 +1614,13 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
+    <name>zandor::designer::GridHint</name>
+    <message>
+        <source>Double-click a column of a table, or drag it here, to choose what comes out. Until then all columns do.</source>
+        <translation>Double-cliquez sur une colonne d’une table, ou faites-la glisser ici, pour choisir les colonnes de sortie. D’ici là, toutes les colonnes sont produites.</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
@@ -1512,6 +1813,10 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>&amp;Ask later</source>
         <translation>&amp;Demander plus tard</translation>
+    </message>
+    <message>
+        <source>The designer ended unexpectedly, and the changes that were kept safe cannot be read. They stay in the file &quot;%1&quot;.</source>
+        <translation>Le programme s’est terminé de façon inattendue, et les modifications mises en sûreté ne peuvent pas être lues. Elles restent dans le fichier «&#xa0;%1&#xa0;».</translation>
     </message>
 </context>
 <context>
@@ -1743,6 +2048,14 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
         <source>Stop what is running, on the database too (Esc)</source>
         <translation>Arrêter ce qui est en cours, sur la base de données aussi (Échap)</translation>
     </message>
+    <message>
+        <source>The query finds no rows.</source>
+        <translation>La requête ne trouve aucune ligne.</translation>
+    </message>
+    <message>
+        <source>A text has to be the same as a whole, and on most databases in capital and small letters: Like *berlin* finds Berlin wherever it stands.</source>
+        <translation>Un texte doit être identique en entier et, dans la plupart des bases de données, jusqu’aux majuscules et minuscules&#xa0;: Like *berlin* trouve Berlin où qu’il se trouve.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -1800,6 +2113,10 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>The rows would fill the disk with the folder &quot;%1&quot;: make room there, or ask for fewer rows.</source>
         <translation>Les lignes rempliraient le disque du dossier «&#xa0;%1&#xa0;»&#xa0;: faites-y de la place, ou demandez moins de lignes.</translation>
+    </message>
+    <message>
+        <source>The rows cannot be written</source>
+        <translation>Les lignes ne peuvent pas être écrites</translation>
     </message>
 </context>
 <context>
@@ -2005,6 +2322,10 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
             <numerusform>Déplacer %n colonnes</numerusform>
         </translation>
     </message>
+    <message>
+        <source>Resize column %1</source>
+        <translation>Redimensionner la colonne %1</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::TableAdding</name>
@@ -2193,89 +2514,6 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
         <translation>Il n’y a pas de dialecte «&#xa0;%1&#xa0;»&#xa0;; sont connus sqlite, postgresql, mysql, sqlserver et standard.</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::Canvas</name>
-    <message>
-        <source>Tables and joins</source>
-        <translation>Tables et jointures</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::CanvasScrollBar</name>
-    <message>
-        <source>Scroll across</source>
-        <translation>Défilement horizontal</translation>
-    </message>
-    <message>
-        <source>Scroll down</source>
-        <translation>Défilement vertical</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::ColumnListModel</name>
-    <message>
-        <source>key column</source>
-        <translation>colonne clé</translation>
-    </message>
-    <message>
-        <source>comes out</source>
-        <translation>colonne de sortie</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::FieldTitles</name>
-    <message>
-        <source>Add field…</source>
-        <translation>Ajouter un champ…</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::GridModel</name>
-    <message>
-        <source>column %1</source>
-        <translation>colonne %1</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::GridWidget</name>
-    <message>
-        <source>Output columns</source>
-        <translation>Colonnes de sortie</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::HomeButton</name>
-    <message>
-        <source>Back to the origin</source>
-        <translation>Retour à l’origine</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::PaneHandle</name>
-    <message>
-        <source>Divider of canvas and grid</source>
-        <translation>Séparateur entre la zone de dessin et la grille</translation>
-    </message>
-    <message>
-        <source>Drag to give the canvas or the grid more room</source>
-        <translation>Faites glisser pour donner plus de place à la zone de dessin ou à la grille</translation>
-    </message>
-</context>
-<context>
-    <name>platform::qt::PickListWidget</name>
-    <message>
-        <source>Type to find a field</source>
-        <translation>Tapez pour trouver un champ</translation>
-    </message>
-    <message>
-        <source>Field</source>
-        <translation>Champ</translation>
-    </message>
-    <message>
-        <source>Fields</source>
-        <translation>Champs</translation>
     </message>
 </context>
 </TS>

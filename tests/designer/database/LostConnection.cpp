@@ -46,7 +46,7 @@ protected:
     }
 
     /// Asks for the columns as the panels do; what went wrong.
-    std::optional<QString> read() {
+    std::optional<reader::Error> read() {
         return takeTables(database, designer::readTables(database.connector(), {{towns}, {}}));
     }
 
