@@ -76,7 +76,7 @@ TEST(AMessage, HasMessagesInItsPlacesThatAreTranslatedToo) {
 TEST(AMessage, KeepsNamesThatLookLikePlaces) {
     EXPECT_EQ(say<MessageCode::cartesianProduct>(u"%2", u"%1").text(),
               u"No join connects %2 with %1, so that every row of one comes with every row of the "
-              u"other: draw a join between them, or delete one.");
+              u"other: draw a join between them, add the table that lies between, or delete one.");
 }
 
 TEST(AMessage, IsOneLineWhateverNamesAreInIt) {

@@ -46,8 +46,11 @@ protected:
     }
 
     /// Asks for the columns as the panels do; what went wrong.
-    std::optional<reader::Error> read() {
-        return takeTables(database, designer::readTables(database.connector(), {{towns}, {}}));
+    std::optional<QString> read() {
+        const auto error =
+            takeTables(database, designer::readTables(database.connector(), {{towns}, {}}));
+        if (!error) return {};
+        return error->text();
     }
 
     QString bannerText() { return banner->findChild<QLabel*>()->text(); }

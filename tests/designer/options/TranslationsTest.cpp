@@ -130,9 +130,11 @@ TEST(TheTranslations, KnowWhatTheSourcesSay) {
     QProcess lupdate;
     lupdate.setWorkingDirectory(QStringLiteral(SOURCE_ROOT));
     lupdate.setProcessChannelMode(QProcess::MergedChannels);
-    lupdate.start(LUPDATE, {"-I", "src", "-no-ui-lines", "-locations", "none", "-no-obsolete",
-                            "-source-language", "en", "-extensions", "cpp,h", "src/designer",
-                            "src/platform/qt", "-ts", copy});
+    lupdate.start(LUPDATE, {"-I", "src", "-I", "src/frontends/qt/include", "-no-ui-lines",
+                            "-locations", "none", "-no-obsolete", "-source-language", "en",
+                            "-extensions", "cpp,h,def", "-tr-function-alias",
+                            "QT_TRANSLATE_NOOP+=ZANDOR_TEXT", "src/designer", "src/frontends/qt",
+                            "src/model", "-ts", copy});
     ASSERT_TRUE(lupdate.waitForFinished(120000));
     ASSERT_EQ(lupdate.exitCode(), 0);
     EXPECT_THAT(sourcesIn(copy), ContainerEq(sourcesIn(pathOf("de"))))
