@@ -138,7 +138,7 @@ void Zandor::ShowTablesAnew(const QueryPicture& picture) {
     }
     // The current table stays, and has an heir when it has gone.
     if (mTableFreeList->IsFree(mActiveTableIndex)) mActiveTableIndex = shown.heir();
-    if (mActiveTableIndex != 0) lstTable(mActiveTableIndex)->Activated(true);
+    if (mActiveTableIndex != 0) Hold(lstTable(mActiveTableIndex))->Activated(true);
 
     ShowJoinsAnew(picture, shown);
     OrganizeTables();
