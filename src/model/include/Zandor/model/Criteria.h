@@ -43,8 +43,9 @@ class ZANDOR_MODEL_EXPORT Criteria final
 public:
     static constexpr std::int16_t firstRow = 4;
 
-    /// `revision` is that of the definition.
-    explicit Criteria(std::shared_ptr<Revision> revision) : mRevision(std::move(revision)) {}
+    /// `revision` is that of the definition. Definitions of other models have none and leave it.
+    explicit Criteria(std::shared_ptr<Revision> revision = std::make_shared<Revision>())
+        : mRevision(std::move(revision)) {}
 
     /// Rows from the first to the last one that has a criterium.
     std::int32_t Count() const override;

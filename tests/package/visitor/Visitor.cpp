@@ -1,0 +1,152 @@
+#include <QAbstractButton>
+#include <QAbstractItemView>
+#include <QAccessible>
+#include <QApplication>
+#include <QDropEvent>
+#include <QGenericPlugin>
+#include <QMimeData>
+#include <QTextStream>
+#include <QTimer>
+#include <QWindow>
+
+#include <memory>
+
+// Somebody who sits before a program that has only its user's side: Qt loads the plug-in into it
+// (QT_QPA_GENERIC_PLUGINS=visitor), so that nothing in the program is there for its test. Once the
+// windows are on the screen he does what ZANDOR_VISIT says, one deed after another with "," between
+// them, and closes them:
+//
+//   see                    everything that the windows say, as a screen reader has it
+//   say PROPERTY           of each query designer
+//   set PROPERTY NUMBER    of the first one
+//   press NAME             the first button of that name
+//   drop X Y               the first row of the program's own list onto a place of the first one
+//
+// He knows the designer by its class's name alone, as the program may have its libraries in itself.
+
+namespace {
+
+QTextStream& out() {
+    static QTextStream stream(stdout);
+    return stream;
+}
+
+class Visitor : public QObject {
+public:
+    Visitor() {
+        // As soon as there is an event loop; until all windows stand it asks again.
+        connect(&mClock, &QTimer::timeout, this, [this] {
+            if (windowsStand()) visit();
+        });
+        QMetaObject::invokeMethod(
+            this, [this] { mClock.start(20); }, Qt::QueuedConnection);
+    }
+
+private:
+    static bool windowsStand() {
+        const auto windows = QGuiApplication::topLevelWindows();
+        return !windows.isEmpty() && std::ranges::all_of(windows, [](const QWindow* window) {
+            return !window->isVisible() || window->isExposed();
+        });
+    }
+
+    void visit() {
+        mClock.stop();
+        const QStringList deeds =
+            qEnvironmentVariable("ZANDOR_VISIT").split(',', Qt::SkipEmptyParts);
+        for (const QString& deed : deeds) {
+            QStringList words = deed.split(' ', Qt::SkipEmptyParts);
+            const QString verb = words.takeFirst();
+            if (!act(verb, words)) out() << "cannot " << deed << "\n";
+            // What follows from it comes by the event loop.
+            for (int n = 0; n < 3; ++n) QCoreApplication::processEvents();
+        }
+        out().flush();
+        QApplication::closeAllWindows();
+    }
+
+    bool act(const QString& verb, const QStringList& words) {
+        const auto designers = shown<QWidget>("ZandorWidget");
+        if (verb == u"see") return see();
+        if (designers.isEmpty() || words.isEmpty()) return false;
+        if (verb == u"say") {
+            for (const QWidget* designer : designers)
+                out() << words[0] << " " << designer->property(words[0].toLatin1()).toString()
+                      << "\n";
+            return true;
+        }
+        if (verb == u"set")
+            return designers[0]->setProperty(words[0].toLatin1(), words.at(1).toInt());
+        if (verb == u"press") {
+            for (auto* button : designers[0]->findChildren<QAbstractButton*>())
+                if (button->isVisible() && button->accessibleName() == words.join(' '))
+                    return button->click(), true;
+            return false;
+        }
+        return verb == u"drop" && drop(*designers[0], {words[0].toInt(), words.at(1).toInt()});
+    }
+
+    template <class T>
+    static QList<T*> shown(const char* kind) {
+        QList<T*> found;
+        for (QWidget* window : QApplication::topLevelWidgets()) {
+            QList<T*> all = window->findChildren<T*>();
+            if (auto* itself = qobject_cast<T*>(window)) all.prepend(itself);
+            for (T* each : all)
+                if (each->isVisible() && each->inherits(kind)) found.push_back(each);
+        }
+        return found;
+    }
+
+    static bool see() {
+        for (QWidget* window : QApplication::topLevelWidgets())
+            if (window->isVisible()) tell(QAccessible::queryAccessibleInterface(window));
+        return true;
+    }
+
+    static void tell(QAccessibleInterface* one) {
+        if (!one) return;
+        const QString name = one->text(QAccessible::Name), value = one->text(QAccessible::Value);
+        // A cell's name has its text in it, if there is one.
+        const bool isEmptyCell = one->role() == QAccessible::Cell && !name.contains(u':');
+        const bool isBlank = value.isEmpty() && (name.isEmpty() || isEmptyCell);
+        if (!isBlank) out() << name << (value.isEmpty() ? "" : ": ") << value << "\n";
+        for (int n = 0; n < one->childCount(); ++n) tell(one->child(n));
+    }
+
+    /// As the window system brings it: to the window, which looks for whoever takes it.
+    static bool drop(QWidget& designer, QPoint at) {
+        for (const auto* list : shown<QAbstractItemView>("QAbstractItemView")) {
+            if (designer.isAncestorOf(list)) continue;
+            const std::unique_ptr<QMimeData> data(
+                list->model()->mimeData({list->model()->index(0, 0)}));
+            QWindow* const window = designer.window()->windowHandle();
+            const QPoint place = designer.mapTo(designer.window(), at);
+            QDragEnterEvent enter(place, Qt::CopyAction, data.get(), Qt::LeftButton, {});
+            QCoreApplication::sendEvent(window, &enter);
+            QDragMoveEvent move(place, Qt::CopyAction, data.get(), Qt::LeftButton, {});
+            QCoreApplication::sendEvent(window, &move);
+            if (!move.isAccepted()) return false;
+            QDropEvent drop(place, Qt::CopyAction, data.get(), Qt::NoButton, {});
+            QCoreApplication::sendEvent(window, &drop);
+            return drop.isAccepted();
+        }
+        return false;
+    }
+
+    QTimer mClock;
+};
+
+class VisitorPlugin : public QGenericPlugin {
+    Q_OBJECT
+    Q_PLUGIN_METADATA(IID QGenericPluginFactoryInterface_iid FILE "visitor.json")
+
+public:
+    QObject* create(const QString& name, const QString&) override {
+        return name == u"visitor" ? new Visitor : nullptr;
+    }
+};
+
+} // namespace
+
+#include "Visitor.moc"
