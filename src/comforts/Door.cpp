@@ -88,6 +88,7 @@ void Door::changeField(std::int32_t column, const Field& field) {
     const auto record =
         control().DragRecord(field.table, element, element->ColumnItems().Item(field.entry));
     const auto chosen = record->ZDColumn();
+    if (!control().MayComeOut(chosen)) return;
     definition->Column(chosen);
     // A host asked for its columns may have moved this one.
     const std::int32_t now = columnOfKey(definition->Key());

@@ -42,6 +42,7 @@ public:
 
     /// Whether the grid is on the control at all.
     bool hasGrid() const { return !control().mOnlyJoin; }
+    bool isReadOnly() const { return control().ReadOnly(); }
     const MSFlexGridLib::MSFlexGrid& grid() const { return *control().sprColumn; }
     Ref<TalvikZandorLib::Zandor> model() { return control().Model(); }
     /// Than at the last call.

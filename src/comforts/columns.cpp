@@ -22,8 +22,9 @@ constexpr auto widestByHand = static_cast<float>(TalvikZandorLib::SizedDefinitio
 
 bool Comforts::columnMovable(std::int32_t column) {
     if (!mFlags.MovesColumns || column < 1) return false;
-    return act(u"columnMovable",
-               [&](Door& door) { return door.keepsOrder() && door.definitionOf(column); });
+    return act(u"columnMovable", [&](Door& door) {
+        return !door.isReadOnly() && door.keepsOrder() && door.definitionOf(column);
+    });
 }
 
 bool Comforts::columnMoved(std::int32_t column, std::int32_t position) {
@@ -72,7 +73,8 @@ void Comforts::resize(Door& door, std::int32_t column, std::int32_t width) {
     // As it was, should the model refuse.
     fit(door, column);
     const auto model = door.model();
-    const auto changed = door.storeWidth(column, width);
+    const auto changed =
+        door.isReadOnly() ? decltype(door.definitionOf(column))() : door.storeWidth(column, width);
     TalvikDBxZandor::require(door.model() == model);
     keep(number, width);
     if (const std::int32_t now = door.columnWith(number, column); now > 0) fit(door, now);

@@ -95,7 +95,7 @@ bool Comforts::cellTyped(const String& text) {
     return act(u"cellTyped", [&](Door& door) {
         const std::int32_t row = door.grid().Row();
         const std::int32_t column = door.grid().Col();
-        if (!door.hasGrid() || column == 0) return false;
+        if (!door.hasGrid() || column == 0 || door.isReadOnly()) return false;
         if (mFlags.OffersFields && row == row::field) return offerFields(door, column, text);
         if (mFlags.OffersFields && !door.isUsed(column)) return true;
         if (!mFlags.KeepsTyping || row == row::field || !door.isUsed(column)) return false;

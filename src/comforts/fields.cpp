@@ -45,7 +45,7 @@ bool Comforts::cellOpened() {
 /// Drops the list of all fields down over a column's first cell.
 bool Comforts::offerFields(Door& door, std::int32_t column, const String& typed) {
     door.closeEditors();
-    if (!door.isOpen()) return true;
+    if (!door.isOpen() || door.isReadOnly()) return true;
     auto fields = door.fields();
     // A column that has a field and no definition cannot be given another.
     if (fields.empty() || (door.isUsed(column) && !door.definitionOf(column))) return true;

@@ -28,8 +28,9 @@ void Comforts::offerRename() {
 }
 
 void Comforts::menuChecked(std::int16_t source) {
-    if (mRename)
-        mRename->Visible(mFlags.HasTitleMenu && source == TalvikDBxZandor::menuSource::table);
+    if (!mRename) return;
+    const bool overTable = source == TalvikDBxZandor::menuSource::table;
+    mRename->Visible(mFlags.HasTitleMenu && overTable && mDoor && !mDoor->isReadOnly());
 }
 
 } // namespace zandor::comforts

@@ -173,6 +173,26 @@ const Script scripts[] = {
          c.step([&] { c.user.pressCell(grid, left, 5, 1); });
          c.step([&] { c.user.key("txtValue", escape); });
      }},
+    {"a host that is asked",
+     [](HostedControl& c) {
+         c.step([&] { c.ask(); });
+         menuOn(c, orders, 4, "mnuTableDefinitionCopy");
+         menuOn(c, parts, 2, "mnuTableDefinitionPaste");
+         c.step([&] { c.user.dragToEntry(orders, 2, customers, 3); });
+         c.step([&] { c.user.dragToCell(orders, 2, grid, 1, 2); });
+         menuOnCell(c, 1, 1, "mnuColumnDefinitionDelete");
+         menuOnCell(c, 1, 1, "mnuHost1");
+         menuOnJoin(c, "mnuJoinDelete");
+         c.step([&] { c.user.closeTable(orders); });
+     }},
+    {"a drawing that is only read",
+     [](HostedControl& c) {
+         c.step([&] { c.user.pressCell(grid, left, 4, 1); });
+         c.step([&] { c.control().ReadOnly(true); });
+         menuOn(c, orders, 4, "mnuTableDefinitionCopy");
+         menuOnJoin(c, "mnuJoinShowDefinition", "cmdOk");
+         c.step([&] { c.control().ReadOnly(false); });
+     }},
     {"tables moved, sized and scrolled",
      [](HostedControl& c) {
          c.step([&] { c.user.moveTable(customers, 4500, 900); });

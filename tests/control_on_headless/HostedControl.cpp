@@ -138,6 +138,40 @@ void HostedControl::act() {
     }
 }
 
+/// Says yes to everything, and has two entries in the menu.
+class HostedControl::Answers final : public TalvikDBxZandor::Questions {
+public:
+    explicit Answers(HostedControl& hosted) : mHosted(hosted) {}
+    bool MayJoin(const TalvikDBxZandor::JoinEnd&, const TalvikDBxZandor::JoinEnd&) override {
+        return asked("MayJoin");
+    }
+    bool MayRemoveJoin(const Ref<TalvikZandorLib::ZDJoin>&) override {
+        return asked("MayRemoveJoin");
+    }
+    bool MayCloseTable(const Ref<TalvikZandorLib::ZDTable>&) override {
+        return asked("MayCloseTable");
+    }
+    bool MayComeOut(const Ref<TalvikZandorLib::ZDColumn>&) override { return asked("MayComeOut"); }
+    bool MayRemoveColumn(const Ref<TalvikZandorLib::ZDColumnDefinition>&) override {
+        return asked("MayRemoveColumn");
+    }
+    std::vector<TalvikDBxZandor::HostEntry>
+    MenuEntries(const TalvikDBxZandor::MenuPlace&) override {
+        asked("MenuEntries");
+        return {{u"One", [this] { asked("an entry"); }}, {u"Two", {}}};
+    }
+
+private:
+    bool asked(const std::string& question) {
+        mHosted.at(question);
+        return true;
+    }
+
+    HostedControl& mHosted;
+};
+
+void HostedControl::ask() { mControl->Ask(std::make_shared<Answers>(*this)); }
+
 void HostedControl::bind(const Ref<fake::Model>& shown) {
     mControl->P_SET_Zandor(std::shared_ptr<TalvikZandorLib::Zandor>(shown));
 }

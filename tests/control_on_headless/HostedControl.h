@@ -54,6 +54,8 @@ public:
     std::string broken();
 
     TalvikDBxZandor::Zandor& control() { return *mControl; }
+    /// From now on the control asks the host.
+    void ask();
     void bind(const zandor::platform::Ref<fake::Model>& model);
     void destroy();
 
@@ -69,6 +71,8 @@ public:
     std::function<void()> inDialog; ///< while the dialog stands open
 
 private:
+    class Answers;
+
     static bool reachesTheHost(const std::string& toolkitCall);
     void at(const std::string& place);
     void act();

@@ -53,7 +53,7 @@ void Zandor::lstTable_SelectionChanged(std::int16_t Index) {
 void Zandor::lstTable_ColumnMouseMove(std::int16_t Index, const Ref<ColumnItem>&,
                                       std::int16_t Button, std::int16_t) {
     Guard(u"lstTable_ColumnMouseMove", [&] {
-        if (Button != platform::leftButton) return;
+        if (Button != platform::leftButton || mReadOnly) return;
         mDragTableIndex = Index;
         // Held, because the drop may come while Drag still runs and unload the element.
         const auto before = Hold(lstTable.Find(Index));

@@ -199,6 +199,7 @@ void Zandor::lstTable_CloseClick(std::int16_t Index) {
         const auto element = Hold(lstTable(Index));
         const String name = element->Text();
         const auto table = TableOf(element);
+        if (!MayCloseTable(table)) return;
         model->DeleteTable(table);
         // A host may have shown what is left of its model already.
         if (Shows(Index, element))

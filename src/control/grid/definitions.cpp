@@ -36,6 +36,7 @@ void Zandor::InsertDragColumns(float X, float Y) {
 void Zandor::InsertRecords(const std::vector<Ref<clsDragColumn>>& records, std::int32_t column) {
     const auto model = Model();
     for (const auto& record : records) {
+        if (!MayComeOut(record->ZDColumn())) continue;
         String fieldName = Hold(record->Table())->Text() + u".";
         fieldName += Hold(record->Column())->Text();
         const std::int32_t binding = mBinding;
@@ -101,7 +102,8 @@ bool Zandor::MoveColumn(std::int32_t column, std::int32_t position) {
     bool result = false;
     Guard(u"MoveColumn", [&] {
         const auto ordered = Ordered();
-        if (!ordered || column < 1 || position < 1 || sprColumn->ColData(column) == 0) return;
+        if (mReadOnly || !ordered || column < 1 || position < 1 || sprColumn->ColData(column) == 0)
+            return;
         // No blank column comes between.
         std::int32_t last = sprColumn->Cols() - 1;
         while (sprColumn->ColData(last) == 0) --last;
@@ -161,6 +163,7 @@ void Zandor::mnuColumnDefinitionDelete_Click() {
         const auto model = Model();
         const std::int32_t number = sprColumn->ColData(column);
         const auto definition = DefinitionOf(column);
+        if (!MayRemoveColumn(definition)) return;
         // The host may have shown its model anew when it was asked.
         require(mModel == model.pointer() && sprColumn->ColData(column) == number);
         RemoveColumn(column);

@@ -34,6 +34,7 @@ void Zandor::sprColumn_MouseDown(std::int16_t Button, std::int16_t, float X, flo
 
 /// Opens the editor of the current cell.
 void Zandor::EditCell() {
+    if (mReadOnly) return;
     const std::int32_t row = sprColumn->Row();
     const String text = sprColumn->Text();
     if (row == row::sort)

@@ -8,6 +8,7 @@ void Zandor::PopupZandorMenu(std::int16_t source, float X, float Y) {
     Guard(u"PopupZandorMenu", [&] {
         Raise(Event::Activate);
         CheckMenus(source, X, Y);
+        OfferHostEntries(source, X, Y);
         // Window frameworks that watch the control's window learn that a menu is open.
         const std::uint32_t message = mToolkit->RegisterWindowMessage(u"TALVIKDISABLEVELT");
         std::int32_t scratch = 0;
@@ -48,6 +49,11 @@ void Zandor::CheckMenus(std::int16_t source, float X, float Y) {
             if (column >= 1 && !sprColumn->TextMatrix(row::field, column).empty())
                 mnuColumnDefinitionDelete->Enabled(true);
         }
+        if (mReadOnly)
+            for (const auto* change :
+                 {&mnuTableDefinitionPaste, &mnuTableDefinitionDelete, &mnuJoinDelete,
+                  &mnuColumnDefinitionPaste, &mnuColumnDefinitionDelete})
+                (*change)->Enabled(false);
         if (const auto checked = mHooks.MenuChecked) checked(source);
     });
 }

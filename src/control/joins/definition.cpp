@@ -58,15 +58,18 @@ void Zandor::mnuJoinShowDefinition_Click() {
         dialog.form->Caption(LNGJoinForm);
         const auto model = Model();
         const auto join = ModelJoin(*record);
-        join->CompareOperator(toInteger(record->CompareOperator()));
-        join->JoinType(toInteger(record->JoinType()));
+        if (!mReadOnly) {
+            join->CompareOperator(toInteger(record->CompareOperator()));
+            join->JoinType(toInteger(record->JoinType()));
+        }
 
         SetLanguageOfJoinDefinition(dialog);
         SetEnabledJoinTypes(dialog);
         SetEnabledJoinOperators(dialog);
         dialog.Join(join);
         dialog.JoinLine(record);
-        dialog.JoinModifyDisabled(mJoinModifyDisabled);
+        // The name says the opposite of what the number does: 0 leaves nothing to choose.
+        dialog.JoinModifyDisabled(mReadOnly ? std::int16_t{0} : mJoinModifyDisabled);
         dialog.form->ShowModal();
         if (!dialog.JoinIsModified()) return;
 

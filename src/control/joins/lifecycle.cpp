@@ -102,6 +102,7 @@ bool Zandor::AddNewJoin(const Ref<clsJoinLine>& record, const ZDTableRef& leftTa
 /// or it cannot be told from others; a join that the model refuses does not stay drawn.
 platform::Ref<clsJoinLine> Zandor::JoinTo(const clsDragColumn& source, const Held<Tabulet>& table,
                                           const Ref<ColumnItem>& target) {
+    if (!MayJoin(source, table, target)) return {};
     Ref<clsJoinLine> record;
     if (!DrawNewJoin(record, source.Table(), source.Column(), table, target, 0, 0)) return {};
     const auto rightTable = TableOf(table);
@@ -151,6 +152,7 @@ void Zandor::mnuJoinDelete_Click() {
         }
         const auto model = Model();
         const auto join = ModelJoin(*record);
+        if (!MayRemoveJoin(join)) return;
         require(Draws(record));
         RemoveJoin(record);
         const String key = join->Key();

@@ -139,6 +139,11 @@ void Tabulet::Activated(bool value) {
     mActivated = value;
 }
 
+void Tabulet::Locked(bool value) {
+    called("Locked");
+    mLocked = value;
+}
+
 void Tabulet::Font(const platform::Font& value) {
     called("Font");
     mLook.font = value;
@@ -152,6 +157,7 @@ void Tabulet::Images(const Ref<platform::ImageList>& value) {
 void Tabulet::takeLookOf(const Tabulet& pattern) {
     mLook.font = pattern.mLook.font;
     mImages = pattern.mImages;
+    mLocked = pattern.mLocked;
 }
 
 std::int32_t Tabulet::TableHandle() const {

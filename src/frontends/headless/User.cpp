@@ -180,19 +180,21 @@ Tabulet& User::dragFrame(const std::string& name, const Bounds& by) {
 
 void User::moveTable(const std::string& name, float left, float top) {
     const Bounds at = reach<Tabulet>(name).placement();
+    if (reach<Tabulet>(name).locked()) return;
     auto& table = dragFrame(name, {left - at.Left, top - at.Top, 0, 0});
     if (table.events.Moved) table.events.Moved(table.index);
 }
 
 void User::resizeTable(const std::string& name, float width, float height) {
     const Bounds at = reach<Tabulet>(name).placement();
+    if (reach<Tabulet>(name).locked()) return;
     auto& table = dragFrame(name, {0, 0, width - at.Width, height - at.Height});
     if (table.events.Resized) table.events.Resized(table.index);
 }
 
 void User::closeTable(const std::string& name) {
     auto& table = reach<Tabulet>(name);
-    if (table.events.CloseClick) table.events.CloseClick(table.index);
+    if (!table.locked() && table.events.CloseClick) table.events.CloseClick(table.index);
 }
 
 void User::scrollList(const std::string& name, std::int32_t firstEntry) {

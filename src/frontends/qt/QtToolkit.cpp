@@ -226,8 +226,10 @@ Ref<TalvikTabulet::Tabulet> QtToolkit::makeTabulet(const Design& design, std::in
         holder && holder->widget() && holder->widget()->testAttribute(Qt::WA_SetFont))
         box->setFont(holder->widget()->font());
     auto table = std::make_shared<TabuletAdapter>(box, mFocus, mTables, index, events);
-    if (const auto* shown = dynamic_cast<const TabuletAdapter*>(pattern))
+    if (const auto* shown = dynamic_cast<const TabuletAdapter*>(pattern)) {
         table->Images(shown->images());
+        table->Locked(shown->isLocked());
+    }
     return table;
 }
 

@@ -160,6 +160,10 @@ void TabuletAdapter::Activated(bool value) {
     if (mWidget) mWidget->setCurrent(value);
 }
 
+void TabuletAdapter::Locked(bool value) {
+    if (mWidget) mWidget->setLocked(value);
+}
+
 void TabuletAdapter::Font(const platform::Font& value) {
     if (mWidget) setFont(*mWidget, value);
 }

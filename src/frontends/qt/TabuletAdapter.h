@@ -38,9 +38,11 @@ public:
     bool Visible() const override { return mVisible; }
     void Visible(bool value) override;
     void Activated(bool value) override;
+    void Locked(bool value) override;
     void Font(const platform::Font& value) override;
     void Images(const Ref<ImageList>& value) override { mImages = value; }
     const Ref<ImageList>& images() const { return mImages; }
+    bool isLocked() const { return mWidget && mWidget->isLocked(); }
     std::int32_t TableHandle() const override { return mHandle; }
     TalvikTabulet::ColumnList& ColumnItems() override { return mEntries; }
     Ref<TalvikTabulet::ColumnItem> ColumnAt(float X, float Y) const override;

@@ -151,6 +151,13 @@ void TabuletWidget::setNote(const QString& note) {
     update(titleBar());
 }
 
+void TabuletWidget::setLocked(bool locked) {
+    mLocked = locked;
+    mClose->setVisible(!locked);
+    unsetCursor();
+    update(titleBar());
+}
+
 void TabuletWidget::setCurrent(bool current) {
     if (mCurrent == current) return;
     mCurrent = current;
@@ -163,7 +170,8 @@ QSize TabuletWidget::smallest() const {
 
 QRect TabuletWidget::titlePlace() const {
     const int sign = mNote.isEmpty() ? 0 : mTitleHeight - 4;
-    return titleBar().adjusted(border + 4 + sign, 0, -mTitleHeight, 0);
+    const int cross = isLocked() ? border : mTitleHeight;
+    return titleBar().adjusted(border + 4 + sign, 0, -cross, 0);
 }
 
 QFont TabuletWidget::titleFont() const {
@@ -248,7 +256,8 @@ bool TabuletWidget::moveOrResize(const QKeyEvent& event) {
     const QPoint arrow = arrowOf(event);
     const bool resize = held == (Qt::AltModifier | Qt::ShiftModifier) ||
                         held == (Qt::ControlModifier | Qt::ShiftModifier);
-    if (arrow.isNull() || !mListener || !(resize || held == Qt::AltModifier)) return false;
+    if (arrow.isNull() || !mListener || isLocked() || !(resize || held == Qt::AltModifier))
+        return false;
     Qt::Edges edges;
     if (resize) edges = arrow.x() != 0 ? Qt::RightEdge : Qt::BottomEdge;
     const QPointer<TabuletWidget> alive = this;
@@ -279,6 +288,7 @@ Qt::Edges TabuletWidget::edgesAt(QPoint at) const {
 void TabuletWidget::mousePressEvent(QMouseEvent* event) {
     raise();
     if (event->button() != Qt::LeftButton) return;
+    if (isLocked()) return mList->setFocus(Qt::MouseFocusReason);
     mEdges = edgesAt(event->position().toPoint());
     mGesture = mEdges ? Gesture::resize : Gesture::move;
     mPressedAt = event->globalPosition();
@@ -291,7 +301,7 @@ void TabuletWidget::mouseMoveEvent(QMouseEvent* event) {
     // The release may have gone to a message box that came up in between.
     if (!(event->buttons() & Qt::LeftButton)) endGesture();
     if (mGesture == Gesture::none) {
-        setCursor(cursorFor(edgesAt(event->position().toPoint())));
+        if (!isLocked()) setCursor(cursorFor(edgesAt(event->position().toPoint())));
         return;
     }
     const QPointF way = event->globalPosition() - mPressedAt;

@@ -52,6 +52,9 @@ public:
     /// What is wrong with the table, as a sign in its title and a tooltip over it; empty: nothing.
     void setNote(const QString& note);
     const QString& note() const { return mNote; }
+    /// Neither moved, nor resized, nor closed by the user, and nothing that offers it.
+    void setLocked(bool locked);
+    bool isLocked() const { return mLocked; }
     void setCurrent(bool current);
     bool isCurrent() const { return mCurrent; }
 
@@ -97,6 +100,7 @@ private:
     QString mTitle;
     QString mNote;
     bool mCurrent = false;
+    bool mLocked = false;
     int mTitleHeight = 0;
     Gesture mGesture = Gesture::none;
     Qt::Edges mEdges;

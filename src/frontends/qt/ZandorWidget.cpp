@@ -1,5 +1,6 @@
 #include <Zandor/ZandorWidget.h>
 
+#include "frontends/qt/Canvas.h"
 #include "frontends/qt/CanvasItems.h"
 #include "frontends/qt/GridWidget.h"
 #include "frontends/qt/JoinName.h"
@@ -11,6 +12,7 @@
 
 #include <Zandor/platform/Numbers.h>
 #include <Zandor/qt/Text.h>
+#include <Zandor/qt/Twips.h>
 
 #include <QGuiApplication>
 #include <QInputMethod>
@@ -107,6 +109,29 @@ ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
     };
     mToolkit->grid()->handle().setMover([this](int down) { moveDivider(down); });
     mControl->UserControl_Resize();
+}
+
+void ZandorWidget::setQuestions(std::shared_ptr<TalvikDBxZandor::Questions> questions) {
+    mControl->Ask(std::move(questions));
+}
+
+bool ZandorWidget::isReadOnly() const { return mControl->ReadOnly(); }
+
+void ZandorWidget::setReadOnly(bool readOnly) { mControl->ReadOnly(readOnly); }
+
+QPointF ZandorWidget::toCanvas(QPointF place) const {
+    const QPointF onCanvas = place - canvasOrigin();
+    return {platform::qt::toTwips(onCanvas.x()), platform::qt::toTwips(onCanvas.y())};
+}
+
+QPoint ZandorWidget::fromCanvas(QPointF twips) const {
+    return canvasOrigin() + QPoint(platform::qt::toPixels(static_cast<float>(twips.x())),
+                                   platform::qt::toPixels(static_cast<float>(twips.y())));
+}
+
+/// Where the canvas begins in this widget, by how far it is scrolled.
+QPoint ZandorWidget::canvasOrigin() const {
+    return mToolkit->view().canvas()->mapTo(this, QPoint());
 }
 
 double ZandorWidget::upperPaneShare() const { return mControl->UpperPaneShare(); }

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/Questions.h>
 #include <Zandor/TalvikZandorLib.h>
 #include <Zandor/control/ControlArray.h>
 #include <Zandor/control/Events.h>
@@ -169,6 +170,15 @@ public:
     /// interface. Kept within 0.05 and 0.95; what is no number changes nothing.
     float UpperPaneShare() const { return mUpperPaneShare; }
     void UpperPaneShare(float share);
+
+    /// Whether the user only looks: the canvas scrolls, entries are selected and copied, joins tell
+    /// what they are; tables stand where they stand, and nothing comes into the model but what is
+    /// selected. What the host does itself is as ever. Not part of the public interface.
+    bool ReadOnly() const { return mReadOnly; }
+    void ReadOnly(bool value);
+
+    /// Whom to ask before what the user does is done; nothing, as at first: nobody.
+    void Ask(std::shared_ptr<Questions> questions) { mQuestions = std::move(questions); }
 
     /// Drops every table and replaces the model by an empty one.
     void Terminate();
@@ -416,6 +426,21 @@ private:
     void ClearColumn(std::int32_t column);
     void FitColumn(std::int32_t column, const String& fieldName);
 
+    // What the host says
+    template <class Question>
+    auto Answer(Question question);
+    template <class T>
+    bool May(bool (Questions::*question)(const Ref<T>&), const Ref<T>& about);
+    bool MayJoin(const clsDragColumn& source, const Held<Tabulet>& table,
+                 const Ref<ColumnItem>& target);
+    bool MayRemoveJoin(const Ref<TalvikZandorLib::ZDJoin>& join);
+    bool MayCloseTable(const Ref<TalvikZandorLib::ZDTable>& table);
+    bool MayComeOut(const ZDColumnRef& column);
+    bool MayRemoveColumn(const Ref<TalvikZandorLib::ZDColumnDefinition>& definition);
+    MenuPlace PlaceOfMenu(std::int16_t source, float X, float Y);
+    void OfferHostEntries(std::int16_t source, float X, float Y);
+    void mnuHost_Click(std::size_t entry);
+
     // Context menu
     void PopupZandorMenu(std::int16_t source, float X, float Y);
     void CheckMenus(std::int16_t source, float X, float Y);
@@ -427,12 +452,14 @@ private:
     const Given<platform::Toolkit> mToolkit;
     const Given<TalvikZandorLib::Library> mLibrary;
     const Given<ZandorEvents> mEvents;
+    std::shared_ptr<Questions> mQuestions;
     Hooks mHooks;
     platform::Words mWords;
 
     std::int16_t mDebugSwitch = 1;
     bool mTraces = true; ///< false for what is not traced even with DebugSwitch
     std::int16_t mJoinModifyDisabled = 0;
+    bool mReadOnly = false;
     bool mOnlyJoin = true;
     static constexpr float half = 0.5F;
     float mUpperPaneShare = half;
@@ -453,6 +480,7 @@ private:
     float mPopupX = 0;
     float mPopupY = 0;
     bool mMenuPrepared = false;
+    std::vector<HostEntry> mHostEntries; ///< of the menu that is open, or was last
 
     // Constituent controls, in stacking order
     const TalvikTabulet::TabuletEvents mTableEvents;
@@ -484,6 +512,7 @@ private:
     Part<platform::MenuEntry> mnuTableDefinitionSep;
     Part<platform::MenuEntry> mnuColumnDefinitionPaste;
     Part<platform::MenuEntry> mnuColumnDefinitionDelete;
+    std::vector<Part<platform::MenuEntry>> mnuHost; ///< made as they are needed
 };
 
 } // namespace TalvikDBxZandor

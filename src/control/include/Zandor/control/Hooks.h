@@ -8,13 +8,6 @@ namespace TalvikDBxZandor {
 
 namespace platform = zandor::platform;
 
-/// What the menu opens over. No entry is made ready for any other number.
-namespace menuSource {
-inline constexpr std::int16_t table = 0;
-inline constexpr std::int16_t canvas = 1;
-inline constexpr std::int16_t grid = 2;
-} // namespace menuSource
-
 /// A join that has just been placed on the canvas, with the names that stand there.
 struct PlacedJoin {
     platform::String LeftTable;

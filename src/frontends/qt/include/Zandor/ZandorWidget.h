@@ -116,6 +116,19 @@ public:
     void repaint();
 
     // Beside the interface
+    /// Whom to ask before what the user does is done, and for entries of the menu; nothing, as at
+    /// first: nobody. Questions.h has the rules. Takes effect with the next act.
+    void setQuestions(std::shared_ptr<TalvikDBxZandor::Questions> questions);
+    /// Whether the user only looks: the canvas scrolls, entries are selected and copied, joins tell
+    /// what they are; tables stand where they stand, cells open no editors, and nothing comes into
+    /// the model but what is selected. False at first. What the host does itself is as ever.
+    bool isReadOnly() const;
+    void setReadOnly(bool readOnly);
+    /// A place in this widget, in logical pixels, as one on the canvas, in twips, as tables have
+    /// theirs in the model; and back, to the nearest pixel. Goes with the scrolling, and beyond
+    /// what is in sight.
+    QPointF toCanvas(QPointF place) const;
+    QPoint fromCanvas(QPointF twips) const;
     /// The share of the height that the canvas has above the grid; half of it at first. Kept
     /// within 0.05 and 0.95.
     double upperPaneShare() const;
@@ -162,6 +175,7 @@ private:
     class Events;
     class House;
 
+    QPoint canvasOrigin() const;
     void queuePaint();
     void moveDivider(int down);
     void say(const zandor::platform::Words& words);

@@ -65,6 +65,9 @@ public:
     virtual bool Visible() const = 0;
     virtual void Visible(bool value) = 0;
     virtual void Activated(bool value) = 0;
+    /// Whether the user can neither move, nor resize, nor close it; nothing of that is offered
+    /// then.
+    virtual void Locked(bool value) = 0;
     virtual void Font(const platform::Font& value) = 0;
     /// What the images of its entries are taken from; it has none at first.
     virtual void Images(const Ref<platform::ImageList>& value) = 0;

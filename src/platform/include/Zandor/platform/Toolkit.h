@@ -47,9 +47,9 @@ public:
     virtual Ref<ImageList> makeImageList(const Design& design,
                                          const std::vector<Picture>& pictures) = 0;
 
-    /// Elements of control arrays stand inside design.Container. A table list takes font and images
-    /// from the pattern, the array's element 0 (nullptr when element 0 itself is made), and starts
-    /// invisible; `events` outlives the element.
+    /// Elements of control arrays stand inside design.Container. A table list takes font, images
+    /// and lock from the pattern, the array's element 0 (nullptr when element 0 itself is made),
+    /// and starts invisible; `events` outlives the element.
     virtual Ref<TalvikTabulet::Tabulet> makeTabulet(const Design& design, std::int16_t index,
                                                     const TalvikTabulet::Tabulet* pattern,
                                                     const TalvikTabulet::TabuletEvents& events) = 0;

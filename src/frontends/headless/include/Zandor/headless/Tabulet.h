@@ -69,6 +69,7 @@ public:
     bool Visible() const override;
     void Visible(bool value) override;
     void Activated(bool value) override;
+    void Locked(bool value) override;
     void Font(const platform::Font& value) override;
     void Images(const Ref<platform::ImageList>& value) override;
     std::int32_t TableHandle() const override;
@@ -86,6 +87,7 @@ public:
     ColumnItem& entry(std::int32_t position) const;
     const String& tag() const { return mTag; }
     bool activated() const { return mActivated; }
+    bool locked() const { return mLocked; }
     /// How often the list was completed.
     int completions() const { return mCompletions; }
 
@@ -97,7 +99,7 @@ public:
     TalvikTabulet::Point emptyPlace() const;
     /// Makes an entry the first visible row. Scroll fires when that changes anything.
     void scrollTo(std::int32_t position);
-    /// Its font and its images.
+    /// Its font, its images and its lock.
     void takeLookOf(const Tabulet& pattern);
     /// As the user leaves it with the mouse.
     void drag(const Bounds& bounds) { place(bounds); }
@@ -118,6 +120,7 @@ private:
     const std::int32_t mHandle;
     String mTag;
     bool mActivated = false;
+    bool mLocked = false;
     int mCompletions = 0;
     Ref<platform::ImageList> mImages;
     std::int32_t mFirstVisible = 1;

@@ -1,0 +1,182 @@
+#include "GridStage.h"
+
+namespace gridstage {
+
+namespace {
+
+/// A join, two output columns, every comfort and a user who is only to look.
+class ADrawingThatIsOnlyRead : public GridTest {
+protected:
+    ADrawingThatIsOnlyRead() {
+        orders->place(1000, 500, 2000, 2000);
+        customers->place(5000, 1500, 2000, 2000);
+        model->join(orders, u"CUSTOMER", customers, u"ID");
+        model->definition(customers, u"NAME", {u"'A'"});
+        model->definition(orders, u"TOTAL");
+        stage->comforts().setFlags(zandor::comforts::Flags::all());
+        control().JoinModifyDisabled(1);
+        control().ReadOnly(true);
+        bind();
+        changes.clear();
+        library.calls->onPass = [this](const std::string& call) {
+            if (call.ends_with("=") || call.find("Add") != std::string::npos ||
+                call.find("Remove") != std::string::npos ||
+                call.find("Delete") != std::string::npos)
+                changes.push_back(call);
+        };
+    }
+    ~ADrawingThatIsOnlyRead() override { library.calls->onPass = nullptr; }
+
+    bool editing() {
+        return shows("fraValue") || shows("fraSortOrder") || shows("fraVisibility") ||
+               (stage->exists("lstFields") && shows("lstFields"));
+    }
+    void expectUnchanged() {
+        EXPECT_EQ(changes, Names{});
+        EXPECT_EQ(stage->boxes, Boxes{});
+        EXPECT_FALSE(editing());
+    }
+    TalvikTabulet::Point middleOfTheLine() {
+        const auto line = stage->look("linJoin(1)");
+        return {(line.X1 + line.X2) / 2, (line.Y1 + line.Y2) / 2};
+    }
+    void menuOverTheLine(const std::string& entry = {}) {
+        willChoose(entry);
+        const auto at = middleOfTheLine();
+        stage->pressCanvas(right, at.X, at.Y);
+        stage->releaseCanvas(right, at.X, at.Y);
+    }
+
+    /// The entries of the menu seen last that can be chosen.
+    Names onOffer() {
+        std::erase_if(menu, [](const Stage::Entry& entry) { return !entry.visible; });
+        return enabled();
+    }
+
+    Names changes; ///< what was called of the model that writes
+};
+
+TEST_F(ADrawingThatIsOnlyRead, OpensNoEditor) {
+    for (const std::int32_t row : {fieldRow, synonymRow, sortRow, visibleRow, criteriaRow})
+        for (const std::int32_t col : {1, 2, 3}) {
+            press(left, row, col);
+            grid().Row(row);
+            grid().Col(col);
+            stage->editCell();
+            stage->typeInGrid(u" ");
+            stage->typeInGrid(u"x");
+            EXPECT_FALSE(editing()) << row << ", " << col;
+        }
+    stage->clickField(1);
+    stage->clickField(3);
+    expectUnchanged();
+}
+
+TEST_F(ADrawingThatIsOnlyRead, KeepsItsTablesWhereTheyAre) {
+    const auto before = stage->look("lstTable(1)").bounds;
+    stage->moveTable(1, 3000, 900);
+    stage->resizeTable(1, 2700, 2700);
+    EXPECT_EQ(stage->look("lstTable(1)").bounds, before);
+    expectUnchanged();
+}
+
+TEST_F(ADrawingThatIsOnlyRead, KeepsItsTables) {
+    stage->closeTable(1);
+    EXPECT_TRUE(shows("lstTable(1)"));
+    Backstage::lstTable_CloseClick(control(), 1);
+    EXPECT_TRUE(shows("lstTable(1)"));
+    expectUnchanged();
+}
+
+TEST_F(ADrawingThatIsOnlyRead, TakesNoDragAndNoDoubleClick) {
+    stage->selectEntries(1, {id});
+    changes.clear();
+    stage->doubleClickEntry(1, id);
+    EXPECT_EQ(fields(3), (Texts{u"NAME", u"TOTAL", u""}));
+    stage->pressEntry(1, id, left);
+    changes.clear(); // of the selection
+    stage->moveOverEntry(1, customer, left);
+    EXPECT_TRUE(Backstage::mDragColumns(control()).empty());
+    EXPECT_FALSE(stage->exists("linJoin(2)"));
+    expectUnchanged();
+}
+
+TEST_F(ADrawingThatIsOnlyRead, OffersOnlyWhatChangesNothing) {
+    copy(1, {id});
+    changes.clear();
+    menuOverEntry(2, name);
+    EXPECT_EQ(onOffer(), Names{"mnuTableDefinitionCopy"});
+    menuOverTheLine();
+    EXPECT_EQ(onOffer(), Names{"mnuJoinShowDefinition"});
+    menuOverCell(synonymRow, 1);
+    EXPECT_EQ(onOffer(), Names{});
+}
+
+TEST_F(ADrawingThatIsOnlyRead, ShowsTheDefinitionOfAJoin) {
+    int shown = 0;
+    stage->onDialog = [&] {
+        ++shown;
+        EXPECT_FALSE(stage->look("cboJoinType").enabled);
+        EXPECT_FALSE(stage->look("cboJoinCompareOperator").enabled);
+        stage->clickButton("cmdOk");
+    };
+    menuOverTheLine("mnuJoinShowDefinition");
+    EXPECT_EQ(shown, 1);
+    expectUnchanged();
+}
+
+TEST_F(ADrawingThatIsOnlyRead, KeepsTheOrderOfItsColumns) {
+    stage->dragField(2, 1);
+    grid().Col(2);
+    stage->moveCurrentColumn(-1);
+    EXPECT_FALSE(control().MoveColumn(2, 1));
+    EXPECT_EQ(fields(2), (Texts{u"NAME", u"TOTAL"}));
+    expectUnchanged();
+}
+
+TEST_F(ADrawingThatIsOnlyRead, ScrollsSelectsAndCopies) {
+    stage->scrollBarTo("hsbTable", 300);
+    EXPECT_EQ(control().VisibleFrameLeft(), 300);
+    stage->selectEntries(1, {total});
+    stage->pressEntry(1, total, left);
+    EXPECT_EQ(orders->column(u"TOTAL").activatedValue, 1);
+    copy(1, {total});
+    ASSERT_EQ(Backstage::mDragColumns(control()).size(), 1U);
+    EXPECT_EQ(Backstage::mDragColumns(control())[0]->Column()->Text(), u"TOTAL");
+}
+
+TEST_F(ADrawingThatIsOnlyRead, ShowsWhatItsHostChanges) {
+    model->table(u"NEW", {u"ID"})->place(3000, 3000, 1500, 1500);
+    control().ShowAnew();
+    const auto before = stage->look("lstTable(3)").bounds;
+    stage->moveTable(3, 600, 600);
+    EXPECT_EQ(stage->look("lstTable(3)").bounds, before);
+    control().SetCurrentTable(u"CUSTOMERS");
+    control().Terminate();
+    EXPECT_FALSE(stage->exists("lstTable(1)"));
+    EXPECT_EQ(stage->boxes, Boxes{});
+}
+
+TEST_F(ADrawingThatIsOnlyRead, IsWorkedInAgainOnceItMay) {
+    control().ReadOnly(false);
+    stage->moveTable(1, 3000, 900);
+    EXPECT_NEAR(orders->left, 3000, 15);
+    press(left, criteriaRow, 1);
+    EXPECT_TRUE(shows("fraValue"));
+    stage->closeTable(2);
+    EXPECT_EQ(model->tableCount(), 1);
+    EXPECT_EQ(stage->boxes, Boxes{});
+}
+
+TEST_F(ADrawingThatIsOnlyRead, KeepsWhatWasBeingTypedBefore) {
+    control().ReadOnly(false);
+    press(left, criteriaRow, 1);
+    stage->type("txtValue", u"'B'");
+    control().ReadOnly(true);
+    EXPECT_EQ(model->definitionAt(1).criterion(u"4"), u"'B'");
+    EXPECT_FALSE(editing());
+}
+
+} // namespace
+
+} // namespace gridstage
