@@ -4,7 +4,9 @@
 #include <QApplication>
 #include <QDropEvent>
 #include <QGenericPlugin>
+#include <QMenu>
 #include <QMimeData>
+#include <QMouseEvent>
 #include <QTextStream>
 #include <QTimer>
 #include <QWindow>
@@ -20,6 +22,8 @@
 //   say PROPERTY           of each query designer
 //   set PROPERTY NUMBER    of the first one
 //   press NAME             the first button of that name
+//   choose ENTRY X Y       an entry of the menu that a right click there opens; it is looked for by
+//                          its text, "&" and all
 //   drop X Y               the first row of the program's own list onto a place of the first one
 //
 // He knows the designer by its class's name alone, as the program may have its libraries in itself.
@@ -77,9 +81,11 @@ private:
         }
         if (verb == u"set")
             return designers[0]->setProperty(words[0].toLatin1(), words.at(1).toInt());
+        if (verb == u"choose") return choose(*designers[0], words);
         if (verb == u"press") {
-            for (auto* button : designers[0]->findChildren<QAbstractButton*>())
-                if (button->isVisible() && button->accessibleName() == words.join(' '))
+            const QString name = words.join(' ');
+            for (auto* button : shown<QAbstractButton>("QAbstractButton"))
+                if (button->accessibleName() == name || button->text() == name)
                     return button->click(), true;
             return false;
         }
@@ -112,6 +118,34 @@ private:
         const bool isBlank = value.isEmpty() && (name.isEmpty() || isEmptyCell);
         if (!isBlank) out() << name << (value.isEmpty() ? "" : ": ") << value << "\n";
         for (int n = 0; n < one->childCount(); ++n) tell(one->child(n));
+    }
+
+    /// The menu stands open until somebody chooses from it.
+    static bool choose(QWidget& designer, QStringList words) {
+        const QPoint at(words.takeAt(words.size() - 2).toInt(), words.takeLast().toInt());
+        bool found = false;
+        QTimer::singleShot(200, &designer, [&found, text = words.join(' ')] {
+            auto* const menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
+            if (!menu) return;
+            for (QAction* action : menu->actions()) {
+                if (action->text() != text || !action->isEnabled()) continue;
+                found = true;
+                menu->setActiveAction(action);
+                QKeyEvent enter(QEvent::KeyPress, Qt::Key_Return, {});
+                QCoreApplication::sendEvent(menu, &enter);
+                return;
+            }
+            menu->close();
+        });
+        QWidget* const part = designer.childAt(at);
+        const QPoint inside = part->mapFrom(&designer, at);
+        for (const auto type : {QEvent::MouseButtonPress, QEvent::MouseButtonRelease}) {
+            const bool down = type == QEvent::MouseButtonPress;
+            QMouseEvent click(type, inside, part->mapToGlobal(inside), Qt::RightButton,
+                              down ? Qt::RightButton : Qt::NoButton, {});
+            QCoreApplication::sendEvent(part, &click);
+        }
+        return found;
     }
 
     /// As the window system brings it: to the window, which looks for whoever takes it.
