@@ -8,4 +8,4 @@ endif()
 execute_process(COMMAND make -B -f ${SOURCES}/makefile/Makefile
         PREFIX=${PLACE}/${KIND} SOURCE=${SOURCES}/consumer/main.cpp STATIC=${static}
     WORKING_DIRECTORY ${folder} COMMAND_ERROR_IS_FATAL ANY)
-execute_process(COMMAND ${folder}/consumer ${SAMPLE} COMMAND_ERROR_IS_FATAL ANY)
+execute_process(COMMAND ${folder}/program ${SAMPLE} COMMAND_ERROR_IS_FATAL ANY)
