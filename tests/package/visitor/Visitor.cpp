@@ -24,6 +24,7 @@
 //   press NAME             the first button of that name
 //   choose ENTRY X Y       an entry of the menu that a right click there opens; it is looked for by
 //                          its text, "&" and all
+//   where NAME             where a part of that name stands in the first one
 //   drop X Y               the first row of the program's own list onto a place of the first one
 //
 // He knows the designer by its class's name alone, as the program may have its libraries in itself.
@@ -87,6 +88,15 @@ private:
             for (auto* button : shown<QAbstractButton>("QAbstractButton"))
                 if (button->accessibleName() == name || button->text() == name)
                     return button->click(), true;
+            return false;
+        }
+        if (verb == u"where") {
+            for (const auto* part : designers[0]->findChildren<QWidget*>())
+                if (part->isVisible() && part->accessibleName() == words.join(' ')) {
+                    const QPoint at = part->mapTo(designers[0], QPoint());
+                    out() << part->accessibleName() << " at " << at.x() << " " << at.y() << "\n";
+                    return true;
+                }
             return false;
         }
         return verb == u"drop" && drop(*designers[0], {words[0].toInt(), words.at(1).toInt()});
