@@ -9,6 +9,7 @@
 
 using namespace zandor;
 
+// [rules]
 /// Lets its user join what belongs together, and take no table away.
 class Rules : public TalvikDBxZandor::Questions {
 public:
@@ -21,6 +22,7 @@ public:
 private:
     static bool isKey(const TalvikDBxZandor::JoinEnd& end) { return end.Column->Marker(); }
 };
+// [rules]
 
 /// A drawing with rules of its own, or, as long as the box is ticked, one to look at alone.
 int main(int argc, char** argv) {

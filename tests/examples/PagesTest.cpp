@@ -36,10 +36,11 @@ TEST(ThePageAboutEmbedding, ShowsTheCodeThatIsCompiled) {
     shows("make", contentOf("tests/package/makefile/Makefile"));
     for (const char* name : {"sql", "text", "twips", "showing", "errors"})
         shows("cpp", part("tests/examples/EmbeddingTest.cpp", name));
+    shows("cpp", part("examples/read_only/main.cpp", "rules"));
     // Nothing is shown that is not among these.
     std::size_t shown = 0;
     for (const std::string fence : {"```cpp\n", "```cmake\n", "```make\n"})
         for (auto at = page.find(fence); at != std::string::npos; at = page.find(fence, at + 1))
             ++shown;
-    EXPECT_EQ(shown, 9U);
+    EXPECT_EQ(shown, 10U);
 }
