@@ -104,6 +104,7 @@ void QtToolkit::dismiss() {
 }
 
 void QtToolkit::MsgBox(const String& prompt, std::int32_t style, const String& title) {
+    if (mSilent) return;
     QWidget* const parent = window();
     showMessageBox(parent && parent->isVisible() ? parent : nullptr, prompt, style, title, this);
 }

@@ -25,6 +25,8 @@ public:
 
     /// The surface is about to go: boxes shown from now on stand on their own.
     void close() { mClosing = true; }
+    /// Boxes are left out.
+    void setSilent(bool silent) { mSilent = silent; }
     /// The control has ended: its boxes, its dialog, its menu and its drag end too, untold.
     void dismiss();
     /// What the parts made so far, and those made later, say.
@@ -88,6 +90,7 @@ private:
     QPointer<QWidget> mGrid;
     Words mWords;
     bool mClosing = false;
+    bool mSilent = false;
 };
 
 } // namespace zandor::platform::qt

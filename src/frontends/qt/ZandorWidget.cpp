@@ -4,6 +4,7 @@
 #include "frontends/qt/CanvasItems.h"
 #include "frontends/qt/GridWidget.h"
 #include "frontends/qt/JoinName.h"
+#include "frontends/qt/LaterLibrary.h"
 #include "frontends/qt/PaneHandle.h"
 #include "frontends/qt/QtToolkit.h"
 #include "frontends/qt/ShownText.h"
@@ -84,11 +85,17 @@ private:
 
 public:
     platform::qt::QtToolkit toolkit;
+    platform::qt::LaterLibrary library;
     Events events;
     std::optional<Zandor> control;
 };
 
 ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
+    : ZandorWidget(parent) {
+    setLibrary(library);
+}
+
+ZandorWidget::ZandorWidget(QWidget* parent)
     : QWidget(parent), mHouse(House::build(*this)), mToolkit(&mHouse->toolkit) {
     // The canvas has the same background, so that none sees where it ends.
     setAutoFillBackground(true);
@@ -96,7 +103,7 @@ ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
     setFocusPolicy(Qt::TabFocus);
     resize(sizeHint());
     mToolkit->drags().setKeeper(mHouse);
-    mHouse->control.emplace(*mToolkit, library, mHouse->events, mHouse);
+    mHouse->control.emplace(*mToolkit, mHouse->library, mHouse->events, mHouse);
     mControl = &*mHouse->control;
     mToolkit->comforts().attach(*mControl);
     mToolkit->view().setNamer([this](const platform::qt::CanvasLine& line) {
@@ -133,6 +140,10 @@ QPoint ZandorWidget::fromCanvas(QPointF twips) const {
 QPoint ZandorWidget::canvasOrigin() const {
     return mToolkit->view().canvas()->mapTo(this, QPoint());
 }
+
+void ZandorWidget::setLibrary(TalvikZandorLib::Library& library) { mHouse->library.set(library); }
+
+void ZandorWidget::setSilent(bool silent) { mToolkit->setSilent(silent); }
 
 double ZandorWidget::upperPaneShare() const { return mControl->UpperPaneShare(); }
 

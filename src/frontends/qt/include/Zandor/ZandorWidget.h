@@ -53,6 +53,8 @@ public:
     using ZDColumnDefinition = zandor::platform::Ref<TalvikZandorLib::ZDColumnDefinition>;
 
     explicit ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent = nullptr);
+    /// For forms (.ui), which know of a parent only: setLibrary comes next.
+    explicit ZandorWidget(QWidget* parent = nullptr);
     ~ZandorWidget() override;
 
     /// The control behind the widget, for hosts that prefer its C++ interface.
@@ -129,6 +131,13 @@ public:
     /// what is in sight.
     QPointF toCanvas(QPointF place) const;
     QPoint fromCanvas(QPointF twips) const;
+    /// Who makes the model's objects, for a widget that was made without: before its model is asked
+    /// for or set. Until then the model is an empty one, and a join or an output column that the
+    /// user makes in another is reported as error 91. The library outlives the widget.
+    void setLibrary(TalvikZandorLib::Library& library);
+    /// Leaves out the message boxes, errors and traces alike: for where nobody is at work with the
+    /// control, as in an editor of forms.
+    void setSilent(bool silent);
     /// The share of the height that the canvas has above the grid; half of it at first. Kept
     /// within 0.05 and 0.95.
     double upperPaneShare() const;
