@@ -27,6 +27,8 @@ const std::map<std::string, Houses> mayInclude = {
     {"comforts", {"comforts", "control", "platform"}},
     {"frontends/headless", {"frontends/headless", "comforts", "control", "platform"}},
     {"frontends/qt", {"frontends/qt", "comforts", "control", "platform"}},
+    {"frontends/qt_designer",
+     {"frontends/qt_designer", "frontends/qt", "model", "comforts", "control", "platform"}},
     {"model", {"model", "platform"}},
     {"reader", {"reader", "model", "platform"}},
     {"files", {"files", "model", "platform"}},

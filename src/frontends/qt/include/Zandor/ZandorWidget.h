@@ -40,7 +40,7 @@ class ZANDOR_WIDGETS_EXPORT ZandorWidget : public QWidget {
     Q_OBJECT
     ZANDOR_WIDGET_PROPERTIES(ZANDOR_DECLARE_TEXT, ZANDOR_DECLARE_FLAG, ZANDOR_DECLARE_NUMBER,
                              ZANDOR_DECLARE_FLAG, ZANDOR_DECLARE_NUMBER)
-    Q_PROPERTY(ZandorModel Zandor READ model WRITE setModel)
+    Q_PROPERTY(ZandorModel Zandor READ model WRITE setModel DESIGNABLE false)
     Q_PROPERTY(ZDJoin lastjoin READ lastjoin)
     Q_PROPERTY(ZDTable activetable READ activetable)
     Q_PROPERTY(ZDColumn ActiveColumn READ ActiveColumn)
