@@ -12,15 +12,15 @@ namespace platform = zandor::platform;
 
 /// What the menu opens over. No entry of the control's is made ready for any other number.
 namespace menuSource {
-inline constexpr std::int16_t table = 0;
-inline constexpr std::int16_t canvas = 1;
-inline constexpr std::int16_t grid = 2;
+inline constexpr std::int16_t table = 0;  ///< over a table's list
+inline constexpr std::int16_t canvas = 1; ///< over the canvas beside them
+inline constexpr std::int16_t grid = 2;   ///< over the grid
 } // namespace menuSource
 
 /// A column of a table on the canvas: one end of a join.
 struct JoinEnd {
-    platform::Ref<TalvikZandorLib::ZDTable> Table;
-    platform::Ref<TalvikZandorLib::ZDColumn> Column;
+    platform::Ref<TalvikZandorLib::ZDTable> Table;   ///< never nothing
+    platform::Ref<TalvikZandorLib::ZDColumn> Column; ///< one of its columns
 };
 
 /// Where the menu is about to open. What is not there is nothing.
@@ -32,14 +32,14 @@ struct MenuPlace {
     platform::Ref<TalvikZandorLib::ZDColumnDefinition> Definition; ///< of the grid's column
     std::int32_t Row = -1;                                         ///< of the grid, from 0
     float X = 0;                                                   ///< on the canvas, in twips
-    float Y = 0;
+    float Y = 0;                                                   ///< the same, downwards
 };
 
 /// An entry of the host's in the menu.
 struct HostEntry {
     platform::String Caption; ///< "-" makes a separator; an ampersand marks the mnemonic
-    std::function<void()> Chosen;
-    bool Enabled = true;
+    std::function<void()> Chosen; ///< runs when the menu has closed; may be empty
+    bool Enabled = true;          ///< whether it can be chosen
 };
 
 /// What a control asks its host before its user's acts are done, beside the events, which tell what
@@ -55,11 +55,13 @@ public:
 
     /// May a join be made, from the column that was dragged or copied to the one it came to?
     virtual bool MayJoin(const JoinEnd& left, const JoinEnd& right);
+    /// May a join be deleted?
     virtual bool MayRemoveJoin(const platform::Ref<TalvikZandorLib::ZDJoin>& join);
     /// May a table be closed, and what hangs on it with it?
     virtual bool MayCloseTable(const platform::Ref<TalvikZandorLib::ZDTable>& table);
     /// May a column come out: become an output column, or take the place of another one's field?
     virtual bool MayComeOut(const platform::Ref<TalvikZandorLib::ZDColumn>& column);
+    /// May an output column be deleted?
     virtual bool
     MayRemoveColumn(const platform::Ref<TalvikZandorLib::ZDColumnDefinition>& definition);
 

@@ -66,6 +66,7 @@ public:
     /// fault.
     static Ref<Query> restored(const QueryRecord& record);
 
+    /// The numbers of the keys given last.
     LastKeys lastKeys() const { return {mLastTable, mLastColumn, mLastJoin, mLastDefinition}; }
     /// Makes what a Snapshot of this query found once more; reversed, it is undone. The query must
     /// be as it was before the change (after it): error 5 when it is seen not to be, nothing

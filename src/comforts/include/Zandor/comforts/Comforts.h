@@ -35,9 +35,10 @@ class Door;
 /// end with the control, and with the comforts themselves, when the host is told something.
 class ZANDOR_CONTROL_EXPORT Comforts {
 public:
+    /// Name under which failures are reported.
     static constexpr platform::StringView ModuleName = u"comforts.Comforts";
 
-    using String = platform::String;
+    using String = platform::String; ///< UTF-16
 
     /// The toolkit outlives the comforts.
     explicit Comforts(platform::Toolkit& toolkit);
@@ -45,11 +46,15 @@ public:
     Comforts& operator=(const Comforts&) = delete;
     ~Comforts();
 
+    /// Begins to serve a control, which outlives this or is detached before.
     void attach(TalvikDBxZandor::Zandor& control);
+    /// Lets go of it, with what stands open. Nothing happens without one.
     void detach();
 
+    /// Which of them are on; new ones take effect at once.
     const Flags& flags() const { return mFlags; }
     void setFlags(const Flags& flags);
+    /// What they say; new words are shown at once.
     const platform::Words& words() const { return mWords; }
     void setWords(const platform::Words& words);
 
@@ -74,11 +79,13 @@ public:
     // Columns of the grid
     /// Whether a drag of the column's field would move it.
     bool columnMovable(std::int32_t column);
+    /// The user has moved a column to a position; both from 1.
     bool columnMoved(std::int32_t column, std::int32_t position);
     /// By a key: the current cell's column, by some places to the right.
     bool currentColumnMoved(std::int32_t step);
     /// The user has left a column's border so that it has this width.
     bool borderDragged(std::int32_t column, float width);
+    /// The user wants the column to be as wide as what it holds.
     bool borderDoubleClicked(std::int32_t column);
 
     // Findings

@@ -17,7 +17,7 @@ struct Field {
 struct Finding {
     platform::String definition; ///< its key
     std::int32_t row = 0;        ///< of the grid
-    platform::String text;
+    platform::String text;       ///< for its tooltip and screen readers
 };
 
 } // namespace zandor::comforts

@@ -36,6 +36,7 @@ struct Flags {
     /// it was.
     bool KeepsSelectionUnderDrags = false;
 
+    /// All of them on.
     static constexpr Flags all() {
         return {.AddsOnDoubleClick = true,
                 .KeepsTyping = true,

@@ -26,6 +26,8 @@ class QtToolkit;
 /// are the control's own under their own names; integers are 16-bit ones, and a value outside
 /// -32768 to 32767 is refused as error 6 in a message box, the property staying as it was.
 ///
+/// The properties are listed in docs/interface.md.
+///
 /// To the Tab key of the window around, the widget is a single stop; docs/keyboard.md lists its
 /// keys.
 ///
@@ -46,12 +48,18 @@ class ZANDOR_WIDGETS_EXPORT ZandorWidget : public QWidget {
     Q_PROPERTY(ZDColumn ActiveColumn READ ActiveColumn)
 
 public:
+    /// A query model, counted.
     using ZandorModel = zandor::platform::Ref<TalvikZandorLib::Zandor>;
+    /// A join of it.
     using ZDJoin = zandor::platform::Ref<TalvikZandorLib::ZDJoin>;
+    /// A table of it.
     using ZDTable = zandor::platform::Ref<TalvikZandorLib::ZDTable>;
+    /// A column of a table.
     using ZDColumn = zandor::platform::Ref<TalvikZandorLib::ZDColumn>;
+    /// An output column.
     using ZDColumnDefinition = zandor::platform::Ref<TalvikZandorLib::ZDColumnDefinition>;
 
+    /// Begins with an empty query of the library, the canvas alone, and no comforts.
     explicit ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent = nullptr);
     /// For forms (.ui), which know of a parent only: setLibrary comes next.
     explicit ZandorWidget(QWidget* parent = nullptr);
@@ -59,6 +67,7 @@ public:
 
     /// The control behind the widget, for hosts that prefer its C++ interface.
     TalvikDBxZandor::Zandor& control() { return *mControl; }
+    /// What the control is built with, for tests and for front ends that add to this one.
     zandor::platform::qt::QtToolkit& toolkit() { return *mToolkit; }
 
     /// What people expect beyond the bare control; all off at first.
@@ -100,21 +109,28 @@ public:
     using QWidget::repaint;
     using QWidget::update;
 
-    /// The query model; never nothing.
+    /// The query model; never nothing. Setting nothing emits Error and keeps the model held. Setting
+    /// another one keeps grid columns of the one before; showAnew takes them away.
     ZandorModel model() const;
     void setModel(const ZandorModel& model);
     /// Always nothing: the signals carry the object concerned.
     ZDJoin lastjoin() const;
+    /// Always nothing, as lastjoin.
     ZDTable activetable() const;
+    /// Always nothing, as lastjoin.
     ZDColumn ActiveColumn() const;
 
+    /// Drops every table and replaces the model by an empty one.
     Q_INVOKABLE void Terminate();
+    /// Selects the columns of a name in every table of a name, and no others there.
     Q_INVOKABLE void SelectColumnNames(const QString& TabName, const QString& ColName);
+    /// Makes the first table of a name the current one; nothing happens when there is none.
     Q_INVOKABLE void SetCurrentTable(const QString& TabName);
 
     /// Painting anew is for the control to lay itself out and close an open editor, as when it is
     /// first shown. Painting that its own work causes is not, nor is the painting of a part.
     void update();
+    /// As update, at once.
     void repaint();
 
     // Beside the interface
@@ -130,6 +146,7 @@ public:
     /// theirs in the model; and back, to the nearest pixel. Goes with the scrolling, and beyond
     /// what is in sight.
     QPointF toCanvas(QPointF place) const;
+    /// The way back of toCanvas.
     QPoint fromCanvas(QPointF twips) const;
     /// Who makes the model's objects, for a widget that was made without: before its model is asked
     /// for or set. Until then the model is an empty one, and a join or an output column that the
@@ -151,16 +168,25 @@ public:
     void resetWords();
 
 Q_SIGNALS:
-    /// DeletedTable has the name.
+    /// A table was taken out of the query. DeletedTable has the name.
     void TableDeleted();
+    /// The user has moved a table.
     void TableMoved();
+    /// The user has dropped columns or opened the context menu.
     void Activate();
+    /// An output column was added; once for each.
     void ColumnCreated(const ZDColumnDefinition& definition);
+    /// Sort order, visibility, synonym, place or a criterion of one was changed.
     void ColumnModified(const ZDColumnDefinition& definition);
+    /// An output column was deleted by the user.
     void ColumnRemoved(const ZDColumnDefinition& definition);
+    /// The host handed over nothing as its model.
     void Error(const QString& text, int number);
+    /// The user has joined two columns.
     void JoinCreated(const ZDJoin& join);
+    /// The user has changed type or operator in the join dialog.
     void JoinModified(const ZDJoin& join);
+    /// The user has deleted a join.
     void JoinRemoved(const ZDJoin& join);
 
     // Beside the interface

@@ -20,12 +20,15 @@ struct Unknown;
 /// key, and is written again as long as the object is there.
 struct ZANDOR_FILES_EXPORT QueryDocument {
     QueryDocument() = default;
+    /// Of a query alone, which is shared, not copied.
     QueryDocument(platform::Ref<model::Query> query) : query(std::move(query)) {}
 
+    /// Never nothing.
     platform::Ref<model::Query> query = platform::makeRef<model::Query>();
     /// Address of the database that the query asks, for the program that opens the file; empty:
     /// none is known. Written as it stands, so it must not have a password in it.
     platform::String database = {};
+    /// What the file has beyond this version's knowledge; nothing: no more.
     std::shared_ptr<const Unknown> unknown = {};
 };
 
@@ -45,6 +48,7 @@ ZANDOR_FILES_EXPORT Result<QueryDocument> fromJson(std::string_view text);
 /// Nothing on success.
 ZANDOR_FILES_EXPORT std::optional<Error> saveQuery(const Path& path, const QueryDocument& document);
 
+/// The document of a file, as fromJson; the error also where the file cannot be read.
 ZANDOR_FILES_EXPORT Result<QueryDocument> loadQuery(const Path& path);
 
 } // namespace zandor::files

@@ -12,41 +12,44 @@ namespace zandor::model {
 
 /// A table and all of it that can change, but for what is selected in it: that is no change.
 struct TableState {
-    Ref<Table> object = {};
-    String name = {};
-    std::int32_t left = 0;
-    std::int32_t top = 0;
-    std::int32_t width = 0;
-    std::int32_t height = 0;
+    Ref<Table> object = {};  ///< the table itself
+    String name = {};        ///< as TableRecord::name
+    std::int32_t left = 0;   ///< in twips, as the three below
+    std::int32_t top = 0;    ///< of the upper edge
+    std::int32_t width = 0;  ///< the border included
+    std::int32_t height = 0; ///< the border included
 
     friend bool operator==(const TableState&, const TableState&) = default;
 };
 
+/// A join and all of it that can change.
 struct JoinState {
-    Ref<Join> object = {};
-    ColumnPlace left = {};
-    ColumnPlace right = {};
-    std::int16_t type = 0;
-    std::int16_t comparison = 0;
+    Ref<Join> object = {};       ///< the join itself
+    ColumnPlace left = {};       ///< its left end
+    ColumnPlace right = {};      ///< its right end
+    std::int16_t type = 0;       ///< as ZDJoin::JoinType
+    std::int16_t comparison = 0; ///< as ZDJoin::CompareOperator
 
     friend bool operator==(const JoinState&, const JoinState&) = default;
 };
 
+/// The criterion of one row.
 struct CriterionState {
-    std::int16_t row = 0;
-    String text = {};
-    criteria::References references = {};
+    std::int16_t row = 0;                 ///< of the grid
+    String text = {};                     ///< as it was typed
+    criteria::References references = {}; ///< what its names are tied to
 
     friend bool operator==(const CriterionState&, const CriterionState&) = default;
 };
 
+/// An output column and all of it that can change.
 struct DefinitionState {
-    Ref<ColumnDefinition> object = {};
-    ColumnPlace column = {};
-    String synonym = {};
-    std::int16_t sortOrder = 0;
-    bool visible = true;
-    std::int32_t width = 0;
+    Ref<ColumnDefinition> object = {};         ///< the definition itself
+    ColumnPlace column = {};                   ///< what comes out
+    String synonym = {};                       ///< as ZDColumnDefinition::Synonym
+    std::int16_t sortOrder = 0;                ///< as ZDColumnDefinition::SortOrder
+    bool visible = true;                       ///< as ZDColumnDefinition::Visible
+    std::int32_t width = 0;                    ///< as SizedDefinition::Width
     std::vector<CriterionState> criteria = {}; ///< in the order of their rows
 
     friend bool operator==(const DefinitionState&, const DefinitionState&) = default;
@@ -55,19 +58,23 @@ struct DefinitionState {
 /// What is different in a list. An object that changed its position has both gone and come.
 template <class State>
 struct ListChange {
+    /// An item with its place in the list.
     struct Placed {
         std::int32_t position; ///< from 1
-        State state;
+        State state;           ///< as it was, or is
     };
+    /// An item that was there before and is there after.
     struct Pair {
-        State before;
-        State after;
+        State before; ///< as it was
+        State after;  ///< as it is
     };
     std::vector<Placed> gone = {};  ///< by position in the list before
     std::vector<Placed> come = {};  ///< by position in the list after
     std::vector<Pair> changed = {}; ///< in the order of the list
 
+    /// Whether nothing is different.
     bool empty() const { return gone.empty() && come.empty() && changed.empty(); }
+    /// The way back.
     ListChange reversed() const {
         ListChange result{come, gone, changed};
         for (Pair& pair : result.changed) std::swap(pair.before, pair.after);
@@ -75,16 +82,20 @@ struct ListChange {
     }
 };
 
+/// The difference between two moments of a query. Query::apply makes it once more, and reversed
+/// undoes it.
 struct Change {
-    LastKeys lastBefore = {};
-    LastKeys lastAfter = {};
-    ListChange<TableState> tables = {};
-    ListChange<JoinState> joins = {};
-    ListChange<DefinitionState> definitions = {};
+    LastKeys lastBefore = {};                     ///< at the earlier moment
+    LastKeys lastAfter = {};                      ///< at the later one
+    ListChange<TableState> tables = {};           ///< of the tables
+    ListChange<JoinState> joins = {};             ///< of the joins
+    ListChange<DefinitionState> definitions = {}; ///< of the output columns
 
+    /// Whether nothing is different.
     bool empty() const {
         return lastBefore == lastAfter && tables.empty() && joins.empty() && definitions.empty();
     }
+    /// The way back.
     Change reversed() const {
         return {lastAfter, lastBefore, tables.reversed(), joins.reversed(), definitions.reversed()};
     }

@@ -13,6 +13,7 @@ public:
     /// The name of the entry that stands for all columns of its table.
     static constexpr platform::StringView allColumns = u"*";
 
+    /// Query::addTable makes columns.
     Column(ColumnPlace place, ColumnDescription description)
         : mPlace(std::move(place)), mDescription(std::move(description)) {}
 
@@ -24,8 +25,11 @@ public:
     void Selected(bool value) override { mSelected = value; }
     void activated(std::int16_t value) override { mActivated = value; }
 
+    /// What was set last: 1 while the user has the entry selected, 0 otherwise.
     std::int16_t activated() const { return mActivated; }
+    /// As the database had it.
     const ColumnDescription& description() const { return mDescription; }
+    /// How joins and definitions name it.
     const ColumnPlace& place() const { return mPlace; }
     /// The column as an output column shows it; always the same object.
     static Ref<FieldColumn> field(const Ref<Column>& column) {

@@ -38,7 +38,9 @@ public:
     bool HasCriterium(const String& key) const override { return mCriteria.Contains(key); }
     void AddCriterium(const String& text, const String& key) override { mCriteria.Add(text, key); }
 
+    /// Its criteria by row.
     const class Criteria& criteria() const { return mCriteria; }
+    /// What comes out, by key.
     const ColumnPlace& place() const { return mPlace; }
     /// Raised by its criteria too.
     Revision& revision() { return *mRevision; }

@@ -41,7 +41,7 @@ private:
 class ZANDOR_MODEL_EXPORT Criteria final
     : public TalvikZandorLib::EditableCollection<TalvikZandorLib::ZDCriterium> {
 public:
-    static constexpr std::int16_t firstRow = 4;
+    static constexpr std::int16_t firstRow = 4; ///< of the grid, from 0
 
     /// `revision` is that of the definition. Definitions of other models have none and leave it.
     explicit Criteria(std::shared_ptr<Revision> revision = std::make_shared<Revision>())
@@ -53,11 +53,12 @@ public:
     Ref<TalvikZandorLib::ZDCriterium> Item(const String& key) const override;
     void Remove(const String& key) override;
 
+    /// Whether the row of a key has a criterium; false for a key that is no row.
     bool Contains(const String& key) const;
     /// Error 457 when the row has a criterium, error 5 when the key is no row; nothing is added
     /// then.
     void Add(const String& text, const String& key);
-    void clear();
+    void clear(); ///< leaves no criterium
 
     /// The criteria that there are, in the order of their rows.
     const std::map<std::int16_t, Ref<RowCriterium>>& rows() const { return mRows; }

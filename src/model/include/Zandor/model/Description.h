@@ -23,19 +23,21 @@ enum class ColumnType {
     Blob,
 };
 
+/// A column as its database describes it.
 struct ColumnDescription {
-    String name = {};
-    ColumnType type = ColumnType::Unknown;
-    String declaredType = {}; ///< as the database words it; may be empty
-    bool primaryKey = false;
+    String name = {};                      ///< as the database has it
+    ColumnType type = ColumnType::Unknown; ///< of its values
+    String declaredType = {};              ///< as the database words it; may be empty
+    bool primaryKey = false;               ///< whether it belongs to the primary key
 
     friend bool operator==(const ColumnDescription&, const ColumnDescription&) = default;
 };
 
+/// A table or view as its database describes it.
 struct TableDescription {
-    String schema = {}; ///< empty: the database's default schema
-    String name = {};
-    std::vector<ColumnDescription> columns = {};
+    String schema = {};                          ///< empty: the database's default schema
+    String name = {};                            ///< as the database has it
+    std::vector<ColumnDescription> columns = {}; ///< in their order
 
     friend bool operator==(const TableDescription&, const TableDescription&) = default;
 };

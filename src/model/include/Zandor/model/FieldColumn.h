@@ -12,6 +12,7 @@ class Column;
 /// is the column, which it is a part of.
 class ZANDOR_MODEL_EXPORT FieldColumn final : public TalvikZandorLib::ZDColumn {
 public:
+    /// Of a column that it is a part of.
     explicit FieldColumn(Column& column) : mColumn(column) {}
     FieldColumn(const FieldColumn&) = delete;
     FieldColumn& operator=(const FieldColumn&) = delete;
@@ -24,6 +25,7 @@ public:
     void Selected(bool value) override;
     void activated(std::int16_t value) override;
 
+    /// The column itself.
     const Column& column() const { return mColumn; }
 
 private:

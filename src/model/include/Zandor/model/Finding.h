@@ -8,6 +8,7 @@ namespace zandor::model {
 
 /// Something about a query that a person should know, and where it is.
 struct Finding {
+    /// What there is to say; the message says it in words.
     enum class Kind {
         noTables,
         definitionWithoutColumn,
@@ -22,14 +23,14 @@ struct Finding {
         notInDialect,
     };
 
-    Kind kind;
-    Message message;
+    Kind kind;       ///< what there is to say
+    Message message; ///< in words, which are made where they are shown
     // Keys of what is concerned, empty where there is none.
-    platform::String table{};
-    platform::String join{};
-    platform::String definition{};
-    std::int16_t row = 0;     ///< grid row of a criterion; 0 where it is about none
-    std::size_t position = 0; ///< in the criterion's text, UTF-16 code units from 0
+    platform::String table{};      ///< key
+    platform::String join{};       ///< key
+    platform::String definition{}; ///< key
+    std::int16_t row = 0;          ///< grid row of a criterion; 0 where it is about none
+    std::size_t position = 0;      ///< in the criterion's text, UTF-16 code units from 0
 
     /// The message in English: one line.
     platform::String text() const { return message.text(); }
@@ -42,6 +43,6 @@ struct Finding {
     }
 };
 
-using Findings = std::vector<Finding>;
+using Findings = std::vector<Finding>; ///< in the order in which they were found
 
 } // namespace zandor::model

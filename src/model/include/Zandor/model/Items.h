@@ -14,6 +14,7 @@ class Items final : public platform::KeyedCollection<Interface> {
     using Base = platform::KeyedCollection<Interface>;
 
 public:
+    /// `log` is that of the query.
     explicit Items(std::shared_ptr<ChangeLog> log) : mLog(std::move(log)) { mRevision.enter(mLog); }
 
     /// Error 457 when an item has the same key; nothing is added then.
@@ -24,6 +25,7 @@ public:
         item->revision().enter(mLog);
         mRevision.raise();
     }
+    /// Error 5 when no item has the key; nothing changes then.
     void Remove(const platform::String& key) override {
         Base::Remove(key);
         mRevision.raise();
@@ -44,6 +46,7 @@ public:
         mRevision.raise();
     }
 
+    /// Item by its own type; error 9 outside 1 to Count.
     platform::Ref<Own> own(std::int32_t position) const {
         return std::static_pointer_cast<Own>(this->Item(position));
     }

@@ -36,7 +36,9 @@ public:
 
     /// The ends by key. Their columns are empty as long as none is set.
     const ColumnPlace& left() const { return mLeft; }
+    /// As left.
     const ColumnPlace& right() const { return mRight; }
+    /// Raised by every change.
     Revision& revision() { return mRevision; }
 
 private:

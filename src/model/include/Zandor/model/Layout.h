@@ -13,23 +13,26 @@ namespace zandor::model::layout {
 
 inline constexpr std::int32_t margin = 300;          ///< left of and above the first table
 inline constexpr std::int32_t betweenColumns = 1200; ///< room for the join marks of both sides
-inline constexpr std::int32_t betweenRows = 450;
+inline constexpr std::int32_t betweenRows = 450;     ///< from one table to the one below
 
+/// Of a table.
 struct Size {
-    std::int32_t width = 0;
-    std::int32_t height = 0;
+    std::int32_t width = 0;  ///< the border included
+    std::int32_t height = 0; ///< title and border included
 };
 
+/// Of a table's upper left corner.
 struct Place {
-    std::int32_t left = 0;
-    std::int32_t top = 0;
+    std::int32_t left = 0; ///< from the canvas's left edge
+    std::int32_t top = 0;  ///< from its upper edge
 };
 
+/// A place and a size.
 struct Box {
-    std::int32_t left = 0;
-    std::int32_t top = 0;
-    std::int32_t width = 0;
-    std::int32_t height = 0;
+    std::int32_t left = 0;   ///< as Place::left
+    std::int32_t top = 0;    ///< as Place::top
+    std::int32_t width = 0;  ///< as Size::width
+    std::int32_t height = 0; ///< as Size::height
 };
 
 /// The size of a table with this many entries, the longest of which (or the title) has this many

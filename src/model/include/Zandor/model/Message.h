@@ -55,6 +55,7 @@ public:
     }
     /// The text with its places, in English.
     const char* english() const { return mText.english; }
+    /// What belongs in its places, in the order of their numbers.
     const std::vector<MessageArgument>& arguments() const { return mArguments; }
 
     /// The words in English: one line.
@@ -62,6 +63,7 @@ public:
     /// The words in another language. `translate` gives the text for an English one, with places
     /// by the same numbers; it is asked for those of arguments too that are messages themselves.
     using Translate = std::function<platform::String(const char* english)>;
+    /// The words as Translate gives them.
     platform::String words(const Translate& translate) const;
 
     /// Whether the codes and the arguments are the same.
@@ -75,21 +77,27 @@ private:
 /// What takes a place in a text: a name, a number, words of an engine or the system, which are the
 /// same in all languages and are made one line; or a message of its own.
 struct ZANDOR_MODEL_EXPORT MessageArgument {
-    MessageArgument(platform::StringView text);
+    MessageArgument(platform::StringView text); ///< UTF-16; line breaks become blanks
+    /// As above.
     MessageArgument(const platform::String& text) : MessageArgument(platform::StringView(text)) {}
+    /// As above.
     MessageArgument(const char16_t* text) : MessageArgument(platform::StringView(text)) {}
     /// UTF-8; a malformed sequence becomes U+FFFD.
     MessageArgument(std::string_view text) : MessageArgument(platform::fromUtf8(text)) {}
+    /// As above.
     MessageArgument(const std::string& text) : MessageArgument(std::string_view(text)) {}
+    /// As above.
     MessageArgument(const char* text) : MessageArgument(std::string_view(text)) {}
+    /// In decimal digits.
     MessageArgument(std::integral auto number)
         : content(platform::decimal(static_cast<std::int64_t>(number))) {}
     MessageArgument(char) = delete;
     MessageArgument(char16_t) = delete;
     MessageArgument(bool) = delete;
+    /// A message in the place of an argument; it is translated by itself.
     MessageArgument(Message message) : content(std::move(message)) {}
 
-    std::variant<platform::String, Message> content;
+    std::variant<platform::String, Message> content; ///< what takes the place
 
     friend bool operator==(const MessageArgument&, const MessageArgument&) = default;
 };

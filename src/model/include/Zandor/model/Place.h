@@ -16,9 +16,11 @@ class Table;
 /// The tables of one query.
 using Tables = Items<Table, TalvikZandorLib::ZDTable>;
 
+/// A table by key.
 class ZANDOR_MODEL_EXPORT TablePlace {
 public:
     TablePlace() = default;
+    /// Of a query's tables, the one with a key.
     TablePlace(std::weak_ptr<const Tables> home, String key)
         : mHome(std::move(home)), mKey(std::move(key)) {}
 
@@ -26,9 +28,11 @@ public:
     Ref<Table> table() const;
     /// Whether no table was ever named.
     bool empty() const { return mKey.empty(); }
+    /// Empty when no table was ever named.
     const String& key() const { return mKey; }
     /// Whether both are of one query.
     bool sameHome(const TablePlace& other) const;
+    /// Whether it names one of these tables, there or deleted.
     bool isIn(const std::shared_ptr<const Tables>& tables) const;
 
     friend bool operator==(const TablePlace& left, const TablePlace& right) {
@@ -40,15 +44,20 @@ private:
     String mKey;
 };
 
+/// A column by key, with its table.
 class ZANDOR_MODEL_EXPORT ColumnPlace {
 public:
     ColumnPlace() = default;
+    /// Of a table, the column with a key.
     ColumnPlace(TablePlace table, String key) : mTable(std::move(table)), mKey(std::move(key)) {}
 
     /// The column, or nothing when its table was deleted or its query is gone.
     Ref<Column> column() const;
+    /// Whether no column was ever named.
     bool empty() const { return mKey.empty(); }
+    /// Empty when no column was ever named.
     const String& key() const { return mKey; }
+    /// The table, which may be named without a column.
     const TablePlace& table() const { return mTable; }
 
     /// Error 91 when no column is named; error 5 when it is not, or no longer, a column of these

@@ -12,24 +12,26 @@
 /// moment (ZDColumn::activated) is the control's and not recorded.
 namespace zandor::model {
 
+/// A column of a table.
 struct ColumnRecord {
-    String key = {};
-    ColumnDescription description = {};
-    bool selected = false;
+    String key = {};                    ///< "c" and a number
+    ColumnDescription description = {}; ///< as the database had it
+    bool selected = false;              ///< as ZDColumn::Selected
 
     friend bool operator==(const ColumnRecord&, const ColumnRecord&) = default;
 };
 
+/// A table as it stands in the query.
 struct TableRecord {
-    String key = {};
-    String name = {};
-    String schema = {};
-    String sourceName = {};
-    std::int32_t left = -1;
-    std::int32_t top = -1;
-    std::int32_t width = 0;
-    std::int32_t height = 0;
-    std::int16_t selected = 0;
+    String key = {};                        ///< "t" and a number
+    String name = {};                       ///< unique in the query
+    String schema = {};                     ///< of the database's table; empty: the default one
+    String sourceName = {};                 ///< of the database's table
+    std::int32_t left = -1;                 ///< as ZDTable::Left, in twips
+    std::int32_t top = -1;                  ///< as ZDTable::Top
+    std::int32_t width = 0;                 ///< as ZDTable::Width
+    std::int32_t height = 0;                ///< as ZDTable::Height
+    std::int16_t selected = 0;              ///< as ZDTable::Selected
     std::vector<ColumnRecord> columns = {}; ///< the first is the entry "*"
 
     friend bool operator==(const TableRecord&, const TableRecord&) = default;
@@ -38,16 +40,17 @@ struct TableRecord {
 /// Keys of one end of a join. The column is empty when none is set, and so is the table when the
 /// end reads as nothing.
 struct EndRecord {
-    String table = {};
-    String column = {};
+    String table = {};  ///< key
+    String column = {}; ///< key
 
     friend bool operator==(const EndRecord&, const EndRecord&) = default;
 };
 
+/// A join.
 struct JoinRecord {
-    String key = {};
-    EndRecord left = {};
-    EndRecord right = {};
+    String key = {};             ///< "j" and a number
+    EndRecord left = {};         ///< its left end
+    EndRecord right = {};        ///< its right end
     std::int16_t type = 0;       ///< as ZDJoin::JoinType
     std::int16_t comparison = 0; ///< as ZDJoin::CompareOperator
 
@@ -57,29 +60,31 @@ struct JoinRecord {
 /// What a name in a criterion's text means (see criteria::Reference). The keys may be those of a
 /// table that is gone; both are empty for what was no name of a column when it was typed.
 struct NameRecord {
-    std::int32_t begin = 0;
-    std::int32_t tableEnd = 0;
-    String table = {};
-    String column = {};
+    std::int32_t begin = 0;    ///< as criteria::Reference::begin
+    std::int32_t tableEnd = 0; ///< as criteria::Reference::tableEnd
+    String table = {};         ///< key
+    String column = {};        ///< key
 
     friend bool operator==(const NameRecord&, const NameRecord&) = default;
 };
 
+/// The criterion of one row.
 struct CriterionRecord {
-    std::int16_t row = 0;
-    String text = {};
+    std::int16_t row = 0;               ///< of the grid, 4 to 32767
+    String text = {};                   ///< as it was typed
     std::vector<NameRecord> names = {}; ///< known by now, in the order of the text
 
     friend bool operator==(const CriterionRecord&, const CriterionRecord&) = default;
 };
 
+/// An output column.
 struct DefinitionRecord {
-    String key = {};
-    String column = {}; ///< key; empty when the definition reads as having none
-    String synonym = {};
-    std::int16_t sortOrder = 0;
-    bool visible = true;
-    std::int32_t width = 0;                     ///< as SizedDefinition::Width
+    String key = {};            ///< "x" and a number
+    String column = {};         ///< key; empty when the definition reads as having none
+    String synonym = {};        ///< as ZDColumnDefinition::Synonym
+    std::int16_t sortOrder = 0; ///< as ZDColumnDefinition::SortOrder
+    bool visible = true;        ///< as ZDColumnDefinition::Visible
+    std::int32_t width = 0;     ///< as SizedDefinition::Width
     std::vector<CriterionRecord> criteria = {}; ///< in the order of their rows
 
     friend bool operator==(const DefinitionRecord&, const DefinitionRecord&) = default;
@@ -87,19 +92,20 @@ struct DefinitionRecord {
 
 /// The number of the newest key of each kind, whether its object is still there or not.
 struct LastKeys {
-    std::int32_t table = 0;
-    std::int32_t column = 0;
-    std::int32_t join = 0;
-    std::int32_t definition = 0;
+    std::int32_t table = 0;      ///< of a table; 0: none yet
+    std::int32_t column = 0;     ///< of a column
+    std::int32_t join = 0;       ///< of a join
+    std::int32_t definition = 0; ///< of an output column
 
     friend bool operator==(const LastKeys&, const LastKeys&) = default;
 };
 
+/// A whole query.
 struct QueryRecord {
-    LastKeys lastKeys = {};
-    std::vector<TableRecord> tables = {};
-    std::vector<JoinRecord> joins = {};
-    std::vector<DefinitionRecord> definitions = {};
+    LastKeys lastKeys = {};                         ///< none of the keys below has a greater number
+    std::vector<TableRecord> tables = {};           ///< in the order of the query
+    std::vector<JoinRecord> joins = {};             ///< in the order of the query
+    std::vector<DefinitionRecord> definitions = {}; ///< in the order of the query
 
     friend bool operator==(const QueryRecord&, const QueryRecord&) = default;
 };

@@ -14,6 +14,7 @@ struct Reference {
     std::size_t tableEnd = 0; ///< behind the table's name; `begin` when the column stands alone
     ColumnPlace column{};     ///< empty: no column, so they are a text or a parameter
 
+    /// Whether the table is named before the column.
     bool namesTable() const { return tableEnd > begin; }
 
     friend bool operator==(const Reference&, const Reference&) = default;

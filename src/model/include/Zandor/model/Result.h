@@ -11,16 +11,22 @@ namespace zandor::model {
 template <class T, class Error>
 class Result {
 public:
+    /// It went well.
     Result(T value) : mContent(std::move(value)) {}
+    /// It did not.
     Result(Error error) : mContent(std::move(error)) {}
 
+    /// Whether it holds a value.
     explicit operator bool() const { return std::holds_alternative<T>(mContent); }
     /// Only for a result that holds a value. Not for a temporary one: what is taken from it in the
     /// head of a loop would be gone in the body.
     T& operator*() & { return std::get<T>(mContent); }
+    /// As above.
     const T& operator*() const& { return std::get<T>(mContent); }
     void operator*() && = delete;
+    /// As the value itself, for its members.
     T* operator->() & { return &**this; }
+    /// As above.
     const T* operator->() const& { return &**this; }
     void operator->() && = delete;
     /// The error's text; empty for a result that holds a value.

@@ -18,6 +18,7 @@ public:
     /// Counts the changes; 0 is before the first.
     using Moment = std::uint64_t;
 
+    /// How many changes there were.
     Moment now() const { return mNow; }
     /// The revisions of what was changed after a moment, the latest first. Of an object that is
     /// gone there is none; one that was set back again is told like any other.
@@ -65,6 +66,7 @@ public:
     Revised(const Revised&) = delete;
 
     Revised& operator=(const Revised&) = delete;
+    /// The same value changes nothing and raises nothing.
     Revised& operator=(T value) {
         if (mValue == value) return *this;
         mValue = std::move(value);
@@ -72,8 +74,11 @@ public:
         return *this;
     }
 
+    /// The value.
     operator const T&() const { return mValue; }
+    /// The value.
     const T& operator*() const { return mValue; }
+    /// Its members.
     const T* operator->() const { return &mValue; }
 
 private:

@@ -14,6 +14,7 @@ class Query;
 /// never change.
 class ZANDOR_MODEL_EXPORT Snapshot {
 public:
+    /// Of a query as it is.
     explicit Snapshot(Query& query) { update(query); }
 
     /// What came about since the last time; from now on the query is remembered as it is. Always of

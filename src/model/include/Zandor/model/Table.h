@@ -36,7 +36,9 @@ public:
 
     /// Name of the table or view in the database, and its schema (empty: the default one).
     const String& sourceName() const { return mSourceName; }
+    /// Of the table in the database; empty: the default one.
     const String& schema() const { return mSchema; }
+    /// How joins name it.
     const TablePlace& place() const { return mPlace; }
     /// Raised by everything but selections.
     Revision& revision() { return mRevision; }

@@ -11,9 +11,10 @@
 
 namespace zandor::model::sql {
 
+/// What became of a query.
 struct Built {
     std::optional<Statement> statement; ///< nothing when the query has no tables
-    Findings findings;
+    Findings findings;                  ///< what was left out, and what else there is to say
 };
 
 /// The statement that a query draws. A criterion or definition that cannot be used is left out and
@@ -23,10 +24,11 @@ ZANDOR_MODEL_EXPORT Built build(Query& query);
 /// What a host shows: the findings of the query and, for a dialect, of its names and joins.
 ZANDOR_MODEL_EXPORT Findings validate(Query& query, Dialect dialect);
 
+/// A statement as text.
 struct ZANDOR_MODEL_EXPORT Text {
-    String text; ///< empty when there is none
-    std::vector<Binding> bindings;
-    Findings findings;
+    String text;                   ///< empty when there is none
+    std::vector<Binding> bindings; ///< what takes the places of its placeholders, in their order
+    Findings findings;             ///< those of the query and of the dialect
 
     /// Whether the statement can be run: it is there and says what was drawn.
     bool runnable() const;

@@ -6,8 +6,10 @@
 
 namespace zandor::model::sql {
 
+/// What an engine reads; Standard is SQL as its norm has it.
 enum class Dialect { SQLite, PostgreSQL, MySQL, SqlServer, Standard };
 
+/// All of them.
 inline constexpr Dialect allDialects[] = {Dialect::SQLite, Dialect::PostgreSQL, Dialect::MySQL,
                                           Dialect::SqlServer, Dialect::Standard};
 

@@ -12,13 +12,13 @@
 namespace zandor::model::sql {
 
 struct Expression;
-using Node = std::shared_ptr<const Expression>;
+using Node = std::shared_ptr<const Expression>; ///< A part of a tree; shared, and never changed
 
 /// A column of a table in the statement.
 struct ColumnRef {
-    String table; ///< the name under which the table stands in the statement
-    String column;
-    ColumnType type = ColumnType::Unknown;
+    String table;  ///< the name under which the table stands in the statement
+    String column; ///< its name
+    ColumnType type = ColumnType::Unknown; ///< of its values
 
     friend bool operator==(const ColumnRef&, const ColumnRef&) = default;
 };
@@ -27,15 +27,15 @@ struct ColumnRef {
 /// a boolean "true" or "false", a date "2024-05-01", a time "10:30:00", a timestamp
 /// "2024-05-01 10:30:00"; a text and an unknown are as they stand.
 struct Value {
-    ColumnType type = ColumnType::Text;
-    String text;
+    ColumnType type = ColumnType::Text; ///< of the constant
+    String text;                        ///< canonical
 
     friend bool operator==(const Value&, const Value&) = default;
 };
 
 /// A value that is asked for before the statement runs.
 struct Parameter {
-    String name;
+    String name;                           ///< what the one who runs the statement is asked for
     ColumnType type = ColumnType::Unknown; ///< of the column that it is compared with
     bool pattern = false; ///< whether the value asked for is a pattern as people type them
 
@@ -45,57 +45,66 @@ struct Parameter {
 /// In the order of the joins' operator codes.
 enum class Comparison { equal, notEqual, less, greater, lessEqual, greaterEqual };
 
+/// Two values by an operator.
 struct Compare {
-    Comparison comparison;
-    Node left;
-    Node right;
+    Comparison comparison; ///< the operator
+    Node left;             ///< before it
+    Node right;            ///< behind it
 };
 
 /// `pattern` is a Value or a Parameter of that kind. In a value's text % stands for any run and _
 /// for any one character; a backslash makes the next character stand for itself. Letters match
 /// without regard to case as far as the engine knows them.
 struct Like {
-    bool negated;
-    Node operand;
-    Node pattern;
+    bool negated; ///< NOT LIKE
+    Node operand; ///< what is compared
+    Node pattern; ///< with what
 };
 
+/// A value within two bounds, these included.
 struct Between {
-    bool negated;
-    Node operand;
-    Node low;
-    Node high;
+    bool negated; ///< outside them
+    Node operand; ///< the value
+    Node low;     ///< the lower bound
+    Node high;    ///< the upper bound
 };
 
+/// A value among others.
 struct In {
-    bool negated;
-    Node operand;
+    bool negated;           ///< not among them
+    Node operand;           ///< the value
     std::vector<Node> list; ///< never empty
 };
 
+/// No value at all.
 struct IsNull {
-    bool negated;
-    Node operand;
+    bool negated; ///< any value
+    Node operand; ///< what is asked
 };
 
+/// The opposite of a condition.
 struct Not {
-    Node operand;
+    Node operand; ///< the condition
 };
 
+/// Conditions that hold together.
 struct And {
     std::vector<Node> terms; ///< two or more
 };
 
+/// Conditions one of which holds.
 struct Or {
     std::vector<Node> terms; ///< two or more
 };
 
+/// One node of the tree.
 struct Expression {
     std::variant<ColumnRef, Value, Parameter, Compare, Like, Between, In, IsNull, Not, And, Or>
-        node;
+        node; ///< what it is
 };
 
 template <class Part>
+/// A node of one kind.
 Node make(Part part) {
     return std::make_shared<const Expression>(Expression{std::move(part)});
 }
@@ -103,6 +112,6 @@ Node make(Part part) {
 /// The terms under one And, respectively Or; a single term stands for itself. Terms that are of
 /// the same kind themselves are taken apart. Nothing for no terms.
 ZANDOR_MODEL_EXPORT Node allOf(std::vector<Node> terms);
-ZANDOR_MODEL_EXPORT Node anyOf(std::vector<Node> terms);
+ZANDOR_MODEL_EXPORT Node anyOf(std::vector<Node> terms); ///< as allOf, under one Or
 
 } // namespace zandor::model::sql

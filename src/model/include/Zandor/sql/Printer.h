@@ -11,18 +11,20 @@ enum class ValueForm { bound, literal };
 /// What takes the place of one placeholder.
 using Binding = std::variant<Value, Parameter>;
 
+/// A statement in a dialect.
 struct Printed {
-    String text;
+    String text;                   ///< one clause a line
     std::vector<Binding> bindings; ///< in the order of the placeholders; parameters in either form
 };
 
 /// Why a dialect cannot say a statement.
 struct Refusal {
+    /// What it is that cannot be said: a name, a kind of join, or so large a statement.
     enum class Reason { name, join, size };
 
-    Reason reason;
-    Message message;
-    String join{}; ///< key of the query's join that is refused
+    Reason reason;   ///< what cannot be said
+    Message message; ///< the same in words
+    String join{};   ///< key of the query's join that is refused
 };
 
 /// The statement in a dialect, one clause a line. The same statement gives the same text.

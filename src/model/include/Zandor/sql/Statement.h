@@ -8,50 +8,56 @@ namespace zandor::model::sql {
 
 /// All columns of one table of the statement.
 struct AllColumns {
-    String table;
+    String table; ///< the name under which it stands in the statement
 };
 
+/// One column of the rows, or all of a table.
 struct SelectItem {
-    std::variant<AllColumns, ColumnRef> what;
-    String name; ///< under which the column comes out; empty: its own
+    std::variant<AllColumns, ColumnRef> what; ///< what comes out
+    String name;                              ///< under which the column comes out; empty: its own
 };
 
+/// A table of the database in the statement.
 struct TableRef {
     String schema; ///< empty: the default one
-    String name;
-    String alias; ///< the name that columns refer to; may be the table's own
+    String name;   ///< in the database
+    String alias;  ///< the name that columns refer to; may be the table's own
 };
 
+/// Which rows stay without a partner: none, those of the left side, of the right one, of both.
 enum class JoinKind { inner, leftOuter, rightOuter, fullOuter };
 
 struct Source;
-using SourceNode = std::shared_ptr<const Source>;
+using SourceNode = std::shared_ptr<const Source>; ///< Shared, and never changed
 
+/// Two sources and what joins them.
 struct JoinSource {
-    JoinKind kind;
-    SourceNode left;
-    SourceNode right;
-    Node on;    ///< never nothing
-    String key; ///< of the query's join that decided the kind
+    JoinKind kind;    ///< which rows stay
+    SourceNode left;  ///< the left side
+    SourceNode right; ///< the right side
+    Node on;          ///< never nothing
+    String key;       ///< of the query's join that decided the kind
 };
 
+/// A table, or sources that are joined.
 struct Source {
-    std::variant<TableRef, JoinSource> node;
+    std::variant<TableRef, JoinSource> node; ///< which of the two
 };
 
+/// A column that sorts.
 struct OrderItem {
-    ColumnRef column;
-    bool descending = false;
+    ColumnRef column;        ///< by its values
+    bool descending = false; ///< the greatest first
 };
 
 /// A SELECT statement.
 struct Statement {
-    std::vector<SelectItem> items;
-    std::vector<SourceNode> from; ///< more than one: every row of one with every row of the other
-    Node where;                   ///< nothing: all rows
-    std::vector<OrderItem> order;
-    std::optional<std::int64_t> limit;
-    std::int64_t offset = 0;
+    std::vector<SelectItem> items; ///< never empty
+    std::vector<SourceNode> from;  ///< more than one: every row of one with every row of the other
+    Node where;                    ///< nothing: all rows
+    std::vector<OrderItem> order;  ///< the first sorts first
+    std::optional<std::int64_t> limit; ///< of rows; nothing: all
+    std::int64_t offset = 0;           ///< rows left out before the first
 };
 
 } // namespace zandor::model::sql

@@ -14,23 +14,24 @@ using platform::String;
 
 /// A table or view by name; an empty schema is the database's default one.
 struct TableId {
-    String schema;
-    String name;
+    String schema; ///< empty: the default one
+    String name;   ///< as the database has it
 
     friend bool operator==(const TableId&, const TableId&) = default;
 };
 
+/// What a database has: a table, or a view.
 struct TableEntry {
-    TableId id;
-    bool isView = false;
+    TableId id;          ///< its name
+    bool isView = false; ///< it is a view
 
     friend bool operator==(const TableEntry&, const TableEntry&) = default;
 };
 
 /// The names as the foreign key words them, which may differ in case from the names of the tables.
 struct ForeignKey {
-    TableId child;
-    TableId parent;
+    TableId child;  ///< the table that declares the key
+    TableId parent; ///< the table that it refers to
     std::vector<std::pair<String, String>> columns; ///< child's and parent's, pair by pair
 
     friend bool operator==(const ForeignKey&, const ForeignKey&) = default;

@@ -7,16 +7,17 @@ namespace zandor::platform {
 
 /// A placement inside the container, in twips (1/1440 inch, 15 to a logical pixel at 96 dpi).
 struct Bounds {
-    float Left = 0;
-    float Top = 0;
-    float Width = 0;
-    float Height = 0;
+    float Left = 0;   ///< of the left edge
+    float Top = 0;    ///< of the upper edge
+    float Width = 0;  ///< 0 or more
+    float Height = 0; ///< 0 or more
 
     friend bool operator==(const Bounds&, const Bounds&) = default;
 };
 
+/// A font as a host names it.
 struct Font {
-    String Name;
+    String Name;        ///< of the family
     float Size = 8.25F; ///< points
 
     friend bool operator==(const Font&, const Font&) = default;
@@ -34,14 +35,22 @@ public:
     virtual Bounds bounds() const = 0;
     virtual void setBounds(const Bounds& bounds) = 0;
 
+    /// Of bounds.
     float Left() const { return bounds().Left; }
+    /// Of bounds.
     float Top() const { return bounds().Top; }
+    /// Of bounds.
     float Width() const { return bounds().Width; }
+    /// Of bounds.
     float Height() const { return bounds().Height; }
 
+    /// The others of bounds stay.
     void Left(float value) { set(&Bounds::Left, value); }
+    /// The others of bounds stay.
     void Top(float value) { set(&Bounds::Top, value); }
+    /// The others of bounds stay.
     void Width(float value) { set(&Bounds::Width, value); }
+    /// The others of bounds stay.
     void Height(float value) { set(&Bounds::Height, value); }
 
 private:
@@ -54,9 +63,9 @@ private:
 
 /// What a constituent control is born with: the settings of design time.
 struct Design {
-    StringView Name;          ///< the control's name, "hsbTable"
-    StringView FontName = {}; ///< empty: the container's font
-    StringView Caption = {};
+    StringView Name;              ///< the control's name, "hsbTable"
+    StringView FontName = {};     ///< empty: the container's font
+    StringView Caption = {};      ///< what stands on it at first
     Control* Container = nullptr; ///< nullptr: the control's own surface
 };
 

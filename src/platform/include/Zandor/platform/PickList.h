@@ -16,10 +16,11 @@ public:
     /// with is the one at a position from 0 on if it is left, else the first.
     virtual void Open(const Bounds& over, const std::vector<String>& items, const String& typed,
                       std::int32_t position) = 0;
-    virtual void Close() = 0;
-    virtual bool IsOpen() const = 0;
+    virtual void Close() = 0;        ///< nothing has been picked
+    virtual bool IsOpen() const = 0; ///< whether it stands open
 };
 
+/// What a list tells.
 struct PickListEvents {
     /// The user has taken an item, by its position among all; the list has closed.
     std::function<void(std::int32_t position)> Picked;

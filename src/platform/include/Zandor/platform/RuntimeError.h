@@ -7,8 +7,8 @@ namespace zandor::platform {
 
 /// The one exception type of the control. Numbers and descriptions are the classic runtime's.
 struct ZANDOR_CONTROL_EXPORT RuntimeError {
-    std::int32_t Number = 0;
-    String Description;
+    std::int32_t Number = 0; ///< of the list in docs/architecture.md
+    String Description;      ///< one line, in English
 };
 
 namespace errors {

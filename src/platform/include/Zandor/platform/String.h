@@ -10,7 +10,7 @@ namespace zandor::platform {
 
 /// Text as both kinds of host speak it: UTF-16 code units, compared binary.
 using String = std::u16string;
-using StringView = std::u16string_view;
+using StringView = std::u16string_view; ///< text that somebody else holds
 
 /// `value` in decimal digits, with a minus sign when negative and no blank.
 ZANDOR_CONTROL_EXPORT String decimal(std::int64_t value);

@@ -9,10 +9,11 @@
 
 namespace zandor::platform {
 
-inline constexpr std::int32_t styleOkOnly = 0;
-inline constexpr std::int32_t styleExclamation = 48;
-inline constexpr std::int32_t styleSystemModal = 4096;
+inline constexpr std::int32_t styleOkOnly = 0;         ///< an OK button
+inline constexpr std::int32_t styleExclamation = 48;   ///< an exclamation mark
+inline constexpr std::int32_t styleSystemModal = 4096; ///< before all windows
 
+/// Shows message boxes; styles are added up.
 class ZANDOR_CONTROL_EXPORT MessageBoxes {
 public:
     virtual ~MessageBoxes() = default;
@@ -24,20 +25,28 @@ public:
 /// makes. Design-time controls are made once, in the order in which they stack.
 class ZANDOR_CONTROL_EXPORT Toolkit : public MessageBoxes {
 public:
+    /// A frame to put other controls into.
     virtual std::unique_ptr<Frame> makeFrame(const Design& design, FrameEvents events) = 0;
+    /// A button with a caption.
     virtual std::unique_ptr<CommandButton> makeCommandButton(const Design& design,
                                                              CommandButtonEvents events) = 0;
+    /// A list to choose one of the items from; nothing is chosen at first.
     virtual std::unique_ptr<ComboBox>
     makeComboBox(const Design& design, const std::vector<String>& items, KeyEvent KeyDown) = 0;
+    /// A box for one line of text, empty at first.
     virtual std::unique_ptr<TextBox> makeTextBox(const Design& design, KeyEvent KeyDown) = 0;
+    /// A text that cannot be typed into.
     virtual std::unique_ptr<Label> makeLabel(const Design& design) = 0;
+    /// A scroll bar at 0.
     virtual std::unique_ptr<ScrollBar> makeScrollBar(const Design& design, Orientation orientation,
                                                      ScrollBarEvents events) = 0;
+    /// A grid of so many rows and columns, the first of each for titles.
     virtual std::unique_ptr<MSFlexGridLib::MSFlexGrid>
     makeGrid(const Design& design, std::int32_t rows, std::int32_t cols,
              MSFlexGridLib::GridEvents events) = 0;
     /// Click is the menu's own, fired as it opens.
     virtual std::unique_ptr<PopupMenu> makePopupMenu(const Design& design, PlainEvent Click) = 0;
+    /// A dialog window, not shown yet.
     virtual std::unique_ptr<Dialog> makeDialog(const Design& design, DialogEvents events) = 0;
 
     /// Closed at first.
@@ -53,7 +62,9 @@ public:
     virtual Ref<TalvikTabulet::Tabulet> makeTabulet(const Design& design, std::int16_t index,
                                                     const TalvikTabulet::Tabulet* pattern,
                                                     const TalvikTabulet::TabuletEvents& events) = 0;
+    /// A line, invisible at first.
     virtual Ref<Line> makeLine(const Design& design, std::int16_t index) = 0;
+    /// A mark, invisible at first.
     virtual Ref<Shape> makeShape(const Design& design, std::int16_t index) = 0;
 
     /// The font that the host's surroundings use.
@@ -64,7 +75,7 @@ public:
     virtual float TextWidth(const String& text) const = 0;
     /// Inner size of the control, in twips.
     virtual float ScaleWidth() const = 0;
-    virtual float ScaleHeight() const = 0;
+    virtual float ScaleHeight() const = 0; ///< as ScaleWidth
 
     /// A number for a window message of that name, the same for the same name; 0 on failure.
     virtual std::uint32_t RegisterWindowMessage(const String& name) = 0;

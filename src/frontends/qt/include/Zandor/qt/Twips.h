@@ -11,7 +11,7 @@
 /// Twips to logical pixels and back. The device scale is Qt's own business.
 namespace zandor::platform::qt {
 
-inline constexpr float twipsPerPixel = 15;
+inline constexpr float twipsPerPixel = 15; ///< of logical pixels, 96 to an inch
 
 /// To the nearest pixel; what is far outside every screen is brought to its rim, so that sums of
 /// two results never overflow.
@@ -22,6 +22,7 @@ inline int toPixels(float twips) {
     return static_cast<int>(std::min(pixels, rim));
 }
 
+/// Exactly, to single precision.
 inline float toTwips(double pixels) { return static_cast<float>(pixels * twipsPerPixel); }
 
 /// The edges are rounded, not the size: neighbours stay neighbours at every fraction.
@@ -33,6 +34,7 @@ inline QRect toPixels(const Bounds& bounds) {
     return {left, top, std::max(0, right - left), std::max(0, bottom - top)};
 }
 
+/// Exactly, to single precision.
 inline Bounds toTwips(const QRect& pixels) {
     return {toTwips(pixels.x()), toTwips(pixels.y()), toTwips(pixels.width()),
             toTwips(pixels.height())};

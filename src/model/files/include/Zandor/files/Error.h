@@ -16,11 +16,12 @@ using Path = std::filesystem::path;
 
 /// What went wrong, where, and what to do about it.
 struct ZANDOR_FILES_EXPORT Error {
+    /// Of a message of the house's or of the model's.
     Error(model::Message message) : message(std::move(message)) {}
     /// Somebody else's words, which are shown as they stand: UTF-8.
     explicit Error(std::string_view words);
 
-    model::Message message;
+    model::Message message; ///< whose words are made where they are shown
 
     /// The message in English: one line of UTF-8.
     std::string text() const;
@@ -29,7 +30,7 @@ struct ZANDOR_FILES_EXPORT Error {
 };
 
 template <class T>
-using Result = model::Result<T, Error>;
+using Result = model::Result<T, Error>; ///< A value, or the error that kept it from being made
 
 /// "The file "a" cannot be saved (No space left on device); make room on the disk, …", by what
 /// failed and the number of the system's error.

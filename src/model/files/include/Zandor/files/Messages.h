@@ -18,6 +18,7 @@ inline constexpr model::MessageText messageTexts[] = {
 #undef ZANDOR_MESSAGE
 };
 
+/// The row of a code.
 constexpr model::MessageText textOf(MessageCode code) {
     return messageTexts[static_cast<std::size_t>(code)];
 }

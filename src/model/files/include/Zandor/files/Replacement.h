@@ -15,6 +15,7 @@ namespace zandor::files {
 /// Whatever this program writes for its user is written so.
 class ZANDOR_FILES_EXPORT Replacement final : public Output {
 public:
+    /// Of the file at a path, which need not exist; nothing is done yet.
     explicit Replacement(const Path& path);
     Replacement(const Replacement&) = delete;
     Replacement& operator=(const Replacement&) = delete;

@@ -12,13 +12,16 @@ class ZANDOR_READER_EXPORT Connection {
 public:
     /// Takes over an open database that nobody else uses.
     explicit Connection(QSqlDatabase database) : mDatabase(std::move(database)) {}
+    /// The other one has no database then.
     Connection(Connection&& other) noexcept { std::swap(mDatabase, other.mDatabase); }
+    /// The databases change places.
     Connection& operator=(Connection&& other) noexcept {
         std::swap(mDatabase, other.mDatabase);
         return *this;
     }
     ~Connection();
 
+    /// For Qt's own classes; open as long as this is there.
     const QSqlDatabase& database() const { return mDatabase; }
 
 private:

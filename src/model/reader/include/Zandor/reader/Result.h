@@ -11,11 +11,12 @@ namespace zandor::reader {
 
 /// What went wrong and what to do about it.
 struct ZANDOR_READER_EXPORT Error {
+    /// Of a message of the house's or of the model's.
     Error(model::Message message) : message(std::move(message)) {}
     /// Somebody else's words, which are shown as they stand.
     explicit Error(const QString& words);
 
-    model::Message message;
+    model::Message message; ///< whose words are made where they are shown
 
     /// The message in English: one line.
     QString text() const;
