@@ -1,5 +1,8 @@
 #include "Files.h"
 
+#include <filesystem>
+#include <regex>
+
 namespace {
 
 /// What stands between two lines "// [name]" of a file, or others of its comments.
@@ -43,4 +46,34 @@ TEST(ThePageAboutEmbedding, ShowsTheCodeThatIsCompiled) {
         for (auto at = page.find(fence); at != std::string::npos; at = page.find(fence, at + 1))
             ++shown;
     EXPECT_EQ(shown, 10U);
+}
+
+TEST(ThePageAboutFrontEnds, NamesWhatAToolkitMakes) {
+    const std::string page = contentOf("docs/front-ends.md");
+    const std::string header = contentOf("src/platform/include/Zandor/platform/Toolkit.h");
+    static const std::regex made(R"(\bmake[A-Z]\w+)");
+    std::size_t names = 0;
+    for (std::sregex_iterator it(header.begin(), header.end(), made), end; it != end; ++it) {
+        ++names;
+        EXPECT_NE(page.find('`' + it->str() + '`'), std::string::npos) << it->str();
+    }
+    EXPECT_GE(names, 14U);
+}
+
+TEST(ThePageAboutFrontEnds, NamesWhatTheHeadersHave) {
+    const std::string page = contentOf("docs/front-ends.md");
+    std::string headers;
+    for (const char* folder : {"platform", "control", "comforts"})
+        for (const auto& entry : std::filesystem::recursive_directory_iterator(
+                 SOURCE_ROOT "/src/" + std::string(folder) + "/include"))
+            if (entry.path().extension() == ".h")
+                headers += contentOf(std::filesystem::relative(entry.path(), SOURCE_ROOT).string());
+    // Whatever stands alone between backticks and begins as a type or a member does.
+    static const std::regex name(R"(`(?:[A-Za-z]+::)*([A-Za-z_]{4,})(?:\(\))?`)");
+    std::size_t names = 0;
+    for (std::sregex_iterator it(page.begin(), page.end(), name), end; it != end; ++it) {
+        ++names;
+        EXPECT_NE(headers.find((*it)[1].str()), std::string::npos) << (*it)[1];
+    }
+    EXPECT_GE(names, 40U);
 }
