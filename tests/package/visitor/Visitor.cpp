@@ -132,7 +132,8 @@ private:
 
     /// The menu stands open until somebody chooses from it.
     static bool choose(QWidget& designer, QStringList words) {
-        const QPoint at(words.takeAt(words.size() - 2).toInt(), words.takeLast().toInt());
+        const int Y = words.takeLast().toInt(), X = words.takeLast().toInt();
+        const QPoint at(X, Y);
         bool found = false;
         QTimer::singleShot(200, &designer, [&found, text = words.join(' ')] {
             auto* const menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
