@@ -149,6 +149,12 @@ private:
             menu->close();
         });
         QWidget* const part = designer.childAt(at);
+        // As a click of the user's does.
+        for (QWidget* focused = part; focused; focused = focused->parentWidget()) {
+            if (!(focused->focusPolicy() & Qt::ClickFocus)) continue;
+            focused->setFocus(Qt::MouseFocusReason);
+            break;
+        }
         const QPoint inside = part->mapFrom(&designer, at);
         for (const auto type : {QEvent::MouseButtonPress, QEvent::MouseButtonRelease}) {
             const bool down = type == QEvent::MouseButtonPress;
