@@ -42,16 +42,12 @@ struct DefinitionPicture;
 /// returned. Without such a keeper the control is destroyed while no procedure runs.
 class ZANDOR_CONTROL_EXPORT Zandor {
 public:
-    /// Name under which failures are reported.
     static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.Zandor";
 
-    using String = platform::String; ///< UTF-16
-    /// An object that may be nothing.
+    using String = platform::String;
     template <class T>
     using Ref = platform::Ref<T>;
 
-    /// Makes its constituents, empty and laid out; with an empty query of the library once one is
-    /// asked for. `keeper` is the house that it stands in.
     Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, ZandorEvents& events,
            std::weak_ptr<void> keeper = {});
     Zandor(const Zandor&) = delete;
@@ -61,7 +57,7 @@ public:
 
     // What a front end notifies; UserControl_Initialize runs within construction.
     void UserControl_Paint();
-    void UserControl_Resize(); ///< the inner size is another one
+    void UserControl_Resize();
 
     /// Runs UserControl_Terminate, the first time. From then on no procedure does anything, and
     /// those that run, further down the stack, return without another call of toolkit, host or
@@ -125,7 +121,6 @@ public:
     void VisibleFrameTop(std::int16_t v);
     /// The query model; never nothing. Setting nothing raises Error and keeps the model held.
     Ref<TalvikZandorLib::Zandor> P_GET_Zandor();
-    /// Keeps grid columns of the model before; ShowAnew behind it takes them away.
     void P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& model);
     /// Scroll range; the next layout overwrites it. A negative value is error 380.
     std::int16_t HorizMaxScrollPos() const;
