@@ -60,12 +60,12 @@ using Integer = std::int16_t;
 
 // A property procedure is an overloaded member function, so a row cannot name it as an argument.
 // clang-format off
-#define ACCESSORS(id, name, type, setter, getterReport, setterReport) \
-    Member{id, u"" #name, Kind::property, Type::type, Setter::setter, getterReport, setterReport, \
+#define ACCESSORS(id, name, type, setter) \
+    Member{id, u"" #name, Kind::property, Type::type, Setter::setter, report::name.get, report::name.let, \
            [](Zandor& zandor) -> Variant { return zandor.name(); }, \
            [](Zandor& zandor, const Variant& value) { zandor.name(valueOf<type>(value)); }}
-#define GETTER(id, name, type, getterReport) \
-    Member{id, u"" #name, Kind::property, Type::type, Setter::none, getterReport, {}, \
+#define GETTER(id, name, type) \
+    Member{id, u"" #name, Kind::property, Type::type, Setter::none, report::name.get, {}, \
            [](Zandor& zandor) -> Variant { return zandor.name(); }}
 #define METHOD(id, name, parameters, ...) \
     Member{id, u"" #name, Kind::method, Type::none, Setter::none, {}, {}, nullptr, nullptr, parameters, \
@@ -109,33 +109,33 @@ const Member table[] = {
     field<&Zandor::MXHorzFrameSize>(0x40030030, u"MXHorzFrameSize"),
     field<&Zandor::MXVertFrameSize>(0x40030031, u"MXVertFrameSize"),
     field<&Zandor::DeletedTable>(0x40030032, u"DeletedTable"),
-    ACCESSORS(0x68030018, DebugSwitch, Integer, byReference, u"P_GET DebugSwitch", u"P_LET DebugSwitch"),
-    ACCESSORS(0x68030017, JoinModifyDisabled, Integer, byValue, u"P_GET JoinModifyDisabled", u"P_LET JoinModifyDisabled"),
-    ACCESSORS(0x68030016, VisibleFrameLeft, Integer, byValue, u"P_GET VisibleFrameLeft", u"P_LET VisibleFrameLeft"),
-    ACCESSORS(0x68030015, VisibleFrameTop, Integer, byReference, u"P_GET VisibleFrameTop", u"P_LET VisibleFrameTop"),
-    Member{0x68030014, u"Zandor", Kind::property, Type::Zandor, Setter::object, u"P_GET Zandor", u"P_SET Zandor",
+    ACCESSORS(0x68030018, DebugSwitch, Integer, byReference),
+    ACCESSORS(0x68030017, JoinModifyDisabled, Integer, byValue),
+    ACCESSORS(0x68030016, VisibleFrameLeft, Integer, byValue),
+    ACCESSORS(0x68030015, VisibleFrameTop, Integer, byReference),
+    Member{0x68030014, u"Zandor", Kind::property, Type::Zandor, Setter::object, report::Zandor.get, report::Zandor.let,
            [](Zandor& zandor) -> Variant { return zandor.P_GET_Zandor(); },
            [](Zandor& zandor, const Variant& value) { zandor.P_SET_Zandor(modelOf(value)); }},
-    ACCESSORS(0x68030013, HorizMaxScrollPos, Integer, byValue, u"P_GET HorizMaxScrollPos", u"P_LET HorizMaxScrollPos"),
-    ACCESSORS(0x68030012, VertMaxScrollPos, Integer, byValue, u"P_GET VertMaxScrollPos", u"P_LET VertMaxScrollPos"),
-    ACCESSORS(0x68030011, HorizontalScrollbarPos, Integer, byValue, u"P_GET HorizontalScrollbarPos", u"P_LET HorizontalScrollbarPos"),
-    ACCESSORS(0x68030010, VerticalScrollbarPos, Integer, byValue, u"P_GET VerticalScrollbarPos", u"P_LET VerticalScrollbarPos"),
-    ACCESSORS(0x6803000F, OnlyJoin, Boolean, byValue, u"P_GET OnlyJoin", u"P_LET OnlyJoin"),
-    ACCESSORS(0x6803000E, UseJoinTypeNormal, Boolean, byValue, u"P_GET UseJoinTypeNormal", u"P_LET UseJoinTypeNormal"),
-    ACCESSORS(0x6803000D, UseJoinTypeLeft, Boolean, byValue, u"P_GET UseJoinTypeLeft", u"P_LET UseJoinTypeLeft"),
-    ACCESSORS(0x6803000C, UseJoinTypeRight, Boolean, byValue, u"P_GET UseJoinTypeRight", u"P_LET UseJoinTypeRight"),
-    ACCESSORS(0x6803000B, UseJoinTypeBoth, Boolean, byValue, u"P_GET UseJoinTypeBoth", u"P_LET UseJoinTypeBoth"),
-    ACCESSORS(0x6803000A, UseJoinCompareOperatorEquals, Boolean, byValue, u"P_GET UseJoinCompareOperatorEquals", u"P_LET UseJoinCompareOperatorEquals"),
-    ACCESSORS(0x68030009, UseJoinCompareOperatorNotEquals, Boolean, byValue, u"P_GET UseJoinCompareOperatorNotEquals", u"P_LET UseJoinCompareOperatorNotEquals"),
-    ACCESSORS(0x68030008, UseJoinCompareOperatorLess, Boolean, byValue, u"P_GET UseJoinCompareOperatorLess", u"P_LET UseJoinCompareOperatorLess"),
-    ACCESSORS(0x68030007, UseJoinCompareOperatorGreater, Boolean, byValue, u"P_GET UseJoinCompareOperatorGreater", u"P_LET UseJoinCompareOperatorGreater"),
-    ACCESSORS(0x68030006, UseJoinCompareOperatorLessEquals, Boolean, byValue, u"P_GET UseJoinCompareOperatorLessEquals", u"P_LET UseJoinCompareOperatorLessEquals"),
-    ACCESSORS(0x68030005, UseJoinCompareOperatorGreaterEquals, Boolean, byValue, u"P_GET UseJoinCompareOperatorGreaterEquals", u"P_LET UseJoinCompareOperatorGreaterEquals"),
-    ACCESSORS(0x68030004, UseJoinCompareOperatorLE, Boolean, byValue, u"P_GET UseJoinCompareOperatorLessEquals", u"P_LET UseJoinCompareOperatorLE"),
-    ACCESSORS(0x68030003, UseJoinCompareOperatorGE, Boolean, byValue, u"P_GET UseJoinCompareOperatorGE", u"P_LET UseJoinCompareOperatorGreaterEquals"),
-    GETTER(0x68030002, lastjoin, ZDJoin, u"P_GET lastjoin"),
-    GETTER(0x68030001, activetable, ZDTable, u"P_GET activetable"),
-    GETTER(0x68030000, ActiveColumn, ZDColumn, u"P_GET activecolumn"),
+    ACCESSORS(0x68030013, HorizMaxScrollPos, Integer, byValue),
+    ACCESSORS(0x68030012, VertMaxScrollPos, Integer, byValue),
+    ACCESSORS(0x68030011, HorizontalScrollbarPos, Integer, byValue),
+    ACCESSORS(0x68030010, VerticalScrollbarPos, Integer, byValue),
+    ACCESSORS(0x6803000F, OnlyJoin, Boolean, byValue),
+    ACCESSORS(0x6803000E, UseJoinTypeNormal, Boolean, byValue),
+    ACCESSORS(0x6803000D, UseJoinTypeLeft, Boolean, byValue),
+    ACCESSORS(0x6803000C, UseJoinTypeRight, Boolean, byValue),
+    ACCESSORS(0x6803000B, UseJoinTypeBoth, Boolean, byValue),
+    ACCESSORS(0x6803000A, UseJoinCompareOperatorEquals, Boolean, byValue),
+    ACCESSORS(0x68030009, UseJoinCompareOperatorNotEquals, Boolean, byValue),
+    ACCESSORS(0x68030008, UseJoinCompareOperatorLess, Boolean, byValue),
+    ACCESSORS(0x68030007, UseJoinCompareOperatorGreater, Boolean, byValue),
+    ACCESSORS(0x68030006, UseJoinCompareOperatorLessEquals, Boolean, byValue),
+    ACCESSORS(0x68030005, UseJoinCompareOperatorGreaterEquals, Boolean, byValue),
+    ACCESSORS(0x68030004, UseJoinCompareOperatorLE, Boolean, byValue),
+    ACCESSORS(0x68030003, UseJoinCompareOperatorGE, Boolean, byValue),
+    GETTER(0x68030002, lastjoin, ZDJoin),
+    GETTER(0x68030001, activetable, ZDTable),
+    GETTER(0x68030000, ActiveColumn, ZDColumn),
     METHOD(0x6003005F, Terminate, {}, { if (!arguments.empty()) throw platform::errors::wrongNumberOfArguments(); zandor.Terminate(); }),
     METHOD(0x60030061, SelectColumnNames, selectColumnNames, { zandor.SelectColumnNames(textAt(arguments, 0, 2), textAt(arguments, 1, 2)); }),
     METHOD(0x60030062, SetCurrentTable, setCurrentTable, { zandor.SetCurrentTable(textAt(arguments, 0, 1)); }),

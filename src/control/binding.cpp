@@ -17,12 +17,12 @@ Held<TalvikZandorLib::Zandor> Zandor::Model() {
 
 platform::Ref<TalvikZandorLib::Zandor> Zandor::P_GET_Zandor() {
     Ref<TalvikZandorLib::Zandor> result;
-    Guard(u"P_GET Zandor", [&] { result = Model(); });
+    Guard(report::Zandor.get, [&] { result = Model(); });
     return result;
 }
 
 void Zandor::P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& given) {
-    Guard(u"P_SET Zandor", [this, model = given] {
+    Guard(report::Zandor.let, [this, model = given] {
         if (!model) {
             Raise(Event::Error, {.Text = u"New Zanodr is nothing!", .Number = -1});
             return;

@@ -27,12 +27,12 @@ void scrollTo(const Part<platform::ScrollBar>& bar, std::int16_t value, const Vi
 
 std::int16_t Zandor::VisibleFrameLeft() const {
     std::int16_t result = 0;
-    Guard(u"P_GET VisibleFrameLeft", [&] { result = toInteger(-fraTable->Left()); });
+    Guard(report::VisibleFrameLeft.get, [&] { result = toInteger(-fraTable->Left()); });
     return result;
 }
 
 void Zandor::VisibleFrameLeft(std::int16_t v) {
-    Guard(u"P_LET VisibleFrameLeft", [&] {
+    Guard(report::VisibleFrameLeft.let, [&] {
         scrollTo(
             hsbTable, v, [&] { return mToolkit->ScaleWidth(); }, [&] { return fraTable->Width(); });
     });
@@ -40,12 +40,12 @@ void Zandor::VisibleFrameLeft(std::int16_t v) {
 
 std::int16_t Zandor::VisibleFrameTop() const {
     std::int16_t result = 0;
-    Guard(u"P_GET VisibleFrameTop", [&] { result = toInteger(-fraTable->Top()); });
+    Guard(report::VisibleFrameTop.get, [&] { result = toInteger(-fraTable->Top()); });
     return result;
 }
 
 void Zandor::VisibleFrameTop(std::int16_t v) {
-    Guard(u"P_LET VisibleFrameTop", [&] {
+    Guard(report::VisibleFrameTop.let, [&] {
         scrollTo(
             vsbTable, v, [&] { return UpperPaneHeight(); }, [&] { return fraTable->Height(); });
     });
@@ -53,46 +53,46 @@ void Zandor::VisibleFrameTop(std::int16_t v) {
 
 std::int16_t Zandor::HorizMaxScrollPos() const {
     std::int16_t result = 0;
-    Guard(u"P_GET HorizMaxScrollPos", [&] { result = hsbTable->Max(); });
+    Guard(report::HorizMaxScrollPos.get, [&] { result = hsbTable->Max(); });
     return result;
 }
 
 void Zandor::HorizMaxScrollPos(std::int16_t v) {
-    Guard(u"P_LET HorizMaxScrollPos", [&] { hsbTable->Max(v); });
+    Guard(report::HorizMaxScrollPos.let, [&] { hsbTable->Max(v); });
 }
 
 std::int16_t Zandor::VertMaxScrollPos() const {
     std::int16_t result = 0;
-    Guard(u"P_GET VertMaxScrollPos", [&] { result = vsbTable->Max(); });
+    Guard(report::VertMaxScrollPos.get, [&] { result = vsbTable->Max(); });
     return result;
 }
 
 void Zandor::VertMaxScrollPos(std::int16_t v) {
-    Guard(u"P_LET VertMaxScrollPos", [&] { vsbTable->Max(v); });
+    Guard(report::VertMaxScrollPos.let, [&] { vsbTable->Max(v); });
 }
 
 std::int16_t Zandor::HorizontalScrollbarPos() const {
     std::int16_t result = 0;
-    Guard(u"P_GET HorizontalScrollbarPos", [&] { result = hsbTable->Value(); });
+    Guard(report::HorizontalScrollbarPos.get, [&] { result = hsbTable->Value(); });
     return result;
 }
 
 void Zandor::HorizontalScrollbarPos(std::int16_t v) {
-    Guard(u"P_LET HorizontalScrollbarPos", [&] { hsbTable->Value(v); });
+    Guard(report::HorizontalScrollbarPos.let, [&] { hsbTable->Value(v); });
 }
 
 std::int16_t Zandor::VerticalScrollbarPos() const {
     std::int16_t result = 0;
-    Guard(u"P_GET VerticalScrollbarPos", [&] { result = vsbTable->Value(); });
+    Guard(report::VerticalScrollbarPos.get, [&] { result = vsbTable->Value(); });
     return result;
 }
 
 void Zandor::VerticalScrollbarPos(std::int16_t v) {
-    Guard(u"P_LET VerticalScrollbarPos", [&] { vsbTable->Value(v); });
+    Guard(report::VerticalScrollbarPos.let, [&] { vsbTable->Value(v); });
 }
 
 void Zandor::OnlyJoin(bool v) {
-    Guard(u"P_LET OnlyJoin", [&] {
+    Guard(report::OnlyJoin.let, [&] {
         mOnlyJoin = v;
         if (!mOnlyJoin) {
             sprColumn->Visible(true);

@@ -306,6 +306,10 @@ void DesignerWindow::connectParts() {
         showTitle();
     });
     connect(&mFile, &QueryFile::changed, this, &DesignerWindow::showTitle);
+    connect(&mFile, &QueryFile::changed, mResults,
+            [this] { mResults->proposeFile(mFile.besideWith(QStringLiteral("csv"))); });
+    connect(mFiles, &FileDialogs::saved, this,
+            [this] { tell(tr("Saved as %1.").arg(platform::qt::asSigns(mFile.name()))); });
     connect(mFiles, &FileDialogs::opened, mDatabases, &DatabaseCommands::followFile);
     connect(&mDocument, &Document::replaced, statusBar(), &QStatusBar::clearMessage);
     connect(mFiles, &FileDialogs::gone, this,

@@ -16,6 +16,7 @@
 #include <QImage>
 #include <QLabel>
 #include <QPushButton>
+#include <QStatusBar>
 #include <QTabWidget>
 #include <QTableWidget>
 #include <QTranslator>
@@ -218,20 +219,23 @@ TEST_F(TheWindowsCommands, ExportTheDrawingAsTheKindOfFileThatIsNamed) {
     EXPECT_FALSE(QImage(folder.path("drawing.png")).isNull());
 }
 
-TEST_F(TheWindowsCommands, ProposeANameForTheDrawing) {
+TEST_F(TheWindowsCommands, ProposeANameForTheDrawingAndTheRows) {
     open();
-    const auto proposed = [&] {
+    const auto proposed = [&](const char* exported) {
         QString name;
         const Answering answers({[&](QDialog& dialog) {
             name = dialog.findChild<QLineEdit*>("fileNameEdit")->text();
             dialog.reject();
         }});
-        command("exportPicture");
+        command(exported);
         return name;
     };
-    EXPECT_EQ(proposed(), "drawing.png");
+    EXPECT_EQ(proposed("exportPicture"), "drawing.png");
+    EXPECT_EQ(proposed("exportRows"), "rows.csv");
     commandWithFile("save", folder.path("large orders.json"));
-    EXPECT_EQ(proposed(), "large orders.png");
+    EXPECT_EQ(window->statusBar()->currentMessage(), "Saved as large orders.json.");
+    EXPECT_EQ(proposed("exportPicture"), "large orders.png");
+    EXPECT_EQ(proposed("exportRows"), "large orders.csv");
 }
 
 TEST_F(TheWindowsCommands, CutTablesInPicturesWhenThatIsWanted) {

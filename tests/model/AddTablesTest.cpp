@@ -118,6 +118,38 @@ TEST_F(AddingTables, DrawsOneOfSeveralKeysBetweenTwoTablesAndTellsOfTheOthers) {
     EXPECT_EQ(joins(query).size(), 2U);
 }
 
+TEST_F(AddingTables, LeadsEachOfSeveralKeysToAnInstanceOfItsOwn) {
+    ASSERT_TRUE(add({u"bills"}));
+    ASSERT_TRUE(add({u"customers"}));
+    ASSERT_TRUE(add({u"customers"}));
+    EXPECT_EQ(joins(query), (Joins{"bills.Buyer = customers.id", "bills.payer = customers_1.id"}));
+    // A key that is drawn stays where it is, whoever drew it.
+    query.Joins().Remove(query.Joins().Item(1)->Key());
+    const auto join = platform::makeRef<model::Join>();
+    const auto table = [&](std::int32_t n) {
+        return std::static_pointer_cast<model::Table>(query.Tables().Item(n));
+    };
+    join->LeftColumn(table(2)->columnNamed(u"id"));
+    join->RightColumn(table(1)->columnNamed(u"taker"));
+    query.AddJoin(join);
+    ASSERT_TRUE(add({u"customers"}));
+    EXPECT_EQ(joins(query), (Joins{"bills.payer = customers_1.id", "customers.id = bills.taker",
+                                   "bills.Buyer = customers_2.id"}));
+    ASSERT_TRUE(add({u"customers"}));
+    EXPECT_EQ(joins(query).size(), 3U);
+}
+
+TEST_F(AddingTables, LeadsEachKeyToAnInstanceWhenAllComeAtOnce) {
+    std::vector<reader::LeftOut> leftOut;
+    const TableId customers{u"", u"customers"};
+    ASSERT_TRUE(reader::addTables(query, database.reader(),
+                                  {customers, {u"", u"bills"}, customers, customers}, 16000,
+                                  &leftOut));
+    EXPECT_EQ(joins(query), (Joins{"bills.Buyer = customers.id", "bills.payer = customers_1.id",
+                                   "bills.taker = customers_2.id"}));
+    EXPECT_TRUE(leftOut.empty());
+}
+
 TEST_F(AddingTables, DrawsOneOfTwoKeysThatRunAgainstEachOther) {
     std::vector<reader::LeftOut> leftOut;
     ASSERT_TRUE(reader::addTables(query, database.reader(), {{u"", u"members"}, {u"", u"teams"}},

@@ -107,6 +107,7 @@ bool FileDialogs::saveTo(const QString& path) {
         return false;
     }
     mRecent.add(mFile.path());
+    emit saved();
     return true;
 }
 

@@ -37,6 +37,7 @@ public:
 signals:
     /// A file was opened: its database may be another one (QueryFile::databaseAddress()).
     void opened();
+    void saved();
     /// The query's file is no longer there: one line.
     void gone(const QString& message);
 

@@ -8,6 +8,7 @@
 #include <Zandor/files/Replacement.h>
 
 #include <QCryptographicHash>
+#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 
@@ -35,6 +36,12 @@ QueryFile::QueryFile(Document& document, QObject* parent) : QObject(parent), mDo
 
 QString QueryFile::name() const {
     return mPath.isEmpty() ? tr("Untitled") : QFileInfo(mPath).fileName();
+}
+
+QString QueryFile::besideWith(const QString& suffix) const {
+    if (mPath.isEmpty()) return {};
+    const QFileInfo file(mPath);
+    return file.dir().filePath(file.completeBaseName() + u'.' + suffix);
 }
 
 std::optional<QString> QueryFile::databaseAddress() const {

@@ -25,6 +25,9 @@ public:
     const QString& path() const { return mPath; }
     /// For titles and messages: the file's name without its folder, or "Untitled".
     QString name() const;
+    /// Beside the file and called like it, with another suffix: what to call something that is made
+    /// of the query. Empty as long as the query was never saved.
+    QString besideWith(const QString& suffix) const;
     /// Of the database that the query asks, never with a password: what the file said, or was set.
     std::optional<QString> databaseAddress() const;
     /// For the next saving; a password is taken out of it. Nothing is modified by it.

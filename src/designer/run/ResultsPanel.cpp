@@ -223,8 +223,9 @@ void ResultsPanel::finish(const Outcome& outcome) {
 }
 
 void ResultsPanel::askForFile() {
-    const QString path = QFileDialog::getSaveFileName(this, tr("Export all rows"), tr("rows.csv"),
-                                                      tr("Comma-separated values (*.csv)"));
+    const QString path = QFileDialog::getSaveFileName(
+        this, tr("Export all rows"), mProposed.isEmpty() ? tr("rows.csv") : mProposed,
+        tr("Comma-separated values (*.csv)"));
     if (path.isEmpty()) return;
     const bool named = path.endsWith(QLatin1String(".csv"), Qt::CaseInsensitive);
     exportTo(named ? path : path + QLatin1String(".csv"));

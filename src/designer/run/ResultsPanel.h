@@ -40,6 +40,9 @@ public:
     QAction* exportAction() { return mExport; } ///< asks for the file
     QAction* copyAction();
 
+    /// What the file of an export is called unless the user calls it otherwise; empty: as at first.
+    void proposeFile(const QString& path) { mProposed = path; }
+
     /// Runs the query as it is drawn now and shows its rows, up to the limit. Asks for parameters.
     void run();
     /// Ends what is running, on the engine too.
@@ -83,10 +86,11 @@ private:
     Database& mDatabase;
     QString mAddress; ///< where the rows that are shown came from
     QMap<QString, QString> mAnswers;
-    QString mStatement;      ///< that ran last
+    QString mStatement;          ///< that ran last
     bool mComparesTexts = false; ///< the query that ran last
-    platform::String mAsked; ///< by the query whose rows are shown
-    QString mFile;           ///< that is being exported to; empty otherwise
+    platform::String mAsked;     ///< by the query whose rows are shown
+    QString mProposed;           ///< for the file of an export
+    QString mFile;               ///< that is being exported to; empty otherwise
     std::shared_ptr<Spool> mSpool;
     WorkerPointer mWorker;
     QElapsedTimer mClock;

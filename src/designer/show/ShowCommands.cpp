@@ -60,11 +60,9 @@ DrawingPicture ShowCommands::picture() const {
                                                  : DrawingPicture::Rows::asDrawn);
 }
 
-/// Beside the query's file and called like it.
 QString ShowCommands::proposedName() const {
-    const QFileInfo file(mFile.path());
-    if (!mFile.path().isEmpty())
-        return file.dir().filePath(file.completeBaseName() + QStringLiteral(".png"));
+    if (const QString beside = mFile.besideWith(QStringLiteral("png")); !beside.isEmpty())
+        return beside;
     return QDir(QStandardPaths::writableLocation(QStandardPaths::PicturesLocation))
         .filePath(tr("drawing.png"));
 }

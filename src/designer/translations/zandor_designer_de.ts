@@ -1043,7 +1043,7 @@
     </message>
     <message>
         <source>Add field…</source>
-        <translation>Feld hinzufügen…</translation>
+        <translation>Neues Feld…</translation>
     </message>
     <message>
         <source>Type to find a field</source>
@@ -1448,6 +1448,10 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     <message>
         <source>&amp;Try again</source>
         <translation>&amp;Erneut versuchen</translation>
+    </message>
+    <message>
+        <source>Saved as %1.</source>
+        <translation>Gespeichert als %1.</translation>
     </message>
 </context>
 <context>

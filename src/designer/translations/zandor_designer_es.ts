@@ -1043,7 +1043,7 @@
     </message>
     <message>
         <source>Add field…</source>
-        <translation>Añadir campo…</translation>
+        <translation>Añadir…</translation>
     </message>
     <message>
         <source>Type to find a field</source>
@@ -1448,6 +1448,10 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     <message>
         <source>&amp;Try again</source>
         <translation>&amp;Intentar de nuevo</translation>
+    </message>
+    <message>
+        <source>Saved as %1.</source>
+        <translation>Guardado como %1.</translation>
     </message>
 </context>
 <context>

@@ -1043,7 +1043,7 @@
     </message>
     <message>
         <source>Add field…</source>
-        <translation>Ajouter un champ…</translation>
+        <translation>Ajouter…</translation>
     </message>
     <message>
         <source>Type to find a field</source>
@@ -1448,6 +1448,10 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <message>
         <source>&amp;Try again</source>
         <translation>Réessa&amp;yer</translation>
+    </message>
+    <message>
+        <source>Saved as %1.</source>
+        <translation>Enregistré sous %1.</translation>
     </message>
 </context>
 <context>

@@ -42,25 +42,61 @@ std::vector<std::size_t> instancesOf(const TableId& source, const std::vector<Ta
     return positions;
 }
 
-/// The relations among the sources that reach one from `firstNew` on. Those among the earlier
-/// ones are as the user left them.
-Result<std::vector<Relation>> relations(DatabaseReader& reader, const std::vector<TableId>& sources,
-                                        std::size_t firstNew) {
-    std::vector<Relation> result;
-    for (std::size_t child = 0; child < sources.size(); ++child) {
-        if (instancesOf(sources[child], sources).front() != child) continue;
-        auto keys = reader.foreignKeys(sources[child]);
-        if (!keys) return keys.failure();
-        for (ForeignKey& key : *keys) {
-            auto parents = instancesOf(key.parent, sources);
-            std::erase(parents, child);
-            if (parents.empty()) continue;
-            const std::size_t parent = parents.front();
-            if (std::max(child, parent) >= firstNew)
-                result.push_back({child, parent, std::move(key)});
+bool hasSmallerName(const ForeignKey& a, const ForeignKey& b) {
+    const auto name = [](const ForeignKey& key) {
+        return std::pair(model::foldedName(key.columns.front().first),
+                         model::foldedName(key.child.name));
+    };
+    return name(a) < name(b);
+}
+
+/// A join that stands in the query, with its tables as positions in the list of them.
+struct Drawn {
+    std::size_t left = 0;
+    std::size_t right = 0;
+    String leftColumn;
+    String rightColumn;
+};
+
+std::vector<Drawn> joinsAmong(model::Query& query, const TableList& tables) {
+    const auto position = [&](const Ref<ZDTable>& table) {
+        return static_cast<std::size_t>(std::ranges::find(tables, table) - tables.begin());
+    };
+    std::vector<Drawn> drawn;
+    for (const auto& join : Each<TalvikZandorLib::ZDJoin>(query.Joins()))
+        if (join->LeftColumn() && join->RightColumn())
+            drawn.push_back({position(join->LeftTable()), position(join->RightTable()),
+                             join->LeftColumn()->Name(), join->RightColumn()->Name()});
+    return drawn;
+}
+
+/// Where a key of a child leads: to the first of the parent's instances that the child is not
+/// joined to in another way, so that a second "team" is the other side's. Nothing for a key that is
+/// drawn.
+std::optional<std::size_t> parentFor(const ForeignKey& key, std::size_t child,
+                                     const std::vector<std::size_t>& parents,
+                                     const std::vector<Drawn>& drawn,
+                                     const std::vector<Relation>& found) {
+    const auto& [ofChild, ofParent] = key.columns.front();
+    const auto isPair = [child](std::size_t parent, std::size_t a, std::size_t b) {
+        return (a == child && b == parent) || (a == parent && b == child);
+    };
+    std::optional<std::size_t> free;
+    for (const std::size_t parent : parents) {
+        bool joined = false;
+        for (const Drawn& join : drawn) {
+            if (!isPair(parent, join.left, join.right)) continue;
+            const bool forth = join.left == child;
+            if (model::sameName(forth ? join.leftColumn : join.rightColumn, ofChild) &&
+                model::sameName(forth ? join.rightColumn : join.leftColumn, ofParent))
+                return {};
+            joined = true;
         }
+        for (const Relation& relation : found)
+            joined = joined || isPair(parent, relation.child, relation.parent);
+        if (!joined && !free) free = parent;
     }
-    return result;
+    return free.value_or(parents.front());
 }
 
 /// The columns that a key connects, pair by pair; none for a key that fits no longer.
@@ -75,17 +111,42 @@ std::vector<std::pair<Ref<model::Column>, Ref<model::Column>>> ends(const TableL
     return result;
 }
 
-bool hasSmallerName(const ForeignKey& a, const ForeignKey& b) {
-    const auto name = [](const ForeignKey& key) {
-        return std::pair(model::foldedName(key.columns.front().first),
-                         model::foldedName(key.child.name));
-    };
-    return name(a) < name(b);
+/// The keys of each source, by the smaller name first; those of a source that stands there several
+/// times with its first instance.
+Result<std::vector<std::vector<ForeignKey>>> keysOf(DatabaseReader& reader,
+                                                    const std::vector<TableId>& sources) {
+    std::vector<std::vector<ForeignKey>> all(sources.size());
+    for (std::size_t child = 0; child < sources.size(); ++child) {
+        if (instancesOf(sources[child], sources).front() != child) continue;
+        auto keys = reader.foreignKeys(sources[child]);
+        if (!keys) return keys.failure();
+        std::ranges::stable_sort(*keys, hasSmallerName);
+        all[child] = std::move(*keys);
+    }
+    return all;
 }
 
-/// Leaves those that fit, and of those between one pair of tables one.
-std::vector<LeftOut> choose(const TableList& tables, std::vector<Relation>& relations) {
-    const auto fits = [&](const Relation& relation) { return !ends(tables, relation).empty(); };
+/// The relations by keys that fit, and that reach a table from `firstNew` on. Those among the
+/// earlier ones are as the user left them.
+std::vector<Relation> relations(const TableList& tables, const std::vector<TableId>& sources,
+                                const std::vector<std::vector<ForeignKey>>& keys,
+                                std::size_t firstNew, const std::vector<Drawn>& drawn) {
+    std::vector<Relation> result;
+    for (std::size_t child = 0; child < sources.size(); ++child) {
+        for (const ForeignKey& key : keys[child]) {
+            auto parents = instancesOf(key.parent, sources);
+            std::erase(parents, child);
+            if (parents.empty() || ends(tables, {child, parents.front(), key}).empty()) continue;
+            const auto parent = parentFor(key, child, parents, drawn, result);
+            if (parent && std::max(child, *parent) >= firstNew)
+                result.push_back({child, *parent, key});
+        }
+    }
+    return result;
+}
+
+/// Leaves one of those between one pair of tables.
+std::vector<LeftOut> choose(std::vector<Relation>& relations) {
     const auto onePair = [](const Relation& a, const Relation& b) {
         return (a.child == b.child && a.parent == b.parent) ||
                (a.child == b.parent && a.parent == b.child);
@@ -93,7 +154,6 @@ std::vector<LeftOut> choose(const TableList& tables, std::vector<Relation>& rela
     std::vector<Relation> chosen;
     std::vector<Relation> others;
     for (Relation& relation : relations) {
-        if (!fits(relation)) continue;
         const auto rival = std::ranges::find_if(
             chosen, [&](const Relation& other) { return onePair(relation, other); });
         if (rival == chosen.end()) {
@@ -176,17 +236,19 @@ Result<TableList> addTables(model::Query& query, DatabaseReader& reader,
     std::vector<TableId> sources;
     for (const auto& table : present) sources.push_back({table->schema(), table->sourceName()});
     sources.insert(sources.end(), names.begin(), names.end());
-    auto found = relations(reader, sources, present.size());
-    if (!found) return found.failure();
+    const auto keys = keysOf(reader, sources);
+    if (!keys) return keys.failure();
+    const auto drawn = joinsAmong(query, present);
 
     TableList added;
     for (const auto& description : descriptions) added.push_back(query.addTable(description));
     TableList all = present;
     all.insert(all.end(), added.begin(), added.end());
-    auto others = choose(all, *found);
+    auto found = relations(all, sources, *keys, present.size(), drawn);
+    auto others = choose(found);
     if (leftOut) *leftOut = std::move(others);
-    place(present, added, *found, canvasWidth);
-    for (const Relation& relation : *found) addJoins(query, all, relation);
+    place(present, added, found, canvasWidth);
+    for (const Relation& relation : found) addJoins(query, all, relation);
     return added;
 }
 

@@ -242,3 +242,24 @@ TEST_F(AModelWithoutATable, PassesTheKeyboardOfThatTableOnWithinTheControl) {
     EXPECT_TRUE(widget->isAncestorOf(host.focusWidget())) << focus().toStdString();
     EXPECT_NE(host.focusWidget(), widget.get()) << "which does nothing with keys";
 }
+
+TEST_F(AModelWithoutATable, KeepsTheKeyboardInTheControlWhereverItWas) {
+    for (const bool gridShown : {true, false})
+        for (const char* const part : {"lstTable(1)", "lstTable(2)", "lstTable(3)", "linJoin(1)"}) {
+            bind();
+            widget->setOnlyJoin(!gridShown);
+            tabTo(part);
+            for (std::int32_t n = model->joinCount(); n >= 1; --n)
+                model->joins.items.Remove(model->joinAt(n).key);
+            for (std::int32_t n = model->definitionCount(); n >= 1; --n)
+                model->definitions.items.Remove(model->definitionAt(n).key);
+            for (std::int32_t n = model->tableCount(); n >= 1; --n)
+                model->tables.items.Remove(model->tableAt(n).key);
+            widget->showAnew();
+            settle();
+            QWidget* const has = host.focusWidget();
+            EXPECT_TRUE(has && (has == widget.get() || widget->isAncestorOf(has)))
+                << part << (gridShown ? ", with the grid" : ", without") << ": "
+                << focus().toStdString();
+        }
+}

@@ -11,6 +11,7 @@
 #include <Zandor/control/clsDragColumn.h>
 #include <Zandor/control/clsFreeList.h>
 #include <Zandor/control/clsJoinLine.h>
+#include <Zandor/control/report.h>
 #include <Zandor/platform/KeyedCollection.h>
 #include <Zandor/platform/Toolkit.h>
 #include <Zandor/platform/Words.h>
@@ -108,10 +109,10 @@ public:
     // Property procedures, each beside the name it reports under. Two pairs of names share one
     // flag each, and some of their report names are crossed; hosts' logs know them so.
     // clang-format off
-    std::int16_t DebugSwitch() const { return Get(u"P_GET DebugSwitch", mDebugSwitch); }
-    void DebugSwitch(std::int16_t v) { Let(u"P_LET DebugSwitch", mDebugSwitch, v); }
-    std::int16_t JoinModifyDisabled() const { return Get(u"P_GET JoinModifyDisabled", mJoinModifyDisabled); }
-    void JoinModifyDisabled(std::int16_t v) { Let(u"P_LET JoinModifyDisabled", mJoinModifyDisabled, v); }
+    std::int16_t DebugSwitch() const { return Get(report::DebugSwitch.get, mDebugSwitch); }
+    void DebugSwitch(std::int16_t v) { Let(report::DebugSwitch.let, mDebugSwitch, v); }
+    std::int16_t JoinModifyDisabled() const { return Get(report::JoinModifyDisabled.get, mJoinModifyDisabled); }
+    void JoinModifyDisabled(std::int16_t v) { Let(report::JoinModifyDisabled.let, mJoinModifyDisabled, v); }
     /// How far the canvas is scrolled to the left. A value past the end of the range goes to its
     /// end; a negative one is error 380.
     std::int16_t VisibleFrameLeft() const;
@@ -134,36 +135,36 @@ public:
     void VerticalScrollbarPos(std::int16_t v);
     /// Whether the canvas takes the whole height. Setting false shows the grid with the row titles
     /// of the moment.
-    bool OnlyJoin() const { return Get(u"P_GET OnlyJoin", mOnlyJoin); }
+    bool OnlyJoin() const { return Get(report::OnlyJoin.get, mOnlyJoin); }
     void OnlyJoin(bool v);
-    bool UseJoinTypeNormal() const { return Get(u"P_GET UseJoinTypeNormal", mUseJoinType[0]); }
-    void UseJoinTypeNormal(bool v) { Let(u"P_LET UseJoinTypeNormal", mUseJoinType[0], v); }
-    bool UseJoinTypeLeft() const { return Get(u"P_GET UseJoinTypeLeft", mUseJoinType[1]); }
-    void UseJoinTypeLeft(bool v) { Let(u"P_LET UseJoinTypeLeft", mUseJoinType[1], v); }
-    bool UseJoinTypeRight() const { return Get(u"P_GET UseJoinTypeRight", mUseJoinType[2]); }
-    void UseJoinTypeRight(bool v) { Let(u"P_LET UseJoinTypeRight", mUseJoinType[2], v); }
-    bool UseJoinTypeBoth() const { return Get(u"P_GET UseJoinTypeBoth", mUseJoinType[3]); }
-    void UseJoinTypeBoth(bool v) { Let(u"P_LET UseJoinTypeBoth", mUseJoinType[3], v); }
-    bool UseJoinCompareOperatorEquals() const { return Get(u"P_GET UseJoinCompareOperatorEquals", mUseOperator[0]); }
-    void UseJoinCompareOperatorEquals(bool v) { Let(u"P_LET UseJoinCompareOperatorEquals", mUseOperator[0], v); }
-    bool UseJoinCompareOperatorNotEquals() const { return Get(u"P_GET UseJoinCompareOperatorNotEquals", mUseOperator[1]); }
-    void UseJoinCompareOperatorNotEquals(bool v) { Let(u"P_LET UseJoinCompareOperatorNotEquals", mUseOperator[1], v); }
-    bool UseJoinCompareOperatorLess() const { return Get(u"P_GET UseJoinCompareOperatorLess", mUseOperator[2]); }
-    void UseJoinCompareOperatorLess(bool v) { Let(u"P_LET UseJoinCompareOperatorLess", mUseOperator[2], v); }
-    bool UseJoinCompareOperatorGreater() const { return Get(u"P_GET UseJoinCompareOperatorGreater", mUseOperator[3]); }
-    void UseJoinCompareOperatorGreater(bool v) { Let(u"P_LET UseJoinCompareOperatorGreater", mUseOperator[3], v); }
-    bool UseJoinCompareOperatorLessEquals() const { return Get(u"P_GET UseJoinCompareOperatorLessEquals", mUseOperator[4]); }
-    void UseJoinCompareOperatorLessEquals(bool v) { Let(u"P_LET UseJoinCompareOperatorLessEquals", mUseOperator[4], v); }
-    bool UseJoinCompareOperatorGreaterEquals() const { return Get(u"P_GET UseJoinCompareOperatorGreaterEquals", mUseOperator[5]); }
-    void UseJoinCompareOperatorGreaterEquals(bool v) { Let(u"P_LET UseJoinCompareOperatorGreaterEquals", mUseOperator[5], v); }
-    bool UseJoinCompareOperatorLE() const { return Get(u"P_GET UseJoinCompareOperatorLessEquals", mUseOperator[4]); }
-    void UseJoinCompareOperatorLE(bool v) { Let(u"P_LET UseJoinCompareOperatorLE", mUseOperator[4], v); }
-    bool UseJoinCompareOperatorGE() const { return Get(u"P_GET UseJoinCompareOperatorGE", mUseOperator[5]); }
-    void UseJoinCompareOperatorGE(bool v) { Let(u"P_LET UseJoinCompareOperatorGreaterEquals", mUseOperator[5], v); }
+    bool UseJoinTypeNormal() const { return Get(report::UseJoinTypeNormal.get, mUseJoinType[0]); }
+    void UseJoinTypeNormal(bool v) { Let(report::UseJoinTypeNormal.let, mUseJoinType[0], v); }
+    bool UseJoinTypeLeft() const { return Get(report::UseJoinTypeLeft.get, mUseJoinType[1]); }
+    void UseJoinTypeLeft(bool v) { Let(report::UseJoinTypeLeft.let, mUseJoinType[1], v); }
+    bool UseJoinTypeRight() const { return Get(report::UseJoinTypeRight.get, mUseJoinType[2]); }
+    void UseJoinTypeRight(bool v) { Let(report::UseJoinTypeRight.let, mUseJoinType[2], v); }
+    bool UseJoinTypeBoth() const { return Get(report::UseJoinTypeBoth.get, mUseJoinType[3]); }
+    void UseJoinTypeBoth(bool v) { Let(report::UseJoinTypeBoth.let, mUseJoinType[3], v); }
+    bool UseJoinCompareOperatorEquals() const { return Get(report::UseJoinCompareOperatorEquals.get, mUseOperator[0]); }
+    void UseJoinCompareOperatorEquals(bool v) { Let(report::UseJoinCompareOperatorEquals.let, mUseOperator[0], v); }
+    bool UseJoinCompareOperatorNotEquals() const { return Get(report::UseJoinCompareOperatorNotEquals.get, mUseOperator[1]); }
+    void UseJoinCompareOperatorNotEquals(bool v) { Let(report::UseJoinCompareOperatorNotEquals.let, mUseOperator[1], v); }
+    bool UseJoinCompareOperatorLess() const { return Get(report::UseJoinCompareOperatorLess.get, mUseOperator[2]); }
+    void UseJoinCompareOperatorLess(bool v) { Let(report::UseJoinCompareOperatorLess.let, mUseOperator[2], v); }
+    bool UseJoinCompareOperatorGreater() const { return Get(report::UseJoinCompareOperatorGreater.get, mUseOperator[3]); }
+    void UseJoinCompareOperatorGreater(bool v) { Let(report::UseJoinCompareOperatorGreater.let, mUseOperator[3], v); }
+    bool UseJoinCompareOperatorLessEquals() const { return Get(report::UseJoinCompareOperatorLessEquals.get, mUseOperator[4]); }
+    void UseJoinCompareOperatorLessEquals(bool v) { Let(report::UseJoinCompareOperatorLessEquals.let, mUseOperator[4], v); }
+    bool UseJoinCompareOperatorGreaterEquals() const { return Get(report::UseJoinCompareOperatorGreaterEquals.get, mUseOperator[5]); }
+    void UseJoinCompareOperatorGreaterEquals(bool v) { Let(report::UseJoinCompareOperatorGreaterEquals.let, mUseOperator[5], v); }
+    bool UseJoinCompareOperatorLE() const { return Get(report::UseJoinCompareOperatorLE.get, mUseOperator[4]); }
+    void UseJoinCompareOperatorLE(bool v) { Let(report::UseJoinCompareOperatorLE.let, mUseOperator[4], v); }
+    bool UseJoinCompareOperatorGE() const { return Get(report::UseJoinCompareOperatorGE.get, mUseOperator[5]); }
+    void UseJoinCompareOperatorGE(bool v) { Let(report::UseJoinCompareOperatorGE.let, mUseOperator[5], v); }
     /// Always nothing: hosts learn the object concerned from the events' arguments.
-    Ref<TalvikZandorLib::ZDJoin> lastjoin() const { return Nothing<TalvikZandorLib::ZDJoin>(u"P_GET lastjoin"); }
-    Ref<TalvikZandorLib::ZDTable> activetable() const { return Nothing<TalvikZandorLib::ZDTable>(u"P_GET activetable"); }
-    Ref<TalvikZandorLib::ZDColumn> ActiveColumn() const { return Nothing<TalvikZandorLib::ZDColumn>(u"P_GET activecolumn"); }
+    Ref<TalvikZandorLib::ZDJoin> lastjoin() const { return Nothing<TalvikZandorLib::ZDJoin>(report::lastjoin.get); }
+    Ref<TalvikZandorLib::ZDTable> activetable() const { return Nothing<TalvikZandorLib::ZDTable>(report::activetable.get); }
+    Ref<TalvikZandorLib::ZDColumn> ActiveColumn() const { return Nothing<TalvikZandorLib::ZDColumn>(report::ActiveColumn.get); }
     // clang-format on
 
     /// The share of the height that the canvas has above the grid; not part of the public

@@ -17,8 +17,10 @@ struct LeftOut {
 /// (left the child, right the parent, "="). A table named twice gets in twice. Everything is read
 /// before the query is touched, so on an error the query is as it was.
 ///
-/// Of tables that stand in the query several times, the first one is joined; a key from a table to
-/// itself joins the first to the second, and is left out when there is one only.
+/// Of tables that stand in the query several times, the first one is joined. Where it has several
+/// keys to another table that does, each leads to an instance of its own, the one with the smallest
+/// name to the first; those that are drawn already stay. A key from a table to itself joins the
+/// first to the second, and is left out when there is one only.
 ///
 /// Two keys between one pair of tables, in whatever direction, mostly mean two different things
 /// (who is billed, who is delivered to), and both joins at once find next to nothing. So the one
