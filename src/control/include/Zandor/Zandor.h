@@ -43,12 +43,16 @@ struct DefinitionPicture;
 /// returned. Without such a keeper the control is destroyed while no procedure runs.
 class ZANDOR_CONTROL_EXPORT Zandor {
 public:
+    /// Name under which failures are reported.
     static constexpr platform::StringView ModuleName = u"TalvikDBxZandor.Zandor";
 
-    using String = platform::String;
+    using String = platform::String; ///< UTF-16
+    /// An object that may be nothing.
     template <class T>
     using Ref = platform::Ref<T>;
 
+    /// Makes its constituents, empty and laid out; with an empty query of the library once one is
+    /// asked for. `keeper` is the house that it stands in.
     Zandor(platform::Toolkit& toolkit, TalvikZandorLib::Library& library, ZandorEvents& events,
            std::weak_ptr<void> keeper = {});
     Zandor(const Zandor&) = delete;
@@ -57,7 +61,10 @@ public:
     ~Zandor();
 
     // What a front end notifies; UserControl_Initialize runs within construction.
+    /// The control comes to be shown, or its host asks for painting: what is shown is laid out and
+    /// an open editor closes.
     void UserControl_Paint();
+    /// The inner size is another one.
     void UserControl_Resize();
 
     /// Runs UserControl_Terminate, the first time. From then on no procedure does anything, and
@@ -122,6 +129,7 @@ public:
     void VisibleFrameTop(std::int16_t v);
     /// The query model; never nothing. Setting nothing raises Error and keeps the model held.
     Ref<TalvikZandorLib::Zandor> P_GET_Zandor();
+    /// Keeps grid columns of the model before; ShowAnew behind it takes them away.
     void P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& model);
     /// Scroll range; the next layout overwrites it. A negative value is error 380.
     std::int16_t HorizMaxScrollPos() const;

@@ -8,8 +8,8 @@ namespace zandor::reader {
 
 /// A foreign key that was not drawn, because another one joins the same tables.
 struct LeftOut {
-    ForeignKey drawn;
-    ForeignKey other;
+    ForeignKey drawn; ///< the one that joins them
+    ForeignKey other; ///< the one that was left out
 };
 
 /// Puts tables with their columns into a query, then a join for every pair of columns of the
