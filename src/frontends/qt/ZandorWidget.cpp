@@ -92,7 +92,7 @@ public:
 
 ZandorWidget::ZandorWidget(TalvikZandorLib::Library& library, QWidget* parent)
     : ZandorWidget(parent) {
-    setLibrary(library);
+    mHouse->library.set(library);
 }
 
 ZandorWidget::ZandorWidget(QWidget* parent)
@@ -141,7 +141,11 @@ QPoint ZandorWidget::canvasOrigin() const {
     return mToolkit->view().canvas()->mapTo(this, QPoint());
 }
 
-void ZandorWidget::setLibrary(TalvikZandorLib::Library& library) { mHouse->library.set(library); }
+void ZandorWidget::setLibrary(TalvikZandorLib::Library& library) {
+    mHouse->library.set(library);
+    // Of a form, what can be translated is set last of all, behind OnlyJoin, which reads titles.
+    mControl->OnlyJoin(mControl->OnlyJoin());
+}
 
 void ZandorWidget::setSilent(bool silent) { mToolkit->setSilent(silent); }
 

@@ -37,19 +37,13 @@ QWidget* ZandorPlugin::createWidget(QWidget* parent) {
 }
 
 QString ZandorPlugin::domXml() const {
-    // One line each. Titles of the grid are read when OnlyJoin becomes false, but what can be
-    // translated is set behind all else: they are left to the program to translate.
-    QString texts;
+    QString texts; // of one line each
     const QMetaObject& meta = ZandorWidget::staticMetaObject;
-    for (int i = meta.propertyOffset(); i < meta.propertyCount(); ++i) {
-        const QString property = QString::fromLatin1(meta.property(i).name());
-        if (meta.property(i).typeId() != QMetaType::QString) continue;
-        const QString fixed =
-            property.startsWith(u"LNGSpread") ? QStringLiteral(" notr=\"true\"") : QString();
-        texts +=
-            QStringLiteral("<stringpropertyspecification name=\"%1\" type=\"singleline\"%2/>\n")
-                .arg(property, fixed);
-    }
+    for (int i = meta.propertyOffset(); i < meta.propertyCount(); ++i)
+        if (meta.property(i).typeId() == QMetaType::QString)
+            texts +=
+                QStringLiteral("<stringpropertyspecification name=\"%1\" type=\"singleline\"/>\n")
+                    .arg(QLatin1String(meta.property(i).name()));
     return QStringLiteral(R"(<ui language="c++" displayname="Query Designer">
 <widget class="ZandorWidget" name="zandorWidget">
 <property name="geometry"><rect><x>0</x><y>0</y><width>640</width><height>420</height></rect></property>

@@ -177,20 +177,18 @@ TEST_F(TheEditor, KeepsWhatAFormSays) {
     EXPECT_EQ(ownProperties(formOfTests()).size(), 6U);
 }
 
-TEST_F(TheEditor, LeavesTheTitlesOfTheGridToTheProgramToTranslate) {
+TEST_F(TheEditor, WritesTextsOfOneLineThatCanBeTranslated) {
+    QWidget& widget = fresh();
+    editor.change(widget, QStringLiteral("LNGSpreadField"), QStringLiteral("Column:"));
+    EXPECT_TRUE(editor.contents().contains(u"<string>Column:</string>"));
+    const QString code = compiled(editor.contents());
+    EXPECT_TRUE(code.contains(u"setLNGSpreadField(QCoreApplication::translate("))
+        << qPrintable(code);
+
     QDomDocument document;
     ASSERT_TRUE(document.setContent(plugin().domXml()));
-    std::set<std::string> fixed, translated;
-    const auto all = document.elementsByTagName(QStringLiteral("stringpropertyspecification"));
-    for (int i = 0; i < all.size(); ++i) {
-        const QDomElement text = all.at(i).toElement();
-        EXPECT_EQ(text.attribute(QStringLiteral("type")), u"singleline");
-        const bool is = text.attribute(QStringLiteral("notr")) == u"true";
-        (is ? fixed : translated).insert(text.attribute(QStringLiteral("name")).toStdString());
-    }
-    EXPECT_EQ(fixed,
-              (std::set<std::string>{"LNGSpreadCriteria", "LNGSpreadField", "LNGSpreadOr",
-                                     "LNGSpreadSort", "LNGSpreadSynonym", "LNGSpreadVisible"}));
-    EXPECT_EQ(translated.count("LNGJoinOk"), 1U);
-    EXPECT_EQ(translated.size(), 20U);
+    const auto texts = document.elementsByTagName(QStringLiteral("stringpropertyspecification"));
+    EXPECT_EQ(texts.size(), 26);
+    for (int i = 0; i < texts.size(); ++i)
+        EXPECT_EQ(texts.at(i).toElement().attribute(QStringLiteral("type")), u"singleline");
 }

@@ -30,9 +30,11 @@ TEST(ACompiledForm, HasTheWidgetWithItsPropertiesAndTakesAQuery) {
 }
 
 TEST(ACompiledForm, HasTheTitlesOfTheGridThatItSays) {
+    fake::Library library;
     QDialog dialog;
     Ui::QueryForm form;
     form.setupUi(&dialog);
+    form.query->setLibrary(library);
     const auto* const grid =
         dynamic_cast<GridWidget*>(form.query->findChild<QWidget*>(QStringLiteral("sprColumn")));
     ASSERT_TRUE(grid);

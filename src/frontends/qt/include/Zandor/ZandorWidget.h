@@ -150,7 +150,8 @@ public:
     QPoint fromCanvas(QPointF twips) const;
     /// Who makes the model's objects, for a widget that was made without: before its model is asked
     /// for or set. Until then the model is an empty one, and a join or an output column that the
-    /// user makes in another is reported as error 91. The library outlives the widget.
+    /// user makes in another is reported as error 91. The library outlives the widget. The titles of
+    /// the grid, when it is shown, become those of the moment.
     void setLibrary(TalvikZandorLib::Library& library);
     /// Leaves out the message boxes, errors and traces alike: for where nobody is at work with the
     /// control, as in an editor of forms.
