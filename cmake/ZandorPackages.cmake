@@ -1,18 +1,27 @@
-# Debian packages: `cpack -G DEB` in the build folder of shared libraries.
+# Debian packages: `cpack -G DEB` in the build folder of shared libraries, configured with the
+# prefix /usr. `tests/package/debian` makes them and tries them on a clean system.
+if(NOT BUILD_SHARED_LIBS)
+    return()
+endif()
+set(release 1)
 set(abi ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})
+set(libraries "libzandor${abi} (= ${PROJECT_VERSION}-${release})")
 set(CPACK_PACKAGE_NAME zandor)
 set(CPACK_PACKAGE_VERSION ${PROJECT_VERSION})
 set(CPACK_PACKAGE_CONTACT "The Zandor authors <zandor@example.org>")
+set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "") # each package has one of its own
 set(CPACK_RESOURCE_FILE_LICENSE ${PROJECT_SOURCE_DIR}/LICENSE)
 set(CPACK_PACKAGING_INSTALL_PREFIX /usr)
 set(CPACK_STRIP_FILES ON)
 set(CPACK_VERBATIM_VARIABLES ON)
-set(CPACK_COMPONENTS_ALL runtime development designer)
 
 set(CPACK_DEB_COMPONENT_INSTALL ON)
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
+set(CPACK_DEBIAN_PACKAGE_RELEASE ${release})
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
 set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS ON)
+set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS_POLICY ">=")
+set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS
     ${PROJECT_BINARY_DIR}/src
     ${PROJECT_BINARY_DIR}/src/frontends/headless
@@ -24,36 +33,86 @@ set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_NAME libzandor${abi})
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_SECTION libs)
 set(CPACK_COMPONENT_RUNTIME_DESCRIPTION "visual query designer to embed - libraries
- Tables as movable boxes, joins as lines between them, output columns in a
- grid below; whatever the user does is written into the query model of the
- program that has the control. With a ready-made model that writes SQL.")
+Tables as movable boxes, joins as lines between them, output columns in a
+grid below; whatever the user does is written into the query model of the
+program that has the control. With a ready-made model that writes SQL.")
+
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_NAME libzandor-dev)
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_SECTION libdevel)
-set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_DEPENDS
-    "libzandor${abi} (= ${PROJECT_VERSION}), qt6-base-dev")
+set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_DEPENDS "${libraries}, qt6-base-dev (>= 6.4)")
+set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_SUGGESTS qt6-designer-plugin-zandor)
 set(CPACK_COMPONENT_DEVELOPMENT_DESCRIPTION "visual query designer to embed - development files
- Headers, link names, and what CMake and pkg-config find the libraries by.")
+Headers, link names, and what CMake and pkg-config find the libraries by, for
+programs that let their users draw questions to a database.")
+
 set(CPACK_DEBIAN_DESIGNER_PACKAGE_NAME zandor-designer)
 set(CPACK_DEBIAN_DESIGNER_PACKAGE_SECTION database)
-set(CPACK_DEBIAN_DESIGNER_PACKAGE_DEPENDS "libzandor${abi} (= ${PROJECT_VERSION})")
+set(CPACK_DEBIAN_DESIGNER_PACKAGE_DEPENDS "${libraries}, libqt6sql6-sqlite")
+set(CPACK_DEBIAN_DESIGNER_PACKAGE_RECOMMENDS qt6-translations-l10n)
+set(CPACK_DEBIAN_DESIGNER_PACKAGE_SUGGESTS
+    "libqt6sql6-psql, libqt6sql6-mysql, libqt6sql6-odbc")
 set(CPACK_COMPONENT_DESIGNER_DESCRIPTION "questions to a database, drawn instead of written
- A desktop program over SQLite, PostgreSQL and ODBC databases: tables are
- boxes, joins are lines, what is to come out stands in a grid. It writes the
- SQL, runs it and shows the rows, and never changes the data.")
+A desktop program over SQLite, PostgreSQL, MySQL and ODBC databases: tables
+are boxes, joins are lines, what is to come out stands in a grid. It writes
+the SQL, runs it and shows the rows, and never changes the data.")
 
-# What Debian wants of every package.
+set(CPACK_DEBIAN_PLUGIN_PACKAGE_NAME qt6-designer-plugin-zandor)
+set(CPACK_DEBIAN_PLUGIN_PACKAGE_SECTION devel)
+set(CPACK_DEBIAN_PLUGIN_PACKAGE_DEPENDS "${libraries}")
+set(CPACK_DEBIAN_PLUGIN_PACKAGE_RECOMMENDS designer-qt6)
+set(CPACK_COMPONENT_PLUGIN_DESCRIPTION "visual query designer to embed - plug-in for Qt Designer
+Puts the query designer into the widget box of Qt Designer, and lets programs
+load forms that have it.")
+
+# What is built is packed, as far as there is a package for it.
+get_cmake_property(built COMPONENTS)
+set(CPACK_COMPONENTS_ALL)
+foreach(component runtime development designer plugin)
+    if(component IN_LIST built)
+        list(APPEND CPACK_COMPONENTS_ALL ${component})
+    endif()
+endforeach()
+
+# What Debian wants of every package: its licence and two changelogs, of the program and of the
+# package.
 find_program(ZANDOR_GZIP gzip REQUIRED)
-set(changelog ${PROJECT_BINARY_DIR}/changelog.gz)
-add_custom_command(OUTPUT ${changelog}
-    COMMAND ${ZANDOR_GZIP} -9nc ${PROJECT_SOURCE_DIR}/CHANGELOG.md > ${changelog}
-    DEPENDS ${PROJECT_SOURCE_DIR}/CHANGELOG.md
-    VERBATIM)
-add_custom_target(zandor_changelog ALL DEPENDS ${changelog})
+string(TIMESTAMP date "%a, %d %b %Y %H:%M:%S +0000" UTC)
+file(CONFIGURE OUTPUT ${PROJECT_BINARY_DIR}/changelog.Debian CONTENT
+"zandor (@PROJECT_VERSION@-@release@) unstable; urgency=medium
+
+  * See changelog.gz.
+
+ -- @CPACK_PACKAGE_CONTACT@  @date@
+" @ONLY)
+set(packed)
+foreach(text ${PROJECT_SOURCE_DIR}/CHANGELOG.md ${PROJECT_BINARY_DIR}/changelog.Debian)
+    set(log ${PROJECT_BINARY_DIR}/package/changelog.gz)
+    if(text MATCHES "Debian$")
+        set(log ${PROJECT_BINARY_DIR}/package/changelog.Debian.gz)
+    endif()
+    add_custom_command(OUTPUT ${log}
+        COMMAND ${CMAKE_COMMAND} -E make_directory ${PROJECT_BINARY_DIR}/package
+        COMMAND ${ZANDOR_GZIP} -9nc ${text} > ${log}
+        DEPENDS ${text} VERBATIM)
+    list(APPEND packed ${log})
+endforeach()
+add_custom_target(zandor_changelogs ALL DEPENDS ${packed})
 foreach(component IN LISTS CPACK_COMPONENTS_ALL)
     string(TOUPPER ${component} upper)
     set(folder ${CMAKE_INSTALL_DATADIR}/doc/${CPACK_DEBIAN_${upper}_PACKAGE_NAME})
-    install(FILES ${changelog} DESTINATION ${folder} COMPONENT ${component})
+    install(FILES ${packed} DESTINATION ${folder} COMPONENT ${component})
     install(FILES ${PROJECT_SOURCE_DIR}/LICENSE RENAME copyright
         DESTINATION ${folder} COMPONENT ${component})
 endforeach()
+
+# Six libraries of one version, which nobody has apart; and calls of ldconfig that CPack writes
+# beside the trigger.
+file(CONFIGURE OUTPUT ${PROJECT_BINARY_DIR}/package/overrides CONTENT
+"libzandor@abi@: package-name-doesnt-match-sonames
+libzandor@abi@: maintscript-calls-ldconfig
+" @ONLY)
+file(WRITE ${PROJECT_BINARY_DIR}/package/triggers "activate-noawait ldconfig\n")
+set(CPACK_DEBIAN_RUNTIME_PACKAGE_CONTROL_EXTRA ${PROJECT_BINARY_DIR}/package/triggers)
+install(FILES ${PROJECT_BINARY_DIR}/package/overrides RENAME libzandor${abi}
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/lintian/overrides COMPONENT runtime)
 include(CPack)
