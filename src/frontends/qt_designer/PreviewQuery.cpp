@@ -56,7 +56,7 @@ void join(model::Query& query, const Ref<model::Table>& left, const Ref<model::T
 
 Ref<model::ColumnDefinition> output(model::Query& query, const Ref<model::Table>& table,
                                     StringView column) {
-    const auto definition = makeRef<model::ColumnDefinition>();
+    auto definition = makeRef<model::ColumnDefinition>();
     definition->Column(table->columnNamed(column));
     query.AddColumnDefinition(definition);
     return definition;
@@ -65,7 +65,7 @@ Ref<model::ColumnDefinition> output(model::Query& query, const Ref<model::Table>
 } // namespace
 
 Ref<model::Query> makePreviewQuery() {
-    const auto query = makeRef<model::Query>();
+    auto query = makeRef<model::Query>();
     std::vector<Ref<model::Table>> tables;
     for (const auto& description : descriptions) tables.push_back(query->addTable(description));
     place(tables);
