@@ -74,45 +74,40 @@ foreach(component runtime development designer plugin)
 endforeach()
 
 # What Debian wants of every package: its licence and two changelogs, of the program and of the
-# package.
+# package. Made here, so that a component can be installed before all is built.
 find_program(ZANDOR_GZIP gzip REQUIRED)
+set(place ${PROJECT_BINARY_DIR}/package)
 string(TIMESTAMP date "%a, %d %b %Y %H:%M:%S +0000" UTC)
-file(CONFIGURE OUTPUT ${PROJECT_BINARY_DIR}/changelog.Debian CONTENT
+file(CONFIGURE OUTPUT ${place}/changelog.Debian CONTENT
 "zandor (@PROJECT_VERSION@-@release@) unstable; urgency=medium
 
   * See changelog.gz.
 
  -- @CPACK_PACKAGE_CONTACT@  @date@
 " @ONLY)
-set(packed)
-foreach(text ${PROJECT_SOURCE_DIR}/CHANGELOG.md ${PROJECT_BINARY_DIR}/changelog.Debian)
-    set(log ${PROJECT_BINARY_DIR}/package/changelog.gz)
-    if(text MATCHES "Debian$")
-        set(log ${PROJECT_BINARY_DIR}/package/changelog.Debian.gz)
-    endif()
-    add_custom_command(OUTPUT ${log}
-        COMMAND ${CMAKE_COMMAND} -E make_directory ${PROJECT_BINARY_DIR}/package
-        COMMAND ${ZANDOR_GZIP} -9nc ${text} > ${log}
-        DEPENDS ${text} VERBATIM)
-    list(APPEND packed ${log})
-endforeach()
-add_custom_target(zandor_changelogs ALL DEPENDS ${packed})
+set(log ${PROJECT_SOURCE_DIR}/CHANGELOG.md)
+set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS ${log})
+execute_process(COMMAND ${ZANDOR_GZIP} -9nc ${log}
+    OUTPUT_FILE ${place}/changelog.gz COMMAND_ERROR_IS_FATAL ANY)
+execute_process(COMMAND ${ZANDOR_GZIP} -9nc ${place}/changelog.Debian
+    OUTPUT_FILE ${place}/changelog.Debian.gz COMMAND_ERROR_IS_FATAL ANY)
 foreach(component IN LISTS CPACK_COMPONENTS_ALL)
     string(TOUPPER ${component} upper)
     set(folder ${CMAKE_INSTALL_DATADIR}/doc/${CPACK_DEBIAN_${upper}_PACKAGE_NAME})
-    install(FILES ${packed} DESTINATION ${folder} COMPONENT ${component})
+    install(FILES ${place}/changelog.gz ${place}/changelog.Debian.gz
+        DESTINATION ${folder} COMPONENT ${component})
     install(FILES ${PROJECT_SOURCE_DIR}/LICENSE RENAME copyright
         DESTINATION ${folder} COMPONENT ${component})
 endforeach()
 
 # Six libraries of one version, which nobody has apart; and calls of ldconfig that CPack writes
 # beside the trigger.
-file(CONFIGURE OUTPUT ${PROJECT_BINARY_DIR}/package/overrides CONTENT
+file(CONFIGURE OUTPUT ${place}/overrides CONTENT
 "libzandor@abi@: package-name-doesnt-match-sonames
 libzandor@abi@: maintscript-calls-ldconfig
 " @ONLY)
-file(WRITE ${PROJECT_BINARY_DIR}/package/triggers "activate-noawait ldconfig\n")
-set(CPACK_DEBIAN_RUNTIME_PACKAGE_CONTROL_EXTRA ${PROJECT_BINARY_DIR}/package/triggers)
-install(FILES ${PROJECT_BINARY_DIR}/package/overrides RENAME libzandor${abi}
+file(WRITE ${place}/triggers "activate-noawait ldconfig\n")
+set(CPACK_DEBIAN_RUNTIME_PACKAGE_CONTROL_EXTRA ${place}/triggers)
+install(FILES ${place}/overrides RENAME libzandor${abi}
     DESTINATION ${CMAKE_INSTALL_DATADIR}/lintian/overrides COMPONENT runtime)
 include(CPack)
