@@ -64,10 +64,18 @@ set(CPACK_COMPONENT_PLUGIN_DESCRIPTION "visual query designer to embed - plug-in
 Puts the query designer into the widget box of Qt Designer, and lets programs
 load forms that have it.")
 
+set(CPACK_DEBIAN_PYTHON_PACKAGE_NAME python3-zandor)
+set(CPACK_DEBIAN_PYTHON_PACKAGE_SECTION python)
+set(CPACK_DEBIAN_PYTHON_PACKAGE_DEPENDS
+    "${libraries}, python3 (>= 3.11~), python3 (<< 3.12), python3-pyqt6")
+set(CPACK_COMPONENT_PYTHON_DESCRIPTION "visual query designer to embed - for Python and PyQt6
+The widget, the ready-made query model with its SQL, files and readers of
+databases, and query models written in Python.")
+
 # What is built is packed, as far as there is a package for it.
 get_cmake_property(built COMPONENTS)
 set(CPACK_COMPONENTS_ALL)
-foreach(component runtime development designer plugin)
+foreach(component runtime development designer plugin python)
     if(component IN_LIST built)
         list(APPEND CPACK_COMPONENTS_ALL ${component})
     endif()
