@@ -96,6 +96,18 @@ protected:
         stage->releaseEntry(table, entry, right);
     }
 
+    /// Of the first join.
+    TalvikTabulet::Point middleOfTheLine() {
+        const auto line = stage->look("linJoin(1)");
+        return {(line.X1 + line.X2) / 2, (line.Y1 + line.Y2) / 2};
+    }
+    void menuOverTheLine(const std::string& entry = {}) {
+        willChoose(entry);
+        const auto at = middleOfTheLine();
+        stage->pressCanvas(right, at.X, at.Y);
+        stage->releaseCanvas(right, at.X, at.Y);
+    }
+
     void willChoose(const std::string& entry) {
         stage->onMenu = [this, entry](const std::vector<Stage::Entry>& shown) {
             menu = shown;

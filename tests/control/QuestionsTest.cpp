@@ -61,17 +61,6 @@ protected:
         control().Ask(host);
     }
 
-    TalvikTabulet::Point middleOfTheLine() {
-        const auto line = stage->look("linJoin(1)");
-        return {(line.X1 + line.X2) / 2, (line.Y1 + line.Y2) / 2};
-    }
-    void menuOverTheLine(const std::string& entry = {}) {
-        willChoose(entry);
-        const auto at = middleOfTheLine();
-        stage->pressCanvas(right, at.X, at.Y);
-        stage->releaseCanvas(right, at.X, at.Y);
-    }
-
     /// What the host is asked about, each in one gesture.
     struct Act {
         String question;

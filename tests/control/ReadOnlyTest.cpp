@@ -36,16 +36,6 @@ protected:
         EXPECT_EQ(stage->boxes, Boxes{});
         EXPECT_FALSE(editing());
     }
-    TalvikTabulet::Point middleOfTheLine() {
-        const auto line = stage->look("linJoin(1)");
-        return {(line.X1 + line.X2) / 2, (line.Y1 + line.Y2) / 2};
-    }
-    void menuOverTheLine(const std::string& entry = {}) {
-        willChoose(entry);
-        const auto at = middleOfTheLine();
-        stage->pressCanvas(right, at.X, at.Y);
-        stage->releaseCanvas(right, at.X, at.Y);
-    }
 
     /// The entries of the menu seen last that can be chosen.
     Names onOffer() {
