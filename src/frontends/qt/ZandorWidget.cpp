@@ -231,16 +231,10 @@ void ZandorWidget::setTableNotes(const QMap<QString, QString>& notes) {
 }
 
 void ZandorWidget::showAnew() {
-    const auto hasKeyboard = [this] {
-        const QWidget* const focus = window()->focusWidget();
-        return focus && (focus == this || isAncestorOf(focus));
-    };
-    const bool had = hasKeyboard();
     const QPointer<ZandorWidget> alive = this;
     mControl->ShowAnew();
+    // A part that goes with the keyboard's focus passes it on within the widget.
     if (alive) mToolkit->grid()->offerAnew();
-    // The part that had it may have gone.
-    if (alive && had && !hasKeyboard()) mToolkit->navigation().enter(true);
 }
 
 QSize ZandorWidget::sizeHint() const { return {900, 600}; }
