@@ -118,4 +118,15 @@ file(WRITE ${place}/triggers "activate-noawait ldconfig\n")
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_CONTROL_EXTRA ${place}/triggers)
 install(FILES ${place}/overrides RENAME libzandor${abi}
     DESTINATION ${CMAKE_INSTALL_DATADIR}/lintian/overrides COMPONENT runtime)
+
+# What Python has compiled goes with its source.
+file(WRITE ${place}/prerm "#!/bin/sh
+set -e
+if command -v py3clean >/dev/null; then py3clean -p python3-zandor; fi
+")
+file(WRITE ${place}/postinst "#!/bin/sh
+set -e
+if command -v py3compile >/dev/null; then py3compile -p python3-zandor; fi
+")
+set(CPACK_DEBIAN_PYTHON_PACKAGE_CONTROL_EXTRA ${place}/prerm ${place}/postinst)
 include(CPack)
