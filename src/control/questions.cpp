@@ -21,6 +21,7 @@ void Zandor::ReadOnly(bool value) {
         if (mReadOnly == value) return;
         // While it may still be kept, what stands in an open editor is, if it is kept at all.
         if (value) MakeGetValueFieldsInvisible();
+        mLife.check();
         mReadOnly = value;
         for (const auto& [index, table] : lstTable) table->Locked(value);
     });
@@ -95,26 +96,29 @@ MenuPlace Zandor::PlaceOfMenu(std::int16_t source, float X, float Y) {
 }
 
 /// Entries that were made for an earlier menu serve again; those that are too many are hidden.
+/// Where the host fails, the menu opens with the control's own.
 void Zandor::OfferHostEntries(std::int16_t source, float X, float Y) {
-    std::vector<HostEntry> offered;
-    if (mQuestions) {
+    Guard(u"OfferHostEntries", [&] {
+        mHostEntries.clear();
+        for (const auto& entry : mnuHost) entry->Visible(false);
+        if (!mQuestions) return;
         const MenuPlace place = PlaceOfMenu(source, X, Y);
-        offered = Answer([&](Questions& questions) { return questions.MenuEntries(place); });
-    }
-    if (!offered.empty()) offered.insert(offered.begin(), {.Caption = u"-", .Chosen = {}});
-    mHostEntries.swap(offered);
-    while (mnuHost.size() < mHostEntries.size()) {
-        const std::size_t n = mnuHost.size();
-        const String name = u"mnuHost" + platform::decimal(static_cast<std::int32_t>(n));
-        mnuHost.emplace_back(mLife, mnuZandor->makeEntry(
-                                        {.Name = name}, [this, n] { mnuHost_Click(n); }, nullptr));
-    }
-    for (std::size_t n = 0; n < mnuHost.size(); ++n) {
-        const bool used = n < mHostEntries.size();
-        if (used) mnuHost[n]->Caption(mHostEntries[n].Caption);
-        if (used) mnuHost[n]->Enabled(mHostEntries[n].Enabled);
-        mnuHost[n]->Visible(used);
-    }
+        auto offered = Answer([&](Questions& questions) { return questions.MenuEntries(place); });
+        if (offered.empty()) return;
+        offered.insert(offered.begin(), {.Caption = u"-", .Chosen = {}});
+        mHostEntries.swap(offered);
+        for (std::size_t n = 0; n < mHostEntries.size(); ++n) {
+            if (n == mnuHost.size()) {
+                const String name = u"mnuHost" + platform::decimal(static_cast<std::int32_t>(n));
+                mnuHost.emplace_back(mLife,
+                                     mnuZandor->makeEntry(
+                                         {.Name = name}, [this, n] { mnuHost_Click(n); }, nullptr));
+            }
+            mnuHost[n]->Caption(mHostEntries[n].Caption);
+            mnuHost[n]->Enabled(mHostEntries[n].Enabled);
+            mnuHost[n]->Visible(true);
+        }
+    });
 }
 
 void Zandor::mnuHost_Click(std::size_t entry) {

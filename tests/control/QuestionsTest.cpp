@@ -270,6 +270,16 @@ TEST_F(AHostThatIsAsked, HearsOfAFailureOfAnEntryOfItsOwn) {
     EXPECT_EQ(stage->boxes, Boxes{report(u"mnuHost_Click", refusal())});
 }
 
+TEST_F(AHostThatIsAsked, HasAMenuWithoutItsEntriesWhenItFails) {
+    host->entries = {{u"One", {}}};
+    menuOverEntry(1, id);
+    host->first = [] { throw refusal(); };
+    menuOverEntry(1, id);
+    EXPECT_EQ(stage->boxes, Boxes{report(u"OfferHostEntries", refusal())});
+    const Texts shown = captions(menu);
+    EXPECT_EQ(std::count(shown.begin(), shown.end(), u"One"), 0);
+}
+
 TEST_F(AHostThatIsAsked, MayEndTheControlByAnEntryOfItsOwn) {
     host->entries = {{u"Close", [this] { control().End(); }}};
     menuOverEntry(1, id, "mnuHost1");

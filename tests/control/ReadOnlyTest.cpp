@@ -108,11 +108,28 @@ TEST_F(ADrawingThatIsOnlyRead, ShowsTheDefinitionOfAJoin) {
         ++shown;
         EXPECT_FALSE(stage->look("cboJoinType").enabled);
         EXPECT_FALSE(stage->look("cboJoinCompareOperator").enabled);
-        stage->clickButton("cmdOk");
+        EXPECT_FALSE(stage->look("cmdOk").enabled);
+        stage->clickButton("cmdCancel");
     };
     menuOverTheLine("mnuJoinShowDefinition");
     EXPECT_EQ(shown, 1);
     expectUnchanged();
+}
+
+TEST_F(ADrawingThatIsOnlyRead, KeepsAJoinWhoseTypeTheDialogDoesNotOffer) {
+    control().ReadOnly(false);
+    model->joinAt(1).joinType = 1;
+    control().UseJoinTypeLeft(false);
+    control().UseJoinTypeRight(false);
+    control().UseJoinTypeBoth(false);
+    control().ReadOnly(true);
+    bind();
+    stage->onDialog = [&] {
+        stage->clickButton("cmdOk");
+        stage->clickButton("cmdCancel");
+    };
+    menuOverTheLine("mnuJoinShowDefinition");
+    EXPECT_EQ(model->joinAt(1).joinType, 1);
 }
 
 TEST_F(ADrawingThatIsOnlyRead, KeepsTheOrderOfItsColumns) {

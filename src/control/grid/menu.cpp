@@ -8,7 +8,9 @@ void Zandor::PopupZandorMenu(std::int16_t source, float X, float Y) {
     Guard(u"PopupZandorMenu", [&] {
         Raise(Event::Activate);
         CheckMenus(source, X, Y);
+        const std::int32_t binding = mBinding;
         OfferHostEntries(source, X, Y);
+        require(binding == mBinding);
         // Window frameworks that watch the control's window learn that a menu is open.
         const std::uint32_t message = mToolkit->RegisterWindowMessage(u"TALVIKDISABLEVELT");
         std::int32_t scratch = 0;

@@ -70,6 +70,8 @@ void Zandor::mnuJoinShowDefinition_Click() {
         dialog.JoinLine(record);
         // The name says the opposite of what the number does: 0 leaves nothing to choose.
         dialog.JoinModifyDisabled(mReadOnly ? std::int16_t{0} : mJoinModifyDisabled);
+        // What it does not offer, Ok would write as another.
+        if (mReadOnly) dialog.cmdOk->Enabled(false);
         dialog.form->ShowModal();
         if (!dialog.JoinIsModified()) return;
 

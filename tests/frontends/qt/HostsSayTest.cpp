@@ -42,12 +42,12 @@ TEST_F(AHostsSay, InAReadOnlyDrawingTablesHaveNoCrossAndStay) {
 }
 
 TEST_F(AHostsSay, AReadOnlyTableGivesItsNameThePlaceOfTheCross) {
-    const auto wide = [this] { return table(3).grab().toImage(); };
-    const QImage before = wide();
+    const QRect cross = table(3).closeButton().geometry();
     widget->setReadOnly(true);
-    EXPECT_NE(wide(), before);
-    widget->setReadOnly(false);
-    EXPECT_EQ(wide(), before);
+    const QImage place = table(3).grab(cross).toImage();
+    QImage plain = place;
+    plain.fill(place.pixelColor(0, 0));
+    EXPECT_NE(place, plain) << "where the cross was, the long name goes on";
 }
 
 TEST_F(AHostsSay, AReadOnlyDrawingIsPressedIntoTheKeyboardsFocus) {
@@ -99,7 +99,9 @@ TEST_F(AHostsSay, IsHeardByKeys) {
     menus.choice.clear();
     tabTo("linJoin(1)");
     menuKey();
-    EXPECT_FALSE(menus.enabled.contains("mnuHost1") && menus.opened < 2);
+    EXPECT_EQ(menus.opened, 2);
+    EXPECT_TRUE(menus.enabled.contains("mnuJoinDelete"));
+    EXPECT_FALSE(menus.enabled.contains("mnuHost1"));
     widget->setQuestions(nullptr);
     tabTo("lstTable(2)");
     press(Qt::Key_Delete);

@@ -19,7 +19,8 @@ public:
         ++opened;
         enabled.clear();
         for (const QAction* action : menu->actions())
-            if (action->isEnabled() && !action->isSeparator()) enabled += action->objectName();
+            if (action->isEnabled() && action->isVisible() && !action->isSeparator())
+                enabled += action->objectName();
         QTimer::singleShot(0, menu, [this, menu] {
             at = menu->pos();
             const QAction* const active = menu->activeAction();

@@ -47,8 +47,9 @@ struct HostEntry {
 ///
 /// What is refused does not happen: the model is not called for it and no event tells of it. The
 /// model as the host changes it itself is nobody's question. An exception in an answer is reported
-/// as error 440 and refuses. A host that binds a model, or shows its own anew, before it answers
-/// has refused as well, for what it was asked about may not be there any more.
+/// as error 440 and refuses; of the menu it costs the host's entries. A host that binds a model, or
+/// shows its own anew, before it answers has refused as well, for what it was asked about may not be
+/// there any more.
 class ZANDOR_CONTROL_EXPORT Questions {
 public:
     virtual ~Questions() = default;
