@@ -1,5 +1,6 @@
 #include "designer/run/ResultModel.h"
 
+#include "designer/run/shownNumber.h"
 #include "frontends/qt/ShownText.h"
 
 #include <QApplication>
@@ -32,6 +33,7 @@ qsizetype memoryOf(const std::vector<Row>& page) {
 }
 
 QString readable(const Cell& cell) {
+    if (cell.kind == Cell::Kind::number) return shownNumber(cell.text);
     if (cell.kind != Cell::Kind::blob) return cell.text;
     return ResultModel::tr("(blob, %1 bytes)").arg(QLocale().toString(cell.text.toLongLong()));
 }

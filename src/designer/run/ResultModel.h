@@ -30,6 +30,8 @@ public:
     /// A view wants the rows sorted by a column, or with -1 as they came.
     void sort(int column, Qt::SortOrder direction) override { emit sortWished(column, direction); }
 
+    /// Where a row that is shown is in the spool.
+    qint64 spooled(int row) const;
     int rowCount(const QModelIndex& parent = {}) const override;
     int columnCount(const QModelIndex& parent = {}) const override;
     QVariant data(const QModelIndex& index, int role = Qt::DisplayRole) const override;
@@ -45,8 +47,6 @@ signals:
 
 private:
     Cell cell(const QModelIndex& index) const;
-    /// Where a row that is shown is in the spool.
-    qint64 spooled(int row) const;
 
     std::shared_ptr<Spool> mSpool;
     QStringList mColumns;

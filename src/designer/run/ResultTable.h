@@ -21,6 +21,8 @@ public:
     /// The arrow in the header; -1 for none. Sorts nothing.
     void showSorting(int column, Qt::SortOrder direction = Qt::AscendingOrder);
     QAction* copyAction() { return mCopy; }
+    /// An entry of the context menu.
+    QAction* addCommand(const QString& text, const char* name, const std::function<void()>& what);
     /// What is said in the middle while there are no rows; empty for nothing.
     void setEmptyText(const QString& text);
     const QString& emptyText() const { return mEmptyText; }
@@ -35,7 +37,6 @@ protected:
 
 private:
     void copy();
-    QAction* addCommand(const QString& text, const char* name, const std::function<void()>& what);
 
     ResultModel* mModel;
     QAction* mCopy;

@@ -20,6 +20,7 @@ class Database;
 class Document;
 class ResultTable;
 class Spool;
+class SummaryLine;
 
 /// Runs the drawn query and shows its rows, or why there are none. One statement runs at a time; it
 /// runs on a thread and a connection of its own.
@@ -111,6 +112,7 @@ private:
     QPlainTextEdit* mMessageStatement;
     ResultTable* mTable;
     QLabel* mStatus;
+    SummaryLine* mSummary;
     QToolButton* mAll;
 };
 

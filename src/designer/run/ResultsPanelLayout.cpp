@@ -1,5 +1,6 @@
 #include "designer/run/ResultTable.h"
 #include "designer/run/ResultsPanel.h"
+#include "designer/run/SummaryLine.h"
 #include "designer/run/shapeIcon.h"
 
 #include <QAction>
@@ -89,9 +90,12 @@ void ResultsPanel::makeLayout() {
     mAll->setText(tr("All rows"));
     mAll->setToolTip(tr("Run the query again without the limit"));
     connect(mAll, &QToolButton::clicked, this, &ResultsPanel::runAll);
+    mSummary = new SummaryLine(*mTable, this);
+    mTable->addCommand(tr("Copy s&ummary"), "copySummary", [this] { mSummary->copyAll(); });
     auto* foot = new QHBoxLayout;
     foot->setContentsMargins(6, 3, 6, 3);
     foot->addWidget(mStatus, 1);
+    foot->addWidget(mSummary);
     foot->addWidget(mAll);
 
     auto* layout = new QVBoxLayout(this);

@@ -1147,6 +1147,37 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::CellTally</name>
+    <message>
+        <source>Cells: %1</source>
+        <translation>Zellen: %1</translation>
+    </message>
+    <message>
+        <source>Empty: %1</source>
+        <translation>Leer: %1</translation>
+    </message>
+    <message>
+        <source>Numbers: %1</source>
+        <translation>Zahlen: %1</translation>
+    </message>
+    <message>
+        <source>Sum: %1</source>
+        <translation>Summe: %1</translation>
+    </message>
+    <message>
+        <source>Average: %1</source>
+        <translation>Durchschnitt: %1</translation>
+    </message>
+    <message>
+        <source>Smallest: %1</source>
+        <translation>Kleinste: %1</translation>
+    </message>
+    <message>
+        <source>Largest: %1</source>
+        <translation>Größte: %1</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
@@ -2060,6 +2091,10 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
         <source>A text has to be the same as a whole, and on most databases in capital and small letters: Like *berlin* finds Berlin wherever it stands.</source>
         <translation>Ein Text muss als Ganzes gleich sein, bei den meisten Datenbanken auch in Groß- und Kleinbuchstaben: Like *berlin* findet Berlin, wo immer es steht.</translation>
     </message>
+    <message>
+        <source>Copy s&amp;ummary</source>
+        <translation>Z&amp;usammenfassung kopieren</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -2329,6 +2364,17 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>Resize column %1</source>
         <translation>Breite der Spalte %1 ändern</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::SummaryLine</name>
+    <message>
+        <source>What the selected cells come to</source>
+        <translation>Was die gewählten Zellen ergeben</translation>
+    </message>
+    <message>
+        <source>Cells: %1 · adding up, %2 %</source>
+        <translation>Zellen: %1 · wird berechnet, %2 %</translation>
     </message>
 </context>
 <context>

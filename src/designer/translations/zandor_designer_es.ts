@@ -1147,6 +1147,37 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::CellTally</name>
+    <message>
+        <source>Cells: %1</source>
+        <translation>Celdas: %1</translation>
+    </message>
+    <message>
+        <source>Empty: %1</source>
+        <translation>Vacías: %1</translation>
+    </message>
+    <message>
+        <source>Numbers: %1</source>
+        <translation>Números: %1</translation>
+    </message>
+    <message>
+        <source>Sum: %1</source>
+        <translation>Suma: %1</translation>
+    </message>
+    <message>
+        <source>Average: %1</source>
+        <translation>Promedio: %1</translation>
+    </message>
+    <message>
+        <source>Smallest: %1</source>
+        <translation>Menor: %1</translation>
+    </message>
+    <message>
+        <source>Largest: %1</source>
+        <translation>Mayor: %1</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
@@ -2060,6 +2091,10 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
         <source>A text has to be the same as a whole, and on most databases in capital and small letters: Like *berlin* finds Berlin wherever it stands.</source>
         <translation>Un texto tiene que coincidir entero y, en la mayoría de las bases de datos, también en mayúsculas y minúsculas: Like *berlin* encuentra Berlin esté donde esté.</translation>
     </message>
+    <message>
+        <source>Copy s&amp;ummary</source>
+        <translation>Copiar el res&amp;umen</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -2329,6 +2364,17 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>Resize column %1</source>
         <translation>Cambiar el ancho de la columna %1</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::SummaryLine</name>
+    <message>
+        <source>What the selected cells come to</source>
+        <translation>Lo que suman las celdas seleccionadas</translation>
+    </message>
+    <message>
+        <source>Cells: %1 · adding up, %2 %</source>
+        <translation>Celdas: %1 · calculando, %2 %</translation>
     </message>
 </context>
 <context>

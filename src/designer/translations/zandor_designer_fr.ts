@@ -1147,6 +1147,37 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::CellTally</name>
+    <message>
+        <source>Cells: %1</source>
+        <translation>Cellules : %1</translation>
+    </message>
+    <message>
+        <source>Empty: %1</source>
+        <translation>Vides : %1</translation>
+    </message>
+    <message>
+        <source>Numbers: %1</source>
+        <translation>Nombres : %1</translation>
+    </message>
+    <message>
+        <source>Sum: %1</source>
+        <translation>Somme : %1</translation>
+    </message>
+    <message>
+        <source>Average: %1</source>
+        <translation>Moyenne : %1</translation>
+    </message>
+    <message>
+        <source>Smallest: %1</source>
+        <translation>Plus petit : %1</translation>
+    </message>
+    <message>
+        <source>Largest: %1</source>
+        <translation>Plus grand : %1</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
@@ -2060,6 +2091,10 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
         <source>A text has to be the same as a whole, and on most databases in capital and small letters: Like *berlin* finds Berlin wherever it stands.</source>
         <translation>Un texte doit être identique en entier et, dans la plupart des bases de données, jusqu’aux majuscules et minuscules&#xa0;: Like *berlin* trouve Berlin où qu’il se trouve.</translation>
     </message>
+    <message>
+        <source>Copy s&amp;ummary</source>
+        <translation>Copier le rés&amp;umé</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -2329,6 +2364,17 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>Resize column %1</source>
         <translation>Redimensionner la colonne %1</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::SummaryLine</name>
+    <message>
+        <source>What the selected cells come to</source>
+        <translation>Ce que donnent les cellules sélectionnées</translation>
+    </message>
+    <message>
+        <source>Cells: %1 · adding up, %2 %</source>
+        <translation>Cellules : %1 · calcul en cours, %2 %</translation>
     </message>
 </context>
 <context>

@@ -1,22 +1,12 @@
-#include "Databases.h"
-#include "Queries.h"
-#include "designer/database/Answers.h"
+#include "OpenPanel.h"
 
-#include "designer/document/Document.h"
 #include "designer/run/ParameterDialog.h"
-#include "designer/run/ResultTable.h"
-#include "designer/run/ResultsPanel.h"
 
-#include <gmock/gmock.h>
-
-#include <QAction>
 #include <QComboBox>
 #include <QElapsedTimer>
 #include <QHeaderView>
-#include <QLabel>
 #include <QLineEdit>
 #include <QPlainTextEdit>
-#include <QToolButton>
 
 using namespace zandor;
 
@@ -27,43 +17,7 @@ using testing::StartsWith;
 
 namespace {
 
-class TheResultsPanel : public testing::Test {
-protected:
-    void open(const QStringList& statements) {
-        file = folder.database("panel.db", statements);
-        ASSERT_EQ(database.open(file), std::nullopt);
-        panel.resize(500, 400);
-        panel.show();
-    }
-    void show(const QStringList& tables, const std::vector<Drawn>& columns = {}) {
-        document.setQuery(draw(file, tables, columns));
-    }
-    /// Presses the tool button of an action.
-    void press(QAction* action) {
-        for (QToolButton* button : panel.findChildren<QToolButton*>())
-            if (button->defaultAction() == action)
-                return hands::click(*button, button->rect().center());
-        FAIL() << "no button for " << action->text().toStdString();
-    }
-    void pressRun() { press(panel.runAction()); }
-    bool ended() {
-        return until([&] { return !panel.isRunning(); });
-    }
-    std::string status() { return panel.findChild<QLabel*>("runStatus")->text().toStdString(); }
-    std::string message() {
-        const auto* label = panel.findChild<QLabel*>("runMessage");
-        return label->isVisible() ? label->text().toStdString() : "";
-    }
-    designer::ResultTable& table() { return *panel.findChild<designer::ResultTable*>(); }
-    QToolButton& all() { return *panel.findChild<QToolButton*>("allRows"); }
-    QString at(int row, int column) { return table().rows().index(row, column).data().toString(); }
-
-    DatabaseFolder folder;
-    QString file;
-    designer::Document document;
-    designer::Database database;
-    ResultsPanel panel{document, database};
-};
+class TheResultsPanel : public OpenPanel {};
 
 } // namespace
 

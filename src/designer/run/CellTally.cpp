@@ -1,0 +1,46 @@
+#include "designer/run/CellTally.h"
+
+#include "designer/run/shownNumber.h"
+
+#include <QCoreApplication>
+#include <QLocale>
+#include <QStringList>
+
+namespace zandor::designer {
+
+namespace {
+
+class Words {
+    Q_DECLARE_TR_FUNCTIONS(zandor::designer::CellTally)
+};
+
+} // namespace
+
+void CellTally::add(const Cell& cell) {
+    ++mCells;
+    const bool isText = cell.kind == Cell::Kind::text;
+    if (cell.kind == Cell::Kind::null || (isText && cell.text.isEmpty())) ++mEmpty;
+    if (cell.kind != Cell::Kind::number) return;
+    const auto value = Decimal::from(cell.text);
+    if (!value) return;
+    if (mNumbers == 0 || *value < mSmallest) mSmallest = *value;
+    if (mNumbers == 0 || *value > mLargest) mLargest = *value;
+    ++mNumbers;
+    mSum.add(*value);
+}
+
+QString CellTally::inWords() const {
+    const auto count = [](qint64 value) { return QLocale().toString(value); };
+    QStringList parts{Words::tr("Cells: %1").arg(count(mCells))};
+    if (mEmpty > 0) parts << Words::tr("Empty: %1").arg(count(mEmpty));
+    if (mNumbers > 0) {
+        if (mNumbers + mEmpty < mCells) parts << Words::tr("Numbers: %1").arg(count(mNumbers));
+        parts << Words::tr("Sum: %1").arg(shownNumber(sum().text()))
+              << Words::tr("Average: %1").arg(shownNumber(average().text()))
+              << Words::tr("Smallest: %1").arg(shownNumber(mSmallest.text()))
+              << Words::tr("Largest: %1").arg(shownNumber(mLargest.text()));
+    }
+    return parts.join(QStringLiteral(" \u00b7 "));
+}
+
+} // namespace zandor::designer

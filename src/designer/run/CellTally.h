@@ -1,0 +1,34 @@
+#pragma once
+
+#include "designer/run/Cell.h"
+#include "designer/run/Decimal.h"
+
+namespace zandor::designer {
+
+/// What cells come to: how many they are, and what the numbers among them make.
+class CellTally {
+public:
+    void add(const Cell& cell);
+
+    qint64 cells() const { return mCells; }
+    qint64 empty() const { return mEmpty; } ///< without a value, or with a text of no character
+    qint64 numbers() const { return mNumbers; }
+    // Of the numbers, of which there has to be one.
+    Decimal sum() const { return mSum.total(); }
+    Decimal average() const { return mSum.average(mNumbers); }
+    const Decimal& smallest() const { return mSmallest; }
+    const Decimal& largest() const { return mLargest; }
+
+    /// One line for a user; of the numbers only if there are any.
+    QString inWords() const;
+
+private:
+    qint64 mCells = 0;
+    qint64 mEmpty = 0;
+    qint64 mNumbers = 0;
+    DecimalSum mSum;
+    Decimal mSmallest;
+    Decimal mLargest;
+};
+
+} // namespace zandor::designer
