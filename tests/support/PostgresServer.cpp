@@ -1,5 +1,7 @@
 #include "support/PostgresServer.h"
 
+#include "support/ServerProcess.h"
+
 #include <QDeadlineTimer>
 #include <QDir>
 #include <QSqlError>
@@ -8,17 +10,7 @@
 #include <csignal>
 #include <stdexcept>
 
-#include <unistd.h>
-
 namespace {
-
-constexpr int patience = 120'000; // milliseconds; a crowded machine is slow
-
-[[noreturn]] void fail(const QString& what, QProcess& process) {
-    const QString words = QString::fromLocal8Bit(process.readAll()).trimmed();
-    throw std::runtime_error(
-        QStringLiteral("%1 (%2): %3").arg(what, process.errorString(), words).toStdString());
-}
 
 /// Where Debian keeps the programs, which it does not put into the path: the newest version's.
 QString programOf(const QString& name) {
@@ -53,20 +45,17 @@ void PostgresServer::start() {
 }
 
 PostgresServer::~PostgresServer() {
-    if (mServer.state() == QProcess::NotRunning) return;
-    ::kill(static_cast<pid_t>(mServer.processId()), SIGINT); // ends the sessions that there are
-    if (!mServer.waitForFinished(patience)) mServer.kill();
-    mServer.waitForFinished();
+    endBySignal(mServer, SIGINT); // which ends the sessions that there are
 }
 
 void PostgresServer::kill() {
     mServer.kill();
-    mServer.waitForFinished(patience);
+    mServer.waitForFinished(serverPatience);
 }
 
 void PostgresServer::restart() {
     // It ends again as long as a session of the one before has not seen that this is gone.
-    const QDeadlineTimer end(patience);
+    const QDeadlineTimer end(serverPatience);
     do start();
     while (!answersBeforeItEnds() && !end.hasExpired());
     waitUntilItAnswers();
@@ -82,7 +71,7 @@ void PostgresServer::requirePassword(const QString& user) {
     rules.close();
     ::kill(static_cast<pid_t>(mServer.processId()), SIGHUP);
     const QString probe = QStringLiteral("postgres-probe");
-    const QDeadlineTimer end(patience);
+    const QDeadlineTimer end(serverPatience);
     for (bool enters = true; enters;) {
         if (end.hasExpired()) throw std::runtime_error("the server still asks for no password");
         QThread::msleep(20);
@@ -99,41 +88,30 @@ void PostgresServer::requirePassword(const QString& user) {
 
 void PostgresServer::launch(QProcess& process, const QString& program,
                             const QStringList& arguments) const {
-    QStringList line{QStringLiteral("--pdeathsig"), QStringLiteral("INT")};
-    if (geteuid() == 0)
-        line += {QStringLiteral("--reuid=postgres"), QStringLiteral("--regid=postgres"),
-                 QStringLiteral("--init-groups")};
-    line += {QStringLiteral("--"), programOf(program)};
-    process.setProcessChannelMode(QProcess::MergedChannels);
-    process.setWorkingDirectory(mDirectory.path());
-    process.start(QStringLiteral("setpriv"), line + arguments);
-    if (!process.waitForStarted()) fail(QStringLiteral("setpriv did not start"), process);
+    launchAs(QStringLiteral("postgres"), QStringLiteral("INT"), process, mDirectory.path(),
+             programOf(program), arguments);
 }
 
 void PostgresServer::makeDirectory() {
-    if (geteuid() == 0) {
-        QProcess chown;
-        chown.start(QStringLiteral("chown"), {QStringLiteral("postgres"), mDirectory.path()});
-        if (!chown.waitForFinished() || chown.exitCode() != 0)
-            fail(QStringLiteral("The directory could not be given to the user postgres"), chown);
-    }
+    giveFolderTo(QStringLiteral("postgres"), mDirectory.path());
     QProcess initdb;
     launch(initdb, QStringLiteral("initdb"),
            {QStringLiteral("--pgdata=") + mDirectory.filePath(QStringLiteral("data")),
             QStringLiteral("--locale=C"), QStringLiteral("--encoding=UTF8"),
             QStringLiteral("--auth=trust"), QStringLiteral("--username=postgres"),
             QStringLiteral("--no-sync")});
-    if (!initdb.waitForFinished(patience) || initdb.exitCode() != 0)
-        fail(QStringLiteral("initdb failed; is the package postgresql installed?"), initdb);
+    if (!initdb.waitForFinished(serverPatience) || initdb.exitCode() != 0)
+        failWithWords(QStringLiteral("initdb failed; is the package postgresql installed?"),
+                      initdb);
 }
 
 void PostgresServer::waitUntilItAnswers() {
     if (!answersBeforeItEnds())
-        fail(QStringLiteral("The PostgreSQL server does not answer"), mServer);
+        failWithWords(QStringLiteral("The PostgreSQL server does not answer"), mServer);
 }
 
 bool PostgresServer::answersBeforeItEnds() {
-    const QDeadlineTimer end(patience);
+    const QDeadlineTimer end(serverPatience);
     const QString probe = QStringLiteral("postgres-probe");
     for (bool answers = false; !answers;) {
         if (mServer.waitForFinished(0) || mServer.state() == QProcess::NotRunning ||

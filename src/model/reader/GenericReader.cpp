@@ -1,14 +1,13 @@
 #include <Zandor/DatabaseReader.h>
 
-#include <Zandor/model/Names.h>
+#include "model/reader/sortByName.h"
+
 #include <Zandor/reader/rows.h>
 
 #include <QSqlDriver>
 #include <QSqlField>
 #include <QSqlIndex>
 #include <QSqlRecord>
-
-#include <algorithm>
 
 namespace zandor::reader {
 
@@ -68,10 +67,7 @@ Result<std::vector<TableEntry>> GenericReader::tables() {
         entries.push_back({{{}, name.toStdU16String()}, false});
     for (const QString& name : mDatabase.tables(QSql::Views))
         entries.push_back({{{}, name.toStdU16String()}, true});
-    std::sort(entries.begin(), entries.end(), [](const TableEntry& left, const TableEntry& right) {
-        return std::pair(model::foldedName(left.id.name), left.id.name) <
-               std::pair(model::foldedName(right.id.name), right.id.name);
-    });
+    sortByName(entries);
     return entries;
 }
 
@@ -96,14 +92,12 @@ std::unique_ptr<DatabaseReader> makeGenericReader(const QSqlDatabase& database) 
 }
 
 std::unique_ptr<DatabaseReader> makeReader(const QSqlDatabase& database) {
-    switch (database.driver()->dbmsType()) {
-    case QSqlDriver::SQLite: return makeSqliteReader(database);
-    case QSqlDriver::PostgreSQL:
-        // Behind ODBC a statement's parameters are another matter.
-        if (database.driverName() == QStringLiteral("QPSQL")) return makePostgresReader(database);
-        [[fallthrough]];
-    default: return makeGenericReader(database);
-    }
+    // By the driver and not by the engine: behind ODBC a statement's parameters are another matter.
+    const QString driver = database.driverName();
+    if (driver == QStringLiteral("QSQLITE")) return makeSqliteReader(database);
+    if (driver == QStringLiteral("QPSQL")) return makePostgresReader(database);
+    if (driver == QStringLiteral("QMYSQL")) return makeMysqlReader(database);
+    return makeGenericReader(database);
 }
 
 } // namespace zandor::reader

@@ -11,7 +11,7 @@
 
 #include <algorithm>
 #include <array>
-#include <optional>
+#include <span>
 
 namespace zandor::reader {
 
@@ -19,53 +19,78 @@ using model::say;
 
 namespace {
 
+/// An option of an address, and what the driver calls it.
+struct Option {
+    const char* name;
+    const char* driverName;
+};
+
+// The time that connecting may take, which is last, is given to the driver in any case.
+constexpr Option postgresOptions[] = {{"sslmode", "sslmode"},
+                                      {"sslrootcert", "sslrootcert"},
+                                      {"sslcert", "sslcert"},
+                                      {"sslkey", "sslkey"},
+                                      {"application_name", "application_name"},
+                                      {"connect_timeout", "connect_timeout"}};
+constexpr Option mysqlOptions[] = {{"sslrootcert", "SSL_CA"},
+                                   {"sslcert", "SSL_CERT"},
+                                   {"sslkey", "SSL_KEY"},
+                                   {"connect_timeout", "MYSQL_OPT_CONNECT_TIMEOUT"}};
+constexpr Option odbcOptions[] = {{"connect_timeout", "SQL_ATTR_LOGIN_TIMEOUT"}};
+
+// Make the session one that cannot write, and that reads what the dialect writes.
+constexpr const char* postgresBegin[] = {"SET default_transaction_read_only = on"};
+constexpr const char* mysqlBegin[] = {
+    "SET SESSION TRANSACTION READ ONLY",
+    "SET SESSION sql_mode = REPLACE(@@SESSION.sql_mode, 'NO_BACKSLASH_ESCAPES', '')"};
+
 struct Engine {
     const char* scheme;
     const char* driver;
     const char* name;
     const char* package; ///< of Debian, with the driver
-    const char* options; ///< for the driver
-    /// Makes the session one that cannot write.
-    const char* readOnly;
+    std::span<const Option> options;
+    std::span<const char* const> begin;
 };
 
 constexpr std::array<Engine, 5> engines = {{
-    {"postgresql", "QPSQL", "PostgreSQL", "libqt6sql6-psql", "",
-     "SET default_transaction_read_only = on"},
-    {"postgres", "QPSQL", "PostgreSQL", "libqt6sql6-psql", "",
-     "SET default_transaction_read_only = on"},
-    {"mysql", "QMYSQL", "MySQL", "libqt6sql6-mysql", "MYSQL_OPT_CONNECT_TIMEOUT=10",
-     "SET SESSION TRANSACTION READ ONLY"},
-    {"mariadb", "QMYSQL", "MariaDB", "libqt6sql6-mysql", "MYSQL_OPT_CONNECT_TIMEOUT=10",
-     "SET SESSION TRANSACTION READ ONLY"},
-    {"odbc", "QODBC", "ODBC", "libqt6sql6-odbc",
-     "SQL_ATTR_ACCESS_MODE=SQL_MODE_READ_ONLY;SQL_ATTR_LOGIN_TIMEOUT=10", nullptr},
+    {"postgresql", "QPSQL", "PostgreSQL", "libqt6sql6-psql", postgresOptions, postgresBegin},
+    {"postgres", "QPSQL", "PostgreSQL", "libqt6sql6-psql", postgresOptions, postgresBegin},
+    {"mysql", "QMYSQL", "MySQL", "libqt6sql6-mysql", mysqlOptions, mysqlBegin},
+    {"mariadb", "QMYSQL", "MariaDB", "libqt6sql6-mysql", mysqlOptions, mysqlBegin},
+    {"odbc", "QODBC", "ODBC", "libqt6sql6-odbc", odbcOptions, {}},
 }};
 
 const platform::String example = u"postgresql://user@host:5432/database";
+const QString hostOption = QStringLiteral("host");
 
-/// The options of an address as the driver of PostgreSQL takes them, or what is wrong with them.
-/// They go into a line that the driver makes, so only known names get there, and values in quotes.
-Result<QString> postgresOptions(const QUrlQuery& query) {
-    static const QStringList known = {
-        QStringLiteral("sslmode"),         QStringLiteral("sslrootcert"),
-        QStringLiteral("sslcert"),         QStringLiteral("sslkey"),
-        QStringLiteral("connect_timeout"), QStringLiteral("application_name")};
-    QString options;
+/// The options of an address as the driver takes them, or what is wrong with them. They go into a
+/// line that the driver takes apart, so only known names get there.
+Result<QStringList> driverOptions(const Engine& engine, const QUrlQuery& query) {
+    QStringList options;
+    const Option& timeout = engine.options.back();
     bool timed = false;
     for (auto [name, value] : query.queryItems(QUrl::FullyDecoded)) {
-        if (name == QStringLiteral("host")) continue;
-        if (!known.contains(name))
+        const auto known = std::ranges::find_if(
+            engine.options, [&](const Option& each) { return name == QLatin1String(each.name); });
+        if (known == engine.options.end() && name != hostOption) {
+            QStringList names;
+            for (const Option& each : engine.options) names << QLatin1String(each.name);
             return Error{
                 say<MessageCode::unknownOption>(name.simplified().toStdU16String(),
-                                                known.join(QStringLiteral(", ")).toStdU16String())};
+                                                names.join(QStringLiteral(", ")).toStdU16String())};
+        }
         if (value.contains(u';'))
             return Error{say<MessageCode::semicolonInOption>(name.toStdU16String())};
-        timed = timed || name == QStringLiteral("connect_timeout");
-        value.replace(u'\\', QStringLiteral("\\\\")).replace(u'\'', QStringLiteral("\\'"));
-        options += QStringLiteral("%1='%2';").arg(name, value);
+        if (name == hostOption) continue;
+        if (engine.options.data() == postgresOptions) { // whose driver reads quotes
+            value.replace(u'\\', QStringLiteral("\\\\")).replace(u'\'', QStringLiteral("\\'"));
+            value = u'\'' + value + u'\'';
+        }
+        timed = timed || name == QLatin1String(timeout.name);
+        options << QStringLiteral("%1=%2").arg(QLatin1String(known->driverName), value);
     }
-    if (!timed) options += QStringLiteral("connect_timeout=10");
+    if (!timed) options << QStringLiteral("%1=10").arg(QLatin1String(timeout.driverName));
     return options;
 }
 
@@ -73,30 +98,33 @@ Result<Connection> openServer(const Engine& engine, const QUrl& url, const QStri
     const QString driver = QLatin1String(engine.driver);
     if (!QSqlDatabase::isDriverAvailable(driver))
         return Error{say<MessageCode::driverMissing>(engine.name, engine.package)};
-    QString options = QLatin1String(engine.options);
     const QUrlQuery query(url.query());
-    if (driver == QStringLiteral("QPSQL")) {
-        const auto made = postgresOptions(query);
-        if (!made) return made.failure();
-        options = *made;
-    }
+    const auto made = driverOptions(engine, query);
+    if (!made) return made.failure();
+    QStringList options = *made;
 
     Connection connection(
         QSqlDatabase::addDatabase(driver, QUuid::createUuid().toString(QUuid::WithoutBraces)));
     QSqlDatabase database = connection.database();
-    const QString folder = query.queryItemValue(QStringLiteral("host"), QUrl::FullyDecoded);
-    database.setHostName(folder.isEmpty() ? url.host() : folder);
+    const QString socket = query.queryItemValue(hostOption, QUrl::FullyDecoded);
+    database.setHostName(socket.isEmpty() ? url.host() : socket);
+    if (driver == QStringLiteral("QMYSQL") && !socket.isEmpty()) {
+        database.setHostName(QStringLiteral("localhost"));
+        options << QStringLiteral("UNIX_SOCKET=") + socket;
+    }
     if (url.port() > 0) database.setPort(url.port());
     database.setDatabaseName(driver == QStringLiteral("QODBC") ? url.host() : url.path().mid(1));
+    if (driver == QStringLiteral("QODBC"))
+        options << QStringLiteral("SQL_ATTR_ACCESS_MODE=SQL_MODE_READ_ONLY");
     database.setUserName(url.userName());
     database.setPassword(password.isEmpty() ? url.password() : password);
-    database.setConnectOptions(options);
+    database.setConnectOptions(options.join(u';'));
     const auto opening = say<MessageCode::databaseNotOpened>(
         url.toDisplayString(QUrl::RemoveQuery).simplified().toStdU16String());
     if (!database.open()) return serverError(opening, database.lastError());
-    if (engine.readOnly) {
+    for (const char* begin : engine.begin) {
         QSqlQuery statement(database);
-        if (!statement.exec(QLatin1String(engine.readOnly)))
+        if (!statement.exec(QLatin1String(begin)))
             return serverError(opening, statement.lastError());
     }
     return connection;

@@ -16,11 +16,16 @@ struct Advice {
     model::Message (*advice)();
 };
 
+/// Behind the words that a wrong password gets as well.
+constexpr const char* deniedDatabase = "' to database '";
+
 /// An engine that was not reached, or turns one away, gives no code but only its words.
-constexpr std::array<Advice, 14> byWords = {{
+constexpr std::array<Advice, 16> byWords = {{
     {"no password supplied", say<MessageCode::givePassword>},
     {"password authentication failed", say<MessageCode::checkPassword>},
+    {deniedDatabase, say<MessageCode::askAdministrator>},
     {"Access denied for user", say<MessageCode::checkPassword>},
+    {"command denied to user", say<MessageCode::askOwner>},
     {"no pg_hba.conf entry", say<MessageCode::askAdministrator>},
     {"could not translate host name", say<MessageCode::checkHost>},
     {"Unknown MySQL server host", say<MessageCode::checkHost>},
@@ -53,6 +58,7 @@ bool asksForPassword(const Error& error) {
     static const std::array<QLatin1String, 3> words = {
         QLatin1String("fe_sendauth"), QLatin1String("password authentication failed"),
         QLatin1String("Access denied for user")};
+    if (said.contains(QLatin1String(deniedDatabase))) return false;
     return std::any_of(words.begin(), words.end(),
                        [&](QLatin1String each) { return said.contains(each); });
 }

@@ -42,7 +42,7 @@ TEST(OpeningADatabase, SaysWhatIsWrongWithAnAddress) {
               "else there.");
     EXPECT_EQ(errorOf("postgresql://user@host/db?options=-c%20x"),
               "The address has an unknown option \"options\"; known are sslmode, sslrootcert, "
-              "sslcert, sslkey, connect_timeout, application_name and host.");
+              "sslcert, sslkey, application_name, connect_timeout and host.");
     EXPECT_EQ(errorOf("postgresql://user@host/db?sslcert=a;password=b"),
               "The option sslcert of the address has a semicolon in it; use a value without one.");
 }

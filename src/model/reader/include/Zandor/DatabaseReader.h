@@ -56,6 +56,9 @@ public:
 ZANDOR_READER_EXPORT std::unique_ptr<DatabaseReader> makeSqliteReader(const QSqlDatabase& database);
 ZANDOR_READER_EXPORT std::unique_ptr<DatabaseReader>
 makePostgresReader(const QSqlDatabase& database);
+/// Lists the tables of the database that the address names, or of all of the server's when it names
+/// none. Foreign keys come in the order of their names, for the engine keeps no other.
+ZANDOR_READER_EXPORT std::unique_ptr<DatabaseReader> makeMysqlReader(const QSqlDatabase& database);
 /// Knows of any engine what its Qt driver tells: tables, columns, primary keys; no foreign keys.
 ZANDOR_READER_EXPORT std::unique_ptr<DatabaseReader>
 makeGenericReader(const QSqlDatabase& database);

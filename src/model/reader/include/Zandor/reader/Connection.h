@@ -38,11 +38,11 @@ ZANDOR_READER_EXPORT Result<Connection> openSqlite(const QString& path);
 ///     mysql://user@host:port/database             also mariadb://
 ///     odbc://user@data-source
 ///
-/// each part but the scheme as far as the engine needs it. Behind a "?" an address may have the
-/// options sslmode, sslrootcert, sslcert, sslkey, connect_timeout (seconds; 10 unless given) and
-/// application_name of PostgreSQL, and host, the folder of the server's socket, which takes the
-/// place of the host. The password is `password`, or that of the address when it is empty; no
-/// message shows it. Needs a QCoreApplication.
+/// each part but the scheme as far as the engine needs it. Behind a "?" an address may have options:
+/// connect_timeout (seconds; 10 unless given); sslrootcert, sslcert and sslkey of PostgreSQL and
+/// MySQL; sslmode and application_name of PostgreSQL; and host, the folder of PostgreSQL's socket or
+/// the socket of MySQL's server, which takes the place of the host. The password is `password`, or
+/// that of the address when it is empty; no message shows it. Needs a QCoreApplication.
 ZANDOR_READER_EXPORT Result<Connection> openDatabase(const QString& address,
                                                      const QString& password = {});
 
