@@ -89,6 +89,7 @@ Case readCase(const json& from) {
         for (const json& value : from["joins"]) to.joins.push_back(join(value));
     if (from.contains("columns"))
         for (const json& value : from["columns"]) to.columns.push_back(column(value));
+    to.collated = from.value("collated", false);
     to.answers = from.value("answers", to.answers);
     if (from.contains("sql"))
         for (const auto& [dialects, text] : from["sql"].items())

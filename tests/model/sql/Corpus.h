@@ -45,6 +45,7 @@ struct Case {
     std::vector<Table> tables;
     std::vector<Join> joins;
     std::vector<Column> columns;
+    bool collated = false; ///< depends on which texts are the same, and in what order
     std::map<std::string, std::string> answers; ///< to parameters, as a user types them
     std::map<std::string, std::string> sql;     ///< by dialect, with the values written out
     std::vector<ExpectedFinding> findings;      ///< for the first dialect of `sql`, else SQLite

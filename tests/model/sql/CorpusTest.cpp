@@ -10,6 +10,7 @@
 using namespace zandor;
 
 using corpus::Case;
+using model::Finding;
 using model::sql::Dialect;
 using model::sql::ValueForm;
 using platform::toUtf8;
@@ -20,8 +21,6 @@ const std::vector<Case>& cases() {
     static const std::vector<Case> all = corpus::read(CORPUS);
     return all;
 }
-
-const Dialect engineDialects[] = {Dialect::SQLite, Dialect::PostgreSQL};
 
 bool isSorted(const Case& drawn) {
     return std::any_of(drawn.columns.begin(), drawn.columns.end(),
@@ -36,6 +35,14 @@ Rows sorted(Rows rows) {
 std::string described(const Rows& rows) {
     return std::to_string(rows.size()) + " rows, first\n" +
            Rows(rows.mid(0, 5)).join(u'\n').toStdString();
+}
+
+/// Such as a full outer join in MySQL.
+bool cannotBeSaid(const model::sql::Text& text) {
+    return std::any_of(text.findings.begin(), text.findings.end(), [](const Finding& finding) {
+        return finding.kind == Finding::Kind::notInDialect ||
+               finding.kind == Finding::Kind::nameNotCarried;
+    });
 }
 
 std::string parts(const corpus::ExpectedFinding& finding) {
@@ -88,20 +95,23 @@ TEST(TheCorpus, HasTheFindingsItExpects) {
     }
 }
 
-TEST(TheCorpus, FindsTheRowsOfItsReferenceQueriesOnBothEngines) {
+TEST(TheCorpus, FindsTheRowsOfItsReferenceQueriesOnAllEngines) {
     for (const Case& drawn : cases()) {
         if (drawn.reference.empty()) continue;
         SCOPED_TRACE(drawn.name);
         const auto query = corpus::draw(drawn, sampleEngines().reader());
         std::map<Dialect, Rows> found;
-        for (const Dialect dialect : engineDialects) {
+        for (const Dialect dialect : sampleEngines().dialects()) {
             SCOPED_TRACE(corpus::nameOf(dialect));
             const auto text = model::sql::statementText(*query, dialect, ValueForm::bound);
+            if (dialect == Dialect::MySQL && cannotBeSaid(text)) continue;
             ASSERT_TRUE(text.runnable());
             Outcome ours = sampleEngines().run(dialect, text, drawn.answers);
-            Outcome theirs = sampleEngines().run(dialect, QString::fromStdString(drawn.reference));
+            Outcome theirs =
+                sampleEngines().runCommon(dialect, QString::fromStdString(drawn.reference));
             ASSERT_EQ(ours.error.toStdString(), "") << toUtf8(text.text);
             ASSERT_EQ(theirs.error.toStdString(), "") << drawn.reference;
+            if (drawn.collated && dialect == Dialect::MySQL) continue;
             EXPECT_FALSE(theirs.rows.isEmpty()) << "a reference that proves nothing";
             EXPECT_TRUE(sorted(ours.rows) == sorted(theirs.rows))
                 << toUtf8(text.text) << "\nours: " << described(ours.rows)
@@ -111,9 +121,10 @@ TEST(TheCorpus, FindsTheRowsOfItsReferenceQueriesOnBothEngines) {
             }
             found[dialect] = sorted(ours.rows);
         }
-        EXPECT_TRUE(found[Dialect::SQLite] == found[Dialect::PostgreSQL])
-            << "SQLite: " << described(found[Dialect::SQLite])
-            << "\nPostgreSQL: " << described(found[Dialect::PostgreSQL]);
+        for (const auto& [dialect, rows] : found)
+            EXPECT_TRUE(rows == found[Dialect::SQLite])
+                << corpus::nameOf(dialect) << ": " << described(rows)
+                << "\nSQLite: " << described(found[Dialect::SQLite]);
     }
 }
 
@@ -123,9 +134,10 @@ TEST(TheCorpus, FindsTheSameRowsWithTheValuesWrittenOut) {
         if (drawn.reference.empty() || !drawn.answers.empty()) continue;
         SCOPED_TRACE(drawn.name);
         const auto query = corpus::draw(drawn, sampleEngines().reader());
-        for (const Dialect dialect : engineDialects) {
+        for (const Dialect dialect : sampleEngines().dialects()) {
             const auto bound = model::sql::statementText(*query, dialect, ValueForm::bound);
             const auto literal = model::sql::statementText(*query, dialect, ValueForm::literal);
+            if (cannotBeSaid(bound)) continue;
             const Outcome outcome =
                 sampleEngines().run(dialect, QString::fromStdU16String(literal.text));
             ASSERT_EQ(outcome.error.toStdString(), "") << toUtf8(literal.text);

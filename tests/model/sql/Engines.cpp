@@ -14,7 +14,7 @@
 #include <QTime>
 #include <QVariant>
 
-#include <cmath>
+#include <iostream>
 #include <stdexcept>
 
 using namespace zandor;
@@ -49,14 +49,19 @@ QString unquotedMoment(QString text) {
 
 QString connectionName(const QString& engine, const QString& name) { return engine + u'-' + name; }
 
-std::unique_ptr<PostgresServer>& server() {
-    static std::unique_ptr<PostgresServer> theServer;
-    return theServer;
+std::unique_ptr<Servers>& servers() {
+    static std::unique_ptr<Servers> theServers;
+    return theServers;
 }
 
-PostgresServer& startedServer() {
-    if (!server()) server() = std::make_unique<PostgresServer>();
-    return *server();
+Servers& startedServers() {
+    if (servers()) return *servers();
+    servers() = std::make_unique<Servers>();
+    if (const auto missing = MariaServer::missing())
+        std::cout << "Not on MariaDB: " << missing->toStdString() << '\n';
+    else
+        servers()->maria.emplace();
+    return *servers();
 }
 
 std::unique_ptr<Engines>& engines(bool small) {
@@ -96,34 +101,62 @@ void shrink(const QSqlDatabase& sqlite) {
 
 } // namespace
 
-Engines::Engines(PostgresServer& server, const QString& name, const Prepare& prepare) {
+Engines::Engines(Servers& servers, const QString& name, const Prepare& prepare) {
     const QString file = mDirectory.filePath(QStringLiteral("sample.sqlite"));
     if (!QFile::copy(QStringLiteral(SAMPLE_DATABASE), file))
         throw std::runtime_error("the sample database could not be copied");
-    mSqlite = QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), connectionName(u"s"_qs, name));
-    mSqlite.setDatabaseName(file);
-    if (!mSqlite.open()) throw std::runtime_error(mSqlite.lastError().text().toStdString());
-    prepare(mSqlite);
+    QSqlDatabase sqlite =
+        QSqlDatabase::addDatabase(QStringLiteral("QSQLITE"), connectionName(u"s"_qs, name));
+    sqlite.setDatabaseName(file);
+    if (!sqlite.open()) throw std::runtime_error(sqlite.lastError().text().toStdString());
+    prepare(sqlite);
 
-    mPostgres = server.connect(connectionName(u"p"_qs, name));
-    if (!mPostgres.isOpen()) throw std::runtime_error(mPostgres.lastError().text().toStdString());
-    ::run(mPostgres, QStringLiteral("CREATE SCHEMA %1").arg(name));
-    ::run(mPostgres, QStringLiteral("SET search_path = %1").arg(name));
-    copyToPostgres(mSqlite, mPostgres);
-    mReader = reader::makeSqliteReader(mSqlite);
+    QSqlDatabase postgres = servers.postgres.connect(connectionName(u"p"_qs, name));
+    if (!postgres.isOpen()) throw std::runtime_error(postgres.lastError().text().toStdString());
+    ::run(postgres, QStringLiteral("CREATE SCHEMA %1").arg(name));
+    ::run(postgres, QStringLiteral("SET search_path = %1").arg(name));
+    copyToServer(sqlite, postgres);
+
+    mDatabases = {{Dialect::SQLite, sqlite}, {Dialect::PostgreSQL, postgres}};
+    if (servers.maria) {
+        QSqlDatabase maria = servers.maria->connect(connectionName(u"m"_qs, name));
+        if (!maria.isOpen()) throw std::runtime_error(maria.lastError().text().toStdString());
+        // Takes no notice of case, which `Like` must not and none of the values depends on, but of
+        // accents and blanks, as the others do.
+        ::run(maria,
+              QStringLiteral("CREATE DATABASE %1 COLLATE utf8mb4_uca1400_nopad_as_ci").arg(name));
+        ::run(maria, QStringLiteral("USE %1").arg(name));
+        copyToServer(sqlite, maria);
+        mDatabases.emplace(Dialect::MySQL, maria);
+    }
+    mReader = reader::makeSqliteReader(sqlite);
 }
 
 Engines::~Engines() {
     mReader.reset();
-    for (QSqlDatabase* database : {&mSqlite, &mPostgres}) {
-        const QString name = database->connectionName();
-        *database = {};
+    for (auto& [dialect, database] : mDatabases) {
+        const QString name = database.connectionName();
+        database = {};
         QSqlDatabase::removeDatabase(name);
     }
 }
 
-const QSqlDatabase& Engines::database(Dialect dialect) const {
-    return dialect == Dialect::SQLite ? mSqlite : mPostgres;
+std::vector<Dialect> Engines::dialects() const {
+    std::vector<Dialect> dialects;
+    for (const auto& [dialect, database] : mDatabases) dialects.push_back(dialect);
+    return dialects;
+}
+
+const QSqlDatabase& Engines::database(Dialect dialect) const { return mDatabases.at(dialect); }
+
+Outcome Engines::runCommon(Dialect dialect, const QString& statement) const {
+    if (dialect != Dialect::MySQL) return run(dialect, statement);
+    const QSqlDatabase& maria = database(dialect);
+    const QString mode = QStringLiteral("SET sql_mode = ");
+    ::run(maria, mode + QStringLiteral("'ANSI_QUOTES,PIPES_AS_CONCAT,NO_BACKSLASH_ESCAPES'"));
+    Outcome outcome = run(dialect, statement);
+    ::run(maria, mode + QStringLiteral("DEFAULT"));
+    return outcome;
 }
 
 Outcome Engines::run(Dialect dialect, const QString& statement, const QVariantList& values) const {
@@ -169,18 +202,18 @@ Outcome Engines::run(Dialect dialect, const model::sql::Text& text,
 
 Engines& sampleEngines() {
     auto& theirs = engines(false);
-    if (!theirs) theirs = std::make_unique<Engines>(startedServer(), u"sample"_qs, addOddNames);
+    if (!theirs) theirs = std::make_unique<Engines>(startedServers(), u"sample"_qs, addOddNames);
     return *theirs;
 }
 
 Engines& smallEngines() {
     auto& theirs = engines(true);
-    if (!theirs) theirs = std::make_unique<Engines>(startedServer(), u"small"_qs, shrink);
+    if (!theirs) theirs = std::make_unique<Engines>(startedServers(), u"small"_qs, shrink);
     return *theirs;
 }
 
 void stopEngines() {
     engines(false).reset();
     engines(true).reset();
-    server().reset();
+    servers().reset();
 }

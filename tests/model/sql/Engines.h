@@ -1,6 +1,7 @@
 #pragma once
 
-#include "PostgresCopy.h"
+#include "ServerCopy.h"
+#include "support/MariaServer.h"
 #include "support/PostgresServer.h"
 
 #include <Zandor/DatabaseReader.h>
@@ -9,6 +10,7 @@
 #include <QStringList>
 
 #include <functional>
+#include <map>
 #include <memory>
 #include <optional>
 
@@ -21,19 +23,30 @@ struct Outcome {
     QString error;
 };
 
-/// A database with the same rows in an SQLite file and on a PostgreSQL server.
+/// The servers that a program starts.
+struct Servers {
+    PostgresServer postgres;
+    std::optional<MariaServer> maria; ///< nothing where it is not installed
+};
+
+/// A database with the same rows in an SQLite file and on the servers.
 class Engines {
 public:
     using Prepare = std::function<void(const QSqlDatabase& sqlite)>;
 
-    /// A copy of the sample database, changed by `prepare`, in a database of the server's under
+    /// A copy of the sample database, changed by `prepare`, in databases of the servers' under
     /// `name`.
-    Engines(PostgresServer& server, const QString& name, const Prepare& prepare);
+    Engines(Servers& servers, const QString& name, const Prepare& prepare);
     ~Engines();
 
+    /// Those that statements can be run on.
+    std::vector<zandor::model::sql::Dialect> dialects() const;
     zandor::reader::DatabaseReader& reader() { return *mReader; }
     Outcome run(zandor::model::sql::Dialect dialect, const QString& statement,
                 const QVariantList& values = {}) const;
+    /// Runs a statement that is written in words that all engines have, with names in double
+    /// quotes.
+    Outcome runCommon(zandor::model::sql::Dialect dialect, const QString& statement) const;
     /// Runs a query's statement, with answers to its parameters.
     Outcome run(zandor::model::sql::Dialect dialect, const zandor::model::sql::Text& text,
                 const std::map<std::string, std::string>& answers = {}) const;
@@ -42,8 +55,7 @@ private:
     const QSqlDatabase& database(zandor::model::sql::Dialect dialect) const;
 
     QTemporaryDir mDirectory;
-    QSqlDatabase mSqlite;
-    QSqlDatabase mPostgres;
+    std::map<zandor::model::sql::Dialect, QSqlDatabase> mDatabases;
     std::unique_ptr<zandor::reader::DatabaseReader> mReader;
 };
 
@@ -51,5 +63,5 @@ private:
 Engines& sampleEngines(); ///< the sample database and the tables with odd names
 Engines& smallEngines();  ///< the same with a few rows a table
 
-/// Stops the server, if it was started. Before the application object goes.
+/// Stops the servers, if they were started. Before the application object goes.
 void stopEngines();

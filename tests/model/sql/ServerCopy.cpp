@@ -1,4 +1,4 @@
-#include "PostgresCopy.h"
+#include "ServerCopy.h"
 
 #include <QSqlDriver>
 #include <QSqlError>
@@ -11,8 +11,21 @@
 
 namespace {
 
+/// A name in SQLite.
 QString quoted(const QString& name) {
     return u'"' + QString(name).replace(u'"', QStringLiteral("\"\"")) + u'"';
+}
+
+bool isMysql(const QSqlDatabase& server) {
+    return server.driver()->dbmsType() == QSqlDriver::MySqlServer;
+}
+
+QString quotedOn(const QSqlDatabase& server, const QString& name) {
+    if (!isMysql(server)) return quoted(name);
+    QString carried;
+    for (const QChar c : name) // the engine has none beyond U+FFFF
+        if (!c.isLowSurrogate()) carried += c.isHighSurrogate() ? QChar(u'_') : c;
+    return u'`' + carried.replace(u'`', QStringLiteral("``")) + u'`';
 }
 
 QSqlQuery selected(const QSqlDatabase& database, const QString& statement) {
@@ -23,9 +36,15 @@ QSqlQuery selected(const QSqlDatabase& database, const QString& statement) {
     return query;
 }
 
-/// The same kind of values in PostgreSQL's words.
-QString typeOf(const QString& declared) {
+/// The same kind of values in a server's words.
+QString typeOn(const QSqlDatabase& server, const QString& declared) {
     const QString type = declared.toUpper();
+    if (isMysql(server)) {
+        if (type == u"REAL") return QStringLiteral("double");
+        if (type == u"TIMESTAMP") return QStringLiteral("datetime"); // which has no zone
+        if (type == u"TEXT") return QStringLiteral("varchar(500)");  // of which an index can be
+        return declared;
+    }
     if (type == u"BLOB") return QStringLiteral("bytea");
     if (type == u"REAL") return QStringLiteral("double precision");
     if (type == u"DATETIME") return QStringLiteral("timestamp");
@@ -35,7 +54,7 @@ QString typeOf(const QString& declared) {
 class TableCopy {
 public:
     TableCopy(const QSqlDatabase& from, const QSqlDatabase& to, const QString& table)
-        : mFrom(from), mTo(to), mTable(quoted(table)) {}
+        : mFrom(from), mTo(to), mTable(table) {}
 
     void run() {
         create();
@@ -46,29 +65,33 @@ private:
     void create() {
         QStringList columns;
         QMap<int, QString> key;
-        QSqlQuery info = selected(mFrom, QStringLiteral("PRAGMA table_info(%1)").arg(mTable));
+        QSqlQuery info =
+            selected(mFrom, QStringLiteral("PRAGMA table_info(%1)").arg(quoted(mTable)));
         while (info.next()) {
-            const QString name = quoted(info.value(QStringLiteral("name")).toString());
-            const QString type = typeOf(info.value(QStringLiteral("type")).toString());
-            columns << name + u' ' + type;
-            mFields << QSqlField(name, fieldType(type));
-            if (const int at = info.value(QStringLiteral("pk")).toInt()) key.insert(at, name);
+            const QString name = quotedOn(mTo, info.value(QStringLiteral("name")).toString());
+            const int at = info.value(QStringLiteral("pk")).toInt();
+            const QString declared = info.value(QStringLiteral("type")).toString();
+            columns << name + u' ' + typeOn(mTo, declared);
+            mFields << QSqlField(name, fieldType(declared.toUpper()));
+            if (at) key.insert(at, name);
         }
         if (!key.isEmpty())
             columns << QStringLiteral("PRIMARY KEY (%1)").arg(key.values().join(u", "));
-        ::run(mTo, QStringLiteral("CREATE TABLE %1 (%2)").arg(mTable, columns.join(u", ")));
+        ::run(
+            mTo,
+            QStringLiteral("CREATE TABLE %1 (%2)").arg(quotedOn(mTo, mTable), columns.join(u", ")));
     }
 
     /// SQLite keeps truth as a number and moments as texts; they are handed on as what they are.
     static QMetaType fieldType(const QString& type) {
         if (type == u"BOOLEAN") return QMetaType::fromType<bool>();
-        if (type == u"bytea") return QMetaType::fromType<QByteArray>();
+        if (type == u"BLOB") return QMetaType::fromType<QByteArray>();
         return {};
     }
 
     void fill() {
         constexpr int rowsAtOnce = 500;
-        QSqlQuery rows = selected(mFrom, QStringLiteral("SELECT * FROM %1").arg(mTable));
+        QSqlQuery rows = selected(mFrom, QStringLiteral("SELECT * FROM %1").arg(quoted(mTable)));
         QStringList values;
         while (rows.next()) {
             QStringList row;
@@ -92,7 +115,8 @@ private:
 
     void insert(QStringList& values) {
         if (values.isEmpty()) return;
-        ::run(mTo, QStringLiteral("INSERT INTO %1 VALUES %2").arg(mTable, values.join(u", ")));
+        ::run(mTo, QStringLiteral("INSERT INTO %1 VALUES %2")
+                       .arg(quotedOn(mTo, mTable), values.join(u", ")));
         values.clear();
     }
 
@@ -111,17 +135,18 @@ void run(const QSqlDatabase& database, const QString& statement) {
             (query.lastError().text() + u'\n' + statement.left(400)).toStdString());
 }
 
-void copyToPostgres(const QSqlDatabase& sqlite, const QSqlDatabase& postgres) {
+void copyToServer(const QSqlDatabase& sqlite, const QSqlDatabase& server) {
     QStringList tables;
-    QStringList views;
+    QStringList viewsAndIndexes;
     QSqlQuery master = selected(sqlite, QStringLiteral("SELECT type, name, sql FROM sqlite_master "
-                                                       "WHERE name NOT LIKE 'sqlite%'"));
+                                                       "WHERE name NOT LIKE 'sqlite%' "
+                                                       "ORDER BY type = 'view'"));
     while (master.next()) {
         const QString type = master.value(0).toString();
         if (type == u"table") tables << master.value(1).toString();
-        if (type == u"view") views << master.value(2).toString();
+        if (type == u"view" || type == u"index") viewsAndIndexes << master.value(2).toString();
     }
-    for (const QString& table : tables) TableCopy(sqlite, postgres, table).run();
-    for (const QString& view : views) run(postgres, view);
-    run(postgres, QStringLiteral("ANALYZE"));
+    for (const QString& table : tables) TableCopy(sqlite, server, table).run();
+    for (const QString& statement : viewsAndIndexes) run(server, statement);
+    if (!isMysql(server)) run(server, QStringLiteral("ANALYZE"));
 }
