@@ -10,6 +10,7 @@
 #include "designer/PlainBox.h"
 #include "designer/Screen.h"
 #include "designer/canvasSize.h"
+#include "designer/chart/ChartPanel.h"
 #include "designer/database/ConnectionBanner.h"
 #include "designer/database/droppedDatabase.h"
 #include "designer/document/Autosave.h"
@@ -206,6 +207,9 @@ void DesignerWindow::makeMenus() {
     query->addAction(mResults->cancelAction());
     query->addAction(mResults->exportAction());
     query->addSeparator();
+    mResults->chartAction()->setObjectName(QStringLiteral("chartShown"));
+    query->addAction(mResults->chartAction());
+    query->addSeparator();
     QAction* const arrange =
         command(query, tr("&Arrange tables"), "arrange", [this] { mAdding->arrange(); });
     arrange->setShortcut(Qt::CTRL | Qt::SHIFT | Qt::Key_A);
@@ -258,6 +262,9 @@ void DesignerWindow::makeMenus() {
     goTo(tr("&Tables"), "goTables", Qt::Key_2, mTables);
     goTo(tr("&SQL"), "goStatement", Qt::Key_3, mStatement);
     goTo(tr("&Rows"), "goResults", Qt::Key_4, mResults);
+    connect(go->actions().last(), &QAction::triggered, mResults, &ResultsPanel::goToTable);
+    goTo(tr("&Chart"), "goChart", Qt::Key_5, mResults);
+    connect(go->actions().last(), &QAction::triggered, mResults, &ResultsPanel::goToChart);
     view->addSeparator();
     const auto panel = [&](const QString& text, const char* name) {
         QAction* const action = findChild<QDockWidget*>(QLatin1String(name))->toggleViewAction();
@@ -306,8 +313,10 @@ void DesignerWindow::connectParts() {
         showTitle();
     });
     connect(&mFile, &QueryFile::changed, this, &DesignerWindow::showTitle);
-    connect(&mFile, &QueryFile::changed, mResults,
-            [this] { mResults->proposeFile(mFile.besideWith(QStringLiteral("csv"))); });
+    connect(&mFile, &QueryFile::changed, mResults, [this] {
+        mResults->proposeFile(mFile.besideWith(QStringLiteral("csv")));
+        mResults->chart().proposeFile(mFile.besideWith(QStringLiteral("chart.png")));
+    });
     connect(mFiles, &FileDialogs::saved, this,
             [this] { tell(tr("Saved as %1.").arg(platform::qt::asSigns(mFile.name()))); });
     connect(mFiles, &FileDialogs::opened, mDatabases, &DatabaseCommands::followFile);

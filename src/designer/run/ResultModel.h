@@ -30,6 +30,8 @@ public:
     /// A view wants the rows sorted by a column, or with -1 as they came.
     void sort(int column, Qt::SortOrder direction) override { emit sortWished(column, direction); }
 
+    /// The value of a cell, of a long text the beginning; of a blob the number of its bytes.
+    Cell cell(const QModelIndex& index) const;
     /// Where a row that is shown is in the spool.
     qint64 spooled(int row) const;
     int rowCount(const QModelIndex& parent = {}) const override;
@@ -46,8 +48,6 @@ signals:
     void sortWished(int column, Qt::SortOrder direction);
 
 private:
-    Cell cell(const QModelIndex& index) const;
-
     std::shared_ptr<Spool> mSpool;
     QStringList mColumns;
     RowOrder mOrder; ///< empty: as they came

@@ -1,12 +1,14 @@
 #include "designer/run/ResultsPanel.h"
 
 #include "designer/PlainBox.h"
+#include "designer/chart/ChartPanel.h"
 #include "designer/database/Database.h"
 #include "designer/database/patiently.h"
 #include "designer/document/Document.h"
 #include "designer/run/FileExport.h"
 #include "designer/run/ParameterDialog.h"
 #include "designer/run/ResultTable.h"
+#include "designer/run/SummaryLine.h"
 #include "designer/statement/ModelWords.h"
 #include "frontends/qt/ShownText.h"
 
@@ -65,8 +67,8 @@ void ResultsPanel::run() {
     mAsked = asked();
     showSpool();
     mFitted = false;
-    mPages->setCurrentWidget(mTable);
     start(*made, mSpool, {});
+    showRows();
     emit shown();
 }
 
@@ -218,7 +220,8 @@ void ResultsPanel::finish(const Outcome& outcome) {
         mDatabase.sayLost(outcome.message);
         break;
     }
-    if (!exporting && mPages->currentWidget() == mTable && !mFitted) mTable->fitColumns();
+    if (!exporting && areRowsShown() && !mFitted) mTable->fitColumns();
+    drawChart();
     queryChanged(); // while it ran
 }
 
@@ -257,7 +260,7 @@ platform::String ResultsPanel::asked() {
 }
 
 void ResultsPanel::queryChanged() {
-    if (isRunning() || !mSpool || mPages->currentWidget() != mTable) return;
+    if (isRunning() || !mSpool || !areRowsShown()) return;
     if (mOutdated == (asked() != mAsked)) return;
     mOutdated = !mOutdated;
     showStatus();
@@ -271,6 +274,40 @@ void ResultsPanel::showSpool() {
     mOutdated = false;
 }
 
+bool ResultsPanel::areRowsShown() const { return mPages->currentIndex() != 0; }
+
+/// As a table or as a chart.
+void ResultsPanel::showRows() {
+    const bool charted = mChartShown->isChecked();
+    mPages->setCurrentWidget(charted ? static_cast<QWidget*>(mChart) : mTable);
+    setFocusProxy(mPages->currentWidget());
+    mSummary->setVisible(!charted && !mSummary->text().isEmpty());
+    drawChart();
+}
+
+/// Only as long as it is seen: it reads rows.
+void ResultsPanel::drawChart() {
+    if (mPages->currentWidget() != mChart) return;
+    if (isRunning() && mFile.isEmpty())
+        return mChart->say(tr("The chart is drawn when the rows have come."));
+    const ResultModel& rows = mTable->rows();
+    QStringList columns;
+    for (int column = 0; column < rows.columnCount(); ++column)
+        columns << (mSpool ? mSpool->columns().value(column) : QString());
+    mChart->show({columns, rows.rowCount(),
+                  [&rows](int row, int column) { return rows.cell(rows.index(row, column)); }});
+}
+
+void ResultsPanel::goToTable() {
+    mChartShown->setChecked(false);
+    mTable->setFocus(Qt::ShortcutFocusReason);
+}
+
+void ResultsPanel::goToChart() {
+    mChartShown->setChecked(true);
+    mChart->setFocus(Qt::ShortcutFocusReason);
+}
+
 /// Sorts the rows that are shown, and not the query: neither is it changed nor run again.
 void ResultsPanel::sort(int column, Qt::SortOrder direction) {
     ResultModel& rows = mTable->rows();
@@ -280,6 +317,7 @@ void ResultsPanel::sort(int column, Qt::SortOrder direction) {
         rows.setOrder({});
         mSorting = why;
         showStatus();
+        drawChart();
     };
     mTable->clearSelection();
     if (column < 0 || count == 0) return refuse({});
@@ -302,6 +340,7 @@ void ResultsPanel::sort(int column, Qt::SortOrder direction) {
                    ? tr("these rows are sorted by %1 here, the query is not").arg(name)
                    : tr("these rows are sorted by %1 descending here, the query is not").arg(name);
     showStatus();
+    drawChart();
 }
 
 void ResultsPanel::showMessage(const QString& text, const QString& statement) {
@@ -309,6 +348,7 @@ void ResultsPanel::showMessage(const QString& text, const QString& statement) {
     mMessageStatement->setPlainText(statement);
     mMessageStatement->setVisible(!statement.isEmpty());
     mPages->setCurrentIndex(0);
+    mSummary->hide();
     setStatus({});
     emit shown();
 }

@@ -16,6 +16,7 @@ class QToolButton;
 
 namespace zandor::designer {
 
+class ChartPanel;
 class Database;
 class Document;
 class ResultTable;
@@ -40,9 +41,15 @@ public:
     QAction* cancelAction() { return mCancel; }
     QAction* exportAction() { return mExport; } ///< asks for the file
     QAction* copyAction();
+    QAction* chartAction() { return mChartShown; } ///< whether rows are shown as a chart
+
+    /// Shows the rows as a table or as a chart, and gives it the keyboard.
+    void goToTable();
+    void goToChart();
 
     /// What the file of an export is called unless the user calls it otherwise; empty: as at first.
     void proposeFile(const QString& path) { mProposed = path; }
+    ChartPanel& chart() { return *mChart; }
 
     /// Runs the query as it is drawn now and shows its rows, up to the limit. Asks for parameters.
     void run();
@@ -77,6 +84,9 @@ private:
     platform::String asked();
     void queryChanged();
     void showSpool();
+    bool areRowsShown() const;
+    void showRows();
+    void drawChart();
     void sort(int column, Qt::SortOrder direction);
     void showMessage(const QString& text, const QString& statement = {});
     void setStatus(const QString& text);
@@ -105,12 +115,14 @@ private:
     QAction* mRun;
     QAction* mCancel;
     QAction* mExport;
+    QAction* mChartShown;
     QComboBox* mLimit;
     QProgressBar* mBusy;
     QStackedWidget* mPages;
     QLabel* mMessage;
     QPlainTextEdit* mMessageStatement;
     ResultTable* mTable;
+    ChartPanel* mChart;
     QLabel* mStatus;
     SummaryLine* mSummary;
     QToolButton* mAll;

@@ -1,3 +1,4 @@
+#include "designer/chart/ChartPanel.h"
 #include "designer/run/ResultTable.h"
 #include "designer/run/ResultsPanel.h"
 #include "designer/run/SummaryLine.h"
@@ -46,6 +47,26 @@ void ResultsPanel::makeActions() {
     mExport->setIconText(tr("Export\u2026")); // beside the rows
     mExport->setToolTip(tr("Run the query and write all its rows into a CSV file"));
     connect(mExport, &QAction::triggered, this, &ResultsPanel::askForFile);
+
+    // Three columns on a line.
+    mChartShown = new QAction(shapeIcon({{0.1, 0.9},
+                                         {0.1, 0.5},
+                                         {0.3, 0.5},
+                                         {0.3, 0.8},
+                                         {0.4, 0.8},
+                                         {0.4, 0.1},
+                                         {0.6, 0.1},
+                                         {0.6, 0.8},
+                                         {0.7, 0.8},
+                                         {0.7, 0.3},
+                                         {0.9, 0.3},
+                                         {0.9, 0.9}}),
+                              tr("C&hart"), this);
+    mChartShown->setCheckable(true);
+    mChartShown->setToolTip(tr("Show the rows as a chart (Ctrl+5), and as a table again (Ctrl+4)"));
+    connect(mChartShown, &QAction::toggled, this, [this] {
+        if (areRowsShown()) showRows();
+    });
 }
 
 void ResultsPanel::makeLayout() {
@@ -64,6 +85,8 @@ void ResultsPanel::makeLayout() {
     bar->addAction(mCancel);
     bar->addWidget(mLimit);
     bar->addAction(mExport);
+    bar->addSeparator();
+    bar->addAction(mChartShown);
 
     mBusy = new QProgressBar(this);
     mBusy->setRange(0, 0);
@@ -78,6 +101,8 @@ void ResultsPanel::makeLayout() {
     mPages = new QStackedWidget(this);
     mPages->addWidget(makeMessagePage());
     mPages->addWidget(mTable);
+    mChart = new ChartPanel(this);
+    mPages->addWidget(mChart);
     setFocusProxy(mTable);
 
     mStatus = new QLabel(this);

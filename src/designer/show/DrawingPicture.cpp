@@ -3,11 +3,7 @@
 #include "designer/canvasSize.h"
 #include "frontends/qt/TabuletWidget.h"
 
-#include <QBuffer>
-#include <QImage>
 #include <QPainter>
-#include <QSvgGenerator>
-#include <QSvgRenderer>
 
 #include <algorithm>
 #include <limits>
@@ -18,7 +14,6 @@ namespace {
 
 /// Room for the control's scroll bars, which are not part of the picture.
 constexpr QSize besideCanvas(60, 60);
-constexpr int pixelsPerInch = 96; // of logical pixels
 constexpr int canvasEnd = std::numeric_limits<std::int16_t>::max();
 
 using platform::qt::TabuletWidget;
@@ -128,37 +123,6 @@ void DrawingPicture::bind(const platform::Ref<model::Query>& query) {
 
 void DrawingPicture::render(QPainter& painter) const {
     mControl->render(&painter, QPoint(), QRegion(QRect(QPoint(), mSize)));
-}
-
-QImage DrawingPicture::image(qreal scale) const {
-    QImage result(mSize * scale, QImage::Format_ARGB32_Premultiplied);
-    if (result.isNull()) return result;
-    result.setDevicePixelRatio(scale);
-    QPainter painter(&result);
-    render(painter);
-    return result;
-}
-
-QByteArray DrawingPicture::svg() const {
-    QByteArray content;
-    QBuffer buffer(&content);
-    QSvgGenerator generator;
-    generator.setOutputDevice(&buffer);
-    generator.setResolution(pixelsPerInch);
-    generator.setSize(mSize);
-    generator.setViewBox(QRect(QPoint(), mSize));
-    QPainter painter(&generator);
-    render(painter);
-    painter.end();
-    return content;
-}
-
-// Through SVG: widgets count on a device that clips what they paint, and a page does not.
-void DrawingPicture::paint(QPainter& painter, const QRectF& into) const {
-    if (isEmpty() || into.isEmpty()) return;
-    QRectF place(QPointF(), QSizeF(mSize).scaled(into.size(), Qt::KeepAspectRatio));
-    place.moveCenter(into.center());
-    QSvgRenderer(svg()).render(&painter, place);
 }
 
 } // namespace zandor::designer

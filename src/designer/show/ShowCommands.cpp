@@ -5,14 +5,10 @@
 #include "designer/document/Document.h"
 #include "designer/document/QueryFile.h"
 #include "designer/show/DrawingPicture.h"
+#include "designer/show/askForPicture.h"
 #include "designer/show/savePicture.h"
 
-#include <QClipboard>
 #include <QDir>
-#include <QFileDialog>
-#include <QFileInfo>
-#include <QGuiApplication>
-#include <QImage>
 #include <QPrintDialog>
 #include <QPrinter>
 #include <QSettings>
@@ -68,22 +64,7 @@ QString ShowCommands::proposedName() const {
 }
 
 void ShowCommands::askForFile() {
-    QFileDialog dialog(&mWindow, tr("Export drawing"));
-    dialog.setAcceptMode(QFileDialog::AcceptSave);
-    dialog.setNameFilters(
-        {tr("Picture (*.png)"), tr("Scalable drawing (*.svg)"), tr("Document (*.pdf)")});
-    const QStringList suffixes{QStringLiteral("png"), QStringLiteral("svg"), QStringLiteral("pdf")};
-    const auto follow = [&](const QString& filter) {
-        dialog.setDefaultSuffix(suffixes.value(dialog.nameFilters().indexOf(filter)));
-    };
-    connect(&dialog, &QFileDialog::filterSelected, &dialog, follow);
-    follow(dialog.selectedNameFilter());
-    const QFileInfo proposed(proposedName());
-    if (proposed.dir().exists()) dialog.setDirectory(proposed.dir());
-    dialog.selectFile(proposed.fileName());
-    if (dialog.exec() != QDialog::Accepted) return;
-    if (const auto error = savePicture(picture(), dialog.selectedFiles().value(0)))
-        PlainBox::warn(&mWindow, tr("Export drawing"), *error);
+    askForPicture(&mWindow, tr("Export drawing"), proposedName(), picture());
 }
 
 void ShowCommands::askForPrinter() {
@@ -96,9 +77,6 @@ void ShowCommands::askForPrinter() {
         PlainBox::warn(&mWindow, tr("Print"), *error);
 }
 
-void ShowCommands::copy() {
-    constexpr qreal scale = 2; // for documents that are printed
-    QGuiApplication::clipboard()->setImage(picture().image(scale));
-}
+void ShowCommands::copy() { designer::copyPicture(picture()); }
 
 } // namespace zandor::designer

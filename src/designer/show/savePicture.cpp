@@ -1,7 +1,7 @@
 #include "designer/show/savePicture.h"
 
 #include "designer/document/paths.h"
-#include "designer/show/DrawingPicture.h"
+#include "designer/show/Picture.h"
 #include "designer/statement/ModelWords.h"
 
 #include <Zandor/files/Replacement.h>
@@ -25,15 +25,13 @@ constexpr qreal pointsPerPixel = 72.0 / pixelsPerInch;
 
 QString tr(const char* text) { return QCoreApplication::translate("zandor::designer", text); }
 
-bool writePng(const DrawingPicture& picture, QIODevice& file) {
+bool writePng(const Picture& picture, QIODevice& file) {
     return picture.image(pngScale).save(&file, "PNG");
 }
 
-bool writeSvg(const DrawingPicture& picture, QIODevice& file) {
-    return file.write(picture.svg()) > 0;
-}
+bool writeSvg(const Picture& picture, QIODevice& file) { return file.write(picture.svg()) > 0; }
 
-bool writePdf(const DrawingPicture& picture, QIODevice& file) {
+bool writePdf(const Picture& picture, QIODevice& file) {
     QPdfWriter writer(&file);
     writer.setResolution(pixelsPerInch);
     writer.setPageSize(QPageSize(QSizeF(picture.size()) * pointsPerPixel, QPageSize::Point, {},
@@ -47,10 +45,10 @@ bool writePdf(const DrawingPicture& picture, QIODevice& file) {
 
 } // namespace
 
-std::optional<QString> savePicture(const DrawingPicture& picture, const QString& path) {
+std::optional<QString> savePicture(const Picture& picture, const QString& path) {
     if (picture.isEmpty()) return tr("There is nothing to draw; add a table first.");
     const QString suffix = QFileInfo(path).suffix().toLower();
-    using Write = bool (*)(const DrawingPicture&, QIODevice&);
+    using Write = bool (*)(const Picture&, QIODevice&);
     const Write write = suffix == QLatin1String("png")   ? writePng
                         : suffix == QLatin1String("svg") ? writeSvg
                         : suffix == QLatin1String("pdf") ? writePdf
@@ -68,7 +66,7 @@ std::optional<QString> savePicture(const DrawingPicture& picture, const QString&
     return inWords(files::replaceFile(pathOf(path), content.data().toStdString()));
 }
 
-std::optional<QString> printPicture(const DrawingPicture& picture, QPrinter& printer) {
+std::optional<QString> printPicture(const Picture& picture, QPrinter& printer) {
     if (picture.isEmpty()) return tr("There is nothing to draw; add a table first.");
     QPainter painter;
     if (!painter.begin(&printer)) return tr("The printer cannot be reached; choose another one.");

@@ -8,14 +8,14 @@ class QPrinter;
 
 namespace zandor::designer {
 
-class DrawingPicture;
+class Picture;
 
 /// Writes a picture as its name's suffix says: ".png" (two pixels for a logical one), ".svg" or
-/// ".pdf" (one page of the drawing's size). The file is replaced when all of it is written. Returns
+/// ".pdf" (one page of the picture's size). The file is replaced when all of it is written. Returns
 /// what went wrong.
-std::optional<QString> savePicture(const DrawingPicture& picture, const QString& path);
+std::optional<QString> savePicture(const Picture& picture, const QString& path);
 
 /// Onto one page, as large as fits, but never enlarged. Returns what went wrong.
-std::optional<QString> printPicture(const DrawingPicture& picture, QPrinter& printer);
+std::optional<QString> printPicture(const Picture& picture, QPrinter& printer);
 
 } // namespace zandor::designer

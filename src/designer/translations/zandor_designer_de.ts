@@ -1124,6 +1124,18 @@
         <source>The drawing is too large for &quot;%1&quot;; choose a name that ends in .svg.</source>
         <translation>Die Zeichnung ist zu groß für „%1“; wählen Sie einen Namen, der auf .svg endet.</translation>
     </message>
+    <message>
+        <source>Picture (*.png)</source>
+        <translation>Bild (*.png)</translation>
+    </message>
+    <message>
+        <source>Scalable drawing (*.svg)</source>
+        <translation>Skalierbare Zeichnung (*.svg)</translation>
+    </message>
+    <message>
+        <source>Document (*.pdf)</source>
+        <translation>Dokument (*.pdf)</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -1175,6 +1187,95 @@
     <message>
         <source>Largest: %1</source>
         <translation>Größte: %1</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartData</name>
+    <message>
+        <source>Drawn are the first %1 of %2 rows.</source>
+        <translation>Gezeichnet sind die ersten %1 von %2 Zeilen.</translation>
+    </message>
+    <message>
+        <source>Rows left out because they have no date: %1.</source>
+        <translation>Ohne Datum und darum ausgelassene Zeilen: %1.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartPanel</name>
+    <message>
+        <source>Cop&amp;y</source>
+        <translation>Kop&amp;ieren</translation>
+    </message>
+    <message>
+        <source>Copy the chart as a picture</source>
+        <translation>Das Diagramm als Bild kopieren</translation>
+    </message>
+    <message>
+        <source>E&amp;xport…</source>
+        <translation>E&amp;xportieren…</translation>
+    </message>
+    <message>
+        <source>Export the chart as PNG, SVG or PDF</source>
+        <translation>Das Diagramm als PNG, SVG oder PDF exportieren</translation>
+    </message>
+    <message>
+        <source>&amp;Kind:</source>
+        <translation>A&amp;rt:</translation>
+    </message>
+    <message>
+        <source>Columns</source>
+        <translation>Säulen</translation>
+    </message>
+    <message>
+        <source>Lines</source>
+        <translation>Linien</translation>
+    </message>
+    <message>
+        <source>&amp;Axis:</source>
+        <translation>A&amp;chse:</translation>
+    </message>
+    <message>
+        <source>The column whose values stand below</source>
+        <translation>Die Spalte, deren Werte unten stehen</translation>
+    </message>
+    <message>
+        <source>Val&amp;ues</source>
+        <translation>&amp;Werte</translation>
+    </message>
+    <message>
+        <source>The columns that are drawn</source>
+        <translation>Die Spalten, die gezeichnet werden</translation>
+    </message>
+    <message>
+        <source>There are no rows to draw.</source>
+        <translation>Es gibt keine Zeilen zu zeichnen.</translation>
+    </message>
+    <message>
+        <source>A chart needs a column of numbers, and these rows have none.</source>
+        <translation>Ein Diagramm braucht eine Spalte mit Zahlen, und diese Zeilen haben keine.</translation>
+    </message>
+    <message>
+        <source>A chart needs a column of texts or dates beside the numbers, and these rows have none.</source>
+        <translation>Ein Diagramm braucht neben den Zahlen eine Spalte mit Texten oder Daten, und diese Zeilen haben keine.</translation>
+    </message>
+    <message>
+        <source>Choose under &quot;Values&quot; what is to be drawn.</source>
+        <translation>Unter „Werte“ wählen, was gezeichnet werden soll.</translation>
+    </message>
+    <message>
+        <source>Export chart</source>
+        <translation>Diagramm exportieren</translation>
+    </message>
+    <message>
+        <source>chart.png</source>
+        <translation>diagramm.png</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartView</name>
+    <message>
+        <source>Chart</source>
+        <translation>Diagramm</translation>
     </message>
 </context>
 <context>
@@ -1483,6 +1584,10 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     <message>
         <source>Saved as %1.</source>
         <translation>Gespeichert als %1.</translation>
+    </message>
+    <message>
+        <source>&amp;Chart</source>
+        <translation>&amp;Diagramm</translation>
     </message>
 </context>
 <context>
@@ -2095,6 +2200,18 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
         <source>Copy s&amp;ummary</source>
         <translation>Z&amp;usammenfassung kopieren</translation>
     </message>
+    <message>
+        <source>The chart is drawn when the rows have come.</source>
+        <translation>Das Diagramm wird gezeichnet, wenn die Zeilen da sind.</translation>
+    </message>
+    <message>
+        <source>C&amp;hart</source>
+        <translation>&amp;Diagramm</translation>
+    </message>
+    <message>
+        <source>Show the rows as a chart (Ctrl+5), and as a table again (Ctrl+4)</source>
+        <translation>Die Zeilen als Diagramm zeigen (Strg+5) und wieder als Tabelle (Strg+4)</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -2113,18 +2230,6 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>Export drawing</source>
         <translation>Zeichnung exportieren</translation>
-    </message>
-    <message>
-        <source>Picture (*.png)</source>
-        <translation>Bild (*.png)</translation>
-    </message>
-    <message>
-        <source>Scalable drawing (*.svg)</source>
-        <translation>Skalierbare Zeichnung (*.svg)</translation>
-    </message>
-    <message>
-        <source>Document (*.pdf)</source>
-        <translation>Dokument (*.pdf)</translation>
     </message>
     <message>
         <source>Query</source>

@@ -1124,6 +1124,18 @@
         <source>The drawing is too large for &quot;%1&quot;; choose a name that ends in .svg.</source>
         <translation>El dibujo es demasiado grande para «%1»; elija un nombre que termine en .svg.</translation>
     </message>
+    <message>
+        <source>Picture (*.png)</source>
+        <translation>Imagen (*.png)</translation>
+    </message>
+    <message>
+        <source>Scalable drawing (*.svg)</source>
+        <translation>Dibujo vectorial (*.svg)</translation>
+    </message>
+    <message>
+        <source>Document (*.pdf)</source>
+        <translation>Documento (*.pdf)</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -1175,6 +1187,95 @@
     <message>
         <source>Largest: %1</source>
         <translation>Mayor: %1</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartData</name>
+    <message>
+        <source>Drawn are the first %1 of %2 rows.</source>
+        <translation>Están dibujadas las primeras %1 de %2 filas.</translation>
+    </message>
+    <message>
+        <source>Rows left out because they have no date: %1.</source>
+        <translation>Filas omitidas por no tener fecha: %1.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartPanel</name>
+    <message>
+        <source>Cop&amp;y</source>
+        <translation>Cop&amp;iar</translation>
+    </message>
+    <message>
+        <source>Copy the chart as a picture</source>
+        <translation>Copiar el gráfico como imagen</translation>
+    </message>
+    <message>
+        <source>E&amp;xport…</source>
+        <translation>E&amp;xportar…</translation>
+    </message>
+    <message>
+        <source>Export the chart as PNG, SVG or PDF</source>
+        <translation>Exportar el gráfico como PNG, SVG o PDF</translation>
+    </message>
+    <message>
+        <source>&amp;Kind:</source>
+        <translation>&amp;Tipo:</translation>
+    </message>
+    <message>
+        <source>Columns</source>
+        <translation>Columnas</translation>
+    </message>
+    <message>
+        <source>Lines</source>
+        <translation>Líneas</translation>
+    </message>
+    <message>
+        <source>&amp;Axis:</source>
+        <translation>E&amp;je:</translation>
+    </message>
+    <message>
+        <source>The column whose values stand below</source>
+        <translation>La columna cuyos valores están abajo</translation>
+    </message>
+    <message>
+        <source>Val&amp;ues</source>
+        <translation>Valo&amp;res</translation>
+    </message>
+    <message>
+        <source>The columns that are drawn</source>
+        <translation>Las columnas que se dibujan</translation>
+    </message>
+    <message>
+        <source>There are no rows to draw.</source>
+        <translation>No hay filas que dibujar.</translation>
+    </message>
+    <message>
+        <source>A chart needs a column of numbers, and these rows have none.</source>
+        <translation>Un gráfico necesita una columna de números, y estas filas no tienen ninguna.</translation>
+    </message>
+    <message>
+        <source>A chart needs a column of texts or dates beside the numbers, and these rows have none.</source>
+        <translation>Un gráfico necesita una columna de textos o fechas junto a los números, y estas filas no tienen ninguna.</translation>
+    </message>
+    <message>
+        <source>Choose under &quot;Values&quot; what is to be drawn.</source>
+        <translation>Elija en «Valores» lo que se ha de dibujar.</translation>
+    </message>
+    <message>
+        <source>Export chart</source>
+        <translation>Exportar el gráfico</translation>
+    </message>
+    <message>
+        <source>chart.png</source>
+        <translation>grafico.png</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartView</name>
+    <message>
+        <source>Chart</source>
+        <translation>Gráfico</translation>
     </message>
 </context>
 <context>
@@ -1483,6 +1584,10 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     <message>
         <source>Saved as %1.</source>
         <translation>Guardado como %1.</translation>
+    </message>
+    <message>
+        <source>&amp;Chart</source>
+        <translation>&amp;Gráfico</translation>
     </message>
 </context>
 <context>
@@ -2095,6 +2200,18 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
         <source>Copy s&amp;ummary</source>
         <translation>Copiar el res&amp;umen</translation>
     </message>
+    <message>
+        <source>The chart is drawn when the rows have come.</source>
+        <translation>El gráfico se dibuja cuando han llegado las filas.</translation>
+    </message>
+    <message>
+        <source>C&amp;hart</source>
+        <translation>&amp;Gráfico</translation>
+    </message>
+    <message>
+        <source>Show the rows as a chart (Ctrl+5), and as a table again (Ctrl+4)</source>
+        <translation>Mostrar las filas como gráfico (Ctrl+5) y de nuevo como tabla (Ctrl+4)</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -2113,18 +2230,6 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>Export drawing</source>
         <translation>Exportar el dibujo</translation>
-    </message>
-    <message>
-        <source>Picture (*.png)</source>
-        <translation>Imagen (*.png)</translation>
-    </message>
-    <message>
-        <source>Scalable drawing (*.svg)</source>
-        <translation>Dibujo vectorial (*.svg)</translation>
-    </message>
-    <message>
-        <source>Document (*.pdf)</source>
-        <translation>Documento (*.pdf)</translation>
     </message>
     <message>
         <source>Query</source>

@@ -1124,6 +1124,18 @@
         <source>The drawing is too large for &quot;%1&quot;; choose a name that ends in .svg.</source>
         <translation>Le dessin est trop grand pour «&#xa0;%1&#xa0;»&#xa0;; choisissez un nom qui se termine par .svg.</translation>
     </message>
+    <message>
+        <source>Picture (*.png)</source>
+        <translation>Image (*.png)</translation>
+    </message>
+    <message>
+        <source>Scalable drawing (*.svg)</source>
+        <translation>Dessin vectoriel (*.svg)</translation>
+    </message>
+    <message>
+        <source>Document (*.pdf)</source>
+        <translation>Document (*.pdf)</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -1175,6 +1187,95 @@
     <message>
         <source>Largest: %1</source>
         <translation>Plus grand : %1</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartData</name>
+    <message>
+        <source>Drawn are the first %1 of %2 rows.</source>
+        <translation>Sont dessinées les %1 premières lignes sur %2.</translation>
+    </message>
+    <message>
+        <source>Rows left out because they have no date: %1.</source>
+        <translation>Lignes omises faute de date : %1.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartPanel</name>
+    <message>
+        <source>Cop&amp;y</source>
+        <translation>Cop&amp;ier</translation>
+    </message>
+    <message>
+        <source>Copy the chart as a picture</source>
+        <translation>Copier le graphique comme image</translation>
+    </message>
+    <message>
+        <source>E&amp;xport…</source>
+        <translation>E&amp;xporter…</translation>
+    </message>
+    <message>
+        <source>Export the chart as PNG, SVG or PDF</source>
+        <translation>Exporter le graphique en PNG, SVG ou PDF</translation>
+    </message>
+    <message>
+        <source>&amp;Kind:</source>
+        <translation>&amp;Type :</translation>
+    </message>
+    <message>
+        <source>Columns</source>
+        <translation>Colonnes</translation>
+    </message>
+    <message>
+        <source>Lines</source>
+        <translation>Lignes</translation>
+    </message>
+    <message>
+        <source>&amp;Axis:</source>
+        <translation>A&amp;xe :</translation>
+    </message>
+    <message>
+        <source>The column whose values stand below</source>
+        <translation>La colonne dont les valeurs figurent en bas</translation>
+    </message>
+    <message>
+        <source>Val&amp;ues</source>
+        <translation>Vale&amp;urs</translation>
+    </message>
+    <message>
+        <source>The columns that are drawn</source>
+        <translation>Les colonnes qui sont dessinées</translation>
+    </message>
+    <message>
+        <source>There are no rows to draw.</source>
+        <translation>Il n’y a pas de lignes à dessiner.</translation>
+    </message>
+    <message>
+        <source>A chart needs a column of numbers, and these rows have none.</source>
+        <translation>Un graphique a besoin d’une colonne de nombres, et ces lignes n’en ont pas.</translation>
+    </message>
+    <message>
+        <source>A chart needs a column of texts or dates beside the numbers, and these rows have none.</source>
+        <translation>Un graphique a besoin d’une colonne de textes ou de dates à côté des nombres, et ces lignes n’en ont pas.</translation>
+    </message>
+    <message>
+        <source>Choose under &quot;Values&quot; what is to be drawn.</source>
+        <translation>Choisissez sous « Valeurs » ce qui doit être dessiné.</translation>
+    </message>
+    <message>
+        <source>Export chart</source>
+        <translation>Exporter le graphique</translation>
+    </message>
+    <message>
+        <source>chart.png</source>
+        <translation>graphique.png</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::ChartView</name>
+    <message>
+        <source>Chart</source>
+        <translation>Graphique</translation>
     </message>
 </context>
 <context>
@@ -1483,6 +1584,10 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     <message>
         <source>Saved as %1.</source>
         <translation>Enregistré sous %1.</translation>
+    </message>
+    <message>
+        <source>&amp;Chart</source>
+        <translation>&amp;Graphique</translation>
     </message>
 </context>
 <context>
@@ -2095,6 +2200,18 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
         <source>Copy s&amp;ummary</source>
         <translation>Copier le rés&amp;umé</translation>
     </message>
+    <message>
+        <source>The chart is drawn when the rows have come.</source>
+        <translation>Le graphique est dessiné quand les lignes sont arrivées.</translation>
+    </message>
+    <message>
+        <source>C&amp;hart</source>
+        <translation>&amp;Graphique</translation>
+    </message>
+    <message>
+        <source>Show the rows as a chart (Ctrl+5), and as a table again (Ctrl+4)</source>
+        <translation>Afficher les lignes en graphique (Ctrl+5), puis de nouveau en tableau (Ctrl+4)</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::ShowCommands</name>
@@ -2113,18 +2230,6 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>Export drawing</source>
         <translation>Exporter le dessin</translation>
-    </message>
-    <message>
-        <source>Picture (*.png)</source>
-        <translation>Image (*.png)</translation>
-    </message>
-    <message>
-        <source>Scalable drawing (*.svg)</source>
-        <translation>Dessin vectoriel (*.svg)</translation>
-    </message>
-    <message>
-        <source>Document (*.pdf)</source>
-        <translation>Document (*.pdf)</translation>
     </message>
     <message>
         <source>Query</source>
