@@ -81,7 +81,7 @@ TEST_F(EveryChange, OfCriteriaIsSeen) {
     isSeen("Remove", [&] { definition->Criteria().Remove(u"4"); });
     isSeen("what names are tied to", [&] { query.addTable(SmallQuery::described(u"items")); });
     const auto& criterium = static_cast<model::ColumnDefinition&>(*definition).criteria().rows();
-    isSeen("references", [&] { criterium.at(4)->tie(u"orders.id", {{0, 6, {}}}); });
+    isSeen("references", [&] { criterium.at(4)->tie({u"orders.id", {{0, 6, {}}}}); });
 }
 
 TEST_F(EveryChange, OfAListIsSeen) {

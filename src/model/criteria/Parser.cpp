@@ -1,8 +1,7 @@
 #include "model/criteria/Parser.h"
 
+#include "model/criteria/ExpressionReader.h"
 #include "model/criteria/Literals.h"
-
-#include <Zandor/model/Table.h>
 
 #include <algorithm>
 
@@ -11,8 +10,6 @@ namespace zandor::model::criteria {
 using sql::Node;
 
 namespace {
-
-constexpr int deepestNesting = 100;
 
 /// Whether somebody may have meant a pattern: "100 %" is no such text.
 bool looksLikePattern(StringView text) {
@@ -29,66 +26,43 @@ bool looksLikePattern(StringView text) {
 
 class Parser {
 public:
-    Parser(StringView text, std::vector<Token> tokens, const sql::ColumnRef& subject,
-           const Resolver& resolver, const References& known)
-        : mText(text), mTokens(std::move(tokens)), mSubjectColumn(subject),
-          mSubject(sql::make(subject)), mResolver(resolver), mKnown(known) {}
+    Parser(StringView text, const Subject& subject, const Resolver& resolver,
+           const References& known)
+        : mCursor(text, Mode::criterion), mSubject(subject), mNames(mCursor, resolver, known),
+          mExpressions(mCursor, mNames) {}
 
     Reading read() {
         try {
-            if (peek().kind != TokenKind::end) mReading.condition = disjunction();
-            if (peek().kind != TokenKind::end) fail<MessageCode::jointMissing>();
+            if (mCursor.peek().kind != TokenKind::end) mReading.condition = disjunction();
+            if (mCursor.error()) throw Error(*mCursor.error());
+            if (mCursor.peek().kind != TokenKind::end) fail<MessageCode::jointMissing>();
+            mReading.references = std::move(mNames.references);
         } catch (Error& error) {
             mReading.condition = {};
-            mReading.error = std::move(error);
+            // What no token can be made of explains more than what was missed before it.
+            mReading.error = mCursor.error() ? *mCursor.error() : std::move(error);
             mReading.warning.reset();
-            keepKnown();
+            mNames.keepKnown();
+            mReading.references = std::move(mNames.references);
         }
         return std::move(mReading);
     }
 
 private:
-    /// One step down into parentheses or a Not.
-    class Nesting {
-    public:
-        explicit Nesting(Parser& parser) : mParser(parser) {
-            if (++mParser.mDepth > deepestNesting) mParser.fail<MessageCode::nestedTooDeep>();
-        }
-        ~Nesting() { --mParser.mDepth; }
-
-    private:
-        Parser& mParser;
-    };
-
-    const Token& peek(std::size_t ahead = 0) const {
-        return mTokens[std::min(mAt + ahead, mTokens.size() - 1)];
-    }
-    Token take() { return mTokens[mAt < mTokens.size() - 1 ? mAt++ : mAt]; }
-    bool at(StringView keyword, std::size_t ahead = 0) const {
-        return isKeyword(peek(ahead), keyword);
-    }
-    bool takeKeyword(StringView keyword) {
-        if (!at(keyword)) return false;
-        take();
-        return true;
-    }
-    bool takeKind(TokenKind kind) {
-        if (peek().kind != kind) return false;
-        take();
-        return true;
-    }
     template <MessageCode code, class... Arguments>
     [[noreturn]] void fail(const Arguments&... arguments) const {
-        if (atDecimalComma()) throw Error{peek().begin, say<MessageCode::decimalComma>()};
-        throw Error{peek().begin, say<code>(arguments...)};
+        if (atDecimalComma()) mCursor.fail<MessageCode::decimalComma>();
+        mCursor.fail<code>(arguments...);
     }
+
     /// For want of a value.
     [[noreturn]] void failMissing(const Token& token) const {
-        throw Error{token.begin, missingOf(mSubjectColumn.type)};
+        throw Error{token.begin, missingOf(mSubject.type)};
     }
+
     /// For a value that is none of the column's.
     [[noreturn]] void failValue(const Token& token) const {
-        const bool number = isNumber(mSubjectColumn.type);
+        const bool number = isNumber(mSubject.type);
         const std::size_t comma = token.text.find(u',');
         if (number && comma != String::npos) {
             String point = token.text;
@@ -96,134 +70,211 @@ private:
             if (literal(point, ColumnType::Decimal))
                 throw Error{token.begin, say<MessageCode::decimalComma>()};
         }
-        throw Error{token.begin, refusalOf(mSubjectColumn.type)};
+        throw Error{token.begin, refusalOf(mSubject.type)};
     }
+
     /// Whether digits stand on both sides of a comma that no list has, as in 1,5.
     bool atDecimalComma() const {
-        if (peek().kind != TokenKind::comma || mAt == 0 || mSubjectColumn.type == ColumnType::Text)
+        if (mCursor.peek().kind != TokenKind::comma || mCursor.atBegin() ||
+            mSubject.type == ColumnType::Text)
             return false;
-        const Token& before = mTokens[mAt - 1];
-        const Token& behind = peek(1);
+        const Token& before = mCursor.before();
+        const Token& behind = mCursor.peek(1);
         return before.kind == TokenKind::word && behind.kind == TokenKind::word &&
-               before.end == peek().begin && peek().end == behind.begin &&
+               before.end == mCursor.peek().begin && mCursor.peek().end == behind.begin &&
                literal(before.text, ColumnType::Decimal) &&
                literal(behind.text, ColumnType::Decimal);
     }
 
     Node disjunction() {
         std::vector<Node> terms{conjunction()};
-        while (takeKeyword(u"Or")) terms.push_back(conjunction());
+        while (mCursor.takeKeyword(u"Or")) terms.push_back(conjunction());
         return sql::anyOf(std::move(terms));
     }
 
     Node conjunction() {
         std::vector<Node> terms{negation()};
-        while (takeKeyword(u"And")) terms.push_back(negation());
+        while (mCursor.takeKeyword(u"And")) terms.push_back(negation());
         return sql::allOf(std::move(terms));
     }
 
     Node negation() {
-        if (!at(u"Not")) return predicate(false);
-        if (at(u"Like", 1) || at(u"Between", 1) || at(u"In", 1)) {
-            take();
+        if (!mCursor.at(u"Not")) return predicate(false);
+        if (mCursor.at(u"Like", 1) || mCursor.at(u"Between", 1) || mCursor.at(u"In", 1)) {
+            mCursor.take();
             return predicate(true);
         }
-        const Nesting nesting(*this);
-        take();
+        const Cursor::Nesting nesting(mCursor);
+        mCursor.take();
         return sql::make(sql::Not{negation()});
     }
 
     Node predicate(bool negated) {
-        if (peek().kind == TokenKind::open) {
-            const Nesting nesting(*this);
-            take();
+        if (mCursor.peek().kind == TokenKind::open && !atValueInParentheses()) {
+            const Cursor::Nesting nesting(mCursor);
+            mCursor.take();
             Node inner = disjunction();
-            if (!takeKind(TokenKind::close)) fail<MessageCode::closingMissing>(u")");
+            if (!mCursor.takeKind(TokenKind::close)) fail<MessageCode::closingMissing>(u")");
             return inner;
         }
-        if (at(u"Like")) return like(negated);
-        if (takeKeyword(u"Between")) return between(negated);
-        if (at(u"In") && peek(1).kind == TokenKind::open) return in(negated);
+        if (mCursor.at(u"Like")) return like(negated);
+        if (mCursor.takeKeyword(u"Between")) return between(negated);
+        if (mCursor.at(u"In") && mCursor.peek(1).kind == TokenKind::open) return in(negated);
         if (negated) {
-            take();
+            mCursor.take();
             fail<MessageCode::listMissing>();
         }
-        if (at(u"Is")) return isNull();
-        auto comparison = sql::Comparison::equal;
-        if (peek().kind == TokenKind::comparison) comparison = operatorOf(take().text);
-        return sql::make(sql::Compare{comparison, mSubject, operand()});
+        if (mCursor.at(u"Is")) return isNull();
+        if (mCursor.peek().kind == TokenKind::comparison) {
+            const auto comparison = comparisonOf(mCursor.take().text);
+            return compared(comparison, operand());
+        }
+        const Token first = mCursor.peek();
+        Node left = plainOperand();
+        const bool own = std::holds_alternative<sql::Value>(left->node);
+        if (!own && atComparison()) {
+            mCursor.setMode(Mode::expression);
+            Node condition = mExpressions.conditionFrom(std::move(left));
+            mCursor.setMode(Mode::criterion);
+            return condition;
+        }
+        return compared(sql::Comparison::equal, fitted(std::move(left), first));
     }
 
-    static sql::Comparison operatorOf(StringView symbol) {
-        if (symbol == u"<>") return sql::Comparison::notEqual;
-        if (symbol == u"<") return sql::Comparison::less;
-        if (symbol == u">") return sql::Comparison::greater;
-        if (symbol == u"<=") return sql::Comparison::lessEqual;
-        if (symbol == u">=") return sql::Comparison::greaterEqual;
-        return sql::Comparison::equal;
+    Node compared(sql::Comparison comparison, Node right) const {
+        return sql::make(sql::Compare{comparison, mSubject.node, std::move(right)});
+    }
+
+    /// Whether what was read so far is the left side of a comparison of its own.
+    bool atComparison() const {
+        const std::size_t ahead = mCursor.at(u"Not") ? 1 : 0;
+        return (ahead == 0 &&
+                (mCursor.peek().kind == TokenKind::comparison || mCursor.at(u"Is"))) ||
+               mCursor.at(u"Like", ahead) || mCursor.at(u"Between", ahead) ||
+               mCursor.at(u"In", ahead);
+    }
+
+    /// Whether the parentheses ahead hold a value that goes on behind them, and no conditions.
+    bool atValueInParentheses() const {
+        std::size_t ahead = 0;
+        int depth = 0;
+        do {
+            const TokenKind kind = mCursor.peek(ahead).kind;
+            if (kind == TokenKind::end) return false;
+            if (kind == TokenKind::open) ++depth;
+            if (kind == TokenKind::close) --depth;
+            ++ahead;
+        } while (depth > 0);
+        const Token& behind = mCursor.peek(ahead);
+        if (behind.kind == TokenKind::comparison || atSymbol(behind)) return true;
+        for (const StringView word : {u"Is", u"Like", u"Between", u"In", u"Not"})
+            if (isKeyword(behind, word)) return true;
+        return false;
+    }
+
+    static bool atSymbol(const Token& token) {
+        return token.kind == TokenKind::word &&
+               StringView(u"+-*/&").find(token.text.front()) != StringView::npos;
     }
 
     Node isNull() {
-        take();
-        const bool negated = takeKeyword(u"Not");
-        if (!takeKeyword(u"Null")) fail<MessageCode::nullMissing>();
-        return sql::make(sql::IsNull{negated, mSubject});
+        mCursor.take();
+        const bool negated = mCursor.takeKeyword(u"Not");
+        if (!mCursor.takeKeyword(u"Null")) fail<MessageCode::nullMissing>();
+        return sql::make(sql::IsNull{negated, mSubject.node});
     }
 
     Node like(bool negated) {
-        const Token word = take();
+        const Token word = mCursor.take();
         if (!takesAnyText()) throw Error{word.begin, say<MessageCode::likeOnNoText>()};
-        const Token first = peek();
-        const bool qualified = first.kind == TokenKind::bracketed && peek(1).kind == TokenKind::dot;
+        const Token first = mCursor.peek();
+        const bool qualified =
+            first.kind == TokenKind::bracketed && mCursor.peek(1).kind == TokenKind::dot;
         Node asked;
         if (!qualified)
-            asked = first.kind == TokenKind::bracketed ? bracketedName() : takeParameter();
+            asked = first.kind == TokenKind::bracketed ? mNames.takeBracketed()
+                                                       : mNames.takeParameter(true);
         const auto* parameter = asked ? std::get_if<sql::Parameter>(&asked->node) : nullptr;
         if (qualified || (asked && !parameter))
             throw Error{first.begin, say<MessageCode::columnForPattern>()};
         if (parameter) {
             sql::Parameter pattern = *parameter;
+            pattern.type = mSubject.type;
             pattern.pattern = true;
-            return sql::make(sql::Like{negated, mSubject, sql::make(std::move(pattern))});
+            return sql::make(sql::Like{negated, mSubject.node, sql::make(std::move(pattern))});
         }
-        const String typed = first.kind == TokenKind::quoted ? take().text : barePattern();
+        const String typed = first.kind == TokenKind::quoted ? mCursor.take().text : barePattern();
         if (first.kind != TokenKind::quoted && typed.empty()) fail<MessageCode::patternMissing>();
-        return sql::make(sql::Like{negated, mSubject,
+        return sql::make(sql::Like{negated, mSubject.node,
                                    sql::make(sql::Value{ColumnType::Text, likePattern(typed)})});
     }
 
     Node between(bool negated) {
         Node low = operand();
-        if (!takeKeyword(u"And")) fail<MessageCode::secondValueMissing>();
+        if (!mCursor.takeKeyword(u"And")) fail<MessageCode::secondValueMissing>();
         Node high = operand();
-        return sql::make(sql::Between{negated, mSubject, std::move(low), std::move(high)});
+        return sql::make(sql::Between{negated, mSubject.node, std::move(low), std::move(high)});
     }
 
     Node in(bool negated) {
-        take();
-        take();
+        mCursor.take();
+        mCursor.take();
         std::vector<Node> list{operand()};
-        while (takeKind(TokenKind::comma)) list.push_back(operand());
-        if (!takeKind(TokenKind::close)) fail<MessageCode::listNotClosed>();
-        return sql::make(sql::In{negated, mSubject, std::move(list)});
+        while (mCursor.takeKind(TokenKind::comma)) list.push_back(operand());
+        if (!mCursor.takeKind(TokenKind::close)) fail<MessageCode::listNotClosed>();
+        return sql::make(sql::In{negated, mSubject.node, std::move(list)});
     }
 
-    /// A value, a column or a parameter.
+    /// A value, a column, a parameter or an expression that the subject can be compared with.
     Node operand() {
-        if (Node parameter = takeParameter()) return parameter;
-        if (Node column = takeColumn()) return column;
-        const Token first = peek();
+        const Token first = mCursor.peek();
+        return fitted(plainOperand(), first);
+    }
+
+    Node fitted(Node node, const Token& first) const {
+        if (std::holds_alternative<sql::Value>(node->node)) return node;
+        node = typed(std::move(node), mSubject.type);
+        if (comparable(typeOf(*node), mSubject.type)) return node;
+        if (mSubject.type == ColumnType::Timestamp && typeOf(*node) == ColumnType::Date)
+            return sql::make(sql::Call{sql::Function::moment, {node}, ColumnType::Timestamp});
+        if (std::holds_alternative<sql::ColumnRef>(node->node))
+            throw Error{first.begin, say<MessageCode::incomparableColumn>(nameOf(mSubject.type))};
+        throw Error{first.begin, say<MessageCode::incomparableValue>(nameOf(mSubject.type))};
+    }
+
+    /// The same whatever it holds.
+    Node plainOperand() {
+        const Token first = mCursor.peek();
+        const bool calls = mCursor.atCall() && (signatureOf(first.text) || isKeyword(first, u"If"));
+        if (calls || first.kind == TokenKind::open)
+            return inExpression([&] { return mExpressions.value(); });
+        if (Node parameter = mNames.takeParameter(takesAnyText())) return continued(parameter);
+        if (Node column = mNames.takeQualified(takesAnyText())) return continued(column);
         switch (first.kind) {
         case TokenKind::quoted:
-        case TokenKind::dated: return delimitedValue(take());
+        case TokenKind::dated: return continued(delimitedValue(mCursor.take()));
         case TokenKind::word: return bareValue();
-        case TokenKind::bracketed: return bracketedName();
+        case TokenKind::bracketed: return continued(mNames.takeBracketed());
         default: failMissing(first);
         }
     }
 
+    template <class Read>
+    Node inExpression(Read read) {
+        mCursor.setMode(Mode::expression);
+        Node node = read();
+        mCursor.setMode(Mode::criterion);
+        return node;
+    }
+
+    /// With the operators behind it, if there are any.
+    Node continued(Node first) {
+        if (!atSymbol(mCursor.peek())) return first;
+        return inExpression([&] { return mExpressions.valueFrom(std::move(first)); });
+    }
+
     Node delimitedValue(const Token& token) {
-        ColumnType type = mSubjectColumn.type;
+        ColumnType type = mSubject.type;
         if (token.kind == TokenKind::dated) {
             const auto moment = momentLiteral(token.text, type);
             if (!moment) failValue(token);
@@ -237,172 +288,101 @@ private:
     }
 
     Node bareValue() {
-        const Token first = peek();
-        if (at(u"Null")) fail<MessageCode::equalToNull>();
+        const Token first = mCursor.peek();
+        if (mCursor.at(u"Null")) fail<MessageCode::equalToNull>();
+        const std::size_t place = mCursor.place();
         const String typed = bareText();
         if (typed.empty()) failMissing(first);
-        const auto value = literal(typed, mSubjectColumn.type);
+        const auto value = literal(typed, mSubject.type);
+        if (!value && isNumber(mSubject.type)) {
+            mCursor.returnTo(place);
+            if (Node calculated = calculation()) return calculated;
+        }
         if (!value) failValue(first);
         if (value->type == ColumnType::Text && !mReading.warning && looksLikePattern(typed))
             mReading.warning = Error{first.begin, say<MessageCode::patternWithoutLike>()};
         return sql::make(*value);
     }
 
-    bool atWord() const { return peek().kind == TokenKind::word && !at(u"And") && !at(u"Or"); }
+    /// A number with an operator behind it, or nothing.
+    Node calculation() {
+        mCursor.setMode(Mode::expression);
+        const std::size_t signs = mCursor.peek().kind == TokenKind::symbol ? 1 : 0;
+        Node node;
+        if (mCursor.peek(signs + 1).kind == TokenKind::symbol &&
+            literal(mCursor.peek(signs).text, ColumnType::Decimal))
+            node = mExpressions.value();
+        mCursor.setMode(Mode::criterion);
+        return node;
+    }
+
+    bool atWord() const {
+        return mCursor.peek().kind == TokenKind::word && !mCursor.at(u"And") && !mCursor.at(u"Or");
+    }
 
     /// The bare words from here up to And, Or or another kind of token, with the blanks between
     /// them as typed.
     String bareText() {
-        const std::size_t begin = peek().begin;
+        const std::size_t begin = mCursor.peek().begin;
         std::size_t end = begin;
-        while (atWord()) end = take().end;
-        return String(mText.substr(begin, end - begin));
+        while (atWord()) end = mCursor.take().end;
+        return String(mCursor.text().substr(begin, end - begin));
     }
 
     /// The same with brackets, which make a wildcard an ordinary character, as typed.
     String barePattern() {
-        const std::size_t begin = peek().begin;
+        const std::size_t begin = mCursor.peek().begin;
         std::size_t end = begin;
-        while (atWord() || peek().kind == TokenKind::bracketed || peek().kind == TokenKind::dot)
-            end = take().end;
-        return String(mText.substr(begin, end - begin));
+        while (atWord() || mCursor.peek().kind == TokenKind::bracketed ||
+               mCursor.peek().kind == TokenKind::dot)
+            end = mCursor.take().end;
+        return String(mCursor.text().substr(begin, end - begin));
     }
 
     /// Whether any text is a value for the column.
     bool takesAnyText() const {
-        return mSubjectColumn.type == ColumnType::Text ||
-               mSubjectColumn.type == ColumnType::Unknown;
+        return mSubject.type == ColumnType::Text || mSubject.type == ColumnType::Unknown;
     }
 
-    Node takeParameter() {
-        const Token& token = peek();
-        if (token.kind != TokenKind::word || token.text.front() != u':') return {};
-        String name = token.text.substr(1);
-        if (!isBareName(name)) {
-            // A text may begin with a colon; other values cannot.
-            if (takesAnyText()) return {};
-            throw Error{token.begin + 1, say<MessageCode::parameterNameMissing>()};
-        }
-        take();
-        return sql::make(sql::Parameter{std::move(name), mSubjectColumn.type});
-    }
-
-    /// table.column in any mix of bare and bracketed names. A bare pair that names no column of the
-    /// query is left alone: it may be a text.
-    Node takeColumn() {
-        const Token first = peek();
-        if (first.kind != TokenKind::word && first.kind != TokenKind::bracketed) return {};
-        if (peek(1).kind == TokenKind::dot) {
-            take();
-            take();
-            const Token second = take();
-            if (second.kind != TokenKind::bracketed && second.kind != TokenKind::word)
-                throw Error{second.begin, say<MessageCode::columnNameMissing>()};
-            const auto found = lookUp({first.begin, first.end}, first.text, second.text);
-            if (!found)
-                throw Error{first.begin,
-                            say<MessageCode::noSuchColumn>(first.text + u"." + second.text)};
-            return columnNode(first, *found);
-        }
-        if (first.kind != TokenKind::word) return {};
-        const StringView whole = first.text;
-        const std::size_t dot = whole.find(u'.');
-        if (dot == StringView::npos || !isBareName(whole.substr(0, dot)) ||
-            !isBareName(whole.substr(dot + 1)))
-            return {};
-        Reference reference{first.begin, first.begin + dot};
-        const auto found = lookUp(reference, whole.substr(0, dot), whole.substr(dot + 1));
-        if (!found) {
-            // From now on it is the text that it looks like, whatever tables come later.
-            if (takesAnyText()) mReading.references.push_back(std::move(reference));
-            return {};
-        }
-        take();
-        return columnNode(first, *found);
-    }
-
-    /// [name] is a column when just one table has it, and a parameter when none has.
-    Node bracketedName() {
-        const Token token = take();
-        if (const Reference* known = knownAt(token.begin)) {
-            mReading.references.push_back(*known);
-            if (const auto column = columnOf(*known)) return columnNode(token, *column);
-            return sql::make(sql::Parameter{token.text, mSubjectColumn.type});
-        }
-        const auto found = mResolver.columnsNamed(token.text);
-        if (found.size() > 1)
-            throw Error{token.begin,
-                        say<MessageCode::ambiguousColumn>(u"[" + found.front().column.table +
-                                                          u"].[" + token.text + u"]")};
-        Reference reference{token.begin, token.begin};
-        if (found.size() == 1) reference.column = found.front().place;
-        mReading.references.push_back(std::move(reference));
-        if (found.size() == 1) return columnNode(token, found.front().column);
-        return sql::make(sql::Parameter{token.text, mSubjectColumn.type});
-    }
-
-    /// The column that a table's and a column's name stand for, or nothing.
-    std::optional<sql::ColumnRef> lookUp(Reference reference, StringView table, StringView column) {
-        if (const Reference* known = knownAt(reference.begin)) {
-            // A settled text is entered by the caller.
-            if (known->column.empty()) return {};
-            mReading.references.push_back(*known);
-            return columnOf(*known);
-        }
-        const auto found = mResolver.columnsNamed(table, column);
-        if (found.size() != 1) return {};
-        reference.column = found.front().place;
-        mReading.references.push_back(std::move(reference));
-        return found.front().column;
-    }
-
-    const Reference* knownAt(std::size_t begin) const {
-        const auto at = std::find_if(mKnown.begin(), mKnown.end(),
-                                     [&](const Reference& known) { return known.begin == begin; });
-        return at == mKnown.end() ? nullptr : &*at;
-    }
-
-    static std::optional<sql::ColumnRef> columnOf(const Reference& known) {
-        if (known.column.empty()) return {};
-        const auto column = known.column.column();
-        if (!column) throw Error{known.begin, say<MessageCode::tableOfColumnGone>()};
-        return columnRef(*column, *known.column.table().table());
-    }
-
-    /// What was known behind the place where reading stopped stays known.
-    void keepKnown() {
-        auto& references = mReading.references;
-        for (const Reference& known : mKnown)
-            if (references.empty() || known.begin > references.back().begin)
-                references.push_back(known);
-    }
-
-    Node columnNode(const Token& token, const sql::ColumnRef& column) {
-        if (!comparable(column.type, mSubjectColumn.type))
-            throw Error{token.begin,
-                        say<MessageCode::incomparableColumn>(nameOf(mSubjectColumn.type))};
-        return sql::make(column);
-    }
-
-    StringView mText;
-    std::vector<Token> mTokens;
-    const sql::ColumnRef& mSubjectColumn;
-    Node mSubject;
-    const Resolver& mResolver;
-    const References& mKnown;
+    Cursor mCursor;
+    const Subject& mSubject;
+    NameReader mNames;
+    ExpressionReader mExpressions;
     Reading mReading;
-    std::size_t mAt = 0;
-    int mDepth = 0;
 };
 
 } // namespace
 
-Reading read(StringView text, const sql::ColumnRef& subject, const Resolver& resolver,
+Subject::Subject(const sql::ColumnRef& column)
+    : node(sql::make(column)), type(column.type), name(column.table + u"." + column.column) {}
+
+Subject::Subject(Node node, String name)
+    : node(std::move(node)), type(this->node ? typeOf(*this->node) : ColumnType::Unknown),
+      name(std::move(name)) {}
+
+Reading read(StringView text, const Subject& subject, const Resolver& resolver,
              const References& known) {
-    auto scanned = tokens(text);
-    if (auto* error = std::get_if<Error>(&scanned)) return {{}, std::move(*error), {}, known};
-    return Parser(text, std::move(std::get<std::vector<Token>>(scanned)), subject, resolver, known)
-        .read();
+    if (auto error = unusable(text)) return {{}, std::move(error), {}, known};
+    return Parser(text, subject, resolver, known).read();
+}
+
+ExpressionReading readExpression(StringView text, const Resolver& resolver,
+                                 const References& known) {
+    if (auto error = unusable(text)) return {{}, std::move(error), known};
+    Cursor cursor(text, Mode::expression);
+    NameReader names(cursor, resolver, known);
+    ExpressionReading reading;
+    try {
+        reading.value = ExpressionReader(cursor, names).expression();
+        if (cursor.error()) throw Error(*cursor.error());
+        if (cursor.peek().kind != TokenKind::end) cursor.fail<MessageCode::operatorMissing>();
+    } catch (Error& error) {
+        reading.value = {};
+        reading.error = cursor.error() ? *cursor.error() : std::move(error);
+        names.keepKnown();
+    }
+    reading.references = std::move(names.references);
+    return reading;
 }
 
 } // namespace zandor::model::criteria

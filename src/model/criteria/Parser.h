@@ -1,31 +1,21 @@
 #pragma once
 
-#include "model/criteria/Tokens.h"
-
-#include <Zandor/model/References.h>
-#include <Zandor/sql/Expression.h>
-
-#include <optional>
+#include "model/criteria/NameReader.h"
 
 /// The language of criteria as people type them into a cell: a value, or a comparison, or several
-/// of them with And, Or and Not.
+/// of them with And, Or and Not; and that of expressions, which stand in for a column.
 namespace zandor::model::criteria {
 
-/// A column as it stands in the statement.
-sql::ColumnRef columnRef(const Column& column, const Table& table);
+/// What a criterion speaks about.
+struct Subject {
+    Subject() = default;
+    Subject(const sql::ColumnRef& column); ///< a column as it is
+    /// What comes out of a definition, by its total.
+    Subject(sql::Node node, String name);
 
-struct NamedColumn {
-    sql::ColumnRef column;
-    ColumnPlace place;
-};
-
-/// The columns that a criterion may name.
-class Resolver {
-public:
-    virtual ~Resolver() = default;
-    /// Every column of that name in the query; in the table of that name where one is given.
-    virtual std::vector<NamedColumn> columnsNamed(StringView table, StringView column) const = 0;
-    virtual std::vector<NamedColumn> columnsNamed(StringView column) const = 0;
+    sql::Node node;                        ///< nothing: a criterion means nothing here
+    ColumnType type = ColumnType::Unknown; ///< of its values
+    String name;                           ///< as the grid has it
 };
 
 struct Reading {
@@ -35,10 +25,20 @@ struct Reading {
     References references;        ///< on an error those before it, and the known ones behind it
 };
 
-/// Reads the condition that a text sets to a column. Whatever is typed becomes a tree of values,
+/// Reads the condition that a text sets to a subject. Whatever is typed becomes a tree of values,
 /// columns and parameters or an error: never SQL text. Names at the place of a `known` reference
 /// mean what that says, all others what the resolver finds.
-Reading read(StringView text, const sql::ColumnRef& subject, const Resolver& resolver,
+Reading read(StringView text, const Subject& subject, const Resolver& resolver,
              const References& known = {});
+
+struct ExpressionReading {
+    sql::Node value; ///< nothing on an error
+    std::optional<Error> error;
+    References references; ///< as those of a Reading
+};
+
+/// Reads an expression by the same rules.
+ExpressionReading readExpression(StringView text, const Resolver& resolver,
+                                 const References& known = {});
 
 } // namespace zandor::model::criteria

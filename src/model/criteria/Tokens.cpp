@@ -17,31 +17,27 @@ bool isSpace(char16_t c) {
 
 bool isSpecial(char16_t c) { return StringView(u"'\"()[],=<>!").find(c) != StringView::npos; }
 
-/// A character that text cannot carry to any engine.
-std::optional<Error> unusable(StringView text) {
-    if (text.size() > longestText) return Error{longestText, say<MessageCode::criterionTooLong>()};
-    for (std::size_t i = 0; i < text.size(); ++i) {
-        const char16_t c = text[i];
-        if (c == 0) return Error{i, say<MessageCode::zeroInCriterion>()};
-        if (c < 0xD800 || c > 0xDFFF) continue;
-        const bool paired =
-            c < 0xDC00 && i + 1 < text.size() && text[i + 1] >= 0xDC00 && text[i + 1] <= 0xDFFF;
-        if (!paired) return Error{i, say<MessageCode::halfCharacterInCriterion>()};
-        ++i;
-    }
-    return {};
+bool startsName(char16_t c) {
+    return (c >= u'a' && c <= u'z') || (c >= u'A' && c <= u'Z') || c == u'_' ||
+           (c >= 0x80 && !isSpace(c));
 }
+
+bool isNamePart(char16_t c) { return startsName(c) || (c >= u'0' && c <= u'9') || c == u'$'; }
 
 class Scanner {
 public:
-    explicit Scanner(StringView text) : mText(text) {}
+    Scanner(StringView text, Mode mode, std::size_t from) : mText(text), mMode(mode), mAt(from) {}
 
-    std::variant<std::vector<Token>, Error> scan() {
+    Tokens scan() {
+        std::optional<Error> error;
+        std::size_t end = mAt;
         while (skipSpaces(), mAt < mText.size()) {
-            if (auto error = next()) return *error;
+            end = mAt;
+            if ((error = next())) break;
         }
-        mTokens.push_back({TokenKind::end, mText.size(), mText.size(), {}});
-        return std::move(mTokens);
+        if (!error) end = mText.size();
+        mTokens.push_back({TokenKind::end, end, end, {}});
+        return {std::move(mTokens), std::move(error)};
     }
 
 private:
@@ -50,6 +46,8 @@ private:
     }
 
     std::optional<Error> next() {
+        if (mMode == Mode::expression && StringView(u"+-*/&").find(mText[mAt]) != StringView::npos)
+            return single(TokenKind::symbol);
         switch (mText[mAt]) {
         case u'\'': return delimited(TokenKind::quoted, u'\'');
         case u'"': return delimited(TokenKind::quoted, u'"');
@@ -67,9 +65,54 @@ private:
             if (!mTokens.empty() && mTokens.back().kind == TokenKind::bracketed &&
                 mTokens.back().end == mAt)
                 return single(TokenKind::dot);
-            return word();
-        default: return word();
+            return anyWord();
+        default: return anyWord();
         }
+    }
+
+    std::optional<Error> anyWord() { return mMode == Mode::criterion ? word() : nameOrNumber(); }
+
+    bool digitAt(std::size_t at) const {
+        return at < mText.size() && mText[at] >= u'0' && mText[at] <= u'9';
+    }
+
+    void skipDigits() {
+        while (digitAt(mAt)) ++mAt;
+    }
+
+    /// 12, 1.5, .5, 1e-3; a name, or two with a dot between; or :name.
+    std::optional<Error> nameOrNumber() {
+        const std::size_t begin = mAt;
+        if (digitAt(mAt) || (mText[mAt] == u'.' && digitAt(mAt + 1))) {
+            skipDigits();
+            if (mAt < mText.size() && mText[mAt] == u'.') ++mAt;
+            skipDigits();
+            const bool exponent = mAt < mText.size() && (mText[mAt] == u'e' || mText[mAt] == u'E');
+            const bool sign =
+                mAt + 1 < mText.size() && (mText[mAt + 1] == u'+' || mText[mAt + 1] == u'-');
+            if (exponent && digitAt(mAt + (sign ? 2 : 1))) {
+                mAt += sign ? 2 : 1;
+                skipDigits();
+            }
+            return add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
+        }
+        if (mText[mAt] == u':') ++mAt;
+        const std::size_t first = mAt;
+        while (mAt < mText.size() && (isNamePart(mText[mAt]) || mText[mAt] == u'.')) ++mAt;
+        if (mAt == first && first == begin)
+            return Error{begin, say<MessageCode::signUnknown>(mText.substr(begin, 1))};
+        return qualified(begin);
+    }
+
+    /// What was read up to here is a word; a dot before a bracket ends it.
+    std::optional<Error> qualified(std::size_t begin) {
+        const bool qualifies =
+            mAt < mText.size() && mText[mAt] == u'[' && mAt - begin > 1 && mText[mAt - 1] == u'.';
+        if (!qualifies)
+            return add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
+        --mAt;
+        add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
+        return single(TokenKind::dot);
     }
 
     std::optional<Error> add(TokenKind kind, std::size_t begin, String text) {
@@ -113,45 +156,46 @@ private:
         return add(TokenKind::comparison, begin, String(mText.substr(begin, mAt - begin)));
     }
 
-    /// Bare characters. An apostrophe within a word belongs to it (O'Brien); a dot before a
-    /// bracket ends it.
+    /// Bare characters. An apostrophe within a word belongs to it (O'Brien).
     std::optional<Error> word() {
         const std::size_t begin = mAt++;
         while (mAt < mText.size() && !isSpace(mText[mAt]) &&
                (mText[mAt] == u'\'' || !isSpecial(mText[mAt])))
             ++mAt;
-        const bool qualifies =
-            mAt < mText.size() && mText[mAt] == u'[' && mAt - begin > 1 && mText[mAt - 1] == u'.';
-        if (!qualifies)
-            return add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
-        --mAt;
-        add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
-        return single(TokenKind::dot);
+        return qualified(begin);
     }
 
     StringView mText;
-    std::size_t mAt = 0;
+    const Mode mMode;
+    std::size_t mAt;
     std::vector<Token> mTokens;
 };
 
 } // namespace
 
-std::variant<std::vector<Token>, Error> tokens(StringView text) {
-    if (auto error = unusable(text)) return *error;
-    return Scanner(text).scan();
+std::optional<Error> unusable(StringView text) {
+    if (text.size() > longestText) return Error{longestText, say<MessageCode::criterionTooLong>()};
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        const char16_t c = text[i];
+        if (c == 0) return Error{i, say<MessageCode::zeroInCriterion>()};
+        if (c < 0xD800 || c > 0xDFFF) continue;
+        const bool paired =
+            c < 0xDC00 && i + 1 < text.size() && text[i + 1] >= 0xDC00 && text[i + 1] <= 0xDFFF;
+        if (!paired) return Error{i, say<MessageCode::halfCharacterInCriterion>()};
+        ++i;
+    }
+    return {};
+}
+
+Tokens tokens(StringView text, Mode mode, std::size_t from) {
+    return Scanner(text, mode, from).scan();
 }
 
 bool isBlank(StringView text) { return std::all_of(text.begin(), text.end(), isSpace); }
 
 bool isBareName(StringView text) {
-    const auto starts = [](char16_t c) {
-        return (c >= u'a' && c <= u'z') || (c >= u'A' && c <= u'Z') || c == u'_' ||
-               (c >= 0x80 && !isSpace(c));
-    };
-    return !text.empty() && starts(text.front()) &&
-           std::all_of(text.begin(), text.end(), [&](char16_t c) {
-               return starts(c) || (c >= u'0' && c <= u'9') || c == u'$';
-           });
+    return !text.empty() && startsName(text.front()) &&
+           std::all_of(text.begin(), text.end(), isNamePart);
 }
 
 bool isKeyword(const Token& token, StringView keyword) {

@@ -3,7 +3,7 @@
 #include <Zandor/model/Description.h>
 #include <Zandor/model/Messages.h>
 
-#include <variant>
+#include <optional>
 #include <vector>
 
 namespace zandor::model::criteria {
@@ -20,6 +20,7 @@ enum class TokenKind {
     bracketed, ///< [name]
     dated,     ///< #2024-05-01#
     comparison,
+    symbol, ///< + - * / &, where the text is an expression
     open,
     close,
     comma,
@@ -34,8 +35,19 @@ struct Token {
     String text; ///< without its quotes or brackets, doubled ones halved
 };
 
-/// The tokens of a criterion with an `end` token behind them, or the error.
-std::variant<std::vector<Token>, Error> tokens(StringView text);
+/// What bare characters are: in a criterion they may be a text, in an expression they are names,
+/// numbers and operators.
+enum class Mode { criterion, expression };
+
+/// The tokens of a text from a place on, with an `end` token behind them, or where the error is.
+struct Tokens {
+    std::vector<Token> list;
+    std::optional<Error> error;
+};
+Tokens tokens(StringView text, Mode mode, std::size_t from = 0);
+
+/// A character that text cannot carry to any engine, or too many of them.
+std::optional<Error> unusable(StringView text);
 
 /// Whether there is nothing but blanks: no criterion.
 bool isBlank(StringView text);

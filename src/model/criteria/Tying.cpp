@@ -17,9 +17,8 @@ String written(StringView name, bool bracketed) {
     return out + u']';
 }
 
-void followNames(RowCriterium& criterium) {
-    String text = criterium.Criterium();
-    References references = criterium.references();
+TiedText followed(TiedText tied) {
+    auto& [text, references] = tied;
     // From behind, so that the places before stay where they are.
     for (std::size_t i = references.size(); i-- > 0;) {
         Reference& reference = references[i];
@@ -36,23 +35,27 @@ void followNames(RowCriterium& criterium) {
             references[behind].tableEnd += name.size() - length;
         }
     }
-    criterium.tie(std::move(text), std::move(references));
+    return tied;
 }
 
 } // namespace
 
-void tie(const ColumnDefinition& definition, const Resolver& resolver) {
-    const Ref<Column> column = definition.place().column();
-    if (!column) return;
-    const sql::ColumnRef subject = columnRef(*column, *definition.place().table().table());
+void tie(ColumnDefinition& definition, const Resolver& resolver) {
+    const Output output = outputOf(definition, resolver);
+    if (definition.isExpression())
+        definition.tie({definition.expression().text, output.reading.references});
+    if (!output.subject.node) return;
     for (const auto& [row, criterium] : definition.criteria().rows()) {
-        const String text = criterium->Criterium();
-        criterium->tie(text, read(text, subject, resolver, criterium->references()).references);
+        const TiedText& tied = criterium->tied();
+        criterium->tie(
+            {tied.text, read(tied.text, output.subject, resolver, tied.references).references});
     }
 }
 
-void followNames(const ColumnDefinition& definition) {
-    for (const auto& [row, criterium] : definition.criteria().rows()) followNames(*criterium);
+void followNames(ColumnDefinition& definition) {
+    if (definition.isExpression()) definition.tie(followed(definition.expression()));
+    for (const auto& [row, criterium] : definition.criteria().rows())
+        criterium->tie(followed(criterium->tied()));
 }
 
 } // namespace zandor::model::criteria

@@ -65,10 +65,14 @@ void from1(json::Members& file) {
     if (!json::find(file, "lastKeys")) file.push_back({"lastKeys", {lastKeys}});
 }
 
+/// Version 2 had no totals, expressions, priorities of sorting and options of the query: an older
+/// program would leave them out and ask another question.
+void from2(json::Members&) {}
+
 using Step = void (*)(json::Members&);
 
 /// The step at position n leads from version n + 1 to the next.
-constexpr std::array<Step, currentVersion - 1> steps = {from1};
+constexpr std::array<Step, currentVersion - 1> steps = {from1, from2};
 
 } // namespace
 

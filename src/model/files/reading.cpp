@@ -30,7 +30,7 @@ private:
     void join(Object object);
     model::EndRecord end(Object object, const std::string& owner);
     void definition(Object object);
-    static std::vector<model::NameRecord> names(Object& criterion);
+    static std::vector<model::NameRecord> names(Object& owner);
 
     static void each(json::Items items, const Pointer& list,
                      const std::function<void(Object)>& use) {
@@ -51,6 +51,9 @@ void Reader::read(json::Value file) {
     auto joins = object.list("joins", limits::joins);
     auto definitions = object.list("definitions", limits::definitions);
     database = object.text("database", String());
+    record.options.distinct = object.flag("distinct", false);
+    record.options.first = object.integer<std::int32_t>("first", 0);
+    record.options.description = object.text("description", String());
     Object last = object.object("lastKeys");
     record.lastKeys = {last.integer<std::int32_t>("table"), last.integer<std::int32_t>("column"),
                        last.integer<std::int32_t>("join"),
@@ -122,21 +125,20 @@ model::EndRecord Reader::end(Object object, const std::string& owner) {
     return end;
 }
 
-std::vector<model::NameRecord> Reader::names(Object& criterion) {
+std::vector<model::NameRecord> Reader::names(Object& owner) {
     std::vector<model::NameRecord> names;
-    each(criterion.listOrNone("names", limits::textLength), criterion.place() / "names",
-         [&](Object each) {
-             constexpr std::int64_t longest = limits::textLength;
-             model::NameRecord name;
-             name.begin = each.integer<std::int32_t>("at");
-             const auto length = each.integer<std::int32_t>("tableLength", 0);
-             if (length < 0 || length > longest)
-                 refuse<MessageCode::notALength>(each.place() / "tableLength");
-             name.tableEnd = std::min<std::int64_t>(name.begin, longest) + length;
-             name.table = each.textOrNull("table");
-             name.column = each.textOrNull("column");
-             names.push_back(std::move(name));
-         });
+    each(owner.listOrNone("names", limits::textLength), owner.place() / "names", [&](Object each) {
+        constexpr std::int64_t longest = limits::textLength;
+        model::NameRecord name;
+        name.begin = each.integer<std::int32_t>("at");
+        const auto length = each.integer<std::int32_t>("tableLength", 0);
+        if (length < 0 || length > longest)
+            refuse<MessageCode::notALength>(each.place() / "tableLength");
+        name.tableEnd = std::min<std::int64_t>(name.begin, longest) + length;
+        name.table = each.textOrNull("table");
+        name.column = each.textOrNull("column");
+        names.push_back(std::move(name));
+    });
     return names;
 }
 
@@ -148,6 +150,10 @@ void Reader::definition(Object object) {
     definition.sortOrder = object.word("sort", words::sortOrders, 0);
     definition.visible = object.flag("visible", true);
     definition.width = object.integer<std::int32_t>("width", 0);
+    definition.expression = object.text("expression", String());
+    definition.names = names(object);
+    definition.total = static_cast<model::Total>(object.word("total", words::totals, 0));
+    definition.sortPriority = object.integer<std::int16_t>("sortPriority", std::int16_t{0});
     const std::string key = platform::toUtf8(definition.key);
     each(object.listOrNone("criteria", INT16_MAX), object.place() / "criteria", [&](Object each) {
         const auto row = each.integer<std::int16_t>("row");

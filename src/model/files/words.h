@@ -16,4 +16,9 @@ inline constexpr std::array<std::string_view, 4> joinTypes = {"inner", "left", "
 inline constexpr std::array<std::string_view, 6> comparisons = {"=", "<>", "<", ">", "<=", ">="};
 inline constexpr std::array<std::string_view, 3> sortOrders = {"none", "ascending", "descending"};
 
+/// model::Total
+inline constexpr std::array<std::string_view, 9> totals = {
+    "none",    "group",    "count",   "count different", "sum",
+    "average", "smallest", "largest", "condition"};
+
 } // namespace zandor::files::words

@@ -74,6 +74,11 @@ json::Value Writer::file(const model::QueryRecord& record, const String& databas
                                           {"join", json::number(last.join)},
                                           {"definition", json::number(last.definition)}},
                                          "lastKeys")});
+    const model::QueryOptions& options = record.options;
+    if (options.distinct) members.push_back({"distinct", {true}});
+    if (options.first != 0) members.push_back({"first", json::number(options.first)});
+    if (!options.description.empty())
+        members.push_back({"description", textOf(options.description, Pointer() / "description")});
     members.push_back({"tables", {std::move(tables)}});
     members.push_back({"joins", {std::move(joins)}});
     members.push_back({"definitions", {std::move(definitions)}});
@@ -161,6 +166,15 @@ json::Value Writer::definition(const model::DefinitionRecord& definition,
                              {"sort", {word(words::sortOrders, definition.sortOrder)}},
                              {"visible", {definition.visible}}};
     if (definition.width != 0) members.push_back({"width", json::number(definition.width)});
+    if (!definition.expression.empty()) {
+        members.push_back({"expression", textOf(definition.expression, place / "expression")});
+        if (!definition.names.empty()) members.push_back({"names", names(definition.names)});
+    }
+    if (definition.total != model::Total::None)
+        members.push_back(
+            {"total", {word(words::totals, static_cast<std::int16_t>(definition.total))}});
+    if (definition.sortPriority != 0)
+        members.push_back({"sortPriority", json::number(definition.sortPriority)});
     members.push_back({"criteria", {std::move(criteria)}});
     return whole(std::move(members), key);
 }

@@ -39,6 +39,8 @@ public:
         lastKey("column", mRecord.lastKeys.column);
         lastKey("join", mRecord.lastKeys.join);
         lastKey("definition", mRecord.lastKeys.definition);
+        if (mRecord.options.first < 0 || mRecord.options.first > QueryOptions::greatestFirst)
+            fault<MessageCode::notInRange>("first", 0, QueryOptions::greatestFirst);
         for (std::size_t n = 0; n < mRecord.tables.size() && !mFault; ++n)
             table(mRecord.tables[n], at("tables", n));
         for (std::size_t n = 0; n < mRecord.joins.size() && !mFault; ++n)
@@ -114,6 +116,14 @@ private:
             fault<MessageCode::noSortOrder>(path + "sort");
         if (definition.width < 0 || definition.width > ColumnDefinition::greatestWidth)
             fault<MessageCode::notInRange>(path + "width", 0, ColumnDefinition::greatestWidth);
+        if (definition.sortPriority < 0 ||
+            definition.sortPriority > ColumnDefinition::greatestSortPriority)
+            fault<MessageCode::notInRange>(path + "sortPriority", 0,
+                                           ColumnDefinition::greatestSortPriority);
+        if (definition.total > lastTotal) fault<MessageCode::noTotal>(path + "total");
+        if (!definition.expression.empty() && !definition.column.empty())
+            fault<MessageCode::columnBesideExpression>(path + "column");
+        names(definition.names, definition.expression, path);
         std::int32_t before = Criteria::firstRow - 1;
         for (std::size_t n = 0; n < definition.criteria.size() && !mFault; ++n) {
             const std::int16_t row = definition.criteria[n].row;
@@ -123,17 +133,18 @@ private:
             else if (row <= before)
                 fault<MessageCode::rowOutOfOrder>(path + at("criteria", n) + "row");
             before = row;
-            names(definition.criteria[n], path + at("criteria", n));
+            names(definition.criteria[n].names, definition.criteria[n].text,
+                  path + at("criteria", n));
         }
     }
 
-    void names(const CriterionRecord& criterion, const std::string& path) {
+    void names(const std::vector<NameRecord>& names, const String& text, const std::string& path) {
         std::int32_t end = 0;
-        for (std::size_t n = 0; n < criterion.names.size() && !mFault; ++n) {
-            const NameRecord& name = criterion.names[n];
+        for (std::size_t n = 0; n < names.size() && !mFault; ++n) {
+            const NameRecord& name = names[n];
             const std::string place = path + at("names", n);
             const bool inOrder = name.begin >= end && name.tableEnd >= name.begin;
-            if (!inOrder || static_cast<std::size_t>(name.tableEnd) > criterion.text.size())
+            if (!inOrder || static_cast<std::size_t>(name.tableEnd) > text.size())
                 fault<MessageCode::placeOutOfOrder>(place + "at");
             end = name.tableEnd;
             if (name.table.empty() && name.column.empty()) continue;

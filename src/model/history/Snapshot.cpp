@@ -25,9 +25,12 @@ DefinitionState stateOf(Ref<ColumnDefinition> definition) {
                           definition->SortOrder(),
                           definition->Visible(),
                           definition->Width(),
-                          {}};
+                          {},
+                          definition->total(),
+                          definition->sortPriority(),
+                          definition->expression()};
     for (const auto& [row, criterium] : definition->criteria().rows())
-        state.criteria.push_back({row, criterium->Criterium(), criterium->references()});
+        state.criteria.push_back({row, criterium->tied()});
     return state;
 }
 
@@ -128,11 +131,16 @@ void Snapshot::List<State>::sort(std::vector<typename ListChange<State>::Pair>& 
 
 Change Snapshot::update(Query& query) {
     const auto revised = query.mLog->since(mMoment);
-    Change change{mLastKeys, query.lastKeys(), mTables.update(*query.mTables, revised),
+    Change change{mLastKeys,
+                  query.lastKeys(),
+                  mOptions,
+                  query.options(),
+                  mTables.update(*query.mTables, revised),
                   mJoins.update(query.mJoins, revised),
                   mDefinitions.update(query.mDefinitions, revised)};
     mMoment = query.mLog->now();
     mLastKeys = change.lastAfter;
+    mOptions = change.optionsAfter;
     return change;
 }
 

@@ -42,11 +42,13 @@ void apply(Items& items, const ListChange<State>& change, Set set) {
 } // namespace
 
 void Query::apply(const Change& change) {
-    if (!(change.lastBefore == lastKeys())) throw platform::errors::invalidProcedureCall();
+    if (change.lastBefore != lastKeys() || change.optionsBefore != options())
+        throw platform::errors::invalidProcedureCall();
     require(*mTables, change.tables);
     require(mJoins, change.joins);
     require(mDefinitions, change.definitions);
 
+    mOptions = change.optionsAfter;
     const auto put = [this](const auto& state) { set(state); };
     model::apply(*mTables, change.tables, put);
     model::apply(mJoins, change.joins, put);
@@ -82,10 +84,13 @@ void Query::set(const DefinitionState& state) {
     definition.mSortOrder = state.sortOrder;
     definition.mVisible = state.visible;
     definition.mWidth = state.width;
+    definition.mTotal = state.total;
+    definition.mSortPriority = state.sortPriority;
+    definition.mExpression = state.expression;
     definition.mCriteria.clear();
     for (const CriterionState& criterion : state.criteria) {
-        definition.mCriteria.Add(criterion.text, platform::decimal(criterion.row));
-        definition.mCriteria.rows().at(criterion.row)->tie(criterion.text, criterion.references);
+        definition.mCriteria.Add(criterion.text.text, platform::decimal(criterion.row));
+        definition.mCriteria.rows().at(criterion.row)->tie(criterion.text);
     }
 }
 

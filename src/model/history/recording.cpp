@@ -57,9 +57,14 @@ DefinitionRecord recordOf(const ColumnDefinition& definition) {
                             .sortOrder = definition.SortOrder(),
                             .visible = definition.Visible(),
                             .width = definition.Width(),
-                            .criteria = {}};
+                            .criteria = {},
+                            .total = definition.total(),
+                            .sortPriority = definition.sortPriority(),
+                            .expression = definition.expression().text,
+                            .names = recordOf(definition.expression().references)};
     for (const auto& [row, criterium] : definition.criteria().rows())
-        record.criteria.push_back({row, criterium->Criterium(), recordOf(criterium->references())});
+        record.criteria.push_back(
+            {row, criterium->Criterium(), recordOf(criterium->tied().references)});
     return record;
 }
 
@@ -68,6 +73,7 @@ DefinitionRecord recordOf(const ColumnDefinition& definition) {
 QueryRecord Query::record() const {
     QueryRecord record;
     record.lastKeys = lastKeys();
+    record.options = options();
     for (const auto& table : Each<ZDTable>(*mTables))
         record.tables.push_back(recordOf(static_cast<Table&>(*table)));
     for (const auto& join : Each<ZDJoin>(mJoins))
@@ -84,6 +90,7 @@ Ref<Query> Query::restored(const QueryRecord& record) {
     query->mLastColumn = record.lastKeys.column;
     query->mLastJoin = record.lastKeys.join;
     query->mLastDefinition = record.lastKeys.definition;
+    query->mOptions = record.options;
     for (const TableRecord& table : record.tables) query->restoreTable(table);
     for (const JoinRecord& from : record.joins) {
         const auto join = makeRef<Join>();
@@ -105,16 +112,16 @@ Ref<Query> Query::restored(const QueryRecord& record) {
         definition->mSortOrder = from.sortOrder;
         definition->mVisible = from.visible;
         definition->mWidth = from.width;
+        definition->mTotal = from.total;
+        definition->mSortPriority = from.sortPriority;
+        definition->mExpression = {from.expression, query->restored(from.names)};
         definition->mKey = from.key;
         for (const CriterionRecord& criterion : from.criteria) {
             definition->AddCriterium(criterion.text, platform::decimal(criterion.row));
-            criteria::References references;
-            for (const NameRecord& name : criterion.names)
-                references.push_back(
-                    {static_cast<std::size_t>(name.begin), static_cast<std::size_t>(name.tableEnd),
-                     name.column.empty() ? ColumnPlace()
-                                         : query->restoredEnd({name.table, name.column})});
-            definition->criteria().rows().at(criterion.row)->tie(criterion.text, references);
+            definition->criteria()
+                .rows()
+                .at(criterion.row)
+                ->tie({criterion.text, query->restored(criterion.names)});
         }
         query->mDefinitions.Add(definition);
     }
@@ -138,6 +145,15 @@ void Query::restoreTable(const TableRecord& record) {
     table->mHeight = record.height;
     table->mSelected = record.selected;
     mTables->Add(table);
+}
+
+criteria::References Query::restored(const std::vector<NameRecord>& names) const {
+    criteria::References references;
+    for (const NameRecord& name : names)
+        references.push_back(
+            {static_cast<std::size_t>(name.begin), static_cast<std::size_t>(name.tableEnd),
+             name.column.empty() ? ColumnPlace() : restoredEnd({name.table, name.column})});
+    return references;
 }
 
 // Also an end that reads as nothing is of this query, so that it can be set again.

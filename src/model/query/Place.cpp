@@ -1,5 +1,6 @@
 #include <Zandor/model/Place.h>
 
+#include <Zandor/model/OutputName.h>
 #include <Zandor/model/Table.h>
 
 namespace zandor::model {
@@ -40,6 +41,8 @@ ColumnPlace placeOf(const Ref<TalvikZandorLib::ZDColumn>& column) {
     if (const auto own = std::dynamic_pointer_cast<const Column>(column)) return own->place();
     if (const auto field = std::dynamic_pointer_cast<const FieldColumn>(column))
         return field->column().place();
+    if (const auto output = std::dynamic_pointer_cast<const OutputName>(column))
+        return output->place();
     throw platform::errors::invalidProcedureCall();
 }
 

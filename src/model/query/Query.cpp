@@ -3,6 +3,8 @@
 #include "model/criteria/QueryColumns.h"
 #include "model/criteria/Tying.h"
 
+#include <algorithm>
+
 namespace zandor::model {
 
 using platform::Each;
@@ -46,7 +48,10 @@ Ref<ZDJoin> Query::AddJoin(const Ref<ZDJoin>& join) {
 
 Ref<ZDColumnDefinition> Query::AddColumnDefinition(const Ref<ZDColumnDefinition>& definition) {
     const auto added = own<ColumnDefinition>(definition);
-    added->mPlace->require(mTables);
+    if (added->isExpression())
+        requireNames(*added);
+    else
+        added->mPlace->require(mTables);
     if (added->mKey.empty()) added->mKey = nextKey(u'x', mLastDefinition);
     mDefinitions.Add(added);
     // One that comes back may have missed that a table was renamed.
@@ -73,9 +78,19 @@ void Query::DeleteTable(const Ref<ZDTable>& table) {
         return join.left().table().key() == key || join.right().table().key() == key;
     });
     removeIf<ColumnDefinition>(mDefinitions, [&](const ColumnDefinition& definition) {
-        return definition.place().table().key() == key;
+        const auto& names = definition.expression().references;
+        return definition.place().table().key() == key ||
+               std::any_of(names.begin(), names.end(), [&](const criteria::Reference& name) {
+                   return name.column.table().key() == key;
+               });
     });
     mTables->Remove(key);
+}
+
+void Query::options(QueryOptions value) {
+    if (value.first < 0 || value.first > QueryOptions::greatestFirst)
+        throw platform::errors::invalidPropertyValue();
+    mOptions = std::move(value);
 }
 
 Ref<Table> Query::addTable(const TableDescription& source) {
@@ -108,7 +123,7 @@ void Query::renameTable(const Ref<Table>& table, const String& name) {
     tieCriteria();
     table->mName = name;
     for (const auto& definition : Each<ZDColumnDefinition>(mDefinitions))
-        criteria::followNames(static_cast<const ColumnDefinition&>(*definition));
+        criteria::followNames(static_cast<ColumnDefinition&>(*definition));
 }
 
 Ref<Table> Query::tableNamed(platform::StringView name) const {
@@ -118,12 +133,21 @@ Ref<Table> Query::tableNamed(platform::StringView name) const {
 void Query::tieCriteria() {
     const criteria::QueryColumns columns(*mTables);
     for (const auto& definition : Each<ZDColumnDefinition>(mDefinitions))
-        criteria::tie(static_cast<const ColumnDefinition&>(*definition), columns);
+        criteria::tie(static_cast<ColumnDefinition&>(*definition), columns);
 }
 
 String Query::nextKey(char16_t letter, std::int32_t& last) {
     if (last == INT32_MAX) throw platform::errors::overflow();
     return letter + platform::decimal(++last);
+}
+
+/// An expression has no column to be of this query by; once its names were tied they are.
+void Query::requireNames(ColumnDefinition& definition) {
+    const TablePlace home(mTables, {});
+    for (const criteria::Reference& name : definition.expression().references)
+        if (!name.column.empty() && !name.column.table().sameHome(home))
+            throw platform::errors::invalidProcedureCall();
+    definition.mPlace = ColumnPlace(home, {});
 }
 
 void Query::requireOwn(const Ref<ZDTable>& table) const {

@@ -1,8 +1,11 @@
 #include <Zandor/sql/Builder.h>
 
+#include "model/criteria/Output.h"
 #include "model/criteria/QueryColumns.h"
 #include "model/sql/JoinTrees.h"
 #include "model/sql/NameCheck.h"
+#include "model/sql/Simplify.h"
+#include "model/sql/Totals.h"
 
 #include <Zandor/model/Names.h>
 
@@ -24,21 +27,32 @@ public:
         }
         JoinTrees trees = joinTrees(mQuery, mBuilt.findings);
         mStatement.from = std::move(trees.trees);
-        for (std::int32_t i = 1; i <= mQuery.ColumnDefinitions().Count(); ++i)
-            add(dynamic_cast<ColumnDefinition&>(*mQuery.ColumnDefinitions().Item(i)));
+        const auto definitions = each();
+        mGrouped = std::any_of(definitions.begin(), definitions.end(), [](const auto& definition) {
+            return aggregates(definition->total()) || definition->total() == Total::Group;
+        });
+        for (const auto& definition : definitions) add(*definition);
         if (mStatement.items.empty()) selectEverything();
         reportDuplicates();
-
-        std::vector<Node> rows;
-        for (auto& [row, terms] : mRows) rows.push_back(allOf(std::move(terms)));
-        std::vector<Node> where = std::move(trees.conditions);
-        if (Node criteria = anyOf(std::move(rows))) where.push_back(std::move(criteria));
-        mStatement.where = allOf(std::move(where));
+        order();
+        mStatement.where = allOf(std::move(trees.conditions));
+        place(mRows, mStatement, mBuilt.findings);
+        mStatement.where = simplified(mStatement.where);
+        mStatement.having = simplified(mStatement.having);
+        takeOptions();
         mBuilt.statement = std::move(mStatement);
         return std::move(mBuilt);
     }
 
 private:
+    std::vector<Ref<const ColumnDefinition>> each() const {
+        std::vector<Ref<const ColumnDefinition>> all;
+        for (const auto& item :
+             platform::Each<TalvikZandorLib::ZDColumnDefinition>(mQuery.ColumnDefinitions()))
+            all.push_back(std::dynamic_pointer_cast<const ColumnDefinition>(item));
+        return all;
+    }
+
     void report(Finding::Kind kind, const ColumnDefinition& definition, Message message,
                 std::int16_t row = 0, std::size_t position = 0) {
         Finding finding{kind, std::move(message)};
@@ -49,30 +63,91 @@ private:
     }
 
     void add(const ColumnDefinition& definition) {
+        criteria::Output output = criteria::outputOf(definition, mColumns);
+        if (output.reading.error) {
+            reportExpression(definition, *output.reading.error);
+            return;
+        }
         const Ref<Column> column = definition.place().column();
-        if (!column) {
+        if (!column && !output.value) {
             report(Finding::Kind::definitionWithoutColumn, definition,
                    say<MessageCode::definitionWithoutColumn>());
             return;
         }
-        const Ref<Table> table = definition.place().table().table();
-        if (table->isAllColumns(*column)) {
-            addAll(definition, table->Name());
+        if (!output.subject.node) {
+            addAll(definition, definition.place().table().table()->Name());
             return;
         }
-        const ColumnRef reference = criteria::columnRef(*column, *table);
-        if (definition.Visible()) {
-            mStatement.items.push_back({reference, definition.Synonym()});
-            mNames.push_back({&definition, definition.Synonym().empty() ? column->Name()
-                                                                        : definition.Synonym()});
+        const Total total = definition.total();
+        const auto refusal = output.value
+                                 ? refusalOf(total, typeOf(*output.value), output.subject.name)
+                                 : std::nullopt;
+        if (refusal) {
+            report(Finding::Kind::badTotal, definition, *refusal);
+            return;
         }
-        if (definition.SortOrder() != 0)
-            mStatement.order.push_back({reference, definition.SortOrder() == 2});
+        if (mGrouped && !aggregates(total) && total != Total::Condition) group(output.subject);
+        if (definition.Visible() && total != Total::Condition) addItem(definition, output.subject);
+        addSort(definition, output.subject);
         for (const auto& [row, criterium] : definition.criteria().rows())
-            addCriterion(definition, reference, row, *criterium);
+            addCriterion(definition, output.subject, row, criterium->tied());
+    }
+
+    /// Rows are put together by it; what is said twice is one node.
+    void group(criteria::Subject& subject) {
+        for (const Node& known : mStatement.group) {
+            if (!same(known, subject.node)) continue;
+            subject.node = known;
+            return;
+        }
+        mStatement.group.push_back(subject.node);
+    }
+
+    void addItem(const ColumnDefinition& definition, const criteria::Subject& subject) {
+        String name = definition.Synonym();
+        const auto* column = std::get_if<ColumnRef>(&subject.node->node);
+        if (name.empty() && !column) name = subject.name;
+        mNames.push_back({&definition, name.empty() ? column->column : name});
+        mStatement.items.push_back({subject.node, std::move(name)});
+    }
+
+    void addSort(const ColumnDefinition& definition, const criteria::Subject& subject) {
+        if (definition.SortOrder() == 0) return;
+        if (mGrouped && definition.total() == Total::Condition) {
+            report(Finding::Kind::sortNotOutput, definition,
+                   say<MessageCode::sortOfCondition>(subject.name));
+            return;
+        }
+        if (mQuery.options().distinct && !definition.Visible()) {
+            report(Finding::Kind::sortNotOutput, definition,
+                   say<MessageCode::sortNotOutput>(subject.name));
+            return;
+        }
+        const std::int16_t priority = definition.sortPriority();
+        mOrder[priority == 0 ? ColumnDefinition::greatestSortPriority + 1 : priority].push_back(
+            {subject.node, definition.SortOrder() == 2});
+    }
+
+    void order() {
+        for (auto& [priority, items] : mOrder)
+            mStatement.order.insert(mStatement.order.end(), items.begin(), items.end());
+    }
+
+    void takeOptions() {
+        const QueryOptions& options = mQuery.options();
+        mStatement.distinct = options.distinct;
+        if (options.first == 0) return;
+        mStatement.limit = options.first;
+        if (!mStatement.order.empty()) return;
+        mBuilt.findings.push_back(
+            {Finding::Kind::firstUnsorted, say<MessageCode::firstUnsorted>(options.first)});
     }
 
     void addAll(const ColumnDefinition& definition, const String& table) {
+        if (mGrouped || definition.total() != Total::None) {
+            report(Finding::Kind::badTotal, definition, say<MessageCode::totalOfAllColumns>(table));
+            return;
+        }
         if (definition.Visible()) mStatement.items.push_back({AllColumns{table}, {}});
         if (definition.SortOrder() != 0)
             report(Finding::Kind::sortOnAllColumns, definition,
@@ -83,22 +158,38 @@ private:
                        say<MessageCode::criterionOnAllColumns>(table), row);
     }
 
-    void addCriterion(const ColumnDefinition& definition, const ColumnRef& subject,
-                      std::int16_t row, const RowCriterium& criterium) {
-        auto reading =
-            criteria::read(criterium.Criterium(), subject, mColumns, criterium.references());
+    void reportExpression(const ColumnDefinition& definition, criteria::Error& found) {
+        const String& name =
+            definition.Synonym().empty() ? definition.expression().text : definition.Synonym();
+        report(Finding::Kind::badExpression, definition,
+               say<MessageCode::badCriterion>(name, found.position + 1, std::move(found.message)),
+               0, found.position);
+    }
+
+    void addCriterion(const ColumnDefinition& definition, const criteria::Subject& subject,
+                      std::int16_t row, const criteria::TiedText& tied) {
+        auto reading = criteria::read(tied.text, subject, mColumns, tied.references);
         const auto reportAt = [&](Finding::Kind kind, criteria::Error& found) {
             report(kind, definition,
-                   say<MessageCode::badCriterion>(subject.table + u"." + subject.column,
-                                                  found.position + 1, std::move(found.message)),
+                   say<MessageCode::badCriterion>(subject.name, found.position + 1,
+                                                  std::move(found.message)),
                    row, found.position);
         };
         if (reading.error) reportAt(Finding::Kind::badCriterion, *reading.error);
         if (reading.warning) reportAt(Finding::Kind::patternWithoutLike, *reading.warning);
-        if (reading.condition) mRows[row].push_back(std::move(reading.condition));
+        if (!reading.condition) return;
+        const Total total = definition.total();
+        RowTerms& terms = mRows[row];
+        auto& place = aggregates(total)                       ? terms.ofTotals
+                      : mGrouped && total == Total::Condition ? terms.ofConditions
+                                                              : terms.ofGroups;
+        place.push_back({std::move(reading.condition), &definition, row});
     }
 
     void selectEverything() {
+        // Where rows are put together, all of them is what they are put together by.
+        for (const Node& node : mStatement.group) mStatement.items.push_back({node, {}});
+        if (mGrouped) return;
         for (std::int32_t i = 1; i <= mQuery.Tables().Count(); ++i)
             mStatement.items.push_back({AllColumns{mQuery.Tables().Item(i)->Name()}, {}});
     }
@@ -119,7 +210,9 @@ private:
     Built mBuilt;
     Statement mStatement;
     std::vector<std::pair<const ColumnDefinition*, String>> mNames;
-    std::map<std::int16_t, std::vector<Node>> mRows;
+    std::map<std::int16_t, RowTerms> mRows;
+    std::map<int, std::vector<OrderItem>> mOrder; ///< by priority
+    bool mGrouped = false;                        ///< rows are put together
 };
 
 } // namespace
@@ -131,7 +224,7 @@ Text statementText(Query& query, Dialect dialect, ValueForm form,
     Built built = build(query);
     Text result{{}, {}, std::move(built.findings)};
     if (!built.statement) return result;
-    built.statement->limit = limit;
+    if (limit) built.statement->limit = std::min(*limit, built.statement->limit.value_or(*limit));
     Findings names = uncarriedNames(query, dialect);
     if (!names.empty()) {
         result.findings.insert(result.findings.end(), names.begin(), names.end());

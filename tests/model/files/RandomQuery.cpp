@@ -103,6 +103,9 @@ private:
         definition->Synonym(text());
         definition->SortOrder(static_cast<std::int16_t>(upTo(2)));
         definition->Visible(chance(80));
+        if (chance(30)) definition->total(static_cast<model::Total>(upTo(8)));
+        if (chance(20)) definition->sortPriority(static_cast<std::int16_t>(upTo(255)));
+        if (chance(20)) definition->expression(u"Coalesce(t1.c, [t2].[c], " + text() + u")");
         if (chance(40)) definition->Width(upTo(model::ColumnDefinition::greatestWidth));
         mQuery->AddColumnDefinition(definition);
         for (int n = upTo(3); n > 0; --n) {
@@ -112,6 +115,7 @@ private:
     }
 
     void change() {
+        if (chance(30)) mQuery->options({chance(50), upTo(1000), text()});
         const auto definition = any<model::ColumnDefinition>(mQuery->ColumnDefinitions());
         if (!definition) return;
         // The tables that are gone already are what makes an object read as nothing.

@@ -4,10 +4,32 @@ using namespace zandor;
 
 TEST(AFileOfVersion1, IsTheQueryThatItsVersion2Is) {
     const auto old = documentOf(contentOf(testFile("version-1.json")));
-    const auto current = documentOf(contentOf(testFile("version-2.json")));
-    EXPECT_EQ(old.query->record(), current.query->record());
+    const auto next = documentOf(contentOf(testFile("version-2.json")));
+    EXPECT_EQ(old.query->record(), next.query->record());
     // What version 1 did not know is kept over the step as well.
-    EXPECT_EQ(jsonOf(old), contentOf(testFile("version-2.json")));
+    EXPECT_EQ(jsonOf(old), jsonOf(next));
+}
+
+TEST(AFileOfVersion2, IsWrittenWithNothingButAnotherVersion) {
+    std::string text = contentOf(testFile("version-2.json"));
+    const std::string written = jsonOf(documentOf(text));
+    const std::string version = "\"version\": 2";
+    text.replace(text.find(version), version.size(), "\"version\": 3");
+    EXPECT_EQ(written, text);
+}
+
+TEST(AFileOfVersion3, HasTotalsExpressionsAndWhatIsSaidOfTheQuery) {
+    const auto query = documentOf(contentOf(testFile("version-3.json"))).query;
+    EXPECT_TRUE(query->options().distinct);
+    EXPECT_EQ(query->options().first, 10);
+    EXPECT_EQ(query->options().description, u"What customers have ordered");
+    const auto definition = [&](std::int32_t position) {
+        return query->ColumnDefinitions().Item(position)->Column()->Name();
+    };
+    EXPECT_EQ(definition(2), u"different(orders.id)");
+    EXPECT_EQ(definition(3), u"largest(Upper(customers.name))");
+    query->renameTable(query->tableNamed(u"customers"), u"people");
+    EXPECT_EQ(definition(3), u"largest(Upper(people.name))");
 }
 
 TEST(AFileOfVersion1, IsGivenTheLastKeysOfWhatIsThere) {
@@ -26,7 +48,7 @@ TEST(AFileOfVersion1, IsRefusedWithACodeThatIsNone) {
 }
 
 TEST(AFileOfTheCurrentVersion, IsWrittenAsItWasRead) {
-    const std::string text = contentOf(testFile("version-2.json"));
+    const std::string text = contentOf(testFile("version-3.json"));
     EXPECT_NE(text.find("\"version\": " + std::to_string(files::currentVersion)),
               std::string::npos);
     EXPECT_EQ(jsonOf(documentOf(text)), text);

@@ -150,6 +150,11 @@ std::string nameOf(model::Finding::Kind kind) {
     case Kind::ambiguousOuterJoin: return "ambiguousOuterJoin";
     case Kind::badCriterion: return "badCriterion";
     case Kind::nameNotCarried: return "nameNotCarried";
+    case Kind::badExpression: return "badExpression";
+    case Kind::badTotal: return "badTotal";
+    case Kind::criterionNotPlaced: return "criterionNotPlaced";
+    case Kind::sortNotOutput: return "sortNotOutput";
+    case Kind::firstUnsorted: return "firstUnsorted";
     case Kind::notInDialect: break;
     }
     return "notInDialect";

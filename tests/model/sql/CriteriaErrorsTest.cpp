@@ -122,7 +122,7 @@ TEST_F(ABadCriterion, NamesAColumnThatSeveralTablesHave) {
 TEST_F(ABadCriterion, HasACharacterThatNoTextCarries) {
     using namespace std::string_literals;
     const std::string half = "half a character stands here, type it afresh";
-    expectError(u"text", u"a\0b"s, 1, "the character zero cannot stand in a criterion");
+    expectError(u"text", u"a\0b"s, 1, "the character zero cannot stand here");
     expectError(u"text", u"'a\xD83D'"s, 2, half);
     expectError(u"text", u"\xDE00"s, 0, half);
     expectError(u"text", u"😀\xD83D"s, 2, half);
@@ -132,7 +132,7 @@ TEST_F(ABadCriterion, HasACharacterThatNoTextCarries) {
 TEST_F(ABadCriterion, IsTooLong) {
     const platform::String longest(10000, u'a');
     EXPECT_FALSE(read(u"text", longest).error);
-    expectError(u"text", longest + u"a", 10000, "a criterion has at most 10000 characters");
+    expectError(u"text", longest + u"a", 10000, "at most 10000 characters can stand here");
 }
 
 TEST_F(ABadCriterion, IsNestedTooDeep) {

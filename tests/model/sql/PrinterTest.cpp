@@ -136,7 +136,7 @@ TEST(ThePrinter, PagesEachDialectsWay) {
     EXPECT_EQ(behind(page, Dialect::SqlServer),
               "ORDER BY (SELECT NULL)\nOFFSET 20 ROWS\nFETCH NEXT 10 ROWS ONLY");
     EXPECT_EQ(behind(page, Dialect::Standard), "OFFSET 20 ROWS\nFETCH NEXT 10 ROWS ONLY");
-    page.order.push_back({{u"t", u"a", ColumnType::Integer}, true});
+    page.order.push_back({make(ColumnRef{u"t", u"a", ColumnType::Integer}), true});
     EXPECT_EQ(behind(page, Dialect::SqlServer),
               "ORDER BY t.a DESC\nOFFSET 20 ROWS\nFETCH NEXT 10 ROWS ONLY");
 }

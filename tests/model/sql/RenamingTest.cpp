@@ -60,7 +60,7 @@ TEST_F(CriteriaThatNameTables, FollowARenamedTableInEveryWayOfWriting) {
     query->renameTable(b, u"c");
     EXPECT_EQ(text(definition), "c.id Or [c].[id] Or c.[id] Or [c].id And > [weight] Or 7")
         << "in brackets where there were some";
-    EXPECT_EQ(where(), "a.id = c.id\n    OR a.id = c.id\n    OR a.id = c.id\n"
+    EXPECT_EQ(where(), "a.id = c.id\n"
                        "    OR (a.id = c.id AND a.id > c.weight)\n    OR a.id = 7");
 }
 

@@ -4,6 +4,7 @@
 #include <Zandor/model/ColumnDefinition.h>
 #include <Zandor/model/Description.h>
 #include <Zandor/model/Join.h>
+#include <Zandor/model/QueryOptions.h>
 #include <Zandor/model/Record.h>
 #include <Zandor/model/Table.h>
 #include <Zandor/model/export.h>
@@ -19,7 +20,7 @@ namespace zandor::model {
 class ZANDOR_MODEL_EXPORT Query final : public TalvikZandorLib::Zandor,
                                         public TalvikZandorLib::OrderedDefinitions {
 public:
-    Query() = default;
+    Query() { mRevision.enter(mLog); }
     Query(const Query&) = delete;
     Query& operator=(const Query&) = delete;
 
@@ -36,7 +37,7 @@ public:
     /// one is of another query or deleted, error 457 when the join is in the query already. A join
     /// that was removed from this query comes back under its old key. Nothing changes on an error.
     Ref<TalvikZandorLib::ZDJoin> AddJoin(const Ref<TalvikZandorLib::ZDJoin>& join) override;
-    /// The same rules for the definition's column.
+    /// The same rules for the definition's column; one that is an expression needs none.
     Ref<TalvikZandorLib::ZDColumnDefinition>
     AddColumnDefinition(const Ref<TalvikZandorLib::ZDColumnDefinition>& definition) override;
     /// Both must be definitions of this query: error 91 when the first is nothing, error 5 for one
@@ -44,8 +45,8 @@ public:
     /// columns, and the order of its sorting, follow.
     void StandsBehind(const Ref<TalvikZandorLib::ZDColumnDefinition>& definition,
                       const Ref<TalvikZandorLib::ZDColumnDefinition>& predecessor) override;
-    /// Takes the joins and definitions that hang on the table along; criteria of others that name
-    /// it name nothing from then on. Error 91 for nothing, error 5
+    /// Takes the joins and definitions that hang on the table along, also the expressions that name
+    /// it; criteria of others that name it name nothing from then on. Error 91 for nothing, error 5
     /// for a table that does not stand in this query.
     void DeleteTable(const Ref<TalvikZandorLib::ZDTable>& table) override;
 
@@ -59,6 +60,11 @@ public:
     void renameTable(const Ref<Table>& table, const String& name);
     /// The table of a name as databases compare names, or nothing.
     Ref<Table> tableNamed(platform::StringView name) const;
+
+    /// What is said of the query as a whole.
+    const QueryOptions& options() const { return *mOptions; }
+    /// Error 380 when `first` is outside its range; nothing changes then.
+    void options(QueryOptions value);
 
     /// Everything that the query is. Ends and columns that read as nothing are recorded as none.
     QueryRecord record() const;
@@ -81,16 +87,20 @@ private:
     void set(const DefinitionState& state);
     void restoreTable(const TableRecord& record);
     ColumnPlace restoredEnd(const EndRecord& record) const;
+    criteria::References restored(const std::vector<NameRecord>& names) const;
     /// Error 6 when there are no more numbers.
     String nextKey(char16_t letter, std::int32_t& last);
     /// Before the tables change, so that no criterion slips from one table to another.
     void tieCriteria();
+    void requireNames(ColumnDefinition& definition);
     void requireOwn(const Ref<TalvikZandorLib::ZDTable>& table) const;
 
     // Shared with the objects, which may be held longer than the query.
     const std::shared_ptr<ChangeLog> mLog = std::make_shared<ChangeLog>();
     // Shared so that joins and definitions can tell whether the query is still there.
     const std::shared_ptr<model::Tables> mTables = std::make_shared<model::Tables>(mLog);
+    Revision mRevision;
+    Revised<QueryOptions> mOptions{mRevision};
     Items<Join, TalvikZandorLib::ZDJoin> mJoins{mLog};
     Items<ColumnDefinition, TalvikZandorLib::ZDColumnDefinition> mDefinitions{mLog};
     std::int32_t mLastTable = 0;

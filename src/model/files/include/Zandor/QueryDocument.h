@@ -33,7 +33,7 @@ struct ZANDOR_FILES_EXPORT QueryDocument {
 };
 
 /// The version that is written; older ones are read.
-inline constexpr int currentVersion = 2;
+inline constexpr int currentVersion = 3;
 
 /// The document as JSON. Refused when a text in the query has half a character (an unpaired
 /// surrogate) or the query goes beyond the limits of a file: what is written can be read again,

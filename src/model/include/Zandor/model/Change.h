@@ -35,9 +35,8 @@ struct JoinState {
 
 /// The criterion of one row.
 struct CriterionState {
-    std::int16_t row = 0;                 ///< of the grid
-    String text = {};                     ///< as it was typed
-    criteria::References references = {}; ///< what its names are tied to
+    std::int16_t row = 0;         ///< of the grid
+    criteria::TiedText text = {}; ///< with what its names are tied to
 
     friend bool operator==(const CriterionState&, const CriterionState&) = default;
 };
@@ -51,6 +50,9 @@ struct DefinitionState {
     bool visible = true;                       ///< as ZDColumnDefinition::Visible
     std::int32_t width = 0;                    ///< as SizedDefinition::Width
     std::vector<CriterionState> criteria = {}; ///< in the order of their rows
+    Total total = Total::None;                 ///< as ColumnDefinition::total
+    std::int16_t sortPriority = 0;             ///< as ColumnDefinition::sortPriority
+    criteria::TiedText expression = {};        ///< as ColumnDefinition::expression
 
     friend bool operator==(const DefinitionState&, const DefinitionState&) = default;
 };
@@ -87,17 +89,21 @@ struct ListChange {
 struct Change {
     LastKeys lastBefore = {};                     ///< at the earlier moment
     LastKeys lastAfter = {};                      ///< at the later one
+    QueryOptions optionsBefore = {};              ///< at the earlier moment
+    QueryOptions optionsAfter = {};               ///< at the later one
     ListChange<TableState> tables = {};           ///< of the tables
     ListChange<JoinState> joins = {};             ///< of the joins
     ListChange<DefinitionState> definitions = {}; ///< of the output columns
 
     /// Whether nothing is different.
     bool empty() const {
-        return lastBefore == lastAfter && tables.empty() && joins.empty() && definitions.empty();
+        return lastBefore == lastAfter && optionsBefore == optionsAfter && tables.empty() &&
+               joins.empty() && definitions.empty();
     }
     /// The way back.
     Change reversed() const {
-        return {lastAfter, lastBefore, tables.reversed(), joins.reversed(), definitions.reversed()};
+        return {lastAfter,         lastBefore,       optionsAfter,          optionsBefore,
+                tables.reversed(), joins.reversed(), definitions.reversed()};
     }
 };
 

@@ -15,23 +15,19 @@ class ZANDOR_MODEL_EXPORT RowCriterium final : public TalvikZandorLib::ZDCriteri
 public:
     /// `revision` is that of the definition, raised also after the criterium was removed from it.
     explicit RowCriterium(std::shared_ptr<Revision> revision, String text = {})
-        : mRevision(std::move(revision)), mText(*mRevision, std::move(text)) {}
-    String Criterium() const override { return mText; }
+        : mRevision(std::move(revision)), mTied(*mRevision, {std::move(text), {}}) {}
+    String Criterium() const override { return mTied->text; }
     /// The names in a new text mean what they name when the query is next read or changed.
-    void Criterium(const String& value) override { tie(value, {}); }
+    void Criterium(const String& value) override { tie({value, {}}); }
 
-    /// What names in the text are tied to already.
-    const criteria::References& references() const { return mReferences; }
+    /// The text and what names in it are tied to already.
+    const criteria::TiedText& tied() const { return *mTied; }
     /// The text with the places of its names.
-    void tie(String text, criteria::References references) {
-        mText = std::move(text);
-        mReferences = std::move(references);
-    }
+    void tie(criteria::TiedText text) { mTied = std::move(text); }
 
 private:
     const std::shared_ptr<Revision> mRevision;
-    Revised<String> mText;
-    Revised<criteria::References> mReferences{*mRevision};
+    Revised<criteria::TiedText> mTied;
 };
 
 /// The criteria of one definition by grid row, 4 to 32767. Keys are rows in decimal: "4", "5".

@@ -30,6 +30,8 @@ public:
     bool empty() const { return mKey.empty(); }
     /// Empty when no table was ever named.
     const String& key() const { return mKey; }
+    /// The same tables, and none of them.
+    TablePlace nowhere() const { return {mHome, {}}; }
     /// Whether both are of one query.
     bool sameHome(const TablePlace& other) const;
     /// Whether it names one of these tables, there or deleted.

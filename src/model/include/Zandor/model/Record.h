@@ -2,6 +2,8 @@
 
 #include <Zandor/model/Description.h>
 #include <Zandor/model/Messages.h>
+#include <Zandor/model/QueryOptions.h>
+#include <Zandor/model/Total.h>
 #include <Zandor/model/export.h>
 
 #include <cstdint>
@@ -86,6 +88,10 @@ struct DefinitionRecord {
     bool visible = true;        ///< as ZDColumnDefinition::Visible
     std::int32_t width = 0;     ///< as SizedDefinition::Width
     std::vector<CriterionRecord> criteria = {}; ///< in the order of their rows
+    Total total = Total::None;                  ///< as ColumnDefinition::total
+    std::int16_t sortPriority = 0;              ///< as ColumnDefinition::sortPriority
+    String expression = {};                     ///< as it was typed; then there is no column
+    std::vector<NameRecord> names = {};         ///< of the expression, as those of a criterion
 
     friend bool operator==(const DefinitionRecord&, const DefinitionRecord&) = default;
 };
@@ -103,6 +109,7 @@ struct LastKeys {
 /// A whole query.
 struct QueryRecord {
     LastKeys lastKeys = {};                         ///< none of the keys below has a greater number
+    QueryOptions options = {};                      ///< as Query::options
     std::vector<TableRecord> tables = {};           ///< in the order of the query
     std::vector<JoinRecord> joins = {};             ///< in the order of the query
     std::vector<DefinitionRecord> definitions = {}; ///< in the order of the query

@@ -23,4 +23,12 @@ struct Reference {
 /// In the order of the text.
 using References = std::vector<Reference>;
 
+/// A criterion or an expression as it was typed, with what its names were found to be so far.
+struct TiedText {
+    String text = {};           ///< as it was typed
+    References references = {}; ///< of its names
+
+    friend bool operator==(const TiedText&, const TiedText&) = default;
+};
+
 } // namespace zandor::model::criteria

@@ -44,6 +44,7 @@ private:
 
     ChangeLog::Moment mMoment = 0;
     LastKeys mLastKeys;
+    QueryOptions mOptions;
     List<TableState> mTables;
     List<JoinState> mJoins;
     List<DefinitionState> mDefinitions;

@@ -1,14 +1,15 @@
 #pragma once
 
 #include <Zandor/model/Description.h>
+#include <Zandor/model/Total.h>
 #include <Zandor/model/export.h>
 
 #include <memory>
 #include <variant>
 #include <vector>
 
-/// The tree of a condition. It holds no SQL text: names and values are data, and a printer writes
-/// them in a dialect, with the parentheses that they need.
+/// The tree of a condition or of a value. It holds no SQL text: names and values are data, and a
+/// printer writes them in a dialect, with the parentheses that they need.
 namespace zandor::model::sql {
 
 struct Expression;
@@ -97,9 +98,74 @@ struct Or {
     std::vector<Node> terms; ///< two or more
 };
 
+/// What joins two values into a third.
+enum class Operator { add, subtract, multiply, divide, concatenate };
+
+/// Two values by an operator. A division is one of fractions, and by 0 it gives nothing.
+struct Operation {
+    Operator symbol; ///< the operator
+    Node left;       ///< before it
+    Node right;      ///< behind it
+    ColumnType type; ///< of the result
+};
+
+/// A number with the other sign.
+struct Negative {
+    Node operand; ///< the number
+};
+
+/// What can be asked of values; the three last have no name of their own in an expression.
+enum class Function {
+    round,        ///< a number to whole ones, or to decimals: a Value from 0 to 15
+    abs,          ///< a number without its sign
+    length,       ///< of a text, in characters
+    upper,        ///< a text in capital letters
+    lower,        ///< a text in small letters
+    trim,         ///< a text without blanks at its ends
+    left,         ///< the first characters of a text
+    right,        ///< its last characters
+    mid,          ///< those from one on, counted from 1; so many of them or all
+    coalesce,     ///< the first of its arguments that is there
+    year,         ///< of a date
+    month,        ///< of a date
+    day,          ///< of a date, in its month
+    dateDiff,     ///< days from the first date to the second
+    today,        ///< the date
+    now,          ///< the date and time
+    text,         ///< anything as text
+    number,       ///< a text as number
+    date,         ///< a text or moment as date
+    moment,       ///< a date as its first moment
+    addDays,      ///< a date and a number of days
+    addDaysLater, ///< a moment and a number of days
+};
+
+/// What a function makes of its arguments.
+struct Call {
+    Function function;           ///< the function
+    std::vector<Node> arguments; ///< as many as it takes
+    ColumnType type;             ///< of the result
+};
+
+/// One value where a condition holds, another where it does not.
+struct Choice {
+    Node condition;  ///< what decides
+    Node then;       ///< where it holds
+    Node otherwise;  ///< elsewhere; nothing: no value
+    ColumnType type; ///< of both
+};
+
+/// What is made of the values of the rows that are put together.
+struct Aggregate {
+    Total total;     ///< one that aggregates
+    Node operand;    ///< the values; nothing: the rows themselves are counted
+    ColumnType type; ///< of the result
+};
+
 /// One node of the tree.
 struct Expression {
-    std::variant<ColumnRef, Value, Parameter, Compare, Like, Between, In, IsNull, Not, And, Or>
+    std::variant<ColumnRef, Value, Parameter, Compare, Like, Between, In, IsNull, Not, And, Or,
+                 Operation, Negative, Call, Choice, Aggregate>
         node; ///< what it is
 };
 
@@ -113,5 +179,17 @@ Node make(Part part) {
 /// the same kind themselves are taken apart. Nothing for no terms.
 ZANDOR_MODEL_EXPORT Node allOf(std::vector<Node> terms);
 ZANDOR_MODEL_EXPORT Node anyOf(std::vector<Node> terms); ///< as allOf, under one Or
+
+/// What a node's values are; Boolean for a condition.
+ZANDOR_MODEL_EXPORT ColumnType typeOf(const Expression& expression);
+
+/// Whether it is made by a comparison or by And, Or and Not, and is no value of a table or row.
+ZANDOR_MODEL_EXPORT bool isCondition(const Expression& expression);
+
+/// Whether two nodes say the same.
+ZANDOR_MODEL_EXPORT bool same(const Node& left, const Node& right);
+
+/// The nodes right below one, in the order in which they are written; none is nothing.
+ZANDOR_MODEL_EXPORT std::vector<Node> partsOf(const Expression& expression);
 
 } // namespace zandor::model::sql

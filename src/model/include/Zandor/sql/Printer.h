@@ -19,8 +19,9 @@ struct Printed {
 
 /// Why a dialect cannot say a statement.
 struct Refusal {
-    /// What it is that cannot be said: a name, a kind of join, or so large a statement.
-    enum class Reason { name, join, size };
+    /// What it is that cannot be said: a name, a kind of join, so large a statement, or an
+    /// expression.
+    enum class Reason { name, join, size, expression };
 
     Reason reason;   ///< what cannot be said
     Message message; ///< the same in words

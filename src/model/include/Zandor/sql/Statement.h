@@ -13,8 +13,8 @@ struct AllColumns {
 
 /// One column of the rows, or all of a table.
 struct SelectItem {
-    std::variant<AllColumns, ColumnRef> what; ///< what comes out
-    String name;                              ///< under which the column comes out; empty: its own
+    std::variant<AllColumns, Node> what; ///< what comes out
+    String name;                         ///< under which the column comes out; empty: its own
 };
 
 /// A table of the database in the statement.
@@ -46,15 +46,18 @@ struct Source {
 
 /// A column that sorts.
 struct OrderItem {
-    ColumnRef column;        ///< by its values
+    Node value;              ///< what it sorts by
     bool descending = false; ///< the greatest first
 };
 
 /// A SELECT statement.
 struct Statement {
+    bool distinct = false;         ///< rows that are equal come out once
     std::vector<SelectItem> items; ///< never empty
     std::vector<SourceNode> from;  ///< more than one: every row of one with every row of the other
     Node where;                    ///< nothing: all rows
+    std::vector<Node> group;       ///< rows that are equal in these are put together
+    Node having;                   ///< a condition on what was put together; nothing: all of it
     std::vector<OrderItem> order;  ///< the first sorts first
     std::optional<std::int64_t> limit; ///< of rows; nothing: all
     std::int64_t offset = 0;           ///< rows left out before the first

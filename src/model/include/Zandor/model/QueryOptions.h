@@ -1,0 +1,21 @@
+#pragma once
+
+#include <Zandor/platform/String.h>
+
+#include <cstdint>
+
+namespace zandor::model {
+
+/// What is said of a query as a whole.
+struct QueryOptions {
+    /// The most rows that can be asked for.
+    static constexpr std::int32_t greatestFirst = 1'000'000'000;
+
+    bool distinct = false;             ///< rows that are equal come out once
+    std::int32_t first = 0;            ///< no more rows than these, 0 to greatestFirst; 0: all
+    platform::String description = {}; ///< for people
+
+    friend bool operator==(const QueryOptions&, const QueryOptions&) = default;
+};
+
+} // namespace zandor::model

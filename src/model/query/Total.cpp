@@ -1,0 +1,20 @@
+#include <Zandor/model/Total.h>
+
+namespace zandor::model {
+
+platform::StringView wordOf(Total total) {
+    switch (total) {
+    case Total::None: break;
+    case Total::Group: return u"group";
+    case Total::Count: return u"count";
+    case Total::CountDifferent: return u"different";
+    case Total::Sum: return u"sum";
+    case Total::Average: return u"average";
+    case Total::Smallest: return u"smallest";
+    case Total::Largest: return u"largest";
+    case Total::Condition: return u"condition";
+    }
+    return {};
+}
+
+} // namespace zandor::model

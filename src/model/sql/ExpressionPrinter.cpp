@@ -1,0 +1,371 @@
+#include "model/sql/ExpressionPrinter.h"
+
+#include "model/criteria/Literals.h"
+#include "model/criteria/Tokens.h"
+#include "model/sql/Templates.h"
+
+namespace zandor::model::sql {
+
+namespace {
+
+StringView symbolOf(Comparison comparison) {
+    switch (comparison) {
+    case Comparison::equal: return u" = ";
+    case Comparison::notEqual: return u" <> ";
+    case Comparison::less: return u" < ";
+    case Comparison::greater: return u" > ";
+    case Comparison::lessEqual: return u" <= ";
+    case Comparison::greaterEqual: break;
+    }
+    return u" >= ";
+}
+
+bool isZero(StringView number) {
+    return number.find_first_of(u"123456789") >= number.find_first_of(u"eE");
+}
+
+} // namespace
+
+void Output::name(StringView name) {
+    if (const auto why = cannotCarry(name, dialect)) throw Refusal{Refusal::Reason::name, *why};
+    text += identifier(name, dialect);
+}
+
+void Output::column(const ColumnRef& column) {
+    name(column.table);
+    text += u'.';
+    name(column.column);
+}
+
+void ExpressionPrinter::any(const Expression& expression, Tightness around) {
+    const bool outer = mWritesOut;
+    mWritesOut = outer || mWrittenOut.contains(&expression);
+    std::visit([&](const auto& part) { write(part, around); }, expression.node);
+    mWritesOut = outer;
+}
+
+void ExpressionPrinter::condition(const Expression& expression, Tightness around) {
+    // SQL Server has bits, and conditions, and takes none for the other.
+    const bool bit = mOut.dialect == Dialect::SqlServer && !isCondition(expression);
+    any(expression, bit ? Tightness::joined : around);
+    if (bit) mOut.text += u" = 1";
+}
+
+void ExpressionPrinter::value(const Expression& expression, Tightness around) {
+    if (mOut.dialect != Dialect::SqlServer || !isCondition(expression)) {
+        any(expression, around);
+        return;
+    }
+    mOut.text += u"CASE WHEN ";
+    any(expression, Tightness::disjunction);
+    mOut.text += u" THEN 1 WHEN NOT (";
+    any(expression, Tightness::disjunction);
+    mOut.text += u") THEN 0 END";
+}
+
+void ExpressionPrinter::terms(const Expression& expression, StringView lineBreak,
+                              Tightness around) {
+    if (const auto* all = std::get_if<And>(&expression.node))
+        joined(all->terms, u"AND ", lineBreak, Tightness::conjunction);
+    else if (const auto* any = std::get_if<Or>(&expression.node))
+        joined(any->terms, u"OR ", lineBreak, Tightness::predicate);
+    else
+        condition(expression, around);
+}
+
+void ExpressionPrinter::joined(const std::vector<Node>& parts, StringView word,
+                               StringView lineBreak, Tightness inner) {
+    bool first = true;
+    for (const auto& part : parts) {
+        if (!first) {
+            mOut.text += lineBreak;
+            mOut.text += word;
+        }
+        first = false;
+        condition(*part, inner);
+    }
+}
+
+void ExpressionPrinter::parenthesised(const std::vector<Node>& parts, StringView word,
+                                      Tightness inner, bool parentheses) {
+    if (parentheses) mOut.text += u'(';
+    joined(parts, word, u" ", inner);
+    if (parentheses) mOut.text += u')';
+}
+
+void ExpressionPrinter::write(const ColumnRef& reference, Tightness) { mOut.column(reference); }
+
+void ExpressionPrinter::write(const Value& value, Tightness) {
+    if (mOut.form == ValueForm::literal || mWritesOut) {
+        mOut.text += literal(value, mOut.dialect);
+        return;
+    }
+    mOut.text += placeholder(value.type, mOut.dialect);
+    mOut.bindings.push_back(value);
+}
+
+/// For showing, a parameter is shown by its name.
+void ExpressionPrinter::write(const Parameter& parameter, Tightness) {
+    if (mWritesOut)
+        throw Refusal{Refusal::Reason::expression,
+                      say<MessageCode::parameterInGroup>(parameter.name)};
+    mOut.bindings.push_back(parameter);
+    if (mOut.form == ValueForm::bound) {
+        // What the user will answer may be a fraction even where the column holds whole
+        // numbers.
+        const bool whole = parameter.type == ColumnType::Integer;
+        mOut.text += placeholder(whole ? ColumnType::Decimal : parameter.type, mOut.dialect);
+        return;
+    }
+    mOut.text += u':';
+    mOut.text += criteria::isBareName(parameter.name)
+                     ? parameter.name
+                     : identifier(parameter.name, Dialect::Standard);
+}
+
+void ExpressionPrinter::write(const Compare& compare, Tightness around) {
+    const bool within = around > Tightness::predicate;
+    if (within) mOut.text += u'(';
+    value(*compare.left, Tightness::joined);
+    mOut.text += symbolOf(compare.comparison);
+    value(*compare.right, Tightness::joined);
+    if (within) mOut.text += u')';
+}
+
+void ExpressionPrinter::write(const Like& like, Tightness around) {
+    const bool within = around > Tightness::predicate;
+    if (within) mOut.text += u'(';
+    likeOperand(*like.operand);
+    mOut.text += like.negated ? u" NOT" : u"";
+    // The other engines' Like takes no notice of case.
+    mOut.text += mOut.dialect == Dialect::PostgreSQL ? u" ILIKE " : u" LIKE ";
+    bool escapes = true;
+    if (const auto* value = std::get_if<Value>(&like.pattern->node)) {
+        const String pattern = likePattern(value->text, mOut.dialect);
+        write(Value{ColumnType::Text, pattern}, Tightness::factor);
+        escapes = pattern.find(u'\\') != String::npos;
+    } else {
+        write(std::get<Parameter>(like.pattern->node), Tightness::factor);
+    }
+    const bool byDefault = mOut.dialect == Dialect::PostgreSQL || mOut.dialect == Dialect::MySQL;
+    if (escapes && !byDefault) mOut.text += u" ESCAPE '\\'";
+    if (within) mOut.text += u')';
+}
+
+/// PostgreSQL matches nothing but text, and what type the column has may be unknown here.
+void ExpressionPrinter::likeOperand(const Expression& operand) {
+    const auto* reference = std::get_if<ColumnRef>(&operand.node);
+    const bool cast =
+        mOut.dialect == Dialect::PostgreSQL && reference && reference->type == ColumnType::Unknown;
+    if (cast) mOut.text += u"CAST(";
+    value(operand, Tightness::joined);
+    if (cast) mOut.text += u" AS text)";
+}
+
+void ExpressionPrinter::write(const Between& between, Tightness around) {
+    const bool within = around > Tightness::predicate;
+    if (within) mOut.text += u'(';
+    value(*between.operand, Tightness::joined);
+    mOut.text += between.negated ? u" NOT BETWEEN " : u" BETWEEN ";
+    value(*between.low, Tightness::joined);
+    mOut.text += u" AND ";
+    value(*between.high, Tightness::joined);
+    if (within) mOut.text += u')';
+}
+
+void ExpressionPrinter::write(const In& in, Tightness around) {
+    const bool within = around > Tightness::predicate;
+    if (within) mOut.text += u'(';
+    value(*in.operand, Tightness::joined);
+    mOut.text += in.negated ? u" NOT IN (" : u" IN (";
+    const char16_t* separator = u"";
+    for (const auto& item : in.list) {
+        mOut.text += separator;
+        value(*item, Tightness::joined);
+        separator = u", ";
+    }
+    mOut.text += within ? u"))" : u")";
+}
+
+void ExpressionPrinter::write(const IsNull& isNull, Tightness around) {
+    const bool within = around > Tightness::predicate;
+    if (within) mOut.text += u'(';
+    value(*isNull.operand, Tightness::joined);
+    mOut.text += isNull.negated ? u" IS NOT NULL" : u" IS NULL";
+    if (within) mOut.text += u')';
+}
+
+void ExpressionPrinter::write(const Not& inverse, Tightness around) {
+    const bool within = around > Tightness::predicate;
+    mOut.text += within ? u"(NOT (" : u"NOT (";
+    condition(*inverse.operand, Tightness::disjunction);
+    mOut.text += within ? u"))" : u")";
+}
+
+void ExpressionPrinter::write(const And& all, Tightness around) {
+    parenthesised(all.terms, u"AND ", Tightness::conjunction, around > Tightness::conjunction);
+}
+
+void ExpressionPrinter::write(const Or& any, Tightness around) {
+    // An And within an Or needs no parentheses; people who read it do.
+    parenthesised(any.terms, u"OR ", Tightness::predicate, around > Tightness::disjunction);
+}
+
+void ExpressionPrinter::write(const Operation& operation, Tightness around) {
+    if (operation.symbol == Operator::concatenate) {
+        concatenate(operation, around);
+        return;
+    }
+    const bool sum = operation.symbol == Operator::add || operation.symbol == Operator::subtract;
+    const Tightness own = sum ? Tightness::sum : Tightness::product;
+    const bool within = around > own;
+    if (within) mOut.text += u'(';
+    if (operation.symbol == Operator::divide) {
+        divide(operation);
+    } else {
+        value(*operation.left, own);
+        mOut.text += operation.symbol == Operator::add        ? u" + "
+                     : operation.symbol == Operator::subtract ? u" - "
+                                                              : u" * ";
+        value(*operation.right, sum ? Tightness::product : Tightness::factor);
+    }
+    if (within) mOut.text += u')';
+}
+
+/// Whole numbers are divided as fractions, and by 0 into nothing, as SQLite and MySQL have it.
+void ExpressionPrinter::divide(const Operation& operation) {
+    const bool mysql = mOut.dialect == Dialect::MySQL;
+    if (!mysql) mOut.text += u"CAST(";
+    value(*operation.left, mysql ? Tightness::product : Tightness::disjunction);
+    switch (mOut.dialect) {
+    case Dialect::SQLite: mOut.text += u" AS REAL)"; break;
+    case Dialect::MySQL: mOut.text += u" * 1e0"; break;
+    case Dialect::SqlServer: mOut.text += u" AS float)"; break;
+    case Dialect::PostgreSQL:
+    case Dialect::Standard: mOut.text += u" AS double precision)"; break;
+    }
+    mOut.text += u" / ";
+    const auto* number = std::get_if<Value>(&operation.right->node);
+    const bool guarded =
+        !mysql && mOut.dialect != Dialect::SQLite && !(number && !isZero(number->text));
+    if (guarded) mOut.text += u"NULLIF(";
+    value(*operation.right, guarded ? Tightness::disjunction : Tightness::factor);
+    if (guarded) mOut.text += u", 0)";
+}
+
+/// Engines differ in how tightly they join texts, so the parts stand in parentheses of their own.
+void ExpressionPrinter::concatenate(const Operation& operation, Tightness around) {
+    const bool call = mOut.dialect == Dialect::MySQL;
+    const bool within = !call && around > Tightness::joined;
+    if (call) mOut.text += u"CONCAT";
+    if (call || within) mOut.text += u'(';
+    value(*operation.left, call ? Tightness::joined : Tightness::factor);
+    mOut.text += call ? u", " : mOut.dialect == Dialect::SqlServer ? u" + " : u" || ";
+    value(*operation.right, call ? Tightness::joined : Tightness::factor);
+    if (call || within) mOut.text += u')';
+}
+
+void ExpressionPrinter::write(const Negative& negative, Tightness around) {
+    const bool within = around > Tightness::product;
+    // Two signs beside each other would begin a comment.
+    mOut.text += within ? u"(-(" : u"-(";
+    value(*negative.operand, Tightness::disjunction);
+    mOut.text += within ? u"))" : u")";
+}
+
+void ExpressionPrinter::write(const Call& call, Tightness) {
+    StringView form = templateOf(call.function, call.arguments.size(), mOut.dialect);
+    if (form.empty())
+        throw Refusal{
+            Refusal::Reason::expression,
+            say<MessageCode::noSuchFunction>(nameOf(call.function), nameOf(mOut.dialect))};
+    while (!form.empty()) {
+        const std::size_t open = std::min(form.find(u'{'), form.size());
+        mOut.text += form.substr(0, open);
+        form.remove_prefix(open);
+        if (form.empty()) break;
+        const std::size_t close = form.find(u'}');
+        piece(call, form.substr(1, close - 1));
+        form.remove_prefix(close + 1);
+    }
+}
+
+void ExpressionPrinter::piece(const Call& call, StringView piece) {
+    if (piece == u"*") {
+        const char16_t* separator = u"";
+        for (const Node& argument : call.arguments) {
+            mOut.text += separator;
+            value(*argument, Tightness::disjunction);
+            separator = u", ";
+        }
+        return;
+    }
+    const Expression& argument = *call.arguments[static_cast<std::size_t>(piece[0] - u'1')];
+    const StringView kind = piece.size() > 2 ? piece.substr(2) : StringView();
+    if (kind.empty()) {
+        value(argument, Tightness::factor);
+    } else if (kind == u"digits") {
+        mOut.text += std::get<Value>(argument.node).text;
+    } else if (kind == u"moment") {
+        const bool cast = typeOf(argument) == ColumnType::Unknown;
+        if (cast) mOut.text += u"CAST(";
+        value(argument, Tightness::joined);
+        if (cast) mOut.text += u" AS timestamp)";
+    } else {
+        clamped(argument, kind);
+    }
+}
+
+/// What is less than a number that a function takes stands for that number.
+void ExpressionPrinter::clamped(const Expression& number, StringView least) {
+    if (const auto* whole = std::get_if<Value>(&number.node)) {
+        const bool below = whole->text.front() == u'-' || (least == u"1" && whole->text == u"0");
+        // A number of digits only.
+        mOut.text += below ? String(least) : whole->text;
+        return;
+    }
+    const bool cast = mOut.dialect == Dialect::PostgreSQL;
+    mOut.text += cast ? u"CAST(CASE WHEN " : u"CASE WHEN ";
+    value(number, Tightness::joined);
+    mOut.text += u" < " + String(least) + u" THEN " + String(least) + u" ELSE ";
+    value(number, Tightness::joined);
+    mOut.text += cast ? u" END AS integer)" : u" END";
+}
+
+void ExpressionPrinter::write(const Choice& choice, Tightness) {
+    mOut.text += u"CASE WHEN ";
+    condition(*choice.condition, Tightness::disjunction);
+    mOut.text += u" THEN ";
+    value(*choice.then, Tightness::disjunction);
+    if (choice.otherwise) {
+        mOut.text += u" ELSE ";
+        value(*choice.otherwise, Tightness::disjunction);
+    }
+    mOut.text += u" END";
+}
+
+void ExpressionPrinter::write(const Aggregate& aggregate, Tightness) {
+    switch (aggregate.total) {
+    case Total::Count: mOut.text += u"COUNT("; break;
+    case Total::CountDifferent: mOut.text += u"COUNT(DISTINCT "; break;
+    case Total::Sum: mOut.text += u"SUM("; break;
+    case Total::Average: mOut.text += u"AVG("; break;
+    case Total::Smallest: mOut.text += u"MIN("; break;
+    default: mOut.text += u"MAX("; break;
+    }
+    // The average of whole numbers is none.
+    const bool average = aggregate.total == Total::Average;
+    const bool cast = average && mOut.dialect == Dialect::SqlServer;
+    const bool scaled = average && mOut.dialect == Dialect::MySQL;
+    if (!aggregate.operand) {
+        mOut.text += u'*';
+    } else {
+        if (cast) mOut.text += u"CAST(";
+        value(*aggregate.operand, scaled ? Tightness::product : Tightness::disjunction);
+        if (cast) mOut.text += u" AS float)";
+        if (scaled) mOut.text += u" * 1e0";
+    }
+    mOut.text += u')';
+}
+
+} // namespace zandor::model::sql

@@ -1,0 +1,74 @@
+#pragma once
+
+#include <Zandor/sql/Printer.h>
+
+#include <unordered_set>
+
+namespace zandor::model::sql {
+
+/// How tightly a part holds together; one that holds more loosely than its surroundings is put in
+/// parentheses.
+enum class Tightness { disjunction, conjunction, predicate, joined, sum, product, factor };
+
+/// What a dialect makes of a statement, written piece by piece.
+struct Output {
+    Dialect dialect;
+    ValueForm form;
+    String text{};
+    std::vector<Binding> bindings{};
+
+    /// A name in the dialect's quotes. Throws a Refusal where it cannot carry it.
+    void name(StringView name);
+    void column(const ColumnRef& column);
+};
+
+/// Writes conditions and values.
+class ExpressionPrinter {
+public:
+    explicit ExpressionPrinter(Output& output) : mOut(output) {}
+
+    /// What is here is written with its values in it, so that an engine sees that it stands in
+    /// several places.
+    void writeOut(const std::vector<Node>& nodes) {
+        for (const Node& node : nodes) mWrittenOut.insert(node.get());
+    }
+
+    void condition(const Expression& expression, Tightness around);
+    void value(const Expression& expression, Tightness around);
+    /// The terms of a top-level And or Or, a line each; anything else on one line.
+    void terms(const Expression& expression, StringView lineBreak, Tightness around);
+
+private:
+    void joined(const std::vector<Node>& parts, StringView word, StringView lineBreak,
+                Tightness inner);
+    void parenthesised(const std::vector<Node>& parts, StringView word, Tightness inner,
+                       bool parentheses);
+    void any(const Expression& expression, Tightness around);
+    void write(const ColumnRef& reference, Tightness around);
+    void write(const Value& value, Tightness around);
+    void write(const Parameter& parameter, Tightness around);
+    void write(const Compare& compare, Tightness around);
+    void write(const Like& like, Tightness around);
+    void likeOperand(const Expression& operand);
+    void write(const Between& between, Tightness around);
+    void write(const In& in, Tightness around);
+    void write(const IsNull& isNull, Tightness around);
+    void write(const Not& inverse, Tightness around);
+    void write(const And& all, Tightness around);
+    void write(const Or& any, Tightness around);
+    void write(const Operation& operation, Tightness around);
+    void divide(const Operation& operation);
+    void concatenate(const Operation& operation, Tightness around);
+    void write(const Negative& negative, Tightness around);
+    void write(const Call& call, Tightness around);
+    void piece(const Call& call, StringView piece);
+    void clamped(const Expression& number, StringView least);
+    void write(const Choice& choice, Tightness around);
+    void write(const Aggregate& aggregate, Tightness around);
+
+    Output& mOut;
+    std::unordered_set<const Expression*> mWrittenOut;
+    bool mWritesOut = false;
+};
+
+} // namespace zandor::model::sql
