@@ -9,14 +9,20 @@ namespace {
 
 QtMessageHandler previousHandler = nullptr;
 
-/// Off screen there is no desktop session to speak of; Qt need not remark on that.
+/// Off screen there is no desktop session to speak of, and what a statement failed for is told by
+/// the statement; Qt need not remark on either.
 void leaveOutRemarks(QtMsgType type, const QMessageLogContext& context, const QString& text) {
     const bool remark = text.startsWith(QLatin1String("QStandardPaths: XDG_RUNTIME_DIR")) ||
-                        text.startsWith(QLatin1String("This plugin does not support"));
+                        text.startsWith(QLatin1String("This plugin does not support")) ||
+                        text.startsWith(QLatin1String("QODBCResult::"));
     if (!remark) previousHandler(type, context, text);
 }
 
 } // namespace
+
+void keepRemarksQuiet() {
+    if (!previousHandler) previousHandler = qInstallMessageHandler(leaveOutRemarks);
+}
 
 std::unique_ptr<QApplication> makeApplication(int& argc, char** argv, bool offscreen) {
     const bool decided = qEnvironmentVariableIsSet("QT_QPA_PLATFORM");
@@ -31,7 +37,7 @@ std::unique_ptr<QApplication> makeApplication(int& argc, char** argv, bool offsc
         QLoggingCategory::setFilterRules(
             QStringLiteral("qt.qpa.plugin=false\nqt.qpa.xcb=false\nqt.qpa.wayland=false"));
     }
-    if (!previousHandler) previousHandler = qInstallMessageHandler(leaveOutRemarks);
+    keepRemarksQuiet();
     // Where the settings and what is kept safe stand.
     QCoreApplication::setOrganizationName(QStringLiteral("Zandor"));
     QCoreApplication::setApplicationName(QStringLiteral("zandor-designer"));

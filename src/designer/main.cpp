@@ -69,6 +69,7 @@ int main(int argc, char** argv) {
         return designer::shell::print(designer::versionText().toLocal8Bit());
 
     if (designer::asksForTask(given)) {
+        designer::keepRemarksQuiet();
         const QCoreApplication application(argc, argv);
         const auto arguments = designer::readArguments(argumentsOf(argc, argv));
         return arguments ? designer::shell::perform(*arguments->task) : refuse(arguments.error());

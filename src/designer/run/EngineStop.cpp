@@ -1,5 +1,7 @@
 #include "designer/run/EngineStop.h"
 
+#include <Zandor/reader/dialectOf.h>
+
 #include <QSqlDriver>
 #include <QSqlQuery>
 
@@ -16,8 +18,9 @@ constexpr std::chrono::milliseconds betweenLooks(50);
 
 /// What stops a statement of this connection when said over another, or nothing.
 QString killing(const QSqlDatabase& database) {
-    const bool postgres = database.driverName() == QLatin1String("QPSQL");
-    if (!postgres && database.driverName() != QLatin1String("QMYSQL")) return {};
+    const auto dialect = reader::dialectOf(database);
+    const bool postgres = dialect == model::sql::Dialect::PostgreSQL;
+    if (!postgres && dialect != model::sql::Dialect::MySQL) return {};
     QSqlQuery query(database);
     query.setForwardOnly(true);
     const bool told = query.exec(postgres ? QStringLiteral("SELECT pg_backend_pid()")

@@ -2,6 +2,7 @@
 
 #include "model/reader/sortByName.h"
 
+#include <Zandor/reader/dialectOf.h>
 #include <Zandor/reader/rows.h>
 
 #include <QSqlDriver>
@@ -92,12 +93,13 @@ std::unique_ptr<DatabaseReader> makeGenericReader(const QSqlDatabase& database) 
 }
 
 std::unique_ptr<DatabaseReader> makeReader(const QSqlDatabase& database) {
-    // By the driver and not by the engine: behind ODBC a statement's parameters are another matter.
-    const QString driver = database.driverName();
-    if (driver == QStringLiteral("QSQLITE")) return makeSqliteReader(database);
-    if (driver == QStringLiteral("QPSQL")) return makePostgresReader(database);
-    if (driver == QStringLiteral("QMYSQL")) return makeMysqlReader(database);
-    return makeGenericReader(database);
+    using model::sql::Dialect;
+    switch (dialectOf(database)) {
+    case Dialect::SQLite: return makeSqliteReader(database);
+    case Dialect::PostgreSQL: return makePostgresReader(database);
+    case Dialect::MySQL: return makeMysqlReader(database);
+    default: return makeGenericReader(database);
+    }
 }
 
 } // namespace zandor::reader

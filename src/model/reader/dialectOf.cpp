@@ -1,13 +1,32 @@
 #include <Zandor/reader/dialectOf.h>
 
+#include <QSqlDriver>
+#include <QSqlQuery>
+
 namespace zandor::reader {
 
-model::sql::Dialect dialectOf(const QSqlDatabase& database) {
-    using model::sql::Dialect;
-    const QString driver = database.driverName();
-    if (driver == QLatin1String("QPSQL")) return Dialect::PostgreSQL;
-    if (driver == QLatin1String("QMYSQL")) return Dialect::MySQL;
-    return driver == QLatin1String("QSQLITE") ? Dialect::SQLite : Dialect::Standard;
+using model::sql::Dialect;
+
+namespace {
+
+/// What only one engine understands, for those that the driver of ODBC does not know by name.
+constexpr std::pair<const char*, Dialect> ownWords[] = {
+    {"SELECT sqlite_version()", Dialect::SQLite}, {"SELECT CONNECTION_ID()", Dialect::MySQL}};
+
+} // namespace
+
+Dialect dialectOf(const QSqlDatabase& database) {
+    switch (database.driver()->dbmsType()) {
+    case QSqlDriver::SQLite: return Dialect::SQLite;
+    case QSqlDriver::PostgreSQL: return Dialect::PostgreSQL;
+    case QSqlDriver::MySqlServer: return Dialect::MySQL;
+    case QSqlDriver::MSSqlServer: return Dialect::SqlServer;
+    default: break;
+    }
+    if (database.driverName() == QLatin1String("QODBC"))
+        for (const auto& [words, dialect] : ownWords)
+            if (QSqlQuery(database).exec(QLatin1String(words))) return dialect;
+    return Dialect::Standard;
 }
 
 } // namespace zandor::reader

@@ -2,6 +2,7 @@
 
 #include "model/reader/serverError.h"
 
+#include <Zandor/reader/dialectOf.h>
 #include <Zandor/reader/rows.h>
 
 #include <QSqlQuery>
@@ -12,6 +13,7 @@
 #include <algorithm>
 #include <array>
 #include <span>
+#include <vector>
 
 namespace zandor::reader {
 
@@ -38,11 +40,21 @@ constexpr Option mysqlOptions[] = {{"sslrootcert", "SSL_CA"},
                                    {"connect_timeout", "MYSQL_OPT_CONNECT_TIMEOUT"}};
 constexpr Option odbcOptions[] = {{"connect_timeout", "SQL_ATTR_LOGIN_TIMEOUT"}};
 
-// Make the session one that cannot write, and that reads what the dialect writes.
-constexpr const char* postgresBegin[] = {"SET default_transaction_read_only = on"};
-constexpr const char* mysqlBegin[] = {
-    "SET SESSION TRANSACTION READ ONLY",
-    "SET SESSION sql_mode = REPLACE(@@SESSION.sql_mode, 'NO_BACKSLASH_ESCAPES', '')"};
+/// What makes a session one that cannot write, and that reads what the dialect writes. Behind ODBC
+/// drivers take no notice of being told to read only, so the engine is told.
+std::vector<const char*> beginOf(model::sql::Dialect dialect) {
+    using model::sql::Dialect;
+    switch (dialect) {
+    case Dialect::SQLite: return {"PRAGMA query_only = 1"};
+    case Dialect::PostgreSQL: return {"SET default_transaction_read_only = on"};
+    case Dialect::MySQL:
+        return {"SET SESSION TRANSACTION READ ONLY",
+                "SET SESSION sql_mode = REPLACE(@@SESSION.sql_mode, 'NO_BACKSLASH_ESCAPES', '')"};
+    case Dialect::SqlServer: // has no such session
+    case Dialect::Standard: break;
+    }
+    return {};
+}
 
 struct Engine {
     const char* scheme;
@@ -50,15 +62,14 @@ struct Engine {
     const char* name;
     const char* package; ///< of Debian, with the driver
     std::span<const Option> options;
-    std::span<const char* const> begin;
 };
 
 constexpr std::array<Engine, 5> engines = {{
-    {"postgresql", "QPSQL", "PostgreSQL", "libqt6sql6-psql", postgresOptions, postgresBegin},
-    {"postgres", "QPSQL", "PostgreSQL", "libqt6sql6-psql", postgresOptions, postgresBegin},
-    {"mysql", "QMYSQL", "MySQL", "libqt6sql6-mysql", mysqlOptions, mysqlBegin},
-    {"mariadb", "QMYSQL", "MariaDB", "libqt6sql6-mysql", mysqlOptions, mysqlBegin},
-    {"odbc", "QODBC", "ODBC", "libqt6sql6-odbc", odbcOptions, {}},
+    {"postgresql", "QPSQL", "PostgreSQL", "libqt6sql6-psql", postgresOptions},
+    {"postgres", "QPSQL", "PostgreSQL", "libqt6sql6-psql", postgresOptions},
+    {"mysql", "QMYSQL", "MySQL", "libqt6sql6-mysql", mysqlOptions},
+    {"mariadb", "QMYSQL", "MariaDB", "libqt6sql6-mysql", mysqlOptions},
+    {"odbc", "QODBC", "ODBC", "libqt6sql6-odbc", odbcOptions},
 }};
 
 const platform::String example = u"postgresql://user@host:5432/database";
@@ -122,7 +133,7 @@ Result<Connection> openServer(const Engine& engine, const QUrl& url, const QStri
     const auto opening = say<MessageCode::databaseNotOpened>(
         url.toDisplayString(QUrl::RemoveQuery).simplified().toStdU16String());
     if (!database.open()) return serverError(opening, database.lastError());
-    for (const char* begin : engine.begin) {
+    for (const char* begin : beginOf(dialectOf(database))) {
         QSqlQuery statement(database);
         if (!statement.exec(QLatin1String(begin)))
             return serverError(opening, statement.lastError());

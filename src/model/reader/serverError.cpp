@@ -20,7 +20,7 @@ struct Advice {
 constexpr const char* deniedDatabase = "' to database '";
 
 /// An engine that was not reached, or turns one away, gives no code but only its words.
-constexpr std::array<Advice, 16> byWords = {{
+constexpr std::array<Advice, 17> byWords = {{
     {"no password supplied", say<MessageCode::givePassword>},
     {"password authentication failed", say<MessageCode::checkPassword>},
     {deniedDatabase, say<MessageCode::askAdministrator>},
@@ -36,6 +36,7 @@ constexpr std::array<Advice, 16> byWords = {{
     {"Unknown database", say<MessageCode::checkDatabase>},
     {"ermission denied", say<MessageCode::askOwner>},
     {"role \"", say<MessageCode::checkUser>},
+    {"Data source name not found", say<MessageCode::checkSource>},
     {"database \"", say<MessageCode::checkDatabase>},
 }};
 

@@ -2,12 +2,14 @@
 #include "Program.h"
 #include "designer/run/Queries.h"
 #include "model/reader/OneServer.h"
+#include "support/OdbcSources.h"
 
 #include <gmock/gmock.h>
 
 #include <QDeadlineTimer>
 #include <QThread>
 
+#include <algorithm>
 #include <csignal>
 
 using namespace zandor;
@@ -107,4 +109,20 @@ TEST_F(InAShellOnPostgres, TakesThePasswordFromWhereItIsHidden) {
         runProgram({"--run", query, "--database", address.replace("secret", "s3cr3t")});
     EXPECT_EQ(wrong.code, 2);
     EXPECT_EQ(wrong.err.find("s3cr3t"), std::string::npos) << wrong.err;
+}
+
+TEST_F(InAShellOnPostgres, SaysInOneLineWhatWasRefusedBehindOdbc) {
+    const QString driver = QStringLiteral("psqlodbcw.so");
+    if (const auto missing = OdbcSources::missing(driver, QStringLiteral("odbc-postgresql")))
+        GTEST_SKIP() << missing->toStdString();
+    OdbcSources sources;
+    const QString source = sources.add(driver, {"Servername=" + oneServer.server().folder(),
+                                                "Database=postgres", "Username=postgres"});
+    runOnServer({"CREATE TABLE \"Brief\" (n int)"});
+    const QString address = "odbc://" + source;
+    const QString query = saved(draw(address, {"Brief"}, {{"Brief.n", {"< 5"}}}), address);
+    EXPECT_EQ(runProgram({"--run", query}).out, "n\r\n");
+    runOnServer({"DROP TABLE \"Brief\""});
+    const Ended refused = runProgram({"--run", query});
+    EXPECT_EQ(std::count(refused.err.begin(), refused.err.end(), '\n'), 1) << refused.err;
 }

@@ -43,6 +43,9 @@ ZANDOR_READER_EXPORT Result<Connection> openSqlite(const QString& path);
 /// MySQL; sslmode and application_name of PostgreSQL; and host, the folder of PostgreSQL's socket or
 /// the socket of MySQL's server, which takes the place of the host. The password is `password`, or
 /// that of the address when it is empty; no message shows it. Needs a QCoreApplication.
+///
+/// Behind ODBC an engine that is none of the others can write when a view calls a function that
+/// does; its data source should have a user who may only read.
 ZANDOR_READER_EXPORT Result<Connection> openDatabase(const QString& address,
                                                      const QString& password = {});
 

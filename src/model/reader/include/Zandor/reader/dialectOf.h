@@ -7,7 +7,8 @@
 
 namespace zandor::reader {
 
-/// The dialect that the engine of an open database reads.
+/// The dialect that the engine of an open database reads. Behind ODBC the engine is asked which one
+/// it is.
 ZANDOR_READER_EXPORT model::sql::Dialect dialectOf(const QSqlDatabase& database);
 
 } // namespace zandor::reader
