@@ -36,14 +36,16 @@ QString nameOf(const JoinState& state) {
 }
 
 QString nameOf(const DefinitionState& state) {
-    const auto column = state.column.column();
-    return column ? shown(column->Name()) : shown(state.synonym);
+    if (const auto column = state.column.column()) return shown(column->Name());
+    return shown(state.synonym.empty() ? state.expression.text : state.synonym);
 }
 
-/// The same but for where names in criteria lead: this shows once a table is renamed or deleted.
+/// The same but for where names in texts lead: this shows once a table is renamed or deleted.
 bool alike(DefinitionState before, DefinitionState after) {
-    for (auto* state : {&before, &after})
-        for (auto& criterion : state->criteria) criterion.references.clear();
+    for (auto* state : {&before, &after}) {
+        for (auto& criterion : state->criteria) criterion.text.references.clear();
+        state->expression.references.clear();
+    }
     return before == after;
 }
 
@@ -68,6 +70,7 @@ private:
     static QString definitions(const model::ListChange<DefinitionState>& change,
                                const Pairs<DefinitionState>& changed);
     static QString definition(const DefinitionState& before, const DefinitionState& after);
+    static QString options(const model::QueryOptions& before, const model::QueryOptions& after);
 };
 
 QString StepName::of(const Change& change) {
@@ -81,9 +84,11 @@ QString StepName::of(const Change& change) {
     const QString ofJoins = joins(change.joins);
     const QString ofDefinitions = definitions(change.definitions, definitionsChanged);
     const QString ofPlaces = tables(change.tables.changed);
-    const auto several = ofJoins.isEmpty() + ofDefinitions.isEmpty() + ofPlaces.isEmpty() < 2;
-    if (several) return tr("Change the query");
-    return ofJoins + ofDefinitions + ofPlaces;
+    const QString ofOptions = options(change.optionsBefore, change.optionsAfter);
+    const auto none =
+        ofJoins.isEmpty() + ofDefinitions.isEmpty() + ofPlaces.isEmpty() + ofOptions.isEmpty();
+    if (none < 3) return tr("Change the query");
+    return ofJoins + ofDefinitions + ofPlaces + ofOptions;
 }
 
 QString StepName::tables(const Change& change) {
@@ -157,11 +162,22 @@ QString StepName::definition(const DefinitionState& before, const DefinitionStat
     const QString name = nameOf(after);
     if (but(&DefinitionState::criteria)) return tr("Change criterion of %1").arg(name);
     if (but(&DefinitionState::synonym)) return tr("Rename column %1").arg(name);
-    if (but(&DefinitionState::sortOrder)) return tr("Change sorting by %1").arg(name);
+    if (but(&DefinitionState::total)) return tr("Change total of %1").arg(name);
+    if (but(&DefinitionState::expression, &DefinitionState::column))
+        return tr("Change field of %1").arg(name);
+    if (but(&DefinitionState::sortOrder) || but(&DefinitionState::sortPriority))
+        return tr("Change sorting by %1").arg(name);
     if (but(&DefinitionState::visible))
         return (after.visible ? tr("Show column %1") : tr("Hide column %1")).arg(name);
     if (but(&DefinitionState::width)) return tr("Resize column %1").arg(name);
     return tr("Change column %1").arg(name);
+}
+
+QString StepName::options(const model::QueryOptions& before, const model::QueryOptions& after) {
+    if (before == after) return {};
+    model::QueryOptions same = after;
+    same.description = before.description;
+    return same == before ? tr("Describe the query") : tr("Change which rows come out");
 }
 
 } // namespace

@@ -537,14 +537,6 @@
         <translation>vergleichen Sie mit einer Spalte, die Werte dieser Art enthält: %1</translation>
     </message>
     <message>
-        <source>a criterion has at most 10000 characters</source>
-        <translation>ein Kriterium hat höchstens 10000 Zeichen</translation>
-    </message>
-    <message>
-        <source>the character zero cannot stand in a criterion</source>
-        <translation>das Zeichen null darf nicht in einem Kriterium stehen</translation>
-    </message>
-    <message>
         <source>half a character stands here, type it afresh</source>
         <translation>hier steht ein halbes Zeichen, tippen Sie es neu</translation>
     </message>
@@ -963,6 +955,114 @@
     <message>
         <source>%1 is no place in the text behind the name before it</source>
         <translation>%1 ist keine Stelle im Text hinter dem Namen davor</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns: count the rows with the total &quot;count&quot;, or add the columns that are meant.</source>
+        <translation>%1.* steht für alle Spalten: die Zeilen mit der Auswertung „count“ zählen oder die gemeinten Spalten hinzufügen.</translation>
+    </message>
+    <message>
+        <source>%1 holds no numbers, for which alone there is the total &quot;%2&quot;: choose another total.</source>
+        <translation>%1 enthält keine Zahlen, und nur für sie gibt es die Auswertung „%2“: eine andere wählen.</translation>
+    </message>
+    <message>
+        <source>%1 holds values that have no order, so that there is no total &quot;%2&quot; of them: choose another total.</source>
+        <translation>%1 enthält Werte ohne Reihenfolge, darum gibt es für sie keine Auswertung „%2“: eine andere wählen.</translation>
+    </message>
+    <message>
+        <source>Where criteria stand in several rows, some of a total and some of a column that is only a condition, the latter must be the same in every row: repeat it, or make two queries of this one.</source>
+        <translation>Wo Kriterien in mehreren Zeilen stehen, teils einer Auswertung und teils einer Spalte, die nur Bedingung ist, muss letzteres in jeder Zeile gleich sein: wiederholen oder zwei Abfragen daraus machen.</translation>
+    </message>
+    <message>
+        <source>This criterion is asked of rows that were put together, and %1 has many values there: add it as a column of its own, or write a value.</source>
+        <translation>Dieses Kriterium wird auf zusammengefasste Zeilen angewandt, und %1 hat dort viele Werte: als eigene Spalte hinzufügen oder einen Wert schreiben.</translation>
+    </message>
+    <message>
+        <source>%1 sorts the rows and does not come out with them, which different rows need: show it, or take its sort away.</source>
+        <translation>%1 sortiert die Zeilen und kommt nicht mit heraus, was verschiedene Zeilen aber brauchen: die Spalte zeigen oder ihre Sortierung wegnehmen.</translation>
+    </message>
+    <message>
+        <source>%1 is only a condition, so that nothing can be sorted by it: choose another total, or take its sort away.</source>
+        <translation>%1 ist nur eine Bedingung, danach kann nicht sortiert werden: eine andere Auswertung wählen oder die Sortierung wegnehmen.</translation>
+    </message>
+    <message>
+        <source>The first %1 rows are any %1 as long as nothing is sorted: sort by what is to decide.</source>
+        <translation>Die ersten %1 Zeilen sind irgendwelche %1, solange nichts sortiert ist: nach dem sortieren, was entscheiden soll.</translation>
+    </message>
+    <message>
+        <source>%2 has nothing that says %1: leave it out, or calculate it from what was found.</source>
+        <translation>%2 hat nichts, das %1 sagt: weglassen oder aus dem Gefundenen berechnen.</translation>
+    </message>
+    <message>
+        <source>The parameter %1 stands in an expression that rows are put together by: show that column, or write a value in the place of the parameter.</source>
+        <translation>Der Parameter %1 steht in einem Ausdruck, nach dem Zeilen zusammengefasst werden: diese Spalte zeigen oder statt des Parameters einen Wert schreiben.</translation>
+    </message>
+    <message>
+        <source>at most 10000 characters can stand here</source>
+        <translation>hier können höchstens 10000 Zeichen stehen</translation>
+    </message>
+    <message>
+        <source>the character zero cannot stand here</source>
+        <translation>das Zeichen Null kann hier nicht stehen</translation>
+    </message>
+    <message>
+        <source>%1 means nothing here</source>
+        <translation>%1 bedeutet hier nichts</translation>
+    </message>
+    <message>
+        <source>put an operator between two values, such as + or &amp;</source>
+        <translation>zwischen zwei Werte einen Operator setzen, etwa + oder &amp;</translation>
+    </message>
+    <message>
+        <source>compare it with %1</source>
+        <translation>mit %1 vergleichen</translation>
+    </message>
+    <message>
+        <source>a condition is needed here, as in [price] &gt; 5</source>
+        <translation>hier wird eine Bedingung gebraucht, wie in [price] &gt; 5</translation>
+    </message>
+    <message>
+        <source>a number is needed here</source>
+        <translation>hier wird eine Zahl gebraucht</translation>
+    </message>
+    <message>
+        <source>a whole number is needed here</source>
+        <translation>hier wird eine ganze Zahl gebraucht</translation>
+    </message>
+    <message>
+        <source>the number of decimals is needed here, from 0 to 15</source>
+        <translation>hier wird die Zahl der Nachkommastellen gebraucht, von 0 bis 15</translation>
+    </message>
+    <message>
+        <source>a date is needed here, as in #2024-12-31#</source>
+        <translation>hier wird ein Datum gebraucht, wie in #2024-12-31#</translation>
+    </message>
+    <message>
+        <source>texts are joined by &amp;</source>
+        <translation>Texte werden mit &amp; verbunden</translation>
+    </message>
+    <message>
+        <source>the query has no column %1, and a text stands in quotes</source>
+        <translation>die Abfrage hat keine Spalte %1, und ein Text steht in Anführungszeichen</translation>
+    </message>
+    <message>
+        <source>there is no function %1</source>
+        <translation>es gibt keine Funktion %1</translation>
+    </message>
+    <message>
+        <source>a total is no function: write what is to be put together, and choose the total of the output column</source>
+        <translation>eine Auswertung ist keine Funktion: schreiben, was zusammengefasst werden soll, und die Auswertung der Ausgabespalte wählen</translation>
+    </message>
+    <message>
+        <source>this is written %1</source>
+        <translation>das schreibt man %1</translation>
+    </message>
+    <message>
+        <source>%1 is no total</source>
+        <translation>%1 ist keine Auswertung</translation>
+    </message>
+    <message>
+        <source>%1 stands beside an expression, which takes its place</source>
+        <translation>%1 steht neben einem Ausdruck, der an seine Stelle tritt</translation>
     </message>
 </context>
 <context>
@@ -2469,6 +2569,22 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>Resize column %1</source>
         <translation>Breite der Spalte %1 ändern</translation>
+    </message>
+    <message>
+        <source>Change total of %1</source>
+        <translation>Auswertung von %1 ändern</translation>
+    </message>
+    <message>
+        <source>Change field of %1</source>
+        <translation>Feld von %1 ändern</translation>
+    </message>
+    <message>
+        <source>Describe the query</source>
+        <translation>Abfrage beschreiben</translation>
+    </message>
+    <message>
+        <source>Change which rows come out</source>
+        <translation>Ändern, welche Zeilen herauskommen</translation>
     </message>
 </context>
 <context>

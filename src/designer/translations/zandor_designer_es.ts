@@ -537,14 +537,6 @@
         <translation>compárelo con una columna que contenga %1</translation>
     </message>
     <message>
-        <source>a criterion has at most 10000 characters</source>
-        <translation>un criterio tiene como máximo 10000 caracteres</translation>
-    </message>
-    <message>
-        <source>the character zero cannot stand in a criterion</source>
-        <translation>el carácter cero no puede aparecer en un criterio</translation>
-    </message>
-    <message>
         <source>half a character stands here, type it afresh</source>
         <translation>aquí hay medio carácter, escríbalo de nuevo</translation>
     </message>
@@ -963,6 +955,114 @@
     <message>
         <source>%1 is no place in the text behind the name before it</source>
         <translation>%1 no es un lugar del texto situado después del nombre anterior</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns: count the rows with the total &quot;count&quot;, or add the columns that are meant.</source>
+        <translation>%1.* representa todas las columnas: cuente las filas con el total «count» o añada las columnas que se quieren.</translation>
+    </message>
+    <message>
+        <source>%1 holds no numbers, for which alone there is the total &quot;%2&quot;: choose another total.</source>
+        <translation>%1 no contiene números, los únicos para los que hay el total «%2»: elija otro total.</translation>
+    </message>
+    <message>
+        <source>%1 holds values that have no order, so that there is no total &quot;%2&quot; of them: choose another total.</source>
+        <translation>%1 contiene valores sin orden, por lo que no hay total «%2» de ellos: elija otro total.</translation>
+    </message>
+    <message>
+        <source>Where criteria stand in several rows, some of a total and some of a column that is only a condition, the latter must be the same in every row: repeat it, or make two queries of this one.</source>
+        <translation>Donde hay criterios en varias filas, unos de un total y otros de una columna que es solo condición, estos últimos deben ser iguales en cada fila: repítalos o haga de esta dos consultas.</translation>
+    </message>
+    <message>
+        <source>This criterion is asked of rows that were put together, and %1 has many values there: add it as a column of its own, or write a value.</source>
+        <translation>Este criterio se aplica a filas agrupadas, y %1 tiene allí muchos valores: añádalo como columna propia o escriba un valor.</translation>
+    </message>
+    <message>
+        <source>%1 sorts the rows and does not come out with them, which different rows need: show it, or take its sort away.</source>
+        <translation>%1 ordena las filas y no sale con ellas, lo que las filas distintas necesitan: muéstrela o quite su orden.</translation>
+    </message>
+    <message>
+        <source>%1 is only a condition, so that nothing can be sorted by it: choose another total, or take its sort away.</source>
+        <translation>%1 es solo una condición, por lo que no se puede ordenar por ella: elija otro total o quite su orden.</translation>
+    </message>
+    <message>
+        <source>The first %1 rows are any %1 as long as nothing is sorted: sort by what is to decide.</source>
+        <translation>Las primeras %1 filas son %1 cualesquiera mientras nada se ordene: ordene por lo que ha de decidir.</translation>
+    </message>
+    <message>
+        <source>%2 has nothing that says %1: leave it out, or calculate it from what was found.</source>
+        <translation>%2 no tiene nada que diga %1: omítalo o calcúlelo a partir de lo encontrado.</translation>
+    </message>
+    <message>
+        <source>The parameter %1 stands in an expression that rows are put together by: show that column, or write a value in the place of the parameter.</source>
+        <translation>El parámetro %1 está en una expresión por la que se agrupan filas: muestre esa columna o escriba un valor en lugar del parámetro.</translation>
+    </message>
+    <message>
+        <source>at most 10000 characters can stand here</source>
+        <translation>aquí caben como máximo 10000 caracteres</translation>
+    </message>
+    <message>
+        <source>the character zero cannot stand here</source>
+        <translation>el carácter cero no puede estar aquí</translation>
+    </message>
+    <message>
+        <source>%1 means nothing here</source>
+        <translation>%1 no significa nada aquí</translation>
+    </message>
+    <message>
+        <source>put an operator between two values, such as + or &amp;</source>
+        <translation>ponga un operador entre dos valores, como + o &amp;</translation>
+    </message>
+    <message>
+        <source>compare it with %1</source>
+        <translation>compárelo con %1</translation>
+    </message>
+    <message>
+        <source>a condition is needed here, as in [price] &gt; 5</source>
+        <translation>aquí hace falta una condición, como en [price] &gt; 5</translation>
+    </message>
+    <message>
+        <source>a number is needed here</source>
+        <translation>aquí hace falta un número</translation>
+    </message>
+    <message>
+        <source>a whole number is needed here</source>
+        <translation>aquí hace falta un número entero</translation>
+    </message>
+    <message>
+        <source>the number of decimals is needed here, from 0 to 15</source>
+        <translation>aquí hace falta el número de decimales, de 0 a 15</translation>
+    </message>
+    <message>
+        <source>a date is needed here, as in #2024-12-31#</source>
+        <translation>aquí hace falta una fecha, como en #2024-12-31#</translation>
+    </message>
+    <message>
+        <source>texts are joined by &amp;</source>
+        <translation>los textos se unen con &amp;</translation>
+    </message>
+    <message>
+        <source>the query has no column %1, and a text stands in quotes</source>
+        <translation>la consulta no tiene ninguna columna %1, y un texto va entre comillas</translation>
+    </message>
+    <message>
+        <source>there is no function %1</source>
+        <translation>no hay ninguna función %1</translation>
+    </message>
+    <message>
+        <source>a total is no function: write what is to be put together, and choose the total of the output column</source>
+        <translation>un total no es una función: escriba lo que se ha de agrupar y elija el total de la columna de salida</translation>
+    </message>
+    <message>
+        <source>this is written %1</source>
+        <translation>esto se escribe %1</translation>
+    </message>
+    <message>
+        <source>%1 is no total</source>
+        <translation>%1 no es un total</translation>
+    </message>
+    <message>
+        <source>%1 stands beside an expression, which takes its place</source>
+        <translation>%1 está junto a una expresión, que ocupa su lugar</translation>
     </message>
 </context>
 <context>
@@ -2469,6 +2569,22 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>Resize column %1</source>
         <translation>Cambiar el ancho de la columna %1</translation>
+    </message>
+    <message>
+        <source>Change total of %1</source>
+        <translation>Cambiar el total de %1</translation>
+    </message>
+    <message>
+        <source>Change field of %1</source>
+        <translation>Cambiar el campo de %1</translation>
+    </message>
+    <message>
+        <source>Describe the query</source>
+        <translation>Describir la consulta</translation>
+    </message>
+    <message>
+        <source>Change which rows come out</source>
+        <translation>Cambiar qué filas salen</translation>
     </message>
 </context>
 <context>

@@ -537,14 +537,6 @@
         <translation>comparez avec une colonne qui contient %1</translation>
     </message>
     <message>
-        <source>a criterion has at most 10000 characters</source>
-        <translation>un critère compte au plus 10000 caractères</translation>
-    </message>
-    <message>
-        <source>the character zero cannot stand in a criterion</source>
-        <translation>le caractère zéro ne peut pas figurer dans un critère</translation>
-    </message>
-    <message>
         <source>half a character stands here, type it afresh</source>
         <translation>il y a ici un demi-caractère, saisissez-le à nouveau</translation>
     </message>
@@ -963,6 +955,114 @@
     <message>
         <source>%1 is no place in the text behind the name before it</source>
         <translation>%1 n’est pas un endroit du texte situé après le nom précédent</translation>
+    </message>
+    <message>
+        <source>%1.* stands for all columns: count the rows with the total &quot;count&quot;, or add the columns that are meant.</source>
+        <translation>%1.* représente toutes les colonnes : comptez les lignes avec le total « count », ou ajoutez les colonnes voulues.</translation>
+    </message>
+    <message>
+        <source>%1 holds no numbers, for which alone there is the total &quot;%2&quot;: choose another total.</source>
+        <translation>%1 ne contient pas de nombres, pour lesquels seuls existe le total « %2 » : choisissez un autre total.</translation>
+    </message>
+    <message>
+        <source>%1 holds values that have no order, so that there is no total &quot;%2&quot; of them: choose another total.</source>
+        <translation>%1 contient des valeurs sans ordre, pour lesquelles il n’y a pas de total « %2 » : choisissez un autre total.</translation>
+    </message>
+    <message>
+        <source>Where criteria stand in several rows, some of a total and some of a column that is only a condition, the latter must be the same in every row: repeat it, or make two queries of this one.</source>
+        <translation>Là où des critères figurent sur plusieurs lignes, les uns d’un total, les autres d’une colonne qui n’est qu’une condition, ces derniers doivent être les mêmes à chaque ligne : répétez-les, ou faites-en deux requêtes.</translation>
+    </message>
+    <message>
+        <source>This criterion is asked of rows that were put together, and %1 has many values there: add it as a column of its own, or write a value.</source>
+        <translation>Ce critère porte sur des lignes regroupées, et %1 y a plusieurs valeurs : ajoutez-le comme colonne à part, ou écrivez une valeur.</translation>
+    </message>
+    <message>
+        <source>%1 sorts the rows and does not come out with them, which different rows need: show it, or take its sort away.</source>
+        <translation>%1 trie les lignes sans sortir avec elles, ce qu’exigent des lignes différentes : affichez-la, ou retirez son tri.</translation>
+    </message>
+    <message>
+        <source>%1 is only a condition, so that nothing can be sorted by it: choose another total, or take its sort away.</source>
+        <translation>%1 n’est qu’une condition, on ne peut donc rien trier selon elle : choisissez un autre total, ou retirez son tri.</translation>
+    </message>
+    <message>
+        <source>The first %1 rows are any %1 as long as nothing is sorted: sort by what is to decide.</source>
+        <translation>Les %1 premières lignes sont %1 lignes quelconques tant que rien n’est trié : triez selon ce qui doit décider.</translation>
+    </message>
+    <message>
+        <source>%2 has nothing that says %1: leave it out, or calculate it from what was found.</source>
+        <translation>%2 n’a rien qui dise %1 : laissez-le, ou calculez-le à partir de ce qui est trouvé.</translation>
+    </message>
+    <message>
+        <source>The parameter %1 stands in an expression that rows are put together by: show that column, or write a value in the place of the parameter.</source>
+        <translation>Le paramètre %1 se trouve dans une expression selon laquelle des lignes sont regroupées : affichez cette colonne, ou écrivez une valeur à la place du paramètre.</translation>
+    </message>
+    <message>
+        <source>at most 10000 characters can stand here</source>
+        <translation>il peut y avoir ici 10000 caractères au plus</translation>
+    </message>
+    <message>
+        <source>the character zero cannot stand here</source>
+        <translation>le caractère zéro ne peut pas figurer ici</translation>
+    </message>
+    <message>
+        <source>%1 means nothing here</source>
+        <translation>%1 ne signifie rien ici</translation>
+    </message>
+    <message>
+        <source>put an operator between two values, such as + or &amp;</source>
+        <translation>mettez un opérateur entre deux valeurs, tel que + ou &amp;</translation>
+    </message>
+    <message>
+        <source>compare it with %1</source>
+        <translation>comparez-le à %1</translation>
+    </message>
+    <message>
+        <source>a condition is needed here, as in [price] &gt; 5</source>
+        <translation>il faut ici une condition, comme dans [price] &gt; 5</translation>
+    </message>
+    <message>
+        <source>a number is needed here</source>
+        <translation>il faut ici un nombre</translation>
+    </message>
+    <message>
+        <source>a whole number is needed here</source>
+        <translation>il faut ici un nombre entier</translation>
+    </message>
+    <message>
+        <source>the number of decimals is needed here, from 0 to 15</source>
+        <translation>il faut ici le nombre de décimales, de 0 à 15</translation>
+    </message>
+    <message>
+        <source>a date is needed here, as in #2024-12-31#</source>
+        <translation>il faut ici une date, comme dans #2024-12-31#</translation>
+    </message>
+    <message>
+        <source>texts are joined by &amp;</source>
+        <translation>les textes sont joints par &amp;</translation>
+    </message>
+    <message>
+        <source>the query has no column %1, and a text stands in quotes</source>
+        <translation>la requête n’a pas de colonne %1, et un texte se met entre guillemets</translation>
+    </message>
+    <message>
+        <source>there is no function %1</source>
+        <translation>il n’y a pas de fonction %1</translation>
+    </message>
+    <message>
+        <source>a total is no function: write what is to be put together, and choose the total of the output column</source>
+        <translation>un total n’est pas une fonction : écrivez ce qui doit être regroupé, et choisissez le total de la colonne de sortie</translation>
+    </message>
+    <message>
+        <source>this is written %1</source>
+        <translation>cela s’écrit %1</translation>
+    </message>
+    <message>
+        <source>%1 is no total</source>
+        <translation>%1 n’est pas un total</translation>
+    </message>
+    <message>
+        <source>%1 stands beside an expression, which takes its place</source>
+        <translation>%1 se trouve à côté d’une expression, qui prend sa place</translation>
     </message>
 </context>
 <context>
@@ -2469,6 +2569,22 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>Resize column %1</source>
         <translation>Redimensionner la colonne %1</translation>
+    </message>
+    <message>
+        <source>Change total of %1</source>
+        <translation>Modifier le total de %1</translation>
+    </message>
+    <message>
+        <source>Change field of %1</source>
+        <translation>Modifier le champ de %1</translation>
+    </message>
+    <message>
+        <source>Describe the query</source>
+        <translation>Décrire la requête</translation>
+    </message>
+    <message>
+        <source>Change which rows come out</source>
+        <translation>Modifier les lignes qui sortent</translation>
     </message>
 </context>
 <context>

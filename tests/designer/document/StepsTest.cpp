@@ -271,6 +271,16 @@ TEST(AStep, IsNamedAfterWhatChanged) {
     EXPECT_EQ(named([&] { status->AddCriterium(u"'open'", u"4"); }), "Change criterion of status");
     EXPECT_EQ(named([&] { status->Synonym(u"State"); }), "Rename column status");
     EXPECT_EQ(named([&] { status->SortOrder(1); }), "Change sorting by status");
+    EXPECT_EQ(named([&] { dynamic_cast<model::ColumnDefinition&>(*status).sortPriority(2); }),
+              "Change sorting by status");
+    EXPECT_EQ(
+        named([&] { dynamic_cast<model::ColumnDefinition&>(*status).total(model::Total::Count); }),
+        "Change total of status");
+    const auto setOptions = [&](const model::QueryOptions& options) {
+        return named([&] { drawing.query().options(options); });
+    };
+    EXPECT_EQ(setOptions({true, 10, u""}), "Change which rows come out");
+    EXPECT_EQ(setOptions({true, 10, u"for Monday"}), "Describe the query");
     EXPECT_EQ(named([&] { status->Visible(false); }), "Hide column status");
     EXPECT_EQ(named([&] { status->Visible(true); }), "Show column status");
     EXPECT_EQ(named([&] { status->Visible(false), status->SortOrder(0); }), "Change column status");
