@@ -106,9 +106,18 @@ private:
     void addItem(const ColumnDefinition& definition, const criteria::Subject& subject) {
         String name = definition.Synonym();
         const auto* column = std::get_if<ColumnRef>(&subject.node->node);
-        if (name.empty() && !column) name = subject.name;
+        if (name.empty() && !column) name = nameOf(subject);
         mNames.push_back({&definition, name.empty() ? column->column : name});
         mStatement.items.push_back({subject.node, std::move(name)});
+    }
+
+    /// What the grid has, where every dialect can carry it as a name.
+    String nameOf(const criteria::Subject& subject) const {
+        for (const Dialect dialect : allDialects)
+            if (cannotCarry(subject.name, dialect))
+                return u"column " +
+                       platform::decimal(static_cast<std::int64_t>(mStatement.items.size() + 1));
+        return subject.name;
     }
 
     void addSort(const ColumnDefinition& definition, const criteria::Subject& subject) {

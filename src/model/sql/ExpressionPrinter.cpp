@@ -4,6 +4,9 @@
 #include "model/criteria/Tokens.h"
 #include "model/sql/Templates.h"
 
+#include <algorithm>
+#include <utility>
+
 namespace zandor::model::sql {
 
 namespace {
@@ -24,6 +27,22 @@ bool isZero(StringView number) {
     return number.find_first_of(u"123456789") >= number.find_first_of(u"eE");
 }
 
+/// A placeholder of MySQL whose answer has room.
+StringView roomFor(ColumnType type) {
+    switch (type) {
+    case ColumnType::Integer:
+    case ColumnType::Boolean: return u"CAST(? AS SIGNED)";
+    case ColumnType::Decimal: return u"CAST(? AS DOUBLE)";
+    case ColumnType::Date: return u"CAST(? AS DATE)";
+    case ColumnType::Time: return u"CAST(? AS TIME)";
+    case ColumnType::Timestamp: return u"CAST(? AS DATETIME)";
+    case ColumnType::Text:
+    case ColumnType::Blob:
+    case ColumnType::Unknown: break;
+    }
+    return u"CAST(? AS CHAR(100)) COLLATE utf8mb4_general_ci";
+}
+
 } // namespace
 
 void Output::name(StringView name) {
@@ -40,8 +59,36 @@ void Output::column(const ColumnRef& column) {
 void ExpressionPrinter::any(const Expression& expression, Tightness around) {
     const bool outer = mWritesOut;
     mWritesOut = outer || mWrittenOut.contains(&expression);
-    std::visit([&](const auto& part) { write(part, around); }, expression.node);
+    if (asSmallest(expression)) {
+        const auto* groups = std::exchange(mGroups, nullptr);
+        mOut.text += u"MIN(";
+        std::visit([&](const auto& part) { write(part, Tightness::disjunction); }, expression.node);
+        mOut.text += u')';
+        mGroups = groups;
+    } else {
+        std::visit([&](const auto& part) { write(part, around); }, expression.node);
+    }
     mWritesOut = outer;
+}
+
+/// MySQL knows no expression again behind GROUP BY, and PostgreSQL none with a placeholder in it;
+/// of values that are all the same the smallest is that value.
+bool ExpressionPrinter::asSmallest(const Expression& expression) const {
+    if (!mGroups) return false;
+    const bool mysql = mOut.dialect == Dialect::MySQL;
+    const bool question = mOut.dialect == Dialect::PostgreSQL && holds<Parameter>(expression) &&
+                          typeOf(expression) != ColumnType::Boolean;
+    if (!mysql && !question) return false;
+    return std::any_of(mGroups->begin(), mGroups->end(),
+                       [&](const Node& group) { return same(group, Node(Node(), &expression)); });
+}
+
+/// Qt's driver for MySQL makes room for what comes out before the values are known, and finds no
+/// rows where there is too little.
+void ExpressionPrinter::item(const Expression& expression) {
+    mInItem = mOut.dialect == Dialect::MySQL;
+    value(expression, Tightness::disjunction);
+    mInItem = false;
 }
 
 void ExpressionPrinter::condition(const Expression& expression, Tightness around) {
@@ -96,7 +143,7 @@ void ExpressionPrinter::parenthesised(const std::vector<Node>& parts, StringView
 void ExpressionPrinter::write(const ColumnRef& reference, Tightness) { mOut.column(reference); }
 
 void ExpressionPrinter::write(const Value& value, Tightness) {
-    if (mOut.form == ValueForm::literal || mWritesOut) {
+    if (mOut.form == ValueForm::literal || mWritesOut || mInItem) {
         mOut.text += literal(value, mOut.dialect);
         return;
     }
@@ -114,7 +161,8 @@ void ExpressionPrinter::write(const Parameter& parameter, Tightness) {
         // What the user will answer may be a fraction even where the column holds whole
         // numbers.
         const bool whole = parameter.type == ColumnType::Integer;
-        mOut.text += placeholder(whole ? ColumnType::Decimal : parameter.type, mOut.dialect);
+        const ColumnType type = whole ? ColumnType::Decimal : parameter.type;
+        mOut.text += mInItem ? roomFor(type) : placeholder(type, mOut.dialect);
         return;
     }
     mOut.text += u':';

@@ -33,6 +33,11 @@ public:
         for (const Node& node : nodes) mWrittenOut.insert(node.get());
     }
 
+    /// From now on conditions are on rows that were put together by these.
+    void standBehind(const std::vector<Node>& groups) { mGroups = &groups; }
+
+    /// What comes out as a column.
+    void item(const Expression& expression);
     void condition(const Expression& expression, Tightness around);
     void value(const Expression& expression, Tightness around);
     /// The terms of a top-level And or Or, a line each; anything else on one line.
@@ -44,6 +49,7 @@ private:
     void parenthesised(const std::vector<Node>& parts, StringView word, Tightness inner,
                        bool parentheses);
     void any(const Expression& expression, Tightness around);
+    bool asSmallest(const Expression& expression) const;
     void write(const ColumnRef& reference, Tightness around);
     void write(const Value& value, Tightness around);
     void write(const Parameter& parameter, Tightness around);
@@ -69,6 +75,8 @@ private:
     Output& mOut;
     std::unordered_set<const Expression*> mWrittenOut;
     bool mWritesOut = false;
+    bool mInItem = false;
+    const std::vector<Node>* mGroups = nullptr;
 };
 
 } // namespace zandor::model::sql

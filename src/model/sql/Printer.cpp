@@ -41,20 +41,6 @@ std::size_t depth(const Expression& expression) {
     return deepest + (terms ? parts.size() : 1);
 }
 
-bool holdsValues(const Expression& expression) {
-    if (std::holds_alternative<Value>(expression.node)) return true;
-    const auto parts = partsOf(expression);
-    return std::any_of(parts.begin(), parts.end(),
-                       [](const Node& part) { return holdsValues(*part); });
-}
-
-bool holdsParameters(const Expression& expression) {
-    if (std::holds_alternative<Parameter>(expression.node)) return true;
-    const auto parts = partsOf(expression);
-    return std::any_of(parts.begin(), parts.end(),
-                       [](const Node& part) { return holdsParameters(*part); });
-}
-
 class Printer {
 public:
     Printer(Dialect dialect, ValueForm form) : mOut{dialect, form} {}
@@ -72,7 +58,7 @@ public:
         from(statement.from);
         filter(u"\nWHERE ", statement.where);
         group(statement);
-        filter(u"\nHAVING ", statement.having);
+        if (statement.having) having(statement);
         order(statement);
         paging(statement);
         return {std::move(mOut.text), std::move(mOut.bindings)};
@@ -94,7 +80,8 @@ private:
     void writeGroupsOut(const Statement& statement) {
         std::vector<Node> groups;
         for (const Node& node : statement.group)
-            if (holdsValues(*node) || (holdsParameters(*node) && !groupedByNumber(statement, node)))
+            if (!groupedByNumber(statement, node) &&
+                (holds<Value>(*node) || holds<Parameter>(*node)))
                 groups.push_back(node);
         mExpressions.writeOut(groups);
     }
@@ -102,8 +89,7 @@ private:
     /// With a parameter in it only the number of its item says that it is the same.
     bool groupedByNumber(const Statement& statement, const Node& node) const {
         const bool numbers = !isFor(Dialect::SqlServer) && !isFor(Dialect::Standard);
-        return numbers && holdsParameters(*node) && !holdsValues(*node) &&
-               itemOf(statement, node) != 0;
+        return numbers && holds<Parameter>(*node) && itemOf(statement, node) != 0;
     }
 
     void filter(StringView word, const Node& condition) {
@@ -111,6 +97,14 @@ private:
         check(*condition);
         mOut.text += word;
         mExpressions.terms(*condition, nextLine, Tightness::disjunction);
+    }
+
+    void having(const Statement& statement) {
+        ExpressionPrinter behind = mExpressions;
+        behind.standBehind(statement.group);
+        check(*statement.having);
+        mOut.text += u"\nHAVING ";
+        behind.terms(*statement.having, nextLine, Tightness::disjunction);
     }
 
     void group(const Statement& statement) {
@@ -131,7 +125,7 @@ private:
             mOut.text += u".*";
             return;
         }
-        mExpressions.value(*std::get<Node>(item.what), Tightness::disjunction);
+        mExpressions.item(*std::get<Node>(item.what));
         if (item.name.empty()) return;
         mOut.text += u" AS ";
         mOut.name(item.name);

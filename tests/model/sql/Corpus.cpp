@@ -67,10 +67,18 @@ Join join(const json& value) {
 /// "orders.id" alone is shown and nothing else.
 Column column(const json& value) {
     if (!value.is_object()) return {names(value), {}, 0, true, {}};
+    static constexpr std::array<const char*, 9> totals = {
+        "", "group", "count", "count different", "sum", "average", "smallest", "largest",
+        "condition"};
     static constexpr std::array<const char*, 3> sorts = {"", "ascending", "descending"};
-    return {names(value.at("column")), value.value("as", ""),
-            positionIn(sorts, value.value("sort", "")), !value.value("hidden", false),
-            value.value("criteria", std::vector<std::string>())};
+    return {value.contains("column") ? names(value["column"]) : Names(),
+            value.value("as", ""),
+            positionIn(sorts, value.value("sort", "")),
+            !value.value("hidden", false),
+            value.value("criteria", std::vector<std::string>()),
+            value.value("expression", ""),
+            static_cast<model::Total>(positionIn(totals, value.value("total", ""))),
+            value.value("priority", 0)};
 }
 
 /// A text, or its lines.
@@ -101,7 +109,18 @@ Case readCase(const json& from) {
         for (const json& value : from["findings"])
             to.findings.push_back({value.at("kind"), value.at("text"), value.value("row", 0),
                                    value.value("position", 0)});
-    if (from.contains("reference")) to.reference = lines(from["reference"]);
+    to.options.distinct = from.value("distinct", false);
+    to.options.first = from.value("first", 0);
+    if (from.contains("reference")) {
+        const json& reference = from["reference"];
+        for (const auto dialect : model::sql::allDialects) {
+            const std::string name = corpus::nameOf(dialect);
+            if (!reference.is_object())
+                to.references[name] = lines(reference);
+            else if (reference.contains(name))
+                to.references[name] = lines(reference[name]);
+        }
+    }
     return to;
 }
 
@@ -163,6 +182,7 @@ std::string nameOf(model::Finding::Kind kind) {
 platform::Ref<model::Query> draw(const Case& drawn, reader::DatabaseReader& database) {
     const auto query = platform::makeRef<model::Query>();
     model::Library library;
+    query->options(drawn.options);
     for (const Table& table : drawn.tables) {
         const auto description = database.table({u"", fromUtf8(table.source)});
         if (!description) throw std::runtime_error(description.error().toStdString());
@@ -186,8 +206,13 @@ platform::Ref<model::Query> draw(const Case& drawn, reader::DatabaseReader& data
         query->AddJoin(join);
     }
     for (const Column& from : drawn.columns) {
-        const auto definition = library.NewZDColumnDefinition();
-        definition->Column(columnOf(from.what));
+        const auto definition = platform::makeRef<model::ColumnDefinition>();
+        if (from.expression.empty())
+            definition->Column(columnOf(from.what));
+        else
+            definition->expression(fromUtf8(from.expression));
+        definition->total(from.total);
+        definition->sortPriority(static_cast<std::int16_t>(from.priority));
         definition->Synonym(fromUtf8(from.synonym));
         definition->SortOrder(static_cast<std::int16_t>(from.sort));
         definition->Visible(from.visible);

@@ -19,6 +19,9 @@ struct Column {
     int sort = 0;
     bool visible = true;
     std::vector<std::string> criteria; ///< of the first row, the second one, ...
+    std::string expression{};          ///< instead of a column
+    zandor::model::Total total = zandor::model::Total::None;
+    int priority = 0; ///< of its sort
 };
 
 struct Join {
@@ -49,7 +52,8 @@ struct Case {
     std::map<std::string, std::string> answers; ///< to parameters, as a user types them
     std::map<std::string, std::string> sql;     ///< by dialect, with the values written out
     std::vector<ExpectedFinding> findings;      ///< for the first dialect of `sql`, else SQLite
-    std::string reference;                      ///< empty when there is nothing to run
+    std::map<std::string, std::string> references; ///< by dialect; none when nothing is to be run
+    zandor::model::QueryOptions options;
 };
 
 /// The cases of every file of a directory, in the order of the files' names. Throws

@@ -192,4 +192,13 @@ ZANDOR_MODEL_EXPORT bool same(const Node& left, const Node& right);
 /// The nodes right below one, in the order in which they are written; none is nothing.
 ZANDOR_MODEL_EXPORT std::vector<Node> partsOf(const Expression& expression);
 
+/// Whether a node of a kind is it, or stands below it.
+template <class Kind>
+bool holds(const Expression& expression) {
+    if (std::holds_alternative<Kind>(expression.node)) return true;
+    for (const Node& part : partsOf(expression))
+        if (holds<Kind>(*part)) return true;
+    return false;
+}
+
 } // namespace zandor::model::sql
