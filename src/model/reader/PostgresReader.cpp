@@ -37,17 +37,25 @@ const QString named =
 
 /// What a column's type means. `base` is the declared type or, of a domain, the one it is made
 /// from. Only the engine's own types are known by name: another's may have any.
+///
+/// A text is what the engine compares with a pattern. What it does not is left unknown, also where
+/// its values are written as texts: then a pattern is compared with what it reads like.
 model::ColumnType typeOf(const QString& base, const QString& category, bool builtIn) {
     using model::ColumnType;
     const char16_t kind = category.isEmpty() ? u'X' : category.front().unicode();
     switch (kind) {
     case u'A': // arrays
     case u'C': // rows
+    case u'E': // enumerations
     case u'R': // ranges
         return ColumnType::Unknown;
-    case u'E': return ColumnType::Text;
     default: break;
     }
+    static const QStringList unlikeText = {QStringLiteral("json"), QStringLiteral("jsonb"),
+                                           QStringLiteral("uuid"), QStringLiteral("xml")};
+    if (builtIn && unlikeText.contains(base)) return ColumnType::Unknown;
+    // A number of its own, which is compared with what reads like one and not with numbers.
+    if (builtIn && base == u"money") return ColumnType::Text;
     if (builtIn) return columnType(base.toStdU16String());
     switch (kind) {
     case u'B': return ColumnType::Boolean;

@@ -36,7 +36,7 @@ constexpr std::array<Advice, 17> byWords = {{
     {"Unknown database", say<MessageCode::checkDatabase>},
     {"ermission denied", say<MessageCode::askOwner>},
     {"role \"", say<MessageCode::checkUser>},
-    {"Data source name not found", say<MessageCode::checkSource>},
+    {"Data source name not found", say<MessageCode::checkDatabase>},
     {"database \"", say<MessageCode::checkDatabase>},
 }};
 

@@ -240,5 +240,5 @@ TEST_F(SqliteOverOdbc, SaysThatThereIsNoSuchSource) {
     EXPECT_EQ(opened.error(),
               sql("The database odbc://nowhere cannot be opened ([unixODBC][Driver Manager]Data "
                   "source name not found and no default driver specified): check the name of the "
-                  "data source."));
+                  "database."));
 }
