@@ -87,6 +87,25 @@ void use(const String& text, int type, model::sql::Dialect dialect) {
         must(isOneLine(finding.text()), "a finding of one line");
 }
 
+/// The text as an expression, with a total and beside one.
+void useExpression(const String& text, int type, model::sql::Dialect dialect) {
+    const auto query = someQuery();
+    const auto totals = static_cast<int>(model::lastTotal) + 1;
+    for (const auto total : {static_cast<model::Total>(type % totals), model::Total::Count}) {
+        const auto definition = platform::makeRef<model::ColumnDefinition>();
+        definition->expression(text);
+        definition->total(total);
+        definition->AddCriterium(text, u"5");
+        query->AddColumnDefinition(definition);
+    }
+    const auto statement = model::sql::statementText(*query, dialect, model::sql::ValueForm::bound);
+    must(text.empty() || statement.runnable() || !statement.findings.empty(),
+         "a statement or a reason");
+    query->renameTable(query->tableNamed(u"orders"), u"an Or [other");
+    for (const auto& finding : model::sql::build(*query).findings)
+        must(isOneLine(finding.text()), "a finding of one line");
+}
+
 } // namespace
 
 /// The first byte has the encoding of the rest, UTF-16 or UTF-8, the type and the dialect.
@@ -96,7 +115,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const auto dialect = model::sql::allDialects[data[0] % std::size(model::sql::allDialects)];
     const std::string_view rest(reinterpret_cast<const char*>(data) + 1, size - 1);
     if (data[0] % 2 != 0) {
-        use(platform::fromUtf8(rest), type, dialect);
+        const String text = platform::fromUtf8(rest);
+        use(text, type, dialect);
+        if (!text.empty()) useExpression(text, type, dialect);
         return 0;
     }
     String text;
@@ -104,5 +125,6 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         text += static_cast<char16_t>(static_cast<unsigned char>(rest[at]) |
                                       static_cast<unsigned char>(rest[at + 1]) << 8);
     use(text, type, dialect);
+    if (!text.empty()) useExpression(text, type, dialect);
     return 0;
 }

@@ -351,6 +351,8 @@ void ExpressionPrinter::piece(const Call& call, StringView piece) {
     const Expression& argument = *call.arguments[static_cast<std::size_t>(piece[0] - u'1')];
     const StringView kind = piece.size() > 2 ? piece.substr(2) : StringView();
     if (kind.empty()) {
+        value(argument, Tightness::disjunction);
+    } else if (kind == u"tight") {
         value(argument, Tightness::factor);
     } else if (kind == u"digits") {
         mOut.text += std::get<Value>(argument.node).text;

@@ -24,7 +24,7 @@ Forms formsOf(Function function, std::size_t arguments) {
     case Function::length:
         return {u"LENGTH({1})", u"LENGTH({1})", u"CHAR_LENGTH({1})",
                 // LEN takes no notice of blanks at the end.
-                u"(LEN({1} + N'.') - 1)", u"CHAR_LENGTH({1})"};
+                u"(LEN({1:tight} + N'.') - 1)", u"CHAR_LENGTH({1})"};
     case Function::upper: return everywhere(u"UPPER({1})");
     case Function::lower: return everywhere(u"LOWER({1})");
     case Function::trim: return everywhere(u"TRIM({1})");
@@ -69,7 +69,7 @@ Forms formsOf(Function function, std::size_t arguments) {
         return {u"CAST({1} AS TEXT)", u"CAST({1} AS text)", u"CAST({1} AS CHAR)",
                 u"CAST({1} AS nvarchar(4000))", u"CAST({1} AS VARCHAR(4000))"};
     case Function::number:
-        return {u"CAST({1} AS NUMERIC)", u"CAST({1} AS numeric)", u"({1} + 0e0)",
+        return {u"CAST({1} AS NUMERIC)", u"CAST({1} AS numeric)", u"({1:tight} + 0e0)",
                 u"CAST({1} AS float)", u"CAST({1} AS DECIMAL(38, 10))"};
     case Function::date:
         return {u"date({1})", u"CAST({1} AS date)", u"DATE({1})", u"CAST({1} AS date)",
@@ -78,14 +78,14 @@ Forms formsOf(Function function, std::size_t arguments) {
         return {u"datetime({1})", u"CAST({1} AS timestamp)", u"CAST({1} AS DATETIME)",
                 u"CAST({1} AS datetime2)", u"CAST({1} AS TIMESTAMP)"};
     case Function::addDays:
-        return {u"date({1}, CAST({2} AS TEXT) || ' days')", u"({1} + CAST({2} AS integer))",
-                u"DATE_ADD({1}, INTERVAL {2} DAY)", u"DATEADD(day, {2}, {1})",
-                u"({1} + {2} * INTERVAL '1' DAY)"};
+        return {u"date({1}, CAST({2} AS TEXT) || ' days')", u"({1:tight} + CAST({2} AS integer))",
+                u"DATE_ADD({1}, INTERVAL {2:tight} DAY)", u"DATEADD(day, {2}, {1})",
+                u"({1:tight} + {2:tight} * INTERVAL '1' DAY)"};
     case Function::addDaysLater:
         return {u"datetime({1}, CAST({2} AS TEXT) || ' days')",
-                u"({1} + CAST({2} AS integer) * INTERVAL '1 day')",
-                u"DATE_ADD({1}, INTERVAL {2} DAY)", u"DATEADD(day, {2}, {1})",
-                u"({1} + {2} * INTERVAL '1' DAY)"};
+                u"({1:tight} + CAST({2} AS integer) * INTERVAL '1 day')",
+                u"DATE_ADD({1}, INTERVAL {2:tight} DAY)", u"DATEADD(day, {2}, {1})",
+                u"({1:tight} + {2:tight} * INTERVAL '1' DAY)"};
     }
     return {};
 }

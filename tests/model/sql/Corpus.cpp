@@ -68,8 +68,8 @@ Join join(const json& value) {
 Column column(const json& value) {
     if (!value.is_object()) return {names(value), {}, 0, true, {}};
     static constexpr std::array<const char*, 9> totals = {
-        "", "group", "count", "count different", "sum", "average", "smallest", "largest",
-        "condition"};
+        "",        "group",    "count",   "count different", "sum",
+        "average", "smallest", "largest", "condition"};
     static constexpr std::array<const char*, 3> sorts = {"", "ascending", "descending"};
     return {value.contains("column") ? names(value["column"]) : Names(),
             value.value("as", ""),
