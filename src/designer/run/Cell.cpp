@@ -38,6 +38,14 @@ bool isNumber(const QMetaType& type) {
     }
 }
 
+/// The number that bits make, unless the driver has lost some: it takes them for UTF-8.
+Cell bitsCell(const QString& text) {
+    if (text.contains(QChar::ReplacementCharacter)) return {Cell::Kind::text, text};
+    quint64 number = 0;
+    for (const char byte : text.toUtf8()) number = number << 8 | static_cast<uchar>(byte);
+    return {Cell::Kind::number, QString::number(number)};
+}
+
 QString momentText(const QVariant& value) {
     if (value.typeId() == QMetaType::QDate) return value.toDate().toString(Qt::ISODate);
     if (value.typeId() == QMetaType::QTime) {
@@ -50,10 +58,11 @@ QString momentText(const QVariant& value) {
 
 } // namespace
 
-CellReader::CellReader(const QSqlQuery& query) : mQuery(query) {
+CellReader::CellReader(const QSqlQuery& query, const QSqlDatabase& database)
+    : mQuery(query), mNative(query, database) {
     const QSqlRecord record = query.record();
     for (int i = 0; i < record.count(); ++i) {
-        mColumns << record.fieldName(i);
+        mColumns << mNative.name(i).value_or(record.fieldName(i));
         mNumbers.push_back(isNumber(record.field(i).metaType()));
     }
     mRow.resize(mNumbers.size());
@@ -69,14 +78,17 @@ Cell CellReader::cell(int column) const {
     // The statement knows it; a value that Qt cannot hold calls itself null as well.
     if (mQuery.isNull(column)) return {};
     switch (value.typeId()) {
-    case QMetaType::QByteArray: return {Cell::Kind::blob, {}, value.toByteArray()};
+    case QMetaType::QByteArray:
+        if (mNative.isText(column))
+            return {Cell::Kind::text, QString::fromUtf8(value.toByteArray())};
+        return {Cell::Kind::blob, {}, value.toByteArray()};
     case QMetaType::Bool:
         return {Cell::Kind::boolean,
                 value.toBool() ? QStringLiteral("true") : QStringLiteral("false")};
     case QMetaType::QDate:
     case QMetaType::QTime:
     case QMetaType::QDateTime: {
-        const QString text = momentText(value);
+        const QString text = mNative.written(column).value_or(momentText(value));
         return {Cell::Kind::text, text.isEmpty() ? unknownMoment() : text};
     }
     case QMetaType::Double:
@@ -84,6 +96,7 @@ Cell CellReader::cell(int column) const {
         return {Cell::Kind::number,
                 QString::number(value.toDouble(), 'g', QLocale::FloatingPointShortest)};
     case QMetaType::QString: {
+        if (mNative.isBits(column)) return bitsCell(value.toString());
         // Exact decimals come as text.
         const bool number = mNumbers[static_cast<std::size_t>(column)];
         return {number ? Cell::Kind::number : Cell::Kind::text, value.toString()};

@@ -1,11 +1,11 @@
 #pragma once
 
+#include "designer/run/NativeResult.h"
+
 #include <QByteArray>
 #include <QStringList>
 
 #include <vector>
-
-class QSqlQuery;
 
 namespace zandor::designer {
 
@@ -25,8 +25,8 @@ using Row = std::vector<Cell>;
 /// Reads the values of a statement's row.
 class CellReader {
 public:
-    /// For a statement that has been sent. `query` outlives the reader.
-    explicit CellReader(const QSqlQuery& query);
+    /// For a statement of the database that has been sent. `query` outlives the reader.
+    CellReader(const QSqlQuery& query, const QSqlDatabase& database);
 
     QStringList columns() const { return mColumns; }
     /// The row that the statement stands on; the same object each time.
@@ -36,6 +36,7 @@ private:
     Cell cell(int column) const;
 
     const QSqlQuery& mQuery;
+    const NativeResult mNative;
     QStringList mColumns;
     std::vector<bool> mNumbers; ///< whose values are numbers even where they come as text
     Row mRow;

@@ -1,13 +1,12 @@
 #include "designer/run/EngineStop.h"
 
+#include "designer/run/sharedSqlite.h"
+
 #include <Zandor/reader/dialectOf.h>
 
-#include <QSqlDriver>
 #include <QSqlQuery>
 
 #include <sqlite3.h>
-
-#include <cstring>
 
 namespace zandor::designer {
 
@@ -29,18 +28,6 @@ QString killing(const QSqlDatabase& database) {
     return (postgres ? QStringLiteral("SELECT pg_cancel_backend(%1)")
                      : QStringLiteral("KILL QUERY %1"))
         .arg(query.value(0).toLongLong());
-}
-
-/// The driver's handle, if the driver uses the same library as this program: its structures may be
-/// handed to no other.
-sqlite3* sqliteHandle(const QSqlDatabase& database) {
-    const QVariant handle = database.driver()->handle();
-    if (!handle.isValid() || std::strcmp(handle.typeName(), "sqlite3*") != 0) return nullptr;
-    QSqlQuery query(database);
-    if (!query.exec(QStringLiteral("SELECT sqlite_source_id()")) || !query.next() ||
-        query.value(0).toString() != QLatin1String(sqlite3_sourceid()))
-        return nullptr;
-    return *static_cast<sqlite3* const*>(handle.data());
 }
 
 } // namespace
@@ -77,7 +64,7 @@ void EngineStop::stop() {
 // Not sqlite3_interrupt: it does nothing to a statement that begins a moment later, and the thread
 // that calls it has to know that the connection is still there.
 void EngineStop::askSqlite(const QSqlDatabase& database) {
-    sqlite3* const handle = sqliteHandle(database);
+    sqlite3* const handle = sharedSqlite(database);
     if (!handle) return; // then it stops with the next row
     mSqlite = handle;
     const auto wished = [](void* self) {

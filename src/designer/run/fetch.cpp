@@ -35,7 +35,7 @@ public:
 
     Outcome run(const Command& command, Sink& sink) {
         if (!send(mQuery, command)) return broken();
-        CellReader cells(mQuery);
+        CellReader cells(mQuery, mConnection.database());
         if (const auto error = sink.begin(cells.columns()))
             return leave(Outcome::End::refused, *error);
         while (mQuery.next()) {

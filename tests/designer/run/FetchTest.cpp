@@ -53,6 +53,11 @@ TEST_F(Fetching, TellsKindsOfValuesApart) {
                           "B:"));
 }
 
+TEST_F(Fetching, GivesTheNamesOfColumnsAsTheyAre) {
+    fetch("SELECT 1 AS \"a\"\"b\", 2 AS \"\"\"c\"\"\", 3 AS \"Größe ☃\"");
+    EXPECT_EQ(keeper.columns, QStringList({"a\"b", "\"c\"", "Größe ☃"}));
+}
+
 TEST_F(Fetching, GivesTheColumnsOfAResultWithoutRows) {
     EXPECT_EQ(fetch("SELECT n, word FROM numbers WHERE n < 0").end, Outcome::End::complete);
     EXPECT_EQ(keeper.columns, QStringList({"n", "word"}));

@@ -68,7 +68,25 @@ TEST_F(OnPostgres, TellsKindsOfValuesApart) {
     EXPECT_EQ(keeper.rows,
               QStringList("n:1 | n:1.50 | n:12345678901234567890.123456789 | n:0.1 | b:true | t:a "
                           "| 0: | B:00ff | t:2024-05-01 | t:10:30:00 | t:2024-05-01 "
-                          "10:30:00.250 | n:NaN | t:(outside the calendar)"));
+                          "10:30:00.25 | n:NaN | t:infinity"));
+}
+
+TEST_F(OnPostgres, GivesMomentsAsTheEngineWritesThem) {
+    fetch("SELECT TIMESTAMP '2024-05-01 10:30:00.123456', DATE '0044-03-15 BC', "
+          "DATE '-infinity', TIME '24:00', TIME '01:02:03.5', TIMETZ '01:02:03.25+05:30', "
+          "TIMESTAMPTZ '12024-05-01 10:30+00' AT TIME ZONE 'UTC', CAST(NULL AS date)");
+    EXPECT_EQ(keeper.rows,
+              QStringList("t:2024-05-01 10:30:00.123456 | t:0044-03-15 BC | t:-infinity | "
+                          "t:24:00:00 | t:01:02:03.5 | t:01:02:03.25+05:30 | "
+                          "t:12024-05-01 10:30:00 | 0:"));
+    fetch("SELECT TIMESTAMPTZ '2024-05-01 10:30:00.000001+05:30' FROM (SELECT "
+          "set_config('TimeZone', 'Asia/Kathmandu', true)) AS there");
+    EXPECT_EQ(keeper.rows.last(), "t:2024-05-01 10:45:00.000001+05:45");
+}
+
+TEST_F(OnPostgres, GivesTheNamesOfColumnsAsTheyAre) {
+    fetch("SELECT 1 AS \"a\"\"b\", 2 AS \"\"\"c\"\"\"");
+    EXPECT_EQ(keeper.columns, QStringList({"a\"b", "\"c\""}));
 }
 
 TEST_F(OnPostgres, GivesTheFirstRowsBeforeTheLastOnesAreThere) {
