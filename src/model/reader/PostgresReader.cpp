@@ -68,12 +68,13 @@ model::ColumnType typeOf(const QString& base, const QString& category, bool buil
 
 Result<std::vector<TableEntry>> PostgresReader::tables() {
     std::vector<TableEntry> entries;
+    // A partition is a part of its table, of which there may be thousands.
     const auto error = readRows(
         mDatabase, model::say<MessageCode::tablesNotRead>(),
         QStringLiteral("SELECT %1, c.relname, c.relkind IN ('v', 'm') "
                        "FROM pg_catalog.pg_class c "
                        "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
-                       "WHERE c.relkind IN ('r', 'p', 'f', 'v', 'm') "
+                       "WHERE c.relkind IN ('r', 'p', 'f', 'v', 'm') AND NOT c.relispartition "
                        "AND n.nspname <> 'information_schema' AND n.nspname NOT LIKE 'pg\\_%' "
                        "ORDER BY lower(c.relname), c.relname, n.nspname")
             .arg(schemaColumn.arg(QStringLiteral("n"), QStringLiteral("c"))),

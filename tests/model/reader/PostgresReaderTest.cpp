@@ -61,6 +61,7 @@ TEST_F(PostgresReader, ListsTablesAndViewsOfAllSchemasAndNoneOfTheEnginesOwn) {
                  sql("CREATE TABLE aside.b (x int)"), sql("CREATE VIEW \"A v\" AS SELECT 1 AS x"),
                  sql("CREATE MATERIALIZED VIEW m AS SELECT 1 AS x"),
                  sql("CREATE TABLE parts (x int) PARTITION BY LIST (x)"),
+                 sql("CREATE TABLE part PARTITION OF parts FOR VALUES IN (1)"),
                  sql("CREATE INDEX i ON b (x)"), sql("CREATE SEQUENCE s")});
     EXPECT_EQ(tables(), (std::vector<reader::TableEntry>{{{u"", u"A v"}, true},
                                                          {{u"aside", u"b"}, false},
