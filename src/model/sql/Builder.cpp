@@ -88,6 +88,7 @@ private:
         }
         if (mGrouped && !aggregates(total) && total != Total::Condition) group(output.subject);
         if (definition.Visible() && total != Total::Condition) addItem(definition, output.subject);
+        if (aggregates(total)) mTotals.push_back(output.subject.node);
         addSort(definition, output.subject);
         for (const auto& [row, criterium] : definition.criteria().rows())
             addCriterion(definition, output.subject, row, criterium->tied());
@@ -196,8 +197,9 @@ private:
     }
 
     void selectEverything() {
-        // Where rows are put together, all of them is what they are put together by.
+        // Where rows are put together, all of them is what they are put together by and into.
         for (const Node& node : mStatement.group) mStatement.items.push_back({node, {}});
+        for (const Node& node : mTotals) mStatement.items.push_back({node, {}});
         if (mGrouped) return;
         for (std::int32_t i = 1; i <= mQuery.Tables().Count(); ++i)
             mStatement.items.push_back({AllColumns{mQuery.Tables().Item(i)->Name()}, {}});
@@ -221,6 +223,7 @@ private:
     std::vector<std::pair<const ColumnDefinition*, String>> mNames;
     std::map<std::int16_t, RowTerms> mRows;
     std::map<int, std::vector<OrderItem>> mOrder; ///< by priority
+    std::vector<Node> mTotals;
     bool mGrouped = false;                        ///< rows are put together
 };
 

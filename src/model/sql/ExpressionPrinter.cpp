@@ -395,6 +395,8 @@ void ExpressionPrinter::write(const Choice& choice, Tightness) {
 }
 
 void ExpressionPrinter::write(const Aggregate& aggregate, Tightness) {
+    // Its values are those of the rows before.
+    const auto* groups = std::exchange(mGroups, nullptr);
     switch (aggregate.total) {
     case Total::Count: mOut.text += u"COUNT("; break;
     case Total::CountDifferent: mOut.text += u"COUNT(DISTINCT "; break;
@@ -416,6 +418,7 @@ void ExpressionPrinter::write(const Aggregate& aggregate, Tightness) {
         if (scaled) mOut.text += u" * 1e0";
     }
     mOut.text += u')';
+    mGroups = groups;
 }
 
 } // namespace zandor::model::sql

@@ -66,7 +66,7 @@ Forms formsOf(Function function, std::size_t arguments) {
         return {u"datetime('now', 'localtime')", u"LOCALTIMESTAMP(0)", u"LOCALTIMESTAMP",
                 u"CAST(SYSDATETIME() AS datetime2(0))", u"LOCALTIMESTAMP(0)"};
     case Function::text:
-        return {u"CAST({1} AS TEXT)", u"CAST({1} AS text)", u"CAST({1} AS CHAR)",
+        return {u"CAST({1} AS TEXT)", u"CAST({1} AS text)", u"CONCAT({1})",
                 u"CAST({1} AS nvarchar(4000))", u"CAST({1} AS VARCHAR(4000))"};
     case Function::number:
         return {u"CAST({1} AS NUMERIC)", u"CAST({1} AS numeric)", u"({1:tight} + 0e0)",

@@ -50,9 +50,9 @@ public:
     /// Runs a query's statement, with answers to its parameters.
     Outcome run(zandor::model::sql::Dialect dialect, const zandor::model::sql::Text& text,
                 const std::map<std::string, std::string>& answers = {}) const;
+    const QSqlDatabase& database(zandor::model::sql::Dialect dialect) const;
 
 private:
-    const QSqlDatabase& database(zandor::model::sql::Dialect dialect) const;
 
     QTemporaryDir mDirectory;
     std::map<zandor::model::sql::Dialect, QSqlDatabase> mDatabases;

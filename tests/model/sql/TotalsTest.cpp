@@ -252,3 +252,9 @@ TEST_F(Totals, AreUndoneAndDoneAgain) {
     ASSERT_EQ(typed.definitions.changed.size(), 1U);
     EXPECT_EQ(typed.definitions.changed[0].before.expression.text, u"t.whole");
 }
+
+TEST_F(Totals, ComeOutAllWhereNoneIsShown) {
+    add(u"text")->Visible(false);
+    add(u"whole", Total::Sum)->Visible(false);
+    EXPECT_EQ(sql(), "SELECT\n    t.text,\n    SUM(t.whole)\nFROM t\nGROUP BY t.text");
+}
