@@ -19,6 +19,10 @@
 #include "designer/document/Recovery.h"
 #include "designer/options/EventPanel.h"
 #include "designer/options/OptionsDialog.h"
+#include "designer/properties/ColumnPanel.h"
+#include "designer/properties/GridQuestions.h"
+#include "designer/properties/QueryPanel.h"
+#include "designer/properties/TotalCommands.h"
 #include "designer/run/ResultsPanel.h"
 #include "designer/show/ShowCommands.h"
 #include "designer/statement/FindingPlace.h"
@@ -117,7 +121,19 @@ void DesignerWindow::makePanels() {
     mStatement = new StatementPanel(mDocument);
     mResults = new ResultsPanel(mDocument, mDatabase);
     mEvents = new EventPanel;
+    mCurrentColumn = new CurrentColumn(mDocument, *mDrawing, this);
+    mTotals = new TotalCommands(mDocument, *mCurrentColumn, this);
+    mColumn = new ColumnPanel(mDocument, *mCurrentColumn);
+    mQueryPanel = new QueryPanel(mDocument);
     dock(mTables, QStringLiteral("tablesDock"), tr("Tables"), Qt::LeftDockWidgetArea);
+    // Below the tables, once they are asked for.
+    QDockWidget* const column =
+        dock(mColumn, QStringLiteral("columnDock"), tr("Column"), Qt::LeftDockWidgetArea);
+    QDockWidget* const query =
+        dock(mQueryPanel, QStringLiteral("queryDock"), tr("Query"), Qt::LeftDockWidgetArea);
+    tabifyDockWidget(column, query);
+    column->hide();
+    query->hide();
     QDockWidget* const statement =
         dock(mStatement, QStringLiteral("statementDock"), tr("SQL"), Qt::BottomDockWidgetArea);
     QDockWidget* const results =
@@ -216,14 +232,9 @@ void DesignerWindow::makeMenus() {
     mTableCommands.push_back(arrange);
     mTableCommands.push_back(
         command(query, tr("Re&name table\u2026"), "rename", &DesignerWindow::renameTable));
-    // In sight whatever panel is in front.
-    auto* const run = new QToolButton;
-    run->setDefaultAction(mResults->runAction());
-    run->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
-    run->setAutoRaise(true);
-    run->setFocusPolicy(Qt::TabFocus); // a click leaves the keyboard where it is
-    run->setMaximumHeight(menuBar()->sizeHint().height() - 2);
-    menuBar()->setCornerWidget(run);
+    query->addSeparator();
+    query->addMenu(&mTotals->menu());
+    menuBar()->setCornerWidget(makeCorner());
 
     QMenu* const view = add(tr("&View"), "viewMenu");
     QAction* const dark = view->addAction(tr("&Dark colours"));
@@ -253,11 +264,7 @@ void DesignerWindow::makeMenus() {
                 mDrawing->control().SetCurrentTable(QString::fromStdU16String(table->Name()));
     })->setShortcut(Qt::CTRL | Qt::Key_1);
     const auto goTo = [&](const QString& text, const char* name, Qt::Key key, QWidget* panel) {
-        command(go, text, name, [panel] {
-            panel->parentWidget()->show();
-            panel->parentWidget()->raise();
-            panel->setFocus(Qt::ShortcutFocusReason);
-        })->setShortcut(Qt::CTRL | key);
+        command(go, text, name, [this, panel] { this->goTo(*panel); })->setShortcut(Qt::CTRL | key);
     };
     goTo(tr("&Tables"), "goTables", Qt::Key_2, mTables);
     goTo(tr("&SQL"), "goStatement", Qt::Key_3, mStatement);
@@ -265,6 +272,8 @@ void DesignerWindow::makeMenus() {
     connect(go->actions().last(), &QAction::triggered, mResults, &ResultsPanel::goToTable);
     goTo(tr("&Chart"), "goChart", Qt::Key_5, mResults);
     connect(go->actions().last(), &QAction::triggered, mResults, &ResultsPanel::goToChart);
+    goTo(tr("C&olumn"), "goColumn", Qt::Key_6, mColumn);
+    goTo(tr("&Query"), "goQuery", Qt::Key_7, mQueryPanel);
     view->addSeparator();
     const auto panel = [&](const QString& text, const char* name) {
         QAction* const action = findChild<QDockWidget*>(QLatin1String(name))->toggleViewAction();
@@ -275,6 +284,8 @@ void DesignerWindow::makeMenus() {
     panel(tr("&Tables"), "tablesDock");
     panel(tr("&SQL"), "statementDock");
     panel(tr("&Rows"), "resultsDock");
+    panel(tr("C&olumn"), "columnDock");
+    panel(tr("&Query"), "queryDock");
     panel(tr("&Events"), "eventsDock");
 
     QMenu* const help = add(tr("&Help"), "helpMenu");
@@ -286,7 +297,46 @@ void DesignerWindow::makeMenus() {
     command(help, tr("&About"), "about", &DesignerWindow::about);
 }
 
+/// In sight whatever panel is in front.
+QWidget* DesignerWindow::makeCorner() {
+    auto* const corner = new QWidget;
+    auto* const layout = new QHBoxLayout(corner);
+    layout->setContentsMargins({});
+    layout->setSpacing(2);
+    auto* const totals = new QToolButton;
+    totals->setObjectName(QStringLiteral("totals"));
+    totals->setText(QStringLiteral("\u03a3 ")); // apart from the arrow
+    totals->setToolTip(tr("Total of the output column that the grid is in (Ctrl+T)"));
+    totals->setAccessibleName(tr("Total"));
+    totals->setShortcut(Qt::CTRL | Qt::Key_T);
+    totals->setMenu(&mTotals->menu());
+    totals->setPopupMode(QToolButton::InstantPopup);
+    auto* const run = new QToolButton;
+    run->setDefaultAction(mResults->runAction());
+    run->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
+    for (QToolButton* button : {totals, run}) {
+        button->setAutoRaise(true);
+        button->setFocusPolicy(Qt::TabFocus); // a click leaves the keyboard where it is
+        button->setMaximumHeight(menuBar()->sizeHint().height() - 2);
+        layout->addWidget(button);
+    }
+    connect(mCurrentColumn, &CurrentColumn::changed, totals,
+            [this, totals] { totals->setEnabled(mTotals->menu().isEnabled()); });
+    totals->setEnabled(mTotals->menu().isEnabled());
+    return corner;
+}
+
+void DesignerWindow::goTo(QWidget& panel) {
+    panel.parentWidget()->show();
+    panel.parentWidget()->raise();
+    panel.setFocus(Qt::ShortcutFocusReason);
+}
+
 void DesignerWindow::connectParts() {
+    const auto questions = std::make_shared<GridQuestions>(*mTotals, [this] { goTo(*mColumn); });
+    const auto ask = [questions](ZandorWidget* control) { control->setQuestions(questions); };
+    connect(mDrawing, &DrawingArea::controlMade, this, ask);
+    ask(&mDrawing->control());
     mAdding = new TableAdding(mDocument, mDatabase, *mDrawing);
     auto* const target = new TableDropTarget(*mDrawing);
     new GridHint(mDocument, *mDrawing);

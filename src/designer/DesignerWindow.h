@@ -18,14 +18,18 @@ namespace zandor::designer {
 
 class Autosave;
 class Banner;
+class ColumnPanel;
+class CurrentColumn;
 class DatabaseCommands;
 class EventPanel;
 class FileDialogs;
+class QueryPanel;
 class ResultsPanel;
 class ShowCommands;
 class StatementPanel;
 class TableAdding;
 class TablesPanel;
+class TotalCommands;
 
 /// The designer's window: the drawing, and the panels around it.
 class DesignerWindow final : public QMainWindow {
@@ -61,6 +65,8 @@ private:
     QDockWidget* dock(QWidget* panel, const QString& name, const QString& title,
                       Qt::DockWidgetArea area);
     void makeMenus();
+    QWidget* makeCorner();
+    void goTo(QWidget& panel);
     void connectParts();
     void restoreLayout();
     void lookAround();
@@ -94,6 +100,10 @@ private:
     StatementPanel* mStatement;
     ResultsPanel* mResults;
     EventPanel* mEvents;
+    CurrentColumn* mCurrentColumn;
+    TotalCommands* mTotals;
+    ColumnPanel* mColumn;
+    QueryPanel* mQueryPanel;
     TableAdding* mAdding;
     HelpWindow* mHelp = nullptr;          ///< made when it is asked for first
     std::vector<QAction*> mTableCommands; ///< that need a table

@@ -4,6 +4,7 @@
 #include "document/Answers.h"
 
 #include "designer/DesignerWindow.h"
+#include "frontends/qt/GridModel.h"
 #include "frontends/qt/GridWidget.h"
 #include "frontends/qt/TabuletWidget.h"
 

@@ -40,6 +40,11 @@ QString textOf(model::Query& query) {
                     .arg(columnName(query, definition->Column().get()), toQt(definition->Synonym()))
                     .arg(definition->SortOrder())
                     .arg(QLatin1String(definition->Visible() ? "visible" : "hidden"));
+        if (const auto* own = dynamic_cast<const model::ColumnDefinition*>(definition.get())) {
+            if (own->total() != model::Total::None)
+                text += " total " + toQt(platform::String(model::wordOf(own->total())));
+            if (own->isExpression()) text += " expression " + toQt(own->expression().text);
+        }
         for (std::int32_t n = 1; n <= definition->Criteria().Count(); ++n)
             text += " [" + toQt(definition->Criteria().Item(n)->Criterium()) + "]";
         text += "\n";

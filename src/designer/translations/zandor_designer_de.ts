@@ -1379,6 +1379,69 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::ColumnPanel</name>
+    <message>
+        <source>A column, or an expression such as price * (1 - discount)</source>
+        <translation>Eine Spalte oder ein Ausdruck wie price * (1 - discount)</translation>
+    </message>
+    <message>
+        <source>What becomes of the values when rows are put together</source>
+        <translation>Was aus den Werten wird, wenn Zeilen zusammengefasst werden</translation>
+    </message>
+    <message>
+        <source>What the column is called in the rows</source>
+        <translation>Wie die Spalte in den Zeilen heißt</translation>
+    </message>
+    <message>
+        <source>Not sorted</source>
+        <translation>Nicht sortiert</translation>
+    </message>
+    <message>
+        <source>Ascending</source>
+        <translation>Aufsteigend</translation>
+    </message>
+    <message>
+        <source>Descending</source>
+        <translation>Absteigend</translation>
+    </message>
+    <message>
+        <source>as it stands</source>
+        <translation>wie sie steht</translation>
+    </message>
+    <message>
+        <source>Which column sorts first: 1 before 2, and both before those that sort as they stand, from left to right</source>
+        <translation>Welche Spalte zuerst sortiert: 1 vor 2, und beide vor denen, die sortieren, wie sie stehen, von links nach rechts</translation>
+    </message>
+    <message>
+        <source>Sho&amp;wn in the rows</source>
+        <translation>In den &amp;Zeilen gezeigt</translation>
+    </message>
+    <message>
+        <source>Fi&amp;eld:</source>
+        <translation>F&amp;eld:</translation>
+    </message>
+    <message>
+        <source>&amp;Total:</source>
+        <translation>Aus&amp;wertung:</translation>
+    </message>
+    <message>
+        <source>&amp;Name:</source>
+        <translation>&amp;Name:</translation>
+    </message>
+    <message>
+        <source>&amp;Sort:</source>
+        <translation>&amp;Sortierung:</translation>
+    </message>
+    <message>
+        <source>&amp;Priority:</source>
+        <translation>Ran&amp;g:</translation>
+    </message>
+    <message>
+        <source>a column or an expression</source>
+        <translation>eine Spalte oder ein Ausdruck</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
@@ -1689,6 +1752,26 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
         <source>&amp;Chart</source>
         <translation>&amp;Diagramm</translation>
     </message>
+    <message>
+        <source>Column</source>
+        <translation>Spalte</translation>
+    </message>
+    <message>
+        <source>Query</source>
+        <translation>Abfrage</translation>
+    </message>
+    <message>
+        <source>C&amp;olumn</source>
+        <translation>S&amp;palte</translation>
+    </message>
+    <message>
+        <source>Total of the output column that the grid is in (Ctrl+T)</source>
+        <translation>Auswertung der Ausgabespalte, in der das Gitter ist (Strg+T)</translation>
+    </message>
+    <message>
+        <source>Total</source>
+        <translation>Auswertung</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Document</name>
@@ -1861,6 +1944,13 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
+    <name>zandor::designer::GridQuestions</name>
+    <message>
+        <source>C&amp;olumn…</source>
+        <translation>S&amp;palte…</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
@@ -1980,6 +2070,33 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>Untitled</source>
         <translation>Unbenannt</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::QueryPanel</name>
+    <message>
+        <source>E&amp;qual rows only once</source>
+        <translation>&amp;Gleiche Zeilen nur einmal</translation>
+    </message>
+    <message>
+        <source>all</source>
+        <translation>alle</translation>
+    </message>
+    <message>
+        <source>The query itself gives no more rows than these, in the order in which it is sorted</source>
+        <translation>Die Abfrage selbst gibt nicht mehr Zeilen als diese, in der Reihenfolge, in der sie sortiert ist</translation>
+    </message>
+    <message>
+        <source>What the query is for. The file keeps it.</source>
+        <translation>Wofür die Abfrage da ist. Die Datei bewahrt es auf.</translation>
+    </message>
+    <message>
+        <source>Descri&amp;ption:</source>
+        <translation>&amp;Beschreibung:</translation>
+    </message>
+    <message>
+        <source>Fi&amp;rst rows:</source>
+        <translation>E&amp;rste Zeilen:</translation>
     </message>
 </context>
 <context>
@@ -2719,6 +2836,52 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>Texts that are left as they are follow the designer&apos;s language. Emptying one brings its text of that language back.</source>
         <translation>Texte, die so bleiben, folgen der Sprache des Programms. Wer einen leert, bekommt den Text dieser Sprache zurück.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::Total</name>
+    <message>
+        <source>&amp;No total</source>
+        <translation>&amp;Keine Auswertung</translation>
+    </message>
+    <message>
+        <source>&amp;Group by it</source>
+        <translation>Danach &amp;gruppieren</translation>
+    </message>
+    <message>
+        <source>&amp;Count</source>
+        <translation>&amp;Anzahl</translation>
+    </message>
+    <message>
+        <source>Count &amp;different values</source>
+        <translation>Anzahl &amp;verschiedener Werte</translation>
+    </message>
+    <message>
+        <source>&amp;Sum</source>
+        <translation>&amp;Summe</translation>
+    </message>
+    <message>
+        <source>&amp;Average</source>
+        <translation>&amp;Durchschnitt</translation>
+    </message>
+    <message>
+        <source>S&amp;mallest</source>
+        <translation>K&amp;leinster</translation>
+    </message>
+    <message>
+        <source>&amp;Largest</source>
+        <translation>&amp;Größter</translation>
+    </message>
+    <message>
+        <source>C&amp;riteria only</source>
+        <translation>Nur K&amp;riterien</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::TotalCommands</name>
+    <message>
+        <source>&amp;Total</source>
+        <translation>Aus&amp;wertung</translation>
     </message>
 </context>
 <context>

@@ -1379,6 +1379,69 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::ColumnPanel</name>
+    <message>
+        <source>A column, or an expression such as price * (1 - discount)</source>
+        <translation>Una columna o una expresión como price * (1 - discount)</translation>
+    </message>
+    <message>
+        <source>What becomes of the values when rows are put together</source>
+        <translation>Qué se hace con los valores cuando se agrupan filas</translation>
+    </message>
+    <message>
+        <source>What the column is called in the rows</source>
+        <translation>Cómo se llama la columna en las filas</translation>
+    </message>
+    <message>
+        <source>Not sorted</source>
+        <translation>Sin ordenar</translation>
+    </message>
+    <message>
+        <source>Ascending</source>
+        <translation>Ascendente</translation>
+    </message>
+    <message>
+        <source>Descending</source>
+        <translation>Descendente</translation>
+    </message>
+    <message>
+        <source>as it stands</source>
+        <translation>según su posición</translation>
+    </message>
+    <message>
+        <source>Which column sorts first: 1 before 2, and both before those that sort as they stand, from left to right</source>
+        <translation>Qué columna ordena primero: 1 antes que 2, y ambas antes que las que ordenan según su posición, de izquierda a derecha</translation>
+    </message>
+    <message>
+        <source>Sho&amp;wn in the rows</source>
+        <translation>Se &amp;muestra en las filas</translation>
+    </message>
+    <message>
+        <source>Fi&amp;eld:</source>
+        <translation>Camp&amp;o:</translation>
+    </message>
+    <message>
+        <source>&amp;Total:</source>
+        <translation>&amp;Total:</translation>
+    </message>
+    <message>
+        <source>&amp;Name:</source>
+        <translation>&amp;Nombre:</translation>
+    </message>
+    <message>
+        <source>&amp;Sort:</source>
+        <translation>Or&amp;den:</translation>
+    </message>
+    <message>
+        <source>&amp;Priority:</source>
+        <translation>&amp;Prioridad:</translation>
+    </message>
+    <message>
+        <source>a column or an expression</source>
+        <translation>una columna o una expresión</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
@@ -1689,6 +1752,26 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <source>&amp;Chart</source>
         <translation>&amp;Gráfico</translation>
     </message>
+    <message>
+        <source>Column</source>
+        <translation>Columna</translation>
+    </message>
+    <message>
+        <source>Query</source>
+        <translation>Consulta</translation>
+    </message>
+    <message>
+        <source>C&amp;olumn</source>
+        <translation>Co&amp;lumna</translation>
+    </message>
+    <message>
+        <source>Total of the output column that the grid is in (Ctrl+T)</source>
+        <translation>Total de la columna de salida en la que está la cuadrícula (Ctrl+T)</translation>
+    </message>
+    <message>
+        <source>Total</source>
+        <translation>Total</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Document</name>
@@ -1861,6 +1944,13 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
+    <name>zandor::designer::GridQuestions</name>
+    <message>
+        <source>C&amp;olumn…</source>
+        <translation>C&amp;olumna…</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
@@ -1980,6 +2070,33 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>Untitled</source>
         <translation>Sin título</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::QueryPanel</name>
+    <message>
+        <source>E&amp;qual rows only once</source>
+        <translation>Filas i&amp;guales una sola vez</translation>
+    </message>
+    <message>
+        <source>all</source>
+        <translation>todas</translation>
+    </message>
+    <message>
+        <source>The query itself gives no more rows than these, in the order in which it is sorted</source>
+        <translation>La consulta misma no da más filas que estas, en el orden en que se ordena</translation>
+    </message>
+    <message>
+        <source>What the query is for. The file keeps it.</source>
+        <translation>Para qué sirve la consulta. El archivo lo guarda.</translation>
+    </message>
+    <message>
+        <source>Descri&amp;ption:</source>
+        <translation>Descri&amp;pción:</translation>
+    </message>
+    <message>
+        <source>Fi&amp;rst rows:</source>
+        <translation>P&amp;rimeras filas:</translation>
     </message>
 </context>
 <context>
@@ -2719,6 +2836,52 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>Texts that are left as they are follow the designer&apos;s language. Emptying one brings its text of that language back.</source>
         <translation>Los textos que se dejan como están siguen el idioma del programa. Al vaciar uno vuelve el texto de ese idioma.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::Total</name>
+    <message>
+        <source>&amp;No total</source>
+        <translation>&amp;Sin total</translation>
+    </message>
+    <message>
+        <source>&amp;Group by it</source>
+        <translation>&amp;Agrupar por ella</translation>
+    </message>
+    <message>
+        <source>&amp;Count</source>
+        <translation>&amp;Cuenta</translation>
+    </message>
+    <message>
+        <source>Count &amp;different values</source>
+        <translation>Cuenta de valores &amp;distintos</translation>
+    </message>
+    <message>
+        <source>&amp;Sum</source>
+        <translation>S&amp;uma</translation>
+    </message>
+    <message>
+        <source>&amp;Average</source>
+        <translation>&amp;Promedio</translation>
+    </message>
+    <message>
+        <source>S&amp;mallest</source>
+        <translation>M&amp;enor</translation>
+    </message>
+    <message>
+        <source>&amp;Largest</source>
+        <translation>Ma&amp;yor</translation>
+    </message>
+    <message>
+        <source>C&amp;riteria only</source>
+        <translation>Solo c&amp;riterios</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::TotalCommands</name>
+    <message>
+        <source>&amp;Total</source>
+        <translation>&amp;Total</translation>
     </message>
 </context>
 <context>

@@ -1379,6 +1379,69 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::ColumnPanel</name>
+    <message>
+        <source>A column, or an expression such as price * (1 - discount)</source>
+        <translation>Une colonne, ou une expression telle que price * (1 - discount)</translation>
+    </message>
+    <message>
+        <source>What becomes of the values when rows are put together</source>
+        <translation>Ce que deviennent les valeurs quand des lignes sont regroupées</translation>
+    </message>
+    <message>
+        <source>What the column is called in the rows</source>
+        <translation>Le nom de la colonne dans les lignes</translation>
+    </message>
+    <message>
+        <source>Not sorted</source>
+        <translation>Non trié</translation>
+    </message>
+    <message>
+        <source>Ascending</source>
+        <translation>Croissant</translation>
+    </message>
+    <message>
+        <source>Descending</source>
+        <translation>Décroissant</translation>
+    </message>
+    <message>
+        <source>as it stands</source>
+        <translation>comme elle est placée</translation>
+    </message>
+    <message>
+        <source>Which column sorts first: 1 before 2, and both before those that sort as they stand, from left to right</source>
+        <translation>Quelle colonne trie d’abord : 1 avant 2, et les deux avant celles qui trient comme elles sont placées, de gauche à droite</translation>
+    </message>
+    <message>
+        <source>Sho&amp;wn in the rows</source>
+        <translation>A&amp;ffichée dans les lignes</translation>
+    </message>
+    <message>
+        <source>Fi&amp;eld:</source>
+        <translation>Cham&amp;p :</translation>
+    </message>
+    <message>
+        <source>&amp;Total:</source>
+        <translation>&amp;Total :</translation>
+    </message>
+    <message>
+        <source>&amp;Name:</source>
+        <translation>&amp;Nom :</translation>
+    </message>
+    <message>
+        <source>&amp;Sort:</source>
+        <translation>Tr&amp;i :</translation>
+    </message>
+    <message>
+        <source>&amp;Priority:</source>
+        <translation>Prio&amp;rité :</translation>
+    </message>
+    <message>
+        <source>a column or an expression</source>
+        <translation>une colonne ou une expression</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ConnectionBanner</name>
     <message>
         <source>&amp;Reconnect</source>
@@ -1689,6 +1752,26 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <source>&amp;Chart</source>
         <translation>&amp;Graphique</translation>
     </message>
+    <message>
+        <source>Column</source>
+        <translation>Colonne</translation>
+    </message>
+    <message>
+        <source>Query</source>
+        <translation>Requête</translation>
+    </message>
+    <message>
+        <source>C&amp;olumn</source>
+        <translation>C&amp;olonne</translation>
+    </message>
+    <message>
+        <source>Total of the output column that the grid is in (Ctrl+T)</source>
+        <translation>Total de la colonne de sortie où se trouve la grille (Ctrl+T)</translation>
+    </message>
+    <message>
+        <source>Total</source>
+        <translation>Total</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Document</name>
@@ -1861,6 +1944,13 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
+    <name>zandor::designer::GridQuestions</name>
+    <message>
+        <source>C&amp;olumn…</source>
+        <translation>C&amp;olonne…</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::HelpWindow</name>
     <message>
         <source>Help</source>
@@ -1980,6 +2070,33 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>Untitled</source>
         <translation>Sans titre</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::QueryPanel</name>
+    <message>
+        <source>E&amp;qual rows only once</source>
+        <translation>Lignes é&amp;gales une seule fois</translation>
+    </message>
+    <message>
+        <source>all</source>
+        <translation>toutes</translation>
+    </message>
+    <message>
+        <source>The query itself gives no more rows than these, in the order in which it is sorted</source>
+        <translation>La requête elle-même ne donne pas plus de lignes, dans l’ordre de son tri</translation>
+    </message>
+    <message>
+        <source>What the query is for. The file keeps it.</source>
+        <translation>À quoi sert la requête. Le fichier le conserve.</translation>
+    </message>
+    <message>
+        <source>Descri&amp;ption:</source>
+        <translation>Descri&amp;ption :</translation>
+    </message>
+    <message>
+        <source>Fi&amp;rst rows:</source>
+        <translation>P&amp;remières lignes :</translation>
     </message>
 </context>
 <context>
@@ -2719,6 +2836,52 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>Texts that are left as they are follow the designer&apos;s language. Emptying one brings its text of that language back.</source>
         <translation>Les textes laissés tels quels suivent la langue du programme. En vider un rétablit le texte de cette langue.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::Total</name>
+    <message>
+        <source>&amp;No total</source>
+        <translation>&amp;Aucun total</translation>
+    </message>
+    <message>
+        <source>&amp;Group by it</source>
+        <translation>Re&amp;grouper selon elle</translation>
+    </message>
+    <message>
+        <source>&amp;Count</source>
+        <translation>&amp;Nombre</translation>
+    </message>
+    <message>
+        <source>Count &amp;different values</source>
+        <translation>Nombre de valeurs &amp;différentes</translation>
+    </message>
+    <message>
+        <source>&amp;Sum</source>
+        <translation>&amp;Somme</translation>
+    </message>
+    <message>
+        <source>&amp;Average</source>
+        <translation>&amp;Moyenne</translation>
+    </message>
+    <message>
+        <source>S&amp;mallest</source>
+        <translation>&amp;Plus petit</translation>
+    </message>
+    <message>
+        <source>&amp;Largest</source>
+        <translation>P&amp;lus grand</translation>
+    </message>
+    <message>
+        <source>C&amp;riteria only</source>
+        <translation>C&amp;ritères seulement</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::TotalCommands</name>
+    <message>
+        <source>&amp;Total</source>
+        <translation>&amp;Total</translation>
     </message>
 </context>
 <context>

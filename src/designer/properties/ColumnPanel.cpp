@@ -1,0 +1,230 @@
+#include "designer/properties/ColumnPanel.h"
+
+#include "designer/document/Document.h"
+#include "designer/properties/FieldEdit.h"
+#include "designer/properties/TypingEnd.h"
+#include "designer/properties/fields.h"
+#include "designer/properties/totals.h"
+#include "designer/statement/ModelWords.h"
+#include "frontends/qt/ShownText.h"
+
+#include <Zandor/qt/Text.h>
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QFormLayout>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QSignalBlocker>
+#include <QSpinBox>
+#include <QStandardItemModel>
+
+namespace zandor::designer {
+
+using platform::qt::fromQt;
+using platform::qt::toQt;
+
+namespace {
+
+constexpr std::chrono::milliseconds betweenKeys(150);
+
+void setChoosable(QComboBox& combo, int item, bool choosable) {
+    auto* const items = qobject_cast<QStandardItemModel*>(combo.model());
+    if (items && items->item(item)) items->item(item)->setEnabled(choosable);
+}
+
+} // namespace
+
+ColumnPanel::ColumnPanel(Document& document, CurrentColumn& column, QWidget* parent)
+    : QWidget(parent), mDocument(document), mColumn(column) {
+    makeLayout();
+    setFocusProxy(mField);
+    mSoon.setInterval(betweenKeys);
+    mSoon.setSingleShot(true);
+    connect(&mSoon, &QTimer::timeout, this, &ColumnPanel::check);
+    connect(&mDocument, &Document::replaced, this, [this] {
+        for (QLineEdit* edit : {static_cast<QLineEdit*>(mField), mName}) edit->setModified(false);
+    });
+    connect(&mColumn, &CurrentColumn::changed, this, &ColumnPanel::follow);
+    connect(mField, &QLineEdit::textEdited, &mSoon, qOverload<>(&QTimer::start));
+    connect(mField, &QLineEdit::returnPressed, this, &ColumnPanel::takeOver);
+    connect(mName, &QLineEdit::returnPressed, this, &ColumnPanel::takeOver);
+    connect(mTotal, &QComboBox::activated, this, [this](int item) {
+        const auto total = static_cast<model::Total>(mTotal->itemData(item).toInt());
+        change([total](auto& definition) { definition.total(total); });
+    });
+    connect(mSort, &QComboBox::activated, this, [this](int order) {
+        change([order](auto& definition) {
+            definition.SortOrder(static_cast<std::int16_t>(order));
+            if (order == 0) definition.sortPriority(0);
+        });
+    });
+    connect(mPriority, &QSpinBox::valueChanged, this, [this](int value) {
+        change([value](auto& definition) {
+            definition.sortPriority(static_cast<std::int16_t>(value));
+        });
+    });
+    connect(mShown, &QCheckBox::clicked, this,
+            [this](bool on) { change([on](auto& definition) { definition.Visible(on); }); });
+    new TypingEnd(*this, [this] { takeOver(); });
+    follow();
+}
+
+void ColumnPanel::makeLayout() {
+    mField = new FieldEdit(this);
+    mField->setObjectName(QStringLiteral("columnField"));
+    mField->setToolTip(tr("A column, or an expression such as price * (1 - discount)"));
+    mTotal = new QComboBox(this);
+    mTotal->setObjectName(QStringLiteral("columnTotal"));
+    mTotal->setToolTip(tr("What becomes of the values when rows are put together"));
+    for (const model::Total total : allTotals())
+        mTotal->addItem(nameOf(total).remove(u'&'), static_cast<int>(total));
+    mName = new QLineEdit(this);
+    mName->setObjectName(QStringLiteral("columnName"));
+    mName->setToolTip(tr("What the column is called in the rows"));
+    mSort = new QComboBox(this);
+    mSort->setObjectName(QStringLiteral("columnSort"));
+    mSort->addItems({tr("Not sorted"), tr("Ascending"), tr("Descending")});
+    mPriority = new QSpinBox(this);
+    mPriority->setObjectName(QStringLiteral("columnPriority"));
+    mPriority->setRange(0, model::ColumnDefinition::greatestSortPriority);
+    mPriority->setSpecialValueText(tr("as it stands"));
+    mPriority->setKeyboardTracking(false);
+    mPriority->setToolTip(tr("Which column sorts first: 1 before 2, and both before those that "
+                             "sort as they stand, from left to right"));
+    mShown = new QCheckBox(tr("Sho&wn in the rows"), this);
+    mShown->setObjectName(QStringLiteral("columnShown"));
+    mFinding = new QLabel(this);
+    mFinding->setObjectName(QStringLiteral("columnFinding"));
+    mFinding->setTextFormat(Qt::PlainText);
+    mFinding->setWordWrap(true);
+    mFinding->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    for (QComboBox* combo : {mTotal, mSort}) {
+        combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+        combo->setMinimumContentsLength(6);
+        combo->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
+    }
+    auto* const form = new QFormLayout(this);
+    form->setContentsMargins(8, 6, 8, 6);
+    form->setVerticalSpacing(5);
+    // It has the whole width: expressions are long.
+    auto* const field = new QLabel(tr("Fi&eld:"), this);
+    field->setBuddy(mField);
+    form->addRow(field);
+    form->addRow(mField);
+    form->addRow(mFinding);
+    form->addRow(tr("&Total:"), mTotal);
+    form->addRow(tr("&Name:"), mName);
+    form->addRow(tr("&Sort:"), mSort);
+    form->addRow(tr("&Priority:"), mPriority);
+    form->addRow(mShown);
+}
+
+/// Shows the column that the grid is in; what is being typed about one stays until it counts.
+void ColumnPanel::follow() {
+    const auto definition = mColumn.definition();
+    const platform::String key = definition ? definition->Key() : platform::String();
+    if (key == mKey && !mTaking && (mField->isModified() || mName->isModified())) return;
+    mKey = key;
+    const QSignalBlocker quietPriority(mPriority);
+    mField->offer(completions(*mDocument.query()));
+    mField->setEnabled(mDocument.query()->Tables().Count() > 0);
+    for (QWidget* part :
+         {static_cast<QWidget*>(mTotal), static_cast<QWidget*>(mName), static_cast<QWidget*>(mSort),
+          static_cast<QWidget*>(mPriority), static_cast<QWidget*>(mShown)})
+        part->setEnabled(definition != nullptr);
+    mField->setPlaceholderText(definition ? QString() : tr("a column or an expression"));
+    if (definition) {
+        show(*definition);
+    } else {
+        for (QLineEdit* edit : {static_cast<QLineEdit*>(mField), mName}) edit->clear();
+        mTotal->setCurrentIndex(0);
+        mSort->setCurrentIndex(0);
+        mPriority->setValue(0);
+        mShown->setChecked(false);
+    }
+    check();
+}
+
+void ColumnPanel::show(const model::ColumnDefinition& definition) {
+    const auto put = [](QLineEdit& edit, const QString& text) {
+        if (edit.text() != text) edit.setText(text); // which would move the cursor
+        edit.setModified(false);
+    };
+    put(*mField, fieldOf(definition));
+    put(*mName, toQt(definition.Synonym()));
+    const auto type = typeOf(definition);
+    for (int n = 0; n < mTotal->count(); ++n) {
+        const auto total = static_cast<model::Total>(mTotal->itemData(n).toInt());
+        setChoosable(*mTotal, n, canTotal(type, total) || total == definition.total());
+    }
+    mTotal->setCurrentIndex(mTotal->findData(static_cast<int>(definition.total())));
+    mSort->setCurrentIndex(definition.SortOrder());
+    mPriority->setValue(definition.sortPriority());
+    mPriority->setEnabled(definition.SortOrder() != 0);
+    mShown->setChecked(definition.Visible());
+}
+
+/// Says what is wrong with what stands in the field, whether or not it counts yet.
+void ColumnPanel::check() {
+    mSoon.stop();
+    const QString text = mField->text().trimmed();
+    QStringList said;
+    int from = -1;
+    if (!text.isEmpty())
+        for (const auto& finding : findingsOf(*mDocument.query(), mKey, text)) {
+            said << inWords(finding.message);
+            if (finding.kind == model::Finding::Kind::badExpression && from < 0)
+                from = static_cast<int>(finding.position) +
+                       static_cast<int>(mField->text().indexOf(text));
+        }
+    mField->mark(from);
+    const QString all = said.join(u'\n');
+    mFinding->setText(platform::qt::asSigns(all));
+    mFinding->setVisible(!all.isEmpty());
+    mField->setAccessibleDescription(all);
+}
+
+void ColumnPanel::takeOver() {
+    if (mTaking) return;
+    mTaking = true;
+    takeField();
+    takeName();
+    mPriority->interpretText();
+    mTaking = false;
+    follow();
+}
+
+void ColumnPanel::takeField() {
+    if (!mField->isModified()) return;
+    mField->setModified(false);
+    const QString text = mField->text().trimmed();
+    if (text.isEmpty()) return; // as it was: the grid deletes columns
+    const auto definition = mColumn.definition(mKey);
+    if (definition && fieldOf(*definition) == text) return;
+    mDocument.change({}, [&](model::Query& query) {
+        if (const auto known = mColumn.definition(mKey)) return setField(query, *known, text);
+        const auto added = platform::makeRef<model::ColumnDefinition>();
+        setField(query, *added, text);
+        query.AddColumnDefinition(added);
+        mKey = added->Key();
+    });
+}
+
+void ColumnPanel::takeName() {
+    if (!mName->isModified()) return;
+    mName->setModified(false);
+    change([this](auto& definition) { definition.Synonym(fromQt(mName->text().trimmed())); });
+}
+
+/// One step, unless nothing comes of it.
+void ColumnPanel::change(const std::function<void(model::ColumnDefinition&)>& how) {
+    if (!mColumn.definition(mKey)) return;
+    // What was typed before counts first, as a step of its own.
+    if (!mTaking) takeOver();
+    mDocument.change({}, [&](model::Query&) {
+        if (const auto definition = mColumn.definition(mKey)) how(*definition);
+    });
+}
+
+} // namespace zandor::designer

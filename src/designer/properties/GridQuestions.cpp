@@ -1,0 +1,29 @@
+#include "designer/properties/GridQuestions.h"
+
+#include "designer/properties/TotalCommands.h"
+
+#include <Zandor/qt/Text.h>
+
+#include <QCoreApplication>
+
+namespace zandor::designer {
+
+namespace {
+
+class Words {
+    Q_DECLARE_TR_FUNCTIONS(zandor::designer::GridQuestions)
+};
+
+} // namespace
+
+std::vector<TalvikDBxZandor::HostEntry>
+GridQuestions::MenuEntries(const TalvikDBxZandor::MenuPlace& place) {
+    const auto definition = std::dynamic_pointer_cast<model::ColumnDefinition>(place.Definition);
+    auto entries = mTotals.entries(definition);
+    if (place.Source != TalvikDBxZandor::menuSource::grid) return entries;
+    if (!entries.empty()) entries.push_back({u"-", {}});
+    entries.push_back({platform::qt::fromQt(Words::tr("C&olumn\u2026")), mShowColumn});
+    return entries;
+}
+
+} // namespace zandor::designer

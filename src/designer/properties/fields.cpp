@@ -1,0 +1,101 @@
+#include "designer/properties/fields.h"
+
+#include <Zandor/model/Functions.h>
+#include <Zandor/qt/Text.h>
+#include <Zandor/sql/Builder.h>
+
+#include <QRegularExpression>
+
+#include <algorithm>
+#include <iterator>
+
+namespace zandor::designer {
+
+using platform::qt::fromQt;
+using platform::qt::toQt;
+
+namespace {
+
+using TalvikZandorLib::ZDColumn;
+using TalvikZandorLib::ZDTable;
+
+/// Calls with each table of a query and each of its columns.
+void eachColumn(model::Query& query, const auto& what) {
+    for (const auto& table : platform::Each<ZDTable>(query.Tables()))
+        for (const auto& column : platform::Each<ZDColumn>(table->Columns())) what(table, column);
+}
+
+platform::Ref<ZDColumn> columnNamed(model::Query& query, const QString& text) {
+    platform::Ref<ZDColumn> found;
+    eachColumn(query, [&](const auto& table, const auto& column) {
+        const QString name = toQt(table->Name()) + u'.' + toQt(column->Name());
+        if (!found && name.compare(text, Qt::CaseInsensitive) == 0) found = column;
+    });
+    return found;
+}
+
+/// A name that is none of the language's own has to stand in brackets.
+QString written(const QString& name) {
+    static const QRegularExpression bare(QStringLiteral("^[A-Za-z_][A-Za-z0-9_]*$"));
+    if (bare.match(name).hasMatch()) return name;
+    return u'[' + QString(name).replace(u']', QStringLiteral("]]")) + u']';
+}
+
+} // namespace
+
+QString fieldOf(const model::ColumnDefinition& definition) {
+    if (definition.isExpression()) return toQt(definition.expression().text);
+    const auto column = definition.place().column();
+    return column ? toQt(model::Column::field(column)->Name()) : QString();
+}
+
+void setField(model::Query& query, model::ColumnDefinition& definition, const QString& text) {
+    if (const auto column = columnNamed(query, text))
+        definition.Column(column);
+    else
+        definition.expression(fromQt(text));
+}
+
+model::Findings findingsOf(const model::Query& query, const platform::String& key,
+                           const QString& text) {
+    const auto copy = model::Query::restored(query.record());
+    platform::Ref<model::ColumnDefinition> definition;
+    for (const auto& each :
+         platform::Each<TalvikZandorLib::ZDColumnDefinition>(copy->ColumnDefinitions()))
+        if (each->Key() == key)
+            definition = std::dynamic_pointer_cast<model::ColumnDefinition>(each);
+    if (definition) {
+        setField(*copy, *definition, text);
+    } else {
+        definition = platform::makeRef<model::ColumnDefinition>();
+        setField(*copy, *definition, text);
+        copy->AddColumnDefinition(definition);
+    }
+    const auto said = model::sql::statementText(*copy, model::sql::Dialect::SQLite,
+                                                model::sql::ValueForm::literal);
+    model::Findings result;
+    std::copy_if(said.findings.begin(), said.findings.end(), std::back_inserter(result),
+                 [&](const model::Finding& finding) {
+                     return finding.definition == definition->Key() && finding.row == 0;
+                 });
+    return result;
+}
+
+QStringList completions(model::Query& query) {
+    QStringList result;
+    eachColumn(query, [&](const auto& table, const auto& column) {
+        if (column->Name() != model::Column::allColumns)
+            result << written(toQt(table->Name())) + u'.' + written(toQt(column->Name()));
+    });
+    for (const auto& function : model::criteria::functions())
+        result << toQt(platform::String(function.name)) + u'(';
+    result.sort(Qt::CaseInsensitive);
+    return result;
+}
+
+model::ColumnType typeOf(const model::ColumnDefinition& definition) {
+    const auto column = definition.isExpression() ? nullptr : definition.place().column();
+    return column ? column->description().type : model::ColumnType::Unknown;
+}
+
+} // namespace zandor::designer
