@@ -1,6 +1,9 @@
 #include <Zandor/Zandor.h>
 
+#include <Zandor/control/KeyNumber.h>
+
 #include <algorithm>
+#include <set>
 
 namespace TalvikDBxZandor {
 
@@ -173,6 +176,16 @@ void Zandor::RemoveColumnsOf(const String& tableName) {
         if (removable-- == 0) return;
         RemoveColumn(column);
         --column;
+    }
+    if (!Ordered()) return;
+    // Totals and expressions do not begin with the name. A query that knows the order of its
+    // definitions has taken those away itself that went with the table.
+    std::set<std::int32_t> numbers;
+    for (const auto& definition : Definitions())
+        if (isKeyOfNumber(definition->Key())) numbers.insert(numberOfKey(definition->Key()));
+    for (std::int32_t column = last; column >= 1; --column) {
+        const std::int32_t number = sprColumn->ColData(column);
+        if (number != 0 && !numbers.contains(number)) RemoveColumn(column);
     }
 }
 

@@ -271,13 +271,27 @@ void ExpressionPrinter::write(const Operation& operation, Tightness around) {
     if (operation.symbol == Operator::divide) {
         divide(operation);
     } else {
-        value(*operation.left, own);
+        const bool cast = needsRoom(operation);
+        if (cast) mOut.text += u"CAST(";
+        value(*operation.left, cast ? Tightness::disjunction : own);
+        if (cast) mOut.text += u" AS bigint)";
         mOut.text += operation.symbol == Operator::add        ? u" + "
                      : operation.symbol == Operator::subtract ? u" - "
                                                               : u" * ";
         value(*operation.right, sum ? Tightness::product : Tightness::factor);
     }
     if (within) mOut.text += u')';
+}
+
+/// PostgreSQL and SQL Server multiply whole numbers into one of 32 bits, and stop where it is too
+/// small; the other engines have 64.
+bool ExpressionPrinter::needsRoom(const Operation& operation) const {
+    const bool narrow =
+        mOut.dialect == Dialect::PostgreSQL || mOut.dialect == Dialect::SqlServer;
+    return narrow && operation.symbol == Operator::multiply &&
+           operation.type == ColumnType::Integer &&
+           !std::holds_alternative<Value>(operation.left->node) &&
+           !std::holds_alternative<Value>(operation.right->node);
 }
 
 /// Whole numbers are divided as fractions, and by 0 into nothing, as SQLite and MySQL have it.

@@ -63,6 +63,7 @@ private:
     void write(const And& all, Tightness around);
     void write(const Or& any, Tightness around);
     void write(const Operation& operation, Tightness around);
+    bool needsRoom(const Operation& operation) const;
     void divide(const Operation& operation);
     void concatenate(const Operation& operation, Tightness around);
     void write(const Negative& negative, Tightness around);

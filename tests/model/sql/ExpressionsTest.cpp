@@ -89,6 +89,9 @@ TEST_F(Expressions, AreSaidInEveryDialect) {
     EXPECT_EQ(in(mysql, "whole / number"), "t.whole * 1e0 / t.number");
     EXPECT_EQ(in(sqlServer, "whole / 4"), "CAST(t.whole AS float) / 4");
     EXPECT_EQ(in(sqlServer, "whole / 0.0e1"), "CAST(t.whole AS float) / NULLIF(0.0e1, 0)");
+    EXPECT_EQ(in(postgres, "whole * whole"), "CAST(t.whole AS bigint) * t.whole");
+    EXPECT_EQ(in(postgres, "whole * 2"), "t.whole * 2");
+    EXPECT_EQ(in(postgres, "whole * number"), "t.whole * t.number");
     EXPECT_EQ(in(mysql, "text & '!'"), "CONCAT(t.text, '!')");
     EXPECT_EQ(in(sqlServer, "text & whole"), "t.text + CAST(t.whole AS nvarchar(4000))");
     EXPECT_EQ(in(sqlServer, "whole > 1"),

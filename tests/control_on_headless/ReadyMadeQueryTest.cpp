@@ -1,0 +1,57 @@
+#include "model/SmallQuery.h"
+#include "support/Stage.h"
+
+#include <gtest/gtest.h>
+
+using namespace zandor;
+
+using model::Total;
+using platform::String;
+
+namespace {
+
+/// The ready-made query under the control, with what the control's own words have no name for.
+class AReadyMadeQuery : public testing::Test {
+protected:
+    AReadyMadeQuery() {
+        stage->control().DebugSwitch(0);
+        stage->control().OnlyJoin(false);
+    }
+
+    void add(const String& expression, Total total) {
+        const auto definition = platform::makeRef<model::ColumnDefinition>();
+        if (expression.empty())
+            definition->Column(SmallQuery::id(small.orders));
+        else
+            definition->expression(expression);
+        definition->total(total);
+        small.query->AddColumnDefinition(definition);
+    }
+
+    std::vector<String> fields() {
+        std::vector<String> all;
+        for (std::int32_t column = 1; column < 6; ++column) all.push_back(stage->cell(0, column));
+        return all;
+    }
+
+    SmallQuery small;
+    std::unique_ptr<Stage> stage = Stage::open(small.library);
+};
+
+using Fields = std::vector<String>;
+
+} // namespace
+
+TEST_F(AReadyMadeQuery, IsShownWithItsTotalsAndExpressionsAndLosesThemWithTheirTable) {
+    add(u"", Total::Sum);
+    add(u"customers.id + 1", Total::None);
+    add(u"Upper(orders.name)", Total::Count);
+    add(u"", Total::None);
+    stage->control().P_SET_Zandor(small.query);
+    EXPECT_EQ(fields(), (Fields{u"sum(orders.id)", u"customers.id + 1",
+                                u"count(Upper(orders.name))", u"orders.id", u""}));
+    stage->closeTable(1);
+    EXPECT_EQ(fields(), (Fields{u"customers.id + 1", u"", u"", u"", u""}));
+    EXPECT_EQ(small.query->ColumnDefinitions().Count(), 1);
+    EXPECT_TRUE(stage->boxes.empty());
+}
