@@ -40,21 +40,26 @@ std::optional<QString> MariaServer::missing() {
 // Not in TMPDIR: the path of a socket has to be short.
 MariaServer::MariaServer() : mDirectory(QStringLiteral("/tmp/zandor-mariadb-XXXXXX")) {
     if (!mDirectory.isValid()) throw std::runtime_error(mDirectory.errorString().toStdString());
-    const QString data = QStringLiteral("--datadir=") + mDirectory.filePath(QStringLiteral("data"));
+    // A server that begins removes what another one has for a while in the same folder.
+    const QStringList places = {QStringLiteral("--datadir=") +
+                                    mDirectory.filePath(QStringLiteral("data")),
+                                QStringLiteral("--tmpdir=") + mDirectory.path()};
     QProcess install;
     launch(install, QStringLiteral("mariadb-install-db"),
-           QStringList{QStringLiteral("--no-defaults"), data,
-                       QStringLiteral("--auth-root-authentication-method=normal"),
-                       QStringLiteral("--skip-test-db"), QStringLiteral("--skip-name-resolve")} +
+           QStringList{QStringLiteral("--no-defaults")} + places +
+               QStringList{QStringLiteral("--auth-root-authentication-method=normal"),
+                           QStringLiteral("--skip-test-db"),
+                           QStringLiteral("--skip-name-resolve")} +
                quick);
     if (!install.waitForFinished(serverPatience) || install.exitCode() != 0)
         failWithWords(QStringLiteral("mariadb-install-db failed"), install);
     launch(mServer, QStringLiteral("mariadbd"),
-           QStringList{QStringLiteral("--no-defaults"), data,
-                       QStringLiteral("--socket=") + socket(), QStringLiteral("--skip-networking"),
-                       QStringLiteral("--skip-log-bin"),
-                       QStringLiteral("--character-set-server=utf8mb4"),
-                       QStringLiteral("--pid-file=") + mDirectory.filePath(QStringLiteral("pid"))} +
+           QStringList{QStringLiteral("--no-defaults")} + places +
+               QStringList{QStringLiteral("--socket=") + socket(),
+                           QStringLiteral("--skip-networking"), QStringLiteral("--skip-log-bin"),
+                           QStringLiteral("--character-set-server=utf8mb4"),
+                           QStringLiteral("--pid-file=") +
+                               mDirectory.filePath(QStringLiteral("pid"))} +
                quick);
     waitUntilItAnswers();
 }
