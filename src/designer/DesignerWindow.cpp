@@ -353,6 +353,7 @@ void DesignerWindow::connectParts() {
     connect(mStatement, &StatementPanel::findingChosen, this,
             [this](const model::Finding& finding) {
                 showPlace(mDrawing->control(), *mDocument.query(), finding);
+                if (isOfColumn(finding)) goTo(*mColumn);
             });
     connect(mStatement, &StatementPanel::findingsChanged, mDrawing, &DrawingArea::showFindings);
     mEvents->watch(&mDrawing->control());

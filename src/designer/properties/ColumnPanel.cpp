@@ -15,9 +15,12 @@
 #include <QFormLayout>
 #include <QKeyEvent>
 #include <QLabel>
+#include <QScrollArea>
 #include <QSignalBlocker>
 #include <QSpinBox>
 #include <QStandardItemModel>
+
+#include <algorithm>
 
 namespace zandor::designer {
 
@@ -27,6 +30,7 @@ using platform::qt::toQt;
 namespace {
 
 constexpr std::chrono::milliseconds betweenKeys(150);
+constexpr int leastHeight = 210; // logical pixels, unless less is needed
 
 void setChoosable(QComboBox& combo, int item, bool choosable) {
     auto* const items = qobject_cast<QStandardItemModel*>(combo.model());
@@ -104,7 +108,18 @@ void ColumnPanel::makeLayout() {
         combo->setMinimumContentsLength(6);
         combo->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
     }
-    auto* const form = new QFormLayout(this);
+    // What there is to say may need more room than there is.
+    auto* const page = new QWidget;
+    auto* const scrolled = new QScrollArea(this);
+    scrolled->setWidget(page);
+    scrolled->setWidgetResizable(true);
+    scrolled->setFrameShape(QFrame::NoFrame);
+    scrolled->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    scrolled->setFocusPolicy(Qt::NoFocus);
+    auto* const layout = new QVBoxLayout(this);
+    layout->setContentsMargins({});
+    layout->addWidget(scrolled);
+    auto* const form = new QFormLayout(page);
     form->setContentsMargins(8, 6, 8, 6);
     form->setVerticalSpacing(5);
     // It has the whole width: expressions are long.
@@ -118,6 +133,8 @@ void ColumnPanel::makeLayout() {
     form->addRow(tr("&Sort:"), mSort);
     form->addRow(tr("&Priority:"), mPriority);
     form->addRow(mShown);
+    mFinding->hide();
+    scrolled->setMinimumHeight(std::min(page->sizeHint().height(), leastHeight));
 }
 
 /// Shows the column that the grid is in; what is being typed about one stays until it counts.

@@ -1,6 +1,7 @@
 #include "designer/run/SummaryLine.h"
 
 #include "designer/run/ResultTable.h"
+#include "frontends/qt/ShownText.h"
 
 #include <QClipboard>
 #include <QGuiApplication>
@@ -65,7 +66,7 @@ void SummaryLine::goOn() {
 void SummaryLine::say(const QString& words) {
     if (words != text()) {
         setText(words);
-        setToolTip(words);
+        setToolTip(platform::qt::asToolTip(words));
         setCursorPosition(0);
         updateGeometry();
     }

@@ -14,6 +14,8 @@ namespace {
 
 using platform::qt::toQt;
 
+constexpr int firstRow = 1; // of the grid, below the fields
+
 struct Place {
     platform::Ref<model::Table> table;
     platform::Ref<model::Column> column; ///< may be nothing
@@ -56,6 +58,12 @@ int scrolled(int now, int extent, int begin, int end) {
 
 } // namespace
 
+bool isOfColumn(const model::Finding& finding) {
+    using enum model::Finding::Kind;
+    return finding.kind == badExpression || finding.kind == badTotal ||
+           finding.kind == sortNotOutput || finding.kind == definitionWithoutColumn;
+}
+
 void bringIntoView(ZandorWidget& control, const TalvikZandorLib::ZDTable& table) {
     const int width = control.width() * twipsPerPixel;
     // Output columns have the lower pane.
@@ -76,7 +84,8 @@ void showPlace(ZandorWidget& control, model::Query& query, const model::Finding&
         control.SetCurrentTable(toQt(table->Name()));
     }
     // The cell comes last, for it is where one goes on typing.
-    if (finding.row > 0) control.showCell(toQt(finding.definition), finding.row);
+    if (finding.row > 0 || isOfColumn(finding))
+        control.showCell(toQt(finding.definition), std::max<int>(finding.row, firstRow));
 }
 
 } // namespace zandor::designer

@@ -61,7 +61,7 @@ TEST_F(TheHelp, ShowsTablesAsTables) {
             EXPECT_EQ(table->columns(), 2);
             EXPECT_EQ(table->format().border(), 1);
         }
-    EXPECT_EQ(tables, 2);
+    EXPECT_EQ(tables, 5);
     // Marks of Markdown are not left over.
     EXPECT_EQ(page(help).toPlainText().count("`"), 0);
     EXPECT_EQ(page(help).toPlainText().count("|"), 0);

@@ -6,6 +6,7 @@
 #include <QCompleter>
 #include <QDockWidget>
 #include <QLabel>
+#include <QListWidget>
 #include <QSpinBox>
 
 using namespace zandor;
@@ -179,4 +180,20 @@ TEST_F(TheColumnPanel, CountsWhatIsTypedWhenOneTurnsToSomethingElse) {
     window->document().setQuery(platform::makeRef<model::Query>());
     calm();
     EXPECT_EQ(found<QLineEdit>("columnName").text(), "");
+}
+
+TEST_F(TheColumnPanel, IsWhereAFindingAboutAColumnLeads) {
+    found<QDockWidget>("columnDock").hide();
+    window->document().change({}, [&](model::Query&) { definition(2).expression(u"2 * nothing"); });
+    calm();
+    auto& findings = found<QListWidget>("findings");
+    ASSERT_TRUE(until([&] { return findings.count() == 1; }));
+    window->activateWindow();
+    hands::click(*findings.viewport(), findings.visualItemRect(findings.item(0)).center());
+    calm();
+    EXPECT_EQ(grid().currentCol(), 2);
+    EXPECT_TRUE(found<QDockWidget>("columnDock").isVisible());
+    EXPECT_TRUE(until([&] { return field().hasFocus(); }));
+    EXPECT_EQ(field().text(), "2 * nothing");
+    EXPECT_EQ(field().marked(), 4);
 }
