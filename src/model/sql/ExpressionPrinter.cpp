@@ -57,6 +57,10 @@ void Output::column(const ColumnRef& column) {
 }
 
 void ExpressionPrinter::any(const Expression& expression, Tightness around) {
+    // Some forms write their arguments twice, and those of these again.
+    constexpr std::size_t longest = 1'000'000;
+    if (mOut.text.size() > longest)
+        throw Refusal{Refusal::Reason::size, say<MessageCode::statementTooLong>()};
     const bool outer = mWritesOut;
     mWritesOut = outer || mWrittenOut.contains(&expression);
     if (asSmallest(expression)) {
@@ -386,6 +390,13 @@ void ExpressionPrinter::clamped(const Expression& number, StringView least) {
         const bool below = whole->text.front() == u'-' || (least == u"1" && whole->text == u"0");
         // A number of digits only.
         mOut.text += below ? String(least) : whole->text;
+        return;
+    }
+    // GREATEST of PostgreSQL takes no notice of what is missing.
+    if (mOut.dialect == Dialect::SQLite || mOut.dialect == Dialect::MySQL) {
+        mOut.text += mOut.dialect == Dialect::SQLite ? u"MAX(" : u"GREATEST(";
+        value(number, Tightness::disjunction);
+        mOut.text += u", " + String(least) + u')';
         return;
     }
     const bool cast = mOut.dialect == Dialect::PostgreSQL;

@@ -41,6 +41,35 @@ std::size_t depth(const Expression& expression) {
     return deepest + (terms ? parts.size() : 1);
 }
 
+/// How many entries of its stack SQLite's parser takes for one level of a kind of node, at most.
+int entriesFor(const Expression& expression) {
+    if (const auto* call = std::get_if<Call>(&expression.node)) {
+        switch (call->function) {
+        case Function::abs:
+        case Function::length:
+        case Function::upper:
+        case Function::lower:
+        case Function::trim: return 4;
+        case Function::coalesce: return 6;
+        case Function::right: return 14; // with functions of its own inside
+        default: return 9;
+        }
+    }
+    if (const auto* operation = std::get_if<Operation>(&expression.node))
+        return operation->symbol == Operator::divide ? 6 : 3;
+    if (std::holds_alternative<Choice>(expression.node)) return 6;
+    if (std::holds_alternative<Not>(expression.node)) return 4;
+    if (std::holds_alternative<Between>(expression.node)) return 6;
+    return 3;
+}
+
+/// The entries for the deepest way down.
+int entriesOf(const Expression& expression) {
+    int most = 0;
+    for (const Node& part : partsOf(expression)) most = std::max(most, entriesOf(*part));
+    return most + entriesFor(expression);
+}
+
 class Printer {
 public:
     Printer(Dialect dialect, ValueForm form) : mOut{dialect, form} {}
@@ -125,7 +154,9 @@ private:
             mOut.text += u".*";
             return;
         }
-        mExpressions.item(*std::get<Node>(item.what));
+        const Expression& value = *std::get<Node>(item.what);
+        check(value);
+        mExpressions.item(value);
         if (item.name.empty()) return;
         mOut.text += u" AS ";
         mOut.name(item.name);
@@ -181,10 +212,14 @@ private:
             throw Refusal{Refusal::Reason::join, say<MessageCode::unequalFullJoin>(), join.key};
     }
 
-    void check(const Expression& where) const {
+    void check(const Expression& expression) const {
+        if (mOut.dialect != Dialect::SQLite) return;
         constexpr std::size_t deepest = 950; // SQLite takes 1000
-        if (mOut.dialect == Dialect::SQLite && depth(where) > deepest)
+        if (depth(expression) > deepest)
             throw Refusal{Refusal::Reason::size, say<MessageCode::tooManyConditions>()};
+        constexpr int mostEntries = 92; // and 100 of these, some for the statement around
+        if (entriesOf(expression) > mostEntries)
+            throw Refusal{Refusal::Reason::size, say<MessageCode::nestedTooDeepHere>()};
     }
 
     void tableRef(const TableRef& table) {
