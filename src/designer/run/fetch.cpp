@@ -1,7 +1,10 @@
 #include "designer/run/fetch.h"
 
 #include "designer/run/EngineStop.h"
+#include "designer/run/writtenOut.h"
 #include "designer/statement/ModelWords.h"
+
+#include <Zandor/reader/dialectOf.h>
 
 #include <QSqlError>
 #include <QSqlQuery>
@@ -15,9 +18,13 @@ QString words(const QSqlError& error) {
     return said.isEmpty() ? error.driverText().trimmed() : said;
 }
 
-bool send(QSqlQuery& query, const Command& command) {
+bool send(QSqlQuery& query, const QSqlDatabase& database, const Command& command) {
     // Without values not prepared: the driver would look for placeholders in the texts.
     if (command.values.isEmpty()) return query.exec(command.statement);
+    // Prepared, Qt's driver keeps all rows that have a long text, takes 4 GB for a geometry, and
+    // that of ODBC has a zero too many in every text.
+    if (reader::dialectOf(database) == model::sql::Dialect::MySQL)
+        return query.exec(writtenOut(command.statement, command.values));
     if (!query.prepare(command.statement)) return false;
     for (const QVariant& value : command.values) query.addBindValue(value);
     return query.exec();
@@ -34,7 +41,7 @@ public:
     }
 
     Outcome run(const Command& command, Sink& sink) {
-        if (!send(mQuery, command)) return broken();
+        if (!send(mQuery, mConnection.database(), command)) return broken();
         CellReader cells(mQuery, mConnection.database());
         if (const auto error = sink.begin(cells.columns()))
             return leave(Outcome::End::refused, *error);

@@ -1,5 +1,6 @@
 #include "Queries.h"
 #include "model/reader/OneMariaServer.h"
+#include "support/OdbcSources.h"
 
 #include <gmock/gmock.h>
 
@@ -47,7 +48,7 @@ TEST_F(OnMaria, TellsTextsFromBytesWhateverTheirCollation) {
     fetch("SELECT * FROM t");
     EXPECT_EQ(keeper.rows, expected);
     keeper.rows.clear();
-    fetch({"SELECT a, j, u, i, l, b, bl, d, NULL FROM t WHERE d > ?", {1}, {}});
+    fetch({"SELECT * FROM t WHERE d > ? AND a = ?", {1, "Größe"}, {}});
     EXPECT_EQ(keeper.rows, expected);
 }
 
@@ -61,6 +62,23 @@ TEST_F(OnMaria, GivesBitsAsNumbersAndTimesBeyondADay) {
     EXPECT_EQ(keeper.rows,
               QStringList("n:1 | n:5 | n:65 | t:-800:00:00.000001 | t:2024-02-29 01:02:03 | n:7"));
     EXPECT_EQ(keeper.columns.last(), "a`\"b");
+}
+
+TEST_F(OnMaria, FindsByTextsBehindOdbcToo) {
+    const QString driver = QStringLiteral("libmaodbc.so");
+    if (const auto missing = OdbcSources::missing(driver, QStringLiteral("odbc-mariadb")))
+        GTEST_SKIP() << missing->toStdString();
+    runOnMaria({"USE here", "CREATE TABLE t (a text)", "INSERT INTO t VALUES ('it''s \\\\ ?')"});
+    OdbcSources sources;
+    const QString address =
+        "odbc://" + sources.add(driver, {"SOCKET=" + oneMariaServer.server().socket(),
+                                         "DATABASE=here", "USER=root"});
+    const auto query = draw(address, {"t"}, {{"t.a", {"it's \\ ?"}}});
+    EXPECT_EQ(designer::fetch(Database::connectorTo(address, {}),
+                              commandFor(query, model::sql::Dialect::MySQL), keeper, stop)
+                  .end,
+              Outcome::End::complete);
+    EXPECT_EQ(keeper.rows, QStringList("t:it's \\ ?"));
 }
 
 TEST_F(OnMaria, StopsAStatementThatWouldTakeMinutes) {

@@ -77,6 +77,7 @@ protected:
         const Dialect dialect = reader::dialectOf(database());
         const auto text =
             model::sql::statementText(*query, dialect, model::sql::ValueForm::bound, 2);
+        ASSERT_TRUE(text.runnable());
         QSqlQuery rows(database());
         ASSERT_TRUE(rows.prepare(QString::fromStdU16String(text.text)));
         for (const auto& value : text.bindings)
@@ -173,7 +174,7 @@ TEST_F(PostgresOverOdbc, FindsRowsWithMixedNamesAndEveryKindOfValue) {
     expectFound(table, u"I", u"1");
     expectFound(table, u"I", u"<1.5");
     expectFound(table, u"n", u"1.25");
-    expectFound(table, u"t", u"it's \\ [?]");
+    expectFound(table, u"t", u"it's \\ ?");
     expectFound(table, u"t", u"Like IT*");
     expectFound(table, u"d", u"2024-02-29");
     expectFound(table, u"m", u"2024-02-29 01:02:03");
