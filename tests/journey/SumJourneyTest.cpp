@@ -13,9 +13,13 @@
 
 namespace {
 
+std::string nameOf(const QSize& size) {
+    return std::to_string(size.width()) + "x" + std::to_string(size.height());
+}
+
 /// How many orders has each customer, and for how much? Asked of the sample database by somebody
 /// who writes no SQL.
-class TheOrdersOfEachCustomer : public testing::Test {
+class TheOrdersOfEachCustomer : public testing::TestWithParam<QSize> {
 protected:
     const QString amount = QStringLiteral("quantity * unit_price * (1 - discount)");
 
@@ -28,6 +32,16 @@ protected:
             home.environment() + QStringList{"ZANDOR_MAXIMISED=1"});
         await("the tables are there",
               [this] { return designer->query().filter("join ").size() == 2; });
+    }
+
+    /// Scrolls the canvas until a thing is in sight.
+    QPoint find(const QString& thing) {
+        for (const bool away : {false, true})
+            for (int turn = 0; turn < 20 && !designer->isShown(thing); ++turn) {
+                screen.move(designer->place("control vsbTable"));
+                screen.turnWheel(away);
+            }
+        return designer->place(thing);
     }
 
     void awaitColumns(int count) {
@@ -71,24 +85,26 @@ protected:
         EXPECT_EQ(rounded(rows), rounded(expected));
     }
 
+    static std::string size() { return nameOf(GetParam()); }
+
     void tell(const char* how) {
         const Screen::Effort& done = screen.effort();
-        std::printf("by %s: %d clicks, %d turns of the wheel, %d keys, %d letters typed\n", how,
-                    done.clicks, done.turns, done.keys, done.letters);
-        designer->picture(QStringLiteral("sums-") + how);
+        std::printf("%s by %s: %d clicks, %d turns of the wheel, %d keys, %d letters typed\n",
+                    size().c_str(), how, done.clicks, done.turns, done.keys, done.letters);
+        designer->picture(QString::fromStdString("sums-" + size() + "-" + how));
     }
 
     Home home;
-    Screen screen;
+    Screen screen{GetParam()};
     std::unique_ptr<Designer> designer;
 };
 
 } // namespace
 
-TEST_F(TheOrdersOfEachCustomer, AreAskedForWithAMouse) {
-    screen.doubleClick(designer->place("entry customers name"));
+TEST_P(TheOrdersOfEachCustomer, AreAskedForWithAMouse) {
+    screen.doubleClick(find("entry customers name"));
     awaitColumns(1);
-    screen.doubleClick(designer->place("entry orders id"));
+    screen.doubleClick(find("entry orders id"));
     awaitColumns(2);
     designer->choose("cell 3 2", "mnuHost4"); // Count different values
     awaitTotal("different");
@@ -109,7 +125,7 @@ TEST_F(TheOrdersOfEachCustomer, AreAskedForWithAMouse) {
     tell("mouse");
 }
 
-TEST_F(TheOrdersOfEachCustomer, AreAskedForWithoutAMouse) {
+TEST_P(TheOrdersOfEachCustomer, AreAskedForWithoutAMouse) {
     screen.key("ctrl+1");
     screen.key("F6");
     await("the grid has the keyboard",
@@ -147,6 +163,10 @@ TEST_F(TheOrdersOfEachCustomer, AreAskedForWithoutAMouse) {
     checkRows();
     tell("keys");
 }
+
+INSTANTIATE_TEST_SUITE_P(On, TheOrdersOfEachCustomer,
+                         testing::Values(QSize(1024, 600), QSize(1366, 900)),
+                         [](const auto& info) { return nameOf(info.param); });
 
 int main(int argc, char** argv) {
     // Whatever happens, nothing is left behind: the children die with this program.

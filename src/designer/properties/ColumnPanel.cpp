@@ -182,9 +182,15 @@ void ColumnPanel::show(const model::ColumnDefinition& definition) {
     mShown->setChecked(definition.Visible());
 }
 
+void ColumnPanel::showEvent(QShowEvent* event) {
+    QWidget::showEvent(event);
+    check();
+}
+
 /// Says what is wrong with what stands in the field, whether or not it counts yet.
 void ColumnPanel::check() {
     mSoon.stop();
+    if (!isVisible()) return; // it costs a copy of the query
     const QString text = mField->text().trimmed();
     QStringList said;
     int from = -1;

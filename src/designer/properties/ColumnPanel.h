@@ -24,6 +24,9 @@ public:
     /// Both outlive the panel.
     ColumnPanel(Document& document, CurrentColumn& column, QWidget* parent = nullptr);
 
+protected:
+    void showEvent(QShowEvent* event) override;
+
 private:
     void makeLayout();
     void follow();

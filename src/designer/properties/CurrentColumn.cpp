@@ -36,7 +36,8 @@ void CurrentColumn::watch() {
 
 platform::Ref<model::ColumnDefinition> CurrentColumn::definition() const {
     const GridWidget* const cells = grid();
-    if (!cells || cells->currentCol() >= cells->model().cols()) return nullptr;
+    if (!cells || mArea.control().OnlyJoin()) return nullptr;
+    if (cells->currentCol() >= cells->model().cols()) return nullptr;
     const std::int32_t number = cells->model().columnData(cells->currentCol());
     return number > 0 ? definition(u"x" + platform::decimal(number)) : nullptr;
 }

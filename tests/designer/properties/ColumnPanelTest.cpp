@@ -133,6 +133,13 @@ TEST_F(TheColumnPanel, TakesTheNameOfAColumnForTheColumn) {
     calm();
     EXPECT_EQ(field().text(), "orders.id");
     EXPECT_EQ(made(), 1);
+    window->document().change({}, [&](model::Query&) { definition(1).expression(u"2 * id"); });
+    calm();
+    write("columnField", "");
+    hands::key(field(), Qt::Key_Return);
+    calm();
+    EXPECT_EQ(field().text(), "2 * id");
+    EXPECT_EQ(made(), 2);
 }
 
 TEST_F(TheColumnPanel, OffersNamesOfColumnsAndFunctions) {

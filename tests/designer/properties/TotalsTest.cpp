@@ -65,6 +65,11 @@ TEST_F(TheTotals, AreOnlyThoseThatTheValuesCanHave) {
     EXPECT_TRUE(action(Total::Sum).isEnabled());
     goToColumn(3);
     EXPECT_FALSE(found<QToolButton>("totals").isEnabled()) << "a blank column";
+    goToColumn(2);
+    EXPECT_TRUE(found<QToolButton>("totals").isEnabled());
+    window->drawing().setOptions({{"OnlyJoin", true}});
+    calm();
+    EXPECT_FALSE(found<QToolButton>("totals").isEnabled()) << "no grid";
     using model::ColumnType;
     EXPECT_FALSE(designer::canTotal(ColumnType::Blob, Total::Smallest));
     EXPECT_TRUE(designer::canTotal(ColumnType::Unknown, Total::Sum));
