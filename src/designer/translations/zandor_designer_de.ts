@@ -1064,6 +1064,14 @@
         <source>%1 stands beside an expression, which takes its place</source>
         <translation>%1 steht neben einem Ausdruck, der an seine Stelle tritt</translation>
     </message>
+    <message>
+        <source>This is nested deeper than SQLite takes, which is about 30 levels of parentheses: divide it among several columns or rows of criteria.</source>
+        <translation>Das ist tiefer geschachtelt, als SQLite es nimmt, etwa 30 Ebenen von Klammern: auf mehrere Spalten oder Zeilen von Kriterien verteilen.</translation>
+    </message>
+    <message>
+        <source>This is a statement of more than a million characters: put fewer functions into each other, or divide it among several columns.</source>
+        <translation>Das ergibt eine Anweisung von mehr als einer Million Zeichen: weniger Funktionen ineinander setzen oder auf mehrere Spalten verteilen.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

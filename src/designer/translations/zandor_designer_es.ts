@@ -1064,6 +1064,14 @@
         <source>%1 stands beside an expression, which takes its place</source>
         <translation>%1 está junto a una expresión, que ocupa su lugar</translation>
     </message>
+    <message>
+        <source>This is nested deeper than SQLite takes, which is about 30 levels of parentheses: divide it among several columns or rows of criteria.</source>
+        <translation>Esto está anidado más hondo de lo que SQLite admite, unos 30 niveles de paréntesis: repártalo entre varias columnas o filas de criterios.</translation>
+    </message>
+    <message>
+        <source>This is a statement of more than a million characters: put fewer functions into each other, or divide it among several columns.</source>
+        <translation>Esto da una instrucción de más de un millón de caracteres: anide menos funciones o repártala entre varias columnas.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

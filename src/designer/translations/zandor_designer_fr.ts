@@ -1064,6 +1064,14 @@
         <source>%1 stands beside an expression, which takes its place</source>
         <translation>%1 se trouve à côté d’une expression, qui prend sa place</translation>
     </message>
+    <message>
+        <source>This is nested deeper than SQLite takes, which is about 30 levels of parentheses: divide it among several columns or rows of criteria.</source>
+        <translation>C’est imbriqué plus profondément que SQLite ne l’accepte, soit environ 30 niveaux de parenthèses : répartissez-le sur plusieurs colonnes ou lignes de critères.</translation>
+    </message>
+    <message>
+        <source>This is a statement of more than a million characters: put fewer functions into each other, or divide it among several columns.</source>
+        <translation>Cela donne une instruction de plus d’un million de caractères : imbriquez moins de fonctions, ou répartissez-la sur plusieurs colonnes.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>
