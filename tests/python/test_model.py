@@ -177,3 +177,36 @@ def test_a_list_is_a_collection_by_key():
     for call in (lambda: collection.Item(0), lambda: collection.Item("a"), lambda: collection.Remove("a")):
         with pytest.raises(zandor.NumberedError):
             call()
+
+
+def test_output_columns_have_totals_and_expressions(query):
+    definition = zandor.ColumnDefinition()
+    definition.Column = query.Tables.Item(2).Columns.Item(4)
+    query.AddColumnDefinition(definition)
+    assert definition.total == zandor.Total.Nothing
+    definition.total = zandor.Total.Sum
+    definition.sortPriority = 2
+    assert definition.Column.Name == "sum(orders.total)"
+    assert isinstance(definition.Column, zandor.OutputName)
+    copy = zandor.ColumnDefinition()
+    copy.Column = definition.Column
+    assert (copy.total, query.AddColumnDefinition(copy).Column.Name) == (zandor.Total.Sum, "sum(orders.total)")
+    copy.expression = "orders.total * 2"
+    assert (copy.expression, copy.Column.Name) == ("orders.total * 2", "sum(orders.total * 2)")
+    text = zandor.statementText(query, zandor.Dialect.SQLite).text
+    assert "SUM(orders.total * ?)" in text
+    with pytest.raises(TypeError):
+        definition.total = 9
+    with pytest.raises(zandor.NumberedError) as raised:
+        definition.sortPriority = 256
+    assert (raised.value.number, definition.sortPriority) == (380, 2)
+
+
+def test_a_query_says_what_it_asks_for_as_a_whole(query):
+    assert (query.distinct, query.first, query.description) == (False, 0, "")
+    query.distinct, query.first, query.description = True, 10, "Zehn gr\u00f6\u00dfte"
+    assert (query.distinct, query.first, query.description) == (True, 10, "Zehn gr\u00f6\u00dfte")
+    assert "SELECT DISTINCT" in zandor.statementText(query, zandor.Dialect.SQLite).text
+    with pytest.raises(zandor.NumberedError) as raised:
+        query.first = -1
+    assert (raised.value.number, query.first) == (380, 10)

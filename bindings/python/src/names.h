@@ -10,6 +10,7 @@
 #include <Zandor/ZandorWidget.h>
 #include <Zandor/model/Criteria.h>
 #include <Zandor/model/Finding.h>
+#include <Zandor/model/OutputName.h>
 #include <Zandor/sql/Printer.h>
 
 using Path = zandor::files::Path;
@@ -30,9 +31,11 @@ using zandor::model::ColumnType;
 using zandor::model::FieldColumn;
 using zandor::model::Join;
 using zandor::model::Library;
+using zandor::model::OutputName;
 using zandor::model::Query;
 using zandor::model::RowCriterium;
 using zandor::model::Table;
+using zandor::model::Total;
 using zandor::model::sql::Dialect;
 using zandor::model::sql::ValueForm;
 using FindingKind = zandor::model::Finding::Kind;

@@ -33,7 +33,7 @@ struct Interface<TalvikZandorLib::ZDTable> {
 template <>
 struct Interface<TalvikZandorLib::ZDColumn> {
     static constexpr const char* name = "ZDColumn";
-    using Own = std::tuple<model::Column, model::FieldColumn>;
+    using Own = std::tuple<model::Column, model::FieldColumn, model::OutputName>;
     using Adapter = PythonColumn;
 };
 template <>
@@ -74,6 +74,10 @@ const sipTypeDef* typeOf<model::Column>() {
 template <>
 const sipTypeDef* typeOf<model::FieldColumn>() {
     return sipType_FieldColumn;
+}
+template <>
+const sipTypeDef* typeOf<model::OutputName>() {
+    return sipType_OutputName;
 }
 template <>
 const sipTypeDef* typeOf<model::Join>() {

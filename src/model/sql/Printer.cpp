@@ -2,7 +2,10 @@
 
 #include "model/sql/ExpressionPrinter.h"
 
+#include <Zandor/model/Names.h>
+
 #include <algorithm>
+#include <set>
 
 namespace zandor::model::sql {
 
@@ -76,7 +79,9 @@ public:
 
     Printed print(const Statement& statement) {
         writeGroupsOut(statement);
-        mOut.text += statement.distinct ? u"SELECT DISTINCT" : u"SELECT";
+        const bool around = differsAround(statement);
+        if (around) mOut.text += u"SELECT DISTINCT * FROM (\n";
+        mOut.text += statement.distinct && !around ? u"SELECT DISTINCT" : u"SELECT";
         const char16_t* separator = u"\n    ";
         for (const auto& item : statement.items) {
             mOut.text += separator;
@@ -88,13 +93,31 @@ public:
         filter(u"\nWHERE ", statement.where);
         group(statement);
         if (statement.having) having(statement);
-        order(statement);
+        if (around) mOut.text += u"\n) AS totals";
+        order(statement, around);
         paging(statement);
         return {std::move(mOut.text), std::move(mOut.bindings)};
     }
 
 private:
     bool isFor(Dialect dialect) const { return mOut.dialect == dialect; }
+
+    /// MariaDB leaves equal rows of averages in, but for a select around them; which takes no two
+    /// columns of one name.
+    bool differsAround(const Statement& statement) const {
+        if (!isFor(Dialect::MySQL) || !statement.distinct) return false;
+        std::set<String> names;
+        bool totals = false;
+        for (const SelectItem& item : statement.items) {
+            const auto* value = std::get_if<Node>(&item.what);
+            if (!value) return false;
+            totals = totals || holds<Aggregate>(**value);
+            const auto* column = std::get_if<ColumnRef>(&(*value)->node);
+            const String& name = item.name.empty() && column ? column->column : item.name;
+            if (!names.insert(foldedName(name)).second) return false;
+        }
+        return totals;
+    }
 
     /// The number of the item that a value comes out as, from 1; 0 for none.
     static std::size_t itemOf(const Statement& statement, const Node& value) {
@@ -233,7 +256,8 @@ private:
         mOut.name(table.alias);
     }
 
-    void order(const Statement& statement) {
+    /// `byNumber` where the names of tables cannot be seen any more.
+    void order(const Statement& statement, bool byNumber) {
         const bool needed = isFor(Dialect::SqlServer) && (statement.limit || statement.offset);
         if (statement.order.empty() && needed)
             mOut.text += statement.distinct ? u"\nORDER BY 1" : u"\nORDER BY (SELECT NULL)";
@@ -241,7 +265,7 @@ private:
         for (const auto& item : statement.order) {
             mOut.text += separator;
             const bool plain = std::holds_alternative<ColumnRef>(item.value->node);
-            const std::size_t number = plain ? 0 : itemOf(statement, item.value);
+            const std::size_t number = plain && !byNumber ? 0 : itemOf(statement, item.value);
             if (number != 0 && !followsAll(statement, number))
                 mOut.text += platform::decimal(static_cast<std::int64_t>(number));
             else

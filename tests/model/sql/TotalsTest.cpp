@@ -160,8 +160,9 @@ TEST_F(Totals, AndSortsThatAreNotThere) {
     const auto condition = add(u"text", Total::Condition);
     condition->SortOrder(1);
     add(u"whole", Total::Sum);
-    EXPECT_EQ(findings(), "condition(t.text) is only a condition, so that nothing can be sorted by it: choose "
-                          "another total, or take its sort away. (error)\n");
+    EXPECT_EQ(findings(),
+              "condition(t.text) is only a condition, so that nothing can be sorted by it: choose "
+              "another total, or take its sort away. (error)\n");
     condition->total(Total::None);
     EXPECT_EQ(findings(), "");
 }
@@ -203,10 +204,9 @@ TEST_F(Totals, WhatRowsArePutTogetherByIsWrittenOut) {
     add(u"whole", Total::Count);
     const auto bound =
         model::sql::statementText(*query, Dialect::PostgreSQL, model::sql::ValueForm::bound);
-    EXPECT_EQ(toUtf8(bound.text),
-              "SELECT\n    LEFT(t.text, 2) || 'x' AS \"Left(text, 2) & 'x'\",\n"
-              "    COUNT(t.whole) AS \"count(t.whole)\"\nFROM t\n"
-              "GROUP BY LEFT(t.text, 2) || 'x'");
+    EXPECT_EQ(toUtf8(bound.text), "SELECT\n    LEFT(t.text, 2) || 'x' AS \"Left(text, 2) & 'x'\",\n"
+                                  "    COUNT(t.whole) AS \"count(t.whole)\"\nFROM t\n"
+                                  "GROUP BY LEFT(t.text, 2) || 'x'");
     EXPECT_TRUE(bound.bindings.empty());
 }
 
@@ -257,4 +257,17 @@ TEST_F(Totals, ComeOutAllWhereNoneIsShown) {
     add(u"text")->Visible(false);
     add(u"whole", Total::Sum)->Visible(false);
     EXPECT_EQ(sql(), "SELECT\n    t.text,\n    SUM(t.whole)\nFROM t\nGROUP BY t.text");
+}
+
+// MariaDB 10.11 gives "SELECT DISTINCT AVG(1) FROM t GROUP BY id" a row for each group.
+TEST_F(Totals, AreDifferentInMySqlByASelectAroundThem) {
+    add(u"text")->SortOrder(2);
+    add(u"whole", Total::Average);
+    query->options({.distinct = true, .first = 3});
+    EXPECT_EQ(sql(Dialect::MySQL),
+              "SELECT DISTINCT * FROM (\nSELECT\n    t.text,\n"
+              "    AVG(t.whole * 1e0) AS `average(t.whole)`\nFROM t\nGROUP BY t.text\n) AS totals\n"
+              "ORDER BY 1 DESC\nLIMIT 3");
+    add(u"number", Total::Average)->Synonym(u"TEXT");
+    EXPECT_EQ(sql(Dialect::MySQL).substr(0, 16), "SELECT DISTINCT\n");
 }
