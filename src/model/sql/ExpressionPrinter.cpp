@@ -27,6 +27,12 @@ bool isZero(StringView number) {
     return number.find_first_of(u"123456789") >= number.find_first_of(u"eE");
 }
 
+/// A condition that is not put together of others.
+bool isPredicate(const Expression& expression) {
+    return isCondition(expression) && !std::holds_alternative<And>(expression.node) &&
+           !std::holds_alternative<Or>(expression.node);
+}
+
 /// A placeholder of MySQL whose answer has room.
 StringView roomFor(ColumnType type) {
     switch (type) {
@@ -63,15 +69,16 @@ void ExpressionPrinter::any(const Expression& expression, Tightness around) {
         throw Refusal{Refusal::Reason::size, say<MessageCode::statementTooLong>()};
     const bool outer = mWritesOut;
     mWritesOut = outer || mWrittenOut.contains(&expression);
-    if (asSmallest(expression)) {
-        const auto* groups = std::exchange(mGroups, nullptr);
-        mOut.text += u"MIN(";
-        std::visit([&](const auto& part) { write(part, Tightness::disjunction); }, expression.node);
-        mOut.text += u')';
-        mGroups = groups;
-    } else {
-        std::visit([&](const auto& part) { write(part, around); }, expression.node);
-    }
+    const bool within = isPredicate(expression) && around > Tightness::predicate;
+    const bool smallest = asSmallest(expression);
+    const auto* groups = smallest ? std::exchange(mGroups, nullptr) : mGroups;
+    if (within) mOut.text += u'(';
+    if (smallest) mOut.text += u"MIN(";
+    std::visit([&](const auto& part) { write(part, smallest ? Tightness::disjunction : around); },
+               expression.node);
+    if (smallest) mOut.text += u')';
+    if (within) mOut.text += u')';
+    mGroups = groups;
     mWritesOut = outer;
 }
 
@@ -175,18 +182,13 @@ void ExpressionPrinter::write(const Parameter& parameter, Tightness) {
                      : identifier(parameter.name, Dialect::Standard);
 }
 
-void ExpressionPrinter::write(const Compare& compare, Tightness around) {
-    const bool within = around > Tightness::predicate;
-    if (within) mOut.text += u'(';
+void ExpressionPrinter::write(const Compare& compare, Tightness) {
     value(*compare.left, Tightness::joined);
     mOut.text += symbolOf(compare.comparison);
     value(*compare.right, Tightness::joined);
-    if (within) mOut.text += u')';
 }
 
-void ExpressionPrinter::write(const Like& like, Tightness around) {
-    const bool within = around > Tightness::predicate;
-    if (within) mOut.text += u'(';
+void ExpressionPrinter::write(const Like& like, Tightness) {
     likeOperand(*like.operand);
     mOut.text += like.negated ? u" NOT" : u"";
     // The other engines' Like takes no notice of case.
@@ -201,7 +203,6 @@ void ExpressionPrinter::write(const Like& like, Tightness around) {
     }
     const bool byDefault = mOut.dialect == Dialect::PostgreSQL || mOut.dialect == Dialect::MySQL;
     if (escapes && !byDefault) mOut.text += u" ESCAPE '\\'";
-    if (within) mOut.text += u')';
 }
 
 /// PostgreSQL matches nothing but text, and what type the column has may be unknown here.
@@ -214,20 +215,15 @@ void ExpressionPrinter::likeOperand(const Expression& operand) {
     if (cast) mOut.text += u" AS text)";
 }
 
-void ExpressionPrinter::write(const Between& between, Tightness around) {
-    const bool within = around > Tightness::predicate;
-    if (within) mOut.text += u'(';
+void ExpressionPrinter::write(const Between& between, Tightness) {
     value(*between.operand, Tightness::joined);
     mOut.text += between.negated ? u" NOT BETWEEN " : u" BETWEEN ";
     value(*between.low, Tightness::joined);
     mOut.text += u" AND ";
     value(*between.high, Tightness::joined);
-    if (within) mOut.text += u')';
 }
 
-void ExpressionPrinter::write(const In& in, Tightness around) {
-    const bool within = around > Tightness::predicate;
-    if (within) mOut.text += u'(';
+void ExpressionPrinter::write(const In& in, Tightness) {
     value(*in.operand, Tightness::joined);
     mOut.text += in.negated ? u" NOT IN (" : u" IN (";
     const char16_t* separator = u"";
@@ -236,22 +232,18 @@ void ExpressionPrinter::write(const In& in, Tightness around) {
         value(*item, Tightness::joined);
         separator = u", ";
     }
-    mOut.text += within ? u"))" : u")";
+    mOut.text += u')';
 }
 
-void ExpressionPrinter::write(const IsNull& isNull, Tightness around) {
-    const bool within = around > Tightness::predicate;
-    if (within) mOut.text += u'(';
+void ExpressionPrinter::write(const IsNull& isNull, Tightness) {
     value(*isNull.operand, Tightness::joined);
     mOut.text += isNull.negated ? u" IS NOT NULL" : u" IS NULL";
-    if (within) mOut.text += u')';
 }
 
-void ExpressionPrinter::write(const Not& inverse, Tightness around) {
-    const bool within = around > Tightness::predicate;
-    mOut.text += within ? u"(NOT (" : u"NOT (";
+void ExpressionPrinter::write(const Not& inverse, Tightness) {
+    mOut.text += u"NOT (";
     condition(*inverse.operand, Tightness::disjunction);
-    mOut.text += within ? u"))" : u")";
+    mOut.text += u')';
 }
 
 void ExpressionPrinter::write(const And& all, Tightness around) {
@@ -290,8 +282,7 @@ void ExpressionPrinter::write(const Operation& operation, Tightness around) {
 /// PostgreSQL and SQL Server multiply whole numbers into one of 32 bits, and stop where it is too
 /// small; the other engines have 64.
 bool ExpressionPrinter::needsRoom(const Operation& operation) const {
-    const bool narrow =
-        mOut.dialect == Dialect::PostgreSQL || mOut.dialect == Dialect::SqlServer;
+    const bool narrow = mOut.dialect == Dialect::PostgreSQL || mOut.dialect == Dialect::SqlServer;
     return narrow && operation.symbol == Operator::multiply &&
            operation.type == ColumnType::Integer &&
            !std::holds_alternative<Value>(operation.left->node) &&
