@@ -9,6 +9,7 @@
 #include "designer/show/DrawingPicture.h"
 #include "designer/show/savePicture.h"
 #include "designer/statement/ModelWords.h"
+#include "designer/tables/placeTables.h"
 
 #include <Zandor/QueryDocument.h>
 #include <Zandor/files/Replacement.h>
@@ -41,6 +42,8 @@ int failed(const QString& why) {
 int drawQuery(const designer::Arguments& arguments) {
     const auto document = files::loadQuery(designer::pathOf(arguments.drawing));
     if (!document) return refuse(designer::inWords(document.failure()));
+    constexpr int pageWidth = 15000; // twips
+    designer::arrangeUnplaced(*document->query, pageWidth);
     using designer::DrawingPicture;
     const DrawingPicture picture(*document->query, {},
                                  arguments.asShown ? DrawingPicture::Rows::asDrawn

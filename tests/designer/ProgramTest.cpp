@@ -175,6 +175,30 @@ TEST(TheDesignerProgram, DrawsTheTablesOfAQueryFileIntoAPicture) {
     expectRefusal({"--as-shown", query}, "--as-shown goes with --picture only.");
 }
 
+// As of a query that a program has made.
+TEST(TheDesignerProgram, LaysOutAPictureOfTablesThatHaveNoPlace) {
+    DatabaseFolder folder;
+    const QString file = folder.path("query.json");
+    const auto query = openedSample().query;
+    for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(query->Tables())) {
+        table->Left(-1);
+        table->Top(-1);
+        table->Width(0);
+        table->Height(0);
+    }
+    ASSERT_FALSE(files::saveQuery(file.toStdString(), {query}));
+    ASSERT_EQ(run({"--picture", file, folder.path("out.svg")}).code, 0);
+    QFile svg(folder.path("out.svg"));
+    ASSERT_TRUE(svg.open(QIODevice::ReadOnly));
+    const QByteArray drawn = svg.readAll();
+    for (const char* name : {">customers</text>", ">orders</text>", ">order_lines</text>"})
+        EXPECT_TRUE(drawn.contains(name)) << name;
+    ASSERT_EQ(run({"--picture", file, folder.path("out.png")}).code, 0);
+    const QImage picture(folder.path("out.png"));
+    EXPECT_GT(picture.width(), 1500);
+    EXPECT_GT(picture.height(), 500);
+}
+
 TEST(TheDesignerProgram, RefusesAPictureOfABrokenQueryInOneLine) {
     DatabaseFolder folder;
     expectRefusal({"--picture", folder.file("query.json", "{"), folder.path("out.png")},

@@ -7,6 +7,8 @@
 #include <QSqlQuery>
 #include <QSqlRecord>
 
+#include <limits>
+
 namespace zandor::designer {
 
 namespace {
@@ -59,7 +61,11 @@ QString momentText(const QVariant& value) {
 } // namespace
 
 CellReader::CellReader(const QSqlQuery& query, const QSqlDatabase& database)
-    : mQuery(query), mNative(query, database) {
+    // SQLite has no exact decimals, and shows as many digits as a sum of prices has without noise.
+    : mQuery(query), mNative(query, database),
+      mDigits(database.driverName() == QStringLiteral("QSQLITE")
+                  ? std::numeric_limits<double>::digits10
+                  : static_cast<int>(QLocale::FloatingPointShortest)) {
     const QSqlRecord record = query.record();
     for (int i = 0; i < record.count(); ++i) {
         mColumns << mNative.name(i).value_or(record.fieldName(i));
@@ -93,8 +99,7 @@ Cell CellReader::cell(int column) const {
     }
     case QMetaType::Double:
     case QMetaType::Float:
-        return {Cell::Kind::number,
-                QString::number(value.toDouble(), 'g', QLocale::FloatingPointShortest)};
+        return {Cell::Kind::number, QString::number(value.toDouble(), 'g', mDigits)};
     case QMetaType::QString: {
         if (mNative.isBits(column)) return bitsCell(value.toString());
         // Exact decimals come as text.

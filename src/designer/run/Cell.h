@@ -37,6 +37,7 @@ private:
 
     const QSqlQuery& mQuery;
     const NativeResult mNative;
+    const int mDigits; ///< of a fraction
     QStringList mColumns;
     std::vector<bool> mNumbers; ///< whose values are numbers even where they come as text
     Row mRow;

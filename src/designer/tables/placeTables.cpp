@@ -86,6 +86,23 @@ void arrangeGrown(model::Query& query, const Tables& added, int canvasWidth) {
     for (std::size_t n = 0; n < tables.size(); ++n) move(*tables[n], boxes[n], {});
 }
 
+void arrangeUnplaced(model::Query& query, int canvasWidth) {
+    Tables unplaced = tablesOf(query);
+    for (const auto& table : unplaced) {
+        if (table->Width() > 0 && table->Height() > 0) continue;
+        std::size_t longest = table->Name().size();
+        for (const auto& column : Each<TalvikZandorLib::ZDColumn>(table->Columns()))
+            longest = std::max(longest, column->Name().size());
+        const auto entries = static_cast<std::size_t>(table->Columns().Count());
+        const auto size = model::layout::fittedSize(entries, longest);
+        table->Width(static_cast<float>(size.width));
+        table->Height(static_cast<float>(size.height));
+    }
+    std::erase_if(unplaced,
+                  [](const auto& table) { return table->Left() >= 0 && table->Top() >= 0; });
+    if (!unplaced.empty()) arrangeGrown(query, unplaced, canvasWidth);
+}
+
 void arrangeTables(Document& document, int canvasWidth) {
     const auto name =
         QCoreApplication::translate("zandor::designer::TableAdding", "Arrange tables");

@@ -18,6 +18,10 @@ void placeAt(model::Query& query, const std::vector<platform::Ref<model::Table>>
 void arrangeGrown(model::Query& query, const std::vector<platform::Ref<model::Table>>& added,
                   int canvasWidth);
 
+/// Lays a query out in which some tables have no place yet; one in which all have stays. Tables
+/// without a size get one that fits. Twips.
+void arrangeUnplaced(model::Query& query, int canvasWidth);
+
 /// Lays all tables of the document out anew by their joins, as one step. Twips.
 void arrangeTables(Document& document, int canvasWidth);
 

@@ -53,6 +53,12 @@ TEST_F(Fetching, TellsKindsOfValuesApart) {
                           "B:"));
 }
 
+TEST_F(Fetching, LeavesTheNoiseOfSumsOut) {
+    fetch("SELECT 0.1 + 0.2, 45408.759999999995, 1.0 / 3, 1e300 * 10, -2.5e-7");
+    EXPECT_EQ(keeper.rows,
+              QStringList("n:0.3 | n:45408.76 | n:0.333333333333333 | n:1e+301 | n:-2.5e-07"));
+}
+
 TEST_F(Fetching, GivesTheNamesOfColumnsAsTheyAre) {
     fetch("SELECT 1 AS \"a\"\"b\", 2 AS \"\"\"c\"\"\", 3 AS \"Größe ☃\"");
     EXPECT_EQ(keeper.columns, QStringList({"a\"b", "\"c\"", "Größe ☃"}));
