@@ -140,7 +140,12 @@ void Door::markOutput(bool marks) {
             const auto column = control().Hold(definition->Column());
             if (!column) continue;
             columns.insert(column.get());
-            names.insert(column->Name());
+            const String name = column->Name();
+            names.insert(name);
+            // What stands in the parentheses of a total comes out by it.
+            const std::size_t open = name.find(u'(');
+            if (open != String::npos && name.back() == u')')
+                names.insert(name.substr(open + 1, name.size() - open - 2));
         }
     for (const auto& [slot, table] : tables()) {
         const auto held = control().Hold(tableOf(*table));

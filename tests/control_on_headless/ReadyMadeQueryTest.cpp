@@ -42,6 +42,15 @@ using Fields = std::vector<String>;
 
 } // namespace
 
+TEST_F(AReadyMadeQuery, MarksTheColumnsOfItsTotals) {
+    add(u"", Total::Sum);
+    add(u"customers.id + 1", Total::None);
+    stage->control().P_SET_Zandor(small.query);
+    stage->comforts().setFlags({.MarksOutput = true});
+    EXPECT_EQ(stage->look("lstTable(1)").output, std::vector<String>{u"id"});
+    EXPECT_EQ(stage->look("lstTable(2)").output, std::vector<String>{});
+}
+
 TEST_F(AReadyMadeQuery, IsShownWithItsTotalsAndExpressionsAndLosesThemWithTheirTable) {
     add(u"", Total::Sum);
     add(u"customers.id + 1", Total::None);
