@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <vector>
 
 namespace zandor::designer {
 
@@ -25,13 +26,17 @@ void eachColumn(model::Query& query, const auto& what) {
         for (const auto& column : platform::Each<ZDColumn>(table->Columns())) what(table, column);
 }
 
+/// "table.column", or "column" where just one table has it.
 platform::Ref<ZDColumn> columnNamed(model::Query& query, const QString& text) {
     platform::Ref<ZDColumn> found;
+    std::vector<platform::Ref<ZDColumn>> alone;
     eachColumn(query, [&](const auto& table, const auto& column) {
-        const QString name = toQt(table->Name()) + u'.' + toQt(column->Name());
+        const QString own = toQt(column->Name());
+        const QString name = toQt(table->Name()) + u'.' + own;
         if (!found && name.compare(text, Qt::CaseInsensitive) == 0) found = column;
+        if (own != u"*" && own.compare(text, Qt::CaseInsensitive) == 0) alone.push_back(column);
     });
-    return found;
+    return !found && alone.size() == 1 ? alone.front() : found;
 }
 
 /// A name that is none of the language's own has to stand in brackets.

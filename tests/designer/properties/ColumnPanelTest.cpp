@@ -142,6 +142,16 @@ TEST_F(TheColumnPanel, TakesTheNameOfAColumnForTheColumn) {
     EXPECT_EQ(made(), 2);
 }
 
+TEST_F(TheColumnPanel, TakesTheNameThatOneTableHasForItsColumn) {
+    write("columnField", "Unit_price");
+    hands::key(field(), Qt::Key_Escape);
+    hands::key(field(), Qt::Key_Return);
+    calm();
+    EXPECT_FALSE(definition(1).isExpression());
+    EXPECT_EQ(grid().model().text(0, 1), "order_lines.unit_price");
+    EXPECT_EQ(field().text(), "order_lines.unit_price");
+}
+
 TEST_F(TheColumnPanel, OffersNamesOfColumnsAndFunctions) {
     write("columnField", "2 * quan");
     auto* const completer = field().findChild<QCompleter*>();
