@@ -164,8 +164,9 @@ bool Zandor::RemoveTable(std::int16_t Index) {
     return result;
 }
 
-/// Removes the output columns whose field begins with a table's name. The test knows no separator,
-/// so ORDER takes the columns of ORDERS with it: hosts have come to expect it.
+/// Removes the output columns whose field begins with a table's name, and those that went with it
+/// in the model by another. The first test knows no separator, so ORDER takes the columns of ORDERS
+/// with it: hosts have come to expect it.
 void Zandor::RemoveColumnsOf(const String& tableName) {
     const std::int32_t last = sprColumn->Cols() - 1;
     // No more columns than there are can go; without this bound a match in the last column, which
@@ -173,7 +174,7 @@ void Zandor::RemoveColumnsOf(const String& tableName) {
     std::int32_t removable = last;
     for (std::int32_t column = 1; column <= last; ++column) {
         if (!sprColumn->TextMatrix(0, column).starts_with(tableName)) continue;
-        if (removable-- == 0) return;
+        if (removable-- == 0) break;
         RemoveColumn(column);
         --column;
     }

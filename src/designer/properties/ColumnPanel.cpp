@@ -173,7 +173,7 @@ void ColumnPanel::show(const model::ColumnDefinition& definition) {
     const auto type = typeOf(definition);
     for (int n = 0; n < mTotal->count(); ++n) {
         const auto total = static_cast<model::Total>(mTotal->itemData(n).toInt());
-        setChoosable(*mTotal, n, canTotal(type, total) || total == definition.total());
+        setChoosable(*mTotal, n, model::suits(total, type) || total == definition.total());
     }
     mTotal->setCurrentIndex(mTotal->findData(static_cast<int>(definition.total())));
     mSort->setCurrentIndex(definition.SortOrder());

@@ -37,7 +37,7 @@ void TotalCommands::follow() {
     for (QAction* action : mMenu->actions()) {
         if (action->isSeparator()) continue;
         const auto total = static_cast<Total>(action->data().toInt());
-        action->setEnabled(definition && canTotal(typeOf(*definition), total));
+        action->setEnabled(definition && model::suits(total, typeOf(*definition)));
         action->setChecked(definition && definition->total() == total);
     }
 }
@@ -50,7 +50,7 @@ TotalCommands::entries(const platform::Ref<model::ColumnDefinition>& definition)
         // The rarer ones are in the panel of the column.
         if (total == Total::Group || total == Total::Condition || total == definition->total())
             continue;
-        if (!canTotal(typeOf(*definition), total)) continue;
+        if (!model::suits(total, typeOf(*definition))) continue;
         result.push_back({platform::qt::fromQt(nameOf(total)),
                           [this, key = definition->Key(), total] { setTotal(key, total); }});
     }

@@ -4,14 +4,13 @@
 #include <Zandor/qt/Text.h>
 #include <Zandor/sql/Builder.h>
 
-#include <QRegularExpression>
-
 #include <algorithm>
 #include <iterator>
 #include <vector>
 
 namespace zandor::designer {
 
+using model::criteria::writtenName;
 using platform::qt::fromQt;
 using platform::qt::toQt;
 
@@ -37,13 +36,6 @@ platform::Ref<ZDColumn> columnNamed(model::Query& query, const QString& text) {
         if (own != u"*" && own.compare(text, Qt::CaseInsensitive) == 0) alone.push_back(column);
     });
     return !found && alone.size() == 1 ? alone.front() : found;
-}
-
-/// A name that is none of the language's own has to stand in brackets.
-QString written(const QString& name) {
-    static const QRegularExpression bare(QStringLiteral("^[A-Za-z_][A-Za-z0-9_]*$"));
-    if (bare.match(name).hasMatch()) return name;
-    return u'[' + QString(name).replace(u']', QStringLiteral("]]")) + u']';
 }
 
 } // namespace
@@ -90,7 +82,7 @@ QStringList completions(model::Query& query) {
     QStringList result;
     eachColumn(query, [&](const auto& table, const auto& column) {
         if (column->Name() != model::Column::allColumns)
-            result << written(toQt(table->Name())) + u'.' + written(toQt(column->Name()));
+            result << toQt(writtenName(table->Name()) + u'.' + writtenName(column->Name()));
     });
     for (const auto& function : model::criteria::functions())
         result << toQt(platform::String(function.name)) + u'(';

@@ -4,7 +4,6 @@
 
 namespace zandor::designer {
 
-using model::ColumnType;
 using model::Total;
 
 namespace {
@@ -35,17 +34,6 @@ QString nameOf(Total total) {
     case Total::Condition: return Words::tr("C&riteria only");
     }
     return {};
-}
-
-bool canTotal(ColumnType type, Total total) {
-    const bool number = type == ColumnType::Integer || type == ColumnType::Decimal;
-    switch (total) {
-    case Total::Sum:
-    case Total::Average: return number || type == ColumnType::Unknown;
-    case Total::Smallest:
-    case Total::Largest: return type != ColumnType::Boolean && type != ColumnType::Blob;
-    default: return true;
-    }
 }
 
 } // namespace zandor::designer

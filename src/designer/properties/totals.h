@@ -1,6 +1,5 @@
 #pragma once
 
-#include <Zandor/model/Description.h>
 #include <Zandor/model/Total.h>
 
 #include <QString>
@@ -14,8 +13,5 @@ std::span<const model::Total> allTotals();
 
 /// "&Sum", with a mnemonic; None is "&No total".
 QString nameOf(model::Total total);
-
-/// Whether the total of values of this kind makes sense; of an unknown kind all may.
-bool canTotal(model::ColumnType type, model::Total total);
 
 } // namespace zandor::designer

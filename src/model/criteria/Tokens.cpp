@@ -1,5 +1,6 @@
 #include "model/criteria/Tokens.h"
 
+#include <Zandor/model/Functions.h>
 #include <Zandor/model/Names.h>
 
 #include <algorithm>
@@ -197,6 +198,17 @@ bool isBareName(StringView text) {
     return !text.empty() && startsName(text.front()) &&
            std::all_of(text.begin(), text.end(), isNamePart);
 }
+
+String inBrackets(StringView name) {
+    String out = u"[";
+    for (const char16_t c : name) {
+        out += c;
+        if (c == u']') out += c;
+    }
+    return out + u']';
+}
+
+String writtenName(StringView name) { return isBareName(name) ? String(name) : inBrackets(name); }
 
 bool isKeyword(const Token& token, StringView keyword) {
     return token.kind == TokenKind::word && sameName(token.text, keyword);

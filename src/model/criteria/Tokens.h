@@ -55,6 +55,9 @@ bool isBlank(StringView text);
 /// Whether a name can be written without brackets.
 bool isBareName(StringView text);
 
+/// A name in its brackets, a closing one within doubled.
+String inBrackets(StringView name);
+
 /// Whether a word is this keyword; letters count without regard to case.
 bool isKeyword(const Token& token, StringView keyword);
 

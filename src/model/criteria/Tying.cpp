@@ -1,21 +1,12 @@
 #include "model/criteria/Tying.h"
 
+#include <Zandor/model/Functions.h>
+
 #include <Zandor/model/Table.h>
 
 namespace zandor::model::criteria {
 
 namespace {
-
-/// A table's name as a criterion writes it, in brackets where it had some or needs them.
-String written(StringView name, bool bracketed) {
-    if (!bracketed && isBareName(name)) return String(name);
-    String out = u"[";
-    for (const char16_t c : name) {
-        out += c;
-        if (c == u']') out += c;
-    }
-    return out + u']';
-}
 
 TiedText followed(TiedText tied) {
     auto& [text, references] = tied;
@@ -26,7 +17,9 @@ TiedText followed(TiedText tied) {
         if (!reference.namesTable() || !table) continue;
         const std::size_t length = reference.tableEnd - reference.begin;
         const StringView now = StringView(text).substr(reference.begin, length);
-        const String name = written(table->Name(), now.front() == u'[');
+        // In brackets where it had some.
+        const String name =
+            now.front() == u'[' ? inBrackets(table->Name()) : writtenName(table->Name());
         if (now == name) continue;
         text.replace(reference.begin, length, name);
         reference.tableEnd = reference.begin + name.size();

@@ -17,4 +17,16 @@ platform::StringView wordOf(Total total) {
     return {};
 }
 
+bool suits(Total total, ColumnType type) {
+    switch (total) {
+    case Total::Sum:
+    case Total::Average:
+        return type == ColumnType::Integer || type == ColumnType::Decimal ||
+               type == ColumnType::Unknown;
+    case Total::Smallest:
+    case Total::Largest: return type != ColumnType::Boolean && type != ColumnType::Blob;
+    default: return true;
+    }
+}
+
 } // namespace zandor::model

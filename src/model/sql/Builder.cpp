@@ -49,7 +49,7 @@ private:
         std::vector<Ref<const ColumnDefinition>> all;
         for (const auto& item :
              platform::Each<TalvikZandorLib::ZDColumnDefinition>(mQuery.ColumnDefinitions()))
-            all.push_back(std::dynamic_pointer_cast<const ColumnDefinition>(item));
+            all.push_back(std::static_pointer_cast<const ColumnDefinition>(item));
         return all;
     }
 
@@ -87,11 +87,15 @@ private:
             return;
         }
         if (mGrouped && !aggregates(total) && total != Total::Condition) group(output.subject);
-        if (definition.Visible() && total != Total::Condition) addItem(definition, output.subject);
+        if (comesOut(definition)) addItem(definition, output.subject);
         if (aggregates(total)) mTotals.push_back(output.subject.node);
         addSort(definition, output.subject);
         for (const auto& [row, criterium] : definition.criteria().rows())
             addCriterion(definition, output.subject, row, criterium->tied());
+    }
+
+    static bool comesOut(const ColumnDefinition& definition) {
+        return definition.Visible() && definition.total() != Total::Condition;
     }
 
     /// Rows are put together by it; what is said twice is one node.
@@ -122,13 +126,15 @@ private:
     }
 
     void addSort(const ColumnDefinition& definition, const criteria::Subject& subject) {
-        if (definition.SortOrder() == 0) return;
+        // A constant is the same in every row, and engines take a number for that of a column.
+        if (definition.SortOrder() == 0 || std::holds_alternative<Value>(subject.node->node))
+            return;
         if (mGrouped && definition.total() == Total::Condition) {
             report(Finding::Kind::sortNotOutput, definition,
                    say<MessageCode::sortOfCondition>(subject.name));
             return;
         }
-        if (mQuery.options().distinct && !definition.Visible()) {
+        if (mQuery.options().distinct && !comesOut(definition)) {
             report(Finding::Kind::sortNotOutput, definition,
                    say<MessageCode::sortNotOutput>(subject.name));
             return;
@@ -224,7 +230,7 @@ private:
     std::map<std::int16_t, RowTerms> mRows;
     std::map<int, std::vector<OrderItem>> mOrder; ///< by priority
     std::vector<Node> mTotals;
-    bool mGrouped = false;                        ///< rows are put together
+    bool mGrouped = false; ///< rows are put together
 };
 
 } // namespace

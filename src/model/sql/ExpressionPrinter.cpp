@@ -379,8 +379,10 @@ void ExpressionPrinter::piece(const Call& call, StringView piece) {
 void ExpressionPrinter::clamped(const Expression& number, StringView least) {
     if (const auto* whole = std::get_if<Value>(&number.node)) {
         const bool below = whole->text.front() == u'-' || (least == u"1" && whole->text == u"0");
-        // A number of digits only.
-        mOut.text += below ? String(least) : whole->text;
+        // A number of digits only, of which an engine may take 32 bits and no text has more.
+        constexpr std::size_t mostDigits = 9;
+        const bool beyond = whole->text.size() > mostDigits;
+        mOut.text += below ? String(least) : beyond ? String(mostDigits, u'9') : whole->text;
         return;
     }
     // GREATEST of PostgreSQL takes no notice of what is missing.

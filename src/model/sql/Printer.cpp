@@ -162,11 +162,17 @@ private:
     void group(const Statement& statement) {
         const char16_t* separator = u"\nGROUP BY ";
         for (const Node& node : statement.group) {
+            // Engines take a number alone for that of a column, or nothing alone at all.
+            const bool alone = std::holds_alternative<Value>(node->node);
+            if (alone && isFor(Dialect::SqlServer)) continue;
             mOut.text += separator;
-            if (groupedByNumber(statement, node))
+            if (groupedByNumber(statement, node)) {
                 mOut.text += platform::decimal(static_cast<std::int64_t>(itemOf(statement, node)));
-            else
+            } else {
+                if (alone) mOut.text += u"COALESCE(";
                 mExpressions.value(*node, Tightness::disjunction);
+                if (alone) mOut.text += u", NULL)";
+            }
             separator = u", ";
         }
     }

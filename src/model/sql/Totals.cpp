@@ -1,7 +1,5 @@
 #include "model/sql/Totals.h"
 
-#include "model/criteria/Literals.h"
-
 #include <algorithm>
 #include <optional>
 
@@ -126,13 +124,10 @@ void place(const std::map<std::int16_t, RowTerms>& rows, Statement& statement, F
 }
 
 std::optional<Message> refusalOf(Total total, ColumnType type, const String& name) {
-    const bool calculated = total == Total::Sum || total == Total::Average;
-    if (calculated && !criteria::isNumber(type) && type != ColumnType::Unknown)
+    if (suits(total, type)) return {};
+    if (total == Total::Sum || total == Total::Average)
         return say<MessageCode::totalOfNoNumber>(name, wordOf(total));
-    const bool ordered = total == Total::Smallest || total == Total::Largest;
-    if (ordered && (type == ColumnType::Boolean || type == ColumnType::Blob))
-        return say<MessageCode::totalOfNoOrder>(name, wordOf(total));
-    return {};
+    return say<MessageCode::totalOfNoOrder>(name, wordOf(total));
 }
 
 } // namespace zandor::model::sql

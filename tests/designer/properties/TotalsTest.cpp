@@ -71,8 +71,8 @@ TEST_F(TheTotals, AreOnlyThoseThatTheValuesCanHave) {
     calm();
     EXPECT_FALSE(found<QToolButton>("totals").isEnabled()) << "no grid";
     using model::ColumnType;
-    EXPECT_FALSE(designer::canTotal(ColumnType::Blob, Total::Smallest));
-    EXPECT_TRUE(designer::canTotal(ColumnType::Unknown, Total::Sum));
+    EXPECT_FALSE(model::suits(Total::Smallest, ColumnType::Blob));
+    EXPECT_TRUE(model::suits(Total::Sum, ColumnType::Unknown));
 }
 
 TEST_F(TheTotals, AreEntriesOfTheGridsMenu) {

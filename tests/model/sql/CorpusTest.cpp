@@ -27,11 +27,6 @@ bool isSorted(const Case& drawn) {
                        [](const corpus::Column& column) { return column.sort != 0; });
 }
 
-Rows sorted(Rows rows) {
-    rows.sort();
-    return rows;
-}
-
 std::string described(const Rows& rows) {
     return std::to_string(rows.size()) + " rows, first\n" +
            Rows(rows.mid(0, 5)).join(u'\n').toStdString();

@@ -17,6 +17,11 @@
 /// Rows as one text each, written alike for every engine: what is equal reads equal.
 using Rows = QStringList;
 
+inline Rows sorted(Rows rows) {
+    rows.sort();
+    return rows;
+}
+
 /// What came of a statement: rows, or the engine's words.
 struct Outcome {
     Rows rows;
@@ -53,7 +58,6 @@ public:
     const QSqlDatabase& database(zandor::model::sql::Dialect dialect) const;
 
 private:
-
     QTemporaryDir mDirectory;
     std::map<zandor::model::sql::Dialect, QSqlDatabase> mDatabases;
     std::unique_ptr<zandor::reader::DatabaseReader> mReader;

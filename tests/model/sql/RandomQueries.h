@@ -3,8 +3,15 @@
 #include <Zandor/DatabaseReader.h>
 #include <Zandor/sql/Builder.h>
 
+#include <cstdlib>
 #include <map>
 #include <random>
+
+/// A number that a variable of the environment sets.
+inline std::uint32_t fromEnvironment(const char* name, std::uint32_t otherwise) {
+    const char* text = std::getenv(name);
+    return text ? static_cast<std::uint32_t>(std::strtoul(text, nullptr, 10)) : otherwise;
+}
 
 /// Random numbers that are the same on every machine for a seed.
 class Dice {

@@ -5,7 +5,6 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <cstdlib>
 #include <iostream>
 #include <regex>
 #include <set>
@@ -22,11 +21,6 @@ using model::sql::Dialect;
 using model::sql::ValueForm;
 using platform::toUtf8;
 
-std::uint32_t fromEnvironment(const char* name, std::uint32_t otherwise) {
-    const char* text = std::getenv(name);
-    return text ? static_cast<std::uint32_t>(std::strtoul(text, nullptr, 10)) : otherwise;
-}
-
 std::uint32_t seed() {
     static const std::uint32_t theSeed = fromEnvironment("ZANDOR_SEED", 20240501);
     std::cout << "ZANDOR_SEED=" << theSeed << '\n';
@@ -34,11 +28,6 @@ std::uint32_t seed() {
 }
 
 const std::uint32_t howMany = fromEnvironment("ZANDOR_QUERIES", 3000);
-
-Rows sorted(Rows rows) {
-    rows.sort();
-    return rows;
-}
 
 /// What a user typed, for the message of a failure.
 std::string typed(model::Query& query) {

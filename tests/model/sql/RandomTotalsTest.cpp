@@ -5,7 +5,6 @@
 
 #include <gtest/gtest.h>
 
-#include <cstdlib>
 #include <iostream>
 
 using namespace zandor;
@@ -18,16 +17,6 @@ namespace {
 using model::Finding;
 using model::sql::Dialect;
 using platform::toUtf8;
-
-std::uint32_t fromEnvironment(const char* name, std::uint32_t otherwise) {
-    const char* text = std::getenv(name);
-    return text ? static_cast<std::uint32_t>(std::strtoul(text, nullptr, 10)) : otherwise;
-}
-
-Rows sorted(Rows rows) {
-    rows.sort();
-    return rows;
-}
 
 } // namespace
 

@@ -177,6 +177,9 @@ TEST_F(Totals, DifferentRowsAreSortedByWhatComesOut) {
                           "different rows need: show it, or take its sort away. (error)\n");
     hidden->Visible(true);
     EXPECT_EQ(findings(), "");
+    // What is only a condition does not come out either, though nothing is put together.
+    hidden->total(Total::Condition);
+    EXPECT_NE(findings(), "");
 }
 
 TEST_F(Totals, TheFirstOfWhatIsUnsortedAreAny) {

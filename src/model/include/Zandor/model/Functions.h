@@ -16,4 +16,8 @@ struct FunctionName {
 /// All of them, in the order of the page about criteria.
 ZANDOR_MODEL_EXPORT std::span<const FunctionName> functions();
 
+/// A name as criteria and expressions have it: in brackets where it is none without, a closing one
+/// within doubled.
+ZANDOR_MODEL_EXPORT platform::String writtenName(platform::StringView name);
+
 } // namespace zandor::model::criteria

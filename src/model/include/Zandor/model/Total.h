@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/model/Description.h>
 #include <Zandor/model/export.h>
 #include <Zandor/platform/String.h>
 
@@ -31,5 +32,9 @@ ZANDOR_MODEL_EXPORT platform::StringView wordOf(Total total);
 
 /// Whether it is made of the values of several rows.
 constexpr bool aggregates(Total total) { return total >= Total::Count && total <= Total::Largest; }
+
+/// Whether values of a type have the total: sums and averages are of numbers, the smallest and the
+/// largest of what has an order. Of an unknown type all may be.
+ZANDOR_MODEL_EXPORT bool suits(Total total, ColumnType type);
 
 } // namespace zandor::model
