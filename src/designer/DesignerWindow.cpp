@@ -30,6 +30,7 @@
 #include "designer/statement/StatementPanel.h"
 #include "designer/tables/MissingTables.h"
 #include "designer/tables/RenameDialog.h"
+#include "designer/tables/SavedQueryCommands.h"
 #include "designer/tables/TableAdding.h"
 #include "designer/tables/TableDropTarget.h"
 #include "designer/tables/TablesPanel.h"
@@ -94,6 +95,8 @@ DesignerWindow::DesignerWindow()
     connect(statusBar(), &QStatusBar::messageChanged, statusBar(), &QWidget::setToolTip);
     setAcceptDrops(true);
     makePanels();
+    mAdding = new TableAdding(mDocument, mDatabase, *mDrawing);
+    mSavedQueries = new SavedQueryCommands(mDocument, mFile, *mFiles, *mAdding, this);
     makeMenus();
     connectParts();
     // Off screen there is no edge that a window could reach beyond.
@@ -233,6 +236,8 @@ void DesignerWindow::makeMenus() {
     mTableCommands.push_back(
         command(query, tr("Re&name table\u2026"), "rename", &DesignerWindow::renameTable));
     query->addSeparator();
+    query->addActions({&mSavedQueries->addQuery, &mSavedQueries->readAgain});
+    query->addSeparator();
     query->addMenu(&mTotals->menu());
     menuBar()->setCornerWidget(makeCorner());
 
@@ -337,7 +342,6 @@ void DesignerWindow::connectParts() {
     const auto ask = [questions](ZandorWidget* control) { control->setQuestions(questions); };
     connect(mDrawing, &DrawingArea::controlMade, this, ask);
     ask(&mDrawing->control());
-    mAdding = new TableAdding(mDocument, mDatabase, *mDrawing);
     auto* const target = new TableDropTarget(*mDrawing);
     new GridHint(mDocument, *mDrawing);
     new Invitation(mDocument, mDatabase, *mDrawing);
@@ -349,6 +353,10 @@ void DesignerWindow::connectParts() {
     connect(mAdding, &TableAdding::noted, this, &DesignerWindow::tell);
     connect(mAdding, &TableAdding::refused, this,
             [this](const QString& why) { PlainBox::warn(this, tr("Add tables"), why); });
+
+    connect(mSavedQueries, &SavedQueryCommands::noted, this, &DesignerWindow::tell);
+    connect(mSavedQueries, &SavedQueryCommands::refused, this,
+            [this](const QString& why) { PlainBox::warn(this, tr("Add saved query"), why); });
 
     connect(mStatement, &StatementPanel::findingChosen, this,
             [this](const model::Finding& finding) {
@@ -371,6 +379,7 @@ void DesignerWindow::connectParts() {
     connect(mFiles, &FileDialogs::saved, this,
             [this] { tell(tr("Saved as %1.").arg(platform::qt::asSigns(mFile.name()))); });
     connect(mFiles, &FileDialogs::opened, mDatabases, &DatabaseCommands::followFile);
+    connect(mFiles, &FileDialogs::opened, mSavedQueries, &SavedQueryCommands::followFiles);
     connect(&mDocument, &Document::replaced, statusBar(), &QStatusBar::clearMessage);
     connect(mFiles, &FileDialogs::gone, this,
             [this](const QString& message) { statusBar()->showMessage(message); });
@@ -389,8 +398,10 @@ std::optional<QString> DesignerWindow::openAtFirst(const Arguments& arguments,
                                                    const QString& sample) {
     if (arguments.file.endsWith(QLatin1String(".json"), Qt::CaseInsensitive)) {
         const auto error = mFile.open(arguments.file);
-        if (!error) mDatabases->followFile();
-        return error;
+        if (error) return error;
+        mDatabases->followFile();
+        mSavedQueries->followFiles();
+        return {};
     }
     const bool isSample = arguments.file.isEmpty();
     const QString address = isSample ? sample : arguments.file;

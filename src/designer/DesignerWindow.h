@@ -27,6 +27,7 @@ class QueryPanel;
 class ResultsPanel;
 class ShowCommands;
 class StatementPanel;
+class SavedQueryCommands;
 class TableAdding;
 class TablesPanel;
 class TotalCommands;
@@ -105,6 +106,7 @@ private:
     ColumnPanel* mColumn;
     QueryPanel* mQueryPanel;
     TableAdding* mAdding;
+    SavedQueryCommands* mSavedQueries;
     HelpWindow* mHelp = nullptr;          ///< made when it is asked for first
     std::vector<QAction*> mTableCommands; ///< that need a table
     FileDialogs* mFiles;

@@ -6,6 +6,7 @@
 #include "designer/options/Languages.h"
 #include "designer/placeOfSample.h"
 #include "designer/run/spoolSweep.h"
+#include "designer/shell/loadForTask.h"
 #include "designer/show/DrawingPicture.h"
 #include "designer/show/savePicture.h"
 #include "designer/statement/ModelWords.h"
@@ -40,7 +41,7 @@ int failed(const QString& why) {
 
 /// Draws the tables and joins of a query's file into another file.
 int drawQuery(const designer::Arguments& arguments) {
-    const auto document = files::loadQuery(designer::pathOf(arguments.drawing));
+    const auto document = designer::shell::loadForTask(arguments.drawing);
     if (!document) return refuse(designer::inWords(document.failure()));
     constexpr int pageWidth = 15000; // twips
     designer::arrangeUnplaced(*document->query, pageWidth);

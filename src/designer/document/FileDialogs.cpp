@@ -47,11 +47,15 @@ bool FileDialogs::startNew() {
 
 bool FileDialogs::open() {
     if (!mayLose()) return false;
-    QFileDialog dialog(&mWindow, tr("Open query"));
+    const QString path = ask(tr("Open query"));
+    return !path.isEmpty() && openFrom(path);
+}
+
+QString FileDialogs::ask(const QString& title) {
+    QFileDialog dialog(&mWindow, title);
     prepare(dialog, mFile);
     dialog.setFileMode(QFileDialog::ExistingFile);
-    const QString path = chosen(dialog);
-    return !path.isEmpty() && openFrom(path);
+    return chosen(dialog);
 }
 
 bool FileDialogs::open(const QString& path) { return mayLose() && openFrom(path); }

@@ -23,6 +23,8 @@ public:
     /// Asks for a file.
     bool open();
     bool open(const QString& path);
+    /// Asks for a query file for whatever the title says; empty: the user took none.
+    QString ask(const QString& title);
     /// Asks for a file when there is none yet.
     bool save();
     bool saveAs();

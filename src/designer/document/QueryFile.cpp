@@ -75,7 +75,7 @@ std::optional<QString> QueryFile::open(const QString& path) {
 }
 
 std::optional<QString> QueryFile::saveAs(const QString& path) {
-    const auto text = files::toJson(content());
+    const auto text = files::toJson(files::namedFrom(content(), pathOf(path)));
     if (!text) return inWords(text.failure());
     if (const auto error = files::replaceFile(pathOf(path), *text)) return inWords(*error);
     mMark = FileMark::of(path);

@@ -1,6 +1,7 @@
 #include "designer/database/Address.h"
 #include "designer/document/paths.h"
 #include "designer/shell/Task.h"
+#include "designer/shell/loadForTask.h"
 #include "designer/statement/ModelWords.h"
 
 #include <Zandor/QueryDocument.h>
@@ -27,7 +28,7 @@ Dialect dialectFor(const QString& database) {
 } // namespace
 
 int printStatement(const Task& task) {
-    const auto document = files::loadQuery(pathOf(task.query));
+    const auto document = loadForTask(task.query);
     if (!document) return complain(inWords(document.failure())), unusable;
     const Dialect dialect =
         task.dialect ? *task.dialect : dialectFor(QString::fromStdU16String(document->database));

@@ -5,6 +5,7 @@
 #include "designer/shell/Task.h"
 #include "designer/shell/Words.h"
 #include "designer/shell/askPassword.h"
+#include "designer/shell/loadForTask.h"
 #include "designer/statement/ModelWords.h"
 #include "model/reader/serverError.h"
 
@@ -104,7 +105,7 @@ std::unique_ptr<Sink> makeWriter(Format format, files::Output& out) {
 } // namespace
 
 int runQuery(const Task& task) {
-    const auto document = files::loadQuery(pathOf(task.query));
+    const auto document = loadForTask(task.query);
     if (!document) return complain(inWords(document.failure())), unusable;
     const QString address =
         task.database.isEmpty() ? QString::fromStdU16String(document->database) : task.database;

@@ -7,6 +7,8 @@
 #include <Zandor/model/Names.h>
 #include <Zandor/platform/KeyedCollection.h>
 
+#include <QFileInfo>
+
 namespace zandor::designer {
 
 MissingTables::MissingTables(Document& document, Database& database, DrawingArea& area)
@@ -25,15 +27,21 @@ void MissingTables::mark() {
                    model::sameName(entry.id.schema, table.schema());
         });
     };
-    if (mDatabase.isOpen())
-        for (const auto& each :
-             platform::Each<TalvikZandorLib::ZDTable>(mDocument.query()->Tables())) {
-            const auto& table = static_cast<const model::Table&>(*each);
-            if (!isThere(table))
-                notes[QString::fromStdU16String(table.Name())] =
-                    tr("There is no table \"%1\" in %2.")
-                        .arg(QString::fromStdU16String(table.sourceName()), mDatabase.name());
+    const auto noteOn = [&](const model::Table& table) -> QString {
+        if (const auto& saved = table.savedQuery()) {
+            const QString file = QString::fromStdU16String(saved->file);
+            if (file.isEmpty() || QFileInfo::exists(file)) return {};
+            return tr("There is no file \"%1\" any more; the query is as it was read last.")
+                .arg(QFileInfo(file).fileName());
         }
+        if (!mDatabase.isOpen() || isThere(table)) return {};
+        return tr("There is no table \"%1\" in %2.")
+            .arg(QString::fromStdU16String(table.sourceName()), mDatabase.name());
+    };
+    for (const auto& each : platform::Each<TalvikZandorLib::ZDTable>(mDocument.query()->Tables())) {
+        const QString note = noteOn(static_cast<const model::Table&>(*each));
+        if (!note.isEmpty()) notes[QString::fromStdU16String(each->Name())] = note;
+    }
     mArea.control().setTableNotes(notes);
 }
 

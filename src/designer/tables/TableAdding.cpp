@@ -28,7 +28,7 @@ std::vector<TableId> sourcesOf(model::Query& query) {
     std::vector<TableId> sources;
     for (const auto& each : Each<TalvikZandorLib::ZDTable>(query.Tables())) {
         const auto table = std::static_pointer_cast<model::Table>(each);
-        sources.push_back({table->schema(), table->sourceName()});
+        if (!table->savedQuery()) sources.push_back({table->schema(), table->sourceName()});
     }
     return sources;
 }
@@ -40,36 +40,55 @@ TableAdding::TableAdding(Document& document, Database& database, DrawingArea& ar
 
 void TableAdding::add(const std::vector<TableId>& tables, std::optional<QPoint> place) {
     if (tables.empty() || !mDatabase.isOpen()) return;
-    const auto present = static_cast<std::size_t>(mDocument.query()->Tables().Count());
-    if (present + tables.size() > mostTables) {
-        emit refused(
-            tables.size() == 1
-                ? tr("The drawing takes %1 tables, and has them; delete one first.").arg(mostTables)
-                : tr("The drawing takes %1 tables and has %2; choose fewer.")
-                      .arg(mostTables)
-                      .arg(present));
-        return;
-    }
-    if (!readBefore(tables) || !fits(tables)) return;
-
+    if (!hasRoomFor(tables.size()) || !readBefore(tables) || !fits(tables)) return;
+    std::vector<reader::LeftOut> leftOut;
     const QString step =
         tables.size() == 1 ? tr("Add table %1").arg(QString::fromStdU16String(tables.front().name))
                            : tr("Add %1 tables").arg(tables.size());
+    make(step, place, [&](model::Query& query) {
+        const auto added =
+            reader::addTables(query, mDatabase.reader(), tables, canvasWidth(), &leftOut);
+        return added ? *added : TableList(); // it went well on the copy
+    });
+    if (const QString what = leftOutWords(leftOut); !what.isEmpty()) emit noted(what);
+}
+
+void TableAdding::addQuery(const QString& name, const model::SavedQuery& saved,
+                           std::optional<QPoint> place) {
+    if (!hasRoomFor(1)) return;
+    make(tr("Add query %1").arg(name), place, [&](model::Query& query) {
+        const auto table = query.addQuery(name.toStdU16String(), saved);
+        placeFree(query, table, canvasWidth());
+        return TableList{table};
+    });
+}
+
+bool TableAdding::hasRoomFor(std::size_t tables) {
+    const auto present = static_cast<std::size_t>(mDocument.query()->Tables().Count());
+    if (present + tables <= mostTables) return true;
+    emit refused(
+        tables == 1
+            ? tr("The drawing takes %1 tables, and has them; delete one first.").arg(mostTables)
+            : tr("The drawing takes %1 tables and has %2; choose fewer.")
+                  .arg(mostTables)
+                  .arg(present));
+    return false;
+}
+
+void TableAdding::make(const QString& step, std::optional<QPoint> place,
+                       const std::function<TableList(model::Query&)>& how) {
     mDocument.settle();
     const bool arranges = !place && mPlaces.areAll();
     QString last;
-    std::vector<reader::LeftOut> leftOut;
     mDocument.change(step, [&](model::Query& query) {
-        const auto added =
-            reader::addTables(query, mDatabase.reader(), tables, canvasWidth(), &leftOut);
-        if (!added) return; // it went well on the copy
-        if (place) placeAt(query, *added, *place);
-        if (arranges) arrangeGrown(query, *added, canvasWidth());
-        last = QString::fromStdU16String(added->back()->Name());
+        const TableList tables = how(query);
+        if (tables.empty()) return;
+        if (place) placeAt(query, tables, *place);
+        if (arranges) arrangeGrown(query, tables, canvasWidth());
+        last = QString::fromStdU16String(tables.back()->Name());
     });
     if (arranges) mPlaces.note();
     if (!last.isEmpty()) emit added(last);
-    if (const QString what = leftOutWords(leftOut); !what.isEmpty()) emit noted(what);
 }
 
 void TableAdding::arrange() {

@@ -3,14 +3,20 @@
 #include "designer/database/Database.h"
 #include "designer/tables/OwnPlaces.h"
 
+#include <Zandor/Query.h>
+
 #include <QPoint>
+
+#include <functional>
+#include <optional>
 
 namespace zandor::designer {
 
 class Document;
 class DrawingArea;
 
-/// Adds tables of the database to the drawing, with joins by their foreign keys to what is there.
+/// Adds tables of the database to the drawing, with joins by their foreign keys to what is there,
+/// and saved queries.
 class TableAdding final : public QObject {
     Q_OBJECT
 
@@ -22,6 +28,9 @@ public:
     /// arranged as it grows; of another no table is moved. More tables or joins than the drawing
     /// takes are refused.
     void add(const std::vector<reader::TableId>& tables, std::optional<QPoint> place = {});
+    /// A saved query as a table, in the same way.
+    void addQuery(const QString& name, const model::SavedQuery& saved,
+                  std::optional<QPoint> place = {});
     /// Lays all tables out anew, as one step, and from then on as the drawing grows.
     void arrange();
     /// All tables stand now where the designer has put them, and not a person.
@@ -36,6 +45,13 @@ signals:
     void refused(const QString& why);
 
 private:
+    using TableList = std::vector<platform::Ref<model::Table>>;
+
+    /// Refuses them where not.
+    bool hasRoomFor(std::size_t tables);
+    /// As one step of a name, with the tables where they belong.
+    void make(const QString& step, std::optional<QPoint> place,
+              const std::function<TableList(model::Query&)>& how);
     /// False when the user has cancelled it or it was refused.
     bool readBefore(const std::vector<reader::TableId>& tables);
     bool fits(const std::vector<reader::TableId>& tables);

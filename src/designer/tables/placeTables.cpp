@@ -65,7 +65,29 @@ void move(model::Table& table, const Box& box, QPoint by) {
     table.Top(within(box.top + by.y(), box.height));
 }
 
+/// Gives a table without a size one in which its entries have room.
+void fit(model::Table& table) {
+    if (table.Width() > 0 && table.Height() > 0) return;
+    std::size_t longest = table.Name().size();
+    for (const auto& column : Each<TalvikZandorLib::ZDColumn>(table.Columns()))
+        longest = std::max(longest, column->Name().size());
+    const auto entries = static_cast<std::size_t>(table.Columns().Count());
+    const auto size = model::layout::fittedSize(entries, longest);
+    table.Width(static_cast<float>(size.width));
+    table.Height(static_cast<float>(size.height));
+}
+
 } // namespace
+
+void placeFree(model::Query& query, const Ref<model::Table>& added, int canvasWidth) {
+    fit(*added);
+    std::vector<Box> taken;
+    for (const auto& table : tablesOf(query))
+        if (table != added)
+            taken.push_back({table->Left(), table->Top(), table->Width(), table->Height()});
+    const auto boxes = model::layout::arrange(sizesOf({added}), {}, taken, canvasWidth);
+    move(*added, boxes.front(), {});
+}
 
 void placeAt(model::Query& query, const Tables& tables, QPoint place) {
     const auto boxes = arranged(query, tables, canvasEnd / 2);
@@ -88,16 +110,7 @@ void arrangeGrown(model::Query& query, const Tables& added, int canvasWidth) {
 
 void arrangeUnplaced(model::Query& query, int canvasWidth) {
     Tables unplaced = tablesOf(query);
-    for (const auto& table : unplaced) {
-        if (table->Width() > 0 && table->Height() > 0) continue;
-        std::size_t longest = table->Name().size();
-        for (const auto& column : Each<TalvikZandorLib::ZDColumn>(table->Columns()))
-            longest = std::max(longest, column->Name().size());
-        const auto entries = static_cast<std::size_t>(table->Columns().Count());
-        const auto size = model::layout::fittedSize(entries, longest);
-        table->Width(static_cast<float>(size.width));
-        table->Height(static_cast<float>(size.height));
-    }
+    for (const auto& table : unplaced) fit(*table);
     std::erase_if(unplaced,
                   [](const auto& table) { return table->Left() >= 0 && table->Top() >= 0; });
     if (!unplaced.empty()) arrangeGrown(query, unplaced, canvasWidth);

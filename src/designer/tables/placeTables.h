@@ -8,6 +8,9 @@ namespace zandor::designer {
 
 class Document;
 
+/// Puts a table where none of the others is. Twips.
+void placeFree(model::Query& query, const platform::Ref<model::Table>& added, int canvasWidth);
+
 /// Puts tables of a query, arranged among themselves, at a place on the canvas; all of it within
 /// what the control can say.
 void placeAt(model::Query& query, const std::vector<platform::Ref<model::Table>>& tables,

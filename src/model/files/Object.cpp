@@ -63,9 +63,12 @@ json::Items Object::list(std::string_view name, std::size_t most) {
 }
 
 json::Items Object::listOrNone(std::string_view name, std::size_t most) {
-    const bool there = std::any_of(mMembers.begin(), mMembers.end(),
-                                   [&](const json::Member& member) { return member.name == name; });
-    return there ? list(name, most) : json::Items{};
+    return has(name) ? list(name, most) : json::Items{};
+}
+
+bool Object::has(std::string_view name) const {
+    return std::any_of(mMembers.begin(), mMembers.end(),
+                       [&](const json::Member& member) { return member.name == name; });
 }
 
 std::optional<json::Value> Object::take(std::string_view name) {

@@ -35,6 +35,8 @@ public:
     Object object(std::string_view name);
     /// No member, for an object that has none of that name.
     Object objectOrNone(std::string_view name);
+    /// Whether there is a member of a name that was not asked for yet.
+    bool has(std::string_view name) const;
     json::Items list(std::string_view name, std::size_t most);
     json::Items listOrNone(std::string_view name, std::size_t most);
 

@@ -1,4 +1,5 @@
 #include "model/files/Refusal.h"
+#include "model/files/SavedFiles.h"
 #include "model/files/limits.h"
 
 #include <Zandor/files/Descriptor.h>
@@ -23,7 +24,7 @@ Error unread(const Path& path, int number) {
 } // namespace
 
 std::optional<Error> saveQuery(const Path& path, const QueryDocument& document) {
-    const auto text = toJson(document);
+    const auto text = toJson(namedFrom(document, path));
     if (!text) return text.failure();
     return replaceFile(path, *text);
 }
@@ -52,7 +53,7 @@ Result<QueryDocument> loadQuery(const Path& path) {
     if (!document)
         return Error{
             model::say<MessageCode::fileNotUsed>(nameOf(path), document.failure().message)};
-    return document;
+    return namedAbsolutely(std::move(*document), path);
 }
 
 } // namespace zandor::files

@@ -25,11 +25,13 @@ public:
     Unknown unknown = {};
 
 private:
-    void table(Object object);
+    model::QueryRecord query(Object& object);
+    model::SavedQueryRef savedQuery(Object& source, const std::string& owner);
+    model::TableRecord table(Object object);
     model::ColumnRecord column(Object object);
-    void join(Object object);
+    model::JoinRecord join(Object object);
     model::EndRecord end(Object object, const std::string& owner);
-    void definition(Object object);
+    model::DefinitionRecord definition(Object object);
     static std::vector<model::NameRecord> names(Object& owner);
 
     static void each(json::Items items, const Pointer& list,
@@ -39,42 +41,64 @@ private:
 
     void keep(Object&& object, const std::string& owner) {
         json::Members members = std::move(object).unknown();
-        if (!members.empty()) unknown.membersOf[owner] = std::move(members);
+        if (!members.empty()) unknown.membersOf[mWithin + owner] = std::move(members);
     }
 
+    std::string mWithin; ///< the owners of the saved query that is being read; keys are its own
     std::size_t mColumns = 0;
 };
 
 void Reader::read(json::Value file) {
     Object object(std::move(file), {});
-    auto tables = object.list("tables", limits::tables);
-    auto joins = object.list("joins", limits::joins);
-    auto definitions = object.list("definitions", limits::definitions);
     database = object.text("database", String());
-    record.options.distinct = object.flag("distinct", false);
-    record.options.first = object.integer<std::int32_t>("first", 0);
-    record.options.description = object.text("description", String());
-    Object last = object.object("lastKeys");
-    record.lastKeys = {last.integer<std::int32_t>("table"), last.integer<std::int32_t>("column"),
-                       last.integer<std::int32_t>("join"),
-                       last.integer<std::int32_t>("definition")};
-    keep(std::move(last), "lastKeys");
-    each(std::move(tables), object.place() / "tables",
-         [&](Object each) { table(std::move(each)); });
-    each(std::move(joins), object.place() / "joins", [&](Object each) { join(std::move(each)); });
-    each(std::move(definitions), object.place() / "definitions",
-         [&](Object each) { definition(std::move(each)); });
+    record = query(object);
     keep(std::move(object), "");
 }
 
-void Reader::table(Object object) {
+model::QueryRecord Reader::query(Object& object) {
+    model::QueryRecord query;
+    auto tables = object.list("tables", limits::tables);
+    auto joins = object.list("joins", limits::joins);
+    auto definitions = object.list("definitions", limits::definitions);
+    query.options.distinct = object.flag("distinct", false);
+    query.options.first = object.integer<std::int32_t>("first", 0);
+    query.options.description = object.text("description", String());
+    Object last = object.object("lastKeys");
+    query.lastKeys = {last.integer<std::int32_t>("table"), last.integer<std::int32_t>("column"),
+                      last.integer<std::int32_t>("join"), last.integer<std::int32_t>("definition")};
+    keep(std::move(last), "lastKeys");
+    each(std::move(tables), object.place() / "tables",
+         [&](Object each) { query.tables.push_back(table(std::move(each))); });
+    each(std::move(joins), object.place() / "joins",
+         [&](Object each) { query.joins.push_back(join(std::move(each))); });
+    each(std::move(definitions), object.place() / "definitions",
+         [&](Object each) { query.definitions.push_back(definition(std::move(each))); });
+    return query;
+}
+
+model::SavedQueryRef Reader::savedQuery(Object& source, const std::string& owner) {
+    if (!source.has("query")) return {};
+    model::SavedQuery saved;
+    saved.file = source.text("file", String());
+    Object inner = source.object("query");
+    const std::string outside = mWithin;
+    mWithin += owner + "/query/";
+    saved.record = query(inner);
+    mWithin = outside;
+    keep(std::move(inner), owner + "/query");
+    return saved;
+}
+
+model::TableRecord Reader::table(Object object) {
     model::TableRecord table;
     table.key = object.text("key");
     table.name = object.text("name");
     table.selected = object.integer<std::int16_t>("selected", std::int16_t{0});
+    const std::string key = platform::toUtf8(table.key);
     Object source = object.object("source");
     table.schema = source.text("schema", String());
     table.sourceName = source.text("name");
+    table.query = savedQuery(source, key + "/source");
     Object place = object.objectOrNone("place");
     table.left = place.integer<std::int32_t>("left", table.left);
     table.top = place.integer<std::int32_t>("top", table.top);
@@ -87,11 +111,10 @@ void Reader::table(Object object) {
     each(std::move(columns), object.place() / "columns",
          [&](Object each) { table.columns.push_back(column(std::move(each))); });
 
-    const std::string key = platform::toUtf8(table.key);
     keep(std::move(source), key + "/source");
     keep(std::move(place), key + "/place");
     keep(std::move(object), key);
-    record.tables.push_back(std::move(table));
+    return table;
 }
 
 model::ColumnRecord Reader::column(Object object) {
@@ -107,7 +130,7 @@ model::ColumnRecord Reader::column(Object object) {
     return column;
 }
 
-void Reader::join(Object object) {
+model::JoinRecord Reader::join(Object object) {
     model::JoinRecord join;
     join.key = object.text("key");
     const std::string key = platform::toUtf8(join.key);
@@ -116,7 +139,7 @@ void Reader::join(Object object) {
     join.type = object.word("type", words::joinTypes, 0);
     join.comparison = object.word("operator", words::comparisons, 0);
     keep(std::move(object), key);
-    record.joins.push_back(std::move(join));
+    return join;
 }
 
 model::EndRecord Reader::end(Object object, const std::string& owner) {
@@ -142,7 +165,7 @@ std::vector<model::NameRecord> Reader::names(Object& owner) {
     return names;
 }
 
-void Reader::definition(Object object) {
+model::DefinitionRecord Reader::definition(Object object) {
     model::DefinitionRecord definition;
     definition.key = object.text("key");
     definition.column = object.textOrNull("column");
@@ -161,7 +184,7 @@ void Reader::definition(Object object) {
         keep(std::move(each), key + '/' + std::to_string(row));
     });
     keep(std::move(object), key);
-    record.definitions.push_back(std::move(definition));
+    return definition;
 }
 
 /// Takes the members that say what the file is; refuses what is no query of a version that is

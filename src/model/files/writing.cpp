@@ -33,10 +33,12 @@ class Writer {
 public:
     explicit Writer(const Unknown* unknown) : mUnknown(unknown) {}
 
-    json::Value file(const model::QueryRecord& record, const String& database) const;
+    json::Value file(const model::QueryRecord& record, const String& database);
 
 private:
-    json::Value table(const model::TableRecord& table, const Pointer& place) const;
+    void add(json::Members& members, const model::QueryRecord& record, const Pointer& place);
+    json::Value source(const model::TableRecord& table, const Pointer& place);
+    json::Value table(const model::TableRecord& table, const Pointer& place);
     json::Value column(const model::ColumnRecord& column, const Pointer& place) const;
     json::Value join(const model::JoinRecord& join) const;
     json::Value end(const model::EndRecord& end, const std::string& owner) const;
@@ -45,7 +47,7 @@ private:
 
     json::Value whole(json::Members members, const std::string& owner) const {
         if (mUnknown) {
-            const auto at = mUnknown->membersOf.find(owner);
+            const auto at = mUnknown->membersOf.find(mWithin + owner);
             if (at != mUnknown->membersOf.end())
                 members.insert(members.end(), at->second.begin(), at->second.end());
         }
@@ -53,22 +55,20 @@ private:
     }
 
     const Unknown* mUnknown;
+    std::string mWithin; ///< as the reader's
 };
 
-json::Value Writer::file(const model::QueryRecord& record, const String& database) const {
-    json::Items tables;
-    for (const auto& each : record.tables)
-        tables.push_back(table(each, Pointer() / "tables" / tables.size()));
-    json::Items joins;
-    for (const auto& each : record.joins) joins.push_back(join(each));
-    json::Items definitions;
-    for (const auto& each : record.definitions)
-        definitions.push_back(definition(each, Pointer() / "definitions" / definitions.size()));
-    const model::LastKeys& last = record.lastKeys;
+json::Value Writer::file(const model::QueryRecord& record, const String& database) {
     json::Members members = {{"format", {std::string(words::format)}},
                              {"version", json::number(currentVersion)}};
     if (!database.empty())
         members.push_back({"database", textOf(database, Pointer() / "database")});
+    add(members, record, {});
+    return whole(std::move(members), "");
+}
+
+void Writer::add(json::Members& members, const model::QueryRecord& record, const Pointer& place) {
+    const model::LastKeys& last = record.lastKeys;
     members.push_back({"lastKeys", whole({{"table", json::number(last.table)},
                                           {"column", json::number(last.column)},
                                           {"join", json::number(last.join)},
@@ -78,23 +78,45 @@ json::Value Writer::file(const model::QueryRecord& record, const String& databas
     if (options.distinct) members.push_back({"distinct", {true}});
     if (options.first != 0) members.push_back({"first", json::number(options.first)});
     if (!options.description.empty())
-        members.push_back({"description", textOf(options.description, Pointer() / "description")});
+        members.push_back({"description", textOf(options.description, place / "description")});
+    json::Items tables;
+    for (const auto& each : record.tables)
+        tables.push_back(table(each, place / "tables" / tables.size()));
     members.push_back({"tables", {std::move(tables)}});
+    json::Items joins;
+    for (const auto& each : record.joins) joins.push_back(join(each));
     members.push_back({"joins", {std::move(joins)}});
+    json::Items definitions;
+    for (const auto& each : record.definitions)
+        definitions.push_back(definition(each, place / "definitions" / definitions.size()));
     members.push_back({"definitions", {std::move(definitions)}});
-    return whole(std::move(members), "");
 }
 
-json::Value Writer::table(const model::TableRecord& table, const Pointer& place) const {
+json::Value Writer::source(const model::TableRecord& table, const Pointer& place) {
+    const std::string owner = platform::toUtf8(table.key) + "/source";
+    json::Members members = {{"schema", textOf(table.schema, place / "schema")},
+                             {"name", textOf(table.sourceName, place / "name")}};
+    if (table.query) {
+        if (!table.query->file.empty())
+            members.push_back({"file", textOf(table.query->file, place / "file")});
+        const std::string outside = mWithin;
+        mWithin += owner + "/query/";
+        json::Members query;
+        add(query, table.query->record, place / "query");
+        mWithin = outside;
+        members.push_back({"query", whole(std::move(query), owner + "/query")});
+    }
+    return whole(std::move(members), owner);
+}
+
+json::Value Writer::table(const model::TableRecord& table, const Pointer& place) {
     json::Items columns;
     for (const auto& each : table.columns)
         columns.push_back(column(each, place / "columns" / columns.size()));
     const std::string key = platform::toUtf8(table.key);
     return whole({{"key", {key}},
                   {"name", textOf(table.name, place / "name")},
-                  {"source", whole({{"schema", textOf(table.schema, place / "source" / "schema")},
-                                    {"name", textOf(table.sourceName, place / "source" / "name")}},
-                                   key + "/source")},
+                  {"source", source(table, place / "source")},
                   {"place", whole({{"left", json::number(table.left)},
                                    {"top", json::number(table.top)},
                                    {"width", json::number(table.width)},

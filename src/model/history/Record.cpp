@@ -23,6 +23,21 @@ std::optional<std::int32_t> keyNumber(StringView key, char16_t letter) {
     return static_cast<std::int32_t>(number);
 }
 
+SavedQueryRef::SavedQueryRef(SavedQuery query)
+    : mQuery(std::make_shared<const SavedQuery>(std::move(query))) {}
+
+bool operator==(const SavedQueryRef& left, const SavedQueryRef& right) {
+    if (left.mQuery == right.mQuery) return true;
+    return left && right && *left == *right;
+}
+
+int depthOf(const QueryRecord& record) {
+    int deepest = 0;
+    for (const TableRecord& table : record.tables)
+        if (table.query) deepest = std::max(deepest, depthOf(table.query->record) + 1);
+    return deepest;
+}
+
 namespace {
 
 std::string at(const char* list, std::size_t position) {
@@ -32,7 +47,9 @@ std::string at(const char* list, std::size_t position) {
 /// Walks a record and keeps the first fault that it meets.
 class Check {
 public:
-    explicit Check(const QueryRecord& record) : mRecord(record) {}
+    /// `place` is where the record stands in another one.
+    explicit Check(const QueryRecord& record, std::string place = {})
+        : mRecord(record), mPlace(std::move(place)) {}
 
     std::optional<RecordFault> run() {
         lastKey("table", mRecord.lastKeys.table);
@@ -53,7 +70,9 @@ public:
 private:
     template <MessageCode code, class... Arguments>
     void fault(const std::string& path, const Arguments&... arguments) {
-        if (!mFault) mFault = RecordFault{path, say<code>('/' + path, arguments...)};
+        if (mFault) return;
+        const std::string whole = mPlace + path;
+        mFault = RecordFault{whole, say<code>('/' + whole, arguments...)};
     }
 
     void lastKey(const char* kind, std::int32_t last) {
@@ -88,6 +107,8 @@ private:
             key(column.key, u'c', mRecord.lastKeys.column, path + at("columns", n) + "key");
             mTableOf.emplace(column.key, table.key);
         }
+        if (table.query && !mFault)
+            mFault = Check(table.query->record, mPlace + path + "source/query/").run();
     }
 
     void end(const EndRecord& end, const std::string& path) {
@@ -158,6 +179,7 @@ private:
     }
 
     const QueryRecord& mRecord;
+    const std::string mPlace;
     std::unordered_set<String> mKeys;
     std::unordered_set<String> mNames;
     std::unordered_map<String, String> mTableOf; ///< by the key of a column
@@ -166,6 +188,11 @@ private:
 
 } // namespace
 
-std::optional<RecordFault> faultOf(const QueryRecord& record) { return Check(record).run(); }
+std::optional<RecordFault> faultOf(const QueryRecord& record) {
+    if (depthOf(record) > deepestSavedQuery)
+        return RecordFault{"tables",
+                           say<MessageCode::savedQueriesTooDeep>("/tables", deepestSavedQuery)};
+    return Check(record).run();
+}
 
 } // namespace zandor::model

@@ -11,7 +11,8 @@ namespace zandor::model {
 namespace {
 
 TableState stateOf(Ref<Table> table) {
-    return {table, table->Name(), table->Left(), table->Top(), table->Width(), table->Height()};
+    return {table,          table->Name(),   table->Left(),    table->Top(),
+            table->Width(), table->Height(), table->contents()};
 }
 
 JoinState stateOf(Ref<Join> join) {

@@ -67,6 +67,7 @@ void Query::set(const TableState& state) {
     table.mTop = state.top;
     table.mWidth = state.width;
     table.mHeight = state.height;
+    table.mContents = state.contents;
 }
 
 void Query::set(const JoinState& state) {

@@ -23,7 +23,8 @@ TableRecord recordOf(Table& table) {
                        .width = table.Width(),
                        .height = table.Height(),
                        .selected = std::as_const(table).Selected(),
-                       .columns = {}};
+                       .columns = {},
+                       .query = table.savedQuery()};
     for (const auto& item : Each<ZDColumn>(table.Columns())) {
         const auto& column = static_cast<const Column&>(*item);
         record.columns.push_back({column.Key(), column.description(), column.Selected()});
@@ -130,14 +131,14 @@ Ref<Query> Query::restored(const QueryRecord& record) {
 
 void Query::restoreTable(const TableRecord& record) {
     const TablePlace place(mTables, record.key);
-    platform::KeyedCollection<ZDColumn> columns;
+    TableContents contents{.columns = {}, .query = record.query};
     for (const ColumnRecord& from : record.columns) {
         const auto column = makeRef<Column>(ColumnPlace(place, from.key), from.description);
         column->Selected(from.selected);
-        columns.Add(column, from.key);
+        contents.columns.Add(column, from.key);
     }
     const auto table =
-        makeRef<Table>(place, record.name, record.schema, record.sourceName, std::move(columns));
+        makeRef<Table>(place, record.name, record.schema, record.sourceName, std::move(contents));
     // Not by the properties, which take singles and would round beyond 24 bits.
     table->mLeft = record.left;
     table->mTop = record.top;

@@ -93,7 +93,9 @@ void Query::options(QueryOptions value) {
     mOptions = std::move(value);
 }
 
-Ref<Table> Query::addTable(const TableDescription& source) {
+Ref<Table> Query::addTable(const TableDescription& source) { return add(source, {}); }
+
+Ref<Table> Query::add(const TableDescription& source, SavedQueryRef saved) {
     if (source.name.empty()) throw platform::errors::invalidProcedureCall();
     tieCriteria();
     String name = source.name;
@@ -101,16 +103,16 @@ Ref<Table> Query::addTable(const TableDescription& source) {
         name = source.name + u'_' + platform::decimal(n);
 
     const TablePlace place(mTables, nextKey(u't', mLastTable));
-    platform::KeyedCollection<ZDColumn> columns;
-    const auto add = [&](ColumnDescription description) {
+    TableContents contents{.columns = {}, .query = std::move(saved)};
+    const auto addColumn = [&](ColumnDescription description) {
         const String key = nextKey(u'c', mLastColumn);
-        columns.Add(makeRef<Column>(ColumnPlace(place, key), std::move(description)), key);
+        contents.columns.Add(makeRef<Column>(ColumnPlace(place, key), std::move(description)), key);
     };
-    add({.name = String(Column::allColumns)});
-    for (const auto& column : source.columns) add(column);
+    addColumn({.name = String(Column::allColumns)});
+    for (const auto& column : source.columns) addColumn(column);
 
     const auto table =
-        makeRef<Table>(place, std::move(name), source.schema, source.name, std::move(columns));
+        makeRef<Table>(place, std::move(name), source.schema, source.name, std::move(contents));
     mTables->Add(table);
     return table;
 }

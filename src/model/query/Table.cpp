@@ -6,9 +6,10 @@
 namespace zandor::model {
 
 Table::Table(TablePlace place, String name, String schema, String sourceName,
-             platform::KeyedCollection<TalvikZandorLib::ZDColumn> columns)
+             TableContents contents)
     : mPlace(std::move(place)), mName(mRevision, std::move(name)), mSchema(std::move(schema)),
-      mSourceName(std::move(sourceName)), mColumns(std::move(columns)) {}
+      mSourceName(std::move(sourceName)),
+      mContents(mRevision, std::make_shared<TableContents>(std::move(contents))) {}
 
 void Table::Left(float value) { mLeft = platform::toLong(value); }
 void Table::Top(float value) { mTop = platform::toLong(value); }
@@ -16,15 +17,17 @@ void Table::Width(float value) { mWidth = platform::toLong(value); }
 void Table::Height(float value) { mHeight = platform::toLong(value); }
 
 Ref<Column> Table::column(const String& key) const {
-    if (!mColumns.Contains(key)) return {};
-    return std::static_pointer_cast<Column>(mColumns.Item(key));
+    const auto& columns = (*mContents)->columns;
+    if (!columns.Contains(key)) return {};
+    return std::static_pointer_cast<Column>(columns.Item(key));
 }
 
 Ref<Column> Table::columnNamed(platform::StringView name) const {
+    const auto& columns = (*mContents)->columns;
     Ref<Column> alike;
     // A column that is really called "*" stands behind the entry, so the entry is passed over.
-    for (std::int32_t position = 2; position <= mColumns.Count(); ++position) {
-        const auto column = std::static_pointer_cast<Column>(mColumns.Item(position));
+    for (std::int32_t position = 2; position <= columns.Count(); ++position) {
+        const auto column = std::static_pointer_cast<Column>(columns.Item(position));
         if (column->description().name == name) return column;
         if (!alike && sameName(column->description().name, name)) alike = column;
     }
@@ -32,7 +35,7 @@ Ref<Column> Table::columnNamed(platform::StringView name) const {
 }
 
 bool Table::isAllColumns(const Column& column) const {
-    return column.Key() == mColumns.Item(1)->Key();
+    return column.Key() == (*mContents)->columns.Item(1)->Key();
 }
 
 Ref<Table> tableNamed(const TalvikZandorLib::Collection<TalvikZandorLib::ZDTable>& tables,

@@ -117,6 +117,7 @@ Result<std::vector<std::vector<ForeignKey>>> keysOf(DatabaseReader& reader,
                                                     const std::vector<TableId>& sources) {
     std::vector<std::vector<ForeignKey>> all(sources.size());
     for (std::size_t child = 0; child < sources.size(); ++child) {
+        if (sources[child].name.empty()) continue;
         if (instancesOf(sources[child], sources).front() != child) continue;
         auto keys = reader.foreignKeys(sources[child]);
         if (!keys) return keys.failure();
@@ -234,7 +235,10 @@ Result<TableList> addTables(model::Query& query, DatabaseReader& reader,
     }
     const TableList present = tablesOf(query);
     std::vector<TableId> sources;
-    for (const auto& table : present) sources.push_back({table->schema(), table->sourceName()});
+    for (const auto& table : present)
+        // The database knows nothing of a saved query, nor of a table without a name.
+        sources.push_back(table->savedQuery() ? TableId()
+                                              : TableId{table->schema(), table->sourceName()});
     sources.insert(sources.end(), names.begin(), names.end());
     const auto keys = keysOf(reader, sources);
     if (!keys) return keys.failure();

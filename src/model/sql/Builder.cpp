@@ -4,6 +4,7 @@
 #include "model/criteria/QueryColumns.h"
 #include "model/sql/JoinTrees.h"
 #include "model/sql/NameCheck.h"
+#include "model/sql/SavedQueries.h"
 #include "model/sql/Simplify.h"
 #include "model/sql/Totals.h"
 
@@ -18,14 +19,15 @@ namespace {
 
 class Builder {
 public:
-    explicit Builder(Query& query) : mQuery(query), mColumns(query.Tables()) {}
+    Builder(Query& query, SavedQueries& saved)
+        : mQuery(query), mSaved(saved), mColumns(query.Tables()) {}
 
     Built build() {
         if (mQuery.Tables().Count() == 0) {
             mBuilt.findings.push_back({Finding::Kind::noTables, say<MessageCode::noTables>()});
             return std::move(mBuilt);
         }
-        JoinTrees trees = joinTrees(mQuery, mBuilt.findings);
+        JoinTrees trees = joinTrees(mQuery, sources(), mBuilt.findings);
         mStatement.from = std::move(trees.trees);
         const auto definitions = each();
         mGrouped = std::any_of(definitions.begin(), definitions.end(), [](const auto& definition) {
@@ -45,6 +47,13 @@ public:
     }
 
 private:
+    std::vector<SourceNode> sources() {
+        std::vector<SourceNode> all;
+        for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(mQuery.Tables()))
+            all.push_back(mSaved.sourceOf(static_cast<const Table&>(*table), mBuilt.findings));
+        return all;
+    }
+
     std::vector<Ref<const ColumnDefinition>> each() const {
         std::vector<Ref<const ColumnDefinition>> all;
         for (const auto& item :
@@ -223,6 +232,7 @@ private:
     }
 
     Query& mQuery;
+    SavedQueries& mSaved;
     const criteria::QueryColumns mColumns;
     Built mBuilt;
     Statement mStatement;
@@ -235,7 +245,12 @@ private:
 
 } // namespace
 
-Built build(Query& query) { return Builder(query).build(); }
+Built build(Query& query) {
+    SavedQueries saved;
+    return build(query, saved);
+}
+
+Built build(Query& query, SavedQueries& saved) { return Builder(query, saved).build(); }
 
 Text statementText(Query& query, Dialect dialect, ValueForm form,
                    std::optional<std::int64_t> limit) {

@@ -25,7 +25,8 @@ constexpr std::int16_t bothOuter = 3;
 
 class Joiner {
 public:
-    Joiner(Query& query, Findings& findings) : mFindings(findings) {
+    Joiner(Query& query, std::vector<SourceNode> leaves, Findings& findings)
+        : mFindings(findings), mLeaves(std::move(leaves)) {
         for (std::int32_t i = 1; i <= query.Tables().Count(); ++i)
             mTables.push_back(std::dynamic_pointer_cast<Table>(query.Tables().Item(i)));
         for (std::int32_t i = 1; i <= query.Joins().Count(); ++i)
@@ -102,17 +103,11 @@ private:
                                                           mTables[edge.right]->Name()));
     }
 
-    SourceNode leaf(std::size_t table) const {
-        const Table& source = *mTables[table];
-        return std::make_shared<const Source>(
-            Source{TableRef{source.schema(), source.sourceName(), source.Name()}});
-    }
-
     /// The tables of one group under inner joins.
     SourceNode groupTree(std::size_t group) const {
         std::vector<std::size_t> waiting = mGroups[group];
         std::vector<bool> in(mTables.size(), false);
-        SourceNode tree = leaf(waiting.front());
+        SourceNode tree = mLeaves[waiting.front()];
         in[waiting.front()] = true;
         waiting.erase(waiting.begin());
         while (!waiting.empty()) {
@@ -123,7 +118,7 @@ private:
                 if (first) addOwnConditions(mGroups[group].front(), on);
                 addOwnConditions(*next, on);
                 tree = std::make_shared<const Source>(Source{
-                    JoinSource{JoinKind::inner, tree, leaf(*next), allOf(std::move(on)), {}}});
+                    JoinSource{JoinKind::inner, tree, mLeaves[*next], allOf(std::move(on)), {}}});
                 in[*next] = true;
                 waiting.erase(next);
                 break;
@@ -309,13 +304,9 @@ private:
     }
 
     void reportIslands() {
-        const auto firstTable = [](SourceNode node) {
-            while (const auto* join = std::get_if<JoinSource>(&node->node)) node = join->left;
-            return std::get<TableRef>(node->node).alias;
-        };
-        const String first = firstTable(mResult.trees.front());
+        const String first = aliasOf(*mResult.trees.front());
         for (std::size_t i = 1; i < mResult.trees.size(); ++i) {
-            const String other = firstTable(mResult.trees[i]);
+            const String other = aliasOf(*mResult.trees[i]);
             Finding finding{Finding::Kind::cartesianProduct,
                             say<MessageCode::cartesianProduct>(other, first)};
             for (const auto& table : mTables)
@@ -325,6 +316,7 @@ private:
     }
 
     Findings& mFindings;
+    const std::vector<SourceNode> mLeaves; ///< by table
     std::vector<Ref<Table>> mTables;
     std::vector<Edge> mEdges;
     std::vector<std::pair<std::size_t, Node>> mOwnConditions; ///< of joins within one table
@@ -335,6 +327,14 @@ private:
 
 } // namespace
 
-JoinTrees joinTrees(Query& query, Findings& findings) { return Joiner(query, findings).run(); }
+const String& aliasOf(const Source& source) {
+    if (const auto* join = std::get_if<JoinSource>(&source.node)) return aliasOf(*join->left);
+    if (const auto* query = std::get_if<SubSelect>(&source.node)) return query->alias;
+    return std::get<TableRef>(source.node).alias;
+}
+
+JoinTrees joinTrees(Query& query, std::vector<SourceNode> leaves, Findings& findings) {
+    return Joiner(query, std::move(leaves), findings).run();
+}
 
 } // namespace zandor::model::sql

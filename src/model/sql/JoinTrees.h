@@ -21,7 +21,8 @@ struct JoinTrees {
 /// on the kind, and all their conditions stand in the one ON. The side of an outer join is the side
 /// it was drawn with, in whatever order the tables were added. A join between two columns of one
 /// table chooses among its rows before outer joins fill it. Adds findings for outer joins that
-/// leave open which rows are kept, and for tables that no join reaches.
-JoinTrees joinTrees(Query& query, Findings& findings);
+/// leave open which rows are kept, and for tables that no join reaches. `leaves` are what the
+/// tables are read from, in the order of the query.
+JoinTrees joinTrees(Query& query, std::vector<SourceNode> leaves, Findings& findings);
 
 } // namespace zandor::model::sql

@@ -27,6 +27,14 @@ Findings uncarriedNames(Query& query, Dialect dialect) {
             finding->table = table.Key();
             findings.push_back(std::move(*finding));
         }
+        if (!table.savedQuery()) continue;
+        for (Finding& inner :
+             uncarriedNames(*Query::restored(table.savedQuery()->record), dialect)) {
+            Finding finding{inner.kind,
+                            say<MessageCode::inSavedQuery>(table.Name(), std::move(inner.message))};
+            finding.table = table.Key();
+            findings.push_back(std::move(finding));
+        }
     }
     for (const auto& join : platform::Each<ZDJoin>(query.Joins())) {
         const auto left = join->LeftColumn();

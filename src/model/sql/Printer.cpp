@@ -6,12 +6,13 @@
 
 #include <algorithm>
 #include <set>
+#include <unordered_map>
 
 namespace zandor::model::sql {
 
 namespace {
 
-constexpr StringView nextLine = u"\n    ";
+constexpr StringView inside = u"    ";
 
 StringView words(JoinKind kind) {
     switch (kind) {
@@ -73,33 +74,48 @@ int entriesOf(const Expression& expression) {
     return most + entriesFor(expression);
 }
 
+/// The names of queries that are written before the statement.
+using SharedQueries = std::unordered_map<const Statement*, String>;
+
 class Printer {
 public:
-    Printer(Dialect dialect, ValueForm form) : mOut{dialect, form} {}
+    /// Writes behind what is there, each line after `indent`; `shared` have names already.
+    Printer(Output& out, const SharedQueries& shared, String indent)
+        : mOut(out), mShared(shared), mIndent(std::move(indent)) {}
 
-    Printed print(const Statement& statement) {
+    void print(const Statement& statement) {
         writeGroupsOut(statement);
         const bool around = differsAround(statement);
-        if (around) mOut.text += u"SELECT DISTINCT * FROM (\n";
-        mOut.text += statement.distinct && !around ? u"SELECT DISTINCT" : u"SELECT";
-        const char16_t* separator = u"\n    ";
-        for (const auto& item : statement.items) {
-            mOut.text += separator;
-            selectItem(item);
-            separator = u",\n    ";
+        if (around) {
+            mOut.text += u"SELECT DISTINCT * FROM (";
+            line(u"");
         }
-        mOut.text += u"\nFROM ";
+        mOut.text += statement.distinct && !around ? u"SELECT DISTINCT" : u"SELECT";
+        for (const auto& item : statement.items) {
+            if (&item != &statement.items.front()) mOut.text += u',';
+            line(inside);
+            selectItem(item);
+        }
+        line(u"FROM ");
         from(statement.from);
-        filter(u"\nWHERE ", statement.where);
+        filter(statement.where);
         group(statement);
         if (statement.having) having(statement);
-        if (around) mOut.text += u"\n) AS totals";
+        if (around) line(u") AS totals");
         order(statement, around);
         paging(statement);
-        return {std::move(mOut.text), std::move(mOut.bindings)};
     }
 
 private:
+    void line(StringView begin) {
+        mOut.text += u'\n';
+        mOut.text += mIndent;
+        mOut.text += begin;
+    }
+
+    /// What begins a line within a clause.
+    String nextLine() const { return u'\n' + mIndent + String(inside); }
+
     bool isFor(Dialect dialect) const { return mOut.dialect == dialect; }
 
     /// MariaDB leaves equal rows of averages in, but for a select around them; which takes no two
@@ -144,28 +160,28 @@ private:
         return numbers && holds<Parameter>(*node) && itemOf(statement, node) != 0;
     }
 
-    void filter(StringView word, const Node& condition) {
+    void filter(const Node& condition) {
         if (!condition) return;
         check(*condition);
-        mOut.text += word;
-        mExpressions.terms(*condition, nextLine, Tightness::disjunction);
+        line(u"WHERE ");
+        mExpressions.terms(*condition, nextLine(), Tightness::disjunction);
     }
 
     void having(const Statement& statement) {
         ExpressionPrinter behind = mExpressions;
         behind.standBehind(statement.group);
         check(*statement.having);
-        mOut.text += u"\nHAVING ";
-        behind.terms(*statement.having, nextLine, Tightness::disjunction);
+        line(u"HAVING ");
+        behind.terms(*statement.having, nextLine(), Tightness::disjunction);
     }
 
     void group(const Statement& statement) {
-        const char16_t* separator = u"\nGROUP BY ";
+        bool first = true;
         for (const Node& node : statement.group) {
             // Engines take a number alone for that of a column, or nothing alone at all.
             const bool alone = std::holds_alternative<Value>(node->node);
             if (alone && isFor(Dialect::SqlServer)) continue;
-            mOut.text += separator;
+            begin(first, u"GROUP BY ");
             if (groupedByNumber(statement, node)) {
                 mOut.text += platform::decimal(static_cast<std::int64_t>(itemOf(statement, node)));
             } else {
@@ -173,8 +189,16 @@ private:
                 mExpressions.value(*node, Tightness::disjunction);
                 if (alone) mOut.text += u", NULL)";
             }
-            separator = u", ";
         }
+    }
+
+    /// Before the first of several a line with `word`, before the others a comma.
+    void begin(bool& first, StringView word) {
+        if (first)
+            line(word);
+        else
+            mOut.text += u", ";
+        first = false;
     }
 
     void selectItem(const SelectItem& item) {
@@ -195,7 +219,7 @@ private:
         bool first = true;
         for (const auto& source : sources) {
             if (!first) {
-                mOut.text += nextLine;
+                line(inside);
                 mOut.text += u"CROSS JOIN ";
             }
             const bool joined = std::holds_alternative<JoinSource>(source->node);
@@ -203,32 +227,37 @@ private:
             if (joined && !first)
                 inParentheses(*source);
             else
-                sourceLines(*source, nextLine);
+                sourceLines(*source, nextLine(), first ? u"" : inside);
             first = false;
         }
     }
 
     void inParentheses(const Source& source) {
         mOut.text += u'(';
-        sourceLines(source, u" ");
+        sourceLines(source, u" ", inside);
         mOut.text += u')';
     }
 
     /// A source with each of its joins behind a line break, or a blank when inside parentheses.
-    void sourceLines(const Source& source, StringView lineBreak) {
+    /// `within` is how far the line is indented in which it begins.
+    void sourceLines(const Source& source, StringView lineBreak, StringView within) {
         if (const auto* table = std::get_if<TableRef>(&source.node)) {
             tableRef(*table);
             return;
         }
+        if (const auto* query = std::get_if<SubSelect>(&source.node)) {
+            subSelect(*query, within);
+            return;
+        }
         const auto& join = std::get<JoinSource>(source.node);
         check(join);
-        sourceLines(*join.left, lineBreak);
+        sourceLines(*join.left, lineBreak, within);
         mOut.text += lineBreak;
         mOut.text += words(join.kind);
         if (std::holds_alternative<JoinSource>(join.right->node))
             inParentheses(*join.right);
         else
-            sourceLines(*join.right, lineBreak);
+            sourceLines(*join.right, lineBreak, inside);
         mOut.text += u" ON ";
         mExpressions.condition(*join.on, Tightness::conjunction);
     }
@@ -256,20 +285,36 @@ private:
             mOut.name(table.schema);
             mOut.text += u'.';
         }
-        mOut.name(table.name);
-        if (table.alias == table.name) return;
+        named(table.name, table.alias);
+    }
+
+    void named(const String& name, const String& alias) {
+        mOut.name(name);
+        if (alias == name) return;
         mOut.text += u" AS ";
-        mOut.name(table.alias);
+        mOut.name(alias);
+    }
+
+    void subSelect(const SubSelect& query, StringView within) {
+        if (const auto known = mShared.find(query.statement.get()); known != mShared.end()) {
+            named(known->second, query.alias);
+            return;
+        }
+        const String indent = mIndent + String(within);
+        mOut.text += u"(\n" + indent + String(inside);
+        Printer(mOut, mShared, indent + String(inside)).print(*query.statement);
+        mOut.text += u'\n' + indent + u") AS ";
+        mOut.name(query.alias);
     }
 
     /// `byNumber` where the names of tables cannot be seen any more.
     void order(const Statement& statement, bool byNumber) {
         const bool needed = isFor(Dialect::SqlServer) && (statement.limit || statement.offset);
         if (statement.order.empty() && needed)
-            mOut.text += statement.distinct ? u"\nORDER BY 1" : u"\nORDER BY (SELECT NULL)";
-        const char16_t* separator = u"\nORDER BY ";
+            line(statement.distinct ? u"ORDER BY 1" : u"ORDER BY (SELECT NULL)");
+        bool first = true;
         for (const auto& item : statement.order) {
-            mOut.text += separator;
+            begin(first, u"ORDER BY ");
             const bool plain = std::holds_alternative<ColumnRef>(item.value->node);
             const std::size_t number = plain && !byNumber ? 0 : itemOf(statement, item.value);
             if (number != 0 && !followsAll(statement, number))
@@ -277,7 +322,6 @@ private:
             else
                 mExpressions.value(*item.value, Tightness::disjunction);
             if (item.descending) mOut.text += u" DESC";
-            separator = u", ";
         }
     }
 
@@ -293,31 +337,100 @@ private:
         if (!statement.limit && statement.offset == 0) return;
         const String offset = platform::decimal(statement.offset);
         if (mOut.dialect == Dialect::SqlServer || mOut.dialect == Dialect::Standard) {
-            mOut.text += u"\nOFFSET " + offset + u" ROWS";
+            line(u"OFFSET " + offset + u" ROWS");
             if (statement.limit)
-                mOut.text += u"\nFETCH NEXT " + platform::decimal(*statement.limit) + u" ROWS ONLY";
+                line(u"FETCH NEXT " + platform::decimal(*statement.limit) + u" ROWS ONLY");
             return;
         }
         if (statement.limit)
-            mOut.text += u"\nLIMIT " + platform::decimal(*statement.limit);
+            line(u"LIMIT " + platform::decimal(*statement.limit));
         else if (mOut.dialect == Dialect::SQLite)
-            mOut.text += u"\nLIMIT -1";
+            line(u"LIMIT -1");
         else if (mOut.dialect == Dialect::MySQL)
-            mOut.text += u"\nLIMIT 18446744073709551615";
+            line(u"LIMIT 18446744073709551615");
         if (statement.offset == 0) return;
-        mOut.text += statement.limit || mOut.dialect != Dialect::PostgreSQL ? u" " : u"\n";
-        mOut.text += u"OFFSET " + offset;
+        if (statement.limit || mOut.dialect != Dialect::PostgreSQL)
+            mOut.text += u" OFFSET " + offset;
+        else
+            line(u"OFFSET " + offset);
     }
 
-    Output mOut;
+    Output& mOut;
+    const SharedQueries& mShared;
+    const String mIndent;
     ExpressionPrinter mExpressions{mOut};
 };
+
+/// Finds what is written before the statement: the queries that it reads from more than once.
+class Sharing {
+public:
+    explicit Sharing(const Statement& statement) {
+        visit(statement);
+        for (const SubSelect* query : mInOrder)
+            if (mTimes[query->statement.get()] > 1) mQueries.push_back(query);
+    }
+
+    /// Those that others read from come first.
+    const std::vector<const SubSelect*>& queries() const { return mQueries; }
+
+    /// Under such a name no table of the database is read from.
+    String nameFor(const SubSelect& query) {
+        String name = query.alias;
+        for (std::int32_t n = 1; !mTaken.insert(foldedName(name)).second; ++n)
+            name = query.alias + u'_' + platform::decimal(n);
+        return name;
+    }
+
+private:
+    void visit(const Statement& statement) {
+        for (const SourceNode& source : statement.from) visit(*source);
+    }
+
+    void visit(const Source& source) {
+        if (const auto* join = std::get_if<JoinSource>(&source.node)) {
+            visit(*join->left);
+            visit(*join->right);
+        } else if (const auto* table = std::get_if<TableRef>(&source.node)) {
+            mTaken.insert(foldedName(table->name));
+        } else {
+            const auto& query = std::get<SubSelect>(source.node);
+            if (++mTimes[query.statement.get()] > 1) return;
+            visit(*query.statement);
+            mInOrder.push_back(&query);
+        }
+    }
+
+    std::unordered_map<const Statement*, int> mTimes;
+    std::vector<const SubSelect*> mInOrder;
+    std::vector<const SubSelect*> mQueries;
+    std::set<String> mTaken;
+};
+
+void printWhole(const Statement& statement, Output& out) {
+    Sharing sharing(statement);
+    SharedQueries shared;
+    StringView before = u"WITH ";
+    for (const SubSelect* query : sharing.queries()) {
+        const String name = sharing.nameFor(*query);
+        out.text += before;
+        out.name(name);
+        out.text += u" AS (\n" + String(inside);
+        Printer(out, shared, String(inside)).print(*query->statement);
+        out.text += u"\n)";
+        shared.emplace(query->statement.get(), name);
+        before = u",\n";
+    }
+    if (!shared.empty()) out.text += u'\n';
+    Printer(out, shared, {}).print(statement);
+}
 
 } // namespace
 
 std::variant<Printed, Refusal> print(const Statement& statement, Dialect dialect, ValueForm form) {
     try {
-        return Printer(dialect, form).print(statement);
+        Output out{dialect, form};
+        printWhole(statement, out);
+        return Printed{std::move(out.text), std::move(out.bindings)};
     } catch (Refusal& refusal) {
         return std::move(refusal);
     }

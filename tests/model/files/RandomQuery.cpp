@@ -70,6 +70,12 @@ private:
     String suffix() { return platform::decimal(++mNames); }
 
     void addTable() {
+        if (chance(10)) {
+            // What it was so far is a saved query in itself from now on.
+            model::SavedQuery saved{.file = text(), .record = mQuery->record()};
+            if (!model::Query::refusalOf(saved)) mQuery->addQuery(name(), std::move(saved));
+            return;
+        }
         model::TableDescription source{chance(30) ? text() : String(), name(), {}};
         for (int n = upTo(6); n > 0; --n)
             source.columns.push_back({text(), static_cast<model::ColumnType>(upTo(8)),

@@ -38,8 +38,10 @@ Names names(const json& value) {
     return {text.substr(0, dot), text.substr(dot + 1)};
 }
 
-/// "orders", or "orders as old".
-Table table(const std::string& text) {
+/// "orders", "orders as old", or an object for a saved query.
+Table table(const json& value) {
+    if (value.is_object()) return {value.at("query"), value.value("as", ""), true};
+    const std::string text = value;
     const auto as = text.find(" as ");
     if (as == std::string::npos) return {text, {}};
     return {text.substr(0, as), text.substr(as + 4)};
@@ -91,8 +93,11 @@ std::string lines(const json& value) {
 
 Case readCase(const json& from) {
     Case to;
-    to.name = from.at("name");
-    for (const std::string text : from.at("tables")) to.tables.push_back(table(text));
+    to.name = from.value("name", "");
+    if (from.contains("queries"))
+        for (const auto& [name, query] : from["queries"].items())
+            to.queries[name] = std::make_shared<const Case>(readCase(query));
+    for (const json& value : from.at("tables")) to.tables.push_back(table(value));
     if (from.contains("joins"))
         for (const json& value : from["joins"]) to.joins.push_back(join(value));
     if (from.contains("columns"))
@@ -137,6 +142,7 @@ std::vector<Case> read(const std::string& directory) {
         for (const json& value : json::parse(stream)) {
             try {
                 cases.push_back(readCase(value));
+                if (cases.back().name.empty()) throw std::runtime_error("no name");
             } catch (const std::exception& error) {
                 throw std::runtime_error(file.string() + ": " + value.dump() + ": " + error.what());
             }
@@ -174,6 +180,7 @@ std::string nameOf(model::Finding::Kind kind) {
     case Kind::criterionNotPlaced: return "criterionNotPlaced";
     case Kind::sortNotOutput: return "sortNotOutput";
     case Kind::firstUnsorted: return "firstUnsorted";
+    case Kind::otherColumnsGiven: return "otherColumnsGiven";
     case Kind::notInDialect: break;
     }
     return "notInDialect";
@@ -183,10 +190,18 @@ platform::Ref<model::Query> draw(const Case& drawn, reader::DatabaseReader& data
     const auto query = platform::makeRef<model::Query>();
     model::Library library;
     query->options(drawn.options);
-    for (const Table& table : drawn.tables) {
-        const auto description = database.table({u"", fromUtf8(table.source)});
+    const auto add = [&](const Table& table) {
+        const auto name = fromUtf8(table.source);
+        if (table.query) {
+            const auto saved = draw(*drawn.queries.at(table.source), database);
+            return query->addQuery(name, {.file = {}, .record = saved->record()});
+        }
+        const auto description = database.table({u"", name});
         if (!description) throw std::runtime_error(description.error().toStdString());
-        const auto added = query->addTable(*description);
+        return query->addTable(*description);
+    };
+    for (const Table& table : drawn.tables) {
+        const auto added = add(table);
         if (!table.name.empty()) query->renameTable(added, fromUtf8(table.name));
     }
     const auto columnOf = [&](const Names& names) -> platform::Ref<TalvikZandorLib::ZDColumn> {

@@ -4,6 +4,7 @@
 #include <Zandor/sql/Builder.h>
 
 #include <map>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -33,7 +34,8 @@ struct Join {
 
 struct Table {
     std::string source;
-    std::string name; ///< in the query; empty: as it comes
+    std::string name;   ///< in the query; empty: as it comes
+    bool query = false; ///< one of those saved, and no table of the database
 };
 
 struct ExpectedFinding {
@@ -45,13 +47,14 @@ struct ExpectedFinding {
 
 struct Case {
     std::string name;
+    std::map<std::string, std::shared_ptr<const Case>> queries; ///< saved ones, by name
     std::vector<Table> tables;
     std::vector<Join> joins;
     std::vector<Column> columns;
     bool collated = false; ///< depends on which texts are the same, and in what order
-    std::map<std::string, std::string> answers; ///< to parameters, as a user types them
-    std::map<std::string, std::string> sql;     ///< by dialect, with the values written out
-    std::vector<ExpectedFinding> findings;      ///< for the first dialect of `sql`, else SQLite
+    std::map<std::string, std::string> answers;    ///< to parameters, as a user types them
+    std::map<std::string, std::string> sql;        ///< by dialect, with the values written out
+    std::vector<ExpectedFinding> findings;         ///< for the first dialect of `sql`, else SQLite
     std::map<std::string, std::string> references; ///< by dialect; none when nothing is to be run
     zandor::model::QueryOptions options;
 };

@@ -252,6 +252,12 @@ Row nulls(const std::vector<Row>& rows) {
     return row;
 }
 
+QString lineOf(const std::vector<Datum>& row) {
+    QStringList texts;
+    for (const Datum& datum : row) texts.push_back(QString::fromStdString(written(datum)));
+    return texts.join(QStringLiteral(" | "));
+}
+
 } // namespace
 
 const Evaluator::Rows& Evaluator::table(const std::u16string& name, const std::u16string& alias) {
@@ -275,6 +281,7 @@ const Evaluator::Rows& Evaluator::table(const std::u16string& name, const std::u
 
 Evaluator::Rows Evaluator::source(const Source& from) {
     if (const auto* one = std::get_if<TableRef>(&from.node)) return table(one->name, one->alias);
+    if (const auto* query = std::get_if<SubSelect>(&from.node)) return rowsOf(*query);
     const auto& join = std::get<JoinSource>(from.node);
     const Rows left = source(*join.left);
     const Rows right = source(*join.right);
@@ -298,7 +305,7 @@ Evaluator::Rows Evaluator::source(const Source& from) {
     return rows;
 }
 
-QStringList Evaluator::rows(const Statement& statement) {
+std::vector<std::vector<Datum>> Evaluator::values(const Statement& statement) {
     Rows all{Row()};
     for (const SourceNode& from : statement.from) {
         Rows combined;
@@ -332,15 +339,37 @@ QStringList Evaluator::rows(const Statement& statement) {
         for (const Row& row : all) scopes.emplace_back(std::vector{&row});
     }
 
-    QStringList out;
+    std::vector<std::vector<Datum>> out;
+    QSet<QString> seen;
     for (const Scope& scope : scopes) {
         if (statement.having && !scope.truth(statement.having).value_or(false)) continue;
-        QStringList texts;
+        std::vector<Datum> row;
         for (const SelectItem& item : statement.items)
-            texts.push_back(
-                QString::fromStdString(written(scope.value(std::get<Node>(item.what)))));
-        out.push_back(texts.join(QStringLiteral(" | ")));
+            row.push_back(scope.value(std::get<Node>(item.what)));
+        const QString line = lineOf(row);
+        if (statement.distinct && seen.contains(line)) continue;
+        seen.insert(line);
+        out.push_back(std::move(row));
     }
-    if (statement.distinct) out.removeDuplicates();
     return out;
+}
+
+QStringList Evaluator::rows(const Statement& statement) {
+    QStringList lines;
+    for (const auto& row : values(statement)) lines.push_back(lineOf(row));
+    return lines;
+}
+
+/// What comes out of a query, by the names that it has there.
+Evaluator::Rows Evaluator::rowsOf(const SubSelect& query) {
+    Rows rows;
+    for (auto& from : values(*query.statement)) {
+        Row& row = rows.emplace_back();
+        for (std::size_t n = 0; n < from.size(); ++n) {
+            const SelectItem& item = query.statement->items[n];
+            const auto* column = std::get_if<ColumnRef>(&std::get<Node>(item.what)->node);
+            row[{query.alias, item.name.empty() ? column->column : item.name}] = std::move(from[n]);
+        }
+    }
+    return rows;
 }

@@ -27,6 +27,8 @@ public:
 private:
     using Rows = std::vector<Row>;
 
+    std::vector<std::vector<Datum>> values(const zandor::model::sql::Statement& statement);
+    Rows rowsOf(const zandor::model::sql::SubSelect& query);
     Rows source(const zandor::model::sql::Source& source);
     const Rows& table(const std::u16string& name, const std::u16string& alias);
 

@@ -1,5 +1,7 @@
 #include "RandomTotals.h"
 
+#include <Zandor/model/Functions.h>
+
 using namespace zandor;
 
 using model::Total;
@@ -13,7 +15,11 @@ RandomTotals::RandomTotals(std::uint32_t seed, reader::DatabaseReader& database)
     }
 }
 
-platform::Ref<model::Query> RandomTotals::next() {
+platform::Ref<model::Query> RandomTotals::next() { return drawn(0); }
+
+platform::Ref<model::Query> RandomTotals::drawn(int depth) {
+    const bool readsFromSaved = depth < 3 && mDice.oneIn(3);
+    const auto saved = readsFromSaved ? drawn(depth + 1) : nullptr;
     const auto query = platform::makeRef<model::Query>();
     query->addTable(mTables.at(u"orders"));
     mNumbers = {u"orders.id", u"orders.customer_id", u"orders.contact_id", u"[employee_id]"};
@@ -36,9 +42,37 @@ platform::Ref<model::Query> RandomTotals::next() {
         mNumbers.push_back(u"employees.manager_id");
         mDates.push_back(u"employees.hired_on");
     }
+    if (saved) addSaved(*query, *saved);
     for (std::size_t n = 1 + mDice.roll(4); n > 0; --n) addDefinition(*query);
     if (mDice.oneIn(4)) query->options({.distinct = true});
     return query;
+}
+
+/// Joined by a whole number, if it has one.
+void RandomTotals::addSaved(model::Query& query, const model::Query& saved) {
+    model::SavedQuery record{.file = {}, .record = saved.record()};
+    if (model::Query::refusalOf(record)) return;
+    model::Query alone;
+    const auto columns = alone.addQuery(u"saved", record)->contents()->columns;
+    const auto ofType = [&](model::ColumnType type) {
+        std::vector<String> names;
+        for (std::int32_t position = 2; position <= columns.Count(); ++position) {
+            const auto column = std::static_pointer_cast<model::Column>(columns.Item(position));
+            if (column->description().type == type) names.push_back(column->Name());
+        }
+        return names;
+    };
+    const auto numbers = ofType(model::ColumnType::Integer);
+    if (numbers.empty()) return;
+    query.addQuery(u"saved", record);
+    join(query, u"orders", u"id", u"saved", mDice.pick(numbers));
+    const auto write = [](std::vector<String>& to, const std::vector<String>& names) {
+        for (const String& name : names)
+            to.push_back(u"saved." + model::criteria::writtenName(name));
+    };
+    write(mNumbers, numbers);
+    write(mTexts, ofType(model::ColumnType::Text));
+    write(mDates, ofType(model::ColumnType::Date));
 }
 
 void RandomTotals::join(model::Query& query, StringView left, StringView leftColumn,

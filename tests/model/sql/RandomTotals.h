@@ -3,7 +3,8 @@
 #include "RandomQueries.h"
 
 /// Draws queries over a few tables that are joined as their keys go: expressions of every kind and
-/// depth, totals of them, criteria before and behind, different rows. What engines differ in by
+/// depth, totals of them, criteria before and behind, different rows, and such queries as tables up
+/// to three deep. What engines differ in by
 /// themselves (the order of letters, the digits of fractions) is left out.
 class RandomTotals {
 public:
@@ -14,6 +15,8 @@ public:
 private:
     using String = zandor::platform::String;
 
+    zandor::platform::Ref<zandor::model::Query> drawn(int depth);
+    void addSaved(zandor::model::Query& query, const zandor::model::Query& saved);
     void join(zandor::model::Query& query, zandor::platform::StringView left,
               zandor::platform::StringView leftColumn, zandor::platform::StringView right,
               zandor::platform::StringView rightColumn);

@@ -9,6 +9,8 @@
 #include <Zandor/model/Table.h>
 #include <Zandor/model/export.h>
 
+#include <unordered_set>
+
 namespace zandor::model {
 
 /// A query: tables, the joins between them, and output columns. It owns its objects; they may be
@@ -54,6 +56,19 @@ public:
     /// the source's, or, when that is taken, the source's with "_1", "_2" and so on behind it.
     /// Error 5 when the source has no name.
     Ref<Table> addTable(const TableDescription& source);
+    /// Puts a saved query into this one as a table, as addTable does; its columns are those that
+    /// come out of it, each under a name that is its own. Error 5 for an empty name and where
+    /// refusalOf has something to say; nothing changes then.
+    Ref<Table> addQuery(const String& name, SavedQuery saved);
+    /// Why a saved query cannot stand as a table: a fault, nothing that comes out of it, or queries
+    /// in each other deeper than deepestSavedQuery. Nothing when it can.
+    static std::optional<Message> refusalOf(const SavedQuery& saved);
+    /// Gives a table that is a saved query what that one is by now. Columns of the same names keep
+    /// their keys, and what hangs on them. Error 5 where refusalOf has something to say and for a
+    /// table that is no saved query of this query, error 91 for nothing; nothing changes then.
+    void refreshQuery(const Ref<Table>& table, SavedQuery saved);
+    /// As above, and for a column that is used in this query and comes out no more.
+    std::optional<Message> refusalOf(const Table& table, const SavedQuery& saved);
     /// Gives a table of this query another name; criteria that name it are written anew. Error 5
     /// for an empty name or a foreign table, error 91 for nothing, error 457 when another table has
     /// the name; nothing changes then.
@@ -85,6 +100,8 @@ private:
     void set(const TableState& state);
     void set(const JoinState& state);
     void set(const DefinitionState& state);
+    Ref<Table> add(const TableDescription& source, SavedQueryRef saved);
+    std::unordered_set<String> usedColumns() const;
     void restoreTable(const TableRecord& record);
     ColumnPlace restoredEnd(const EndRecord& record) const;
     criteria::References restored(const std::vector<NameRecord>& names) const;

@@ -44,11 +44,15 @@ ZANDOR_FILES_EXPORT Result<std::string> toJson(const QueryDocument& document);
 /// and says in which line or under which JSON pointer the fault is.
 ZANDOR_FILES_EXPORT Result<QueryDocument> fromJson(std::string_view text);
 
-/// Writes the file as a Replacement: on a failure the old file is as it was and no other is left.
-/// Nothing on success.
+/// The document with the files of its saved queries named as a file has them: from its own folder.
+ZANDOR_FILES_EXPORT QueryDocument namedFrom(QueryDocument document, const Path& file);
+
+/// Writes the file as a Replacement, namedFrom it: on a failure the old file is as it was and no
+/// other is left. Nothing on success.
 ZANDOR_FILES_EXPORT std::optional<Error> saveQuery(const Path& path, const QueryDocument& document);
 
-/// The document of a file, as fromJson; the error also where the file cannot be read.
+/// The document of a file, as fromJson; the error also where the file cannot be read. The files of
+/// its saved queries are absolute paths then.
 ZANDOR_FILES_EXPORT Result<QueryDocument> loadQuery(const Path& path);
 
 } // namespace zandor::files

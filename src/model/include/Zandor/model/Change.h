@@ -12,12 +12,13 @@ namespace zandor::model {
 
 /// A table and all of it that can change, but for what is selected in it: that is no change.
 struct TableState {
-    Ref<Table> object = {};  ///< the table itself
-    String name = {};        ///< as TableRecord::name
-    std::int32_t left = 0;   ///< in twips, as the three below
-    std::int32_t top = 0;    ///< of the upper edge
-    std::int32_t width = 0;  ///< the border included
-    std::int32_t height = 0; ///< the border included
+    Ref<Table> object = {};                       ///< the table itself
+    String name = {};                             ///< as TableRecord::name
+    std::int32_t left = 0;                        ///< in twips, as the three below
+    std::int32_t top = 0;                         ///< of the upper edge
+    std::int32_t width = 0;                       ///< the border included
+    std::int32_t height = 0;                      ///< the border included
+    std::shared_ptr<TableContents> contents = {}; ///< never nothing; no two tables share one
 
     friend bool operator==(const TableState&, const TableState&) = default;
 };

@@ -26,6 +26,7 @@ struct Finding {
         criterionNotPlaced,
         sortNotOutput,
         firstUnsorted,
+        otherColumnsGiven,
     };
 
     Kind kind;       ///< what there is to say
@@ -35,7 +36,7 @@ struct Finding {
     platform::String join{};       ///< key
     platform::String definition{}; ///< key
     std::int16_t row = 0;          ///< grid row of a criterion; 0 where it is about none
-    std::size_t position = 0;      ///< in the criterion's or expression's text, UTF-16 code units from 0
+    std::size_t position = 0; ///< in the criterion's or expression's text, UTF-16 code units from 0
 
     /// The message in English: one line.
     platform::String text() const { return message.text(); }
@@ -46,7 +47,7 @@ struct Finding {
                kind == Kind::nameNotCarried || kind == Kind::notInDialect ||
                kind == Kind::definitionWithoutColumn || kind == Kind::badExpression ||
                kind == Kind::badTotal || kind == Kind::criterionNotPlaced ||
-               kind == Kind::sortNotOutput;
+               kind == Kind::sortNotOutput || kind == Kind::otherColumnsGiven;
     }
 };
 

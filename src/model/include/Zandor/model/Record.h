@@ -7,12 +7,34 @@
 #include <Zandor/model/export.h>
 
 #include <cstdint>
+#include <memory>
 #include <optional>
 
 /// A query as plain values: everything that makes it the query it is, and no objects. Two queries
 /// are the same when their records are equal. Which entries the user has selected in a list at the
 /// moment (ZDColumn::activated) is the control's and not recorded.
 namespace zandor::model {
+
+struct SavedQuery;
+
+/// A saved query that stands in another as a table, or nothing. It is shared and never changed, and
+/// equal to one that holds the same.
+class ZANDOR_MODEL_EXPORT SavedQueryRef {
+public:
+    SavedQueryRef() = default;
+    SavedQueryRef(SavedQuery query); ///< of this one
+
+    /// Whether there is one.
+    explicit operator bool() const { return mQuery != nullptr; }
+    const SavedQuery& operator*() const { return *mQuery; }       ///< there must be one
+    const SavedQuery* operator->() const { return mQuery.get(); } ///< there must be one
+
+    /// Whether both are nothing, or hold the same.
+    ZANDOR_MODEL_EXPORT friend bool operator==(const SavedQueryRef&, const SavedQueryRef&);
+
+private:
+    std::shared_ptr<const SavedQuery> mQuery;
+};
 
 /// A column of a table.
 struct ColumnRecord {
@@ -28,13 +50,14 @@ struct TableRecord {
     String key = {};                        ///< "t" and a number
     String name = {};                       ///< unique in the query
     String schema = {};                     ///< of the database's table; empty: the default one
-    String sourceName = {};                 ///< of the database's table
+    String sourceName = {};                 ///< of the database's table, or of the saved query
     std::int32_t left = -1;                 ///< as ZDTable::Left, in twips
     std::int32_t top = -1;                  ///< as ZDTable::Top
     std::int32_t width = 0;                 ///< as ZDTable::Width
     std::int32_t height = 0;                ///< as ZDTable::Height
     std::int16_t selected = 0;              ///< as ZDTable::Selected
     std::vector<ColumnRecord> columns = {}; ///< the first is the entry "*"
+    SavedQueryRef query = {};               ///< what the table is; nothing: one of the database
 
     friend bool operator==(const TableRecord&, const TableRecord&) = default;
 };
@@ -116,6 +139,20 @@ struct QueryRecord {
 
     friend bool operator==(const QueryRecord&, const QueryRecord&) = default;
 };
+
+/// A query as it was read from its file. It stands in another by value, so that none can stand in
+/// itself, and a file that is lost takes no query along.
+struct SavedQuery {
+    String file = {};        ///< where it came from, as the host names it; may be empty
+    QueryRecord record = {}; ///< the query
+
+    friend bool operator==(const SavedQuery&, const SavedQuery&) = default;
+};
+
+/// How deep saved queries stand in each other; a query without any is 0 deep.
+inline constexpr int deepestSavedQuery = 8;
+/// How deep they do in this one, at most.
+ZANDOR_MODEL_EXPORT int depthOf(const QueryRecord& record);
 
 /// Numbers of keys end here, so that a query made from a record has room for new ones.
 inline constexpr std::int32_t greatestKeyNumber = 1'000'000'000;

@@ -1,19 +1,26 @@
 #pragma once
 
 #include <Zandor/model/Column.h>
+#include <Zandor/model/Record.h>
 #include <Zandor/model/export.h>
 
 namespace zandor::model {
 
 class Query;
 
-/// A database table as it stands in the query: the same one may stand there several times, each
-/// time under a name of its own. Its first column is the entry for all columns, "*".
+/// What a table is made of, which only a saved query that is read again gets anew.
+struct TableContents {
+    platform::KeyedCollection<TalvikZandorLib::ZDColumn> columns = {}; ///< from the entry "*" on
+    SavedQueryRef query = {}; ///< what the table is; nothing: one of the database
+};
+
+/// A database table, or a saved query, as it stands in the query: the same one may stand there
+/// several times, each time under a name of its own. Its first column is the entry for all columns,
+/// "*".
 class ZANDOR_MODEL_EXPORT Table final : public TalvikZandorLib::ZDTable {
 public:
-    /// Query::addTable makes tables. `columns` are the items that Columns() gives.
-    Table(TablePlace place, String name, String schema, String sourceName,
-          platform::KeyedCollection<TalvikZandorLib::ZDColumn> columns);
+    /// Query::addTable and Query::addQuery make tables.
+    Table(TablePlace place, String name, String schema, String sourceName, TableContents contents);
 
     /// The name in the query, unique there: the source's, or one with a number behind it.
     String Name() const override { return mName; }
@@ -32,12 +39,18 @@ public:
 
     std::int16_t Selected() const override { return mSelected; }
     void Selected(std::int16_t value) override { mSelected = value; }
-    TalvikZandorLib::Collection<TalvikZandorLib::ZDColumn>& Columns() override { return mColumns; }
+    TalvikZandorLib::Collection<TalvikZandorLib::ZDColumn>& Columns() override {
+        return (*mContents)->columns;
+    }
 
-    /// Name of the table or view in the database, and its schema (empty: the default one).
+    /// Name of the table or view in the database, or of the saved query.
     const String& sourceName() const { return mSourceName; }
     /// Of the table in the database; empty: the default one.
     const String& schema() const { return mSchema; }
+    /// The saved query that it is; nothing for a table of the database.
+    const SavedQueryRef& savedQuery() const { return (*mContents)->query; }
+    /// Never nothing; another one once a saved query was read again.
+    const std::shared_ptr<TableContents>& contents() const { return *mContents; }
     /// How joins name it.
     const TablePlace& place() const { return mPlace; }
     /// Raised by everything but selections.
@@ -58,7 +71,7 @@ private:
     Revised<String> mName;
     const String mSchema;
     const String mSourceName;
-    platform::KeyedCollection<TalvikZandorLib::ZDColumn> mColumns;
+    Revised<std::shared_ptr<TableContents>> mContents; ///< never nothing
     Revised<std::int32_t> mLeft{mRevision, -1};
     Revised<std::int32_t> mTop{mRevision, -1};
     Revised<std::int32_t> mWidth{mRevision};

@@ -21,6 +21,10 @@ struct Built {
 /// named among the findings.
 ZANDOR_MODEL_EXPORT Built build(Query& query);
 
+/// What comes out of a query, in its order, as another query reads from it: each column has a name,
+/// and one of its own. Empty when nothing comes out.
+ZANDOR_MODEL_EXPORT std::vector<ColumnDescription> outputColumns(Query& query);
+
 /// What a host shows: the findings of the query and, for a dialect, of its names and joins.
 ZANDOR_MODEL_EXPORT Findings validate(Query& query, Dialect dialect);
 

@@ -24,6 +24,16 @@ struct TableRef {
     String alias;  ///< the name that columns refer to; may be the table's own
 };
 
+struct Statement;
+
+/// A query that is read from like a table. Each of its columns has a name that is its own, and all
+/// of a table stands for no columns there. What is one statement is one query: where it stands
+/// twice it is written once.
+struct SubSelect {
+    std::shared_ptr<const Statement> statement; ///< never nothing; without an order but for a limit
+    String alias;                               ///< the name that columns refer to
+};
+
 /// Which rows stay without a partner: none, those of the left side, of the right one, of both.
 enum class JoinKind { inner, leftOuter, rightOuter, fullOuter };
 
@@ -39,10 +49,13 @@ struct JoinSource {
     String key;       ///< of the query's join that decided the kind
 };
 
-/// A table, or sources that are joined.
+/// A table, sources that are joined, or a query.
 struct Source {
-    std::variant<TableRef, JoinSource> node; ///< which of the two
+    std::variant<TableRef, JoinSource, SubSelect> node; ///< which of the three
 };
+
+/// The name that columns refer to; of joined sources that of the first.
+ZANDOR_MODEL_EXPORT const String& aliasOf(const Source& source);
 
 /// A column that sorts.
 struct OrderItem {
