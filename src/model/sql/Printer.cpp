@@ -79,9 +79,10 @@ using SharedQueries = std::unordered_map<const Statement*, String>;
 
 class Printer {
 public:
-    /// Writes behind what is there, each line after `indent`; `shared` have names already.
-    Printer(Output& out, const SharedQueries& shared, String indent)
-        : mOut(out), mShared(shared), mIndent(std::move(indent)) {}
+    /// Writes behind what is there, each line after `indent`, within so many statements; `shared`
+    /// have names already.
+    Printer(Output& out, const SharedQueries& shared, String indent, int depth)
+        : mOut(out), mShared(shared), mIndent(std::move(indent)), mDepth(depth) {}
 
     void print(const Statement& statement) {
         writeGroupsOut(statement);
@@ -275,8 +276,9 @@ private:
         constexpr std::size_t deepest = 950; // SQLite takes 1000
         if (depth(expression) > deepest)
             throw Refusal{Refusal::Reason::size, say<MessageCode::tooManyConditions>()};
-        constexpr int mostEntries = 92; // and 100 of these, some for the statement around
-        if (entriesOf(expression) > mostEntries)
+        constexpr int mostEntries = 92;  // and 100 of these, some for the statement
+        constexpr int entriesAround = 8; // for each statement around that one
+        if (entriesOf(expression) > mostEntries - entriesAround * mDepth)
             throw Refusal{Refusal::Reason::size, say<MessageCode::nestedTooDeepHere>()};
     }
 
@@ -302,7 +304,7 @@ private:
         }
         const String indent = mIndent + String(within);
         mOut.text += u"(\n" + indent + String(inside);
-        Printer(mOut, mShared, indent + String(inside)).print(*query.statement);
+        Printer(mOut, mShared, indent + String(inside), mDepth + 1).print(*query.statement);
         mOut.text += u'\n' + indent + u") AS ";
         mOut.name(query.alias);
     }
@@ -358,6 +360,7 @@ private:
     Output& mOut;
     const SharedQueries& mShared;
     const String mIndent;
+    const int mDepth;
     ExpressionPrinter mExpressions{mOut};
 };
 
@@ -415,13 +418,13 @@ void printWhole(const Statement& statement, Output& out) {
         out.text += before;
         out.name(name);
         out.text += u" AS (\n" + String(inside);
-        Printer(out, shared, String(inside)).print(*query->statement);
+        Printer(out, shared, String(inside), 1).print(*query->statement);
         out.text += u"\n)";
         shared.emplace(query->statement.get(), name);
         before = u",\n";
     }
     if (!shared.empty()) out.text += u'\n';
-    Printer(out, shared, {}).print(statement);
+    Printer(out, shared, {}, 0).print(statement);
 }
 
 } // namespace
