@@ -52,3 +52,13 @@ TEST(UnknownMembers, ComeBackWithAnObjectThatIsPutBack) {
     document.query->AddJoin(join);
     EXPECT_EQ(jsonOf(document), everywhere());
 }
+
+TEST(UnknownMembers, AreKeptInSavedQueriesToo) {
+    const std::string text =
+        jsonOf(documentOf(contentOf(testFile("unknown-in-saved-queries.json"))));
+    EXPECT_EQ(count(text, "\"unknown"), 6U) << text;
+    EXPECT_EQ(jsonOf(documentOf(text)), text);
+    files::QueryDocument document = documentOf(text);
+    document.query->DeleteTable(document.query->tableNamed(u"some"));
+    EXPECT_EQ(count(jsonOf(document), "\"unknown"), 1U);
+}
