@@ -202,6 +202,21 @@ def test_output_columns_have_totals_and_expressions(query):
     assert (raised.value.number, definition.sortPriority) == (380, 2)
 
 
+def test_output_columns_say_how_they_are_shown(query):
+    definition = zandor.ColumnDefinition()
+    definition.Column = query.Tables.Item(2).Columns.Item(4)
+    query.AddColumnDefinition(definition)
+    assert (definition.format, definition.decimals) == (zandor.Format.Nothing, -1)
+    definition.format, definition.decimals = zandor.Format.Thousands, 2
+    again = zandor.fromJson(zandor.toJson(zandor.QueryDocument(query))).query.ColumnDefinitions.Item(1)
+    assert (again.format, again.decimals) == (zandor.Format.Thousands, 2)
+    with pytest.raises(TypeError):
+        definition.format = 9
+    with pytest.raises(zandor.NumberedError) as raised:
+        definition.decimals = 16
+    assert (raised.value.number, definition.decimals) == (380, 2)
+
+
 def test_a_query_says_what_it_asks_for_as_a_whole(query):
     assert (query.distinct, query.first, query.description) == (False, 0, "")
     query.distinct, query.first, query.description = True, 10, "Zehn gr\u00f6\u00dfte"

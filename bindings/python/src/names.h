@@ -29,6 +29,7 @@ using zandor::model::Column;
 using zandor::model::ColumnDefinition;
 using zandor::model::ColumnType;
 using zandor::model::FieldColumn;
+using zandor::model::Format;
 using zandor::model::Join;
 using zandor::model::Library;
 using zandor::model::OutputName;

@@ -1,7 +1,5 @@
 #include "designer/chart/ChartData.h"
 
-#include "designer/run/shownNumber.h"
-
 #include <QCoreApplication>
 #include <QLocale>
 #include <QRegularExpression>
@@ -32,12 +30,9 @@ std::optional<double> number(const Cell& cell) {
     return value;
 }
 
-QString label(const Cell& cell) {
-    switch (cell.kind) {
-    case Cell::Kind::null: return QStringLiteral("NULL");
-    case Cell::Kind::number: return shownNumber(cell.text);
-    default: return cell.text.left(longestLabel).simplified();
-    }
+QString label(const Cell& cell, const CellFormat& format) {
+    if (cell.kind == Cell::Kind::null) return QStringLiteral("NULL");
+    return shown(cell, format).left(longestLabel).simplified();
 }
 
 bool isNamedAsKey(const QString& name) {
@@ -115,7 +110,7 @@ ChartData readChart(const ChartSource& source, const ChartChoice& choice) {
     std::vector<std::optional<QDateTime>> moments;
     for (int row = 0; row < count; ++row) {
         const Cell cell = source.cell(row, choice.axis);
-        data.labels << label(cell);
+        data.labels << label(cell, source.format(choice.axis));
         moments.push_back(cell.kind == Cell::Kind::text ? momentIn(cell.text) : std::nullopt);
     }
     // A line goes through time from left to right, however the rows are sorted.
@@ -137,7 +132,7 @@ ChartData readChart(const ChartSource& source, const ChartChoice& choice) {
         data.labels = sorted;
     }
     for (const int column : choice.values) {
-        ChartData::Series series{source.columns[column], {}};
+        ChartData::Series series{source.columns[column], {}, source.format(column)};
         for (const int row : order) series.values.push_back(number(source.cell(row, column)));
         data.series.push_back(std::move(series));
     }

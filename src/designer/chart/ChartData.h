@@ -1,6 +1,6 @@
 #pragma once
 
-#include "designer/run/Cell.h"
+#include "designer/run/CellFormat.h"
 
 #include <QDateTime>
 
@@ -17,6 +17,12 @@ struct ChartSource {
     QStringList columns = {};
     int rows = 0;
     std::function<Cell(int row, int column)> cell = {};
+    std::vector<CellFormat> formats = {}; ///< of the first columns; the others have none
+
+    CellFormat format(int column) const {
+        const auto place = static_cast<std::size_t>(column);
+        return place < formats.size() ? formats[place] : CellFormat();
+    }
 };
 
 /// What a column of a result is good for, told from its first rows.
@@ -50,6 +56,7 @@ struct ChartData {
     struct Series {
         QString name;
         std::vector<std::optional<double>> values; ///< one a point, nothing where the cell is empty
+        CellFormat format = {};
     };
 
     ChartKind kind = ChartKind::columns;

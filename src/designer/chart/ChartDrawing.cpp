@@ -1,7 +1,5 @@
 #include "designer/chart/ChartDrawing.h"
 
-#include "designer/run/shownNumber.h"
-
 #include <QFontMetricsF>
 #include <QPainter>
 #include <QPainterPath>
@@ -28,6 +26,13 @@ constexpr double smallestPlot = 20;
 constexpr double lowestWithAxis = 160;
 
 constexpr double shareOfColumns = 0.74; // of the room of a row
+
+constexpr int digitsDrawn = 12;
+constexpr int digitsTold = 15;
+
+QString inWords(double value, int digits, const CellFormat& format) {
+    return shown(Cell{Cell::Kind::number, QString::number(value, 'g', digits)}, format);
+}
 
 QRectF squareAround(const QPointF& at, double size) {
     return {at.x() - size / 2, at.y() - size / 2, size, size};
@@ -95,7 +100,7 @@ void ChartDrawing::placeAxes(const QSizeF& size) {
     mScale = numberScale(smallest, largest, most, withZero);
     double left = 0;
     for (int mark = 0; mark <= mScale.steps; ++mark)
-        left = std::max(left, metrics.horizontalAdvance(mScale.label(mark)));
+        left = std::max(left, metrics.horizontalAdvance(scaleLabel(mark)));
     left += around + gap;
     // The first slanted label begins left of its place.
     const double first = std::min(metrics.horizontalAdvance(mData.labels.front()), mLongest);
@@ -201,6 +206,17 @@ void ChartDrawing::paintLegend(QPainter& painter) const {
     }
 }
 
+/// In percent where all values are, and else as the steps need it.
+QString ChartDrawing::scaleLabel(int mark) const {
+    const bool percent =
+        std::all_of(mData.series.begin(), mData.series.end(),
+                    [](const auto& each) { return each.format.format == model::Format::Percent; });
+    if (!percent) return mScale.label(mark);
+    const double value = mScale.at(mark);
+    return inWords(std::abs(value) < mScale.step * 1e-6 ? 0 : value, digitsDrawn,
+                   {model::Format::Percent});
+}
+
 void ChartDrawing::paintScale(QPainter& painter) const {
     for (int mark = 0; mark <= mScale.steps; ++mark) {
         const double y = std::round(height(mScale.at(mark))) + 0.5; // a sharp line
@@ -209,7 +225,7 @@ void ChartDrawing::paintScale(QPainter& painter) const {
         painter.drawLine(QPointF(mPlot.left(), y), QPointF(mPlot.right(), y));
         painter.setPen(mLook.faint);
         painter.drawText(QRectF(0, y - mLine / 2, mPlot.left() - gap, mLine),
-                         Qt::AlignRight | Qt::AlignVCenter, mScale.label(mark));
+                         Qt::AlignRight | Qt::AlignVCenter, scaleLabel(mark));
     }
 }
 
@@ -261,7 +277,8 @@ void ChartDrawing::paintValues(QPainter& painter) const {
         return *series.values[static_cast<std::size_t>(mark.point)];
     };
     const auto text = [&](const ChartMark& mark) {
-        return shownNumber(QString::number(valueOf(mark), 'g', 12));
+        return inWords(valueOf(mark), digitsDrawn,
+                       mData.series[static_cast<std::size_t>(mark.series)].format);
     };
     const double slot = mPlot.width() / mData.points() / static_cast<double>(mData.series.size());
     for (const ChartMark& mark : mMarks)
@@ -371,7 +388,7 @@ QString ChartDrawing::words(const ChartMark& mark) const {
     const auto& series = mData.series[static_cast<std::size_t>(mark.series)];
     const double value = *series.values[static_cast<std::size_t>(mark.point)];
     return mData.labels[mark.point] + u'\n' + series.name + QStringLiteral(": ") +
-           shownNumber(QString::number(value, 'g', 15));
+           inWords(value, digitsTold, series.format);
 }
 
 } // namespace zandor::designer

@@ -44,6 +44,7 @@ private:
     void placeAxes(const QSizeF& size);
     void placeLabels();
     void placeMarks();
+    QString scaleLabel(int mark) const;
     double height(double value) const;
     double across(int point) const;
     void paintLegend(QPainter& painter) const;

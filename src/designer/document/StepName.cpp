@@ -167,6 +167,8 @@ QString StepName::definition(const DefinitionState& before, const DefinitionStat
         return tr("Change field of %1").arg(name);
     if (but(&DefinitionState::sortOrder) || but(&DefinitionState::sortPriority))
         return tr("Change sorting by %1").arg(name);
+    if (but(&DefinitionState::format, &DefinitionState::decimals))
+        return tr("Change format of %1").arg(name);
     if (but(&DefinitionState::visible))
         return (after.visible ? tr("Show column %1") : tr("Hide column %1")).arg(name);
     if (but(&DefinitionState::width)) return tr("Resize column %1").arg(name);

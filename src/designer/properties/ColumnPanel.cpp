@@ -4,7 +4,9 @@
 #include "designer/properties/FieldEdit.h"
 #include "designer/properties/TypingEnd.h"
 #include "designer/properties/fields.h"
+#include "designer/properties/formats.h"
 #include "designer/properties/totals.h"
+#include "designer/run/ColumnFormats.h"
 #include "designer/statement/ModelWords.h"
 #include "frontends/qt/ShownText.h"
 
@@ -68,6 +70,14 @@ ColumnPanel::ColumnPanel(Document& document, CurrentColumn& column, QWidget* par
             definition.sortPriority(static_cast<std::int16_t>(value));
         });
     });
+    connect(mFormat, &QComboBox::activated, this, [this](int item) {
+        const CellFormat& format = offeredFormats()[static_cast<std::size_t>(item)];
+        change([&format](auto& definition) { setFormat(definition, format); });
+    });
+    connect(mDecimals, &QSpinBox::valueChanged, this, [this](int value) {
+        change(
+            [value](auto& definition) { definition.decimals(static_cast<std::int16_t>(value)); });
+    });
     connect(mShown, &QCheckBox::clicked, this,
             [this](bool on) { change([on](auto& definition) { definition.Visible(on); }); });
     new TypingEnd(*this, [this] { takeOver(); });
@@ -98,12 +108,26 @@ void ColumnPanel::makeLayout() {
                              "sort as they stand, from left to right"));
     mShown = new QCheckBox(tr("Sho&wn in the rows"), this);
     mShown->setObjectName(QStringLiteral("columnShown"));
+    mFormat = new QComboBox(this);
+    mFormat->setObjectName(QStringLiteral("columnFormat"));
+    mFormat->setToolTip(tr("How the values look in the rows; sorting, criteria and exported files "
+                           "go by the values themselves"));
+    for (const CellFormat& format : offeredFormats()) mFormat->addItem(nameOf(format));
+    mDecimals = new QSpinBox(this);
+    mDecimals->setObjectName(QStringLiteral("columnDecimals"));
+    mDecimals->setRange(model::asManyAsThereAre, model::ColumnDefinition::mostDecimals);
+    mDecimals->setSpecialValueText(tr("as many as there are"));
+    mDecimals->setKeyboardTracking(false);
+    mDecimals->setToolTip(tr("So many digits stand behind the point"));
     mFinding = new QLabel(this);
     mFinding->setObjectName(QStringLiteral("columnFinding"));
     mFinding->setTextFormat(Qt::PlainText);
     mFinding->setWordWrap(true);
+    // Its room is there from the beginning: what one is about to click does not move away.
+    mFinding->setMinimumHeight(mFinding->fontMetrics().lineSpacing());
+    mField->keepInSight(*mFinding);
     mFinding->setTextInteractionFlags(Qt::TextSelectableByMouse);
-    for (QComboBox* combo : {mTotal, mSort}) {
+    for (QComboBox* combo : {mTotal, mSort, mFormat}) {
         combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
         combo->setMinimumContentsLength(6);
         combo->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
@@ -123,7 +147,7 @@ void ColumnPanel::makeLayout() {
     form->setContentsMargins(8, 6, 8, 6);
     form->setVerticalSpacing(5);
     // It has the whole width: expressions are long.
-    auto* const field = new QLabel(tr("Fi&eld:"), this);
+    auto* const field = new QLabel(tr("Fie&ld:"), this);
     field->setBuddy(mField);
     form->addRow(field);
     form->addRow(mField);
@@ -133,7 +157,8 @@ void ColumnPanel::makeLayout() {
     form->addRow(tr("&Sort:"), mSort);
     form->addRow(tr("&Priority:"), mPriority);
     form->addRow(mShown);
-    mFinding->hide();
+    form->addRow(tr("For&mat:"), mFormat);
+    form->addRow(tr("De&cimals:"), mDecimals);
     scrolled->setMinimumHeight(std::min(page->sizeHint().height(), leastHeight));
 }
 
@@ -144,11 +169,13 @@ void ColumnPanel::follow() {
     if (key == mKey && !mTaking && (mField->isModified() || mName->isModified())) return;
     mKey = key;
     const QSignalBlocker quietPriority(mPriority);
+    const QSignalBlocker quietDecimals(mDecimals);
     mField->offer(completions(*mDocument.query()));
     mField->setEnabled(mDocument.query()->Tables().Count() > 0);
     for (QWidget* part :
          {static_cast<QWidget*>(mTotal), static_cast<QWidget*>(mName), static_cast<QWidget*>(mSort),
-          static_cast<QWidget*>(mPriority), static_cast<QWidget*>(mShown)})
+          static_cast<QWidget*>(mPriority), static_cast<QWidget*>(mShown),
+          static_cast<QWidget*>(mFormat), static_cast<QWidget*>(mDecimals)})
         part->setEnabled(definition != nullptr);
     mField->setPlaceholderText(definition ? QString() : tr("a column or an expression"));
     if (definition) {
@@ -159,6 +186,8 @@ void ColumnPanel::follow() {
         mSort->setCurrentIndex(0);
         mPriority->setValue(0);
         mShown->setChecked(false);
+        mFormat->setCurrentIndex(0);
+        mDecimals->setValue(model::asManyAsThereAre);
     }
     check();
 }
@@ -180,6 +209,15 @@ void ColumnPanel::show(const model::ColumnDefinition& definition) {
     mPriority->setValue(definition.sortPriority());
     mPriority->setEnabled(definition.SortOrder() != 0);
     mShown->setChecked(definition.Visible());
+    const auto formats = offeredFormats();
+    for (std::size_t n = 0; n < formats.size(); ++n)
+        setChoosable(*mFormat, static_cast<int>(n),
+                     suits(formats[n].format, outputTypeOf(definition)) ||
+                         formats[n].format == definition.format());
+    mFormat->setCurrentIndex(placeOf(definition));
+    mFormat->setEnabled(!isOfSeveral(definition));
+    mDecimals->setValue(definition.decimals());
+    mDecimals->setEnabled(model::isOfNumbers(definition.format()));
 }
 
 void ColumnPanel::showEvent(QShowEvent* event) {
@@ -204,7 +242,6 @@ void ColumnPanel::check() {
     mField->mark(from);
     const QString all = said.join(u'\n');
     mFinding->setText(platform::qt::asSigns(all));
-    mFinding->setVisible(!all.isEmpty());
     mField->setAccessibleDescription(all);
 }
 
@@ -214,6 +251,7 @@ void ColumnPanel::takeOver() {
     takeField();
     takeName();
     mPriority->interpretText();
+    mDecimals->interpretText();
     mTaking = false;
     follow();
 }
@@ -248,6 +286,7 @@ void ColumnPanel::change(const std::function<void(model::ColumnDefinition&)>& ho
     mDocument.change({}, [&](model::Query&) {
         if (const auto definition = mColumn.definition(mKey)) how(*definition);
     });
+    follow(); // the next key may come before the grid shows it
 }
 
 } // namespace zandor::designer

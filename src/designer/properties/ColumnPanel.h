@@ -49,6 +49,8 @@ private:
     QComboBox* mSort;
     QSpinBox* mPriority;
     QCheckBox* mShown;
+    QComboBox* mFormat;
+    QSpinBox* mDecimals;
     QLabel* mFinding;
 };
 

@@ -1,6 +1,7 @@
 #include "designer/properties/FieldEdit.h"
 
 #include "designer/Colours.h"
+#include "designer/properties/fields.h"
 
 #include <QAbstractItemView>
 #include <QCompleter>
@@ -16,21 +17,23 @@ namespace {
 
 constexpr int waveHeight = 2; // logical pixels
 constexpr int shortestWord = 1;
+constexpr int overlap = 2; // with which Qt puts a list below something
 
 } // namespace
 
 FieldEdit::FieldEdit(QWidget* parent)
-    : QLineEdit(parent), mCompleter(new QCompleter(this)), mWords(new QStringListModel(this)) {
-    mCompleter->setModel(mWords);
-    mCompleter->setCaseSensitivity(Qt::CaseInsensitive);
-    mCompleter->setFilterMode(Qt::MatchContains);
+    : QLineEdit(parent), mCompleter(new QCompleter(this)), mOffered(new QStringListModel(this)) {
+    mCompleter->setModel(mOffered);
     mCompleter->setWidget(this); // not setCompleter: it is a word that is completed, not the text
     connect(mCompleter, qOverload<const QString&>(&QCompleter::activated), this, &FieldEdit::take);
     connect(this, &QLineEdit::textEdited, this, &FieldEdit::complete);
 }
 
-void FieldEdit::offer(const QStringList& words) {
-    if (words != mWords->stringList()) mWords->setStringList(words);
+void FieldEdit::offer(const QStringList& names) { mNames = names; }
+
+void FieldEdit::keepInSight(QWidget& below) {
+    mBelow = &below;
+    below.installEventFilter(this);
 }
 
 void FieldEdit::mark(int from) {
@@ -45,14 +48,25 @@ QString FieldEdit::wordAtCursor() const {
 
 void FieldEdit::complete() {
     const QString word = wordAtCursor();
-    mCompleter->setCompletionPrefix(word);
-    const bool any = word.size() >= shortestWord && mCompleter->completionCount() > 0 &&
-                     !(mCompleter->completionCount() == 1 &&
-                       mCompleter->currentCompletion().compare(word, Qt::CaseInsensitive) == 0);
+    const QStringList found = word.size() < shortestWord ? QStringList() : matching(mNames, word);
+    const bool isThere = found.size() == 1 && found.front().compare(word, Qt::CaseInsensitive) == 0;
+    mOffered->setStringList(found);
+    if (found.isEmpty() || isThere) return mCompleter->popup()->hide();
+    showList();
+}
+
+void FieldEdit::showList() {
     QAbstractItemView* const list = mCompleter->popup();
-    if (!any) return list->hide();
     const int needed = list->sizeHintForColumn(0) + list->verticalScrollBar()->sizeHint().width();
-    mCompleter->complete(QRect(0, 0, std::max(width(), needed), height()));
+    const int end =
+        mBelow ? mapFromGlobal(mBelow->mapToGlobal(QPoint(0, mBelow->height()))).y() : height();
+    mCompleter->complete(QRect(0, 0, std::max(width(), needed), end + overlap));
+}
+
+bool FieldEdit::eventFilter(QObject* watched, QEvent* event) {
+    const bool isMoved = event->type() == QEvent::Resize || event->type() == QEvent::Move;
+    if (watched == mBelow && isMoved && mCompleter->popup()->isVisible()) showList();
+    return QLineEdit::eventFilter(watched, event);
 }
 
 void FieldEdit::take(const QString& word) {

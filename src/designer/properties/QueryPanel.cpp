@@ -20,7 +20,7 @@ using platform::qt::toQt;
 
 QueryPanel::QueryPanel(Document& document, QWidget* parent)
     : QWidget(parent), mDocument(document),
-      mDistinct(new QCheckBox(tr("E&qual rows only once"), this)), mFirst(new QSpinBox(this)),
+      mDistinct(new QCheckBox(tr("Equal rows onl&y once"), this)), mFirst(new QSpinBox(this)),
       mDescription(new QPlainTextEdit(this)) {
     mDistinct->setObjectName(QStringLiteral("queryDistinct"));
     mFirst->setObjectName(QStringLiteral("queryFirst"));
@@ -33,7 +33,7 @@ QueryPanel::QueryPanel(Document& document, QWidget* parent)
     mDescription->setObjectName(QStringLiteral("queryDescription"));
     mDescription->setTabChangesFocus(true);
     mDescription->setPlaceholderText(tr("What the query is for. The file keeps it."));
-    auto* const label = new QLabel(tr("Descri&ption:"), this);
+    auto* const label = new QLabel(tr("Descripti&on:"), this);
     label->setBuddy(mDescription);
 
     auto* const form = new QFormLayout;

@@ -4,6 +4,8 @@
 #include <Zandor/qt/Text.h>
 #include <Zandor/sql/Builder.h>
 
+#include <QRegularExpression>
+
 #include <algorithm>
 #include <iterator>
 #include <vector>
@@ -90,9 +92,38 @@ QStringList completions(model::Query& query) {
     return result;
 }
 
+QStringList matching(const QStringList& names, const QString& typed) {
+    static const QRegularExpression brackets(QStringLiteral("[\\[\\]]"));
+    const QString wanted = QString(typed).remove(brackets);
+    QStringList begin;
+    QStringList contain;
+    for (const QString& name : names) {
+        const QString bare = QString(name).remove(brackets);
+        const QString column = bare.section(u'.', -1);
+        if (bare.startsWith(wanted, Qt::CaseInsensitive) ||
+            column.startsWith(wanted, Qt::CaseInsensitive))
+            begin << name;
+        else if (bare.contains(wanted, Qt::CaseInsensitive))
+            contain << name;
+    }
+    return begin + contain;
+}
+
 model::ColumnType typeOf(const model::ColumnDefinition& definition) {
     const auto column = definition.isExpression() ? nullptr : definition.place().column();
     return column ? column->description().type : model::ColumnType::Unknown;
+}
+
+model::ColumnType outputTypeOf(const model::ColumnDefinition& definition) {
+    switch (definition.total()) {
+    case model::Total::Count:
+    case model::Total::CountDifferent: return model::ColumnType::Integer;
+    case model::Total::Average: return model::ColumnType::Decimal;
+    case model::Total::Sum:
+        return typeOf(definition) == model::ColumnType::Integer ? model::ColumnType::Integer
+                                                                : model::ColumnType::Decimal;
+    default: return typeOf(definition);
+    }
 }
 
 } // namespace zandor::designer

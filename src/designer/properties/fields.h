@@ -24,7 +24,14 @@ model::Findings findingsOf(const model::Query& query, const platform::String& ke
 /// parenthesis behind them.
 QStringList completions(model::Query& query);
 
+/// Of such names those that contain what has been typed: first those that begin with it, themselves
+/// or with their column, each in the order given.
+QStringList matching(const QStringList& names, const QString& typed);
+
 /// What its values are, Unknown where that cannot be told, as of an expression.
 model::ColumnType typeOf(const model::ColumnDefinition& definition);
+
+/// The same of what its total makes of them.
+model::ColumnType outputTypeOf(const model::ColumnDefinition& definition);
 
 } // namespace zandor::designer

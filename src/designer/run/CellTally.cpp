@@ -1,7 +1,5 @@
 #include "designer/run/CellTally.h"
 
-#include "designer/run/shownNumber.h"
-
 #include <QCoreApplication>
 #include <QLocale>
 #include <QStringList>
@@ -16,7 +14,7 @@ class Words {
 
 } // namespace
 
-void CellTally::add(const Cell& cell) {
+void CellTally::add(const Cell& cell, const CellFormat& format) {
     ++mCells;
     const bool isText = cell.kind == Cell::Kind::text;
     if (cell.kind == Cell::Kind::null || (isText && cell.text.isEmpty())) ++mEmpty;
@@ -25,6 +23,10 @@ void CellTally::add(const Cell& cell) {
     if (!value) return;
     if (mNumbers == 0 || *value < mSmallest) mSmallest = *value;
     if (mNumbers == 0 || *value > mLargest) mLargest = *value;
+    if (mNumbers == 0)
+        mFormat = format;
+    else if (format != mFormat)
+        mFormat = {};
     ++mNumbers;
     mSum.add(*value);
 }
@@ -35,10 +37,10 @@ QString CellTally::inWords() const {
     if (mEmpty > 0) parts << Words::tr("Empty: %1").arg(count(mEmpty));
     if (mNumbers > 0) {
         if (mNumbers + mEmpty < mCells) parts << Words::tr("Numbers: %1").arg(count(mNumbers));
-        parts << Words::tr("Sum: %1").arg(shownNumber(sum().text()))
-              << Words::tr("Average: %1").arg(shownNumber(average().text()))
-              << Words::tr("Smallest: %1").arg(shownNumber(mSmallest.text()))
-              << Words::tr("Largest: %1").arg(shownNumber(mLargest.text()));
+        parts << Words::tr("Sum: %1").arg(shown(sum(), mFormat))
+              << Words::tr("Average: %1").arg(shown(average(), mFormat))
+              << Words::tr("Smallest: %1").arg(shown(mSmallest, mFormat))
+              << Words::tr("Largest: %1").arg(shown(mLargest, mFormat));
     }
     return parts.join(QStringLiteral(" \u00b7 "));
 }

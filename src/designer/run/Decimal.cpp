@@ -22,6 +22,16 @@ void dropZerosInFront(QByteArray& digits) {
     digits.remove(0, first - digits.cbegin());
 }
 
+/// Adds one to the last digit.
+void roundUp(QByteArray& digits) {
+    qsizetype n = digits.size();
+    while (n > 0 && digits[n - 1] == '9') digits[--n] = '0';
+    if (n > 0)
+        ++digits[n - 1];
+    else
+        digits.prepend('1');
+}
+
 /// How many digits stand before the point.
 qsizetype magnitude(const Decimal& value) { return value.digits.size() - value.scale; }
 
@@ -78,6 +88,20 @@ QString Decimal::text() const {
     if (scale <= 0) return sign + QString::fromLatin1(plain + QByteArray(-scale, '0'));
     plain = plain.rightJustified(scale + 1, '0');
     return sign + QString::fromLatin1(plain.insert(plain.size() - scale, '.'));
+}
+
+Decimal Decimal::rounded(int decimals) const {
+    Decimal result = *this;
+    result.scale = decimals;
+    if (scale <= decimals) {
+        if (!digits.isEmpty()) result.digits += QByteArray(decimals - scale, '0');
+        return result;
+    }
+    const qsizetype kept = digits.size() - (scale - decimals);
+    result.digits.truncate(std::max<qsizetype>(kept, 0));
+    if (kept >= 0 && kept < digits.size() && digits[kept] >= '5') roundUp(result.digits);
+    if (result.digits.isEmpty()) result.negative = false;
+    return result;
 }
 
 std::strong_ordering operator<=>(const Decimal& a, const Decimal& b) {
@@ -148,14 +172,7 @@ Decimal DecimalSum::average(qint64 count) const {
         quotient += static_cast<char>('0' + left / count);
         left %= count;
     }
-    if (2 * left >= count) { // rounded up
-        qsizetype n = quotient.size();
-        while (n > 0 && quotient[n - 1] == '9') quotient[--n] = '0';
-        if (n > 0)
-            ++quotient[n - 1];
-        else
-            quotient.prepend('1');
-    }
+    if (2 * left >= count) roundUp(quotient);
     for (int n = 0; n < furtherDecimals && quotient.endsWith('0'); ++n) {
         quotient.chop(1);
         --result.scale;

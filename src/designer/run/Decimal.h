@@ -20,6 +20,8 @@ struct Decimal {
     static std::optional<Decimal> from(const QString& text);
     /// With a point, and with an exponent only where it would be very long.
     QString text() const;
+    /// With so many decimals, at least 0: rounded, a half away from zero, or filled up with zeros.
+    Decimal rounded(int decimals) const;
 
     friend std::strong_ordering operator<=>(const Decimal& a, const Decimal& b);
     friend bool operator==(const Decimal& a, const Decimal& b) { return (a <=> b) == 0; }

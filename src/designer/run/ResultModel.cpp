@@ -1,6 +1,5 @@
 #include "designer/run/ResultModel.h"
 
-#include "designer/run/shownNumber.h"
 #include "frontends/qt/ShownText.h"
 
 #include <QApplication>
@@ -32,15 +31,14 @@ qsizetype memoryOf(const std::vector<Row>& page) {
     return bytes;
 }
 
-QString readable(const Cell& cell) {
-    if (cell.kind == Cell::Kind::number) return shownNumber(cell.text);
-    if (cell.kind != Cell::Kind::blob) return cell.text;
+QString readable(const Cell& cell, const CellFormat& format) {
+    if (cell.kind != Cell::Kind::blob) return shown(cell, format);
     return ResultModel::tr("(blob, %1 bytes)").arg(QLocale().toString(cell.text.toLongLong()));
 }
 
 /// As spreadsheets take it: quotes around what would break the table.
-void appendCopied(QString& text, const Cell& cell) {
-    QString value = readable(cell);
+void appendCopied(QString& text, const Cell& cell, const CellFormat& format) {
+    QString value = readable(cell, format);
     const bool breaks = value.contains(u'\t') || value.contains(u'\n') || value.contains(u'\r');
     text += breaks ? u'"' + value.replace(u'"', QStringLiteral("\"\"")) + u'"' : value;
 }
@@ -73,6 +71,13 @@ void ResultModel::refresh() {
     endInsertRows();
 }
 
+bool ResultModel::setFormats(const ColumnFormats& formats) {
+    if (formats == mFormats) return false;
+    mFormats = formats;
+    if (mRows > 0) emit dataChanged(index(0, 0), index(mRows - 1, columnCount() - 1));
+    return true;
+}
+
 void ResultModel::setOrder(RowOrder order) {
     mOrder = std::move(order);
     if (mRows > 0) emit dataChanged(index(0, 0), index(mRows - 1, columnCount() - 1));
@@ -94,9 +99,9 @@ QVariant ResultModel::data(const QModelIndex& index, int role) const {
     case Qt::DisplayRole: {
         const Cell value = cell(index);
         if (value.kind == Cell::Kind::null) return QStringLiteral("NULL");
-        return asSigns(readable(value).left(mostShown).simplified());
+        return asSigns(readable(value, format(index.column())).left(mostShown).simplified());
     }
-    case Qt::ToolTipRole: return asToolTip(readable(cell(index)));
+    case Qt::ToolTipRole: return asToolTip(readable(cell(index), format(index.column())));
     case Qt::TextAlignmentRole: {
         const bool number = cell(index).kind == Cell::Kind::number;
         return QVariant(Qt::AlignVCenter | (number ? Qt::AlignRight : Qt::AlignLeft));
@@ -170,7 +175,7 @@ std::optional<QString> ResultModel::copied(const QItemSelection& selection) cons
         for (const int column : columns) {
             if (column != *columns.begin()) line += u'\t';
             if (place < page.size() && selection.contains(index(row, column)))
-                appendCopied(line, page[place][static_cast<std::size_t>(column)]);
+                appendCopied(line, page[place][static_cast<std::size_t>(column)], format(column));
         }
     }
     QStringList text;

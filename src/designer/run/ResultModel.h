@@ -1,5 +1,6 @@
 #pragma once
 
+#include "designer/run/ColumnFormats.h"
 #include "designer/run/RowOrder.h"
 #include "designer/run/Spool.h"
 
@@ -24,13 +25,17 @@ public:
     void refresh();
     const std::shared_ptr<Spool>& spool() const { return mSpool; }
 
+    /// Shows the values in other formats; false when these are the ones that they have.
+    bool setFormats(const ColumnFormats& formats);
+    CellFormat format(int column) const { return mFormats.at(column, columnCount()); }
+
     /// Shows the rows in another order than they came in, or with an empty one as they came. Rows
     /// that come later stand behind it.
     void setOrder(RowOrder order);
     /// A view wants the rows sorted by a column, or with -1 as they came.
     void sort(int column, Qt::SortOrder direction) override { emit sortWished(column, direction); }
 
-    /// The value of a cell, of a long text the beginning; of a blob the number of its bytes.
+    /// The value of a cell itself, of a long text the beginning; of a blob the number of its bytes.
     Cell cell(const QModelIndex& index) const;
     /// Where a row that is shown is in the spool.
     qint64 spooled(int row) const;
@@ -40,8 +45,8 @@ public:
     QVariant headerData(int section, Qt::Orientation orientation,
                         int role = Qt::DisplayRole) const override;
 
-    /// The selected cells in full as text with tabs between columns and a line a row, or nothing
-    /// when they are more than a clipboard should hold.
+    /// The selected cells in full, as they are shown, as text with tabs between columns and a line
+    /// a row, or nothing when they are more than a clipboard should hold.
     std::optional<QString> copied(const QItemSelection& selection) const;
 
 signals:
@@ -50,6 +55,7 @@ signals:
 private:
     std::shared_ptr<Spool> mSpool;
     QStringList mColumns;
+    ColumnFormats mFormats;
     RowOrder mOrder; ///< empty: as they came
     int mRows = 0;
     mutable QCache<qint64, std::vector<Row>> mPages;

@@ -110,6 +110,13 @@ void ResultTable::fitColumns() {
         if (columnWidth(column) > widestColumn) setColumnWidth(column, widestColumn);
 }
 
+void ResultTable::widenColumns() {
+    for (int column = 0; column < mModel->columnCount(); ++column)
+        if (const int wanted = std::min(sizeHintForColumn(column), widestColumn);
+            columnWidth(column) < wanted)
+            setColumnWidth(column, wanted);
+}
+
 void ResultTable::setEmptyText(const QString& text) {
     mEmptyText = text;
     setAccessibleDescription(text);

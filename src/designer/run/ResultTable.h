@@ -18,6 +18,8 @@ public:
     ResultModel& rows() { return *mModel; }
     /// Makes the columns as wide as the rows that are there need, within reason.
     void fitColumns();
+    /// Makes those wider that their rows no longer fit in, within reason.
+    void widenColumns();
     /// The arrow in the header; -1 for none. Sorts nothing.
     void showSorting(int column, Qt::SortOrder direction = Qt::AscendingOrder);
     QAction* copyAction() { return mCopy; }

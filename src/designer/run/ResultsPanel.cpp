@@ -66,6 +66,7 @@ void ResultsPanel::run() {
     mSpool = std::make_shared<Spool>();
     mAsked = asked();
     showSpool();
+    mTable->rows().setFormats(ColumnFormats(*mDocument.query()));
     mFitted = false;
     start(*made, mSpool, {});
     showRows();
@@ -261,8 +262,14 @@ platform::String ResultsPanel::asked() {
 
 void ResultsPanel::queryChanged() {
     if (isRunning() || !mSpool || !areRowsShown()) return;
-    if (mOutdated == (asked() != mAsked)) return;
-    mOutdated = !mOutdated;
+    const bool isOutdated = asked() != mAsked;
+    // How values are shown is no part of what is asked for, and seen at once.
+    if (!isOutdated && mTable->rows().setFormats(ColumnFormats(*mDocument.query()))) {
+        mTable->widenColumns();
+        drawChart();
+    }
+    if (mOutdated == isOutdated) return;
+    mOutdated = isOutdated;
     showStatus();
 }
 
@@ -292,10 +299,14 @@ void ResultsPanel::drawChart() {
         return mChart->say(tr("The chart is drawn when the rows have come."));
     const ResultModel& rows = mTable->rows();
     QStringList columns;
-    for (int column = 0; column < rows.columnCount(); ++column)
+    std::vector<CellFormat> formats;
+    for (int column = 0; column < rows.columnCount(); ++column) {
         columns << (mSpool ? mSpool->columns().value(column) : QString());
+        formats.push_back(rows.format(column));
+    }
     mChart->show({columns, rows.rowCount(),
-                  [&rows](int row, int column) { return rows.cell(rows.index(row, column)); }});
+                  [&rows](int row, int column) { return rows.cell(rows.index(row, column)); },
+                  formats});
 }
 
 void ResultsPanel::goToTable() {

@@ -26,6 +26,8 @@ SelectedCells::SelectedCells(const ResultModel& rows, const QItemSelection& sele
         for (int row = range.top(); row <= range.bottom(); ++row)
             part->rows[static_cast<std::size_t>(rows.spooled(row))] = true;
     }
+    for (int column = 0; column < rows.columnCount(); ++column)
+        mFormats.push_back(rows.format(column));
     if (mSpool && mCount > 0)
         mPages = (rows.rowCount() + Spool::rowsInAPage - 1) / Spool::rowsInAPage;
 }
@@ -43,8 +45,9 @@ void SelectedCells::goOn(const QDeadlineTimer& until) {
                 if (!part.rows[row]) continue;
                 if (!std::exchange(isRead, true)) rows = mSpool->page(page, mostBytes);
                 if (row - first >= rows.size()) break;
-                for (int column = part.left; column <= part.right; ++column)
-                    mTally.add(rows[row - first][static_cast<std::size_t>(column)]);
+                for (auto column = static_cast<std::size_t>(part.left);
+                     column <= static_cast<std::size_t>(part.right); ++column)
+                    mTally.add(rows[row - first][column], mFormats[column]);
             }
         }
         if (until.hasExpired()) return;

@@ -37,6 +37,7 @@ private:
 
     std::shared_ptr<Spool> mSpool;
     std::vector<Part> mParts;
+    std::vector<CellFormat> mFormats; ///< of all columns
     qint64 mCount = 0;
     qint64 mPage = 0;
     qint64 mPages = 0;

@@ -1072,6 +1072,10 @@
         <source>This is a statement of more than a million characters: put fewer functions into each other, or divide it among several columns.</source>
         <translation>Das ergibt eine Anweisung von mehr als einer Million Zeichen: weniger Funktionen ineinander setzen oder auf mehrere Spalten verteilen.</translation>
     </message>
+    <message>
+        <source>%1 is no format of values</source>
+        <translation>%1 ist kein Format für Werte</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>
@@ -1260,6 +1264,14 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::CellFormat</name>
+    <message>
+        <source>%1%</source>
+        <comment>of hundred</comment>
+        <translation>%1 %</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::CellReader</name>
     <message>
         <source>(outside the calendar)</source>
@@ -1425,10 +1437,6 @@
         <translation>In den &amp;Zeilen gezeigt</translation>
     </message>
     <message>
-        <source>Fi&amp;eld:</source>
-        <translation>F&amp;eld:</translation>
-    </message>
-    <message>
         <source>&amp;Total:</source>
         <translation>Aus&amp;wertung:</translation>
     </message>
@@ -1447,6 +1455,30 @@
     <message>
         <source>a column or an expression</source>
         <translation>eine Spalte oder ein Ausdruck</translation>
+    </message>
+    <message>
+        <source>How the values look in the rows; sorting, criteria and exported files go by the values themselves</source>
+        <translation>Wie die Werte in den Zeilen aussehen; Sortierung, Kriterien und exportierte Dateien richten sich nach den Werten selbst</translation>
+    </message>
+    <message>
+        <source>as many as there are</source>
+        <translation>so viele wie vorhanden</translation>
+    </message>
+    <message>
+        <source>So many digits stand behind the point</source>
+        <translation>So viele Ziffern stehen hinter dem Komma</translation>
+    </message>
+    <message>
+        <source>For&amp;mat:</source>
+        <translation>For&amp;mat:</translation>
+    </message>
+    <message>
+        <source>De&amp;cimals:</source>
+        <translation>Nach&amp;kommastellen:</translation>
+    </message>
+    <message>
+        <source>Fie&amp;ld:</source>
+        <translation>F&amp;eld:</translation>
     </message>
 </context>
 <context>
@@ -1945,17 +1977,61 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
+    <name>zandor::designer::Format</name>
+    <message>
+        <source>As it is</source>
+        <translation>Unverändert</translation>
+    </message>
+    <message>
+        <source>Whole number</source>
+        <translation>Ganze Zahl</translation>
+    </message>
+    <message>
+        <source>Decimals</source>
+        <translation>Nachkommastellen</translation>
+    </message>
+    <message>
+        <source>Thousands</source>
+        <translation>Tausender</translation>
+    </message>
+    <message>
+        <source>Percent</source>
+        <translation>Prozent</translation>
+    </message>
+    <message>
+        <source>Short date</source>
+        <translation>Kurzes Datum</translation>
+    </message>
+    <message>
+        <source>Long date</source>
+        <translation>Langes Datum</translation>
+    </message>
+    <message>
+        <source>Date and time</source>
+        <translation>Datum und Zeit</translation>
+    </message>
+    <message>
+        <source>ISO date</source>
+        <translation>ISO-Datum</translation>
+    </message>
+    <message>
+        <source>Year and month</source>
+        <translation>Jahr und Monat</translation>
+    </message>
+    <message>
+        <source>Weekday</source>
+        <translation>Wochentag</translation>
+    </message>
+    <message>
+        <source>Time</source>
+        <translation>Zeit</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::GridHint</name>
     <message>
         <source>Double-click a column of a table, or drag it here, to choose what comes out. Until then all columns do.</source>
         <translation>Klicken Sie doppelt auf eine Spalte einer Tabelle oder ziehen Sie sie hierher, um zu wählen, was ausgegeben wird. Bis dahin sind es alle Spalten.</translation>
-    </message>
-</context>
-<context>
-    <name>zandor::designer::GridQuestions</name>
-    <message>
-        <source>C&amp;olumn…</source>
-        <translation>S&amp;palte…</translation>
     </message>
 </context>
 <context>
@@ -1988,6 +2064,24 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
         <translation>Öffnen Sie zuerst eine Datenbank: siehe das Menü „Datenbank“.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::JoinCommands</name>
+    <message>
+        <source>Only matching rows of %1</source>
+        <translation>Nur passende Zeilen von %1</translation>
+    </message>
+    <message>
+        <source>All rows of %1</source>
+        <translation>Alle Zeilen von %1</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::MenuQuestions</name>
+    <message>
+        <source>C&amp;olumn…</source>
+        <translation>S&amp;palte…</translation>
     </message>
 </context>
 <context>
@@ -2083,10 +2177,6 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
 <context>
     <name>zandor::designer::QueryPanel</name>
     <message>
-        <source>E&amp;qual rows only once</source>
-        <translation>&amp;Gleiche Zeilen nur einmal</translation>
-    </message>
-    <message>
         <source>all</source>
         <translation>alle</translation>
     </message>
@@ -2099,12 +2189,16 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
         <translation>Wofür die Abfrage da ist. Die Datei bewahrt es auf.</translation>
     </message>
     <message>
-        <source>Descri&amp;ption:</source>
-        <translation>&amp;Beschreibung:</translation>
-    </message>
-    <message>
         <source>Fi&amp;rst rows:</source>
         <translation>E&amp;rste Zeilen:</translation>
+    </message>
+    <message>
+        <source>Equal rows onl&amp;y once</source>
+        <translation>Glei&amp;che Zeilen nur einmal</translation>
+    </message>
+    <message>
+        <source>Descripti&amp;on:</source>
+        <translation>Beschreib&amp;ung:</translation>
     </message>
 </context>
 <context>
@@ -2710,6 +2804,10 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>Change which rows come out</source>
         <translation>Ändern, welche Zeilen herauskommen</translation>
+    </message>
+    <message>
+        <source>Change format of %1</source>
+        <translation>Format von %1 ändern</translation>
     </message>
 </context>
 <context>

@@ -1072,6 +1072,10 @@
         <source>This is a statement of more than a million characters: put fewer functions into each other, or divide it among several columns.</source>
         <translation>Esto da una instrucción de más de un millón de caracteres: anide menos funciones o repártala entre varias columnas.</translation>
     </message>
+    <message>
+        <source>%1 is no format of values</source>
+        <translation>%1 no es un formato de valores</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>
@@ -1260,6 +1264,14 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::CellFormat</name>
+    <message>
+        <source>%1%</source>
+        <comment>of hundred</comment>
+        <translation>%1 %</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::CellReader</name>
     <message>
         <source>(outside the calendar)</source>
@@ -1425,10 +1437,6 @@
         <translation>Se &amp;muestra en las filas</translation>
     </message>
     <message>
-        <source>Fi&amp;eld:</source>
-        <translation>Camp&amp;o:</translation>
-    </message>
-    <message>
         <source>&amp;Total:</source>
         <translation>&amp;Total:</translation>
     </message>
@@ -1447,6 +1455,30 @@
     <message>
         <source>a column or an expression</source>
         <translation>una columna o una expresión</translation>
+    </message>
+    <message>
+        <source>How the values look in the rows; sorting, criteria and exported files go by the values themselves</source>
+        <translation>Cómo se ven los valores en las filas; la ordenación, los criterios y los archivos exportados siguen los propios valores</translation>
+    </message>
+    <message>
+        <source>as many as there are</source>
+        <translation>tantos como haya</translation>
+    </message>
+    <message>
+        <source>So many digits stand behind the point</source>
+        <translation>Número de cifras tras la coma</translation>
+    </message>
+    <message>
+        <source>For&amp;mat:</source>
+        <translation>&amp;Formato:</translation>
+    </message>
+    <message>
+        <source>De&amp;cimals:</source>
+        <translation>Decima&amp;les:</translation>
+    </message>
+    <message>
+        <source>Fie&amp;ld:</source>
+        <translation>Camp&amp;o:</translation>
     </message>
 </context>
 <context>
@@ -1945,17 +1977,61 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
+    <name>zandor::designer::Format</name>
+    <message>
+        <source>As it is</source>
+        <translation>Tal cual</translation>
+    </message>
+    <message>
+        <source>Whole number</source>
+        <translation>Número entero</translation>
+    </message>
+    <message>
+        <source>Decimals</source>
+        <translation>Decimales</translation>
+    </message>
+    <message>
+        <source>Thousands</source>
+        <translation>Millares</translation>
+    </message>
+    <message>
+        <source>Percent</source>
+        <translation>Porcentaje</translation>
+    </message>
+    <message>
+        <source>Short date</source>
+        <translation>Fecha corta</translation>
+    </message>
+    <message>
+        <source>Long date</source>
+        <translation>Fecha larga</translation>
+    </message>
+    <message>
+        <source>Date and time</source>
+        <translation>Fecha y hora</translation>
+    </message>
+    <message>
+        <source>ISO date</source>
+        <translation>Fecha ISO</translation>
+    </message>
+    <message>
+        <source>Year and month</source>
+        <translation>Año y mes</translation>
+    </message>
+    <message>
+        <source>Weekday</source>
+        <translation>Día de la semana</translation>
+    </message>
+    <message>
+        <source>Time</source>
+        <translation>Hora</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::GridHint</name>
     <message>
         <source>Double-click a column of a table, or drag it here, to choose what comes out. Until then all columns do.</source>
         <translation>Haga doble clic en una columna de una tabla, o arrástrela aquí, para elegir qué sale. Hasta entonces salen todas las columnas.</translation>
-    </message>
-</context>
-<context>
-    <name>zandor::designer::GridQuestions</name>
-    <message>
-        <source>C&amp;olumn…</source>
-        <translation>C&amp;olumna…</translation>
     </message>
 </context>
 <context>
@@ -1988,6 +2064,24 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
         <translation>Abra una base de datos para empezar: vea el menú «Base de datos».</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::JoinCommands</name>
+    <message>
+        <source>Only matching rows of %1</source>
+        <translation>Solo las filas coincidentes de %1</translation>
+    </message>
+    <message>
+        <source>All rows of %1</source>
+        <translation>Todas las filas de %1</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::MenuQuestions</name>
+    <message>
+        <source>C&amp;olumn…</source>
+        <translation>C&amp;olumna…</translation>
     </message>
 </context>
 <context>
@@ -2083,10 +2177,6 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
 <context>
     <name>zandor::designer::QueryPanel</name>
     <message>
-        <source>E&amp;qual rows only once</source>
-        <translation>Filas i&amp;guales una sola vez</translation>
-    </message>
-    <message>
         <source>all</source>
         <translation>todas</translation>
     </message>
@@ -2099,12 +2189,16 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
         <translation>Para qué sirve la consulta. El archivo lo guarda.</translation>
     </message>
     <message>
-        <source>Descri&amp;ption:</source>
-        <translation>Descri&amp;pción:</translation>
-    </message>
-    <message>
         <source>Fi&amp;rst rows:</source>
         <translation>P&amp;rimeras filas:</translation>
+    </message>
+    <message>
+        <source>Equal rows onl&amp;y once</source>
+        <translation>Filas i&amp;guales una sola vez</translation>
+    </message>
+    <message>
+        <source>Descripti&amp;on:</source>
+        <translation>De&amp;scripción:</translation>
     </message>
 </context>
 <context>
@@ -2710,6 +2804,10 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>Change which rows come out</source>
         <translation>Cambiar qué filas salen</translation>
+    </message>
+    <message>
+        <source>Change format of %1</source>
+        <translation>Cambiar el formato de %1</translation>
     </message>
 </context>
 <context>

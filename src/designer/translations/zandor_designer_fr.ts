@@ -1072,6 +1072,10 @@
         <source>This is a statement of more than a million characters: put fewer functions into each other, or divide it among several columns.</source>
         <translation>Cela donne une instruction de plus d’un million de caractères : imbriquez moins de fonctions, ou répartissez-la sur plusieurs colonnes.</translation>
     </message>
+    <message>
+        <source>%1 is no format of values</source>
+        <translation>%1 n’est pas un format de valeurs</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>
@@ -1260,6 +1264,14 @@
     </message>
 </context>
 <context>
+    <name>zandor::designer::CellFormat</name>
+    <message>
+        <source>%1%</source>
+        <comment>of hundred</comment>
+        <translation>%1 %</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::CellReader</name>
     <message>
         <source>(outside the calendar)</source>
@@ -1422,11 +1434,7 @@
     </message>
     <message>
         <source>Sho&amp;wn in the rows</source>
-        <translation>A&amp;ffichée dans les lignes</translation>
-    </message>
-    <message>
-        <source>Fi&amp;eld:</source>
-        <translation>Cham&amp;p :</translation>
+        <translation>Affi&amp;chée dans les lignes</translation>
     </message>
     <message>
         <source>&amp;Total:</source>
@@ -1438,15 +1446,39 @@
     </message>
     <message>
         <source>&amp;Sort:</source>
-        <translation>Tr&amp;i :</translation>
+        <translation>Or&amp;dre :</translation>
     </message>
     <message>
         <source>&amp;Priority:</source>
-        <translation>Prio&amp;rité :</translation>
+        <translation>Pri&amp;orité :</translation>
     </message>
     <message>
         <source>a column or an expression</source>
         <translation>une colonne ou une expression</translation>
+    </message>
+    <message>
+        <source>How the values look in the rows; sorting, criteria and exported files go by the values themselves</source>
+        <translation>Comment les valeurs se présentent dans les lignes ; le tri, les critères et les fichiers exportés suivent les valeurs elles-mêmes</translation>
+    </message>
+    <message>
+        <source>as many as there are</source>
+        <translation>autant que présentes</translation>
+    </message>
+    <message>
+        <source>So many digits stand behind the point</source>
+        <translation>Nombre de chiffres après la virgule</translation>
+    </message>
+    <message>
+        <source>For&amp;mat:</source>
+        <translation>For&amp;mat :</translation>
+    </message>
+    <message>
+        <source>De&amp;cimals:</source>
+        <translation>Décima&amp;les :</translation>
+    </message>
+    <message>
+        <source>Fie&amp;ld:</source>
+        <translation>Cham&amp;p :</translation>
     </message>
 </context>
 <context>
@@ -1945,17 +1977,61 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
+    <name>zandor::designer::Format</name>
+    <message>
+        <source>As it is</source>
+        <translation>Telle quelle</translation>
+    </message>
+    <message>
+        <source>Whole number</source>
+        <translation>Nombre entier</translation>
+    </message>
+    <message>
+        <source>Decimals</source>
+        <translation>Décimales</translation>
+    </message>
+    <message>
+        <source>Thousands</source>
+        <translation>Milliers</translation>
+    </message>
+    <message>
+        <source>Percent</source>
+        <translation>Pourcentage</translation>
+    </message>
+    <message>
+        <source>Short date</source>
+        <translation>Date courte</translation>
+    </message>
+    <message>
+        <source>Long date</source>
+        <translation>Date longue</translation>
+    </message>
+    <message>
+        <source>Date and time</source>
+        <translation>Date et heure</translation>
+    </message>
+    <message>
+        <source>ISO date</source>
+        <translation>Date ISO</translation>
+    </message>
+    <message>
+        <source>Year and month</source>
+        <translation>Année et mois</translation>
+    </message>
+    <message>
+        <source>Weekday</source>
+        <translation>Jour de la semaine</translation>
+    </message>
+    <message>
+        <source>Time</source>
+        <translation>Heure</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::GridHint</name>
     <message>
         <source>Double-click a column of a table, or drag it here, to choose what comes out. Until then all columns do.</source>
         <translation>Double-cliquez sur une colonne d’une table, ou faites-la glisser ici, pour choisir les colonnes de sortie. D’ici là, toutes les colonnes sont produites.</translation>
-    </message>
-</context>
-<context>
-    <name>zandor::designer::GridQuestions</name>
-    <message>
-        <source>C&amp;olumn…</source>
-        <translation>C&amp;olonne…</translation>
     </message>
 </context>
 <context>
@@ -1988,6 +2064,24 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>Open a database to begin: see the menu &quot;Database&quot;.</source>
         <translation>Ouvrez une base de données pour commencer : voir le menu « Base de données ».</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::JoinCommands</name>
+    <message>
+        <source>Only matching rows of %1</source>
+        <translation>Seulement les lignes correspondantes de %1</translation>
+    </message>
+    <message>
+        <source>All rows of %1</source>
+        <translation>Toutes les lignes de %1</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::MenuQuestions</name>
+    <message>
+        <source>C&amp;olumn…</source>
+        <translation>C&amp;olonne…</translation>
     </message>
 </context>
 <context>
@@ -2083,10 +2177,6 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
 <context>
     <name>zandor::designer::QueryPanel</name>
     <message>
-        <source>E&amp;qual rows only once</source>
-        <translation>Lignes é&amp;gales une seule fois</translation>
-    </message>
-    <message>
         <source>all</source>
         <translation>toutes</translation>
     </message>
@@ -2099,12 +2189,16 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
         <translation>À quoi sert la requête. Le fichier le conserve.</translation>
     </message>
     <message>
-        <source>Descri&amp;ption:</source>
-        <translation>Descri&amp;ption :</translation>
+        <source>Fi&amp;rst rows:</source>
+        <translation>Première&amp;s lignes :</translation>
     </message>
     <message>
-        <source>Fi&amp;rst rows:</source>
-        <translation>P&amp;remières lignes :</translation>
+        <source>Equal rows onl&amp;y once</source>
+        <translation>Lignes é&amp;gales une seule fois</translation>
+    </message>
+    <message>
+        <source>Descripti&amp;on:</source>
+        <translation>D&amp;escription :</translation>
     </message>
 </context>
 <context>
@@ -2710,6 +2804,10 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>Change which rows come out</source>
         <translation>Modifier les lignes qui sortent</translation>
+    </message>
+    <message>
+        <source>Change format of %1</source>
+        <translation>Changer le format de %1</translation>
     </message>
 </context>
 <context>

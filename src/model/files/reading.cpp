@@ -177,6 +177,8 @@ model::DefinitionRecord Reader::definition(Object object) {
     definition.names = names(object);
     definition.total = static_cast<model::Total>(object.word("total", words::totals, 0));
     definition.sortPriority = object.integer<std::int16_t>("sortPriority", std::int16_t{0});
+    definition.format = static_cast<model::Format>(object.word("format", words::formats, 0));
+    definition.decimals = object.integer<std::int16_t>("decimals", model::asManyAsThereAre);
     const std::string key = platform::toUtf8(definition.key);
     each(object.listOrNone("criteria", INT16_MAX), object.place() / "criteria", [&](Object each) {
         const auto row = each.integer<std::int16_t>("row");

@@ -21,4 +21,9 @@ inline constexpr std::array<std::string_view, 9> totals = {
     "none",    "group",    "count",   "count different", "sum",
     "average", "smallest", "largest", "condition"};
 
+/// model::Format
+inline constexpr std::array<std::string_view, 11> formats = {
+    "none",          "number",   "thousands",  "percent", "short date", "long date",
+    "date and time", "iso date", "year-month", "weekday", "time"};
+
 } // namespace zandor::files::words

@@ -197,6 +197,11 @@ json::Value Writer::definition(const model::DefinitionRecord& definition,
             {"total", {word(words::totals, static_cast<std::int16_t>(definition.total))}});
     if (definition.sortPriority != 0)
         members.push_back({"sortPriority", json::number(definition.sortPriority)});
+    if (definition.format != model::Format::None)
+        members.push_back(
+            {"format", {word(words::formats, static_cast<std::int16_t>(definition.format))}});
+    if (definition.decimals != model::asManyAsThereAre)
+        members.push_back({"decimals", json::number(definition.decimals)});
     members.push_back({"criteria", {std::move(criteria)}});
     return whole(std::move(members), key);
 }

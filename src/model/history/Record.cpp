@@ -142,6 +142,11 @@ private:
             fault<MessageCode::notInRange>(path + "sortPriority", 0,
                                            ColumnDefinition::greatestSortPriority);
         if (definition.total > lastTotal) fault<MessageCode::noTotal>(path + "total");
+        if (definition.format > lastFormat) fault<MessageCode::noFormat>(path + "format");
+        if (definition.decimals < asManyAsThereAre ||
+            definition.decimals > ColumnDefinition::mostDecimals)
+            fault<MessageCode::notInRange>(path + "decimals", asManyAsThereAre,
+                                           ColumnDefinition::mostDecimals);
         if (!definition.expression.empty() && !definition.column.empty())
             fault<MessageCode::columnBesideExpression>(path + "column");
         names(definition.names, definition.expression, path);

@@ -29,7 +29,9 @@ DefinitionState stateOf(Ref<ColumnDefinition> definition) {
                           {},
                           definition->total(),
                           definition->sortPriority(),
-                          definition->expression()};
+                          definition->expression(),
+                          definition->format(),
+                          definition->decimals()};
     for (const auto& [row, criterium] : definition->criteria().rows())
         state.criteria.push_back({row, criterium->tied()});
     return state;

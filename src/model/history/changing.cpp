@@ -88,6 +88,8 @@ void Query::set(const DefinitionState& state) {
     definition.mTotal = state.total;
     definition.mSortPriority = state.sortPriority;
     definition.mExpression = state.expression;
+    definition.mFormat = state.format;
+    definition.mDecimals = state.decimals;
     definition.mCriteria.clear();
     for (const CriterionState& criterion : state.criteria) {
         definition.mCriteria.Add(criterion.text.text, platform::decimal(criterion.row));

@@ -62,7 +62,9 @@ DefinitionRecord recordOf(const ColumnDefinition& definition) {
                             .total = definition.total(),
                             .sortPriority = definition.sortPriority(),
                             .expression = definition.expression().text,
-                            .names = recordOf(definition.expression().references)};
+                            .names = recordOf(definition.expression().references),
+                            .format = definition.format(),
+                            .decimals = definition.decimals()};
     for (const auto& [row, criterium] : definition.criteria().rows())
         record.criteria.push_back(
             {row, criterium->Criterium(), recordOf(criterium->tied().references)});
@@ -116,6 +118,8 @@ Ref<Query> Query::restored(const QueryRecord& record) {
         definition->mTotal = from.total;
         definition->mSortPriority = from.sortPriority;
         definition->mExpression = {from.expression, query->restored(from.names)};
+        definition->mFormat = from.format;
+        definition->mDecimals = from.decimals;
         definition->mKey = from.key;
         for (const CriterionRecord& criterion : from.criteria) {
             definition->AddCriterium(criterion.text, platform::decimal(criterion.row));

@@ -43,6 +43,17 @@ void ColumnDefinition::sortPriority(std::int16_t value) {
     mSortPriority = value;
 }
 
+void ColumnDefinition::format(Format value) {
+    if (value > lastFormat) throw platform::errors::invalidPropertyValue();
+    mFormat = value;
+}
+
+void ColumnDefinition::decimals(std::int16_t value) {
+    if (value < asManyAsThereAre || value > mostDecimals)
+        throw platform::errors::invalidPropertyValue();
+    mDecimals = value;
+}
+
 void ColumnDefinition::expression(const String& text) {
     if (text == mExpression->text) return;
     if (!text.empty()) mPlace = ColumnPlace(mPlace->table().nowhere(), {});

@@ -42,6 +42,15 @@ std::vector<std::string> labels(const QString& first, const QString& last, int m
 
 } // namespace
 
+TEST(AChartsData, IsLabelledAsTheColumnIsShownAndCountedByTheValues) {
+    ChartSource rows = source({"at", "share"}, {{"2026-07-22", "0.25"}, {"2026-07-21", "0.5"}});
+    rows.formats = {{zandor::model::Format::Weekday}, {zandor::model::Format::Percent}};
+    const ChartData data = readChart(rows, best(rows));
+    EXPECT_EQ(data.labels, (QStringList{"Tuesday", "Wednesday"})) << "in the order of time";
+    EXPECT_EQ(data.series.front().values, (std::vector<std::optional<double>>{0.5, 0.25}));
+    EXPECT_EQ(data.series.front().format.format, zandor::model::Format::Percent);
+}
+
 TEST(TheColumnsOfAResult, AreTakenForWhatTheyHold) {
     const auto uses = columnUses(source(
         {"name", "day", "month", "n", "mixed", "nothing"},
@@ -115,7 +124,8 @@ TEST(AScaleOfNumbers, GoesInRoundStepsAroundTheValues) {
     EXPECT_THAT(labels(numberScale(0, 97, 5, true)),
                 ElementsAre("0", "20", "40", "60", "80", "100"));
     EXPECT_THAT(labels(numberScale(3, 7, 5, true)), ElementsAre("0", "2", "4", "6", "8"));
-    EXPECT_THAT(labels(numberScale(-30, 70, 5, true)), ElementsAre("-50", "-25", "0", "25", "50", "75"));
+    EXPECT_THAT(labels(numberScale(-30, 70, 5, true)),
+                ElementsAre("-50", "-25", "0", "25", "50", "75"));
     EXPECT_THAT(labels(numberScale(1001, 1009, 5, false)),
                 ElementsAre("1,000", "1,002", "1,004", "1,006", "1,008", "1,010"));
     EXPECT_THAT(labels(numberScale(0.1, 0.6, 3, true)), ElementsAre("0.0", "0.2", "0.4", "0.6"));

@@ -66,6 +66,18 @@ double apart(const QColor& a, const QColor& b) {
 
 } // namespace
 
+TEST(AChart, WritesValuesAsTheirColumnsAreShown) {
+    ChartData data = twoSeries();
+    for (auto& series : data.series) series.format = {zandor::model::Format::Percent, 1};
+    const ChartDrawing chart(data, look(), size);
+    EXPECT_THAT(chart.words(chart.marks()[0]).toStdString(), HasSubstr("total: 1000.0%"));
+    const auto drawn = [](const ChartData& shown) {
+        return ChartPicture(shown, QApplication::font(), size.toSize()).svg().toStdString();
+    };
+    EXPECT_THAT(drawn(data), HasSubstr(">2000%<")) << "on the scale";
+    EXPECT_THAT(drawn(twoSeries()), testing::Not(HasSubstr("%<")));
+}
+
 TEST(AChart, HasColumnsAsHighAsTheirValues) {
     const ChartDrawing chart(twoSeries(), look(), size);
     EXPECT_EQ(chart.marks().size(), 5u); // a cell is empty

@@ -276,6 +276,8 @@ TEST(AStep, IsNamedAfterWhatChanged) {
     EXPECT_EQ(
         named([&] { dynamic_cast<model::ColumnDefinition&>(*status).total(model::Total::Count); }),
         "Change total of status");
+    EXPECT_EQ(named([&] { dynamic_cast<model::ColumnDefinition&>(*status).decimals(2); }),
+              "Change format of status");
     const auto setOptions = [&](const model::QueryOptions& options) {
         return named([&] { drawing.query().options(options); });
     };

@@ -1,6 +1,7 @@
 #include "OpenProperties.h"
 
 #include "designer/properties/FieldEdit.h"
+#include "designer/properties/fields.h"
 
 #include <QCheckBox>
 #include <QCompleter>
@@ -99,6 +100,65 @@ TEST_F(TheColumnPanel, MakesEachChangeAStep) {
     EXPECT_EQ(combo("columnTotal").currentText(), "No total");
 }
 
+TEST_F(TheColumnPanel, SetsHowValuesAreShownInOneStep) {
+    goToColumn(2); // of whole numbers
+    auto& format = combo("columnFormat");
+    auto& decimals = found<QSpinBox>("columnDecimals");
+    EXPECT_EQ(format.currentText(), "As it is");
+    EXPECT_FALSE(decimals.isEnabled());
+    EXPECT_EQ(decimals.text(), "as many as there are");
+    pick("columnFormat", "Decimals: 1234.50");
+    EXPECT_EQ(definition(2).format(), model::Format::Number);
+    EXPECT_EQ(definition(2).decimals(), 2);
+    EXPECT_EQ(lastStep(), "Change format of quantity");
+    EXPECT_EQ(made(), 1);
+    EXPECT_TRUE(decimals.isEnabled());
+    decimals.setFocus();
+    hands::key(decimals, Qt::Key_Down);
+    hands::key(decimals, Qt::Key_Down);
+    calm();
+    EXPECT_EQ(definition(2).decimals(), 0);
+    EXPECT_EQ(format.currentText(), "Whole number: 1235");
+    EXPECT_EQ(made(), 3);
+    pick("columnFormat", "Thousands: 1,234.50");
+    EXPECT_EQ(definition(2).decimals(), 0) << "as was said before";
+    pick("columnFormat", "As it is");
+    EXPECT_EQ(definition(2).decimals(), model::asManyAsThereAre);
+    pick("columnFormat", "Thousands: 1,234.50");
+    EXPECT_EQ(definition(2).decimals(), model::asManyAsThereAre) << "whole numbers have none";
+    for (int n = 0; n < 6; ++n) window->document().undo();
+    calm();
+    EXPECT_EQ(made(), 0);
+    EXPECT_EQ(format.currentText(), "As it is");
+}
+
+TEST_F(TheColumnPanel, OffersTheFormatsThatTheValuesCanHave) {
+    const auto offered = [&] {
+        QStringList result;
+        for (int n = 0; n < combo("columnFormat").count(); ++n)
+            if (combo("columnFormat").model()->index(n, 0).flags() & Qt::ItemIsEnabled)
+                result << combo("columnFormat").itemText(n).section(u':', 0, 0);
+        return result.join(u'|');
+    };
+    const QString numbers = "As it is|Whole number|Decimals|Thousands|Percent";
+    const QString days = "As it is|Short date|Long date|Date and time|ISO date|Year and month|"
+                         "Weekday|Time";
+    EXPECT_EQ(offered(), days) << "a text may be a day";
+    goToColumn(2);
+    EXPECT_EQ(offered(), numbers);
+    window->document().change({}, [&](model::Query&) { definition(2).total(Total::Largest); });
+    goToColumn(1);
+    window->document().change({}, [&](model::Query&) { definition(1).total(Total::Count); });
+    calm();
+    EXPECT_EQ(offered(), numbers) << "how many there are";
+    window->document().change({}, [&](model::Query& query) {
+        definition(1).total(Total::None);
+        definition(1).Column(query.tableNamed(u"orders")->Columns().Item(1));
+    });
+    calm();
+    EXPECT_FALSE(combo("columnFormat").isEnabled()) << "of several columns";
+}
+
 TEST_F(TheColumnPanel, SaysWhatIsWrongWhileItIsTyped) {
     write("columnField", "order_lines.quantity * nothing");
     ASSERT_TRUE(until([&] { return !finding().empty(); }));
@@ -162,6 +222,53 @@ TEST_F(TheColumnPanel, OffersNamesOfColumnsAndFunctions) {
     EXPECT_FALSE(completer->popup()->isVisible());
     write("columnField", "rou");
     EXPECT_EQ(completer->currentCompletion(), "Round(");
+    hands::key(field(), Qt::Key_Escape);
+}
+
+TEST_F(TheColumnPanel, OffersFirstWhatBeginsWithWhatIsTyped) {
+    const auto offered = [&](const char* typed) {
+        write("columnField", typed);
+        QStringList result;
+        auto& list = *field().findChild<QCompleter*>()->popup();
+        for (int row = 0; list.isVisible() && row < list.model()->rowCount(); ++row)
+            result << list.model()->index(row, 0).data().toString();
+        EXPECT_FALSE(list.isVisible() && list.currentIndex().isValid()) << "none is taken";
+        hands::key(field(), Qt::Key_Escape);
+        return result.join(u' ').toStdString();
+    };
+    EXPECT_EQ(offered("mo"), "Month(");
+    EXPECT_THAT(offered("st"), testing::StartsWith("orders.status orders.customer_id"));
+    EXPECT_EQ(offered("order_id"), "order_lines.order_id");
+    EXPECT_EQ(offered("xyz"), "");
+    EXPECT_EQ(designer::matching({"a.bc", "b.a", "abs(", "[b c].[a b]", "cab("}, "A"),
+              (QStringList{"a.bc", "b.a", "abs(", "[b c].[a b]", "cab("}));
+    EXPECT_EQ(designer::matching({"a.bc", "b.a", "abs(", "[b c].[a b]", "cab("}, "b"),
+              (QStringList{"a.bc", "b.a", "[b c].[a b]", "abs(", "cab("}));
+    EXPECT_EQ(designer::matching({"a.bc", "[b c].[a b]"}, "[a"),
+              (QStringList{"a.bc", "[b c].[a b]"}));
+}
+
+TEST_F(TheColumnPanel, LeavesWhatItSaysInSightBesideTheListOfNames) {
+    const auto& label = found<QLabel>("columnFinding");
+    const int height = label.height();
+    EXPECT_GE(height, label.fontMetrics().lineSpacing());
+    write("columnField", "quantity * unit");
+    ASSERT_TRUE(until([&] { return label.height() > height; }));
+    calm();
+    auto& list = *field().findChild<QCompleter*>()->popup();
+    const auto covered = [&] {
+        const QRect said(label.mapToGlobal(QPoint()), label.size());
+        return list.isVisible() && list.frameGeometry().intersects(said);
+    };
+    ASSERT_TRUE(list.isVisible());
+    EXPECT_FALSE(covered());
+    // Neither when there is more to say while it is open.
+    write("columnField", "quantity * this_is_a_name_that_no_table_of_the_query_has + unit");
+    const int before = label.height();
+    ASSERT_TRUE(until([&] { return label.height() > before; }));
+    calm();
+    ASSERT_TRUE(list.isVisible());
+    EXPECT_FALSE(covered());
     hands::key(field(), Qt::Key_Escape);
 }
 

@@ -27,6 +27,21 @@ std::string average(const QStringList& values) {
 
 } // namespace
 
+TEST(ADecimal, IsRoundedAwayFromZero) {
+    const auto rounded = [](const QString& text, int decimals) {
+        return Decimal::from(text).value().rounded(decimals).text().toStdString();
+    };
+    EXPECT_EQ(rounded("2.5", 0), "3");
+    EXPECT_EQ(rounded("-2.5", 0), "-3");
+    EXPECT_EQ(rounded("9.995", 2), "10.00");
+    EXPECT_EQ(rounded("0.04", 1), "0.0");
+    EXPECT_EQ(rounded("-0.04", 1), "0.0");
+    EXPECT_EQ(rounded("0.05", 1), "0.1");
+    EXPECT_EQ(rounded("0.0005", 1), "0.0");
+    EXPECT_EQ(rounded("12e+3", 2), "12000.00");
+    EXPECT_EQ(rounded("1.2", 3), "1.200");
+}
+
 TEST(ADecimal, IsReadAsEnginesWriteIt) {
     EXPECT_EQ(read("12.50"), "12.50");
     EXPECT_EQ(read("-0.05"), "-0.05");

@@ -1,5 +1,7 @@
 #include "designer/run/ResultTable.h"
 
+#include "Databases.h"
+#include "Queries.h"
 #include "support/QtHands.h"
 
 #include <gtest/gtest.h>
@@ -47,6 +49,7 @@ protected:
         return {table.rows().index(top, left), table.rows().index(bottom, right)};
     }
 
+    DatabaseFolder folder;
     std::shared_ptr<Spool> spool = std::make_shared<Spool>();
     ResultTable table;
 };
@@ -112,6 +115,32 @@ TEST_F(ShownRows, PutALongTextIntoOneLine) {
     EXPECT_EQ(at(0, 0, Qt::ToolTipRole), "two\nlines");
     EXPECT_LT(at(0, 1, Qt::ToolTipRole).toString().size(), 5000);
     EXPECT_EQ(copied(range(0, 1, 0, 1)), QString(100'000, u'x'));
+}
+
+TEST_F(ShownRows, LookAsTheQuerySaysOnTheClipboardToo) {
+    const QString file = folder.database("shown.db", {"CREATE TABLE sales (price, at)"});
+    const auto query = draw(file, {"sales"}, {{"sales.price"}, {"sales.at"}});
+    const auto definition = [&](std::int32_t position) -> auto& {
+        return dynamic_cast<model::ColumnDefinition&>(*query->ColumnDefinitions().Item(position));
+    };
+    definition(1).format(model::Format::Thousands);
+    definition(1).decimals(1);
+    definition(2).format(model::Format::IsoDate);
+    add({{Kind::number, "12345.678"}, {Kind::text, "2026-07-21 14:30:00"}});
+    add({{Kind::number, "1"}, {}});
+    table.rows().refresh();
+    int changes = 0;
+    QObject::connect(&table.rows(), &QAbstractItemModel::dataChanged, [&] { ++changes; });
+    EXPECT_TRUE(table.rows().setFormats(designer::ColumnFormats(*query)));
+    EXPECT_FALSE(table.rows().setFormats(designer::ColumnFormats(*query)));
+    EXPECT_EQ(changes, 1);
+    EXPECT_EQ(at(0, 0), "12,345.7");
+    EXPECT_EQ(at(0, 0, Qt::ToolTipRole), "12,345.7");
+    EXPECT_EQ(at(0, 1), "2026-07-21");
+    EXPECT_EQ(at(1, 1), "NULL");
+    EXPECT_EQ(at(0, 0, Qt::TextAlignmentRole).toInt(), Qt::AlignRight | Qt::AlignVCenter);
+    EXPECT_EQ(copied(range(0, 0, 1, 1)), "12,345.7\t2026-07-21\n1.0\t");
+    EXPECT_EQ(table.rows().cell(table.rows().index(0, 0)).text, "12345.678");
 }
 
 TEST_F(ShownRows, AreCopiedWithTabs) {

@@ -228,6 +228,55 @@ TEST_F(TheResultsPanel, SaysNothingOfAChangeThatNoRowDependsOn) {
     EXPECT_EQ(status().find("changed"), std::string::npos);
 }
 
+TEST_F(TheResultsPanel, ShowsAFormatAtOnceAndExportsTheValuesThemselves) {
+    open({"CREATE TABLE sales (price DECIMAL(8,3), at TEXT)",
+          "INSERT INTO sales VALUES (1234.567, '2026-07-21'), (20, '2026-07-22')"});
+    show({"sales"}, {{"sales.price"}, {"sales.at"}});
+    const auto format = [&](std::int32_t position, model::Format format) {
+        document.change({}, [&](model::Query& query) {
+            auto& definition =
+                dynamic_cast<model::ColumnDefinition&>(*query.ColumnDefinitions().Item(position));
+            definition.format(format);
+            definition.decimals(1);
+        });
+    };
+    const auto inFull = [](int day) {
+        return QLocale().toString(QDate(2026, 7, day), QLocale::LongFormat);
+    };
+    const QString first = inFull(21);
+    const QString second = inFull(22);
+    format(1, model::Format::Thousands);
+    pressRun();
+    ASSERT_TRUE(ended());
+    EXPECT_EQ(at(0, 0), "1,234.6");
+    const std::string said = status();
+    const int narrow = table().columnWidth(1);
+    format(2, model::Format::LongDate);
+    QCoreApplication::processEvents();
+    EXPECT_EQ(at(0, 1), first);
+    EXPECT_GT(table().columnWidth(1), narrow);
+    EXPECT_EQ(status(), said) << "the rows are still those of the drawing";
+    // Sorted by what it is and not by what it looks like.
+    table().sortByColumn(1, Qt::DescendingOrder);
+    EXPECT_EQ(at(0, 1), second);
+    const QString path = file + ".csv";
+    panel.exportTo(path);
+    ASSERT_TRUE(ended());
+    QFile written(path);
+    ASSERT_TRUE(written.open(QIODevice::ReadOnly));
+    EXPECT_EQ(written.readAll(), "price,at\r\n1234.567,2026-07-21\r\n20,2026-07-22\r\n");
+    // With another column before them the rows keep the look that they have.
+    document.change({}, [&](model::Query& query) {
+        query.StandsBehind(query.ColumnDefinitions().Item(2), {});
+    });
+    QCoreApplication::processEvents();
+    EXPECT_EQ(at(0, 1), second);
+    document.undo();
+    document.undo();
+    QCoreApplication::processEvents();
+    EXPECT_EQ(at(0, 1), "2026-07-22");
+}
+
 TEST_F(TheResultsPanel, SaysThatTheDrawingHasChangedWhileItRan) {
     open(numbersTable(10));
     show({"numbers"});

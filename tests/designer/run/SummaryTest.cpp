@@ -115,6 +115,26 @@ TEST_F(TheSummary, IsWrittenAsTheCellsAreInTheUsersLanguage) {
     EXPECT_EQ(QGuiApplication::clipboard()->text(), "1,25\n10,05");
 }
 
+TEST_F(TheSummary, HasTheFormatOfTheColumnsThatItIsOf) {
+    open(sales);
+    show({"sales"}, {{"sales.what"}, {"sales.price"}, {"sales.rabatt"}});
+    const auto definition = [&](std::int32_t position) -> auto& {
+        return dynamic_cast<model::ColumnDefinition&>(
+            *document.query()->ColumnDefinitions().Item(position));
+    };
+    definition(2).format(model::Format::Number);
+    definition(2).decimals(1);
+    definition(3).format(model::Format::Percent);
+    run();
+    select(0, 0, 3, 1);
+    EXPECT_EQ(words(), "Cells: 8 \u00b7 Empty: 3 \u00b7 Numbers: 3 \u00b7 Sum: 8.8 \u00b7 "
+                       "Average: 2.9 \u00b7 Smallest: -2.5 \u00b7 Largest: 10.1");
+    select(0, 2, 1, 2);
+    EXPECT_THAT(words(), StartsWith("Cells: 2 \u00b7 Sum: 30% "));
+    select(0, 1, 0, 2);
+    EXPECT_THAT(words(), StartsWith("Cells: 2 \u00b7 Sum: 1.35 ")) << "of two formats";
+}
+
 TEST_F(TheSummary, IsCopiedByMouseAndKeys) {
     open(sales);
     show({"sales"});

@@ -111,6 +111,8 @@ private:
         definition->Visible(chance(80));
         if (chance(30)) definition->total(static_cast<model::Total>(upTo(8)));
         if (chance(20)) definition->sortPriority(static_cast<std::int16_t>(upTo(255)));
+        if (chance(30)) definition->format(static_cast<model::Format>(upTo(10)));
+        if (chance(30)) definition->decimals(static_cast<std::int16_t>(upTo(16) - 1));
         if (chance(20)) definition->expression(u"Coalesce(t1.c, [t2].[c], " + text() + u")");
         if (chance(40)) definition->Width(upTo(model::ColumnDefinition::greatestWidth));
         mQuery->AddColumnDefinition(definition);

@@ -41,6 +41,29 @@ TEST(ARecord, ThatIsNotTheSameIsNotEqual) {
         const auto definition = s.query->ColumnDefinitions().Item(1);
         dynamic_cast<model::ColumnDefinition&>(*definition).Width(1500);
     }));
+    EXPECT_TRUE(different([](SmallQuery& s) {
+        const auto definition = s.query->ColumnDefinitions().Item(1);
+        dynamic_cast<model::ColumnDefinition&>(*definition).format(model::Format::IsoDate);
+    }));
+    EXPECT_TRUE(different([](SmallQuery& s) {
+        const auto definition = s.query->ColumnDefinitions().Item(1);
+        dynamic_cast<model::ColumnDefinition&>(*definition).decimals(2);
+    }));
+}
+
+TEST(ARecord, HasNoFormatThatNobodyKnows) {
+    SmallQuery small;
+    small.query->AddColumnDefinition(small.newDefinition(small.orders));
+    auto record = small.query->record();
+    record.definitions[0].format = static_cast<model::Format>(11);
+    EXPECT_EQ(model::faultOf(record).value().message,
+              model::say<model::MessageCode::noFormat>("/definitions/0/format"));
+    record = small.query->record();
+    for (const int decimals : {-2, 16}) {
+        record.definitions[0].decimals = static_cast<std::int16_t>(decimals);
+        EXPECT_EQ(model::faultOf(record).value().message,
+                  model::say<model::MessageCode::notInRange>("/definitions/0/decimals", -1, 15));
+    }
 }
 
 TEST(TheKeysOfAQuery, EndWithAnErrorAndNotWithANumberTwice) {

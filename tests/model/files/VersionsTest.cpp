@@ -32,6 +32,18 @@ TEST(AFileOfVersion3, HasTotalsExpressionsAndWhatIsSaidOfTheQuery) {
     EXPECT_EQ(definition(3), u"largest(Upper(people.name))");
 }
 
+TEST(AFileOfVersion3, SaysHowValuesAreShown) {
+    const auto query = documentOf(contentOf(testFile("version-3.json"))).query;
+    const auto definition = [&](std::int32_t position) {
+        return std::dynamic_pointer_cast<model::ColumnDefinition>(
+            query->ColumnDefinitions().Item(position));
+    };
+    EXPECT_EQ(definition(2)->format(), model::Format::None);
+    EXPECT_EQ(definition(2)->decimals(), model::asManyAsThereAre);
+    EXPECT_EQ(definition(3)->format(), model::Format::Thousands);
+    EXPECT_EQ(definition(3)->decimals(), 0);
+}
+
 TEST(AFileOfVersion1, IsGivenTheLastKeysOfWhatIsThere) {
     const auto last = documentOf(contentOf(testFile("version-1.json"))).query->record().lastKeys;
     EXPECT_EQ(last, (model::LastKeys{.table = 4, .column = 9, .join = 3, .definition = 2}));

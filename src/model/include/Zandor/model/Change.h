@@ -54,6 +54,8 @@ struct DefinitionState {
     Total total = Total::None;                 ///< as ColumnDefinition::total
     std::int16_t sortPriority = 0;             ///< as ColumnDefinition::sortPriority
     criteria::TiedText expression = {};        ///< as ColumnDefinition::expression
+    Format format = Format::None;              ///< as ColumnDefinition::format
+    std::int16_t decimals = asManyAsThereAre;  ///< as ColumnDefinition::decimals
 
     friend bool operator==(const DefinitionState&, const DefinitionState&) = default;
 };

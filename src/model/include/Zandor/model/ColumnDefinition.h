@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Criteria.h>
+#include <Zandor/model/Format.h>
 #include <Zandor/model/Place.h>
 #include <Zandor/model/Total.h>
 #include <Zandor/model/export.h>
@@ -49,6 +50,15 @@ public:
     std::int16_t sortPriority() const { return mSortPriority; }
     /// Error 380 outside 0 to greatestSortPriority.
     void sortPriority(std::int16_t value);
+    /// How its values are shown to people.
+    Format format() const { return mFormat; }
+    /// Error 380 for none of the constants.
+    void format(Format value);
+    /// Behind the point, for a format of numbers: rounded or filled up with zeros to so many; with
+    /// asManyAsThereAre as the values have them.
+    std::int16_t decimals() const { return mDecimals; }
+    /// Error 380 outside asManyAsThereAre to mostDecimals.
+    void decimals(std::int16_t value);
     /// What comes out instead of a column, with what its names are tied to; empty for a column.
     const criteria::TiedText& expression() const { return *mExpression; }
     /// The names in a new text mean what they name when the query is next read or changed. A text
@@ -69,6 +79,8 @@ public:
 
     /// Of sortPriority.
     static constexpr std::int16_t greatestSortPriority = 255;
+    /// Of decimals.
+    static constexpr std::int16_t mostDecimals = 15;
 
 private:
     friend class Query; ///< gives the key
@@ -82,6 +94,8 @@ private:
     Revised<std::int32_t> mWidth{*mRevision};
     Revised<Total> mTotal{*mRevision};
     Revised<std::int16_t> mSortPriority{*mRevision};
+    Revised<Format> mFormat{*mRevision};
+    Revised<std::int16_t> mDecimals{*mRevision, asManyAsThereAre};
     Revised<criteria::TiedText> mExpression{*mRevision};
     String mKey;
     model::Criteria mCriteria{mRevision};

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/model/Description.h>
+#include <Zandor/model/Format.h>
 #include <Zandor/model/Messages.h>
 #include <Zandor/model/QueryOptions.h>
 #include <Zandor/model/Total.h>
@@ -115,6 +116,8 @@ struct DefinitionRecord {
     std::int16_t sortPriority = 0;              ///< as ColumnDefinition::sortPriority
     String expression = {};                     ///< as it was typed; then there is no column
     std::vector<NameRecord> names = {};         ///< of the expression, as those of a criterion
+    Format format = Format::None;               ///< as ColumnDefinition::format
+    std::int16_t decimals = asManyAsThereAre;   ///< as ColumnDefinition::decimals
 
     friend bool operator==(const DefinitionRecord&, const DefinitionRecord&) = default;
 };
