@@ -20,7 +20,7 @@
 #include "designer/options/EventPanel.h"
 #include "designer/options/OptionsDialog.h"
 #include "designer/properties/ColumnPanel.h"
-#include "designer/properties/GridQuestions.h"
+#include "designer/properties/MenuQuestions.h"
 #include "designer/properties/QueryPanel.h"
 #include "designer/properties/TotalCommands.h"
 #include "designer/run/ResultsPanel.h"
@@ -317,6 +317,7 @@ QWidget* DesignerWindow::makeCorner() {
     totals->setMenu(&mTotals->menu());
     totals->setPopupMode(QToolButton::InstantPopup);
     auto* const run = new QToolButton;
+    run->setObjectName(QStringLiteral("runButton"));
     run->setDefaultAction(mResults->runAction());
     run->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
     for (QToolButton* button : {totals, run}) {
@@ -338,7 +339,8 @@ void DesignerWindow::goTo(QWidget& panel) {
 }
 
 void DesignerWindow::connectParts() {
-    const auto questions = std::make_shared<GridQuestions>(*mTotals, [this] { goTo(*mColumn); });
+    const auto questions = std::make_shared<MenuQuestions>(
+        *mTotals, JoinCommands(mDocument, *mDrawing), [this] { goTo(*mColumn); });
     const auto ask = [questions](ZandorWidget* control) { control->setQuestions(questions); };
     connect(mDrawing, &DrawingArea::controlMade, this, ask);
     ask(&mDrawing->control());

@@ -1,7 +1,7 @@
 #include "OpenProperties.h"
 
 #include "designer/properties/CurrentColumn.h"
-#include "designer/properties/GridQuestions.h"
+#include "designer/properties/MenuQuestions.h"
 #include "designer/properties/TotalCommands.h"
 #include "designer/properties/totals.h"
 
@@ -27,7 +27,9 @@ protected:
     }
     std::vector<TalvikDBxZandor::HostEntry> asked(const TalvikDBxZandor::MenuPlace& place) {
         auto* const commands = window->findChild<designer::TotalCommands*>();
-        return designer::GridQuestions(*commands, [] {}).MenuEntries(place);
+        return designer::MenuQuestions(
+                   *commands, designer::JoinCommands(window->document(), window->drawing()), [] {})
+            .MenuEntries(place);
     }
     TalvikDBxZandor::MenuPlace over(int column) {
         TalvikDBxZandor::MenuPlace place;
