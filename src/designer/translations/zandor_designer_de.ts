@@ -1076,6 +1076,34 @@
         <source>%1 is no format of values</source>
         <translation>%1 ist kein Format für Werte</translation>
     </message>
+    <message>
+        <source>The query &quot;%1&quot; would read from itself, by itself or by way of the saved queries in it: choose another one, or take one out.</source>
+        <translation>Die Abfrage „%1“ würde aus sich selbst lesen, unmittelbar oder über die gespeicherten Abfragen in ihr: Wählen Sie eine andere, oder nehmen Sie eine heraus.</translation>
+    </message>
+    <message>
+        <source>In %1: %2</source>
+        <translation>In %1: %2</translation>
+    </message>
+    <message>
+        <source>No column comes out of that query, so that it cannot stand as a table: give it output columns, and save it.</source>
+        <translation>Aus dieser Abfrage kommt keine Spalte heraus, also kann sie nicht als Tabelle stehen: Geben Sie ihr Ausgabespalten, und speichern Sie sie.</translation>
+    </message>
+    <message>
+        <source>Saved queries stand more than %1 deep in each other then: make one query of some of them.</source>
+        <translation>Gespeicherte Abfragen stünden dann mehr als %1 tief ineinander: Machen Sie aus einigen eine einzige.</translation>
+    </message>
+    <message>
+        <source>%1 gives no column %2 any more, which is used here: take it out of this query, or give it back to that one.</source>
+        <translation>%1 liefert keine Spalte %2 mehr, die hier verwendet wird: Nehmen Sie sie aus dieser Abfrage heraus, oder geben Sie sie jener zurück.</translation>
+    </message>
+    <message>
+        <source>%1 has other columns here than its query gives: read it again from its file.</source>
+        <translation>%1 hat hier andere Spalten, als ihre Abfrage liefert: Lesen Sie sie neu aus ihrer Datei.</translation>
+    </message>
+    <message>
+        <source>%1 has saved queries more than %2 deep in each other</source>
+        <translation>%1 hat gespeicherte Abfragen mehr als %2 tief ineinander</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>
@@ -1268,7 +1296,7 @@
     <message>
         <source>%1%</source>
         <comment>of hundred</comment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
 </context>
 <context>
@@ -1812,6 +1840,10 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
         <source>Total</source>
         <translation>Auswertung</translation>
     </message>
+    <message>
+        <source>Add saved query</source>
+        <translation>Gespeicherte Abfrage hinzufügen</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Document</name>
@@ -2089,6 +2121,10 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     <message>
         <source>There is no table &quot;%1&quot; in %2.</source>
         <translation>In %2 gibt es keine Tabelle „%1“.</translation>
+    </message>
+    <message>
+        <source>There is no file &quot;%1&quot; any more; the query is as it was read last.</source>
+        <translation>Die Datei „%1“ gibt es nicht mehr; die Abfrage ist, wie sie zuletzt gelesen wurde.</translation>
     </message>
 </context>
 <context>
@@ -2533,6 +2569,33 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
+    <name>zandor::designer::SavedQueryCommands</name>
+    <message>
+        <source>Add saved &amp;query…</source>
+        <translation>Gespei&amp;cherte Abfrage hinzufügen…</translation>
+    </message>
+    <message>
+        <source>Read saved queries a&amp;gain</source>
+        <translation>&amp;Gespeicherte Abfragen neu lesen</translation>
+    </message>
+    <message>
+        <source>Add saved query</source>
+        <translation>Gespeicherte Abfrage hinzufügen</translation>
+    </message>
+    <message>
+        <source>The saved queries are as they are here.</source>
+        <translation>Die gespeicherten Abfragen sind so wie hier.</translation>
+    </message>
+    <message>
+        <source>Read again: %1.</source>
+        <translation>Neu gelesen: %1.</translation>
+    </message>
+    <message>
+        <source>Read saved queries again</source>
+        <translation>Gespeicherte Abfragen neu lesen</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ShowCommands</name>
     <message>
         <source>&amp;Export drawing…</source>
@@ -2854,6 +2917,10 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>%1 and %2 are joined by %3. Not joined by %4: draw those yourself if you need them.</source>
         <translation>%1 und %2 sind über %3 verknüpft. Nicht verknüpft über %4: Zeichnen Sie diese Verknüpfungen selbst, wenn Sie sie brauchen.</translation>
+    </message>
+    <message>
+        <source>Add query %1</source>
+        <translation>Abfrage %1 hinzufügen</translation>
     </message>
 </context>
 <context>

@@ -1076,6 +1076,34 @@
         <source>%1 is no format of values</source>
         <translation>%1 no es un formato de valores</translation>
     </message>
+    <message>
+        <source>The query &quot;%1&quot; would read from itself, by itself or by way of the saved queries in it: choose another one, or take one out.</source>
+        <translation>La consulta «%1» leería de sí misma, directamente o a través de las consultas guardadas que contiene: elija otra, o quite una.</translation>
+    </message>
+    <message>
+        <source>In %1: %2</source>
+        <translation>En %1: %2</translation>
+    </message>
+    <message>
+        <source>No column comes out of that query, so that it cannot stand as a table: give it output columns, and save it.</source>
+        <translation>De esa consulta no sale ninguna columna, así que no puede estar como tabla: dele columnas de salida, y guárdela.</translation>
+    </message>
+    <message>
+        <source>Saved queries stand more than %1 deep in each other then: make one query of some of them.</source>
+        <translation>Las consultas guardadas estarían entonces anidadas en más de %1 niveles: haga de algunas una sola.</translation>
+    </message>
+    <message>
+        <source>%1 gives no column %2 any more, which is used here: take it out of this query, or give it back to that one.</source>
+        <translation>%1 ya no da ninguna columna %2, que se usa aquí: quítela de esta consulta, o devuélvala a la otra.</translation>
+    </message>
+    <message>
+        <source>%1 has other columns here than its query gives: read it again from its file.</source>
+        <translation>%1 tiene aquí otras columnas que las que da su consulta: léala de nuevo de su archivo.</translation>
+    </message>
+    <message>
+        <source>%1 has saved queries more than %2 deep in each other</source>
+        <translation>%1 tiene consultas guardadas anidadas en más de %2 niveles</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>
@@ -1268,7 +1296,7 @@
     <message>
         <source>%1%</source>
         <comment>of hundred</comment>
-        <translation>%1 %</translation>
+        <translation>%1&#xa0;%</translation>
     </message>
 </context>
 <context>
@@ -1812,6 +1840,10 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
         <source>Total</source>
         <translation>Total</translation>
     </message>
+    <message>
+        <source>Add saved query</source>
+        <translation>Añadir consulta guardada</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Document</name>
@@ -2089,6 +2121,10 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     <message>
         <source>There is no table &quot;%1&quot; in %2.</source>
         <translation>No hay ninguna tabla «%1» en %2.</translation>
+    </message>
+    <message>
+        <source>There is no file &quot;%1&quot; any more; the query is as it was read last.</source>
+        <translation>El archivo «%1» ya no existe; la consulta está como se leyó por última vez.</translation>
     </message>
 </context>
 <context>
@@ -2533,6 +2569,33 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
+    <name>zandor::designer::SavedQueryCommands</name>
+    <message>
+        <source>Add saved &amp;query…</source>
+        <translation>&amp;Añadir consulta guardada…</translation>
+    </message>
+    <message>
+        <source>Read saved queries a&amp;gain</source>
+        <translation>&amp;Leer de nuevo las consultas guardadas</translation>
+    </message>
+    <message>
+        <source>Add saved query</source>
+        <translation>Añadir consulta guardada</translation>
+    </message>
+    <message>
+        <source>The saved queries are as they are here.</source>
+        <translation>Las consultas guardadas están tal como aquí.</translation>
+    </message>
+    <message>
+        <source>Read again: %1.</source>
+        <translation>Leídas de nuevo: %1.</translation>
+    </message>
+    <message>
+        <source>Read saved queries again</source>
+        <translation>Leer de nuevo las consultas guardadas</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ShowCommands</name>
     <message>
         <source>&amp;Export drawing…</source>
@@ -2854,6 +2917,10 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>%1 and %2 are joined by %3. Not joined by %4: draw those yourself if you need them.</source>
         <translation>%1 y %2 se combinan mediante %3. No se combinan mediante %4: dibuje usted esas combinaciones si las necesita.</translation>
+    </message>
+    <message>
+        <source>Add query %1</source>
+        <translation>Añadir la consulta %1</translation>
     </message>
 </context>
 <context>

@@ -1076,6 +1076,34 @@
         <source>%1 is no format of values</source>
         <translation>%1 n’est pas un format de valeurs</translation>
     </message>
+    <message>
+        <source>The query &quot;%1&quot; would read from itself, by itself or by way of the saved queries in it: choose another one, or take one out.</source>
+        <translation>La requête « %1 » lirait dans elle-même, directement ou par les requêtes enregistrées qu’elle contient : choisissez-en une autre, ou retirez-en une.</translation>
+    </message>
+    <message>
+        <source>In %1: %2</source>
+        <translation>Dans %1 : %2</translation>
+    </message>
+    <message>
+        <source>No column comes out of that query, so that it cannot stand as a table: give it output columns, and save it.</source>
+        <translation>Aucune colonne ne sort de cette requête, elle ne peut donc pas servir de table : donnez-lui des colonnes de sortie, et enregistrez-la.</translation>
+    </message>
+    <message>
+        <source>Saved queries stand more than %1 deep in each other then: make one query of some of them.</source>
+        <translation>Des requêtes enregistrées seraient alors imbriquées sur plus de %1 niveaux : faites-en une seule de quelques-unes.</translation>
+    </message>
+    <message>
+        <source>%1 gives no column %2 any more, which is used here: take it out of this query, or give it back to that one.</source>
+        <translation>%1 ne donne plus de colonne %2, qui est utilisée ici : retirez-la de cette requête, ou rendez-la à l’autre.</translation>
+    </message>
+    <message>
+        <source>%1 has other columns here than its query gives: read it again from its file.</source>
+        <translation>%1 a ici d’autres colonnes que celles que sa requête donne : relisez-la depuis son fichier.</translation>
+    </message>
+    <message>
+        <source>%1 has saved queries more than %2 deep in each other</source>
+        <translation>%1 a des requêtes enregistrées imbriquées sur plus de %2 niveaux</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>
@@ -1268,7 +1296,7 @@
     <message>
         <source>%1%</source>
         <comment>of hundred</comment>
-        <translation>%1 %</translation>
+        <translation>%1&#x202f;%</translation>
     </message>
 </context>
 <context>
@@ -1812,6 +1840,10 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
         <source>Total</source>
         <translation>Total</translation>
     </message>
+    <message>
+        <source>Add saved query</source>
+        <translation>Ajouter une requête enregistrée</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Document</name>
@@ -2089,6 +2121,10 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     <message>
         <source>There is no table &quot;%1&quot; in %2.</source>
         <translation>Il n’y a pas de table «&#xa0;%1&#xa0;» dans %2.</translation>
+    </message>
+    <message>
+        <source>There is no file &quot;%1&quot; any more; the query is as it was read last.</source>
+        <translation>Le fichier « %1 » n’existe plus ; la requête est telle qu’elle a été lue en dernier.</translation>
     </message>
 </context>
 <context>
@@ -2533,6 +2569,33 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
+    <name>zandor::designer::SavedQueryCommands</name>
+    <message>
+        <source>Add saved &amp;query…</source>
+        <translation>Ajouter une re&amp;quête enregistrée…</translation>
+    </message>
+    <message>
+        <source>Read saved queries a&amp;gain</source>
+        <translation>Relire les requêtes en&amp;registrées</translation>
+    </message>
+    <message>
+        <source>Add saved query</source>
+        <translation>Ajouter une requête enregistrée</translation>
+    </message>
+    <message>
+        <source>The saved queries are as they are here.</source>
+        <translation>Les requêtes enregistrées sont telles qu’ici.</translation>
+    </message>
+    <message>
+        <source>Read again: %1.</source>
+        <translation>Relues : %1.</translation>
+    </message>
+    <message>
+        <source>Read saved queries again</source>
+        <translation>Relire les requêtes enregistrées</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::ShowCommands</name>
     <message>
         <source>&amp;Export drawing…</source>
@@ -2854,6 +2917,10 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>%1 and %2 are joined by %3. Not joined by %4: draw those yourself if you need them.</source>
         <translation>%1 et %2 sont reliées par %3, mais pas par %4&#xa0;: dessinez vous-même ces jointures si vous en avez besoin.</translation>
+    </message>
+    <message>
+        <source>Add query %1</source>
+        <translation>Ajouter la requête %1</translation>
     </message>
 </context>
 <context>
