@@ -26,10 +26,14 @@ std::optional<QVariant> answerValue(const Parameter& parameter, const QString& t
         return reader::bindValue({ColumnType::Text, model::sql::likePattern(pattern, dialect)},
                                  dialect);
     }
-    if (parameter.type == ColumnType::Blob) return QVariant(typed.toUtf8());
+    // There a text becomes whatever the column has, and a number need not.
+    if (parameter.type == ColumnType::Unknown && dialect == Dialect::PostgreSQL)
+        return QVariant(typed.trimmed());
     const bool anyText = parameter.type == ColumnType::Text;
     const std::optional<Value> value =
         model::criteria::literal(anyText ? text : typed.trimmed().toStdU16String(), parameter.type);
+    // What is not in hexadecimal digits is a text in those bytes.
+    if (!value && parameter.type == ColumnType::Blob) return QVariant(typed.toUtf8());
     if (!value) return {};
     return reader::bindValue(*value, dialect);
 }

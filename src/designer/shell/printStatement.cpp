@@ -32,7 +32,7 @@ int printStatement(const Task& task) {
     if (!document) return complain(inWords(document.failure())), unusable;
     const Dialect dialect =
         task.dialect ? *task.dialect : dialectFor(QString::fromStdU16String(document->database));
-    const auto text = statementText(*document->query, dialect, model::sql::ValueForm::literal);
+    const auto text = statementText(*document->query, dialect, model::sql::ValueForm::script);
     for (const model::Finding& finding : text.findings) complain(inWords(finding.message));
     // One with something left out would not say what was drawn.
     if (!text.runnable()) return failed;

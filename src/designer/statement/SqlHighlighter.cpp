@@ -4,6 +4,9 @@
 
 #include <QPalette>
 
+#include <algorithm>
+#include <iterator>
+
 namespace zandor::designer {
 
 namespace {
@@ -25,8 +28,12 @@ constexpr Open opens[] = {
 
 QColor tone(int hue, bool dark) { return QColor::fromHsl(hue, dark ? 150 : 200, dark ? 175 : 72); }
 
+/// A word of any dialect, for the view is not told which one it shows.
 bool isKeyword(QStringView word) {
-    return model::sql::isReserved({word.utf16(), static_cast<std::size_t>(word.size())});
+    const platform::StringView text(word.utf16(), static_cast<std::size_t>(word.size()));
+    return std::any_of(
+        std::begin(model::sql::allDialects), std::end(model::sql::allDialects),
+        [text](model::sql::Dialect dialect) { return model::sql::isReserved(text, dialect); });
 }
 
 } // namespace

@@ -102,8 +102,10 @@ Dialect StatementPanel::dialect() const {
 }
 
 void StatementPanel::copy() {
-    if (mOutdated) showNow();
-    if (!mView->statement().isEmpty()) QGuiApplication::clipboard()->setText(mView->statement());
+    const QString text =
+        toQt(model::sql::statementText(*mDocument.query(), dialect(), model::sql::ValueForm::script)
+                 .text);
+    if (!text.isEmpty()) QGuiApplication::clipboard()->setText(text);
 }
 
 void StatementPanel::queue() {

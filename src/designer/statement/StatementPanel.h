@@ -38,7 +38,8 @@ signals:
     void findingsChanged(const model::Findings& findings);
 
 public slots:
-    /// Puts the statement as it is now on the clipboard, if there is one.
+    /// Puts the statement as it is now on the clipboard, as the engine's own shell takes it, if
+    /// there is one.
     void copy();
 
 protected:

@@ -65,7 +65,7 @@ Node typed(Node node, ColumnType type) {
     const auto* value = std::get_if<sql::Value>(&node->node);
     if (!value || value->type == type || isUnknown(type)) return node;
     if (value->type != ColumnType::Text && !isMoment(value->type)) return node;
-    if (type == ColumnType::Text || type == ColumnType::Blob) return node;
+    if (type == ColumnType::Text) return node;
     if (auto known = literal(value->text, type)) return sql::make(std::move(*known));
     return node;
 }
@@ -316,6 +316,10 @@ Node ExpressionReader::word() {
     if (auto number = literal(first.text, ColumnType::Decimal)) {
         mCursor.take();
         return sql::make(std::move(*number));
+    }
+    if (auto bytes = literal(first.text, ColumnType::Blob)) {
+        mCursor.take();
+        return sql::make(std::move(*bytes));
     }
     if (Node parameter = mNames.takeParameter(false)) return parameter;
     if (mCursor.atCall()) return call();

@@ -8,6 +8,8 @@ namespace zandor::model::criteria {
 
 namespace {
 
+constexpr StringView exampleOfBytes = u"x'0AFF'";
+
 bool isDigit(char16_t c) { return c >= u'0' && c <= u'9'; }
 
 /// Reads a text from the front.
@@ -154,6 +156,24 @@ std::optional<sql::Value> numberValue(StringView text) {
     return sql::Value{integer ? ColumnType::Integer : ColumnType::Decimal, canonical};
 }
 
+std::optional<sql::Value> bytesValue(StringView text) {
+    const bool quoted = text.size() > 2 && (text[0] == u'x' || text[0] == u'X') &&
+                        text[1] == u'\'' && text.back() == u'\'';
+    const bool prefixed = text.starts_with(u"0x") || text.starts_with(u"0X") ||
+                          text.starts_with(u"\\x") || text.starts_with(u"\\X");
+    if (!quoted && !prefixed) return {};
+    text.remove_prefix(2);
+    if (quoted) text.remove_suffix(1);
+    if (text.size() % 2 != 0) return {};
+    String digits;
+    for (const char16_t c : text) {
+        const bool small = c >= u'a' && c <= u'f';
+        if (!isDigit(c) && !small && !(c >= u'A' && c <= u'F')) return {};
+        digits += small ? static_cast<char16_t>(c - u'a' + u'A') : c;
+    }
+    return sql::Value{ColumnType::Blob, digits};
+}
+
 std::optional<sql::Value> booleanValue(StringView text) {
     for (const StringView yes : {u"true", u"yes", u"1"})
         if (sameName(text, yes)) return sql::Value{ColumnType::Boolean, u"true"};
@@ -177,7 +197,7 @@ Message nameOf(ColumnType type) {
     case ColumnType::Time: return say<MessageCode::aTime>();
     case ColumnType::Timestamp: return say<MessageCode::aTimestamp>();
     case ColumnType::Boolean: return say<MessageCode::aBoolean>();
-    case ColumnType::Blob: return say<MessageCode::noValue>();
+    case ColumnType::Blob: return say<MessageCode::asItStands>(exampleOfBytes);
     case ColumnType::Unknown: break;
     }
     return say<MessageCode::aValue>();
@@ -192,7 +212,7 @@ Message missingOf(ColumnType type) {
     case ColumnType::Time: return say<MessageCode::timeMissing>();
     case ColumnType::Timestamp: return say<MessageCode::timestampMissing>();
     case ColumnType::Boolean: return say<MessageCode::booleanMissing>();
-    case ColumnType::Blob: return say<MessageCode::noValueMissing>();
+    case ColumnType::Blob:
     case ColumnType::Unknown: break;
     }
     return say<MessageCode::valueMissing>();
@@ -206,7 +226,7 @@ Message refusalOf(ColumnType type) {
     case ColumnType::Time: return say<MessageCode::notATime>();
     case ColumnType::Timestamp: return say<MessageCode::notATimestamp>();
     case ColumnType::Boolean: return say<MessageCode::notABoolean>();
-    case ColumnType::Blob: return say<MessageCode::valueRefused>();
+    case ColumnType::Blob: return say<MessageCode::writtenSo>(exampleOfBytes);
     case ColumnType::Text:
     case ColumnType::Unknown: break;
     }
@@ -222,7 +242,7 @@ std::optional<sql::Value> literal(StringView text, ColumnType type) {
     case ColumnType::Time: return timeValue(text);
     case ColumnType::Timestamp: return timestampValue(text);
     case ColumnType::Boolean: return booleanValue(text);
-    case ColumnType::Blob: return {};
+    case ColumnType::Blob: return bytesValue(text);
     case ColumnType::Unknown: break;
     }
     if (auto number = numberValue(text)) return number;

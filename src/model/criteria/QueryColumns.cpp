@@ -12,7 +12,8 @@ void add(std::vector<NamedColumn>& found, const Table& table, StringView name) {
 } // namespace
 
 sql::ColumnRef columnRef(const Column& column, const Table& table) {
-    return {table.Name(), column.Name(), column.description().type};
+    const ColumnDescription& described = column.description();
+    return {table.Name(), column.Name(), described.type, described.declaredType};
 }
 
 std::vector<NamedColumn> QueryColumns::columnsNamed(StringView table, StringView column) const {

@@ -77,13 +77,26 @@ private:
         return at < mText.size() && mText[at] >= u'0' && mText[at] <= u'9';
     }
 
+    /// Before bytes in hexadecimal digits.
+    bool atBytes() const {
+        const StringView two = mText.substr(mAt, 2);
+        return two == u"x'" || two == u"X'" || two == u"0x" || two == u"0X";
+    }
+
     void skipDigits() {
         while (digitAt(mAt)) ++mAt;
     }
 
-    /// 12, 1.5, .5, 1e-3; a name, or two with a dot between; or :name.
+    /// 12, 1.5, .5, 1e-3, x'0AFF', 0x0AFF; a name, or two with a dot between; or :name.
     std::optional<Error> nameOrNumber() {
         const std::size_t begin = mAt;
+        if (atBytes()) {
+            const bool quoted = mText[mAt + 1] == u'\'';
+            mAt += 2;
+            while (mAt < mText.size() && isNamePart(mText[mAt])) ++mAt;
+            if (quoted && mAt < mText.size() && mText[mAt] == u'\'') ++mAt;
+            return add(TokenKind::word, begin, String(mText.substr(begin, mAt - begin)));
+        }
         if (digitAt(mAt) || (mText[mAt] == u'.' && digitAt(mAt + 1))) {
             skipDigits();
             if (mAt < mText.size() && mText[mAt] == u'.') ++mAt;

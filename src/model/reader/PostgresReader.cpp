@@ -66,6 +66,18 @@ model::ColumnType typeOf(const QString& base, const QString& category, bool buil
     }
 }
 
+/// The declared type; with what a domain is made from where the engine has no operators for that
+/// domain: those of arrays, rows, enumerations, shapes and ranges are none of a domain's, and texts
+/// of a form have none.
+platform::String declaredAs(const QSqlQuery& row) {
+    const platform::String declared = textAt(row, 1);
+    const platform::String base = textAt(row, 2);
+    const bool domain = row.value(6).toBool();
+    const bool without = QStringLiteral("ACEGR").contains(row.value(3).toString()) ||
+                         base == u"json" || base == u"xml";
+    return domain && without ? declared + u" AS " + base : declared;
+}
+
 Result<std::vector<TableEntry>> PostgresReader::tables() {
     std::vector<TableEntry> entries;
     // A partition is a part of its table, of which there may be thousands.
@@ -95,7 +107,7 @@ Result<model::TableDescription> PostgresReader::table(const TableId& id) {
             "SELECT a.attname, pg_catalog.format_type(a.atttypid, a.atttypmod), "
             "pg_catalog.format_type(base.oid, NULL), base.typcategory, "
             "base.typnamespace = 'pg_catalog'::regnamespace, "
-            "coalesce(a.attnum = ANY (pk.indkey), false) "
+            "coalesce(a.attnum = ANY (pk.indkey), false), base.oid <> a.atttypid "
             "FROM pg_catalog.pg_class c "
             "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
             "LEFT JOIN pg_catalog.pg_index pk ON pk.indrelid = c.oid AND pk.indisprimary "
@@ -115,7 +127,7 @@ Result<model::TableDescription> PostgresReader::table(const TableId& id) {
             description.columns.push_back(
                 {textAt(row, 0),
                  typeOf(row.value(2).toString(), row.value(3).toString(), row.value(4).toBool()),
-                 textAt(row, 1), row.value(5).toBool()});
+                 declaredAs(row), row.value(5).toBool()});
         });
     if (error) return *error;
     if (!found) return Error{model::say<MessageCode::noSuchTable>(id.name)};

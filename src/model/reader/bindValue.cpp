@@ -1,5 +1,6 @@
 #include <Zandor/reader/bindValue.h>
 
+#include <QByteArray>
 #include <QString>
 
 namespace zandor::reader {
@@ -10,6 +11,7 @@ QVariant bindValue(const model::sql::Value& value, model::sql::Dialect dialect) 
     switch (value.type) {
     case ColumnType::Integer: return text.toLongLong();
     case ColumnType::Boolean: return value.text == u"true";
+    case ColumnType::Blob: return QByteArray::fromHex(text.toLatin1());
     case ColumnType::Decimal:
         if (dialect == model::sql::Dialect::SQLite) return text.toDouble();
         break;

@@ -1,6 +1,6 @@
 #include <Zandor/sql/Dialect.h>
 
-#include "model/sql/ReservedWords.h"
+#include "model/sql/BareNames.h"
 
 #include <algorithm>
 
@@ -8,9 +8,6 @@ namespace zandor::model::sql {
 
 namespace {
 
-bool isLower(char16_t c) { return c >= u'a' && c <= u'z'; }
-bool isUpper(char16_t c) { return c >= u'A' && c <= u'Z'; }
-bool isDigit(char16_t c) { return c >= u'0' && c <= u'9'; }
 bool isHighSurrogate(char16_t c) { return c >= 0xD800 && c < 0xDC00; }
 bool isLowSurrogate(char16_t c) { return c >= 0xDC00 && c < 0xE000; }
 
@@ -29,19 +26,6 @@ String shortened(StringView name) {
     constexpr std::size_t enough = 40;
     if (name.size() <= enough) return String(name);
     return String(name.substr(0, enough - isHighSurrogate(name[enough - 1]))) + u"…";
-}
-
-/// Whether a name reads as itself without quotes.
-bool isPlain(StringView name, Dialect dialect) {
-    // PostgreSQL folds unquoted names to lower case.
-    const bool upper = dialect != Dialect::PostgreSQL;
-    const auto starts = [upper](char16_t c) {
-        return isLower(c) || c == u'_' || (upper && isUpper(c));
-    };
-    return !name.empty() && starts(name.front()) &&
-           std::all_of(name.begin(), name.end(),
-                       [&](char16_t c) { return starts(c) || isDigit(c); }) &&
-           !isReserved(name);
 }
 
 String doubled(StringView text, char16_t twice) {
@@ -72,6 +56,13 @@ String moment(StringView text, StringView keyword, StringView serverType, Dialec
     return String(keyword) + u" " + quoted;
 }
 
+/// From hexadecimal digits.
+String bytes(const String& digits, Dialect dialect) {
+    if (dialect == Dialect::SqlServer) return u"0x" + digits;
+    if (dialect == Dialect::PostgreSQL) return u"BYTEA '\\x" + digits + u"'";
+    return u"X'" + digits + u"'";
+}
+
 /// The engines have one name in all languages.
 MessageArgument argumentOf(Dialect dialect) {
     if (dialect == Dialect::Standard) return say<MessageCode::standardSql>();
@@ -92,7 +83,7 @@ StringView nameOf(Dialect dialect) {
 }
 
 String identifier(StringView name, Dialect dialect) {
-    if (isPlain(name, dialect)) return String(name);
+    if (isBare(name, dialect)) return String(name);
     if (dialect == Dialect::MySQL) return u"`" + doubled(name, u'`') + u"`";
     if (dialect == Dialect::SqlServer) return u"[" + doubled(name, u']') + u"]";
     return u"\"" + doubled(name, u'"') + u"\"";
@@ -134,8 +125,8 @@ String literal(const Value& value, Dialect dialect) {
     case ColumnType::Date: return moment(value.text, u"DATE", u"date", dialect);
     case ColumnType::Time: return moment(value.text, u"TIME", u"time", dialect);
     case ColumnType::Timestamp: return moment(value.text, u"TIMESTAMP", u"datetime2", dialect);
+    case ColumnType::Blob: return bytes(value.text, dialect);
     case ColumnType::Text:
-    case ColumnType::Blob:
     case ColumnType::Unknown: break;
     }
     return quotedText(value.text, dialect);
@@ -163,8 +154,8 @@ String placeholder(ColumnType type, Dialect dialect) {
     case ColumnType::Date: return u"CAST(? AS date)";
     case ColumnType::Time: return u"CAST(? AS time)";
     case ColumnType::Timestamp: return u"CAST(? AS timestamp)";
+    case ColumnType::Blob: return u"CAST(? AS bytea)";
     case ColumnType::Text:
-    case ColumnType::Blob:
     case ColumnType::Unknown: break;
     }
     return u"?";

@@ -2,6 +2,7 @@
 
 #include "model/criteria/Literals.h"
 #include "model/criteria/Tokens.h"
+#include "model/sql/PostgresTypes.h"
 #include "model/sql/Templates.h"
 
 #include <algorithm>
@@ -154,7 +155,7 @@ void ExpressionPrinter::parenthesised(const std::vector<Node>& parts, StringView
 void ExpressionPrinter::write(const ColumnRef& reference, Tightness) { mOut.column(reference); }
 
 void ExpressionPrinter::write(const Value& value, Tightness) {
-    if (mOut.form == ValueForm::literal || mWritesOut || mInItem) {
+    if (mOut.form != ValueForm::bound || mWritesOut || mInItem) {
         mOut.text += literal(value, mOut.dialect);
         return;
     }
@@ -162,30 +163,83 @@ void ExpressionPrinter::write(const Value& value, Tightness) {
     mOut.bindings.push_back(value);
 }
 
-/// For showing, a parameter is shown by its name.
 void ExpressionPrinter::write(const Parameter& parameter, Tightness) {
     if (mWritesOut)
         throw Refusal{Refusal::Reason::expression,
                       say<MessageCode::parameterInGroup>(parameter.name)};
     mOut.bindings.push_back(parameter);
-    if (mOut.form == ValueForm::bound) {
-        // What the user will answer may be a fraction even where the column holds whole
-        // numbers.
-        const bool whole = parameter.type == ColumnType::Integer;
-        const ColumnType type = whole ? ColumnType::Decimal : parameter.type;
+    // What the user will answer may be a fraction even where the column holds whole numbers.
+    const bool whole = parameter.type == ColumnType::Integer;
+    const ColumnType type = whole ? ColumnType::Decimal : parameter.type;
+    switch (mOut.form) {
+    case ValueForm::bound:
         mOut.text += mInItem ? roomFor(type) : placeholder(type, mOut.dialect);
-        return;
+        break;
+    case ValueForm::script:
+        mOut.text += mOut.names.placeholder(parameter.name, type, mOut.dialect);
+        break;
+    case ValueForm::literal:
+        mOut.text += u':';
+        mOut.text += criteria::isBareName(parameter.name)
+                         ? parameter.name
+                         : identifier(parameter.name, Dialect::Standard);
     }
-    mOut.text += u':';
-    mOut.text += criteria::isBareName(parameter.name)
-                     ? parameter.name
-                     : identifier(parameter.name, Dialect::Standard);
+}
+
+/// PostgreSQL compares only what it has an operator for. What is the same can be told by the texts
+/// of two values, what is less cannot.
+ExpressionPrinter::Side ExpressionPrinter::sideOf(const std::vector<Node>& operands,
+                                                  StringView ordering) const {
+    if (mOut.dialect != Dialect::PostgreSQL) return Side::asItIs;
+    const auto holdValue = [&operands](auto&& which) {
+        return std::any_of(operands.begin(), operands.end(), [&](const Node& operand) {
+            const auto* const value = std::get_if<Value>(&operand->node);
+            return value && which(value->type);
+        });
+    };
+    const bool number = holdValue(criteria::isNumber);
+    const bool fraction = holdValue([](ColumnType type) { return type == ColumnType::Decimal; });
+    Side how = Side::asItIs;
+    for (const Node& operand : operands) {
+        const auto* const column = std::get_if<ColumnRef>(&operand->node);
+        if (!column || column->type != ColumnType::Unknown) continue;
+        using Numbers = PostgresComparing::Numbers;
+        const PostgresComparing type = postgresComparing(column->declared);
+        const bool refused = (number && type.numbers == Numbers::none) ||
+                             (fraction && type.numbers == Numbers::whole);
+        const bool asText = !type.equal || refused;
+        if (!ordering.empty() && (asText || !type.ordered))
+            throw Refusal{Refusal::Reason::expression,
+                          say<MessageCode::noSuchFunction>(column->table + u"." + column->column +
+                                                               String(ordering) + u"…",
+                                                           nameOf(mOut.dialect))};
+        if (asText) return Side::asText;
+        if (number && type.numbers == Numbers::written) how = Side::untyped;
+    }
+    return how;
+}
+
+void ExpressionPrinter::side(const Expression& operand, Side how) {
+    const auto* const number = std::get_if<Value>(&operand.node);
+    if (how == Side::asItIs || (how == Side::untyped && !number)) {
+        value(operand, Tightness::joined);
+    } else if (number) {
+        write(Value{ColumnType::Text, number->text}, Tightness::joined);
+    } else {
+        mOut.text += u"CAST(";
+        value(operand, Tightness::disjunction);
+        mOut.text += u" AS text)";
+    }
 }
 
 void ExpressionPrinter::write(const Compare& compare, Tightness) {
-    value(*compare.left, Tightness::joined);
-    mOut.text += symbolOf(compare.comparison);
-    value(*compare.right, Tightness::joined);
+    const bool equality =
+        compare.comparison == Comparison::equal || compare.comparison == Comparison::notEqual;
+    const StringView symbol = symbolOf(compare.comparison);
+    const Side how = sideOf({compare.left, compare.right}, equality ? StringView() : symbol);
+    side(*compare.left, how);
+    mOut.text += symbol;
+    side(*compare.right, how);
 }
 
 void ExpressionPrinter::write(const Like& like, Tightness) {
@@ -208,28 +262,32 @@ void ExpressionPrinter::write(const Like& like, Tightness) {
 /// PostgreSQL matches nothing but text, and what type the column has may be unknown here.
 void ExpressionPrinter::likeOperand(const Expression& operand) {
     const auto* reference = std::get_if<ColumnRef>(&operand.node);
-    const bool cast =
-        mOut.dialect == Dialect::PostgreSQL && reference && reference->type == ColumnType::Unknown;
+    const bool cast = mOut.dialect == Dialect::PostgreSQL && reference &&
+                      (reference->type == ColumnType::Unknown || reference->declared == u"money");
     if (cast) mOut.text += u"CAST(";
     value(operand, Tightness::joined);
     if (cast) mOut.text += u" AS text)";
 }
 
 void ExpressionPrinter::write(const Between& between, Tightness) {
-    value(*between.operand, Tightness::joined);
+    const Side how = sideOf({between.operand, between.low, between.high}, u" Between ");
+    side(*between.operand, how);
     mOut.text += between.negated ? u" NOT BETWEEN " : u" BETWEEN ";
-    value(*between.low, Tightness::joined);
+    side(*between.low, how);
     mOut.text += u" AND ";
-    value(*between.high, Tightness::joined);
+    side(*between.high, how);
 }
 
 void ExpressionPrinter::write(const In& in, Tightness) {
-    value(*in.operand, Tightness::joined);
+    std::vector<Node> operands = in.list;
+    operands.push_back(in.operand);
+    const Side how = sideOf(operands, {});
+    side(*in.operand, how);
     mOut.text += in.negated ? u" NOT IN (" : u" IN (";
     const char16_t* separator = u"";
     for (const auto& item : in.list) {
         mOut.text += separator;
-        value(*item, Tightness::joined);
+        side(*item, how);
         separator = u", ";
     }
     mOut.text += u')';

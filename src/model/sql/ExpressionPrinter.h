@@ -1,6 +1,6 @@
 #pragma once
 
-#include <Zandor/sql/Printer.h>
+#include "model/sql/ShellNames.h"
 
 #include <unordered_set>
 
@@ -14,6 +14,7 @@ enum class Tightness { disjunction, conjunction, predicate, joined, sum, product
 struct Output {
     Dialect dialect;
     ValueForm form;
+    ShellNames names{}; ///< where the form is that of the engine's shell
     String text{};
     std::vector<Binding> bindings{};
 
@@ -56,6 +57,9 @@ private:
     void write(const Compare& compare, Tightness around);
     void write(const Like& like, Tightness around);
     void likeOperand(const Expression& operand);
+    enum class Side { asItIs, untyped, asText };
+    Side sideOf(const std::vector<Node>& operands, StringView ordering) const;
+    void side(const Expression& operand, Side how);
     void write(const Between& between, Tightness around);
     void write(const In& in, Tightness around);
     void write(const IsNull& isNull, Tightness around);

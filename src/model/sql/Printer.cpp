@@ -226,22 +226,25 @@ private:
             const bool joined = std::holds_alternative<JoinSource>(source->node);
             // A tree after the first would otherwise swallow what stands before it.
             if (joined && !first)
-                inParentheses(*source);
+                inParentheses(*source, inside);
             else
-                sourceLines(*source, nextLine(), first ? u"" : inside);
+                sourceLines(*source, inside, first ? u"" : inside);
             first = false;
         }
     }
 
-    void inParentheses(const Source& source) {
+    void inParentheses(const Source& source, StringView within) {
+        const String deeper = String(within) + String(inside);
         mOut.text += u'(';
-        sourceLines(source, u" ", inside);
+        line(deeper);
+        sourceLines(source, deeper, deeper);
+        line(within);
         mOut.text += u')';
     }
 
-    /// A source with each of its joins behind a line break, or a blank when inside parentheses.
-    /// `within` is how far the line is indented in which it begins.
-    void sourceLines(const Source& source, StringView lineBreak, StringView within) {
+    /// A source with each of its joins on a line of its own, which is indented by `joins`; `within`
+    /// is how far the line is in which it begins.
+    void sourceLines(const Source& source, StringView joins, StringView within) {
         if (const auto* table = std::get_if<TableRef>(&source.node)) {
             tableRef(*table);
             return;
@@ -252,13 +255,13 @@ private:
         }
         const auto& join = std::get<JoinSource>(source.node);
         check(join);
-        sourceLines(*join.left, lineBreak, within);
-        mOut.text += lineBreak;
+        sourceLines(*join.left, joins, within);
+        line(joins);
         mOut.text += words(join.kind);
         if (std::holds_alternative<JoinSource>(join.right->node))
-            inParentheses(*join.right);
+            inParentheses(*join.right, joins);
         else
-            sourceLines(*join.right, lineBreak, inside);
+            sourceLines(*join.right, joins, joins);
         mOut.text += u" ON ";
         mExpressions.condition(*join.on, Tightness::conjunction);
     }
@@ -409,7 +412,7 @@ private:
     std::set<String> mTaken;
 };
 
-void printWhole(const Statement& statement, Output& out) {
+Printed whole(const Statement& statement, Output out) {
     Sharing sharing(statement);
     SharedQueries shared;
     StringView before = u"WITH ";
@@ -425,15 +428,19 @@ void printWhole(const Statement& statement, Output& out) {
     }
     if (!shared.empty()) out.text += u'\n';
     Printer(out, shared, {}, 0).print(statement);
+    return {std::move(out.text), std::move(out.bindings)};
 }
 
 } // namespace
 
 std::variant<Printed, Refusal> print(const Statement& statement, Dialect dialect, ValueForm form) {
     try {
-        Output out{dialect, form};
-        printWhole(statement, out);
-        return Printed{std::move(out.text), std::move(out.bindings)};
+        if (form != ValueForm::script) return whole(statement, {dialect, form});
+        // What one parameter is called depends on all of them.
+        const Printed shown = whole(statement, {dialect, ValueForm::literal});
+        Printed written = whole(statement, {dialect, form, ShellNames(shown.bindings)});
+        written.text += u';';
+        return written;
     } catch (Refusal& refusal) {
         return std::move(refusal);
     }

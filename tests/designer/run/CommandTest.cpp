@@ -74,6 +74,31 @@ TEST(TheCommandOfAQuery, TakesAPatternAsPeopleTypeIt) {
               QVariantList({QString("a%*_")}));
 }
 
+TEST(TheCommandOfAQuery, TakesBytesInHexadecimalDigitsOrAsAText) {
+    const auto query = draw(sampleDatabase(), {"employees"}, {{"employees.badge", {"= :badge"}}});
+    const auto text = statementFor(*query, Dialect::SQLite, {});
+    const auto bytes = [&](const char* typed) {
+        return makeCommand(text, Dialect::SQLite, {{"badge", typed}}, {}).values.value(0);
+    };
+    EXPECT_EQ(bytes(" x'0AFF' "), QByteArray("\x0A\xFF"));
+    EXPECT_EQ(bytes("0x0aff"), QByteArray("\x0A\xFF"));
+    EXPECT_EQ(bytes("BADGE"), QByteArray("BADGE"));
+}
+
+TEST(TheCommandOfAQuery, LeavesItToPostgresWhatIsAskedForOfAColumnOfUnknownKind) {
+    const auto query = platform::makeRef<model::Query>();
+    const auto definition = platform::makeRef<model::ColumnDefinition>();
+    const auto table = query->addTable({u"", u"t", {{u"mood"}}});
+    definition->Column(table->columnNamed(u"mood"));
+    definition->AddCriterium(u"= :mood", u"4");
+    query->AddColumnDefinition(definition);
+    for (const auto& [dialect, value] : {std::pair(Dialect::PostgreSQL, QVariant(u"5"_qs)),
+                                         std::pair(Dialect::SQLite, QVariant(qlonglong(5)))}) {
+        const auto text = statementFor(*query, dialect, {});
+        EXPECT_EQ(makeCommand(text, dialect, {{"mood", "5"}}, {}).values.value(0), value);
+    }
+}
+
 TEST(TheCommandOfAQuery, TellsTheEngineToGiveOneRowMoreThanIsShown) {
     const auto query = draw(sampleDatabase(), {"products"});
     for (const auto dialect : {Dialect::SQLite, Dialect::PostgreSQL, Dialect::MySQL})

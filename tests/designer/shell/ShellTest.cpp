@@ -15,6 +15,7 @@
 
 using namespace zandor;
 
+using testing::EndsWith;
 using testing::HasSubstr;
 using testing::StartsWith;
 
@@ -51,7 +52,7 @@ TEST_F(InAShell, PrintsTheStatement) {
     EXPECT_EQ(ended.code, 0) << ended.err;
     EXPECT_EQ(ended.err, "");
     EXPECT_THAT(ended.out, StartsWith("SELECT\n    numbers.word\nFROM numbers\nWHERE "));
-    EXPECT_EQ(ended.out.back(), '\n');
+    EXPECT_THAT(ended.out, EndsWith(";\n"));
 }
 
 TEST_F(InAShell, PrintsTheStatementInADialect) {

@@ -17,6 +17,7 @@ using namespace zandor;
 
 using model::Finding;
 using model::sql::Dialect;
+using testing::EndsWith;
 using testing::HasSubstr;
 using testing::StartsWith;
 
@@ -121,8 +122,23 @@ TEST_F(TheStatementPanel, CopiesTheStatement) {
     drawn.finish();
     ASSERT_TRUE(shows("FROM orders"));
     hands::click(copy(), copy().rect().center());
-    EXPECT_EQ(QGuiApplication::clipboard()->text(), view().statement());
+    EXPECT_EQ(QGuiApplication::clipboard()->text(), view().statement() + u';');
     EXPECT_THAT(QGuiApplication::clipboard()->text().toStdString(), StartsWith("SELECT"));
+}
+
+TEST_F(TheStatementPanel, CopiesParametersAsTheEnginesOwnShellTakesThem) {
+    drawn.output(drawn.table(u"orders"), u"name", u"[Whose order?]");
+    drawn.finish();
+    ASSERT_TRUE(shows("= :\"Whose order?\""));
+    const auto copied = [this](Dialect dialect) {
+        panel.setDatabaseDialect(dialect);
+        panel.copy();
+        return QGuiApplication::clipboard()->text().toStdString();
+    };
+    EXPECT_THAT(copied(Dialect::SQLite), EndsWith("WHERE orders.name = :Whose_order;"));
+    EXPECT_THAT(copied(Dialect::PostgreSQL), EndsWith("WHERE orders.name = :'Whose_order';"));
+    EXPECT_THAT(copied(Dialect::MySQL), EndsWith("WHERE orders.name = @Whose_order;"));
+    EXPECT_THAT(copied(Dialect::SqlServer), EndsWith("WHERE orders.name = @Whose_order;"));
 }
 
 TEST_F(TheStatementPanel, CopiesTheStatementOfTheMomentEvenWhileItCannotBeSeen) {

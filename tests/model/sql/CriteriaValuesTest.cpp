@@ -118,12 +118,29 @@ TEST_F(AValue, OfABooleanColumnIsOneOfSixWords) {
     EXPECT_EQ(condition(u"truth", u"2"), "At character 1: write true or false here.");
 }
 
-TEST_F(AValue, OfABlobColumnCannotBeTyped) {
-    EXPECT_EQ(condition(u"bytes", u"abc"),
-              "At character 1: only Is Null, a column or a parameter can stand here.");
+TEST_F(AValue, OfABlobColumnIsInHexadecimalDigits) {
+    for (const auto* text : {u"x'0AFF'", u"X'0aff'", u"0x0AFF", u"0X0aFf", u"\\x0aff", u"\\X0AFF",
+                             u"\"x'0AFF'\"", u"'0x0AFF'", u"= x'0AFF'"})
+        EXPECT_EQ(condition(u"bytes", text), "t.bytes = X'0AFF'") << platform::toUtf8(text);
+    EXPECT_EQ(condition(u"bytes", u"x''"), "t.bytes = X''");
+    EXPECT_EQ(condition(u"bytes", u"In (x'0A', 0xFF) Or Between \\x01 And \\x02"),
+              "t.bytes IN (X'0A', X'FF') OR t.bytes BETWEEN X'01' AND X'02'");
+    for (const auto* text : {u"abc", u"0AFF", u"x'0AF'", u"x'0AGF'", u"x'0AFF", u"0x0AF", u"42"})
+        EXPECT_EQ(condition(u"bytes", text), "At character 1: this is written x'0AFF'.")
+            << platform::toUtf8(text);
+    EXPECT_EQ(condition(u"bytes", u"="), "At character 2: a value is missing.");
+    EXPECT_EQ(condition(u"bytes", u"> [t].[text]"),
+              "At character 3: compare it with a column that holds x'0AFF'.");
     EXPECT_EQ(condition(u"bytes", u"Is Null"), "t.bytes IS NULL");
     EXPECT_EQ(condition(u"bytes", u"[t].[bytes]"), "t.bytes = t.bytes");
     EXPECT_EQ(condition(u"bytes", u":b"), "t.bytes = :b");
+}
+
+TEST_F(AValue, OfABlobColumnIsWrittenAlikeInACalculation) {
+    EXPECT_EQ(condition(u"bytes", u"Coalesce([t].[bytes], x'00') = 0x0AFF"),
+              "COALESCE(t.bytes, X'00') = X'0AFF'");
+    EXPECT_EQ(condition(u"bytes", u"Coalesce([t].[bytes], '\\x00') = x'0AFF'"),
+              "COALESCE(t.bytes, X'00') = X'0AFF'");
 }
 
 TEST_F(AValue, OfAColumnOfUnknownTypeIsANumberOrADateOrAText) {

@@ -43,15 +43,15 @@ std::string from(const Drawing& drawing, model::Findings* findings = nullptr) {
         join->JoinType(static_cast<std::int16_t>(std::string("=><#").find(drawn[1])));
         query->AddJoin(join);
     }
-    const auto text = model::sql::statementText(*query, model::sql::Dialect::Standard,
+    const auto text = model::sql::statementText(*query, model::sql::Dialect::SQLite,
                                                 model::sql::ValueForm::literal);
     if (findings) *findings = text.findings;
     std::string sql = toUtf8(text.text);
     sql.erase(0, sql.find("FROM ") + 5);
     const std::pair<const char*, const char*> shorter[] = {
-        {".x = ", ""},      {".x", ""},          {"\n    ", " "},    {"INNER JOIN", "="},
-        {"LEFT JOIN", ">"}, {"RIGHT JOIN", "<"}, {"FULL JOIN", "#"}, {"CROSS JOIN", "*"},
-        {" ON ", " on "},   {"\n", " "}};
+        {".x = ", ""},       {".x", ""},         {"\n", " "},         {"  ", " "},
+        {"( ", "("},         {" )", ")"},        {"INNER JOIN", "="}, {"LEFT JOIN", ">"},
+        {"RIGHT JOIN", "<"}, {"FULL JOIN", "#"}, {"CROSS JOIN", "*"}, {" ON ", " on "}};
     for (const auto& [what, by] : shorter) sql = replaced(sql, what, by);
     return sql;
 }

@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <regex>
+
 using namespace zandor;
 
 // Statements built by hand, for what no drawing makes or what is best seen alone.
@@ -54,11 +56,14 @@ Statement where(Node condition) {
     return statement;
 }
 
+/// The standard's quotes around names of small letters are left out here.
 std::string text(const Statement& statement, Dialect dialect, ValueForm form = ValueForm::bound) {
     const auto printed = print(statement, dialect, form);
     if (const auto* refusal = std::get_if<Refusal>(&printed))
         return toUtf8(refusal->message.text());
-    return toUtf8(std::get<Printed>(printed).text);
+    const std::string written = toUtf8(std::get<Printed>(printed).text);
+    if (dialect != Dialect::Standard) return written;
+    return std::regex_replace(written, std::regex("\"([a-z]+)\"(?=[^\"]|$)"), "$1");
 }
 
 /// What stands behind the table.
@@ -107,6 +112,52 @@ TEST(ThePrinter, ShowsParametersByTheirNames) {
         EXPECT_EQ(behind(asked(u"How \"many\"?"), dialect, ValueForm::literal),
                   "WHERE t.a = :\"How \"\"many\"\"?\"");
     }
+}
+
+TEST(ThePrinter, GivesAShellItsOwnParametersAndAnEnd) {
+    const auto asked = [](std::vector<Parameter> parameters) {
+        std::vector<Node> terms;
+        for (Parameter& parameter : parameters)
+            terms.push_back(
+                make(Compare{Comparison::equal, column(u"a"), make(std::move(parameter))}));
+        return where(allOf(std::move(terms)));
+    };
+    const auto from = asked({{u"from", ColumnType::Date}});
+    EXPECT_EQ(behind(from, Dialect::SQLite, ValueForm::script), "WHERE t.a = :from;");
+    EXPECT_EQ(behind(from, Dialect::PostgreSQL, ValueForm::script),
+              "WHERE t.a = CAST(:'from' AS date);");
+    EXPECT_EQ(behind(from, Dialect::MySQL, ValueForm::script), "WHERE t.a = @from;");
+    EXPECT_EQ(behind(from, Dialect::SqlServer, ValueForm::script), "WHERE t.a = @from;");
+    EXPECT_EQ(behind(from, Dialect::Standard, ValueForm::script), "WHERE t.a = :from;");
+    EXPECT_EQ(behind(asked({{u"n", ColumnType::Integer}}), Dialect::PostgreSQL, ValueForm::script),
+              "WHERE t.a = CAST(:'n' AS numeric);");
+    EXPECT_EQ(behind(asked({{u"n", ColumnType::Text}}), Dialect::PostgreSQL, ValueForm::script),
+              "WHERE t.a = :'n';");
+    EXPECT_EQ(behind(where(equals(u"5")), Dialect::SQLite, ValueForm::script), "WHERE t.a = 5;");
+}
+
+TEST(ThePrinter, MakesNamesForAShellOfWhatIsNone) {
+    const auto names = [](const std::vector<String>& asked) {
+        std::vector<Node> terms;
+        for (const String& name : asked)
+            terms.push_back(make(Compare{Comparison::equal, column(u"a"), make(Parameter{name})}));
+        std::string text =
+            behind(where(allOf(std::move(terms))), Dialect::MySQL, ValueForm::script);
+        for (const std::string& left : {std::string("WHERE t.a = @"), std::string("\n"),
+                                        std::string("    AND t.a = @"), std::string(";")})
+            for (std::size_t at; (at = text.find(left)) != std::string::npos;)
+                text.replace(at, left.size(), left == "\n" ? " " : "");
+        return text;
+    };
+    EXPECT_EQ(names({u"How \"many\"?"}), "How_many");
+    EXPECT_EQ(names({u"  von größe:  "}), "von_größe");
+    EXPECT_EQ(names({u"1st"}), "parameter_1st");
+    EXPECT_EQ(names({u"?", u"!"}), "parameter parameter_2");
+    EXPECT_EQ(names({u"a b", u"a-b", u"a b", u"A+B"}), "a_b a_b_2 a_b A_B_3");
+    // What is a name already keeps it, wherever it comes.
+    EXPECT_EQ(names({u"a b", u"a_b_2", u"a_b"}), "a_b_3 a_b_2 a_b");
+    EXPECT_EQ(names({u"x", u"X"}), "x X_2") << "a shell may take them for one";
+    EXPECT_EQ(names({u"_x$"}), "x");
 }
 
 TEST(ThePrinter, PutsParenthesesWhereTheTreeNeedsThemOnly) {

@@ -20,13 +20,15 @@ struct ColumnRef {
     String table;  ///< the name under which the table stands in the statement
     String column; ///< its name
     ColumnType type = ColumnType::Unknown; ///< of its values
+    String declared = {};                  ///< its type in the database's words; may be empty
 
     friend bool operator==(const ColumnRef&, const ColumnRef&) = default;
 };
 
 /// A constant. The text is canonical for its type: an integer "-42", a decimal "1.50" or "1e10",
 /// a boolean "true" or "false", a date "2024-05-01", a time "10:30:00", a timestamp
-/// "2024-05-01 10:30:00"; a text and an unknown are as they stand.
+/// "2024-05-01 10:30:00", bytes "0AFF" in hexadecimal digits; a text and an unknown are as they
+/// stand.
 struct Value {
     ColumnType type = ColumnType::Text; ///< of the constant
     String text;                        ///< canonical

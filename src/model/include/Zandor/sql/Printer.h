@@ -5,8 +5,12 @@
 
 namespace zandor::model::sql {
 
-/// Whether values leave beside the statement, for running it, or within it, for showing it.
-enum class ValueForm { bound, literal };
+/// Where values leave.
+enum class ValueForm {
+    bound,   ///< beside the statement, for running it
+    literal, ///< within it, for showing it
+    script,  ///< within it, with a closing `;` and parameters as the engine's own shell takes them
+};
 
 /// What takes the place of one placeholder.
 using Binding = std::variant<Value, Parameter>;
@@ -14,7 +18,7 @@ using Binding = std::variant<Value, Parameter>;
 /// A statement in a dialect.
 struct Printed {
     String text;                   ///< one clause a line
-    std::vector<Binding> bindings; ///< in the order of the placeholders; parameters in either form
+    std::vector<Binding> bindings; ///< in the order of the placeholders; parameters in every form
 };
 
 /// Why a dialect cannot say a statement.
