@@ -37,7 +37,7 @@ protected:
     }
 
     std::string select() {
-        const auto sql = model::sql::statementText(query, model::sql::Dialect::Standard,
+        const auto sql = model::sql::statementText(query, model::sql::Dialect::SQLite,
                                                    model::sql::ValueForm::literal);
         const std::string text = platform::toUtf8(sql.text);
         return text.substr(0, text.find("\nFROM"));
@@ -130,7 +130,7 @@ TEST_F(OutputColumns, SortTheRowsInTheOrderInWhichTheyStand) {
     at(1)->SortOrder(1);
     at(3)->SortOrder(2);
     query.StandsBehind(at(3), {});
-    const auto sql = model::sql::statementText(query, model::sql::Dialect::Standard,
+    const auto sql = model::sql::statementText(query, model::sql::Dialect::SQLite,
                                                model::sql::ValueForm::literal);
     EXPECT_NE(sql.text.find(u"ORDER BY orders.name DESC, orders.id"), String::npos)
         << platform::toUtf8(sql.text);
