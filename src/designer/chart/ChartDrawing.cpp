@@ -24,6 +24,7 @@ constexpr double betweenPoints = 26; // with a shape each
 constexpr double slant = 45;         // degrees
 constexpr double smallestPlot = 20;
 constexpr double lowestWithAxis = 160;
+constexpr double lowestWithLabels = 110;
 
 constexpr double shareOfColumns = 0.74; // of the room of a row
 
@@ -64,6 +65,15 @@ void ChartDrawing::placeLegend(double width) {
     }
 }
 
+/// Below everything; in a low picture beside the legend.
+void ChartDrawing::placeNote(const QSizeF& size) {
+    mNote = QPointF(around, size.height() - around - mLine);
+    if (size.height() >= lowestWithAxis) return;
+    const double wide = QFontMetricsF(mLook.font).horizontalAdvance(mData.note);
+    mNote = QPointF(size.width() - around - wide, mLegend.back().top());
+    if (mNote.x() < mLegend.back().right() + 3 * gap) mNote.setY(size.height());
+}
+
 void ChartDrawing::placeAxes(const QSizeF& size) {
     const QFontMetricsF metrics(mLook.font);
     double smallest = HUGE_VAL;
@@ -79,13 +89,12 @@ void ChartDrawing::placeAxes(const QSizeF& size) {
     const bool withZero = mData.kind == ChartKind::columns || smallest * 2 < largest;
 
     const double top = mLegend.back().bottom() + 2 * gap;
-    mNoteTop = size.height() - around - (mData.note.isEmpty() ? 0 : mLine);
-    double bottom = mNoteTop - (mData.note.isEmpty() ? 0 : gap);
-    mAxisTop = bottom - mLine;
-    if (size.height() < lowestWithAxis)
-        mAxisTop = size.height();
-    else
-        bottom = mAxisTop - gap;
+    placeNote(size);
+    const bool isLow = size.height() < lowestWithAxis;
+    mLabelled = size.height() >= lowestWithLabels;
+    double bottom = isLow || mData.note.isEmpty() ? size.height() - around : mNote.y() - gap;
+    mAxisTop = isLow ? size.height() : bottom - mLine;
+    if (!isLow) bottom = mAxisTop - gap;
     const double slot = (size.width() - 2 * around) / mData.points();
     double widest = 0;
     if (mData.moments.empty())
@@ -94,7 +103,7 @@ void ChartDrawing::placeAxes(const QSizeF& size) {
     mSlanted = mData.moments.empty() && widest + gap > slot * 0.94; // as wide as the plot will be
     mLongest = mSlanted ? std::min({widest + 1, longestSlanted, size.height() / 3}) : widest + 1;
     const double down = mSlanted ? mLongest * std::sin(slant * M_PI / 180) + mLine * 0.7 : mLine;
-    bottom -= down + gap;
+    if (mLabelled) bottom -= down + gap;
     bottom = std::max(bottom, top + smallestPlot);
     const int most = std::max(2, static_cast<int>((bottom - top) / betweenMarks));
     mScale = numberScale(smallest, largest, most, withZero);
@@ -109,6 +118,7 @@ void ChartDrawing::placeAxes(const QSizeF& size) {
 }
 
 void ChartDrawing::placeLabels() {
+    if (!mLabelled) return;
     const QFontMetricsF metrics(mLook.font);
     if (!mData.moments.empty()) {
         // As wide as a label of the year's longest month, more or less.
@@ -257,7 +267,7 @@ void ChartDrawing::paintLabels(QPainter& painter) const {
                      Qt::AlignCenter | Qt::TextSingleLine,
                      metrics.elidedText(mData.axis, Qt::ElideRight, mPlot.width()));
     painter.setPen(mLook.faint);
-    painter.drawText(QPointF(around, mNoteTop + metrics.ascent()), mData.note);
+    painter.drawText(mNote + QPointF(0, metrics.ascent()), mData.note);
 }
 
 void ChartDrawing::paintColumns(QPainter& painter) const {

@@ -41,6 +41,7 @@ private:
     };
 
     void placeLegend(double width);
+    void placeNote(const QSizeF& size);
     void placeAxes(const QSizeF& size);
     void placeLabels();
     void placeMarks();
@@ -61,7 +62,8 @@ private:
     double mLine;        ///< the height of a line of text
     QRectF mPlot;        ///< what the values stand in
     double mAxisTop = 0; ///< of the axis' name; below the picture where there is no room for it
-    double mNoteTop = 0;
+    QPointF mNote;       ///< where the note begins; below the picture where there is no room for it
+    bool mLabelled = true;
     NumberScale mScale;
     std::vector<QRectF> mLegend; ///< one a series
     std::vector<Label> mLabels;

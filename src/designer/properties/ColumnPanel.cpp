@@ -12,6 +12,8 @@
 
 #include <Zandor/qt/Text.h>
 
+#include <QAbstractItemView>
+#include <QApplication>
 #include <QCheckBox>
 #include <QComboBox>
 #include <QFormLayout>
@@ -21,6 +23,7 @@
 #include <QSignalBlocker>
 #include <QSpinBox>
 #include <QStandardItemModel>
+#include <QStyledItemDelegate>
 
 #include <algorithm>
 
@@ -33,6 +36,22 @@ namespace {
 
 constexpr std::chrono::milliseconds betweenKeys(150);
 constexpr int leastHeight = 210; // logical pixels, unless less is needed
+constexpr int leastWidth = 80;
+constexpr int rowSpacing = 5;
+constexpr int aroundFocus = 6;
+constexpr int aroundItem = 24; // the frame, and a scroll bar on a low screen
+
+/// Shows the items of a list with what is told of them in full.
+class ExampleDelegate final : public QStyledItemDelegate {
+public:
+    using QStyledItemDelegate::QStyledItemDelegate;
+
+protected:
+    void initStyleOption(QStyleOptionViewItem* option, const QModelIndex& index) const override {
+        QStyledItemDelegate::initStyleOption(option, index);
+        option->text = index.data(Qt::AccessibleTextRole).toString();
+    }
+};
 
 void setChoosable(QComboBox& combo, int item, bool choosable) {
     auto* const items = qobject_cast<QStandardItemModel*>(combo.model());
@@ -112,7 +131,11 @@ void ColumnPanel::makeLayout() {
     mFormat->setObjectName(QStringLiteral("columnFormat"));
     mFormat->setToolTip(tr("How the values look in the rows; sorting, criteria and exported files "
                            "go by the values themselves"));
-    for (const CellFormat& format : offeredFormats()) mFormat->addItem(nameOf(format));
+    for (const CellFormat& format : offeredFormats()) {
+        mFormat->addItem(nameOf(format));
+        mFormat->setItemData(mFormat->count() - 1, exampleOf(format), Qt::AccessibleTextRole);
+    }
+    mFormat->setItemDelegate(new ExampleDelegate(mFormat));
     mDecimals = new QSpinBox(this);
     mDecimals->setObjectName(QStringLiteral("columnDecimals"));
     mDecimals->setRange(model::asManyAsThereAre, model::ColumnDefinition::mostDecimals);
@@ -127,10 +150,15 @@ void ColumnPanel::makeLayout() {
     mFinding->setMinimumHeight(mFinding->fontMetrics().lineSpacing());
     mField->keepInSight(*mFinding);
     mFinding->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    // What a number says in words, and a choice with its example, may be cut off rather than make
+    // the panel wide.
+    for (QSpinBox* number : {mPriority, mDecimals}) number->setMinimumWidth(leastWidth);
     for (QComboBox* combo : {mTotal, mSort, mFormat}) {
         combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
         combo->setMinimumContentsLength(6);
         combo->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
+        // The list may be wider than the panel.
+        combo->view()->setMinimumWidth(combo->view()->sizeHintForColumn(0) + aroundItem);
     }
     // What there is to say may need more room than there is.
     auto* const page = new QWidget;
@@ -143,15 +171,19 @@ void ColumnPanel::makeLayout() {
     auto* const layout = new QVBoxLayout(this);
     layout->setContentsMargins({});
     layout->addWidget(scrolled);
-    auto* const form = new QFormLayout(page);
-    form->setContentsMargins(8, 6, 8, 6);
-    form->setVerticalSpacing(5);
+    auto* const parts = new QVBoxLayout(page);
+    parts->setContentsMargins(8, 6, 8, 6);
+    parts->setSpacing(rowSpacing);
     // It has the whole width: expressions are long.
     auto* const field = new QLabel(tr("Fie&ld:"), this);
     field->setBuddy(mField);
-    form->addRow(field);
-    form->addRow(mField);
-    form->addRow(mFinding);
+    for (QWidget* part : {static_cast<QWidget*>(field), static_cast<QWidget*>(mField),
+                          static_cast<QWidget*>(mFinding)})
+        parts->addWidget(part);
+    auto* const form = new QFormLayout;
+    form->setVerticalSpacing(rowSpacing);
+    parts->addLayout(form);
+    parts->addStretch();
     form->addRow(tr("&Total:"), mTotal);
     form->addRow(tr("&Name:"), mName);
     form->addRow(tr("&Sort:"), mSort);
@@ -160,6 +192,12 @@ void ColumnPanel::makeLayout() {
     form->addRow(tr("For&mat:"), mFormat);
     form->addRow(tr("De&cimals:"), mDecimals);
     scrolled->setMinimumHeight(std::min(page->sizeHint().height(), leastHeight));
+    // Whichever way the keyboard comes to a part, it comes into sight.
+    connect(qApp, &QApplication::focusChanged, scrolled, [page, scrolled](QWidget*, QWidget* now) {
+        if (!now || !page->isAncestorOf(now)) return;
+        const QRect place(now->mapTo(page, QPoint()), now->size());
+        scrolled->ensureVisible(0, place.center().y(), 0, place.height() / 2 + aroundFocus);
+    });
 }
 
 /// Shows the column that the grid is in; what is being typed about one stays until it counts.

@@ -17,7 +17,18 @@ class Words {
     Q_DECLARE_TR_FUNCTIONS(zandor::designer::Format)
 };
 
-QString wordOf(const CellFormat& offered) {
+} // namespace
+
+std::span<const CellFormat> offeredFormats() {
+    static constexpr CellFormat all[] = {
+        {Format::None},       {Format::Number, 0}, {Format::Number, 2}, {Format::Thousands, 2},
+        {Format::Percent, 2}, {Format::ShortDate}, {Format::LongDate},  {Format::DateAndTime},
+        {Format::IsoDate},    {Format::YearMonth}, {Format::Weekday},   {Format::Time},
+    };
+    return all;
+}
+
+QString nameOf(const CellFormat& offered) {
     switch (offered.format) {
     case Format::None: return Words::tr("As it is");
     case Format::Number:
@@ -35,23 +46,12 @@ QString wordOf(const CellFormat& offered) {
     return {};
 }
 
-} // namespace
-
-std::span<const CellFormat> offeredFormats() {
-    static constexpr CellFormat all[] = {
-        {Format::None},       {Format::Number, 0}, {Format::Number, 2}, {Format::Thousands, 2},
-        {Format::Percent, 2}, {Format::ShortDate}, {Format::LongDate},  {Format::DateAndTime},
-        {Format::IsoDate},    {Format::YearMonth}, {Format::Weekday},   {Format::Time},
-    };
-    return all;
-}
-
-QString nameOf(const CellFormat& offered) {
-    if (offered.format == Format::None) return wordOf(offered);
+QString exampleOf(const CellFormat& offered) {
+    if (offered.format == Format::None) return nameOf(offered);
     const Cell example = model::isOfNumbers(offered.format)
                              ? Cell{Cell::Kind::number, QStringLiteral("1234.5")}
                              : Cell{Cell::Kind::text, QStringLiteral("2026-07-21 14:30:00")};
-    return QStringLiteral("%1: %2").arg(wordOf(offered), shown(example, offered));
+    return QStringLiteral("%1: %2").arg(nameOf(offered), shown(example, offered));
 }
 
 int placeOf(const model::ColumnDefinition& definition) {

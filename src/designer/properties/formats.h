@@ -16,8 +16,10 @@ namespace zandor::designer {
 /// is a number without decimals.
 std::span<const CellFormat> offeredFormats();
 
-/// "Thousands", with an example in the user's language.
+/// "Thousands".
 QString nameOf(const CellFormat& offered);
+/// "Thousands: 1,234.50", with an example in the user's language where there is one.
+QString exampleOf(const CellFormat& offered);
 
 /// The place among those offered of the one that a column has.
 int placeOf(const model::ColumnDefinition& definition);

@@ -78,6 +78,22 @@ TEST(AChart, WritesValuesAsTheirColumnsAreShown) {
     EXPECT_THAT(drawn(twoSeries()), testing::Not(HasSubstr("%<")));
 }
 
+TEST(AChart, SaysLessWhereItIsLowAndWritesNothingOverAnother) {
+    const auto svg = [](int height) {
+        return ChartPicture(twoSeries(), QApplication::font(), QSize(600, height))
+            .svg()
+            .toStdString();
+    };
+    EXPECT_THAT(svg(120), HasSubstr(">b<"));
+    EXPECT_THAT(svg(80), testing::Not(HasSubstr(">b<")));
+    EXPECT_THAT(svg(80), HasSubstr(">total<"));
+    const ChartDrawing low(twoSeries(), look(), QSizeF(600, 80));
+    for (const ChartMark& mark : low.marks()) {
+        EXPECT_LE(mark.area.bottom(), 80);
+        EXPECT_GE(mark.area.top(), 12 + QFontMetricsF(look().font).height()) << "the legend's line";
+    }
+}
+
 TEST(AChart, HasColumnsAsHighAsTheirValues) {
     const ChartDrawing chart(twoSeries(), look(), size);
     EXPECT_EQ(chart.marks().size(), 5u); // a cell is empty

@@ -3,11 +3,13 @@
 #include "designer/properties/FieldEdit.h"
 #include "designer/properties/fields.h"
 
+#include <QAbstractItemView>
 #include <QCheckBox>
 #include <QCompleter>
 #include <QDockWidget>
 #include <QLabel>
 #include <QListWidget>
+#include <QScrollArea>
 #include <QSpinBox>
 
 using namespace zandor;
@@ -107,7 +109,7 @@ TEST_F(TheColumnPanel, SetsHowValuesAreShownInOneStep) {
     EXPECT_EQ(format.currentText(), "As it is");
     EXPECT_FALSE(decimals.isEnabled());
     EXPECT_EQ(decimals.text(), "as many as there are");
-    pick("columnFormat", "Decimals: 1234.50");
+    pick("columnFormat", "Decimals");
     EXPECT_EQ(definition(2).format(), model::Format::Number);
     EXPECT_EQ(definition(2).decimals(), 2);
     EXPECT_EQ(lastStep(), "Change format of quantity");
@@ -118,13 +120,13 @@ TEST_F(TheColumnPanel, SetsHowValuesAreShownInOneStep) {
     hands::key(decimals, Qt::Key_Down);
     calm();
     EXPECT_EQ(definition(2).decimals(), 0);
-    EXPECT_EQ(format.currentText(), "Whole number: 1235");
+    EXPECT_EQ(format.currentText(), "Whole number");
     EXPECT_EQ(made(), 3);
-    pick("columnFormat", "Thousands: 1,234.50");
+    pick("columnFormat", "Thousands");
     EXPECT_EQ(definition(2).decimals(), 0) << "as was said before";
     pick("columnFormat", "As it is");
     EXPECT_EQ(definition(2).decimals(), model::asManyAsThereAre);
-    pick("columnFormat", "Thousands: 1,234.50");
+    pick("columnFormat", "Thousands");
     EXPECT_EQ(definition(2).decimals(), model::asManyAsThereAre) << "whole numbers have none";
     for (int n = 0; n < 6; ++n) window->document().undo();
     calm();
@@ -137,13 +139,17 @@ TEST_F(TheColumnPanel, OffersTheFormatsThatTheValuesCanHave) {
         QStringList result;
         for (int n = 0; n < combo("columnFormat").count(); ++n)
             if (combo("columnFormat").model()->index(n, 0).flags() & Qt::ItemIsEnabled)
-                result << combo("columnFormat").itemText(n).section(u':', 0, 0);
+                result << combo("columnFormat").itemText(n);
         return result.join(u'|');
     };
     const QString numbers = "As it is|Whole number|Decimals|Thousands|Percent";
     const QString days = "As it is|Short date|Long date|Date and time|ISO date|Year and month|"
                          "Weekday|Time";
     EXPECT_EQ(offered(), days) << "a text may be a day";
+    const auto& list = *combo("columnFormat").view();
+    const QModelIndex third = list.model()->index(3, 0);
+    EXPECT_EQ(third.data(Qt::AccessibleTextRole).toString().toStdString(), "Thousands: 1,234.50");
+    EXPECT_GE(list.minimumWidth(), list.sizeHintForIndex(third).width());
     goToColumn(2);
     EXPECT_EQ(offered(), numbers);
     window->document().change({}, [&](model::Query&) { definition(2).total(Total::Largest); });
@@ -262,6 +268,7 @@ TEST_F(TheColumnPanel, LeavesWhatItSaysInSightBesideTheListOfNames) {
     };
     ASSERT_TRUE(list.isVisible());
     EXPECT_FALSE(covered());
+    EXPECT_GE(label.height(), label.heightForWidth(label.width())) << label.width();
     // Neither when there is more to say while it is open.
     write("columnField", "quantity * this_is_a_name_that_no_table_of_the_query_has + unit");
     const int before = label.height();
@@ -270,6 +277,32 @@ TEST_F(TheColumnPanel, LeavesWhatItSaysInSightBesideTheListOfNames) {
     ASSERT_TRUE(list.isVisible());
     EXPECT_FALSE(covered());
     hands::key(field(), Qt::Key_Escape);
+}
+
+TEST_F(TheColumnPanel, ShowsItsPartsAsAWholeOnASmallScreen) {
+    window->document().change({}, [&](model::Query&) {
+        definition(1).SortOrder(1);
+        definition(1).format(model::Format::Number);
+    });
+    window->resize(1024, 600);
+    calm();
+    const auto& scrolled = *found<QDockWidget>("columnDock").findChild<QScrollArea*>();
+    const auto inSight = [&](const char* name) {
+        const auto& part = found<QWidget>(name);
+        const QRect place(part.mapTo(scrolled.viewport(), QPoint()), part.size());
+        return scrolled.viewport()->rect().contains(place);
+    };
+    ASSERT_FALSE(inSight("columnDecimals")) << "there is more than has room";
+    const auto& field = found<QWidget>("columnField");
+    EXPECT_TRUE(inSight("columnField")) << field.width() << " in " << scrolled.viewport()->width();
+    for (const char* name : {"columnPriority", "columnFormat", "columnDecimals", "columnField"}) {
+        auto& part = found<QWidget>(name);
+        window->activateWindow();
+        part.setFocus(Qt::ShortcutFocusReason);
+        ASSERT_TRUE(until([&] { return part.hasFocus(); })) << name;
+        calm();
+        EXPECT_TRUE(inSight(name)) << name;
+    }
 }
 
 TEST_F(TheColumnPanel, MakesANewColumnOfAFieldInABlankOne) {
