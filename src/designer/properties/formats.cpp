@@ -48,8 +48,10 @@ QString nameOf(const CellFormat& offered) {
 
 QString exampleOf(const CellFormat& offered) {
     if (offered.format == Format::None) return nameOf(offered);
+    const QString number =
+        offered.format == Format::Percent ? QStringLiteral("0.125") : QStringLiteral("1234.5");
     const Cell example = model::isOfNumbers(offered.format)
-                             ? Cell{Cell::Kind::number, QStringLiteral("1234.5")}
+                             ? Cell{Cell::Kind::number, number}
                              : Cell{Cell::Kind::text, QStringLiteral("2026-07-21 14:30:00")};
     return QStringLiteral("%1: %2").arg(nameOf(offered), shown(example, offered));
 }
