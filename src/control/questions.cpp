@@ -23,7 +23,12 @@ void Zandor::ReadOnly(bool value) {
         if (value) MakeGetValueFieldsInvisible();
         mLife.check();
         mReadOnly = value;
-        for (const auto& [index, table] : lstTable) table->Locked(value);
+        // What the user holds is let go where it was.
+        const std::vector shown(lstTable.begin(), lstTable.end());
+        for (const auto& [index, table] : shown) {
+            table->Locked(value);
+            if (value) table->Drag(0);
+        }
     });
 }
 

@@ -175,6 +175,105 @@ TEST_F(ADrawingThatIsOnlyRead, IsWorkedInAgainOnceItMay) {
     EXPECT_EQ(stage->boxes, Boxes{});
 }
 
+/// What the user holds when the host takes the drawing away from him.
+class ADragThatTheHostEnds : public ADrawingThatIsOnlyRead,
+                             public testing::WithParamInterface<bool> {
+protected:
+    ADragThatTheHostEnds() {
+        stage->comforts().setFlags(GetParam() ? zandor::comforts::Flags::all()
+                                              : zandor::comforts::Flags());
+        control().ReadOnly(false);
+        stage->selectEntries(1, {id});
+        forget();
+        changes.clear();
+        stage->onHeld = [this] {
+            ++held;
+            control().ReadOnly(true);
+            changes.clear(); // what a press has selected
+        };
+    }
+    ~ADragThatTheHostEnds() override {
+        EXPECT_EQ(held, 1);
+        EXPECT_EQ(stage->raised.size(), 0U) << "nothing has been done that an event would tell of";
+        expectUnchanged();
+        stage->onHeld = nullptr;
+        control().ReadOnly(false);
+    }
+
+    int held = 0;
+};
+
+TEST_P(ADragThatTheHostEnds, LeavesTheTableWhereItWas) {
+    const auto before = stage->look("lstTable(1)").bounds;
+    const auto line = stage->look("linJoin(1)");
+    stage->moveTable(1, 3000, 900);
+    EXPECT_EQ(stage->look("lstTable(1)").bounds, before);
+    EXPECT_EQ(stage->look("linJoin(1)").X1, line.X1);
+    EXPECT_EQ(stage->look("linJoin(1)").Y1, line.Y1);
+}
+
+TEST_P(ADragThatTheHostEnds, LeavesTheTableItsSize) {
+    const auto before = stage->look("lstTable(1)").bounds;
+    stage->resizeTable(1, 2700, 2700);
+    EXPECT_EQ(stage->look("lstTable(1)").bounds, before);
+}
+
+TEST_P(ADragThatTheHostEnds, TakesNothingBackThatWasDoneBefore) {
+    stage->onHeld = nullptr;
+    stage->moveTable(1, 3000, 900);
+    const auto moved = stage->look("lstTable(1)").bounds;
+    control().ReadOnly(true);
+    EXPECT_EQ(stage->look("lstTable(1)").bounds, moved);
+    control().ReadOnly(false);
+    stage->moveTable(1, moved.Left + 300, moved.Top);
+    EXPECT_NEAR(orders->left, moved.Left + 300, 15) << "it is moved again from where it is";
+    held = 1;
+    changes.clear();
+    forget();
+}
+
+TEST_P(ADragThatTheHostEnds, MakesNoJoin) {
+    stage->selectEntries(2, {name});
+    stage->dragToEntry(1, id, 2, id);
+    EXPECT_FALSE(stage->exists("linJoin(2)"));
+    if (GetParam()) {
+        EXPECT_EQ(stage->look("lstTable(2)").selected, Texts{u"NAME"})
+            << "what was selected under the drag";
+    }
+}
+
+TEST_P(ADragThatTheHostEnds, MakesNoColumn) {
+    stage->dragToCell(1, id, fieldRow, 3);
+    EXPECT_EQ(fields(3), (Texts{u"NAME", u"TOTAL", u""}));
+}
+
+TEST_P(ADragThatTheHostEnds, MakesNoColumnBeyondATableEither) {
+    stage->selectEntries(2, {name});
+    stage->dragAcross(1, id, 2, id, fieldRow, 3);
+    EXPECT_EQ(fields(3), (Texts{u"NAME", u"TOTAL", u""}));
+    if (GetParam()) {
+        EXPECT_EQ(stage->look("lstTable(2)").selected, Texts{u"NAME"});
+    }
+}
+
+TEST_P(ADragThatTheHostEnds, LeavesTheColumnsTheirOrder) {
+    stage->dragField(2, 1);
+    EXPECT_EQ(fields(2), (Texts{u"NAME", u"TOTAL"}));
+}
+
+TEST_P(ADragThatTheHostEnds, IsFollowedByOneThatCounts) {
+    stage->dragToEntry(1, id, 2, id);
+    expectUnchanged();
+    stage->onHeld = nullptr;
+    control().ReadOnly(false);
+    stage->dragToEntry(1, id, 2, id);
+    EXPECT_TRUE(stage->exists("linJoin(2)"));
+    changes.clear();
+    forget();
+}
+
+INSTANTIATE_TEST_SUITE_P(WithoutAndWithComforts, ADragThatTheHostEnds, testing::Bool());
+
 TEST_F(ADrawingThatIsOnlyRead, KeepsWhatWasBeingTypedBefore) {
     control().ReadOnly(false);
     press(left, criteriaRow, 1);

@@ -47,6 +47,9 @@ public:
             transcript.push_back("dialog");
             if (onDialog) onDialog();
         };
+        mUser.onHeld = [this] {
+            if (onHeld) onHeld();
+        };
         mHouse = std::make_shared<House>();
         mHouse->control.emplace(mToolkit, library, mPassing, mHouse);
         mControl = &*mHouse->control;

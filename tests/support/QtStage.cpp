@@ -79,7 +79,10 @@ public:
         // The platform without a screen carries no drags.
         mWidget->toolkit().drags().setCarrier([this](QDrag& drag) {
             if (mDragOver.widget) hands::carryOver(drag, *mDragOver.widget, mDragOver.at);
-            if (mDropAt.widget) hands::carry(drag, *mDropAt.widget, mDropAt.at, mDragOver.widget);
+            if (!mDropAt.widget) return;
+            if (onHeld && !mDragOver.widget) hands::carryOver(drag, *mDropAt.widget, mDropAt.at);
+            held();
+            hands::carry(drag, *mDropAt.widget, mDropAt.at, mDragOver.widget || onHeld);
         });
         mHostField.move(-1000, -1000); // out of the way
         mWidget->resize(800, 600);
@@ -260,6 +263,7 @@ public:
         const Spot end{from.widget, from.widget->mapFrom(&grid(), QPointF(x, target.center().y()))};
         send(from, QEvent::MouseButtonPress, 1, Qt::LeftButton);
         send(end, QEvent::MouseMove, 0, Qt::LeftButton);
+        held();
         send(end, QEvent::MouseButtonRelease, 1, Qt::NoButton);
     }
     void dragBorder(std::int32_t col, float width) override {
@@ -270,7 +274,10 @@ public:
         if (width > 0) end.at += QPointF(width / twipsPerPixel - cell.width(), 0);
         send(border, width > 0 ? QEvent::MouseButtonPress : QEvent::MouseButtonDblClick, 1,
              Qt::LeftButton);
-        if (width > 0) send(end, QEvent::MouseMove, 0, Qt::LeftButton);
+        if (width > 0) {
+            send(end, QEvent::MouseMove, 0, Qt::LeftButton);
+            held();
+        }
         send(end, QEvent::MouseButtonRelease, 1, Qt::NoButton);
     }
     void editCell() override {
@@ -344,6 +351,9 @@ private:
     void send(const Spot& spot, QEvent::Type type, std::int16_t button, Qt::MouseButtons held);
     void gesture(TabuletWidget& box, QPointF grip, QPointF way);
     void drag(std::int16_t from, std::int32_t entry, const Spot& to);
+    void held() const {
+        if (onHeld) onHeld();
+    }
     void boxOpened(QMessageBox& box);
     void menuOpened(QMenu& menu);
     void dialogOpened(QDialog& dialog);
@@ -490,6 +500,7 @@ void QtStage::gesture(TabuletWidget& box, QPointF grip, QPointF way) {
         if (alive)
             hands::mouse(box, QEvent::MouseMove, box.mapFromGlobal(start + part * way),
                          Qt::NoButton, Qt::LeftButton);
+    held();
     if (alive)
         hands::mouse(box, QEvent::MouseButtonRelease, box.mapFromGlobal(start + way),
                      Qt::LeftButton);

@@ -87,6 +87,8 @@ public:
     std::function<void()> onDialog;
     /// Called while the host is told of an event.
     std::function<void()> onEvent;
+    /// Called in each whole drag, of whatever it is, before the button comes up.
+    std::function<void()> onHeld;
 
     /// By name: "hsbTable", "lstTable(3)", "linJoin(1)", "shpJoin(2)", "mnuJoinDelete"; while the
     /// dialog is open also its controls. Fails the test when there is no such control.

@@ -142,6 +142,9 @@ void Tabulet::Activated(bool value) {
 void Tabulet::Locked(bool value) {
     called("Locked");
     mLocked = value;
+    if (!value || !mGrasped) return;
+    place(*std::exchange(mGrasped, std::nullopt));
+    if (events.Moving) events.Moving(index);
 }
 
 void Tabulet::Font(const platform::Font& value) {
@@ -193,8 +196,14 @@ void Tabulet::SetFocus() {
 
 void Tabulet::Drag(std::int16_t action) {
     called("Drag");
-    if (action != 1) throw errors::invalidProcedureCall();
-    mToolkit.beginDrag(*this);
+    if (action == 1) {
+        mToolkit.beginDrag(*this);
+    } else if (action != 0) {
+        throw errors::invalidProcedureCall();
+    } else if (mToolkit.dragged() == this) {
+        mToolkit.endDragOf(this);
+        mToolkit.comforts.dragGone();
+    }
 }
 
 void Tabulet::Complete() {
@@ -213,6 +222,12 @@ void Tabulet::Unload() {
     dropEntries();
     mToolkit.endDragOf(this);
     leave();
+}
+
+void Tabulet::drag(const Bounds& bounds) {
+    if (!mGrasped) return;
+    place(bounds);
+    if (events.Moving) events.Moving(index);
 }
 
 ColumnItem& Tabulet::entry(std::int32_t position) const {

@@ -103,6 +103,7 @@ void User::clickField(const std::string& name, std::int32_t col) {
 void User::dragField(const std::string& name, std::int32_t col, std::int32_t to) {
     pressCell(name, leftButton, 0, col);
     const bool moves = mToolkit.comforts.columnMovable(col);
+    beforeRelease();
     releaseCell(name, leftButton, 0, to);
     if (moves) mToolkit.comforts.columnMoved(col, to);
 }
@@ -113,6 +114,7 @@ void User::dragBorder(const std::string& name, std::int32_t col, float width) {
         return;
     }
     reach<Grid>(name).resizeColumn(col, width);
+    beforeRelease();
     mToolkit.comforts.borderDragged(col, width);
 }
 
@@ -165,31 +167,35 @@ void User::closeDialog() {
     dialog->close();
 }
 
-Tabulet& User::dragFrame(const std::string& name, const Bounds& by) {
+Tabulet* User::dragFrame(const std::string& name, const Bounds& by) {
     if (auto& table = reach<Tabulet>(name); table.usable()) table.takeFocus();
     const Bounds start = reach<Tabulet>(name).placement();
-    for (const float part : {0.5F, 1.0F}) {
+    reach<Tabulet>(name).grasp();
+    for (const float part : {0.5F, 1.0F})
         // What the step before told may have taken the table away.
-        auto& table = reach<Tabulet>(name);
-        table.drag({start.Left + part * by.Left, start.Top + part * by.Top,
-                    start.Width + part * by.Width, start.Height + part * by.Height});
-        if (table.events.Moving) table.events.Moving(table.index);
-    }
-    return reach<Tabulet>(name);
+        reach<Tabulet>(name).drag({start.Left + part * by.Left, start.Top + part * by.Top,
+                                   start.Width + part * by.Width, start.Height + part * by.Height});
+    beforeRelease();
+    auto& table = reach<Tabulet>(name);
+    return table.letGo() ? &table : nullptr;
+}
+
+void User::beforeRelease() const {
+    if (onHeld) onHeld();
 }
 
 void User::moveTable(const std::string& name, float left, float top) {
     const Bounds at = reach<Tabulet>(name).placement();
     if (reach<Tabulet>(name).locked()) return;
-    auto& table = dragFrame(name, {left - at.Left, top - at.Top, 0, 0});
-    if (table.events.Moved) table.events.Moved(table.index);
+    const auto* table = dragFrame(name, {left - at.Left, top - at.Top, 0, 0});
+    if (table && table->events.Moved) table->events.Moved(table->index);
 }
 
 void User::resizeTable(const std::string& name, float width, float height) {
     const Bounds at = reach<Tabulet>(name).placement();
     if (reach<Tabulet>(name).locked()) return;
-    auto& table = dragFrame(name, {0, 0, width - at.Width, height - at.Height});
-    if (table.events.Resized) table.events.Resized(table.index);
+    const auto* table = dragFrame(name, {0, 0, width - at.Width, height - at.Height});
+    if (table && table->events.Resized) table->events.Resized(table->index);
 }
 
 void User::closeTable(const std::string& name) {

@@ -177,6 +177,7 @@ void User::dragAcross(const std::string& from, std::int32_t entry, const std::st
     if (!beginDragFrom(from, entry)) return;
     const TalvikTabulet::Point on = placeOf(reachEntry(across, passed), passed);
     dragOver(across, on.X, on.Y);
+    beforeRelease();
     const Bounds at = reachCell(grid, row, col);
     dropOn(grid, at.Left + at.Width / 2, at.Top + at.Height / 2);
 }
@@ -188,6 +189,7 @@ void User::dragToEntry(const std::string& from, std::int32_t entry, const std::s
     if (!beginDragFrom(from, entry)) return;
     const TalvikTabulet::Point at = placeOf(mToolkit.find<Tabulet>(to), target);
     dragOver(to, at.X, at.Y);
+    beforeRelease();
     dropOn(to, at.X, at.Y);
 }
 
@@ -195,6 +197,7 @@ void User::dragToCell(const std::string& from, std::int32_t entry, const std::st
                       std::int32_t row, std::int32_t col) {
     reachCell(grid, row, col);
     if (!beginDragFrom(from, entry)) return;
+    beforeRelease();
     const Bounds at = reachCell(grid, row, col);
     dropOn(grid, at.Left + at.Width / 2, at.Top + at.Height / 2);
 }

@@ -69,6 +69,7 @@ void DragSession::runRequested() {
     const std::shared_ptr<void> kept = mKeeper.lock();
     const QPointer<DragSession> alive = this;
     mRunning = true;
+    mGivenUp = false;
     const QPointer<QDrag> drag = new QDrag(widget);
     mDrag = drag;
     auto* data = new QMimeData;
@@ -80,7 +81,7 @@ void DragSession::runRequested() {
     if (drag) drag->deleteLater();
     if (!alive) return;
     mRunning = false;
-    if (const auto deliver = std::exchange(mDrop, nullptr); deliver && mSource) deliver();
+    if (const auto deliver = std::exchange(mDrop, nullptr); deliver && mSource) deliver(!mGivenUp);
     if (alive) mSource = nullptr;
 }
 
@@ -90,12 +91,22 @@ void DragSession::cancel() {
     if (mDrag) QDrag::cancel();
 }
 
+void DragSession::giveUp(const Control* source) {
+    if (!source || mSource != source) return;
+    mRequestedBy = nullptr;
+    mGivenUp = true;
+    // While it runs the source stays, until the drag has left what it is over.
+    if (!mRunning) mSource = nullptr;
+    if (mDrag) QDrag::cancel();
+}
+
 void DragSession::forget(const Control* source) {
     if (mSource == source) mSource = nullptr;
 }
 
 bool DragSession::accepts(const QMimeData* data) const {
-    return mRunning && mSource && data && data->data(QLatin1String(columnsMimeType)) == mIdentity;
+    return mRunning && !mGivenUp && mSource && data &&
+           data->data(QLatin1String(columnsMimeType)) == mIdentity;
 }
 
 void DragSession::showWhetherDropCounts(bool counts) {

@@ -34,6 +34,8 @@ public:
     void setKeeper(std::weak_ptr<void> keeper) { mKeeper = std::move(keeper); }
     /// The control has ended: a drag that runs ends, and drops nothing.
     void cancel();
+    /// Ends the drag of a source where it is, as Escape does; without one nothing happens.
+    void giveUp(const Control* source);
 
     /// Asks for a drag with `source` as its source. It begins as soon as the event at hand has
     /// been dealt with; while a drag runs, requests are ignored.
@@ -48,8 +50,9 @@ public:
     void showWhetherDropCounts(bool counts);
     Control* source() const { return mSource; }
     /// Keeps the drop until the drag's own event loop has ended: a handler may open message
-    /// boxes, which must not stand inside the drag.
-    void drop(std::function<void()> deliver) { mDrop = std::move(deliver); }
+    /// boxes, which must not stand inside the drag. It is told whether the drop still counts, for
+    /// the drag may be given up meanwhile.
+    void drop(std::function<void(bool counts)> deliver) { mDrop = std::move(deliver); }
 
 private:
     static QPixmap picture(const QWidget& widget, const QStringList& names);
@@ -59,9 +62,10 @@ private:
     QStringList mNames;
     Control* mSource = nullptr;
     bool mRunning = false;
+    bool mGivenUp = false;
     QPointer<QDrag> mDrag;
     Carrier mCarrier;
-    std::function<void()> mDrop;
+    std::function<void(bool)> mDrop;
     std::weak_ptr<void> mKeeper;
 };
 

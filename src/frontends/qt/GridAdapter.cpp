@@ -227,8 +227,8 @@ bool GridAdapter::dragAccepted(const QMimeData* data) { return mDrags.accepts(da
 
 bool GridAdapter::dropped(const QMimeData* data, QPointF at) {
     if (!mDrags.accepts(data)) return false;
-    mDrags.drop([this, alive = mWidget, at] {
-        if (alive && alive->property(controlProperty).isValid() && mEvents.DragDrop)
+    mDrags.drop([this, alive = mWidget, at](bool counts) {
+        if (counts && alive && alive->property(controlProperty).isValid() && mEvents.DragDrop)
             mEvents.DragDrop(mDrags.source(), toTwips(at.x()), toTwips(at.y()));
     });
     return true;

@@ -185,6 +185,7 @@ void TabuletAdapter::ZOrder() {
 }
 
 void TabuletAdapter::Drag(std::int16_t action) {
+    if (action == 0) mDrags.giveUp(this);
     if (action != 1 || !mWidget) return;
     QStringList names;
     for (const auto& entry : mEntries.items)
@@ -298,6 +299,11 @@ void TabuletAdapter::gestureEnded(Qt::Edges edges) {
     if (events.Resized) events.Resized(index);
 }
 
+void TabuletAdapter::gestureTakenBack() {
+    setBounds(mGestureStart);
+    if (mEvents.Moving) mEvents.Moving(mIndex);
+}
+
 /// The control brings a corner that was pulled out of sight back; the other edges are to stay.
 void TabuletAdapter::keepOppositeEdges(const Bounds& left) {
     Bounds box = bounds();
@@ -327,11 +333,11 @@ bool TabuletAdapter::dropped(const QMimeData* data, QPointF at) {
     if (!mDrags.accepts(data)) return false;
     // The comforts outlive the table, which may be gone once the host has heard of the drop.
     auto& comforts = mSurroundings.comforts;
-    mDrags.drop([this, &comforts, alive = mWidget, at, taken = mEntryTaken] {
+    mDrags.drop([this, &comforts, alive = mWidget, at, taken = mEntryTaken](bool counts) {
         if (!alive) return;
-        if (alive->property(controlProperty).isValid() && mEvents.DragDrop)
+        if (counts && alive->property(controlProperty).isValid() && mEvents.DragDrop)
             mEvents.DragDrop(mIndex, mDrags.source(), toTwips(at.x()), toTwips(at.y()));
-        if (alive) taken ? comforts.dragTaken() : comforts.dragGone();
+        if (alive) (counts && taken) ? comforts.dragTaken() : comforts.dragGone();
     });
     return true;
 }

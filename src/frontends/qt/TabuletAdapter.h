@@ -81,6 +81,7 @@ private:
     void gestureBegan() override;
     void gestureMoved(Qt::Edges edges, QPointF way) override;
     void gestureEnded(Qt::Edges edges) override;
+    void gestureTakenBack() override;
     void keepOppositeEdges(const Bounds& left);
     bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) override;
     bool dropped(const QMimeData* data, QPointF at) override;

@@ -18,6 +18,7 @@
 #include <QToolTip>
 
 #include <cmath>
+#include <utility>
 
 namespace zandor::platform::qt {
 
@@ -156,6 +157,7 @@ void TabuletWidget::setLocked(bool locked) {
     mClose->setVisible(!locked);
     unsetCursor();
     update(titleBar());
+    if (locked && stopGesture() && mListener) mListener->gestureTakenBack();
 }
 
 void TabuletWidget::setCurrent(bool current) {
@@ -261,9 +263,10 @@ bool TabuletWidget::moveOrResize(const QKeyEvent& event) {
     Qt::Edges edges;
     if (resize) edges = arrow.x() != 0 ? Qt::RightEdge : Qt::BottomEdge;
     const QPointer<TabuletWidget> alive = this;
-    mListener->gestureBegan();
+    beginGesture(edges);
+    mMoved = true;
     mListener->gestureMoved(edges, arrow * keyStep);
-    if (alive && mListener) mListener->gestureEnded(edges);
+    if (alive) endGesture();
     if (alive) mCanvas.view().reveal(geometry());
     return true;
 }
@@ -289,11 +292,8 @@ void TabuletWidget::mousePressEvent(QMouseEvent* event) {
     raise();
     if (event->button() != Qt::LeftButton) return;
     if (isLocked()) return mList->setFocus(Qt::MouseFocusReason);
-    mEdges = edgesAt(event->position().toPoint());
-    mGesture = mEdges ? Gesture::resize : Gesture::move;
     mPressedAt = event->globalPosition();
-    mMoved = false;
-    if (mListener) mListener->gestureBegan();
+    beginGesture(edgesAt(event->position().toPoint()));
     mList->setFocus(Qt::MouseFocusReason);
 }
 
@@ -316,11 +316,20 @@ void TabuletWidget::mouseReleaseEvent(QMouseEvent* event) {
     if (event->button() == Qt::RightButton && onTitle && mListener) mListener->titleClicked();
 }
 
-void TabuletWidget::endGesture() {
-    const bool moved = mGesture != Gesture::none && mMoved;
-    mGesture = Gesture::none;
+void TabuletWidget::beginGesture(Qt::Edges edges) {
+    mEdges = edges;
+    mGesture = edges ? Gesture::resize : Gesture::move;
     mMoved = false;
-    if (moved && mListener) mListener->gestureEnded(mEdges);
+    if (mListener) mListener->gestureBegan();
+}
+
+bool TabuletWidget::stopGesture() {
+    const bool going = std::exchange(mGesture, Gesture::none) != Gesture::none;
+    return std::exchange(mMoved, false) && going;
+}
+
+void TabuletWidget::endGesture() {
+    if (stopGesture() && mListener) mListener->gestureEnded(mEdges);
 }
 
 // The canvas below does not scroll while the mouse is over a table.

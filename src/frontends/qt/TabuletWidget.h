@@ -25,6 +25,8 @@ public:
     /// The mouse is `way` logical pixels from where the gesture began.
     virtual void gestureMoved(Qt::Edges edges, QPointF way) = 0;
     virtual void gestureEnded(Qt::Edges edges) = 0;
+    /// The box is to be where the gesture began.
+    virtual void gestureTakenBack() = 0;
     /// Without data it is the drag that has come before. State 0 enters, 1 leaves, 2 is over.
     virtual bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) = 0;
     virtual bool dropped(const QMimeData* data, QPointF at) = 0;
@@ -87,6 +89,9 @@ private:
     QFont titleFont() const;
     void arrange();
     Qt::Edges edgesAt(QPoint at) const;
+    void beginGesture(Qt::Edges edges);
+    /// Whether there was one that has moved the box.
+    bool stopGesture();
     void endGesture();
     bool moveOrResize(const QKeyEvent& event);
     void scrollUnderDrag(QPoint direction);

@@ -182,7 +182,8 @@ public:
 
     /// Whether the user only looks: the canvas scrolls, entries are selected and copied, joins tell
     /// what they are; tables stand where they stand, and nothing comes into the model but what is
-    /// selected. What the host does itself is as ever. Not part of the public interface.
+    /// selected. What the host does itself is as ever. A drag that is going on when it becomes so
+    /// is taken back, and nothing tells of it. Not part of the public interface.
     bool ReadOnly() const { return mReadOnly; }
     void ReadOnly(bool value);
 

@@ -109,8 +109,8 @@ public:
     using QWidget::repaint;
     using QWidget::update;
 
-    /// The query model; never nothing. Setting nothing emits Error and keeps the model held. Setting
-    /// another one keeps grid columns of the one before; showAnew takes them away.
+    /// The query model; never nothing. Setting nothing emits Error and keeps the model held.
+    /// Setting another one keeps grid columns of the one before; showAnew takes them away.
     ZandorModel model() const;
     void setModel(const ZandorModel& model);
     /// Always nothing: the signals carry the object concerned.
@@ -139,7 +139,8 @@ public:
     void setQuestions(std::shared_ptr<TalvikDBxZandor::Questions> questions);
     /// Whether the user only looks: the canvas scrolls, entries are selected and copied, joins tell
     /// what they are; tables stand where they stand, cells open no editors, and nothing comes into
-    /// the model but what is selected. False at first. What the host does itself is as ever.
+    /// the model but what is selected. False at first. What the host does itself is as ever. A drag
+    /// that is going on when it becomes so is taken back, with no signal.
     bool isReadOnly() const;
     void setReadOnly(bool readOnly);
     /// A place in this widget, in logical pixels, as one on the canvas, in twips, as tables have
@@ -150,8 +151,8 @@ public:
     QPoint fromCanvas(QPointF twips) const;
     /// Who makes the model's objects, for a widget that was made without: before its model is asked
     /// for or set. Until then the model is an empty one, and a join or an output column that the
-    /// user makes in another is reported as error 91. The library outlives the widget. The titles of
-    /// the grid, when it is shown, become those of the moment.
+    /// user makes in another is reported as error 91. The library outlives the widget. The titles
+    /// of the grid, when it is shown, become those of the moment.
     void setLibrary(TalvikZandorLib::Library& library);
     /// Leaves out the message boxes, errors and traces alike: for where nobody is at work with the
     /// control, as in an editor of forms.

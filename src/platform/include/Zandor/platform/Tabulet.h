@@ -73,7 +73,8 @@ public:
     virtual void Visible(bool value) = 0;
     virtual void Activated(bool value) = 0; ///< whether it is shown as the current one
     /// Whether the user can neither move, nor resize, nor close it; nothing of that is offered
-    /// then.
+    /// then. A move or a resize that is going on is taken back: the table list is where it was,
+    /// which Moving tells, and neither Moved nor Resized follows.
     virtual void Locked(bool value) = 0;
     virtual void Font(const platform::Font& value) = 0; ///< of title and entries
     /// What the images of its entries are taken from; it has none at first.
@@ -86,7 +87,8 @@ public:
     virtual void ZOrder() = 0; ///< brings it before the others
     /// Error 5 when the control cannot take the focus now.
     virtual void SetFocus() = 0;
-    /// 1 begins a drag with the table list as its source.
+    /// 1 begins a drag with the table list as its source. 0 ends such a drag as Escape does, with
+    /// nothing dropped; without one nothing happens.
     virtual void Drag(std::int16_t action) = 0;
     /// The list has been filled, or is to be shown afresh.
     virtual void Complete() = 0;

@@ -4,6 +4,9 @@
 #include <Zandor/headless/export.h>
 #include <Zandor/platform/Tabulet.h>
 
+#include <optional>
+#include <utility>
+
 namespace zandor::platform::headless {
 
 class Tabulet;
@@ -101,8 +104,12 @@ public:
     void scrollTo(std::int32_t position);
     /// Its font, its images and its lock.
     void takeLookOf(const Tabulet& pattern);
-    /// As the user leaves it with the mouse.
-    void drag(const Bounds& bounds) { place(bounds); }
+    /// The user takes hold of it, to move or resize it by the mouse, and lets go; false when it was
+    /// taken back meanwhile.
+    void grasp() { mGrasped = placement(); }
+    bool letGo() { return std::exchange(mGrasped, std::nullopt).has_value(); }
+    /// As the user, who holds it, has it with the mouse; nothing once it was taken back.
+    void drag(const Bounds& bounds);
 
     const std::int16_t index;
     const TalvikTabulet::TabuletEvents& events;
@@ -122,6 +129,7 @@ private:
     bool mActivated = false;
     bool mLocked = false;
     int mCompletions = 0;
+    std::optional<Bounds> mGrasped; ///< where it was when the user took hold of it
     Ref<platform::ImageList> mImages;
     std::int32_t mFirstVisible = 1;
     std::vector<Ref<TalvikTabulet::ColumnItem>> mItems;

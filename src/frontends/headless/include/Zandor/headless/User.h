@@ -3,6 +3,8 @@
 #include <Zandor/headless/Toolkit.h>
 #include <Zandor/headless/export.h>
 
+#include <functional>
+
 namespace zandor::platform::headless {
 
 /// The user's hands. Only what a user could reach can be touched: something that does not exist, is
@@ -11,6 +13,9 @@ namespace zandor::platform::headless {
 class ZANDOR_HEADLESS_EXPORT User {
 public:
     explicit User(Toolkit& toolkit) : mToolkit(toolkit) {}
+
+    /// Called in each whole drag, of whatever it is, before the button comes up.
+    std::function<void()> onHeld;
 
     void resizeControl(float width, float height);
     void repaint();
@@ -108,7 +113,9 @@ private:
     }
     void mustReach(const Element& element) const;
     Tabulet& reachEntry(const std::string& name, std::int32_t entry) const;
-    Tabulet& dragFrame(const std::string& name, const Bounds& by);
+    /// The table in the end, or nothing when it was taken back.
+    Tabulet* dragFrame(const std::string& name, const Bounds& by);
+    void beforeRelease() const;
     void leaveDragTarget();
     bool beginDragFrom(const std::string& table, std::int32_t entry);
     Bounds reachCell(const std::string& name, std::int32_t row, std::int32_t col) const;
