@@ -72,6 +72,19 @@ class Column(lib.ZDColumn):
         return False
 
 
+class Rules(zandor.Questions):
+    def MayJoin(self, left: zandor.JoinEnd, right: zandor.JoinEnd) -> bool:
+        return left.Column.Marker != right.Column.Marker
+
+    def MenuEntries(self, place: zandor.MenuPlace) -> List[zandor.HostEntry]:
+        name: Optional[str] = place.Table.Name if place.Table else None
+        return [zandor.HostEntry(f"Copy {name}", lambda: print(name))]
+
+
+widget.setQuestions(Rules())
+widget.setQuestions(None)
+widget.setLibrary(zandor.Library())
+other = zandor.ZandorWidget()
 columns: lib.KeyedCollection[Column] = lib.KeyedCollection([Column("id")])
 first: str = columns.Item(1).Name
 """,
@@ -87,6 +100,9 @@ first: str = columns.Item(1).Name
         ("text: str = widget.DebugSwitch()", "Incompatible types in assignment"),
         ("query.Tables.Item(1).Nmae", 'has no attribute "Nmae"'),
         ("zandor.statementText(query, 7)", 'expected "Dialect"'),
+        ("widget.setQuestions(query)", "incompatible type"),
+        ("widget.setLibrary(None)", "incompatible type"),
+        ("zandor.HostEntry('a', 7)", "incompatible type"),
         ("for table in query.Tables: table.Name = 'a'", "read-only"),
     ],
 )

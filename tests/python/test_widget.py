@@ -247,10 +247,3 @@ def test_columns_of_a_model_in_python_are_marked_as_coming_out(application, boxe
     marked = [entries.index(row, 0).data(role) == "comes out" for row in range(4)]
     assert marked == [False, False, False, True]
     assert boxes.texts == []
-
-
-def test_a_library_is_needed(application):
-    with pytest.raises(TypeError):
-        zandor.ZandorWidget()
-    with pytest.raises(TypeError):
-        zandor.ZandorWidget(None)

@@ -39,11 +39,12 @@ public:
             return convert<Result>(result.get(), nameOf(name).c_str());
     }
 
-private:
+protected:
     std::string nameOf(const char* member) const {
         return std::string(Py_TYPE(object())->tp_name) + "." + member;
     }
 
+private:
     PyObject* const mObject;
 };
 

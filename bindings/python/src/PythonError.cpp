@@ -89,4 +89,10 @@ Object ofPackage(const char* module, const char* name) {
     return Object::take(PyObject_GetAttrString(found.get(), name));
 }
 
+bool isOfPackage(PyObject* object, const char* module, const char* name) {
+    const int result = PyObject_IsInstance(object, ofPackage(module, name).get());
+    if (result < 0) throwPythonError();
+    return result == 1;
+}
+
 } // namespace zandor::python

@@ -29,5 +29,7 @@ void setPythonError();
 
 /// A class or function of the package, by its module below `zandor` and its name.
 Object ofPackage(const char* module, const char* name);
+/// Whether an object is of a class of the package, or of one derived from it.
+bool isOfPackage(PyObject* object, const char* module, const char* name);
 
 } // namespace zandor::python

@@ -1,7 +1,9 @@
 #pragma once
 
+#include "PythonQuestions.h"
 #include "adapters.h"
 
+#include <Zandor/Library.h>
 #include <Zandor/ZandorWidget.h>
 
 #include <QVariant>
@@ -15,14 +17,21 @@ namespace zandor::python {
 class Widget : public ZandorWidget {
 public:
     explicit Widget(const LibraryRef& library, QWidget* parent = nullptr)
-        : ZandorWidget(*library, parent), mLibrary(library) {
+        : ZandorWidget(*library, parent), mEnd(std::make_shared<End>(library)) {
         // What such a property holds is the last of a QObject to go.
-        setProperty("zandorEnd", QVariant::fromValue(std::make_shared<End>(library)));
+        setProperty("zandorEnd", QVariant::fromValue(mEnd));
     }
+    /// With the ready-made library, for forms, which know of a parent only.
+    explicit Widget(QWidget* parent = nullptr)
+        : Widget(std::make_shared<model::Library>(), parent) {}
     ~Widget() override { Ending::begin(); }
 
+    void setLibrary(const LibraryRef& library);
+    void setQuestions(const QuestionsRef& questions);
+
     /// Shows Python's garbage collector the objects that only the control holds: the model and the
-    /// library, where they are written in Python. Each has an adapter of this widget's own.
+    /// library, where they are written in Python, and whom it asks. Each has an adapter of this
+    /// widget's own.
     int visit(visitproc visit, void* argument) const;
 
 private:
@@ -36,7 +45,8 @@ private:
         LibraryRef library;
     };
 
-    const LibraryRef mLibrary;
+    const std::shared_ptr<End> mEnd;
+    QuestionsRef mQuestions;
 };
 
 } // namespace zandor::python

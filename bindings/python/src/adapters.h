@@ -29,14 +29,18 @@ private:
     Object mObject;
 };
 
+/// A reference that holds an adapter and its object. Under the lock.
+template <class Adapter>
+std::shared_ptr<Adapter> kept(std::shared_ptr<Adapter> adapter) {
+    Adapter* const face = adapter.get();
+    return {std::make_shared<Kept>(std::move(adapter), Object::share(face->object())), face};
+}
+
 /// A reference to an object of Python as an interface. Under the lock.
 template <class Adapter, class Interface>
 std::shared_ptr<Interface> adapted(PyObject* object) {
-    auto adapter =
-        adapterOf(object, typeid(Adapter), [object] { return std::make_shared<Adapter>(object); });
-    auto* const face = static_cast<Adapter*>(adapter.get());
-    const auto kept = std::make_shared<Kept>(std::move(adapter), Object::share(object));
-    return std::shared_ptr<Interface>(kept, face);
+    return kept(std::static_pointer_cast<Adapter>(adapterOf(
+        object, typeid(Adapter), [object] { return std::make_shared<Adapter>(object); })));
 }
 
 /// While a widget is being destroyed no Python object is let go, for with one may go another, and

@@ -18,6 +18,8 @@ inline Object toPython(const platform::String& text) {
     return toPython(platform::StringView(text));
 }
 Object toPython(const char* text) = delete;
+/// What is one already.
+inline Object toPython(const Object& object) { return object; }
 Object toPython(bool value);
 Object toPython(std::int16_t value);
 Object toPython(std::int32_t value);
@@ -37,6 +39,10 @@ std::int32_t asNumber(PyObject* value, const char* what, std::int32_t least, std
 
 template <class T>
 struct Conversion;
+template <>
+struct Conversion<Object> {
+    static Object from(PyObject* value, const char*) { return Object::share(value); }
+};
 template <class T>
 struct Conversion<platform::Ref<T>> {
     static platform::Ref<T> from(PyObject* value, const char* what) {

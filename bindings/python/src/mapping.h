@@ -61,6 +61,9 @@ inline int receive(PyObject* object, files::Path** result, int* failed) {
 inline int receive(PyObject* object, LibraryRef** result, int* failed) {
     return receiveBy(object, result, failed, isLibrary, libraryOf);
 }
+inline int receive(PyObject* object, QuestionsRef** result, int* failed) {
+    return receiveBy(object, result, failed, asksNothingOrQuestions, questionsOf);
+}
 
 /// A collection as a part of what a wrapper is for. It then belongs to its wrapper.
 template <class List>

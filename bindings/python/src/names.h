@@ -7,6 +7,7 @@
 
 #include <Zandor/Library.h>
 #include <Zandor/QueryDocument.h>
+#include <Zandor/Questions.h>
 #include <Zandor/ZandorWidget.h>
 #include <Zandor/model/Criteria.h>
 #include <Zandor/model/Finding.h>

@@ -124,6 +124,29 @@ Object toPython(const model::sql::Text& statement, model::sql::Dialect dialect) 
                   toPython(statement.runnable()));
 }
 
+Object toPython(const TalvikDBxZandor::JoinEnd& end) {
+    return record("JoinEnd", toPython(end.Table), toPython(end.Column));
+}
+
+Object toPython(const TalvikDBxZandor::MenuPlace& place) {
+    return record("MenuPlace", record("MenuSource", toPython(place.Source)), toPython(place.Table),
+                  toPython(place.Column), toPython(place.Join), toPython(place.Definition),
+                  toPython(place.Row), toPython(place.X), toPython(place.Y));
+}
+
+std::vector<OfferedEntry> offeredEntries(PyObject* values) {
+    std::vector<OfferedEntry> entries;
+    forEach(values, [&entries](PyObject* value) {
+        const auto chosen = attribute<Object>(value, "Chosen");
+        if (chosen.get() != Py_None && !PyCallable_Check(chosen.get()))
+            throwTypeError("Chosen must be None or something to be called, not %s",
+                           Py_TYPE(chosen.get())->tp_name);
+        entries.push_back({attribute<platform::String>(value, "Caption"), chosen,
+                           attribute<bool>(value, "Enabled")});
+    });
+    return entries;
+}
+
 model::TableDescription tableDescription(PyObject* value) {
     model::TableDescription table;
     table.name = attribute<platform::String>(value, "name");

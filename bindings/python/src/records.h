@@ -3,6 +3,7 @@
 #include "Object.h"
 
 #include <Zandor/DatabaseReader.h>
+#include <Zandor/Questions.h>
 #include <Zandor/comforts/Field.h>
 #include <Zandor/model/Finding.h>
 #include <Zandor/platform/Words.h>
@@ -26,6 +27,18 @@ Object toPython(const reader::LeftOut& leftOut);
 Object toPython(const platform::Words& words);
 /// The bindings as values that the dialect's engine takes.
 Object toPython(const model::sql::Text& statement, model::sql::Dialect dialect);
+
+Object toPython(const TalvikDBxZandor::JoinEnd& end);
+Object toPython(const TalvikDBxZandor::MenuPlace& place);
+
+/// An entry for the control's menu.
+struct OfferedEntry {
+    platform::String caption;
+    Object chosen; ///< can be called, or is None
+    bool enabled = true;
+};
+/// Those of whatever can be iterated, each with the attributes of a HostEntry.
+std::vector<OfferedEntry> offeredEntries(PyObject* values);
 
 model::TableDescription tableDescription(PyObject* value);
 /// A name, or a schema and a name as a TableId has them.

@@ -117,8 +117,8 @@ bool wraps(PyObject* object) {
     return is(object, classOf<Class>());
 }
 
-bool isOfPackage(PyObject* object, const char* name) {
-    return is(object, ofPackage("TalvikZandorLib", name).get());
+bool isOfModel(PyObject* object, const char* name) {
+    return isOfPackage(object, "TalvikZandorLib", name);
 }
 
 /// What a wrapper is for.
@@ -147,7 +147,7 @@ template <class T>
 Ref<T> adaptedTo(PyObject* object) {
     using Facts = Interface<T>;
     if constexpr (requires { Facts::extension; })
-        if (isOfPackage(object, Facts::extension) ||
+        if (isOfModel(object, Facts::extension) ||
             isOfAny(object, static_cast<typename Facts::Own*>(nullptr)))
             return adapted<typename Facts::Extended, T>(object);
     return adapted<typename Facts::Adapter, T>(object);
@@ -189,7 +189,7 @@ bool refersTo(PyObject* object) {
     if (object == Py_None) return true;
     try {
         return isOfAny(object, static_cast<typename Interface<T>::Own*>(nullptr)) ||
-               isOfPackage(object, Interface<T>::name);
+               isOfModel(object, Interface<T>::name);
     } catch (const PythonError&) {
         return false; // SIP then says which argument it was
     }
@@ -253,7 +253,7 @@ std::shared_ptr<void> held(PyObject* wrapper) {
 
 bool isLibrary(PyObject* object) {
     try {
-        return is(object, classOf<model::Library>()) || isOfPackage(object, "Library");
+        return is(object, classOf<model::Library>()) || isOfModel(object, "Library");
     } catch (const PythonError&) {
         return false;
     }

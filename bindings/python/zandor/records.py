@@ -1,8 +1,10 @@
-"""Plain values that go between the program and the ready-made model."""
+"""Plain values that go between the program, the ready-made model and the widget."""
 
-from typing import Any, NamedTuple, Optional, Sequence, Tuple, Union
+from enum import IntEnum
+from typing import Any, Callable, NamedTuple, Optional, Sequence, Tuple, Union
 
 from zandor._zandor import ColumnType, FindingKind
+from zandor.TalvikZandorLib import ZDColumn, ZDColumnDefinition, ZDJoin, ZDTable
 
 
 class ColumnDescription(NamedTuple):
@@ -102,3 +104,50 @@ class Statement(NamedTuple):
     findings: Sequence[Finding]
     #: Whether the statement is there and says what was drawn.
     runnable: bool
+
+
+class JoinEnd(NamedTuple):
+    """A column of a table on the canvas: one end of a join."""
+
+    Table: ZDTable
+    Column: ZDColumn
+
+
+class MenuSource(IntEnum):
+    """What the menu opens over."""
+
+    #: Over a table's list.
+    Table = 0
+    #: Over the canvas beside them.
+    Canvas = 1
+    Grid = 2
+
+
+class MenuPlace(NamedTuple):
+    """Where the menu is about to open. What is not there is None."""
+
+    Source: MenuSource
+    #: Whose list it is.
+    Table: Optional[ZDTable] = None
+    #: Its first selected one.
+    Column: Optional[ZDColumn] = None
+    #: Whose line was hit.
+    Join: Optional[ZDJoin] = None
+    #: Of the grid's column.
+    Definition: Optional[ZDColumnDefinition] = None
+    #: Of the grid, from 0; -1 elsewhere.
+    Row: int = -1
+    #: On the canvas, in twips.
+    X: float = 0
+    Y: float = 0
+
+
+class HostEntry(NamedTuple):
+    """An entry of the program's in the widget's menu."""
+
+    #: "-" makes a separator; an ampersand marks the mnemonic.
+    Caption: str
+    #: Called without arguments when the menu has closed. An exception is shown in the control's box.
+    Chosen: Optional[Callable[[], object]] = None
+    #: Whether it can be chosen.
+    Enabled: bool = True
