@@ -3,6 +3,7 @@
 #include "PythonError.h"
 #include "conversions.h"
 #include "raise.h"
+#include "references.h"
 
 namespace zandor::python {
 
@@ -36,6 +37,33 @@ void save(const files::Path& path, const files::QueryDocument& document) {
 }
 
 files::QueryDocument load(const files::Path& path) { return valueOf(files::loadQuery(path)); }
+
+namespace {
+
+files::Path pathOrNone(PyObject* path) {
+    return path && path != Py_None ? pathOf(path) : files::Path();
+}
+
+Object listOfTexts(const std::vector<platform::String>& texts) {
+    const Object list = Object::take(PyList_New(0));
+    for (const platform::String& text : texts)
+        if (PyList_Append(list.get(), toPython(text).get()) != 0) throwPythonError();
+    return list;
+}
+
+} // namespace
+
+model::SavedQuery readSaved(const files::Path& path, PyObject* into) {
+    return valueOf(files::readSavedQuery(path, pathOrNone(into)));
+}
+
+Object readSavedAgain(PyObject* query, PyObject* into) {
+    const auto result = files::readSavedAgain(*queryOf(query), pathOrNone(into));
+    std::vector<platform::String> kept;
+    for (const files::Error& error : result.kept) kept.push_back(platform::fromUtf8(error.text()));
+    return Object::take(
+        PyTuple_Pack(2, listOfTexts(result.changed).get(), listOfTexts(kept).get()));
+}
 
 files::Path pathOf(PyObject* path) {
     PyObject* bytes = nullptr;

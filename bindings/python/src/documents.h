@@ -3,6 +3,7 @@
 #include "Object.h"
 
 #include <Zandor/QueryDocument.h>
+#include <Zandor/files/SavedQueries.h>
 #include <Zandor/sql/Dialect.h>
 
 /// Queries as files. What goes wrong is thrown as Python's zandor.FileError. Under the lock.
@@ -13,6 +14,11 @@ platform::String jsonOf(const files::QueryDocument& document);
 files::QueryDocument documentOf(PyObject* text);
 void save(const files::Path& path, const files::QueryDocument& document);
 files::QueryDocument load(const files::Path& path);
+
+/// `into` is a path, None or nothing.
+model::SavedQuery readSaved(const files::Path& path, PyObject* into);
+/// A tuple of two lists of str.
+Object readSavedAgain(PyObject* query, PyObject* into);
 
 /// Python's path as the system has it.
 files::Path pathOf(PyObject* path);

@@ -36,6 +36,7 @@ using zandor::model::Library;
 using zandor::model::OutputName;
 using zandor::model::Query;
 using zandor::model::RowCriterium;
+using zandor::model::SavedQuery;
 using zandor::model::Table;
 using zandor::model::Total;
 using zandor::model::sql::Dialect;
