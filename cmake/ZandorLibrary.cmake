@@ -57,9 +57,37 @@ function(zandor_library name)
         DEBUG_POSTFIX d
         OUTPUT_NAME Zandor${name}
         EXPORT_NAME ${name})
+    zandor_unite(${target})
 
     if(ZANDOR_INSTALL)
         zandor_install(${name} ${target} ${generated}
             HEADERS ${given_HEADERS} NEEDS ${given_NEEDS})
     endif()
+endfunction()
+
+# With ZANDOR_UNITY, as in a Release, the sources of a target that stand in one folder are compiled
+# together, up to sixteen at a time: most of the time goes into headers of Qt and of the standard
+# library. What is generated stays by itself. Debug compiles each source alone, and so finds what it
+# forgets to include.
+function(zandor_unite target)
+    if(NOT ZANDOR_UNITY)
+        return()
+    endif()
+    get_target_property(sources ${target} SOURCES)
+    get_target_property(folder ${target} SOURCE_DIR)
+    foreach(source IN LISTS sources)
+        cmake_path(ABSOLUTE_PATH source BASE_DIRECTORY ${folder} NORMALIZE)
+        cmake_path(IS_PREFIX PROJECT_BINARY_DIR ${source} generated)
+        if(generated OR NOT source MATCHES "[.]cpp$")
+            continue()
+        endif()
+        cmake_path(GET source PARENT_PATH house)
+        cmake_path(RELATIVE_PATH house BASE_DIRECTORY ${PROJECT_SOURCE_DIR})
+        string(MAKE_C_IDENTIFIER ${house} house)
+        math(EXPR part "0${count_${house}} / 16")
+        math(EXPR count_${house} "0${count_${house}} + 1")
+        set_source_files_properties(${source}
+            TARGET_DIRECTORY ${target} PROPERTIES UNITY_GROUP ${house}_${part})
+    endforeach()
+    set_target_properties(${target} PROPERTIES UNITY_BUILD ON UNITY_BUILD_MODE GROUP)
 endfunction()

@@ -11,7 +11,7 @@ namespace zandor::designer {
 
 namespace {
 
-constexpr int air = 10;           // logical pixels
+constexpr int aroundWords = 10;   // logical pixels
 constexpr int scrollBars = 20;    // below the cells and beside them
 constexpr double left = 0.42;     // leaves the first columns their cells and their list of fields
 constexpr int widestInWords = 60; // average characters
@@ -28,7 +28,7 @@ GridHint::GridHint(Document& document, DrawingArea& area)
     setTextFormat(Qt::PlainText);
     setWordWrap(true);
     setAlignment(Qt::AlignCenter);
-    setMargin(air);
+    setMargin(aroundWords);
     setFrameShape(QFrame::StyledPanel);
     setAutoFillBackground(true);
     setBackgroundRole(QPalette::Base);
@@ -59,7 +59,7 @@ void GridHint::place() {
     QRect cells(0, top, mArea.width() - scrollBars, mArea.height() - top - scrollBars);
     cells.setLeft(static_cast<int>(mArea.width() * left));
     const int width =
-        std::min(cells.width() - air, fontMetrics().averageCharWidth() * widestInWords);
+        std::min(cells.width() - aroundWords, fontMetrics().averageCharWidth() * widestInWords);
     QRect own(0, 0, width, std::min(heightForWidth(width), cells.height()));
     own.moveCenter(cells.center());
     setGeometry(own);

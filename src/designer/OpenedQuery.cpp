@@ -2,11 +2,10 @@
 
 #include "designer/ExampleQuery.h"
 #include "designer/tables/leftOutWords.h"
+#include "designer/tr.h"
 
 #include <Zandor/model/Names.h>
 #include <Zandor/reader/addTables.h>
-
-#include <QCoreApplication>
 
 namespace zandor::designer {
 
@@ -16,8 +15,6 @@ using reader::TableEntry;
 using reader::TableId;
 
 namespace {
-
-QString tr(const char* text) { return QCoreApplication::translate("zandor::designer", text); }
 
 Result<std::vector<TableId>> named(const QStringList& names, const std::vector<TableEntry>& present,
                                    const QString& file) {

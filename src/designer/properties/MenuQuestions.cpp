@@ -10,7 +10,7 @@ namespace zandor::designer {
 
 namespace {
 
-class Words {
+class MenuWords {
     Q_DECLARE_TR_FUNCTIONS(zandor::designer::MenuQuestions)
 };
 
@@ -23,7 +23,7 @@ MenuQuestions::MenuEntries(const TalvikDBxZandor::MenuPlace& place) {
     auto entries = mTotals.entries(definition);
     if (place.Source != TalvikDBxZandor::menuSource::grid) return entries;
     if (!entries.empty()) entries.push_back({u"-", {}});
-    entries.push_back({platform::qt::fromQt(Words::tr("C&olumn\u2026")), mShowColumn});
+    entries.push_back({platform::qt::fromQt(MenuWords::tr("C&olumn\u2026")), mShowColumn});
     return entries;
 }
 

@@ -13,7 +13,7 @@ namespace {
 
 constexpr int usualDecimals = 2;
 
-class Words {
+class FormatWords {
     Q_DECLARE_TR_FUNCTIONS(zandor::designer::Format)
 };
 
@@ -30,18 +30,18 @@ std::span<const CellFormat> offeredFormats() {
 
 QString nameOf(const CellFormat& offered) {
     switch (offered.format) {
-    case Format::None: return Words::tr("As it is");
+    case Format::None: return FormatWords::tr("As it is");
     case Format::Number:
-        return offered.decimals == 0 ? Words::tr("Whole number") : Words::tr("Decimals");
-    case Format::Thousands: return Words::tr("Thousands");
-    case Format::Percent: return Words::tr("Percent");
-    case Format::ShortDate: return Words::tr("Short date");
-    case Format::LongDate: return Words::tr("Long date");
-    case Format::DateAndTime: return Words::tr("Date and time");
-    case Format::IsoDate: return Words::tr("ISO date");
-    case Format::YearMonth: return Words::tr("Year and month");
-    case Format::Weekday: return Words::tr("Weekday");
-    case Format::Time: return Words::tr("Time");
+        return offered.decimals == 0 ? FormatWords::tr("Whole number") : FormatWords::tr("Decimals");
+    case Format::Thousands: return FormatWords::tr("Thousands");
+    case Format::Percent: return FormatWords::tr("Percent");
+    case Format::ShortDate: return FormatWords::tr("Short date");
+    case Format::LongDate: return FormatWords::tr("Long date");
+    case Format::DateAndTime: return FormatWords::tr("Date and time");
+    case Format::IsoDate: return FormatWords::tr("ISO date");
+    case Format::YearMonth: return FormatWords::tr("Year and month");
+    case Format::Weekday: return FormatWords::tr("Weekday");
+    case Format::Time: return FormatWords::tr("Time");
     }
     return {};
 }

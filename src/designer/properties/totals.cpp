@@ -8,7 +8,7 @@ using model::Total;
 
 namespace {
 
-class Words {
+class TotalWords {
     Q_DECLARE_TR_FUNCTIONS(zandor::designer::Total)
 };
 
@@ -23,15 +23,15 @@ std::span<const Total> allTotals() {
 
 QString nameOf(Total total) {
     switch (total) {
-    case Total::None: return Words::tr("&No total");
-    case Total::Group: return Words::tr("&Group by it");
-    case Total::Count: return Words::tr("&Count");
-    case Total::CountDifferent: return Words::tr("Count &different values");
-    case Total::Sum: return Words::tr("&Sum");
-    case Total::Average: return Words::tr("&Average");
-    case Total::Smallest: return Words::tr("S&mallest");
-    case Total::Largest: return Words::tr("&Largest");
-    case Total::Condition: return Words::tr("C&riteria only");
+    case Total::None: return TotalWords::tr("&No total");
+    case Total::Group: return TotalWords::tr("&Group by it");
+    case Total::Count: return TotalWords::tr("&Count");
+    case Total::CountDifferent: return TotalWords::tr("Count &different values");
+    case Total::Sum: return TotalWords::tr("&Sum");
+    case Total::Average: return TotalWords::tr("&Average");
+    case Total::Smallest: return TotalWords::tr("S&mallest");
+    case Total::Largest: return TotalWords::tr("&Largest");
+    case Total::Condition: return TotalWords::tr("C&riteria only");
     }
     return {};
 }

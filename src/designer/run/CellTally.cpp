@@ -8,7 +8,7 @@ namespace zandor::designer {
 
 namespace {
 
-class Words {
+class TallyWords {
     Q_DECLARE_TR_FUNCTIONS(zandor::designer::CellTally)
 };
 
@@ -33,14 +33,14 @@ void CellTally::add(const Cell& cell, const CellFormat& format) {
 
 QString CellTally::inWords() const {
     const auto count = [](qint64 value) { return QLocale().toString(value); };
-    QStringList parts{Words::tr("Cells: %1").arg(count(mCells))};
-    if (mEmpty > 0) parts << Words::tr("Empty: %1").arg(count(mEmpty));
+    QStringList parts{TallyWords::tr("Cells: %1").arg(count(mCells))};
+    if (mEmpty > 0) parts << TallyWords::tr("Empty: %1").arg(count(mEmpty));
     if (mNumbers > 0) {
-        if (mNumbers + mEmpty < mCells) parts << Words::tr("Numbers: %1").arg(count(mNumbers));
-        parts << Words::tr("Sum: %1").arg(shown(sum(), mFormat))
-              << Words::tr("Average: %1").arg(shown(average(), mFormat))
-              << Words::tr("Smallest: %1").arg(shown(mSmallest, mFormat))
-              << Words::tr("Largest: %1").arg(shown(mLargest, mFormat));
+        if (mNumbers + mEmpty < mCells) parts << TallyWords::tr("Numbers: %1").arg(count(mNumbers));
+        parts << TallyWords::tr("Sum: %1").arg(shown(sum(), mFormat))
+              << TallyWords::tr("Average: %1").arg(shown(average(), mFormat))
+              << TallyWords::tr("Smallest: %1").arg(shown(mSmallest, mFormat))
+              << TallyWords::tr("Largest: %1").arg(shown(mLargest, mFormat));
     }
     return parts.join(QStringLiteral(" \u00b7 "));
 }

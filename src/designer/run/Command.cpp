@@ -38,24 +38,25 @@ std::optional<QVariant> answerValue(const Parameter& parameter, const QString& t
     return reader::bindValue(*value, dialect);
 }
 
-class Words {
+class QuestionWords {
     Q_DECLARE_TR_FUNCTIONS(zandor::designer::Question)
 };
 
 QString wanted(const Parameter& use) {
-    if (use.pattern) return Words::tr("a pattern: * for any characters, ? for one");
+    if (use.pattern) return QuestionWords::tr("a pattern: * for any characters, ? for one");
     switch (use.type) {
     case ColumnType::Text:
-    case ColumnType::Blob: return Words::tr("a text");
+    case ColumnType::Blob: return QuestionWords::tr("a text");
     case ColumnType::Integer:
-    case ColumnType::Decimal: return Words::tr("a number");
-    case ColumnType::Date: return Words::tr("a date such as 2024-12-31");
-    case ColumnType::Time: return Words::tr("a time such as 23:59");
-    case ColumnType::Timestamp: return Words::tr("a date and time such as 2024-12-31 23:59");
-    case ColumnType::Boolean: return Words::tr("true or false");
+    case ColumnType::Decimal: return QuestionWords::tr("a number");
+    case ColumnType::Date: return QuestionWords::tr("a date such as 2024-12-31");
+    case ColumnType::Time: return QuestionWords::tr("a time such as 23:59");
+    case ColumnType::Timestamp:
+        return QuestionWords::tr("a date and time such as 2024-12-31 23:59");
+    case ColumnType::Boolean: return QuestionWords::tr("true or false");
     case ColumnType::Unknown: break;
     }
-    return Words::tr("a value");
+    return QuestionWords::tr("a value");
 }
 
 } // namespace

@@ -13,7 +13,7 @@ namespace zandor::designer {
 namespace {
 
 constexpr int stepsBetweenQuestions = 1000; // some microseconds
-constexpr std::chrono::milliseconds betweenLooks(50);
+constexpr std::chrono::milliseconds betweenQuestions(50);
 
 /// What stops a statement of this connection when said over another, or nothing.
 QString killing(const QSqlDatabase& database) {
@@ -78,14 +78,14 @@ void EngineStop::watch(const Connector& another, const QString& killing) {
     std::unique_lock lock(mMutex);
     while (!mEnded) {
         // The flag may be set by a signal, which can wake nobody; so one looks now and then.
-        mChange.wait_for(lock, betweenLooks, [this] { return mEnded || mStopped; });
+        mChange.wait_for(lock, betweenQuestions, [this] { return mEnded || mStopped; });
         if (mEnded || !isWished()) continue;
         lock.unlock();
         if (!connection)
             if (auto made = another()) connection = std::move(*made);
         if (connection) QSqlQuery(connection->database()).exec(killing);
         lock.lock();
-        if (!mEnded) mChange.wait_for(lock, betweenLooks, [this] { return mEnded; });
+        if (!mEnded) mChange.wait_for(lock, betweenQuestions, [this] { return mEnded; });
     }
 }
 

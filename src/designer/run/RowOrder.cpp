@@ -16,10 +16,10 @@ namespace {
 constexpr qint64 mostBytes = 4000;        // of a cell
 constexpr qsizetype mostCharacters = 200; // of a text; beyond it two are alike
 
-enum Rank : quint8 { nothing, number, notANumber, boolean, text, blob };
+enum class Rank : quint8 { nothing, number, notANumber, boolean, text, blob };
 
 struct Key {
-    Rank rank = nothing;
+    Rank rank = Rank::nothing;
     /// As exact as the whole numbers of an engine are; of a text its place in the list of texts.
     long double value = 0;
 };
@@ -41,19 +41,20 @@ public:
         switch (cell.kind) {
         case Cell::Kind::null: mKeys.push_back({}); break;
         case Cell::Kind::boolean:
-            mKeys.push_back({boolean, cell.text == QLatin1String("true") ? 1.0L : 0.0L});
+            mKeys.push_back({Rank::boolean, cell.text == QLatin1String("true") ? 1.0L : 0.0L});
             break;
         case Cell::Kind::blob:
-            mKeys.push_back({blob, static_cast<long double>(cell.text.toLongLong())});
+            mKeys.push_back({Rank::blob, static_cast<long double>(cell.text.toLongLong())});
             break;
         case Cell::Kind::number:
             if (const auto value = numberIn(cell.text)) {
-                mKeys.push_back(std::isnan(*value) ? Key{notANumber} : Key{number, *value});
+                mKeys.push_back(std::isnan(*value) ? Key{Rank::notANumber}
+                                                   : Key{Rank::number, *value});
                 break;
             }
             [[fallthrough]];
         case Cell::Kind::text:
-            mKeys.push_back({text, static_cast<long double>(mTexts.size())});
+            mKeys.push_back({Rank::text, static_cast<long double>(mTexts.size())});
             mTexts.push_back(mCollator.sortKey(cell.text.left(mostCharacters)));
             break;
         }
@@ -74,7 +75,7 @@ public:
 private:
     bool less(const Key& a, const Key& b) const {
         if (a.rank != b.rank) return a.rank < b.rank;
-        if (a.rank != text) return a.value < b.value;
+        if (a.rank != Rank::text) return a.value < b.value;
         return mTexts[static_cast<std::size_t>(a.value)].compare(
                    mTexts[static_cast<std::size_t>(b.value)]) < 0;
     }

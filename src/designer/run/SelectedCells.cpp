@@ -9,7 +9,7 @@ namespace zandor::designer {
 
 namespace {
 
-constexpr qint64 mostBytes = 4000; // longer numbers there are none
+constexpr qint64 mostBytesOfANumber = 4000; // longer numbers there are none
 
 } // namespace
 
@@ -43,7 +43,7 @@ void SelectedCells::goOn(const QDeadlineTimer& until) {
                 std::min<std::size_t>(part.rows.size(), first + Spool::rowsInAPage);
             for (std::size_t row = first; row < end; ++row) {
                 if (!part.rows[row]) continue;
-                if (!std::exchange(isRead, true)) rows = mSpool->page(page, mostBytes);
+                if (!std::exchange(isRead, true)) rows = mSpool->page(page, mostBytesOfANumber);
                 if (row - first >= rows.size()) break;
                 for (auto column = static_cast<std::size_t>(part.left);
                      column <= static_cast<std::size_t>(part.right); ++column)

@@ -20,7 +20,7 @@ namespace zandor::designer {
 namespace {
 
 constexpr qsizetype mostPending = 1 << 18;
-constexpr qint64 betweenLooks = 1 << 26;
+constexpr qint64 bytesBetweenLooks = 1 << 26;
 constexpr qint64 roomLeftToOthers = 1 << 28;
 
 void append(QByteArray& bytes, const Cell& cell) {
@@ -179,7 +179,7 @@ std::vector<Row> Spool::page(qint64 number, qint64 mostBytes) {
 std::optional<QString> Spool::flush() {
     if (mFailure || mPending.isEmpty()) return mFailure;
     if (mEnd >= mNextLook) {
-        mNextLook = mEnd + betweenLooks;
+        mNextLook = mEnd + bytesBetweenLooks;
         if (QStorageInfo(spoolFolder()).bytesAvailable() < roomLeftToOthers)
             mFailure = QCoreApplication::translate(
                            "zandor::designer::Spool",

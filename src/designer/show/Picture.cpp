@@ -7,12 +7,6 @@
 
 namespace zandor::designer {
 
-namespace {
-
-constexpr int pixelsPerInch = 96; // of logical pixels
-
-} // namespace
-
 QImage Picture::image(qreal scale) const {
     QImage result(size() * scale, QImage::Format_ARGB32_Premultiplied);
     if (result.isNull()) return result;

@@ -12,6 +12,8 @@ namespace zandor::designer {
 /// What can be taken out of the window: into a file, onto a page, to the clipboard.
 class Picture {
 public:
+    static constexpr int pixelsPerInch = 96; ///< of logical pixels
+
     virtual ~Picture() = default;
 
     bool isEmpty() const { return size().isEmpty(); }

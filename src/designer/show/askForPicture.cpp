@@ -3,21 +3,15 @@
 #include "designer/PlainBox.h"
 #include "designer/show/Picture.h"
 #include "designer/show/savePicture.h"
+#include "designer/tr.h"
 
 #include <QClipboard>
-#include <QCoreApplication>
 #include <QDir>
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QGuiApplication>
 
 namespace zandor::designer {
-
-namespace {
-
-QString tr(const char* text) { return QCoreApplication::translate("zandor::designer", text); }
-
-} // namespace
 
 void askForPicture(QWidget* window, const QString& title, const QString& proposed,
                    const Picture& picture) {

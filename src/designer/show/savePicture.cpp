@@ -3,11 +3,11 @@
 #include "designer/document/paths.h"
 #include "designer/show/Picture.h"
 #include "designer/statement/ModelWords.h"
+#include "designer/tr.h"
 
 #include <Zandor/files/Replacement.h>
 
 #include <QBuffer>
-#include <QCoreApplication>
 #include <QFileInfo>
 #include <QImage>
 #include <QPageSize>
@@ -20,10 +20,7 @@ namespace zandor::designer {
 namespace {
 
 constexpr qreal pngScale = 2;
-constexpr int pixelsPerInch = 96; // of a logical pixel
-constexpr qreal pointsPerPixel = 72.0 / pixelsPerInch;
-
-QString tr(const char* text) { return QCoreApplication::translate("zandor::designer", text); }
+constexpr qreal pointsPerPixel = 72.0 / Picture::pixelsPerInch;
 
 bool writePng(const Picture& picture, QIODevice& file) {
     return picture.image(pngScale).save(&file, "PNG");
@@ -33,7 +30,7 @@ bool writeSvg(const Picture& picture, QIODevice& file) { return file.write(pictu
 
 bool writePdf(const Picture& picture, QIODevice& file) {
     QPdfWriter writer(&file);
-    writer.setResolution(pixelsPerInch);
+    writer.setResolution(Picture::pixelsPerInch);
     writer.setPageSize(QPageSize(QSizeF(picture.size()) * pointsPerPixel, QPageSize::Point, {},
                                  QPageSize::ExactMatch));
     writer.setPageMargins({});
@@ -71,7 +68,7 @@ std::optional<QString> printPicture(const Picture& picture, QPrinter& printer) {
     QPainter painter;
     if (!painter.begin(&printer)) return tr("The printer cannot be reached; choose another one.");
     const QRectF page(0, 0, printer.width(), printer.height());
-    const QSizeF natural = QSizeF(picture.size()) * printer.resolution() / pixelsPerInch;
+    const QSizeF natural = QSizeF(picture.size()) * printer.resolution() / Picture::pixelsPerInch;
     // At the top, where a reader begins.
     const QSizeF fitted = natural.width() > page.width() || natural.height() > page.height()
                               ? natural.scaled(page.size(), Qt::KeepAspectRatio)

@@ -8,7 +8,7 @@ namespace zandor::designer {
 
 namespace {
 
-using Tables = platform::Each<TalvikZandorLib::ZDTable>;
+using TablesOfQuery = platform::Each<TalvikZandorLib::ZDTable>;
 
 QPoint placeOf(const TalvikZandorLib::ZDTable& table) { return {table.Left(), table.Top()}; }
 
@@ -19,7 +19,7 @@ OwnPlaces::OwnPlaces(Document& document, QObject* parent) : QObject(parent), mDo
 }
 
 bool OwnPlaces::areAll() const {
-    for (const auto& table : Tables(mDocument.query()->Tables())) {
+    for (const auto& table : TablesOfQuery(mDocument.query()->Tables())) {
         const auto known = mPlaces.find(table->Key());
         if (known == mPlaces.end()) return false;
         const auto& places = known->second;
@@ -29,7 +29,7 @@ bool OwnPlaces::areAll() const {
 }
 
 void OwnPlaces::note() {
-    for (const auto& table : Tables(mDocument.query()->Tables()))
+    for (const auto& table : TablesOfQuery(mDocument.query()->Tables()))
         mPlaces[table->Key()].push_back(placeOf(*table));
 }
 

@@ -3,6 +3,8 @@
 #include "designer/tables/tableMime.h"
 #include "frontends/qt/ShownText.h"
 
+#include <Zandor/qt/Text.h>
+
 #include <QMimeData>
 
 #include <algorithm>
@@ -10,12 +12,7 @@
 namespace zandor::designer {
 
 using platform::qt::asSigns;
-
-namespace {
-
-QString qtText(const platform::String& text) { return QString::fromStdU16String(text); }
-
-} // namespace
+using platform::qt::toQt;
 
 TableListModel::TableListModel(QObject* parent) : QAbstractListModel(parent) {}
 
@@ -24,8 +21,8 @@ void TableListModel::setTables(const std::vector<reader::TableEntry>& tables) {
     mEntries.clear();
     mEntries.reserve(tables.size());
     for (const auto& table : tables) {
-        const QString schema = qtText(table.id.schema).toCaseFolded();
-        const QString name = qtText(table.id.name).toCaseFolded();
+        const QString schema = toQt(table.id.schema).toCaseFolded();
+        const QString name = toQt(table.id.name).toCaseFolded();
         const bool usual = schema.isEmpty();
         mEntries.push_back({table, usual ? name : schema + u'.' + name, //
                             usual ? 0 : schema.size() + 1});
@@ -68,13 +65,13 @@ QVariant TableListModel::data(const QModelIndex& index, int role) const {
     if (!checkIndex(index, CheckIndexOption::IndexIsValid)) return {};
     const reader::TableEntry& table = entry(index.row());
     switch (role) {
-    case Qt::DisplayRole: return asSigns(qtText(table.id.name));
-    case SchemaRole: return asSigns(qtText(table.id.schema));
+    case Qt::DisplayRole: return asSigns(toQt(table.id.name));
+    case SchemaRole: return asSigns(toQt(table.id.schema));
     case IsViewRole: return table.isView;
     case Qt::AccessibleTextRole: {
         const QString name = table.id.schema.empty()
-                                 ? qtText(table.id.name)
-                                 : qtText(table.id.schema) + u'.' + qtText(table.id.name);
+                                 ? toQt(table.id.name)
+                                 : toQt(table.id.schema) + u'.' + toQt(table.id.name);
         return table.isView ? tr("%1, view").arg(asSigns(name))
                             : tr("%1, table").arg(asSigns(name));
     }

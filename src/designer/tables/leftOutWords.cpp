@@ -1,5 +1,7 @@
 #include "designer/tables/leftOutWords.h"
 
+#include <Zandor/qt/Text.h>
+
 #include <QCoreApplication>
 #include <QStringList>
 
@@ -7,13 +9,13 @@
 
 namespace zandor::designer {
 
-namespace {
+using platform::qt::toQt;
 
-QString qtText(const platform::String& text) { return QString::fromStdU16String(text); }
+namespace {
 
 /// "trips.from"; of a key with several columns the first is enough to know it by.
 QString nameOf(const reader::ForeignKey& key) {
-    return qtText(key.child.name) + u'.' + qtText(key.columns.front().first);
+    return toQt(key.child.name) + u'.' + toQt(key.columns.front().first);
 }
 
 } // namespace
@@ -32,7 +34,7 @@ QString leftOutWords(const std::vector<reader::LeftOut>& leftOut) {
                          "zandor::designer::TableAdding",
                          "%1 and %2 are joined by %3. Not joined by %4: draw those yourself if you "
                          "need them.")
-                         .arg(qtText(drawn.child.name), qtText(drawn.parent.name), nameOf(drawn),
+                         .arg(toQt(drawn.child.name), toQt(drawn.parent.name), nameOf(drawn),
                               others.join(QStringLiteral(", ")));
     }
     return sentences.join(u' ').simplified();

@@ -23,7 +23,7 @@ namespace {
 constexpr int mostRows = 12;
 constexpr int fewestRows = 4;
 constexpr QSize widths(220, 420); // least and most, logical pixels
-constexpr int border = 2;
+constexpr int frame = 2;
 
 /// The items that hold every word typed, in whatever order and case.
 class Filter : public QSortFilterProxyModel {
@@ -67,7 +67,7 @@ PickListWidget::PickListWidget(QWidget* parent, Picked picked)
     mList->setFocusPolicy(Qt::NoFocus); // the keys stay with the box
     setFocusProxy(mBox);
     auto* const layout = new QVBoxLayout(this);
-    layout->setContentsMargins(border, border, border, border);
+    layout->setContentsMargins(frame, frame, frame, frame);
     layout->setSpacing(0);
     layout->addWidget(mBox);
     layout->addWidget(mList, 1);
@@ -108,13 +108,13 @@ void PickListWidget::stand(const QRect& over) {
     const int row =
         mList->sizeHintForRow(0) > 0 ? mList->sizeHintForRow(0) : fontMetrics().height();
     const int box = mBox->sizeHint().height();
-    const auto height = [&](int rows) { return box + rows * row + 2 * border; };
+    const auto height = [&](int rows) { return box + rows * row + 2 * frame; };
     const int room = parentWidget()->height() - over.top();
     const int most = std::min<int>(mostRows, std::max(1, mItems->rowCount()));
     const int rows =
         std::clamp((room - height(0)) / std::max(1, row), std::min(fewestRows, most), most);
     const int wanted = mList->sizeHintForColumn(0) +
-                       mList->verticalScrollBar()->sizeHint().width() + 2 * border + 8;
+                       mList->verticalScrollBar()->sizeHint().width() + 2 * frame + 8;
     const int width = std::max(over.width(), std::clamp(wanted, widths.width(), widths.height()));
     const int left = std::clamp(over.left(), 0, std::max(0, parentWidget()->width() - width));
     const int top = std::clamp(over.top(), 0, std::max(0, parentWidget()->height() - height(rows)));

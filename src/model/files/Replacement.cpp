@@ -26,7 +26,7 @@ Path nameBeside(const Path& path) {
 
 /// Where a link leads to, also when nothing is there yet; the path itself when it is none. A link
 /// that leads to itself stays one.
-Path resolved(const Path& path) {
+Path targetOf(const Path& path) {
     std::error_code none;
     const Path target = std::filesystem::canonical(path, none);
     if (!none) return target;
@@ -46,7 +46,7 @@ bool isOnDisk(int file) { return ::fsync(file) == 0 || errno == EINVAL; }
 
 } // namespace
 
-Replacement::Replacement(const Path& path) : mPath(path), mTarget(resolved(path)) {}
+Replacement::Replacement(const Path& path) : mPath(path), mTarget(targetOf(path)) {}
 
 Replacement::~Replacement() {
     if (!mBeside.empty()) ::unlink(mBeside.c_str());

@@ -25,14 +25,14 @@ private:
 /// A table's schema, empty when a statement finds the table without being told: when it is in the
 /// default schema and the engine, which searches its own first, has none of that name. The engine's
 /// function for that looks up every table by itself, which takes several times as long.
-const QString schemaColumn = QStringLiteral(
+const QString toldSchema = QStringLiteral(
     "CASE WHEN %1.nspname = (SELECT current_schema()) AND NOT EXISTS (SELECT FROM "
     "pg_catalog.pg_class hides WHERE hides.relnamespace = 'pg_catalog'::regnamespace "
     "AND hides.relname = %2.relname) THEN '' ELSE %1.nspname END");
 
 /// The table that an id names; two parameters, schema and name. Not to_regclass, which reads the
 /// name as SQL does.
-const QString named =
+const QString isNamed =
     QStringLiteral("n.nspname = coalesce(nullif(?, ''), current_schema()) AND c.relname = ?");
 
 /// What a column's type means. `base` is the declared type or, of a domain, the one it is made
@@ -89,7 +89,7 @@ Result<std::vector<TableEntry>> PostgresReader::tables() {
                        "WHERE c.relkind IN ('r', 'p', 'f', 'v', 'm') AND NOT c.relispartition "
                        "AND n.nspname <> 'information_schema' AND n.nspname NOT LIKE 'pg\\_%' "
                        "ORDER BY lower(c.relname), c.relname, n.nspname")
-            .arg(schemaColumn.arg(QStringLiteral("n"), QStringLiteral("c"))),
+            .arg(toldSchema.arg(QStringLiteral("n"), QStringLiteral("c"))),
         {}, [&](const QSqlQuery& row) {
             entries.push_back({{textAt(row, 0), textAt(row, 1)}, row.value(2).toBool()});
         });
@@ -120,7 +120,7 @@ Result<model::TableDescription> PostgresReader::table(const TableId& id) {
             "FROM chain JOIN pg_catalog.pg_type t ON t.oid = chain.typbasetype) "
             "SELECT * FROM chain WHERE typbasetype = 0) base ON true "
             "WHERE c.relkind IN ('r', 'p', 'f', 'v', 'm') AND %1 ORDER BY a.attnum")
-            .arg(named),
+            .arg(isNamed),
         {toQt(id.schema), toQt(id.name)}, [&](const QSqlQuery& row) {
             found = true;
             if (row.isNull(0)) return;
@@ -156,7 +156,7 @@ Result<std::vector<ForeignKey>> PostgresReader::foreignKeys(const TableId& child
                        "WHERE k.contype = 'f' AND %1 "
                        "AND origin.conrelid IS DISTINCT FROM k.conrelid "
                        "ORDER BY k.oid, pair.position")
-            .arg(named, schemaColumn.arg(QStringLiteral("pn"), QStringLiteral("p"))),
+            .arg(isNamed, toldSchema.arg(QStringLiteral("pn"), QStringLiteral("p"))),
         {toQt(child.schema), toQt(child.name)}, [&](const QSqlQuery& row) {
             if (row.value(0).toInt() == 1)
                 keys.push_back({child, {textAt(row, 1), textAt(row, 2)}, {}});

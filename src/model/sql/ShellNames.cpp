@@ -10,26 +10,26 @@ namespace zandor::model::sql {
 
 namespace {
 
-bool isDigit(char16_t c) { return c >= u'0' && c <= u'9'; }
+bool isFigure(char16_t c) { return c >= u'0' && c <= u'9'; }
 
 /// A name in letters, digits and single `_`.
 String simplified(StringView name) {
     String out;
     for (const char16_t c : name) {
-        if (isLetter(c) || isDigit(c))
+        if (isLetter(c) || isFigure(c))
             out += c;
         else if (!out.empty() && out.back() != u'_')
             out += u'_';
     }
     while (!out.empty() && out.back() == u'_') out.pop_back();
     if (out.empty()) return u"parameter";
-    return isDigit(out.front()) ? u"parameter_" + out : out;
+    return isFigure(out.front()) ? u"parameter_" + out : out;
 }
 
 bool isSimple(StringView name) {
-    return !name.empty() && !isDigit(name.front()) &&
+    return !name.empty() && !isFigure(name.front()) &&
            std::all_of(name.begin(), name.end(),
-                       [](char16_t c) { return isLetter(c) || isDigit(c) || c == u'_'; });
+                       [](char16_t c) { return isLetter(c) || isFigure(c) || c == u'_'; });
 }
 
 /// What stands for `?` in a dialect's placeholder.
