@@ -26,6 +26,7 @@ void Zandor::ReadOnly(bool value) {
         // What the user holds is let go where it was.
         const std::vector shown(lstTable.begin(), lstTable.end());
         for (const auto& [index, table] : shown) {
+            mLife.check();
             table->Locked(value);
             if (value) table->Drag(0);
         }

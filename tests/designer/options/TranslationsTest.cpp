@@ -144,8 +144,9 @@ TEST(TheTranslations, KnowWhatTheSourcesSay) {
     const QString said = QString::fromUtf8(lupdate.readAll());
     for (auto all = lost.globalMatch(said); all.hasNext();) {
         const auto one = all.next();
-        EXPECT_TRUE(
-            contentOf(one.captured(1)).contains("translate(\"" + one.captured(2).toUtf8() + '"'))
+        const QByteArray source = contentOf(one.captured(1));
+        EXPECT_TRUE(source.contains("translate(\"" + one.captured(2).toUtf8() + '"') ||
+                    source.contains("#include \"designer/tr.h\"")) // which looks for it there
             << one.captured().toStdString();
     }
 }
