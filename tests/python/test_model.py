@@ -206,12 +206,13 @@ def test_output_columns_say_how_they_are_shown(query):
     definition = zandor.ColumnDefinition()
     definition.Column = query.Tables.Item(2).Columns.Item(4)
     query.AddColumnDefinition(definition)
-    assert (definition.format, definition.decimals) == (zandor.Format.Nothing, -1)
-    definition.format, definition.decimals = zandor.Format.Thousands, 2
-    again = zandor.fromJson(zandor.toJson(zandor.QueryDocument(query))).query.ColumnDefinitions.Item(1)
-    assert (again.format, again.decimals) == (zandor.Format.Thousands, 2)
+    assert (definition.valueFormat, definition.decimals) == (zandor.Format.Nothing, -1)
+    definition.valueFormat, definition.decimals = zandor.Format.Thousands, 2
+    loaded = zandor.fromJson(zandor.toJson(zandor.QueryDocument(query))).query
+    again = loaded.ColumnDefinitions.Item(loaded.ColumnDefinitions.Count)
+    assert (again.valueFormat, again.decimals) == (zandor.Format.Thousands, 2)
     with pytest.raises(TypeError):
-        definition.format = 9
+        definition.valueFormat = 9
     with pytest.raises(zandor.NumberedError) as raised:
         definition.decimals = 16
     assert (raised.value.number, definition.decimals) == (380, 2)

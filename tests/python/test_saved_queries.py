@@ -22,7 +22,8 @@ def inner():
 def outputs(query, *names):
     for table, column in (name.split(".") for name in names):
         definition = zandor.ColumnDefinition()
-        definition.Column = query.tableNamed(table).columnNamed(column)
+        columns = {each.Name: each for each in query.tableNamed(table).Columns}
+        definition.Column = columns[column]
         query.AddColumnDefinition(definition)
 
 
