@@ -15,7 +15,10 @@ namespace {
 
 QString words(const QSqlError& error) {
     const QString said = error.databaseText().trimmed();
-    return said.isEmpty() ? error.driverText().trimmed() : said;
+    if (said.isEmpty()) return error.driverText().trimmed();
+    // A server that another one reads from is gone: what follows is for those who run it.
+    const bool connection = error.nativeErrorCode().startsWith(QLatin1String("08"));
+    return connection ? said.section(u'\n', 0, 0) : said;
 }
 
 bool send(QSqlQuery& query, const QSqlDatabase& database, const Command& command) {
