@@ -30,6 +30,10 @@ TEST(RandomTotals, AreOnAllEnginesWhatTheyAreWithoutSql) {
     int withRows = 0;
     for (std::uint32_t n = 0; n < howMany; ++n) {
         const auto query = random.next();
+        // Of unsorted rows the first ones are any, so that of some queries a number is asked for.
+        if (n % 5 == 0)
+            query->options({.distinct = query->options().distinct,
+                            .first = static_cast<std::int32_t>(1 + n % 7)});
         const auto built = model::sql::build(*query);
         for (const auto& finding : built.findings) ++findings[finding.kind];
         for (const Dialect dialect : smallEngines().dialects()) {
@@ -44,7 +48,14 @@ TEST(RandomTotals, AreOnAllEnginesWhatTheyAreWithoutSql) {
             if (everything) break;
             const Outcome outcome = smallEngines().run(dialect, text);
             ASSERT_EQ(outcome.error.toStdString(), "") << corpus::nameOf(dialect);
-            const Rows expected = sorted(evaluator.rows(*built.statement));
+            Rows expected = sorted(evaluator.rows(*built.statement));
+            if (const auto first = built.statement->limit) {
+                ASSERT_EQ(outcome.rows.size(), std::min<qsizetype>(*first, expected.size()))
+                    << corpus::nameOf(dialect);
+                for (const QString& row : outcome.rows)
+                    ASSERT_TRUE(expected.removeOne(row)) << row.toStdString();
+                expected = sorted(outcome.rows);
+            }
             ASSERT_EQ(sorted(outcome.rows).join(u'\n').toStdString(),
                       expected.join(u'\n').toStdString())
                 << corpus::nameOf(dialect);
