@@ -154,6 +154,16 @@ TEST_F(ASavedQuery, IsReadAgainWithWhatHangsOnIt) {
     EXPECT_EQ(paid->savedQuery()->record, changed->record());
 }
 
+TEST_F(ASavedQuery, IsAskedAboutWithoutAChange) {
+    output(small.orders->columnNamed(u"id"));
+    first()->AddCriterium(u"> paid.id", u"4"); // nobody knows yet which column that is
+    const auto before = query.record();
+    EXPECT_FALSE(query.refusalOf(*paid, saved(inner)));
+    inner->ColumnDefinitions().Remove(inner->ColumnDefinitions().Item(1)->Key());
+    EXPECT_TRUE(query.refusalOf(*paid, saved(inner)));
+    EXPECT_EQ(query.record(), before);
+}
+
 TEST_F(ASavedQuery, ThatIsNoneIsNotReadAgain) {
     SmallQuery other;
     const auto foreign = other.query->addQuery(u"paid", saved(inner));

@@ -115,15 +115,7 @@ model::ColumnType typeOf(const model::ColumnDefinition& definition) {
 }
 
 model::ColumnType outputTypeOf(const model::ColumnDefinition& definition) {
-    switch (definition.total()) {
-    case model::Total::Count:
-    case model::Total::CountDifferent: return model::ColumnType::Integer;
-    case model::Total::Average: return model::ColumnType::Decimal;
-    case model::Total::Sum:
-        return typeOf(definition) == model::ColumnType::Integer ? model::ColumnType::Integer
-                                                                : model::ColumnType::Decimal;
-    default: return typeOf(definition);
-    }
+    return model::typeOf(definition.total(), typeOf(definition));
 }
 
 } // namespace zandor::designer

@@ -6,7 +6,7 @@ namespace zandor::designer {
 
 bool isOfSeveral(const model::ColumnDefinition& definition) {
     const auto column = definition.place().column();
-    return column && column->Name() == model::Column::allColumns &&
+    return column && definition.place().table().table()->isAllColumns(*column) &&
            !model::aggregates(definition.total());
 }
 
@@ -15,7 +15,7 @@ ColumnFormats::ColumnFormats(model::Query& query) {
     for (const auto& each :
          platform::Each<TalvikZandorLib::ZDColumnDefinition>(query.ColumnDefinitions())) {
         const auto& definition = dynamic_cast<const model::ColumnDefinition&>(*each);
-        if (!definition.Visible() || definition.total() == model::Total::Condition) continue;
+        if (!definition.comesOut()) continue;
         if (isOfSeveral(definition)) {
             isFirst = false;
             mLast.clear();

@@ -20,8 +20,7 @@ public:
     ColumnFormats() = default;
     explicit ColumnFormats(model::Query& query);
 
-    /// Of a column of a result of so many. Columns of an entry of
-    /// all columns have none.
+    /// Of a column of a result of so many. Those that an entry of all columns stands for have none.
     CellFormat at(int column, int columns) const;
 
     friend bool operator==(const ColumnFormats&, const ColumnFormats&) = default;

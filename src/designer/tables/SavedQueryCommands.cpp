@@ -26,13 +26,12 @@ SavedQueryCommands::SavedQueryCommands(Document& document, const QueryFile& file
         if (!path.isEmpty()) add(path);
     });
     connect(&readAgain, &QAction::triggered, this, [this] {
-        const Outcome outcome = read();
-        if (!outcome.kept.isEmpty())
-            emit noted(outcome.kept.first());
-        else if (outcome.changed.isEmpty())
-            emit noted(tr("The saved queries are as they are here."));
-        else
-            emit noted(tr("Read again: %1.").arg(outcome.changed.join(QStringLiteral(", "))));
+        Outcome outcome = read();
+        if (!outcome.changed.isEmpty())
+            outcome.kept.prepend(
+                tr("Read again: %1.").arg(outcome.changed.join(QStringLiteral(", "))));
+        if (outcome.kept.isEmpty()) outcome.kept << tr("The saved queries are as they are here.");
+        emit noted(outcome.kept.join(u' '));
     });
     connect(&document, &Document::changed, this, &SavedQueryCommands::offer);
     offer();
@@ -49,7 +48,7 @@ void SavedQueryCommands::add(const QString& path) {
 
 void SavedQueryCommands::followFiles() {
     const Outcome outcome = read();
-    if (!outcome.kept.isEmpty()) emit noted(outcome.kept.first());
+    if (!outcome.kept.isEmpty()) emit noted(outcome.kept.join(u' '));
 }
 
 SavedQueryCommands::Outcome SavedQueryCommands::read() {

@@ -2,10 +2,7 @@
 
 #include <QAction>
 #include <QObject>
-
-#include <optional>
-
-class QPoint;
+#include <QStringList>
 
 namespace zandor::designer {
 
@@ -31,7 +28,7 @@ public:
     void followFiles();
 
 signals:
-    /// One line on what was read again, or could not be.
+    /// A line on what was read again, and on each that could not be.
     void noted(const QString& what);
     /// Nothing was added; one line says why.
     void refused(const QString& why);

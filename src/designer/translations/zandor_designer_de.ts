@@ -333,10 +333,6 @@
         <translation>true oder false</translation>
     </message>
     <message>
-        <source>Is Null, a column or a parameter</source>
-        <translation>Is Null, eine Spalte oder ein Parameter</translation>
-    </message>
-    <message>
         <source>There is no file &quot;%1&quot;; check the path.</source>
         <translation>Es gibt keine Datei „%1“; prüfen Sie den Pfad.</translation>
     </message>
@@ -577,10 +573,6 @@
         <translation>hier fehlt true oder false</translation>
     </message>
     <message>
-        <source>Is Null, a column or a parameter is missing</source>
-        <translation>hier fehlt Is Null, eine Spalte oder ein Parameter</translation>
-    </message>
-    <message>
         <source>a value is missing</source>
         <translation>hier fehlt ein Wert</translation>
     </message>
@@ -603,10 +595,6 @@
     <message>
         <source>write true or false here</source>
         <translation>schreiben Sie hier true oder false</translation>
-    </message>
-    <message>
-        <source>only Is Null, a column or a parameter can stand here</source>
-        <translation>hier darf nur Is Null, eine Spalte oder ein Parameter stehen</translation>
     </message>
     <message>
         <source>only dates and times stand between two #</source>

@@ -333,10 +333,6 @@
         <translation>true o false</translation>
     </message>
     <message>
-        <source>Is Null, a column or a parameter</source>
-        <translation>Is Null, una columna o un parámetro</translation>
-    </message>
-    <message>
         <source>There is no file &quot;%1&quot;; check the path.</source>
         <translation>No existe el archivo «%1»; compruebe la ruta.</translation>
     </message>
@@ -577,10 +573,6 @@
         <translation>falta true o false</translation>
     </message>
     <message>
-        <source>Is Null, a column or a parameter is missing</source>
-        <translation>falta Is Null, una columna o un parámetro</translation>
-    </message>
-    <message>
         <source>a value is missing</source>
         <translation>falta un valor</translation>
     </message>
@@ -603,10 +595,6 @@
     <message>
         <source>write true or false here</source>
         <translation>escriba aquí true o false</translation>
-    </message>
-    <message>
-        <source>only Is Null, a column or a parameter can stand here</source>
-        <translation>aquí solo puede ir Is Null, una columna o un parámetro</translation>
     </message>
     <message>
         <source>only dates and times stand between two #</source>

@@ -333,10 +333,6 @@
         <translation>true ou false</translation>
     </message>
     <message>
-        <source>Is Null, a column or a parameter</source>
-        <translation>Is Null, une colonne ou un paramètre</translation>
-    </message>
-    <message>
         <source>There is no file &quot;%1&quot;; check the path.</source>
         <translation>Il n’y a pas de fichier «&#xa0;%1&#xa0;»&#xa0;; vérifiez le chemin.</translation>
     </message>
@@ -577,10 +573,6 @@
         <translation>il manque true ou false</translation>
     </message>
     <message>
-        <source>Is Null, a column or a parameter is missing</source>
-        <translation>il manque Is Null, une colonne ou un paramètre</translation>
-    </message>
-    <message>
         <source>a value is missing</source>
         <translation>il manque une valeur</translation>
     </message>
@@ -603,10 +595,6 @@
     <message>
         <source>write true or false here</source>
         <translation>écrivez ici true ou false</translation>
-    </message>
-    <message>
-        <source>only Is Null, a column or a parameter can stand here</source>
-        <translation>n’écrivez ici que Is Null, une colonne ou un paramètre</translation>
     </message>
     <message>
         <source>only dates and times stand between two #</source>

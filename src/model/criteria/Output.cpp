@@ -4,19 +4,6 @@
 
 namespace zandor::model::criteria {
 
-namespace {
-
-ColumnType typeOf(Total total, const sql::Node& value) {
-    switch (total) {
-    case Total::Count:
-    case Total::CountDifferent: return ColumnType::Integer;
-    case Total::Average: return ColumnType::Decimal;
-    default: return value ? typeOf(*value) : ColumnType::Unknown;
-    }
-}
-
-} // namespace
-
 Output outputOf(const ColumnDefinition& definition, const Resolver& resolver) {
     Output output;
     bool rows = false;
@@ -32,8 +19,10 @@ Output outputOf(const ColumnDefinition& definition, const Resolver& resolver) {
     if (!output.value && !rows) return output;
     sql::Node subject = output.value;
     if (aggregates(definition.total()))
-        subject = sql::make(sql::Aggregate{definition.total(), output.value,
-                                           typeOf(definition.total(), output.value)});
+        subject = sql::make(
+            sql::Aggregate{definition.total(), output.value,
+                           typeOf(definition.total(),
+                                  output.value ? typeOf(*output.value) : ColumnType::Unknown)});
     output.subject = Subject(std::move(subject), definition.Column()->Name());
     return output;
 }

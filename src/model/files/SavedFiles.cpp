@@ -5,6 +5,7 @@
 #include <Zandor/files/SavedQueries.h>
 
 #include <algorithm>
+#include <map>
 
 namespace zandor::files {
 
@@ -72,6 +73,7 @@ public:
             mCircle = true;
             return Error{model::say<MessageCode::readsFromItself>(nameOf(path))};
         }
+        if (const auto known = mRead.find(file); known != mRead.end()) return known->second;
         auto document = loadQuery(path);
         if (!document) return document.failure();
         mChain.push_back(file);
@@ -81,6 +83,7 @@ public:
         SavedQuery saved{textOf(file), undrawn(document->query->record())};
         if (const auto refusal = model::Query::refusalOf(saved))
             return Error{model::say<MessageCode::fileNotUsed>(nameOf(path), *refusal)};
+        mRead.emplace(file, saved);
         return saved;
     }
 
@@ -111,7 +114,8 @@ public:
 
 private:
     std::vector<Path> mChain;
-    std::size_t mOutside = 0; ///< so long is the chain where the reading began
+    std::map<Path, SavedQuery> mRead; ///< one that many read from is read once
+    std::size_t mOutside = 0;         ///< so long is the chain where the reading began
     bool mCircle = false;
 };
 

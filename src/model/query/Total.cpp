@@ -17,6 +17,15 @@ platform::StringView wordOf(Total total) {
     return {};
 }
 
+ColumnType typeOf(Total total, ColumnType values) {
+    switch (total) {
+    case Total::Count:
+    case Total::CountDifferent: return ColumnType::Integer;
+    case Total::Average: return ColumnType::Decimal;
+    default: return values;
+    }
+}
+
 bool suits(Total total, ColumnType type) {
     switch (total) {
     case Total::Sum:

@@ -1,5 +1,6 @@
 #include <Zandor/Query.h>
 
+#include <Zandor/model/Result.h>
 #include <Zandor/sql/Builder.h>
 
 #include <algorithm>
@@ -13,31 +14,41 @@ using platform::makeRef;
 
 namespace {
 
-std::vector<ColumnDescription> columnsOf(const SavedQuery& saved) {
-    return sql::outputColumns(*Query::restored(saved.record));
+using Columns = std::vector<ColumnDescription>;
+
+/// What the table would have, or why there cannot be one.
+Result<Columns, Message> columnsOf(const SavedQuery& saved) {
+    if (const auto fault = faultOf(saved.record)) return fault->message;
+    if (depthOf(saved.record) >= deepestSavedQuery)
+        return say<MessageCode::queriesNested>(deepestSavedQuery);
+    auto columns = sql::outputColumns(*Query::restored(saved.record));
+    if (columns.empty()) return say<MessageCode::nothingComesOut>();
+    return columns;
 }
 
 } // namespace
 
 std::optional<Message> Query::refusalOf(const SavedQuery& saved) {
-    if (const auto fault = faultOf(saved.record)) return fault->message;
-    if (depthOf(saved.record) >= deepestSavedQuery)
-        return say<MessageCode::queriesNested>(deepestSavedQuery);
-    if (columnsOf(saved).empty()) return say<MessageCode::nothingComesOut>();
-    return {};
+    const auto columns = columnsOf(saved);
+    return columns ? std::nullopt : std::optional(columns.failure());
 }
 
 Ref<Table> Query::addQuery(const String& name, SavedQuery saved) {
-    if (name.empty() || refusalOf(saved)) throw platform::errors::invalidProcedureCall();
-    const TableDescription source{.schema = {}, .name = name, .columns = columnsOf(saved)};
-    return add(source, SavedQueryRef(std::move(saved)));
+    const auto columns = columnsOf(saved);
+    if (name.empty() || !columns) throw platform::errors::invalidProcedureCall();
+    return add({.schema = {}, .name = name, .columns = *columns}, SavedQueryRef(std::move(saved)));
 }
 
-std::optional<Message> Query::refusalOf(const Table& table, const SavedQuery& saved) {
-    if (auto refusal = refusalOf(saved)) return refusal;
-    tieCriteria(); // what a criterion names is used as well
-    const auto used = usedColumns();
-    const auto given = columnsOf(saved);
+std::optional<Message> Query::refusalOf(const Table& table, const SavedQuery& saved) const {
+    const auto columns = columnsOf(saved);
+    return columns ? refusalOf(table, *columns) : columns.failure();
+}
+
+std::optional<Message> Query::refusalOf(const Table& table, const Columns& given) const {
+    // What a criterion names is used as well. It is tied in a copy, for to ask changes nothing.
+    const auto copy = restored(record());
+    copy->tieCriteria();
+    const auto used = copy->usedColumns();
     const auto& columns = table.contents()->columns;
     for (std::int32_t position = 2; position <= columns.Count(); ++position) {
         const auto column = columns.Item(position);
@@ -52,19 +63,20 @@ std::optional<Message> Query::refusalOf(const Table& table, const SavedQuery& sa
 
 void Query::refreshQuery(const Ref<Table>& table, SavedQuery saved) {
     requireOwn(table);
-    if (!table->savedQuery() || refusalOf(*table, saved))
+    const auto given = columnsOf(saved);
+    if (!table->savedQuery() || !given || refusalOf(*table, *given))
         throw platform::errors::invalidProcedureCall();
     auto contents = std::make_shared<TableContents>();
     const auto& before = table->contents()->columns;
     contents->columns.Add(before.Item(1), before.Item(1)->Key());
-    for (ColumnDescription& description : columnsOf(saved)) {
+    for (const ColumnDescription& description : *given) {
         Ref<Column> column;
         for (std::int32_t position = 2; position <= before.Count() && !column; ++position)
             if (before.Item(position)->Name() == description.name)
                 column = std::static_pointer_cast<Column>(before.Item(position));
         if (!column || column->description() != description) {
             const String key = column ? column->Key() : nextKey(u'c', mLastColumn);
-            column = makeRef<Column>(ColumnPlace(table->place(), key), std::move(description));
+            column = makeRef<Column>(ColumnPlace(table->place(), key), description);
         }
         contents->columns.Add(column, column->Key());
     }

@@ -96,15 +96,11 @@ private:
             return;
         }
         if (mGrouped && !aggregates(total) && total != Total::Condition) group(output.subject);
-        if (comesOut(definition)) addItem(definition, output.subject);
+        if (definition.comesOut()) addItem(definition, output.subject);
         if (aggregates(total)) mTotals.push_back(output.subject.node);
         addSort(definition, output.subject);
         for (const auto& [row, criterium] : definition.criteria().rows())
             addCriterion(definition, output.subject, row, criterium->tied());
-    }
-
-    static bool comesOut(const ColumnDefinition& definition) {
-        return definition.Visible() && definition.total() != Total::Condition;
     }
 
     /// Rows are put together by it; what is said twice is one node.
@@ -143,7 +139,7 @@ private:
                    say<MessageCode::sortOfCondition>(subject.name));
             return;
         }
-        if (mQuery.options().distinct && !comesOut(definition)) {
+        if (mQuery.options().distinct && !definition.comesOut()) {
             report(Finding::Kind::sortNotOutput, definition,
                    say<MessageCode::sortNotOutput>(subject.name));
             return;

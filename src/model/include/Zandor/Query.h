@@ -68,7 +68,7 @@ public:
     /// table that is no saved query of this query, error 91 for nothing; nothing changes then.
     void refreshQuery(const Ref<Table>& table, SavedQuery saved);
     /// As above, and for a column that is used in this query and comes out no more.
-    std::optional<Message> refusalOf(const Table& table, const SavedQuery& saved);
+    std::optional<Message> refusalOf(const Table& table, const SavedQuery& saved) const;
     /// Gives a table of this query another name; criteria that name it are written anew. Error 5
     /// for an empty name or a foreign table, error 91 for nothing, error 457 when another table has
     /// the name; nothing changes then.
@@ -101,6 +101,8 @@ private:
     void set(const JoinState& state);
     void set(const DefinitionState& state);
     Ref<Table> add(const TableDescription& source, SavedQueryRef saved);
+    std::optional<Message> refusalOf(const Table& table,
+                                     const std::vector<ColumnDescription>& given) const;
     std::unordered_set<String> usedColumns() const;
     void restoreTable(const TableRecord& record);
     ColumnPlace restoredEnd(const EndRecord& record) const;

@@ -30,6 +30,8 @@ public:
     void SortOrder(std::int16_t value) override;
     bool Visible() const override { return mVisible; }
     void Visible(bool value) override { mVisible = value; }
+    /// Whether it comes out with the rows, and does not only choose or sort them.
+    bool comesOut() const { return Visible() && total() != Total::Condition; }
     std::int32_t Width() const override { return mWidth; }
     /// Error 380 outside 0 to greatestWidth.
     void Width(std::int32_t value) override;

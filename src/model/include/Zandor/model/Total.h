@@ -37,4 +37,7 @@ constexpr bool aggregates(Total total) { return total >= Total::Count && total <
 /// largest of what has an order. Of an unknown type all may be.
 ZANDOR_MODEL_EXPORT bool suits(Total total, ColumnType type);
 
+/// What the total of values of a type is.
+ZANDOR_MODEL_EXPORT ColumnType typeOf(Total total, ColumnType values);
+
 } // namespace zandor::model
