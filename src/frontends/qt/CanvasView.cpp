@@ -1,6 +1,7 @@
 #include "frontends/qt/CanvasView.h"
 
 #include "frontends/qt/Canvas.h"
+#include "frontends/qt/CanvasWindow.h"
 #include "frontends/qt/DragSession.h"
 #include "frontends/qt/ScrollBar.h"
 
@@ -23,17 +24,24 @@ int wayTo(int begin, int end, int seenBegin, int seenEnd) {
 
 } // namespace
 
-void CanvasView::setCanvas(Canvas* canvas) { mCanvas = canvas; }
+void CanvasView::setCanvas(Canvas* canvas, CanvasWindow* window) {
+    mCanvas = canvas;
+    mWindow = window;
+}
+
+void CanvasView::setBar(QScrollBar* bar) {
+    (bar->orientation() == Qt::Horizontal ? mAcross : mDown) = bar;
+    if (mWindow) static_cast<CanvasWindow*>(mWindow.data())->endAt(*bar);
+}
 
 Canvas* CanvasView::canvas() const { return static_cast<Canvas*>(mCanvas.data()); }
 
 bool CanvasView::carries(const QMimeData* data) const { return mDrags.accepts(data); }
 
 QRect CanvasView::seen() const {
-    if (!mCanvas || !mAcross || !mDown) return {};
-    const QRect window(QPoint(), QPoint(mDown->x() - 1, mAcross->y() - 1));
-    return window.intersected(mCanvas->parentWidget()->rect()).translated(-mCanvas->pos()) &
-           mCanvas->rect();
+    if (!mCanvas || !mWindow) return {};
+    const QRect window = static_cast<CanvasWindow*>(mWindow.data())->seen();
+    return window.translated(-mCanvas->pos()) & mCanvas->rect();
 }
 
 void CanvasView::scrollBy(QPoint way) {

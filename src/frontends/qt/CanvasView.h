@@ -17,11 +17,12 @@ namespace zandor::platform::qt {
 
 class Canvas;
 class CanvasLine;
+class CanvasWindow;
 class DragSession;
 class KeyboardMenu;
 
-/// What shows the canvas: the window that the scroll bars move it behind, and the services that it
-/// has from the control around it.
+/// What shows the canvas: the window and the scroll bars that move it behind that, and the services
+/// that it has from the control around it.
 class CanvasView {
 public:
     using Namer = std::function<QString(const CanvasLine&)>;
@@ -29,8 +30,8 @@ public:
     CanvasView(KeyboardMenu& menu, DragSession& drags, const comforts::Comforts& comforts)
         : mMenu(menu), mDrags(drags), mComforts(comforts) {}
 
-    void setCanvas(Canvas* canvas);
-    void setBar(QScrollBar* bar) { (bar->orientation() == Qt::Horizontal ? mAcross : mDown) = bar; }
+    void setCanvas(Canvas* canvas, CanvasWindow* window);
+    void setBar(QScrollBar* bar);
     /// Makes the spoken names of join lines.
     void setNamer(Namer namer) { mNamer = std::move(namer); }
 
@@ -59,6 +60,7 @@ private:
     DragSession& mDrags;
     const comforts::Comforts& mComforts;
     QPointer<QWidget> mCanvas;
+    QPointer<QWidget> mWindow;
     QPointer<QScrollBar> mAcross;
     QPointer<QScrollBar> mDown;
     Namer mNamer;

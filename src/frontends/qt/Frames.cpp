@@ -21,7 +21,8 @@ CanvasAdapter::~CanvasAdapter() {
 }
 
 void CanvasAdapter::ZOrder() {
-    if (mWidget) mWidget->raise();
+    // Alone in its window, the canvas stands as high as that does.
+    if (mWidget) mWidget->parentWidget()->raise();
 }
 
 RowFrame::RowFrame(QWidget* parent, bool outermost) : QFrame(parent), mOutermost(outermost) {

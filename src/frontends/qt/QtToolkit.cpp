@@ -2,6 +2,7 @@
 
 #include "frontends/qt/CanvasAccessible.h"
 #include "frontends/qt/CanvasItems.h"
+#include "frontends/qt/CanvasWindow.h"
 #include "frontends/qt/Dialog.h"
 #include "frontends/qt/EditorWatch.h"
 #include "frontends/qt/Fonts.h"
@@ -112,9 +113,11 @@ void QtToolkit::MsgBox(const String& prompt, std::int32_t style, const String& t
 std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents events) {
     // Only the drawing surface listens to the mouse; other frames hold an editor's parts.
     if (events.MouseDown || events.MouseUp) {
-        auto* canvas = new Canvas(mView, parentOf(design));
+        auto* const window = new CanvasWindow(parentOf(design));
+        window->show();
+        auto* const canvas = new Canvas(mView, window);
         canvas->show();
-        mView.setCanvas(canvas);
+        mView.setCanvas(canvas, window);
         return adapt<CanvasAdapter>(design, Role::frame, canvas, std::move(events));
     }
     auto* frame = new RowFrame(parentOf(design), !design.Container);

@@ -202,7 +202,9 @@ TEST_F(Geometry, StacksTheCanvasBelowTheGridTheBarsTheHomeButtonAndTheEditors) {
     const auto layer = [&](const char* name) {
         return children.indexOf(widget->findChild<QWidget*>(name));
     };
-    EXPECT_LT(layer("fraTable"), layer("sprColumn"));
+    // The canvas is alone in the window that it moves behind.
+    EXPECT_EQ(child<QWidget>("fraTable").parentWidget()->children().size(), 1);
+    EXPECT_LT(children.indexOf(child<QWidget>("fraTable").parentWidget()), layer("sprColumn"));
     EXPECT_LT(layer("sprColumn"), layer("hsbTable"));
     EXPECT_LT(layer("hsbTable"), layer("vsbTable"));
     EXPECT_LT(layer("vsbTable"), layer("cmdHome"));
