@@ -40,12 +40,9 @@ bool isNumber(const QMetaType& type) {
     }
 }
 
-/// The number that bits make, unless the driver has lost some: it takes them for UTF-8.
-Cell bitsCell(const QString& text) {
-    if (text.contains(QChar::ReplacementCharacter)) return {Cell::Kind::text, text};
-    quint64 number = 0;
-    for (const char byte : text.toUtf8()) number = number << 8 | static_cast<uchar>(byte);
-    return {Cell::Kind::number, QString::number(number)};
+bool isMoment(const QMetaType& type) {
+    return type.id() == QMetaType::QDate || type.id() == QMetaType::QTime ||
+           type.id() == QMetaType::QDateTime;
 }
 
 QString momentText(const QVariant& value) {
@@ -70,6 +67,7 @@ CellReader::CellReader(const QSqlQuery& query, const QSqlDatabase& database)
     for (int i = 0; i < record.count(); ++i) {
         mColumns << mNative.name(i).value_or(record.fieldName(i));
         mNumbers.push_back(isNumber(record.field(i).metaType()));
+        mMoments.push_back(isMoment(record.field(i).metaType()));
     }
     mRow.resize(mNumbers.size());
 }
@@ -80,28 +78,29 @@ const Row& CellReader::row() {
 }
 
 Cell CellReader::cell(int column) const {
+    std::optional<QString> moment;
+    if (mMoments[static_cast<std::size_t>(column)]) moment = mNative.moment(column);
+    // Also where it is not needed, for behind ODBC the driver reads all columns up to the asked
+    // one.
     const QVariant value = mQuery.value(column);
+    if (moment) return moment->isNull() ? Cell{} : Cell{Cell::Kind::text, *moment};
     // The statement knows it; a value that Qt cannot hold calls itself null as well.
     if (mQuery.isNull(column)) return {};
     switch (value.typeId()) {
-    case QMetaType::QByteArray:
-        if (mNative.isText(column))
-            return {Cell::Kind::text, QString::fromUtf8(value.toByteArray())};
-        return {Cell::Kind::blob, {}, value.toByteArray()};
+    case QMetaType::QByteArray: return {Cell::Kind::blob, {}, value.toByteArray()};
     case QMetaType::Bool:
         return {Cell::Kind::boolean,
                 value.toBool() ? QStringLiteral("true") : QStringLiteral("false")};
     case QMetaType::QDate:
     case QMetaType::QTime:
     case QMetaType::QDateTime: {
-        const QString text = mNative.written(column).value_or(momentText(value));
+        const QString text = momentText(value);
         return {Cell::Kind::text, text.isEmpty() ? unknownMoment() : text};
     }
     case QMetaType::Double:
     case QMetaType::Float:
         return {Cell::Kind::number, QString::number(value.toDouble(), 'g', mDigits)};
     case QMetaType::QString: {
-        if (mNative.isBits(column)) return bitsCell(value.toString());
         // Exact decimals come as text.
         const bool number = mNumbers[static_cast<std::size_t>(column)];
         return {number ? Cell::Kind::number : Cell::Kind::text, value.toString()};

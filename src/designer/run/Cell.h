@@ -40,6 +40,7 @@ private:
     const int mDigits; ///< of a fraction
     QStringList mColumns;
     std::vector<bool> mNumbers; ///< whose values are numbers even where they come as text
+    std::vector<bool> mMoments;
     Row mRow;
 };
 

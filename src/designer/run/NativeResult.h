@@ -19,19 +19,24 @@ public:
 
     /// A column's name, of which Qt leaves out the quotes in SQLite.
     std::optional<QString> name(int column) const;
-    /// The value of the current row as PostgreSQL writes it: a moment with all its digits, its
-    /// offset and its era, also one that no calendar has.
-    std::optional<QString> written(int column) const;
-    /// Whether what Qt takes for bytes is a text of MySQL in a collation that compares bytes.
-    bool isText(int column) const;
-    /// Whether what Qt takes for a text is the bits of a number of MySQL.
-    bool isBits(int column) const;
+    /// The moment that the current row has in a column, as PostgreSQL or a driver of ODBC writes
+    /// it: with all its digits, its offset and its era, also one that no calendar has. A null text
+    /// where the row has none. It is asked for before Qt is, column by column, for a driver of ODBC
+    /// may give each value once.
+    std::optional<QString> moment(int column) const;
 
 private:
+    using GetValue = const char* (*)(const void*, int, int);
+    using GetData = short (*)(void*, unsigned short, short, void*, long, long*);
+
     void* handle() const;
+    std::optional<QString> momentOfPostgres(int column) const;
+    std::optional<QString> momentOfOdbc(int column) const;
 
     const QSqlQuery& mQuery;
-    enum class Engine { unknown, sqlite, postgres, mysql } mEngine = Engine::unknown;
+    bool mSqlite = false;
+    GetValue mGetValue = nullptr; ///< of PostgreSQL
+    GetData mGetData = nullptr;   ///< of ODBC
 };
 
 } // namespace zandor::designer

@@ -1,6 +1,7 @@
 #include "designer/run/fetch.h"
 
 #include "designer/run/EngineStop.h"
+#include "designer/run/MysqlResult.h"
 #include "designer/run/writtenOut.h"
 #include "designer/statement/ModelWords.h"
 
@@ -21,6 +22,11 @@ QString words(const QSqlError& error) {
     return connection ? said.section(u'\n', 0, 0) : said;
 }
 
+QSqlQuery queryOn(const QSqlDatabase& database) {
+    if (QSqlResult* const result = MysqlResult::over(database)) return QSqlQuery(result);
+    return QSqlQuery(database);
+}
+
 bool send(QSqlQuery& query, const QSqlDatabase& database, const Command& command) {
     // Without values not prepared: the driver would look for placeholders in the texts.
     if (command.values.isEmpty()) return query.exec(command.statement);
@@ -38,7 +44,7 @@ public:
     Fetch(const Connector& connector, const reader::Connection& connection,
           const std::atomic<bool>& stop)
         : mConnection(connection), mStop(stop), mEngineStop(connection.database(), connector, stop),
-          mQuery(connection.database()) {
+          mQuery(queryOn(connection.database())) {
         mQuery.setForwardOnly(true); // the drivers then neither wait for all rows nor keep them
         mQuery.setNumericalPrecisionPolicy(QSql::HighPrecision);
     }

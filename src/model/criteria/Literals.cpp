@@ -9,6 +9,7 @@ namespace zandor::model::criteria {
 namespace {
 
 constexpr StringView exampleOfBytes = u"x'0AFF'";
+constexpr std::size_t mostDigitsOfSecond = 9; // behind the point
 
 bool isDigit(char16_t c) { return c >= u'0' && c <= u'9'; }
 
@@ -33,6 +34,7 @@ public:
         while (!done() && isDigit(mText[mAt])) ++mAt;
         return mAt - begin;
     }
+    StringView behind(std::size_t count) const { return mText.substr(mAt - count, count); }
     /// A number of so many digits, or nothing.
     std::optional<int> number(std::size_t fewest, std::size_t most) {
         const std::size_t begin = mAt;
@@ -82,10 +84,16 @@ std::optional<String> time(Reader& reader) {
     const auto minute = reader.number(2, 2);
     if (!minute || *minute > 59) return {};
     int second = 0;
+    StringView fraction;
     if (reader.take(u':')) {
         const auto seconds = reader.number(2, 2);
         if (!seconds || *seconds > 59) return {};
         second = *seconds;
+        if (reader.take(u'.')) {
+            const std::size_t digits = reader.digits();
+            if (digits == 0 || digits > mostDigitsOfSecond) return {};
+            fraction = reader.behind(digits);
+        }
     }
     String out;
     appendPadded(out, *hour, 2);
@@ -93,6 +101,8 @@ std::optional<String> time(Reader& reader) {
     appendPadded(out, *minute, 2);
     out += u':';
     appendPadded(out, second, 2);
+    // As many digits as there are: an engine that keeps moments as texts compares them too.
+    if (!fraction.empty()) out += u'.' + String(fraction);
     return out;
 }
 

@@ -19,10 +19,10 @@ ZANDOR_MODEL_EXPORT bool isNumber(ColumnType type);
 
 /// The value that a text is for a column of a type, canonical, or nothing when it is none.
 /// Numbers: sign, digits, point, exponent. Dates: year-month-day, checked against the calendar.
-/// Times: hour:minute, seconds if need be. Timestamps: a date, with a time behind it (blank or T
-/// between) or midnight. Booleans: true, false, yes, no, 1, 0. Bytes: hexadecimal digits, two each,
-/// as x'0AFF', 0x0AFF or \x0AFF. A column of an unknown type takes numbers as numbers and all else
-/// as text.
+/// Times: hour:minute, seconds if need be, with up to nine digits behind a point, which stay as
+/// they are typed. Timestamps: a date, with a time behind it (blank or T between) or midnight.
+/// Booleans: true, false, yes, no, 1, 0. Bytes: hexadecimal digits, two each, as x'0AFF', 0x0AFF or
+/// \x0AFF. A column of an unknown type takes numbers as numbers and all else as text.
 ZANDOR_MODEL_EXPORT std::optional<sql::Value> literal(StringView text, ColumnType type);
 
 /// The date, time or timestamp that a text between # signs is, for a column of a type; nothing for

@@ -68,11 +68,14 @@ model::ColumnType typeOf(const QString& base, const QString& category, bool buil
 
 /// The declared type; with what a domain is made from where the engine has no operators for that
 /// domain: those of arrays, rows, enumerations, shapes and ranges are none of a domain's, and texts
-/// of a form have none.
+/// of a form have none. A list of domains comes with what they are made from in the end, which says
+/// whether the engine can compare it.
 platform::String declaredAs(const QSqlQuery& row) {
     const platform::String declared = textAt(row, 1);
     const platform::String base = textAt(row, 2);
     const bool domain = row.value(6).toBool();
+    const platform::String list = row.isNull(7) ? base : textAt(row, 7) + u"[]";
+    if (!domain && list != base) return declared + u" AS " + list;
     const bool without = QStringLiteral("ACEGR").contains(row.value(3).toString()) ||
                          base == u"json" || base == u"xml";
     return domain && without ? declared + u" AS " + base : declared;
@@ -107,7 +110,8 @@ Result<model::TableDescription> PostgresReader::table(const TableId& id) {
             "SELECT a.attname, pg_catalog.format_type(a.atttypid, a.atttypmod), "
             "pg_catalog.format_type(base.oid, NULL), base.typcategory, "
             "base.typnamespace = 'pg_catalog'::regnamespace, "
-            "coalesce(a.attnum = ANY (pk.indkey), false), base.oid <> a.atttypid "
+            "coalesce(a.attnum = ANY (pk.indkey), false), base.oid <> a.atttypid, "
+            "pg_catalog.format_type(part.oid, NULL) "
             "FROM pg_catalog.pg_class c "
             "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
             "LEFT JOIN pg_catalog.pg_index pk ON pk.indrelid = c.oid AND pk.indisprimary "
@@ -119,6 +123,15 @@ Result<model::TableDescription> PostgresReader::table(const TableId& id) {
             "SELECT t.oid, t.typbasetype, t.typcategory, t.typnamespace "
             "FROM chain JOIN pg_catalog.pg_type t ON t.oid = chain.typbasetype) "
             "SELECT * FROM chain WHERE typbasetype = 0) base ON true "
+            // What an array has as elements, in the end.
+            "LEFT JOIN LATERAL (WITH RECURSIVE parts AS ("
+            "SELECT t.oid, t.typbasetype, t.typelem, 0 AS depth "
+            "FROM pg_catalog.pg_type t WHERE t.oid = base.oid AND base.typcategory = 'A' UNION ALL "
+            "SELECT t.oid, t.typbasetype, t.typelem, parts.depth + 1 "
+            "FROM parts JOIN pg_catalog.pg_type t "
+            "ON t.oid = coalesce(nullif(parts.typbasetype, 0), parts.typelem) "
+            "AND (parts.typbasetype <> 0 OR t.typarray = parts.oid)) "
+            "SELECT * FROM parts WHERE depth > 0 ORDER BY depth DESC LIMIT 1) part ON true "
             "WHERE c.relkind IN ('r', 'p', 'f', 'v', 'm') AND %1 ORDER BY a.attnum")
             .arg(isNamed),
         {toQt(id.schema), toQt(id.name)}, [&](const QSqlQuery& row) {

@@ -41,8 +41,8 @@ StringView roomFor(ColumnType type) {
     case ColumnType::Boolean: return u"CAST(? AS SIGNED)";
     case ColumnType::Decimal: return u"CAST(? AS DOUBLE)";
     case ColumnType::Date: return u"CAST(? AS DATE)";
-    case ColumnType::Time: return u"CAST(? AS TIME)";
-    case ColumnType::Timestamp: return u"CAST(? AS DATETIME)";
+    case ColumnType::Time: return u"CAST(? AS TIME(6))";
+    case ColumnType::Timestamp: return u"CAST(? AS DATETIME(6))";
     case ColumnType::Text:
     case ColumnType::Blob:
     case ColumnType::Unknown: break;

@@ -19,8 +19,9 @@ constexpr StringView withoutOrder[] = {u"xid"};
 // These compare their sizes, and a list of them cannot be compared at all.
 constexpr StringView shapes[] = {u"circle", u"lseg"};
 
-/// Between the name of a domain and of the type that it is made from.
+/// Between the name of a domain, or of a list of them, and of the type that it is made from.
 constexpr StringView domainOf = u" AS ";
+constexpr StringView listOf = u"[]";
 
 template <std::size_t count>
 bool isOneOf(const StringView (&names)[count], StringView name) {
@@ -30,11 +31,14 @@ bool isOneOf(const StringView (&names)[count], StringView name) {
 } // namespace
 
 PostgresComparing postgresComparing(StringView declared) {
-    // The operators of such types are none of a domain's.
-    if (declared.find(domainOf) != StringView::npos) return {false, false};
+    // The operators of such types are none of a domain's; lists of domains have those of lists.
+    if (const std::size_t at = declared.find(domainOf); at != StringView::npos) {
+        if (!declared.substr(0, at).ends_with(listOf)) return {false, false};
+        declared.remove_prefix(at + domainOf.size());
+    }
     // A list of values can be compared as far as each of them can.
-    const bool array = declared.ends_with(u"[]");
-    if (array) declared.remove_suffix(2);
+    const bool array = declared.ends_with(listOf);
+    if (array) declared.remove_suffix(listOf.size());
     PostgresComparing comparing;
     comparing.equal = !isOneOf(withoutEquality, declared) && !(array && isOneOf(shapes, declared));
     comparing.ordered = comparing.equal && !isOneOf(withoutOrder, declared);

@@ -19,9 +19,10 @@ struct PostgresComparing {
     Numbers numbers = Numbers::none; ///< that it can be compared with
 };
 
-/// A domain that has to be minded is declared as "name AS type". A type of somebody else's has all
-/// operators, and takes no numbers. Where nothing was declared nobody knows, and numbers are taken
-/// for numbers.
+/// A domain that has to be minded is declared as "name AS type", a list of domains as "name[] AS
+/// type[]", whatever the domain is made from by way of other domains and lists. A type of somebody
+/// else's has all operators, and takes no numbers. Where nothing was declared nobody knows, and
+/// numbers are taken for numbers.
 PostgresComparing postgresComparing(StringView declared);
 
 } // namespace zandor::model::sql

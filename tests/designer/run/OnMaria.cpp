@@ -1,6 +1,5 @@
 #include "Queries.h"
 #include "model/reader/OneMariaServer.h"
-#include "support/OdbcSources.h"
 
 #include <gmock/gmock.h>
 
@@ -52,33 +51,55 @@ TEST_F(OnMaria, TellsTextsFromBytesWhateverTheirCollation) {
     EXPECT_EQ(keeper.rows, expected);
 }
 
-TEST_F(OnMaria, GivesBitsAsNumbersAndTimesBeyondADay) {
+TEST_F(OnMaria, GivesBitsAsNumbers) {
     runOnMaria({"USE here",
-                "CREATE TABLE t (o bit, e bit(8), s bit(64), x time(6), "
-                "d datetime, `a``\"b` int)",
-                "INSERT INTO t VALUES (b'1', b'101', 65, '-800:00:00.000001', "
-                "'2024-02-29 01:02:03', 7)"});
+                "CREATE TABLE t (o bit, e bit(8), b bit(8), s bit(64), `a``\"b` bit(12))",
+                "INSERT INTO t VALUES (b'1', b'101', 200, 18446744073709551615, 256), "
+                "(0, 0, 127, 9007199254740993, NULL)"});
     fetch("SELECT * FROM t");
-    EXPECT_EQ(keeper.rows,
-              QStringList("n:1 | n:5 | n:65 | t:-800:00:00.000001 | t:2024-02-29 01:02:03 | n:7"));
+    EXPECT_EQ(keeper.rows, QStringList({"n:1 | n:5 | n:200 | n:18446744073709551615 | n:256",
+                                        "n:0 | n:0 | n:127 | n:9007199254740993 | 0:"}));
     EXPECT_EQ(keeper.columns.last(), "a`\"b");
 }
 
-TEST_F(OnMaria, FindsByTextsBehindOdbcToo) {
-    const QString driver = QStringLiteral("libmaodbc.so");
-    if (const auto missing = OdbcSources::missing(driver, QStringLiteral("odbc-mariadb")))
-        GTEST_SKIP() << missing->toStdString();
-    runOnMaria({"USE here", "CREATE TABLE t (a text)", "INSERT INTO t VALUES ('it''s \\\\ ?')"});
-    OdbcSources sources;
-    const QString address =
-        "odbc://" + sources.add(driver, {"SOCKET=" + oneMariaServer.server().socket(),
-                                         "DATABASE=here", "USER=root"});
-    const auto query = draw(address, {"t"}, {{"t.a", {"it's \\ ?"}}});
-    EXPECT_EQ(designer::fetch(Database::connectorTo(address, {}),
-                              commandFor(query, model::sql::Dialect::MySQL), keeper, stop)
-                  .end,
-              Outcome::End::complete);
-    EXPECT_EQ(keeper.rows, QStringList("t:it's \\ ?"));
+TEST_F(OnMaria, GivesNumbersAsTheyAre) {
+    runOnMaria({"USE here",
+                "CREATE TABLE t (b boolean, y year, z int(5) unsigned zerofill, l bigint unsigned, "
+                "f float, g double, n decimal(5,2))",
+                "INSERT INTO t VALUES (true, 2024, 42, 18446744073709551615, 1.5, 0.1, -7.10)"});
+    fetch("SELECT t.*, count(*) AS c, 1e300 * 10 AS h FROM t");
+    EXPECT_EQ(keeper.rows, QStringList("n:1 | n:2024 | n:42 | n:18446744073709551615 | n:1.5 | "
+                                       "n:0.1 | n:-7.10 | n:1 | n:1e301"));
+}
+
+TEST_F(OnMaria, GivesMomentsAsTheEngineWritesThem) {
+    runOnMaria({"USE here", "SET sql_mode = ''",
+                "CREATE TABLE t (d date, m datetime, p datetime(6), s timestamp(6) NULL, "
+                "c time(6), l time)",
+                "INSERT INTO t VALUES ('2024-02-29', '2024-02-29 01:02:03', "
+                "'2024-02-29 01:02:03.123456', '2024-02-29 01:02:03.000001', "
+                "'-800:00:00.000001', '23:59:59'), "
+                "('0000-00-00', '0000-00-00', '2024-00-00 01:00', '0000-00-00', 0, '838:59:59'), "
+                "('2024-02-00', '9999-12-31', '2024-02-29 01:02:03.5', NULL, NULL, '-00:00:01')"});
+    fetch("SELECT * FROM t");
+    EXPECT_EQ(keeper.rows,
+              QStringList({"t:2024-02-29 | t:2024-02-29 01:02:03 | t:2024-02-29 01:02:03.123456 | "
+                           "t:2024-02-29 01:02:03.000001 | t:-800:00:00.000001 | t:23:59:59",
+                           "t:0000-00-00 | t:0000-00-00 00:00:00 | t:2024-00-00 01:00:00.000000 | "
+                           "t:0000-00-00 00:00:00.000000 | t:00:00:00.000000 | t:838:59:59",
+                           "t:2024-02-00 | t:9999-12-31 00:00:00 | t:2024-02-29 01:02:03.500000 | "
+                           "0: | 0: | t:-00:00:01"}));
+}
+
+TEST_F(OnMaria, FindsARowByWhatItShows) {
+    runOnMaria({"USE here", "SET sql_mode = ''",
+                "CREATE TABLE t (b bit(8), w bit(64), p datetime(6), s timestamp(6) NULL, "
+                "c time(6), z date, l time(6))",
+                "INSERT INTO t VALUES (200, 18446744073709551615, '2024-02-29 01:02:03.123456', "
+                "'2024-02-29 01:02:03.000001', '23:59:59.999999', '0000-00-00', "
+                "'-800:00:00.000001'), (201, 1, '2024-02-29 01:02:03.123457', "
+                "'2024-02-29 01:02:03', '23:59:59.999998', '2024-02-00', '-800:00:00.000002')"});
+    expectFoundByWhatIsShown(mariaAddress("here"), "t", model::sql::Dialect::MySQL, {"z", "l"});
 }
 
 TEST_F(OnMaria, StopsAStatementThatWouldTakeMinutes) {
@@ -98,6 +119,65 @@ TEST_F(OnMaria, StopsAStatementThatWouldTakeMinutes) {
               "WHERE a.seq * b.seq = -1");
     stopping.join();
     EXPECT_EQ(outcome.end, Outcome::End::cancelled);
+}
+
+TEST_F(OnMaria, EndsAtTheLimit) {
+    Command command{"SELECT seq FROM seq_1_to_100", {}, 10};
+    EXPECT_EQ(fetch(command).end, Outcome::End::limited);
+    EXPECT_EQ(keeper.rows.size(), 10);
+    command.limit = 100;
+    EXPECT_EQ(fetch(command).end, Outcome::End::complete);
+    command.limit = 0;
+    EXPECT_EQ(fetch(command).end, Outcome::End::limited);
+}
+
+TEST_F(OnMaria, GivesTheFirstRowsBeforeTheLastOnesAreThere) {
+    // The whole result would take minutes and all the memory that there is.
+    keeper.refuseAfter = 1000;
+    const Outcome outcome = fetch("SELECT * FROM seq_1_to_1000000 a CROSS JOIN seq_1_to_1000000 b");
+    EXPECT_EQ(outcome.end, Outcome::End::refused);
+    EXPECT_EQ(outcome.rows, 1000);
+    keeper = {};
+    fetch("SELECT count(*) FROM information_schema.processlist WHERE info LIKE '%seq_1_%' AND id "
+          "<> CONNECTION_ID()");
+    EXPECT_EQ(keeper.rows, QStringList("n:0"));
+}
+
+TEST_F(OnMaria, StopsAStatementInTheMidstOfItsRows) {
+    keeper.afterFirst = [this] { stop = true; };
+    EXPECT_EQ(fetch("SELECT * FROM seq_1_to_1000000 a CROSS JOIN seq_1_to_1000000 b").end,
+              Outcome::End::cancelled);
+}
+
+TEST_F(OnMaria, TellsOfAFailureBetweenTwoRows) {
+    const Outcome outcome = fetch("SELECT (SELECT seq FROM seq_1_to_2 WHERE seq <= IF(s.seq > "
+                                  "50000, 2, 1)) FROM seq_1_to_100000 s");
+    EXPECT_EQ(outcome.end, Outcome::End::failed);
+    EXPECT_EQ(outcome.message, "Subquery returns more than 1 row");
+    EXPECT_FALSE(keeper.finished);
+}
+
+TEST_F(OnMaria, TellsThatTheConnectionIsLostInTheMidstOfARow) {
+    const QString statement = "SELECT REPEAT('x', 10000000) AS here FROM seq_1_to_1000";
+    keeper.afterFirst = [&] {
+        // It has more to write than anybody has read.
+        runOnMaria({"SET @there = (SELECT id FROM information_schema.processlist WHERE info LIKE "
+                    "'SELECT REPEAT%')",
+                    "EXECUTE IMMEDIATE CONCAT('KILL ', @there)"});
+    };
+    const Outcome outcome = fetch(statement);
+    EXPECT_EQ(outcome.end, Outcome::End::lost);
+    EXPECT_FALSE(outcome.message.isEmpty());
+    EXPECT_GE(outcome.rows, 1);
+    EXPECT_LT(outcome.rows, 1000);
+    EXPECT_FALSE(keeper.finished);
+}
+
+TEST_F(OnMaria, GivesTheRowsOfTheFirstOfSeveralResults) {
+    runOnMaria({"USE here", "CREATE PROCEDURE p() BEGIN SELECT 1 AS one; SELECT 2 AS two; END"});
+    EXPECT_EQ(fetch("CALL p()").end, Outcome::End::complete);
+    EXPECT_EQ(keeper.columns, QStringList("one"));
+    EXPECT_EQ(keeper.rows, QStringList("n:1"));
 }
 
 TEST_F(OnMaria, TellsAFailureFromALostConnection) {

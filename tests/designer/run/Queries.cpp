@@ -68,6 +68,7 @@ std::optional<QString> Keeper::add(const designer::Row& row) {
                           : cell.text);
     }
     rows << texts.join(QStringLiteral(" | "));
+    if (rows.size() == 1 && afterFirst) afterFirst();
     return {};
 }
 
@@ -76,4 +77,30 @@ designer::Command commandFor(const platform::Ref<model::Query>& query, model::sq
     const auto text = designer::statementFor(*query, dialect, limit);
     EXPECT_TRUE(text.runnable());
     return designer::makeCommand(text, dialect, {}, limit);
+}
+
+void expectFoundByWhatIsShown(const QString& address, const QString& table,
+                              model::sql::Dialect dialect, const QStringList& outside) {
+    const auto rowsOf = [&](const platform::Ref<model::Query>& query) {
+        Keeper keeper;
+        const std::atomic<bool> stop = false;
+        const auto outcome = designer::fetch(designer::Database::connectorTo(address, {}),
+                                             commandFor(query, dialect), keeper, stop);
+        EXPECT_EQ(outcome.end, designer::Outcome::End::complete) << outcome.message.toStdString();
+        return keeper;
+    };
+    const Keeper all = rowsOf(draw(address, {table}));
+    ASSERT_FALSE(all.cells.empty());
+    for (qsizetype column = 0; column < all.columns.size(); ++column) {
+        const QString name = table + u'.' + all.columns[column];
+        for (const designer::Row& row : all.cells) {
+            const designer::Cell& cell = row[static_cast<std::size_t>(column)];
+            SCOPED_TRACE((name + QStringLiteral(": ") + cell.text).toStdString());
+            const QString criterion = outside.contains(all.columns[column])
+                                          ? QStringLiteral("Text(%1) = '%2'").arg(name, cell.text)
+                                          : cell.text;
+            const Keeper found = rowsOf(draw(address, {table}, {{name, {criterion}}}));
+            EXPECT_EQ(found.cells, std::vector<designer::Row>{{cell}});
+        }
+    }
 }

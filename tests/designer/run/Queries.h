@@ -4,6 +4,8 @@
 
 #include <QStringList>
 
+#include <functional>
+
 /// Queries as the tests want them drawn.
 
 /// An output column: "table.column", and its criteria in the row "Criteria:" and below.
@@ -42,10 +44,17 @@ public:
     QStringList rows; ///< cells with " | " between, the kind's first letter before each
     std::vector<zandor::designer::Row> cells;
     bool finished = false;
-    int refuseAfter = -1; ///< rows
+    int refuseAfter = -1;                  ///< rows
+    std::function<void()> afterFirst = {}; ///< done when one row has come
 };
 
 /// The command for a query without parameters.
 zandor::designer::Command commandFor(const zandor::platform::Ref<zandor::model::Query>& query,
                                      zandor::model::sql::Dialect dialect,
                                      std::optional<qint64> limit = {});
+
+/// Runs a query for every value of a table, with what the designer shows of it typed as the
+/// criterion: one row is found, which has that value. No column has a value twice. What no clock or
+/// calendar has, in the columns `outside`, is compared by its text.
+void expectFoundByWhatIsShown(const QString& address, const QString& table,
+                              zandor::model::sql::Dialect dialect, const QStringList& outside = {});

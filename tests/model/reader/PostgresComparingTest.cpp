@@ -29,8 +29,10 @@ QStringList everyType() {
                                "AND typname <> '_cstring' ORDER BY oid")));
     QStringList types;
     while (query.next()) types << query.value(0).toString();
-    return types + QStringList{sql("mood"),  sql("feeling"), sql("pointer"),  sql("paper"),
-                               sql("spans"), sql("mood[]"),  sql("pointer[]")};
+    return types + QStringList{sql("mood"),    sql("feeling"), sql("pointer"),   sql("paper"),
+                               sql("spans"),   sql("mood[]"),  sql("pointer[]"), sql("feeling[]"),
+                               sql("paper[]"), sql("sheet[]"), sql("sheets"),    sql("sheets[]"),
+                               sql("ring[]"),  sql("price[]")};
 }
 
 model::sql::Text textOf(const model::TableDescription& table, const QString& criterion,
@@ -62,7 +64,9 @@ protected:
                      sql("CREATE TYPE mood AS ENUM ('sad', 'happy', '5')"),
                      sql("CREATE DOMAIN feeling AS mood"),
                      sql("CREATE TYPE pointer AS (x int, y int)"),
-                     sql("CREATE DOMAIN paper AS json"),
+                     sql("CREATE DOMAIN paper AS json"), sql("CREATE DOMAIN sheet AS paper"),
+                     sql("CREATE DOMAIN sheets AS sheet[]"), sql("CREATE DOMAIN ring AS circle"),
+                     sql("CREATE DOMAIN price AS numeric(10,2)"),
                      sql("CREATE TYPE spans AS RANGE (subtype = float8)")});
     }
 
@@ -132,6 +136,9 @@ TEST_F(ComparingInPostgres, TellsByItsTextWhatHasNoOperatorForTheSame) {
     EXPECT_TRUE(finds("json", "'5'", sql("= 5")));
     EXPECT_TRUE(finds("xml", "'<a/>'", sql("= '<a/>' And <> '<b/>'")));
     EXPECT_TRUE(finds("paper", "'{}'", sql("= '{}'"))) << "a domain is what it is made from";
+    EXPECT_TRUE(finds("paper[]", "'{5}'", sql("= '{5}' And <> '{6}'"))) << "nor has a list of them";
+    EXPECT_TRUE(finds("sheets[]", "array['{5}'::sheets]", sql("= '{\"{5}\"}'")));
+    EXPECT_TRUE(finds("price[]", "'{5}'", sql("= '{5.0}' And < '{6}'"))) << "this one has";
     EXPECT_TRUE(finds("point", "'(1,2)'", sql("= '(1,2)'")));
 }
 

@@ -86,7 +86,7 @@ TEST_F(PostgresReader, ReadsColumnsWithDeclaredTypeAndMeaning) {
                      "ti time, tz timestamp with time zone, ts timestamp, y bytea, u uuid, "
                      "j jsonb, iv interval, a integer[], e mood, p price, ra int4range, "
                      "po pointer, pt point, gone int, g int GENERATED ALWAYS AS (i + 1) STORED, "
-                     "me mood[])"),
+                     "me mood[], pl price[])"),
                  sql("ALTER TABLE t DROP COLUMN gone")});
     const Columns expected = {{u"i", ColumnType::Integer, u"integer", false},
                               {u"b", ColumnType::Integer, u"bigint", false},
@@ -112,7 +112,8 @@ TEST_F(PostgresReader, ReadsColumnsWithDeclaredTypeAndMeaning) {
                               {u"po", ColumnType::Unknown, u"pointer", false},
                               {u"pt", ColumnType::Unknown, u"point", false},
                               {u"g", ColumnType::Integer, u"integer", false},
-                              {u"me", ColumnType::Unknown, u"mood[]", false}};
+                              {u"me", ColumnType::Unknown, u"mood[]", false},
+                              {u"pl", ColumnType::Unknown, u"price[] AS numeric[]", false}};
     const Columns read = columns({u"", u"t"});
     ASSERT_EQ(read.size(), expected.size());
     for (std::size_t n = 0; n < read.size(); ++n)

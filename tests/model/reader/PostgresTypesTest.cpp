@@ -34,10 +34,13 @@ const Type types[] = {
     {"name", ColumnType::Text, "'abc'", {"abc", "Like A*"}},
     {"\"char\"", ColumnType::Text, "'a'", {"a", "Like A"}},
     {"bytea", ColumnType::Blob, "'abc'", {"Is Not Null"}},
-    {"timestamp", ColumnType::Timestamp, "'2024-02-29 01:02:03'", {"2024-02-29 01:02:03"}},
+    {"timestamp",
+     ColumnType::Timestamp,
+     "'2024-02-29 01:02:03.000001'",
+     {"2024-02-29 01:02:03.000001", ">2024-02-29 01:02:03"}},
     {"timestamptz", ColumnType::Timestamp, "'2024-02-29 01:02:03'", {"2024-02-29 01:02:03"}},
     {"date", ColumnType::Date, "'2024-02-29'", {"2024-02-29", "<2024-03-01"}},
-    {"time", ColumnType::Time, "'01:02:03'", {"01:02:03"}},
+    {"time", ColumnType::Time, "'01:02:03.5'", {"01:02:03.5", "01:02:03.500"}},
     {"timetz", ColumnType::Time, "'01:02:03+00'", {"01:02:03"}},
     {"interval", ColumnType::Unknown, "'1 day'", {"\"1 day\"", "Like 1*", "\"24 hours\""}},
     {"boolean", ColumnType::Boolean, "true", {"true"}},
@@ -51,6 +54,8 @@ const Type types[] = {
     {"json", ColumnType::Unknown, "'{\"a\":1}'", {"Like *a*"}},
     {"jsonb", ColumnType::Unknown, "'{\"a\":1}'", {"Like *a*", "\"{\"\"a\"\":  1}\""}},
     {"integer[]", ColumnType::Unknown, "'{1,2}'", {"\"{1,2}\"", "Like *2*"}},
+    {"feeling[]", ColumnType::Unknown, "'{happy}'", {"\"{happy}\"", "Like *H*"}},
+    {"paper[]", ColumnType::Unknown, "'{5}'", {"\"{5}\"", "Like *5*"}},
     {"int4range", ColumnType::Unknown, "'[1,3)'", {"\"[1,2]\"", "Like *3*"}},
     {"int4multirange", ColumnType::Unknown, "'{[1,3)}'", {"Like *3*"}},
     {"pointer", ColumnType::Unknown, "'(1,2)'", {"Like *2*"}},
@@ -85,7 +90,7 @@ QString sql(const char* text) { return QString::fromUtf8(text); }
 TEST(TypesOfPostgres, MeanWhatCanBeAskedOfThem) {
     runOnServer({sql("DROP SCHEMA public CASCADE"), sql("CREATE SCHEMA public"),
                  sql("CREATE TYPE mood AS ENUM ('sad', 'happy')"),
-                 sql("CREATE DOMAIN feeling AS mood"),
+                 sql("CREATE DOMAIN feeling AS mood"), sql("CREATE DOMAIN paper AS json"),
                  sql("CREATE TYPE pointer AS (x int, y int)")});
     const auto opened = reader::openDatabase(serverAddress());
     ASSERT_TRUE(opened) << opened.error().toStdString();

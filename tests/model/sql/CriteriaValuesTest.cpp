@@ -80,7 +80,10 @@ TEST_F(AValue, OfATimeColumnIsATimeOfTheDay) {
     EXPECT_EQ(condition(u"clock", u"9:05"), "t.clock = '09:05:00'");
     EXPECT_EQ(condition(u"clock", u"23:59:59"), "t.clock = '23:59:59'");
     EXPECT_EQ(condition(u"clock", u"#00:00#"), "t.clock = '00:00:00'");
-    for (const auto* text : {u"24:00", u"12:60", u"12:00:60", u"12", u"12:5", u"noon"})
+    EXPECT_EQ(condition(u"clock", u"1:02:03.500"), "t.clock = '01:02:03.500'");
+    EXPECT_EQ(condition(u"clock", u"#1:02:03.123456789#"), "t.clock = '01:02:03.123456789'");
+    for (const auto* text : {u"24:00", u"12:60", u"12:00:60", u"12", u"12:5", u"noon", u"12:00.5",
+                             u"12:00:00.", u"12:00:00,5", u"12:00:00.1234567890", u"12:00:00.5x"})
         EXPECT_EQ(condition(u"clock", text),
                   "At character 1: this is no time, write it like 23:59.")
             << platform::toUtf8(text);
@@ -89,6 +92,10 @@ TEST_F(AValue, OfATimeColumnIsATimeOfTheDay) {
 TEST_F(AValue, OfATimestampColumnIsADayWithOrWithoutATime) {
     EXPECT_EQ(condition(u"moment", u"2024-05-01 10:30"), "t.moment = '2024-05-01 10:30:00'");
     EXPECT_EQ(condition(u"moment", u"2024-05-01T10:30:15"), "t.moment = '2024-05-01 10:30:15'");
+    EXPECT_EQ(condition(u"moment", u"> 2024-05-01 10:30:15.000001"),
+              "t.moment > '2024-05-01 10:30:15.000001'");
+    EXPECT_EQ(condition(u"moment", u"Between 2024-05-01T10:30:15.5 And '2024-05-01 10:30:15.75'"),
+              "t.moment BETWEEN '2024-05-01 10:30:15.5' AND '2024-05-01 10:30:15.75'");
     EXPECT_EQ(condition(u"moment", u"2024-05-01"), "t.moment = '2024-05-01 00:00:00'");
     EXPECT_EQ(condition(u"moment", u"#2024-5-1 1:30#"), "t.moment = '2024-05-01 01:30:00'");
     EXPECT_EQ(condition(u"moment", u"2024-05-01 25:00"),
