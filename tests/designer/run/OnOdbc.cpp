@@ -88,6 +88,16 @@ TEST_F(OnPostgresBehindOdbc, GivesMomentsWithAllTheirDigits) {
     expectFoundByWhatIsShown(address, "moments", Dialect::PostgreSQL);
 }
 
+// The driver reads the engine's text and writes its own: it knows no era and drops the offset.
+TEST_F(OnPostgresBehindOdbc, GivesWhatTheDriverMakesOfOtherMoments) {
+    fetch("SELECT TIMESTAMP 'infinity', DATE '-infinity', DATE '0044-03-15 BC', TIME '24:00', "
+          "TIMETZ '01:02:03.25+05:30', TIMESTAMPTZ '2024-05-01 10:30:00.000001+05:30' FROM "
+          "(SELECT set_config('TimeZone', 'Asia/Kathmandu', true)) AS there");
+    EXPECT_EQ(keeper.rows, QStringList("t:9999-12-31 23:59:59 | t:0000-00-00 | t:0044-03-15 | "
+                                       "t:24:00:00 | t:01:02:03.25+05:30 | "
+                                       "t:2024-05-01 10:45:00.000001"));
+}
+
 TEST_F(OnMariaBehindOdbc, GivesMomentsAsTheEngineWritesThem) {
     runOnMaria({"USE here", "SET sql_mode = ''",
                 "CREATE TABLE moments (d date, m datetime(6), s timestamp(6) NULL, c time(6), "

@@ -84,6 +84,17 @@ TEST_F(OnPostgres, GivesMomentsAsTheEngineWritesThem) {
     EXPECT_EQ(keeper.rows.last(), "t:2024-05-01 10:45:00.000001+05:45");
 }
 
+TEST_F(OnPostgres, FindsARowByTheMomentThatItShows) {
+    runOnServer({"DROP TABLE IF EXISTS moments",
+                 "CREATE TABLE moments (d date, m timestamp, c time, z timestamptz, n timestamp, "
+                 "e date)",
+                 "INSERT INTO moments VALUES ('2024-02-29', '2024-02-29 01:02:03.123456', "
+                 "'23:59:59.999999', '2024-02-29 01:02:03.000001', 'infinity', '0044-03-15 BC'), "
+                 "('2024-03-01', '2024-02-29 01:02:03.123457', '23:59:59', "
+                 "'2024-02-29 01:02:03', '-infinity', '0044-03-15')"});
+    expectFoundByWhatIsShown(serverAddress(), "moments", Dialect::PostgreSQL, {"z", "n", "e"});
+}
+
 TEST_F(OnPostgres, GivesTheNamesOfColumnsAsTheyAre) {
     fetch("SELECT 1 AS \"a\"\"b\", 2 AS \"\"\"c\"\"\"");
     EXPECT_EQ(keeper.columns, QStringList({"a\"b", "\"c\""}));

@@ -83,7 +83,7 @@ TEST_F(AValue, OfATimeColumnIsATimeOfTheDay) {
     EXPECT_EQ(condition(u"clock", u"1:02:03.500"), "t.clock = '01:02:03.500'");
     EXPECT_EQ(condition(u"clock", u"#1:02:03.123456789#"), "t.clock = '01:02:03.123456789'");
     for (const auto* text : {u"24:00", u"12:60", u"12:00:60", u"12", u"12:5", u"noon", u"12:00.5",
-                             u"12:00:00.", u"12:00:00,5", u"12:00:00.1234567890", u"12:00:00.5x"})
+                             u"12:00:00.", u"12:00:00.1234567890", u"12:00:00.5x"})
         EXPECT_EQ(condition(u"clock", text),
                   "At character 1: this is no time, write it like 23:59.")
             << platform::toUtf8(text);
