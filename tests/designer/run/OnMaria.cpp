@@ -121,6 +121,23 @@ TEST_F(OnMaria, StopsAStatementThatWouldTakeMinutes) {
     EXPECT_EQ(outcome.end, Outcome::End::cancelled);
 }
 
+TEST_F(OnMaria, KeepsTheDigitsOfAMomentThatIsAskedForInAnExpression) {
+    runOnMaria({"USE here", "CREATE TABLE t (p datetime(6), c time(6))",
+                "INSERT INTO t VALUES (NULL, NULL)"});
+    const auto query = draw(mariaAddress("here"), {"t"});
+    for (const char16_t* expression :
+         {u"Coalesce([t].[p], :moment)", u"Coalesce([t].[c], :time)"}) {
+        const auto definition = platform::makeRef<model::ColumnDefinition>();
+        definition->expression(expression);
+        query->AddColumnDefinition(definition);
+    }
+    const auto text = designer::statementFor(*query, model::sql::Dialect::MySQL, {});
+    const designer::Answers answers{{"moment", "2024-02-29 01:02:03.123456"},
+                                    {"time", "23:59:59.999999"}};
+    fetch(designer::makeCommand(text, model::sql::Dialect::MySQL, answers, {}));
+    EXPECT_EQ(keeper.rows, QStringList("t:2024-02-29 01:02:03.123456 | t:23:59:59.999999"));
+}
+
 TEST_F(OnMaria, EndsAtTheLimit) {
     Command command{"SELECT seq FROM seq_1_to_100", {}, 10};
     EXPECT_EQ(fetch(command).end, Outcome::End::limited);
