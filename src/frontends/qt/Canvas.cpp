@@ -5,6 +5,7 @@
 #include "frontends/qt/FocusFrame.h"
 #include "frontends/qt/KeyCodes.h"
 #include "frontends/qt/KeyboardMenu.h"
+#include "frontends/qt/OwnPixels.h"
 #include "frontends/qt/ShownText.h"
 #include "frontends/qt/TabuletWidget.h"
 
@@ -55,6 +56,7 @@ void Canvas::add(CanvasItem& item) {
 
 void Canvas::remove(CanvasItem& item) {
     std::erase(mItems, &item);
+    std::erase(mChanged, &item);
     if (mCurrent != &item) return;
     // The keys go on with the next line, so that several can be deleted in a row.
     const auto rest = lines();
@@ -115,21 +117,75 @@ void Canvas::announceFocus() {
     QAccessible::updateAccessibility(&event);
 }
 
-void Canvas::paintEvent(QPaintEvent* event) {
-    QPainter painter(this);
-    for (const QRect& part : event->region()) painter.fillRect(part, palette().window());
-    painter.setRenderHint(QPainter::Antialiasing);
-    for (const CanvasItem* item : mItems)
-        if (item->visible() && event->region().intersects(item->extent()))
-            item->paint(painter, palette());
-    for (const CanvasItem* item : mItems)
-        if (item->visible() && event->region().intersects(item->extent()))
-            item->paintAbove(painter, palette());
-    if (frameShown()) paintFocusFrame(painter, mView.seen(), palette());
+void Canvas::changes(CanvasItem& item) {
+    if (mChanged.empty())
+        QMetaObject::invokeMethod(this, &Canvas::showChanges, Qt::QueuedConnection);
+    mChanged.push_back(&item);
+    if (!item.visible()) return;
+    mLeft += item.extent();
+    if (item.rests()) mBackdrop.forget(item.extent());
 }
 
-void Canvas::moveEvent(QMoveEvent*) {
-    if (frameShown()) update();
+/// Has the canvas painted where items have changed, but for what tables cover: those would be
+/// painted, too.
+void Canvas::showChanges() {
+    QRegion stale = std::exchange(mLeft, {});
+    for (CanvasItem* item : std::exchange(mChanged, {})) {
+        item->taken();
+        if (item->visible()) stale += item->extent();
+    }
+    if (stale.isEmpty()) return;
+    for (const QObject* child : children())
+        if (const auto* box = qobject_cast<const TabuletWidget*>(child); box && !box->isHidden())
+            stale -= box->geometry();
+    update(stale);
+}
+
+void Canvas::settle() {
+    for (CanvasItem* item : mItems)
+        if (item->settle()) mBackdrop.forget(item->extent());
+}
+
+void Canvas::paintEvent(QPaintEvent* event) {
+    showChanges();
+    const QRegion& region = event->region();
+    const QRect seen = mView.seen();
+    for (QObject* child : children())
+        if (auto* const box = qobject_cast<TabuletWidget*>(child))
+            seen.intersects(box->geometry()) ? box->picture().keep() : box->picture().drop();
+    QPainter painter(this);
+    // A picture of the whole canvas is seldom asked for, and needs none of what would be kept.
+    const bool kept = paintsOwnPixels(painter, *this) && Backdrop::worksAt(devicePixelRatioF()) &&
+                      seen.contains(region.boundingRect());
+    if (kept) {
+        settle();
+        mBackdrop.setLook(palette(), devicePixelRatioF());
+        mBackdrop.keepAround(seen);
+        mBackdrop.paint(painter, region, mItems);
+    } else {
+        for (const QRect& part : region) painter.fillRect(part, palette().window());
+    }
+    const auto shown = [&](const CanvasItem* item) {
+        return item->visible() && region.intersects(item->extent());
+    };
+    for (const CanvasItem* item : mItems)
+        if (item->isGround() && !(kept && item->rests()) && shown(item))
+            item->paint(painter, palette());
+    for (const CanvasItem* item : mItems)
+        if (!item->isGround() && shown(item)) item->paint(painter, palette());
+    for (const CanvasItem* item : mItems)
+        if (shown(item)) item->paintAbove(painter, palette());
+    if (frameShown()) paintFocusFrame(painter, seen, palette());
+}
+
+void Canvas::moveEvent(QMoveEvent* event) {
+    if (!frameShown()) return;
+    // The frame stays at the edges of what is seen; where it was, it has moved with the pixels.
+    const QRect seen = mView.seen();
+    const QRect before = seen.translated(event->pos() - event->oldPos());
+    for (const QRect& place : {seen, before})
+        update(QRegion(place) - place.adjusted(focusFrameWidth, focusFrameWidth, -focusFrameWidth,
+                                               -focusFrameWidth));
 }
 
 void Canvas::focusInEvent(QFocusEvent* event) {

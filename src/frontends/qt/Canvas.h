@@ -1,5 +1,6 @@
 #pragma once
 
+#include "frontends/qt/Backdrop.h"
 #include "frontends/qt/DragScroller.h"
 
 #include <Zandor/platform/Intrinsic.h>
@@ -32,6 +33,8 @@ public:
     void add(CanvasItem& item);
     void remove(CanvasItem& item);
     const std::vector<CanvasItem*>& items() const { return mItems; }
+    /// An item that looks as it did is about to look otherwise.
+    void changes(CanvasItem& item);
 
     /// The tables shown, in the order of their slots.
     std::vector<TabuletWidget*> tables() const;
@@ -66,6 +69,8 @@ protected:
     void dragLeaveEvent(QDragLeaveEvent* event) override;
 
 private:
+    void showChanges();
+    void settle();
     void makeCurrent(CanvasLine* line);
     bool frameShown() const { return mFocusShown && hasFocus() && !mCurrent; }
     QString sentenceAt(QPoint at) const;
@@ -77,6 +82,9 @@ private:
 
     CanvasView& mView;
     std::vector<CanvasItem*> mItems; ///< lines before marks
+    std::vector<CanvasItem*> mChanged;
+    QRegion mLeft; ///< where those were that have changed
+    Backdrop mBackdrop;
     FrameEvents mEvents;
     CanvasLine* mCurrent = nullptr;
     bool mFocusShown = false; ///< a click of the mouse gives the focus without showing it

@@ -30,6 +30,20 @@ QPointF pixelPoint(float x, float y) {
     return {pixel(x), pixel(y)};
 }
 
+/// A filled rectangle with a frame within it, both on whole pixels of the device: crisper than an
+/// outline across their edges, and a matter of filling twice.
+void fillFramed(QPainter& painter, const QRectF& place, qreal frame, const QColor& edge,
+                const QColor& filling) {
+    const QTransform toDevice = painter.deviceTransform();
+    const QTransform back = toDevice.inverted();
+    const QRectF outer = toDevice.mapRect(place);
+    const QPointF corner(std::round(outer.left()), std::round(outer.top()));
+    const QRectF whole(corner, QPointF(std::round(outer.right()), std::round(outer.bottom())));
+    const qreal width = std::max(1.0, std::round(frame * std::abs(toDevice.m11())));
+    painter.fillRect(back.mapRect(whole), edge);
+    painter.fillRect(back.mapRect(whole.adjusted(width, width, -width, -width)), filling);
+}
+
 } // namespace
 
 void CanvasItem::leave() {
@@ -41,8 +55,8 @@ void CanvasItem::leave() {
 
 void CanvasItem::setVisible(bool value) {
     if (mVisible == value) return;
+    note();
     mVisible = value;
-    if (mCanvas) mCanvas->update(mExtent);
 }
 
 void CanvasItem::setFocused(bool value) {
@@ -52,9 +66,23 @@ void CanvasItem::setFocused(bool value) {
 }
 
 void CanvasItem::changed() {
-    const QRegion extent = area();
-    if (mCanvas && mVisible) mCanvas->update(mExtent.united(extent));
-    mExtent = extent;
+    note();
+    mMeasured = false;
+}
+
+void CanvasItem::note() {
+    if (!mCanvas || std::exchange(mNoted, true)) return;
+    mCanvas->changes(*this);
+    mPaintings = 0;
+}
+
+const QRegion& CanvasItem::extent() const {
+    if (!std::exchange(mMeasured, true)) mExtent = area();
+    return mExtent;
+}
+
+bool CanvasItem::settle() {
+    return isGround() && mVisible && !rests() && ++mPaintings > paintingsToRest;
 }
 
 CanvasLine::CanvasLine(Canvas& canvas, QString name, std::int16_t index, const LineEnds& asked)
@@ -175,6 +203,7 @@ void CanvasLine::paintAbove(QPainter& painter, const QPalette& palette) const {
     const bool highlighted = mBorderWidth > 1 || focused();
     const QColor window = palette.color(QPalette::Window);
     const QColor text = palette.color(QPalette::WindowText);
+    painter.setRenderHint(QPainter::Antialiasing);
     painter.setFont(plateFont());
     for (const Plate& plate : all) {
         painter.setPen(
@@ -192,6 +221,7 @@ void CanvasLine::paint(QPainter& painter, const QPalette& palette) const {
     const QColor colour = highlighted ? palette.color(QPalette::Highlight)
                                       : mixed(palette.color(QPalette::Window),
                                               palette.color(QPalette::WindowText), 0.6);
+    painter.setRenderHint(QPainter::Antialiasing);
     if (focused()) {
         QColor halo = palette.color(QPalette::Active, QPalette::Highlight);
         halo.setAlphaF(0.35F);
@@ -241,13 +271,15 @@ void CanvasShape::paint(QPainter& painter, const QPalette& palette) const {
     const QColor outline =
         mixed(palette.color(QPalette::Window), palette.color(QPalette::WindowText), 0.6);
     const QColor focus = palette.color(QPalette::Active, QPalette::Highlight);
-    painter.setPen(QPen(focused() ? focus : outline, 1.2));
-    painter.setBrush(focused() ? focus : palette.color(QPalette::Base));
-    const QRectF inner = box.adjusted(0.6, 0.6, -0.6, -0.6);
-    if (mStyle == shapeCircle)
-        painter.drawEllipse(inner);
-    else
-        painter.drawRect(inner);
+    const QColor edge = focused() ? focus : outline;
+    const QColor filling = focused() ? focus : palette.color(QPalette::Base);
+    constexpr qreal thickness = 1.2;
+    painter.setRenderHint(QPainter::Antialiasing, mStyle == shapeCircle);
+    if (mStyle != shapeCircle) return fillFramed(painter, box, thickness, edge, filling);
+    painter.setPen(QPen(edge, thickness));
+    painter.setBrush(filling);
+    constexpr qreal inset = thickness / 2;
+    painter.drawEllipse(box.adjusted(inset, inset, -inset, -inset));
 }
 
 } // namespace zandor::platform::qt

@@ -11,8 +11,8 @@
 
 namespace zandor::platform::qt {
 
-/// Something that the canvas paints. Every change repaints only the pixels of the old and of the
-/// new appearance.
+/// Something that the canvas paints. A change repaints the pixels of the old and of the new
+/// appearance, once for all the changes that an event of the user brings.
 class CanvasItem {
 public:
     CanvasItem(Canvas& canvas, QString name) : mCanvas(&canvas), mName(std::move(name)) {}
@@ -22,9 +22,10 @@ public:
 
     const QString& name() const { return mName; }
     bool visible() const { return mVisible; }
-    const QRegion& extent() const { return mExtent; }
+    const QRegion& extent() const;
     /// Items of a lower layer are painted first.
     virtual int layer() const = 0;
+    /// Whatever the painter is set to.
     virtual void paint(QPainter& painter, const QPalette& palette) const = 0;
     /// What stands above every line and mark.
     virtual void paintAbove(QPainter&, const QPalette&) const {}
@@ -35,6 +36,15 @@ public:
     virtual bool touches(const CanvasLine&) const { return false; }
     /// Shows that the keyboard's focus is on the item.
     void setFocused(bool value);
+
+    /// Whether the item is painted below all that are not, and so may belong to the backdrop.
+    virtual bool isGround() const { return false; }
+    /// Whether it has been painted often enough without a change to be part of the backdrop.
+    bool rests() const { return mPaintings > paintingsToRest; }
+    /// The canvas is about to be painted. True when the item comes to rest by that.
+    bool settle();
+    /// The canvas has taken the item's changes in.
+    void taken() { mNoted = false; }
 
     /// The canvas is going.
     void detach() { mCanvas = nullptr; }
@@ -50,9 +60,17 @@ protected:
     bool focused() const { return mFocused; }
 
 private:
+    void note();
+
     Canvas* mCanvas;
     QString mName;
-    QRegion mExtent;
+    /// What a drag moves is changed before each painting.
+    static constexpr int paintingsToRest = 2;
+
+    mutable QRegion mExtent; ///< as it was last asked for
+    mutable bool mMeasured = true;
+    bool mNoted = false; ///< by the canvas, as one that changes
+    int mPaintings = 0;  ///< since the last change
     bool mVisible = false;
     bool mFocused = false;
 };
@@ -84,6 +102,8 @@ public:
     QAccessibleInterface* accessible();
 
     int layer() const override { return 0; }
+    /// A highlighted line stands above the others.
+    bool isGround() const override { return mBorderWidth <= 1 && !focused(); }
     void paint(QPainter& painter, const QPalette& palette) const override;
     void paintAbove(QPainter& painter, const QPalette& palette) const override;
 

@@ -6,9 +6,11 @@
 
 namespace zandor::platform::qt {
 
+inline constexpr int focusFrameWidth = 2;
+
 /// The frame around whatever has the keyboard's focus, just inside a rectangle.
 inline void paintFocusFrame(QPainter& painter, const QRect& place, const QPalette& palette) {
-    constexpr int width = 2;
+    constexpr int width = focusFrameWidth;
     painter.save();
     painter.setRenderHint(QPainter::Antialiasing, false);
     QPen pen(palette.color(QPalette::Active, QPalette::Highlight), width);

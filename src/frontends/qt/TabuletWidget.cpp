@@ -111,7 +111,8 @@ Qt::CursorShape cursorFor(Qt::Edges edges) {
 TabuletWidget::TabuletWidget(int slot, Canvas& canvas)
     : QWidget(&canvas), mCanvas(canvas), mSlot(slot), mModel(new ColumnListModel(this)),
       mList(new ColumnListView(this)), mClose(new CloseButton(*this)),
-      mScroller(Qt::Vertical, [this](QPoint direction) { scrollUnderDrag(direction); }) {
+      mScroller(Qt::Vertical, [this](QPoint direction) { scrollUnderDrag(direction); }),
+      mPicture(*this) {
     // Opaque, so that moving the box moves its pixels instead of painting it anew.
     setAttribute(Qt::WA_OpaquePaintEvent);
     setMouseTracking(true);
@@ -123,7 +124,20 @@ TabuletWidget::TabuletWidget(int slot, Canvas& canvas)
     connect(mClose, &QAbstractButton::clicked, this, [this] {
         if (mListener) mListener->closeClicked();
     });
+    const auto otherwise = [this] { mPicture.drop(); };
+    connect(mModel, &QAbstractItemModel::dataChanged, this, otherwise);
+    connect(mModel, &QAbstractItemModel::rowsInserted, this, otherwise);
+    connect(mModel, &QAbstractItemModel::modelReset, this, otherwise);
+    connect(mList->selectionModel(), &QItemSelectionModel::selectionChanged, this, otherwise);
+    connect(mList->selectionModel(), &QItemSelectionModel::currentChanged, this, otherwise);
+    connect(mList->verticalScrollBar(), &QScrollBar::valueChanged, this, otherwise);
+    connect(mList->verticalScrollBar(), &QScrollBar::rangeChanged, this, otherwise);
     measure();
+}
+
+void TabuletWidget::paintAnew() {
+    mPicture.drop();
+    update();
 }
 
 void TabuletWidget::setListener(TabuletListener* listener) {
@@ -141,7 +155,7 @@ void TabuletWidget::setTitle(const QString& title) {
     mTitle = asSigns(title);
     setAccessibleName(mTitle);
     mList->setAccessibleName(mTitle);
-    update(titleBar());
+    paintAnew();
 }
 
 void TabuletWidget::setNote(const QString& note) {
@@ -149,21 +163,21 @@ void TabuletWidget::setNote(const QString& note) {
     mNote = note;
     setAccessibleDescription(asSigns(note));
     mList->setAccessibleDescription(asSigns(note));
-    update(titleBar());
+    paintAnew();
 }
 
 void TabuletWidget::setLocked(bool locked) {
     mLocked = locked;
     mClose->setVisible(!locked);
     unsetCursor();
-    update(titleBar());
+    paintAnew();
     if (locked && stopGesture() && mListener) mListener->gestureTakenBack();
 }
 
 void TabuletWidget::setCurrent(bool current) {
     if (mCurrent == current) return;
     mCurrent = current;
-    update();
+    paintAnew();
 }
 
 QSize TabuletWidget::smallest() const {

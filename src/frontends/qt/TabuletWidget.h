@@ -4,6 +4,7 @@
 
 #include "frontends/qt/ColumnListView.h"
 #include "frontends/qt/DragScroller.h"
+#include "frontends/qt/RestingPicture.h"
 
 #include <Zandor/platform/Words.h>
 
@@ -47,6 +48,7 @@ public:
     ColumnListView& list() const { return *mList; }
     ColumnListModel& model() const { return *mModel; }
     QAbstractButton& closeButton() const { return *mClose; }
+    RestingPicture& picture() { return mPicture; }
 
     void setTitle(const QString& title);
     /// As it is shown.
@@ -85,6 +87,7 @@ private:
     enum class Gesture { none, move, resize };
 
     void measure();
+    void paintAnew();
     QRect titlePlace() const;
     QFont titleFont() const;
     void arrange();
@@ -113,6 +116,7 @@ private:
     QPointF mDraggedAt;
     bool mMoved = false;
     DragScroller mScroller;
+    RestingPicture mPicture;
 };
 
 } // namespace zandor::platform::qt

@@ -1,0 +1,40 @@
+#pragma once
+
+#include <QObject>
+#include <QPalette>
+#include <QPixmap>
+
+class QPaintEvent;
+class QWidget;
+
+namespace zandor::platform::qt {
+
+/// What a box with all its parts looks like while nothing happens to them, kept so that being
+/// uncovered is a matter of copying pixels. Any event of the box or of a part other than to be
+/// painted ends the rest.
+class RestingPicture : public QObject {
+public:
+    /// An opaque box, which the picture belongs to.
+    explicit RestingPicture(QWidget& box);
+
+    /// Takes the picture if the box has been painted often enough at rest. Not to be called while
+    /// the box itself is painted.
+    void keep();
+    /// To be called when the box looks otherwise without an event that says so.
+    void drop();
+
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+private:
+    void watch(QWidget& part);
+    bool isRight() const;
+    bool paint(QWidget& part, const QPaintEvent& event) const;
+
+    QWidget& mBox;
+    QPixmap mPicture;
+    QPalette mPalette; ///< that the picture was taken with
+    int mPaintings = 0;
+    bool mTaking = false;
+};
+
+} // namespace zandor::platform::qt
