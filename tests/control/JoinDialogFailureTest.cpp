@@ -8,7 +8,6 @@ namespace {
 
 using TalvikDBxZandor::frmJoinDefinition;
 
-const Stage::String invalidCall = u"Invalid procedure call or argument";
 const Stage::Box invalidPosition = dialogErrorBox(u"P_SET Join", 380, u"Invalid property value");
 
 struct AJoinDialogInTrouble : JoinScene {

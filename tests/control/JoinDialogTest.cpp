@@ -7,7 +7,6 @@ namespace {
 using platform::String;
 
 constexpr std::int16_t escape = 27;
-constexpr std::int16_t rightButton = 2;
 
 /// Opens the definition of the first join and does something in it; a dialog left open is
 /// cancelled.

@@ -4,8 +4,6 @@ using namespace zandor;
 
 namespace {
 
-constexpr std::int16_t square = 1;
-
 const Stage::Box notFound = controlErrorBox(u"DrawJoin", 91, objectNotSet);
 
 Stage::Box noElement(const Stage::String& index) {

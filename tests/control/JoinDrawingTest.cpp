@@ -5,8 +5,6 @@ using namespace zandor;
 namespace {
 
 constexpr float markSize = 140;
-constexpr std::int16_t square = 1;
-constexpr std::int16_t circle = 3;
 
 /// The first join of a scene: mark 2 is at the western end of its line, mark 1 at the eastern.
 struct ADrawnJoin : JoinScene {

@@ -4,8 +4,6 @@ using namespace zandor;
 
 namespace {
 
-const Stage::String invalidCall = u"Invalid procedure call or argument";
-
 struct ANewJoin : JoinScene {
     ANewJoin() { bind(); }
 

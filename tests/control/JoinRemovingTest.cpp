@@ -4,9 +4,6 @@ using namespace zandor;
 
 namespace {
 
-constexpr std::int16_t leftButton = 1;
-constexpr std::int16_t rightButton = 2;
-
 struct ARemovedJoin : JoinScene {
     ARemovedJoin() {
         join();

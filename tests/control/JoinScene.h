@@ -9,6 +9,12 @@
 #include <functional>
 #include <initializer_list>
 
+// As hosts and toolkits know them.
+inline constexpr std::int16_t leftButton = 1;
+inline constexpr std::int16_t rightButton = 2;
+inline constexpr std::int16_t square = 1; ///< the form of a mark
+inline constexpr std::int16_t circle = 3;
+
 /// Two tables on a stage, Orders to the west of Customers, for the tests of joins.
 struct JoinScene : ::testing::Test {
     using Back = TalvikDBxZandor::ZandorBackstage;
@@ -102,6 +108,7 @@ inline Stage::Box dialogErrorBox(const Stage::String& procedure, std::int32_t nu
     return errorBox(u"TalvikDBxZandor.frmJoinDefinition", procedure, number, description);
 }
 
+inline const Stage::String invalidCall = u"Invalid procedure call or argument";
 inline const Stage::String objectNotSet = u"Object variable or With block variable not set";
 
 using Boxes = std::vector<Stage::Box>;

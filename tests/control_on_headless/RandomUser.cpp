@@ -1,5 +1,6 @@
 #include "RandomUser.h"
 
+#include "control/GridStage.h"
 #include "support/Backstage.h"
 
 using namespace zandor;
@@ -8,14 +9,10 @@ using Backstage = TalvikDBxZandor::ZandorBackstage;
 using platform::Ref;
 namespace headless = platform::headless;
 
-namespace {
-
-constexpr std::int16_t left = 1;
-constexpr std::int16_t right = 2;
-constexpr std::int16_t enter = 13;
-constexpr std::int16_t escape = 27;
-
-} // namespace
+using gridstage::enter;
+using gridstage::escape;
+using gridstage::left;
+using gridstage::right;
 
 RandomUser::RandomUser(std::uint64_t seed, fake::Library& library)
     : mEngine(seed), mLibrary(library) {}

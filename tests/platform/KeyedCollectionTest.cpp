@@ -1,5 +1,7 @@
 #include <Zandor/platform/KeyedCollection.h>
 
+#include "platform/errorNumber.h"
+
 #include <gtest/gtest.h>
 
 using namespace zandor;
@@ -9,16 +11,6 @@ using platform::KeyedCollection;
 using platform::makeRef;
 
 namespace {
-
-template <class Body>
-std::int32_t errorNumber(Body&& body) {
-    try {
-        body();
-    } catch (const platform::RuntimeError& error) {
-        return error.Number;
-    }
-    return 0;
-}
 
 class AKeyedCollection : public testing::Test {
 protected:

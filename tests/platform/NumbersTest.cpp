@@ -1,6 +1,6 @@
 #include <Zandor/platform/Numbers.h>
 
-#include <Zandor/platform/RuntimeError.h>
+#include "platform/errorNumber.h"
 
 #include <gtest/gtest.h>
 
@@ -15,16 +15,6 @@ using platform::toInteger;
 using platform::toLong;
 
 namespace {
-
-template <class Body>
-std::int32_t errorNumber(Body&& body) {
-    try {
-        body();
-    } catch (const platform::RuntimeError& error) {
-        return error.Number;
-    }
-    return 0;
-}
 
 constexpr double notANumber = std::numeric_limits<double>::quiet_NaN();
 constexpr double infinity = std::numeric_limits<double>::infinity();

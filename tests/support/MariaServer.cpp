@@ -13,7 +13,7 @@
 namespace {
 
 /// Debian keeps the server where a user's path does not lead.
-QString programOf(const QString& name) {
+QString mariaProgram(const QString& name) {
     const QString inPath = QStandardPaths::findExecutable(name);
     if (!inPath.isEmpty()) return inPath;
     return QStandardPaths::findExecutable(
@@ -29,8 +29,8 @@ const QStringList quick = {
 } // namespace
 
 std::optional<QString> MariaServer::missing() {
-    if (programOf(QStringLiteral("mariadbd")).isEmpty() ||
-        programOf(QStringLiteral("mariadb-install-db")).isEmpty())
+    if (mariaProgram(QStringLiteral("mariadbd")).isEmpty() ||
+        mariaProgram(QStringLiteral("mariadb-install-db")).isEmpty())
         return QStringLiteral("the package mariadb-server-core is not installed");
     if (!QSqlDatabase::isDriverAvailable(QStringLiteral("QMYSQL")))
         return QStringLiteral("the package libqt6sql6-mysql is not installed");
@@ -72,7 +72,7 @@ void MariaServer::launch(QProcess& process, const QString& program,
     QStringList line = arguments;
     if (geteuid() == 0) line << QStringLiteral("--user=root");
     launchAs(QStringLiteral("root"), QStringLiteral("TERM"), process, mDirectory.path(),
-             programOf(program), line);
+             mariaProgram(program), line);
 }
 
 void MariaServer::waitUntilItAnswers() {

@@ -18,7 +18,7 @@ namespace {
 
 const QString page = QStringLiteral(SOURCE_ROOT "/docs/zandor-designer.1");
 
-QString contentOf(const QString& path) {
+QString textOf(const QString& path) {
     QFile file(path);
     EXPECT_TRUE(file.open(QIODevice::ReadOnly));
     return QString::fromUtf8(file.readAll());
@@ -35,11 +35,11 @@ std::set<std::string> optionsIn(const QString& text) {
 } // namespace
 
 TEST(TheManPage, HasTheOptionsOfTheHelpAndNoOthers) {
-    EXPECT_EQ(optionsIn(contentOf(page).replace("\\-", "-")), optionsIn(designer::helpText()));
+    EXPECT_EQ(optionsIn(textOf(page).replace("\\-", "-")), optionsIn(designer::helpText()));
 }
 
 TEST(TheManPage, HasNoOptionThatTheProgramDoesNotKnow) {
-    for (const std::string& option : optionsIn(contentOf(page).replace("\\-", "-"))) {
+    for (const std::string& option : optionsIn(textOf(page).replace("\\-", "-"))) {
         if (option == "help" || option == "version") continue;
         const auto arguments =
             designer::readArguments({"--" + QString::fromStdString(option) + "=x"});

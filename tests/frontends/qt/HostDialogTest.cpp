@@ -8,7 +8,7 @@
 
 namespace {
 
-class Host : public QDialog {
+class DialogHost : public QDialog {
 public:
     int menus = 0;
 
@@ -53,7 +53,7 @@ protected:
         settle();
     }
 
-    Host host;
+    DialogHost host;
     QLineEdit field;
     QPushButton other{"Other"}, ok{"Ok"};
     int accepted = 0;

@@ -1,3 +1,4 @@
+#include "frontends/qt/Around.h"
 #include "frontends/qt/CanvasItems.h"
 #include "frontends/qt/Desk.h"
 
@@ -30,8 +31,6 @@ constexpr const char* sheets[] = {
     "QWidget { background: #fffff0; color: navy; border: 1px solid silver }",
 };
 
-enum class When { beforeBinding, afterBinding };
-
 /// A host that dresses its window by a style sheet.
 class AStyleSheet : public Desk, public testing::WithParamInterface<std::tuple<const char*, When>> {
 protected:
@@ -42,9 +41,9 @@ protected:
         const QString sheet = QString::fromLatin1(std::get<0>(GetParam()));
         host.resize(widget->size());
         host.show();
-        if (std::get<1>(GetParam()) == When::beforeBinding) host.setStyleSheet(sheet);
+        if (std::get<1>(GetParam()) == When::before) host.setStyleSheet(sheet);
         bind();
-        if (std::get<1>(GetParam()) == When::afterBinding) host.setStyleSheet(sheet);
+        if (std::get<1>(GetParam()) == When::after) host.setStyleSheet(sheet);
         settle();
         settle();
     }
@@ -176,5 +175,4 @@ TEST_P(AStyleSheet, LeavesTheControlAsLargeAsItsBars) {
 
 INSTANTIATE_TEST_SUITE_P(Of, AStyleSheet,
                          testing::Combine(testing::ValuesIn(sheets),
-                                          testing::Values(When::beforeBinding,
-                                                          When::afterBinding)));
+                                          testing::Values(When::before, When::after)));
