@@ -49,7 +49,9 @@ std::vector<const char*> beginOf(model::sql::Dialect dialect) {
     case Dialect::PostgreSQL: return {"SET default_transaction_read_only = on"};
     case Dialect::MySQL:
         return {"SET SESSION TRANSACTION READ ONLY",
-                "SET SESSION sql_mode = REPLACE(@@SESSION.sql_mode, 'NO_BACKSLASH_ESCAPES', '')"};
+                "SET SESSION sql_mode = REPLACE(@@SESSION.sql_mode, 'NO_BACKSLASH_ESCAPES', '')",
+                // Seconds; rows are taken as slowly as somebody reads them in a pipe.
+                "SET SESSION net_write_timeout = 86400"};
     case Dialect::SqlServer: // has no such session
     case Dialect::Standard: break;
     }

@@ -190,6 +190,15 @@ TEST_F(OnMaria, TellsThatTheConnectionIsLostInTheMidstOfARow) {
     EXPECT_FALSE(keeper.finished);
 }
 
+TEST_F(OnMaria, WaitsForOneWhoReadsSlowly) {
+    runOnMaria({"SET GLOBAL net_write_timeout = 1"});
+    keeper.afterFirst = [] { std::this_thread::sleep_for(std::chrono::milliseconds(2500)); };
+    const Outcome outcome = fetch("SELECT REPEAT('x', 10000) FROM seq_1_to_2000");
+    runOnMaria({"SET GLOBAL net_write_timeout = DEFAULT"});
+    EXPECT_EQ(outcome.end, Outcome::End::complete) << outcome.message.toStdString();
+    EXPECT_EQ(outcome.rows, 2000);
+}
+
 TEST_F(OnMaria, GivesTheRowsOfTheFirstOfSeveralResults) {
     runOnMaria({"USE here", "CREATE PROCEDURE p() BEGIN SELECT 1 AS one; SELECT 2 AS two; END"});
     EXPECT_EQ(fetch("CALL p()").end, Outcome::End::complete);
