@@ -30,6 +30,9 @@ void Zandor::P_SET_Zandor(const Ref<TalvikZandorLib::Zandor>& given) {
         const std::int32_t binding = ++mBinding;
         RemoveAllTables();
         require(binding == mBinding);
+        // A slot whose table could not be made has nothing to be looked for in.
+        for (std::int16_t i = 1; i <= lastTableSlot; ++i)
+            if (!mTableFreeList->IsFree(i) && !lstTable.Find(i)) mTableFreeList->FreeIndex(i);
         TakeModel(model);
         lstTable(0)->Font(mToolkit->AmbientFont());
         sprColumn->Font(mToolkit->AmbientFont());

@@ -22,9 +22,9 @@ void Zandor::ReadOnly(bool value) {
         // While it may still be kept, what stands in an open editor is, if it is kept at all.
         if (value) MakeGetValueFieldsInvisible();
         mLife.check();
+        const std::vector shown(lstTable.begin(), lstTable.end());
         mReadOnly = value;
         // What the user holds is let go where it was.
-        const std::vector shown(lstTable.begin(), lstTable.end());
         for (const auto& [index, table] : shown) {
             mLife.check();
             table->Locked(value);

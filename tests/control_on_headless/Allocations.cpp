@@ -6,7 +6,7 @@
 namespace {
 
 std::size_t made = 0;
-bool failing = false;
+std::size_t failing = 0; ///< so many more, and the last of them fails; 0: none
 
 } // namespace
 
@@ -14,11 +14,11 @@ namespace allocations {
 
 std::size_t count() { return made; }
 
-void failNext() { failing = true; }
+void failNext(std::size_t nth) { failing = nth; }
 
 bool disarm() {
-    const bool armed = failing;
-    failing = false;
+    const bool armed = failing > 0;
+    failing = 0;
     return armed;
 }
 
@@ -26,7 +26,7 @@ bool disarm() {
 
 void* operator new(std::size_t size) {
     ++made;
-    if (allocations::disarm()) throw std::bad_alloc();
+    if (failing > 0 && --failing == 0) throw std::bad_alloc();
     if (void* const memory = std::malloc(size == 0 ? 1 : size)) return memory;
     throw std::bad_alloc();
 }

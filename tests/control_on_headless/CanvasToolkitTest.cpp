@@ -97,6 +97,21 @@ TEST_F(ShowingTablesOnAToolkit, KeepsTheSlotOfATableThatCouldNotBeMade) {
     EXPECT_FALSE(stage->exists("lstTable(1)"));
 }
 
+TEST_F(ShowingTablesOnAToolkit, ShowsTheNextModelBesideASlotThatHasNoTable) {
+    fail("makeTabulet");
+    bind();
+    stage->boxes.clear();
+    const auto next = library.newModel();
+    const auto left = next->table(u"C", {u"ID"});
+    const auto right = next->table(u"D", {u"ID"});
+    next->join(left, u"ID", right, u"ID");
+    next->definition(left, u"ID");
+    control().P_SET_Zandor(std::shared_ptr<TalvikZandorLib::Zandor>(next));
+    EXPECT_EQ(told(), Texts{});
+    EXPECT_TRUE(stage->look("linJoin(1)").visible);
+    EXPECT_EQ(stage->cell(0, 1), u"ID");
+}
+
 using FindingOnAToolkit = CanvasOnAToolkit;
 
 TEST_F(FindingOnAToolkit, ATableReportsUnderItsName) {

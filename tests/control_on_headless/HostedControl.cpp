@@ -3,6 +3,7 @@
 #include "support/Backstage.h"
 #include "support/Tables.h"
 
+#include <new>
 #include <unordered_map>
 #include <unordered_set>
 #include <utility>
@@ -201,6 +202,8 @@ void HostedControl::step(const std::function<void()>& deed) {
         // The host has taken away what the user was about to touch.
     } catch (const platform::RuntimeError&) {
         // Or made it what cannot be touched.
+    } catch (const std::bad_alloc&) {
+        // Or there was no memory left for the hand itself.
     }
 }
 
@@ -219,6 +222,6 @@ std::string HostedControl::broken() {
     model = newModel();
     bind(model);
     if (toolkit.boxes().size() != boxes)
-        all += "binding anew: " + platform::toUtf8(toolkit.boxes().back().prompt);
+        all += "binding anew: " + platform::toUtf8(toolkit.boxes()[boxes].prompt);
     return all + mInvariants->broken(*model);
 }

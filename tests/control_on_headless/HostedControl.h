@@ -54,6 +54,7 @@ public:
     std::string broken();
 
     TalvikDBxZandor::Zandor& control() { return *mControl; }
+    Invariants& invariants() { return *mInvariants; }
     /// From now on the control asks the host.
     void ask();
     void bind(const zandor::platform::Ref<fake::Model>& model);

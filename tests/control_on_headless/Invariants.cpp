@@ -56,10 +56,12 @@ void Invariants::checkTables() {
     std::int32_t free = 0;
     for (std::int16_t i = 1; i <= Backstage::lastTableSlot; ++i) {
         free += slots.IsFree(i);
-        if (slots.IsFree(i) == tables.has(i)) mBroken << "table slot " << i << " disagrees\n";
+        if (tables.has(i) ? slots.IsFree(i) : !slots.IsFree(i) && !mSlotsLost)
+            mBroken << "table slot " << i << " disagrees\n";
     }
     if (slots.FreeCount() != free) mBroken << "the count of free table slots disagrees\n";
-    if (tables.count() != 1U + static_cast<std::size_t>(Backstage::lastTableSlot - free))
+    const auto taken = static_cast<std::size_t>(Backstage::lastTableSlot - free);
+    if (mSlotsLost ? tables.count() > 1 + taken : tables.count() != 1 + taken)
         mBroken << "there are table lists without a slot\n";
 }
 
@@ -72,13 +74,16 @@ void Invariants::checkJoins() {
     for (std::int16_t n = 1; n <= Backstage::lastJoinSlot; ++n) {
         const bool taken = !slots.IsFree(n);
         free += !taken;
-        if (lines.has(n) != taken) mBroken << "line " << n << " disagrees with its slot\n";
-        if (marks.has(2 * n) != taken || marks.has(2 * n - 1) != taken)
+        if (lines.has(n) ? !taken : taken && !mSlotsLost)
+            mBroken << "line " << n << " disagrees with its slot\n";
+        const bool whole = marks.has(2 * n) && marks.has(2 * n - 1);
+        const bool none = !marks.has(2 * n) && !marks.has(2 * n - 1);
+        if (taken ? !whole && !mSlotsLost : !none)
             mBroken << "the marks of line " << n << " disagree with its slot\n";
     }
     const auto taken = static_cast<std::size_t>(Backstage::lastJoinSlot - free);
     if (slots.FreeCount() != free) mBroken << "the count of free join slots disagrees\n";
-    if (lines.count() != 1 + taken || marks.count() != 1 + 2 * taken)
+    if (!mSlotsLost && (lines.count() != 1 + taken || marks.count() != 1 + 2 * taken))
         mBroken << "there are lines or marks without a slot\n";
 }
 
@@ -88,10 +93,10 @@ void Invariants::checkRecords() {
     const auto& tables = Backstage::lstTable(mControl);
     const Loaded lines(Backstage::linJoin(mControl));
     const Loaded marks(Backstage::shpJoin(mControl));
-    const auto isShown = [&tables](std::int32_t handle, const platform::String& name) {
+    const auto isShown = [&](std::int32_t handle, const platform::String& name) {
         return std::any_of(tables.begin(), tables.end(), [&](const auto& element) {
             return element.first != 0 && element.second->TableHandle() == handle &&
-                   element.second->Text() == name;
+                   (element.second->Text() == name || (mSlotsLost && name.empty()));
         });
     };
     for (const auto& record : platform::Each<TalvikDBxZandor::clsJoinLine>(records)) {

@@ -25,6 +25,9 @@ public:
     /// when another model is bound, so that they may outlive their definitions, or bear the number
     /// of another's.
     void abandonColumns();
+    /// From here on a slot may stay taken for what could not be made or drawn, and a join may not
+    /// know the name of a table: the toolkit has failed, or there was no memory.
+    void loseSlots() { mSlotsLost = true; }
     /// Remembers what the control holds now.
     void watch() { watchElements(); }
     /// What the control held has been destroyed.
@@ -48,6 +51,7 @@ private:
     std::ostringstream mBroken;
     std::set<std::int32_t> mLeftOver; ///< key numbers of columns that may outlive their definitions
     bool mAbandoned = false;
+    bool mSlotsLost = false;
 
     struct Watched {
         const char* kind;

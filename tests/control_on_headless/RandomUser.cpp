@@ -3,6 +3,9 @@
 #include "control/GridStage.h"
 #include "support/Backstage.h"
 
+#include <new>
+#include <stdexcept>
+
 using namespace zandor;
 
 using Backstage = TalvikDBxZandor::ZandorBackstage;
@@ -13,9 +16,6 @@ using gridstage::enter;
 using gridstage::escape;
 using gridstage::left;
 using gridstage::right;
-
-RandomUser::RandomUser(std::uint64_t seed, fake::Library& library)
-    : mEngine(seed), mLibrary(library) {}
 
 void RandomUser::open() {
     mStage = Stage::open(mLibrary);
@@ -59,6 +59,8 @@ void RandomUser::act() {
         {"editCell", &RandomUser::editCell, 8},
         {"useEditor", &RandomUser::useEditor, 2},
         {"resizeControl", &RandomUser::resizeControl, 3},
+        {"useGrid", &RandomUser::useGrid, 6},
+        {"useComforts", &RandomUser::useComforts, 2},
         {"host", &RandomUser::host, 4},
     };
     std::int32_t total = 0;
@@ -68,6 +70,7 @@ void RandomUser::act() {
         drawn -= action.weight;
         if (drawn > 0) continue;
         mLast = action.name;
+        if (mModelsFail) armModel();
         try {
             (this->*action.action)();
             ++mDone;
@@ -78,6 +81,7 @@ void RandomUser::act() {
         }
         break;
     }
+    mLibrary.calls->disarm();
     hear();
 }
 
@@ -104,10 +108,9 @@ void RandomUser::hear() {
     mStage->transcript.clear();
 }
 
-/// The same on every standard library, which its distributions are not.
 std::int32_t RandomUser::number(std::int32_t from, std::int32_t to) {
     const auto span = static_cast<std::uint64_t>(std::int64_t{to} - from + 1);
-    return static_cast<std::int32_t>(from + static_cast<std::int64_t>(mEngine() % span));
+    return static_cast<std::int32_t>(from + static_cast<std::int64_t>(mDraw(span)));
 }
 
 headless::Toolkit& RandomUser::toolkit() {
@@ -320,8 +323,67 @@ void RandomUser::resizeControl() {
                           static_cast<float>(sensible ? number(6000, 12000) : number(0, 40000)));
 }
 
+/// By keys, and by the fields at the heads of the columns.
+void RandomUser::useGrid() {
+    const std::int32_t col = std::max(1, column());
+    switch (number(0, 6)) {
+    case 0: return mStage->typeInGrid(text());
+    case 1: return mStage->editCell();
+    case 2: return mStage->moveCurrentColumn(chance(50) ? 1 : -1);
+    case 3: return mStage->dragField(col, std::max(1, column()));
+    case 4: return mStage->dragBorder(col, static_cast<float>(chance(30) ? 0 : number(1, 9000)));
+    case 5:
+        mStage->clickField(col);
+        if (chance(70)) mStage->pickField(chance(50) ? u"ID" : String());
+        return;
+    default: return mStage->leaveControl();
+    }
+}
+
+void RandomUser::useComforts() {
+    switch (number(0, 3)) {
+    case 0: {
+        auto flags = comforts::Flags::all();
+        flags.KeepsTyping = chance(50);
+        flags.OffersFields = chance(50);
+        flags.FitsColumns = chance(50);
+        flags.ReadsJoins = chance(50);
+        return mStage->comforts().setFlags(chance(30) ? comforts::Flags() : flags);
+    }
+    case 1: {
+        const std::int16_t table = slot();
+        return mStage->doubleClickEntry(table, reachEntry(table));
+    }
+    case 2: {
+        const std::int16_t from = slot();
+        const std::int32_t entry = reachEntry(from);
+        const std::int16_t across = slot();
+        const std::int32_t passed = reachEntry(across);
+        const auto [row, col] = reachCell();
+        return mStage->dragAcross(from, entry, across, passed, row, col);
+    }
+    default: return mStage->comforts().takeOver();
+    }
+}
+
+/// Of the calls that the next action makes one fails, if it comes to it.
+void RandomUser::armModel() {
+    if (!chance(25)) return;
+    const auto& names = fake::memberNames();
+    const auto& name =
+        names[static_cast<std::size_t>(number(0, static_cast<std::int32_t>(names.size()) - 1))];
+    const std::int32_t nth = chance(60) ? 1 : number(1, 8);
+    switch (number(0, 2)) {
+    case 0: return mLibrary.calls->failNext(name, std::bad_alloc(), nth);
+    case 1: return mLibrary.calls->failNext(name, std::runtime_error("what a host throws"), nth);
+    default:
+        return mLibrary.calls->failNext(name, platform::RuntimeError{1234, u"The host refuses."},
+                                        nth);
+    }
+}
+
 void RandomUser::host() {
-    switch (number(0, 11)) {
+    switch (number(0, 14)) {
     case 0: return control().OnlyJoin(!mCalm && chance(20));
     case 1: return control().SetCurrentTable(u"T" + platform::decimal(number(0, 8)));
     case 2: return control().SelectColumnNames(u"T" + platform::decimal(number(0, 8)), u"ID");
@@ -338,6 +400,9 @@ void RandomUser::host() {
         mInvariants->abandonColumns();
         control().Terminate();
         return bind(newModel());
+    case 9: return control().ShowAnew();
+    case 10: return control().ReadOnly(chance(20));
+    case 11: return control().UpperPaneShare(static_cast<float>(number(0, 100)) / 100);
     default: return control().HorizontalScrollbarPos(static_cast<std::int16_t>(number(0, 9000)));
     }
 }

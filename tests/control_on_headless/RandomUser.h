@@ -3,12 +3,18 @@
 #include "Invariants.h"
 #include "support/Stage.h"
 
-#include <random>
+#include <cstdint>
+#include <functional>
 
 /// A user, and a host, who do at random what a user and a host can do.
 class RandomUser {
 public:
-    RandomUser(std::uint64_t seed, fake::Library& library);
+    /// Draws one of so many numbers, from 0.
+    using Draw = std::function<std::uint64_t(std::uint64_t span)>;
+    RandomUser(Draw draw, fake::Library& library) : mDraw(std::move(draw)), mLibrary(library) {}
+
+    /// From now on the model fails now and then, with any error.
+    void haveModelsFail() { mModelsFail = true; }
 
     /// A fresh control with a fresh model on it.
     void open();
@@ -60,7 +66,10 @@ private:
     void editCell();
     void useEditor();
     void resizeControl();
+    void useGrid();
+    void useComforts();
     void host();
+    void armModel();
     void bind(const zandor::platform::Ref<fake::Model>& model);
 
     String chooseFromMenu(const std::vector<Stage::Entry>& entries);
@@ -68,11 +77,12 @@ private:
     void hear();
     std::pair<float, float> placeOnCanvas();
 
-    std::mt19937_64 mEngine;
+    const Draw mDraw;
     fake::Library& mLibrary;
     std::unique_ptr<Stage> mStage;
     std::unique_ptr<Invariants> mInvariants;
     zandor::platform::Ref<fake::Model> mModel;
+    bool mModelsFail = false;
     bool mCalm = false; ///< no table is closed, so that the grid fills up
     std::string mLast;
     int mDone = 0;

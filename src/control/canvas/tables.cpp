@@ -148,9 +148,12 @@ bool Zandor::RemoveTable(std::int16_t Index) {
         DeletedTable = name;
         RemoveColumnsOf(name);
 
+        // By name, as hosts know it; by handle for one that there was no memory to write a name to.
+        const std::int32_t handle = table->TableHandle();
         std::vector<Ref<clsJoinLine>> joins;
         for (const auto& record : platform::Each<clsJoinLine>(mJoinLines))
-            if (record->LeftTableName() == name || record->RightTableName() == name)
+            if (record->LeftTableName() == name || record->RightTableName() == name ||
+                record->LeftTablehwnd() == handle || record->RightTablehwnd() == handle)
                 joins.push_back(record);
         for (const auto& record : joins)
             if (Draws(record)) RemoveJoin(record);
@@ -245,8 +248,8 @@ void Zandor::SetFocusBack() {
             return;
         }
         for (std::int16_t i = 1; i <= lastTableSlot; ++i) {
-            if (mTableFreeList->IsFree(i)) continue;
-            if (lstTable(i)->Top() > 0 && lstTable(i)->Left() > 0) {
+            const Ref<Tabulet> shown = lstTable.Find(i);
+            if (shown && shown->Top() > 0 && shown->Left() > 0) {
                 mActiveTableIndex = i;
                 return;
             }

@@ -58,11 +58,6 @@ void frmJoinDefinition::Form_Initialize() {
     Guard(u"Form_Initialize", [&] { cmdOk->Default(true); });
 }
 
-clsJoinLine& frmJoinDefinition::SavedLine() {
-    if (!mSavedLine) mSavedLine = platform::makeRef<clsJoinLine>(mLife);
-    return *mSavedLine;
-}
-
 void frmJoinDefinition::ShowName(const Part<platform::TextBox>& box, StringView labelText,
                                  const platform::String& name) {
     if (mDebug)
@@ -88,7 +83,9 @@ void frmJoinDefinition::Join(const platform::Ref<TalvikZandorLib::ZDJoin>& value
 void frmJoinDefinition::JoinLine(const platform::Ref<clsJoinLine>& value) {
     Guard(u"P_SET JoinLine", [&] {
         mJoinLine = value;
-        SavedLine().CopyFields(*mJoinLine);
+        const auto saved = platform::makeRef<clsJoinLine>(mLife);
+        saved->CopyFields(*mJoinLine);
+        mSavedLine = saved;
     });
 }
 
@@ -129,7 +126,8 @@ void frmJoinDefinition::cmdOk_Click() {
 
 void frmJoinDefinition::cmdCancel_Click() {
     Guard(u"cmdCancel_Click", [&] {
-        mJoinLine->CopyFields(SavedLine());
+        // Where nothing could be saved, nothing was changed either.
+        if (mSavedLine) mJoinLine->CopyFields(*mSavedLine);
         form->Hide();
     });
 }

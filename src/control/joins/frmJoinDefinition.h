@@ -51,7 +51,6 @@ private:
     template <class Body>
     void Guard(platform::StringView procedure, Body&& body) const;
     void Form_Initialize();
-    clsJoinLine& SavedLine();
     void ShowName(const Part<platform::TextBox>& box, platform::StringView label,
                   const platform::String& name);
     void cmdOk_Click();
@@ -61,7 +60,7 @@ private:
     const bool mDebug;
     Held<TalvikZandorLib::ZDJoin> mJoin;
     platform::Ref<clsJoinLine> mJoinLine;
-    platform::Ref<clsJoinLine> mSavedLine;
+    platform::Ref<clsJoinLine> mSavedLine; ///< as it was when the dialog opened
     bool mJoinIsModified = false;
     std::int16_t mJoinModifyDisabled = 0;
 };

@@ -4,6 +4,8 @@
 #include <Zandor/platform/Variant.h>
 #include <Zandor/platform/export.h>
 
+#include <utility>
+
 namespace TalvikDBxZandor {
 
 /// The canvas record of one join. A plain record: no setter checks its value; handles, codes and
@@ -49,7 +51,10 @@ public:
     // clang-format on
 
     /// Takes over all fifteen fields of another record.
-    void CopyFields(const clsJoinLine& other) { mFields = other.mFields; }
+    void CopyFields(const clsJoinLine& other) {
+        Fields copy = other.mFields; // all or none
+        mFields = std::move(copy);
+    }
 
     /// Whether a side names a column of this name, without copying the name: drawing asks this
     /// once for every entry of a table.

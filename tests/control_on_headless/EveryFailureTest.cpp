@@ -1,0 +1,177 @@
+#include "Allocations.h"
+#include "Plays.h"
+#include "support/Backstage.h"
+#include "support/Sample.h"
+
+#include <iostream>
+#include <new>
+#include <stdexcept>
+
+using namespace zandor;
+
+namespace {
+
+using Backstage = TalvikDBxZandor::ZandorBackstage;
+
+/// What fails under a control.
+enum class Failing { toolkit, model, memory };
+
+const char* name(Failing failing) {
+    return failing == Failing::toolkit ? "toolkit" : failing == Failing::model ? "model" : "memory";
+}
+
+/// Counts the calls of a toolkit or a model, or what is taken from the free store, and has one of
+/// them fail.
+class Countdown {
+public:
+    /// `nth` from 1; 0 has none fail.
+    Countdown(HostedControl& hosted, Failing failing, std::size_t nth)
+        : mHosted(hosted), mFailing(failing), mNth(nth), mBefore(allocations::count()) {
+        const auto pass = [this](const std::string& call) {
+            if (++mCalls != mNth) return;
+            where = call;
+            throw platform::RuntimeError{1234, u"It fails."};
+        };
+        hosted.toolkit.faults.onPass = nullptr;
+        hosted.library.calls->onPass = nullptr;
+        if (failing == Failing::toolkit) hosted.toolkit.faults.onPass = pass;
+        if (failing == Failing::model) hosted.library.calls->onPass = pass;
+        if (failing == Failing::memory && nth > 0) allocations::failNext(nth);
+    }
+    Countdown(const Countdown&) = delete;
+    Countdown& operator=(const Countdown&) = delete;
+    ~Countdown() { stop(); }
+
+    /// Returns how many there were.
+    std::size_t stop() {
+        allocations::disarm();
+        if (mFailing == Failing::memory) mCalls = allocations::count() - mBefore;
+        mHosted.toolkit.faults.onPass = nullptr;
+        mHosted.library.calls->onPass = nullptr;
+        return mCalls;
+    }
+
+    std::string where;
+
+private:
+    HostedControl& mHosted;
+    const Failing mFailing;
+    const std::size_t mNth;
+    const std::size_t mBefore;
+    std::size_t mCalls = 0;
+};
+
+struct Outcome {
+    std::size_t calls = 0;
+    std::size_t reports = 0;
+    std::string where;
+    std::string wrong;
+};
+
+std::size_t reportsOf(const HostedControl& hosted) {
+    return static_cast<std::size_t>(std::ranges::count(
+        hosted.stage->boxes, Stage::String(u"Unexpected Error:"), &Stage::Box::title));
+}
+
+/// The table list that shows a table now.
+std::string listOf(HostedControl& hosted, platform::StringView title) {
+    for (const auto& [slot, table] : Backstage::lstTable(hosted.control()))
+        if (slot != 0 && table->Text() == title) return "lstTable(" + std::to_string(slot) + ")";
+    return "a table that is not shown";
+}
+
+/// What does not work of what a user does next, with a model freshly bound.
+std::string nextActs(HostedControl& c) {
+    std::string wrong;
+    const auto expect = [&](bool works, const char* what) {
+        if (!works) wrong += std::string(what) + " does not work\n";
+    };
+    try {
+        // Wherever it was left.
+        c.control().ReadOnly(true);
+        c.control().ReadOnly(false);
+        c.user.resizeControl(12000, 9000);
+        c.control().HorizontalScrollbarPos(0);
+        c.control().VerticalScrollbarPos(0);
+        c.user.scrollGrid("sprColumn", 1, 1);
+        c.user.pressCell("sprColumn", 1, 4, 1);
+        c.user.type("txtValue", u"= 7");
+        c.user.key("txtValue", 13);
+        expect(c.model->definitionAt(1).criterion(u"4") == u"= 7", "a criterion");
+        c.user.moveTable(listOf(c, u"PARTS"), 300, 450);
+        expect(c.model->tableAt(3).left == 300, "moving a table");
+        const auto joins = c.model->joinCount();
+        c.user.dragToEntry(listOf(c, u"ORDERS"), 2, listOf(c, u"PARTS"), 3);
+        expect(c.model->joinCount() == joins + 1, "drawing a join");
+        c.user.closeTable(listOf(c, u"CUSTOMERS"));
+        expect(c.model->tableCount() == 2, "closing a table");
+    } catch (const std::exception& error) {
+        wrong += std::string("the user cannot go on: ") + error.what() + '\n';
+    }
+    return wrong;
+}
+
+Outcome played(const Play& play, Failing failing, std::size_t nth) {
+    HostedControl c(play.fill);
+    c.control().DebugSwitch(0);
+    c.bind(c.model);
+    Outcome outcome;
+    Countdown countdown(c, failing, nth);
+    try {
+        play.play(c);
+    } catch (const std::bad_alloc&) {
+        // Between two steps it was the script's own memory.
+    }
+    outcome.calls = countdown.stop();
+    outcome.where = countdown.where;
+    if (!c.gone()) outcome.reports = reportsOf(c);
+    if (failing != Failing::model) c.invariants().loseSlots();
+    outcome.wrong = c.broken();
+    if (c.gone()) return outcome;
+    const std::size_t before = reportsOf(c);
+    outcome.wrong += nextActs(c);
+    if (reportsOf(c) != before)
+        outcome.wrong +=
+            "what comes next is reported: " + platform::toUtf8(c.stage->boxes.back().text) + '\n';
+    return outcome;
+}
+
+/// Every so many-th is tried, that the whole takes seconds; ZANDOR_SAMPLE=1 tries all of them.
+std::size_t stepOf(Failing failing) {
+    if (std::getenv("ZANDOR_SAMPLE")) return static_cast<std::size_t>(sampleStep());
+    return failing == Failing::toolkit ? 97 : 5;
+}
+
+class EveryFailure : public testing::TestWithParam<Play> {};
+
+// Each play begins at another of the first calls, so that the steps do not all fall on the same.
+void tryAll(const Play& play, Failing failing) {
+    const Outcome whole = played(play, failing, 0);
+    ASSERT_EQ(whole.wrong, "") << "with nothing failing";
+    const std::size_t step = stepOf(failing);
+    std::size_t tried = 0, silent = 0, several = 0, most = 0;
+    int failures = 0;
+    for (std::size_t nth = 1 + play.name.size() % step; nth <= whole.calls; nth += step) {
+        const Outcome outcome = played(play, failing, nth);
+        ++tried;
+        const std::size_t reports = std::max(outcome.reports, whole.reports) - whole.reports;
+        silent += reports == 0;
+        several += reports > 1;
+        most = std::max(most, reports);
+        if (outcome.wrong.empty()) continue;
+        ADD_FAILURE() << name(failing) << ' ' << nth << " (" << outcome.where
+                      << "): " << outcome.wrong;
+        if (++failures == 10) GTEST_FAIL() << "and so on";
+    }
+    std::cout << "[ FAULTS   ] " << tried << " of " << whole.calls << " of the " << name(failing)
+              << " tried in " << play.name << "; without a report " << silent << ", with several "
+              << several << ", at most " << most << '\n';
+}
+
+TEST_P(EveryFailure, OfTheToolkitLeavesAControlThatGoesOn) { tryAll(GetParam(), Failing::toolkit); }
+TEST_P(EveryFailure, OfTheModelLeavesAControlThatGoesOn) { tryAll(GetParam(), Failing::model); }
+TEST_P(EveryFailure, OfMemoryLeavesAControlThatGoesOn) { tryAll(GetParam(), Failing::memory); }
+
+INSTANTIATE_TEST_SUITE_P(During, EveryFailure, testing::ValuesIn(plays()), nameOf);
+
+} // namespace
