@@ -174,7 +174,7 @@ void Canvas::paintEvent(QPaintEvent* event) {
     for (const CanvasItem* item : mItems)
         if (!item->isGround() && shown(item)) item->paint(painter, palette());
     for (const CanvasItem* item : mItems)
-        if (shown(item)) item->paintAbove(painter, palette());
+        if (item->reachesAbove() && shown(item)) item->paintAbove(painter, palette());
     if (frameShown()) paintFocusFrame(painter, seen, palette());
 }
 

@@ -27,7 +27,8 @@ public:
     virtual int layer() const = 0;
     /// Whatever the painter is set to.
     virtual void paint(QPainter& painter, const QPalette& palette) const = 0;
-    /// What stands above every line and mark.
+    /// Whether something of the item stands above every line and mark.
+    virtual bool reachesAbove() const { return false; }
     virtual void paintAbove(QPainter&, const QPalette&) const {}
     /// The canvas has another font.
     void fontChanged() { changed(); }
@@ -62,11 +63,11 @@ protected:
 private:
     void note();
 
-    Canvas* mCanvas;
-    QString mName;
     /// What a drag moves is changed before each painting.
     static constexpr int paintingsToRest = 2;
 
+    Canvas* mCanvas;
+    QString mName;
     mutable QRegion mExtent; ///< as it was last asked for
     mutable bool mMeasured = true;
     bool mNoted = false; ///< by the canvas, as one that changes
@@ -105,6 +106,7 @@ public:
     /// A highlighted line stands above the others.
     bool isGround() const override { return mBorderWidth <= 1 && !focused(); }
     void paint(QPainter& painter, const QPalette& palette) const override;
+    bool reachesAbove() const override { return !(mNotes == LineNotes{}); }
     void paintAbove(QPainter& painter, const QPalette& palette) const override;
 
 private:

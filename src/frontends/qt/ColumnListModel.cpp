@@ -14,7 +14,7 @@ int ColumnListModel::rowCount(const QModelIndex& parent) const {
 
 QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid() || index.row() >= rowCount()) return {};
-    if (role == Qt::DisplayRole) return mRows[static_cast<std::size_t>(index.row())].shown;
+    if (role == Qt::DisplayRole) return asSigns(at(index.row()).text);
     if (role == pictureRole && picture(index.row())) return static_cast<int>(*picture(index.row()));
     if (role == outputRole) return at(index.row()).comesOut;
     if (role == Qt::AccessibleDescriptionRole) return description(at(index.row()));
@@ -31,7 +31,7 @@ QVariant ColumnListModel::description(const Row& row) const {
 void ColumnListModel::append(const QString& text) {
     const int row = rowCount();
     beginInsertRows({}, row, row);
-    mRows.push_back({text, asSigns(text), {}});
+    mRows.push_back({text, {}});
     endInsertRows();
 }
 

@@ -33,7 +33,6 @@ public:
 private:
     struct Row {
         QString text;
-        QString shown;
         std::optional<Picture> picture;
         bool comesOut = false;
     };

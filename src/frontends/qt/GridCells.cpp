@@ -87,6 +87,13 @@ void paintFixedCell(QPainter& painter, QStyleOptionHeader option, const QWidget&
     style.drawControl(QStyle::CE_HeaderLabel, &option, &painter, &widget);
 }
 
+QSize GridHeader::sizeHint() const {
+    const bool across = orientation() == Qt::Horizontal;
+    const bool fixed =
+        across ? minimumHeight() == maximumHeight() : minimumWidth() == maximumWidth();
+    return fixed ? minimumSize() : QHeaderView::sizeHint();
+}
+
 QSize GridHeader::sizeFor(const QString& text) const {
     ensurePolished();
     QStyleOptionHeader option;

@@ -39,6 +39,8 @@ public:
 
     /// What a section needs for a text, in logical pixels.
     QSize sizeFor(const QString& text) const;
+    /// Of a header of a fixed size, which the view asks for at every change, no text is measured.
+    QSize sizeHint() const override;
 
 protected:
     void changeEvent(QEvent* event) override;

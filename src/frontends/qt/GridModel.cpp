@@ -11,8 +11,27 @@ namespace zandor::platform::qt {
 
 GridModel::GridModel(int rows, int cols, QObject* parent)
     : QAbstractTableModel(parent), mRows(rows), mColumns(static_cast<std::size_t>(cols)) {
-    for (Column& column : mColumns) column.cells.resize(static_cast<std::size_t>(rows));
     setWords({});
+}
+
+const GridModel::Cell& GridModel::cell(int row, int col) const {
+    static const Cell blank;
+    const auto& cells = column(col).cells;
+    return cells.empty() ? blank : cells[static_cast<std::size_t>(row)];
+}
+
+GridModel::Cell& GridModel::writable(int row, int col) {
+    auto& cells = column(col).cells;
+    cells.resize(static_cast<std::size_t>(mRows));
+    return cells[static_cast<std::size_t>(row)];
+}
+
+void GridModel::setText(int row, int col, const QString& text) {
+    if (text != cell(row, col).text) writable(row, col).text = text;
+}
+
+void GridModel::setNote(int row, int col, const QString& note) {
+    if (note != cell(row, col).note) writable(row, col).note = note;
 }
 
 void GridModel::setAlignment(int row, int col, std::int16_t alignment) {
@@ -22,7 +41,7 @@ void GridModel::setAlignment(int row, int col, std::int16_t alignment) {
     static constexpr std::array<Qt::AlignmentFlag, 3> down = {Qt::AlignTop, Qt::AlignVCenter,
                                                               Qt::AlignBottom};
     const auto place = static_cast<std::size_t>(alignment > 8 ? 1 : alignment);
-    cell(row, col).alignment = across[place / 3] | down[place % 3];
+    writable(row, col).alignment = across[place / 3] | down[place % 3];
 }
 
 void GridModel::setWords(const Words& words) {

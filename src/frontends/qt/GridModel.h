@@ -23,11 +23,11 @@ public:
     int cols() const { return static_cast<int>(mColumns.size()); }
 
     const QString& text(int row, int col) const { return cell(row, col).text; }
-    void setText(int row, int col, const QString& text) { cell(row, col).text = text; }
+    void setText(int row, int col, const QString& text);
     void setAlignment(int row, int col, std::int16_t alignment);
     /// What there is to say about a cell; empty: nothing.
     const QString& note(int row, int col) const { return cell(row, col).note; }
-    void setNote(int row, int col, const QString& note) { cell(row, col).note = note; }
+    void setNote(int row, int col, const QString& note);
     /// Twips.
     float width(int col) const { return column(col).width; }
     void setWidth(int col, float width) { column(col).width = width; }
@@ -57,7 +57,7 @@ private:
     };
 
     struct Column {
-        std::vector<Cell> cells;
+        std::vector<Cell> cells; ///< none until one of them is written; most columns are blank
         float width = 0;
         std::int32_t data = 0;
     };
@@ -65,10 +65,8 @@ private:
     static QVariant valueOf(const Cell& cell, int role);
     const Column& column(int col) const { return mColumns[static_cast<std::size_t>(col)]; }
     Column& column(int col) { return mColumns[static_cast<std::size_t>(col)]; }
-    const Cell& cell(int row, int col) const {
-        return column(col).cells[static_cast<std::size_t>(row)];
-    }
-    Cell& cell(int row, int col) { return column(col).cells[static_cast<std::size_t>(row)]; }
+    const Cell& cell(int row, int col) const;
+    Cell& writable(int row, int col);
 
     QVariant arrow(int row, int col) const;
 

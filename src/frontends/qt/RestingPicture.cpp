@@ -78,15 +78,18 @@ bool RestingPicture::eventFilter(QObject* watched, QEvent* event) {
 }
 
 /// False when the part has to paint itself.
-bool RestingPicture::paint(QWidget& part, const QPaintEvent& event) const {
+bool RestingPicture::paint(QWidget& part, const QPaintEvent& event) {
+    const bool isBox = &part == &mBox;
+    // Whatever lets the box shine through is painted right after it.
+    if (!isBox && !paintsAllOfItself(part)) return mShown;
+    if (isBox) mShown = false;
     if (!isRight()) return false;
     const QPoint origin = part.mapFrom(&mBox, QPoint());
     QPainter painter(&part);
     if (!paintsOwnPixels(painter, part, origin)) return false;
-    // The box has painted below what lets it shine through.
-    if (&part != &mBox && !paintsAllOfItself(part)) return true;
     byRectangles(painter, event.region(),
                  [&](const QRect&) { painter.drawPixmap(origin, mPicture); });
+    if (isBox) mShown = true;
     return true;
 }
 

@@ -28,13 +28,14 @@ public:
 private:
     void watch(QWidget& part);
     bool isRight() const;
-    bool paint(QWidget& part, const QPaintEvent& event) const;
+    bool paint(QWidget& part, const QPaintEvent& event);
 
     QWidget& mBox;
     QPixmap mPicture;
     QPalette mPalette; ///< that the picture was taken with
     int mPaintings = 0;
     bool mTaking = false;
+    bool mShown = false; ///< by the last painting of the box
 };
 
 } // namespace zandor::platform::qt
