@@ -129,7 +129,9 @@ std::int16_t RandomUser::slot() {
 }
 
 std::int32_t RandomUser::entryOf(std::int16_t slot) {
-    return number(1, Backstage::lstTable(control())(slot)->ColumnItems().Count());
+    const std::int32_t count = Backstage::lstTable(control())(slot)->ColumnItems().Count();
+    if (count == 0) throw std::logic_error("the table has no entry");
+    return number(1, count);
 }
 
 std::int32_t RandomUser::reachEntry(std::int16_t slot) {

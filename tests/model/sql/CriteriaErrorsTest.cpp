@@ -39,6 +39,10 @@ TEST_F(ABadCriterion, HasSomethingBehindItsEnd) {
                 "put And or Or between two conditions, or quotes around a text");
     expectError(u"text", u"'a' b", 4,
                 "put And or Or between two conditions, or quotes around a text");
+    expectError(u"text", u"'a' 'or' 'b'", 4,
+                "put And or Or between two conditions, or quotes around a text");
+    expectError(u"text", u"[text] .x", 7,
+                "put And or Or between two conditions, or quotes around a text");
     expectError(u"text", u"Smith, John", 5,
                 "put And or Or between two conditions, or quotes around a text");
     expectError(u"text", u"a=b", 1,
@@ -91,6 +95,7 @@ TEST_F(ABadCriterion, ComparesWithNull) {
 
 TEST_F(ABadCriterion, UsesAnOperatorOfAnotherLanguage) {
     expectError(u"whole", u"!= 1", 0, "write <> for unequal");
+    expectError(u"text", u"a!b", 1, "write <> for unequal");
     expectError(u"whole", u"== 1", 1, "a number is missing");
     expectError(u"whole", u"=> 1", 1, "a number is missing");
 }

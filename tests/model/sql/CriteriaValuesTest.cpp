@@ -50,6 +50,8 @@ TEST_F(AValue, KeepsEveryDigitOfADecimalAndKnowsAWholeNumber) {
     EXPECT_EQ(value(u"0.10").type, model::ColumnType::Decimal);
     EXPECT_EQ(value(u"999999999999999999").type, model::ColumnType::Integer);
     EXPECT_EQ(value(u"1000000000000000000").type, model::ColumnType::Decimal);
+    // Engines read a number with an exponent as no whole one.
+    EXPECT_EQ(value(u"0e5").type, model::ColumnType::Decimal);
 }
 
 TEST_F(AValue, ThatIsNoNumberIsRefusedForANumberColumn) {

@@ -47,6 +47,7 @@ TEST_F(Expressions, HoldTogetherAsTheyWereTyped) {
     EXPECT_EQ(shown("whole * (number * 2)"), "t.whole * (t.number * 2)");
     EXPECT_EQ(shown("-whole * -(-number)"), "-(t.whole) * (-(-(t.number)))");
     EXPECT_EQ(shown("-5 - -5"), "-5 - -5");
+    EXPECT_EQ(shown("1e-3 - 1E+2 - 1e2"), "1e-3 - 1e+2 - 1e2");
     EXPECT_EQ(shown("text & whole + 1 & '!'"), "(t.text || CAST(t.whole + 1 AS TEXT)) || '!'");
     EXPECT_EQ(shown("Not whole = 1 Or number = 2 And truth"),
               "NOT (t.whole = 1) OR (t.number = 2 AND t.truth)");

@@ -1,4 +1,5 @@
 #include <Zandor/Library.h>
+#include <Zandor/model/Record.h>
 #include <Zandor/sql/Builder.h>
 
 #include <gtest/gtest.h>
@@ -62,6 +63,25 @@ TEST_F(CriteriaThatNameTables, FollowARenamedTableInEveryWayOfWriting) {
         << "in brackets where there were some";
     EXPECT_EQ(where(), "a.id = c.id\n"
                        "    OR (a.id = c.id AND a.id > c.weight)\n    OR a.id = 7");
+}
+
+TEST_F(CriteriaThatNameTables, KnowThePlacesOfTheirNamesAfterwards) {
+    defined(a, u"id", u"b.id Or [b].weight Or [weight] Or b.id");
+    for (const char16_t* const name : {u"a longer name", u"b"}) {
+        query->renameTable(b, name);
+        const auto record = query->record();
+        EXPECT_FALSE(model::faultOf(record)) << toUtf8(name) << ": the query could not be saved";
+        const auto& criterion = record.definitions.front().criteria.front();
+        std::vector<std::string> named;
+        for (const auto& each : criterion.names) {
+            const auto begin = static_cast<std::size_t>(each.begin);
+            const auto length = static_cast<std::size_t>(each.tableEnd) - begin;
+            named.push_back(toUtf8(criterion.text.substr(begin, length)));
+        }
+        const std::string written = "[" + toUtf8(name) + "]";
+        EXPECT_EQ(named, (std::vector<std::string>{written, written, "", written}))
+            << toUtf8(criterion.text);
+    }
 }
 
 TEST_F(CriteriaThatNameTables, GetBracketsWhereTheNewNameNeedsThem) {
