@@ -54,6 +54,9 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     mView->setVerticalHeader(new RowTitles(mView));
     mCorner->raise();
     mView->setItemDelegate(new GridCellDelegate(*this, *mView));
+    // Fixed before there is a model, whose texts would be measured for their size.
+    mView->horizontalHeader()->setFixedHeight(0);
+    mView->verticalHeader()->setFixedWidth(0);
     mView->setModel(mModel);
     mView->setFrameShape(QFrame::NoFrame);
     mView->setEditTriggers(QTableView::NoEditTriggers);
