@@ -135,6 +135,14 @@ TEST(Criteria, RefuseAKeyThatIsNoCriteriaRow) {
     EXPECT_EQ(definition.Criteria().Count(), 0);
 }
 
+TEST(Criteria, GoDownToTheLastRowThatHasANumber) {
+    model::ColumnDefinition definition;
+    definition.AddCriterium(u"= 1", u"32767");
+    EXPECT_TRUE(definition.HasCriterium(u"32767"));
+    EXPECT_EQ(definition.Criteria().Count(), 32764);
+    EXPECT_EQ(definition.Criteria().Item(32764)->Criterium(), u"= 1");
+}
+
 TEST(Criteria, CanBeChangedAndRemoved) {
     model::ColumnDefinition definition;
     definition.AddCriterium(u"a", u"4");

@@ -210,3 +210,10 @@ TEST(AQuery, RefusesObjectsOfAnotherModelLibrary) {
     EXPECT_EQ(errorOf([&] { small.query->DeleteTable(foreign); }), 5);
     EXPECT_EQ(errorOf([&] { small.library.NewZDJoin()->LeftTable(foreign); }), 5);
 }
+
+TEST(TheNameOfATable, IsFoundInCapitalsOfAllLetters) {
+    model::Query query;
+    const auto table = query.addTable(SmallQuery::described(u"abcdefghijklmnopqrstuvwxyz"));
+    EXPECT_EQ(query.tableNamed(u"ABCDEFGHIJKLMNOPQRSTUVWXYZ"), table);
+    EXPECT_FALSE(query.tableNamed(u"@BCDEFGHIJKLMNOPQRSTUVWXY["));
+}

@@ -13,9 +13,11 @@ using platform::toUtf8;
 namespace {
 
 /// The ids of a table, and the names with another name.
-Ref<model::Query> idsOf(const String& table) {
+Ref<model::Query> idsOf(const String& table, model::ColumnType type = model::ColumnType::Integer) {
     auto query = platform::makeRef<model::Query>();
-    query->addTable(SmallQuery::described(table));
+    auto described = SmallQuery::described(table);
+    described.columns.front().type = type;
+    query->addTable(described);
     const auto add = [&](const char16_t* column, const char16_t* synonym) {
         const auto definition = platform::makeRef<model::ColumnDefinition>();
         definition->Column(query->tableNamed(table)->columnNamed(column));
@@ -152,6 +154,45 @@ TEST_F(ASavedQuery, IsReadAgainWithWhatHangsOnIt) {
     EXPECT_EQ(columns(), "c7 *\nc9 called\nc10 id + 1\n");
     EXPECT_EQ(first()->place().column(), column);
     EXPECT_EQ(paid->savedQuery()->record, changed->record());
+}
+
+TEST_F(ASavedQuery, KeepsAColumnWhoseTypeIsAnotherUnderItsKey) {
+    join();
+    const auto key = paid->columnNamed(u"id")->Key();
+    query.refreshQuery(paid, saved(idsOf(u"payments", model::ColumnType::Text)));
+    const auto column = paid->columnNamed(u"id");
+    EXPECT_EQ(column->Key(), key);
+    EXPECT_EQ(column->description().type, model::ColumnType::Text);
+    EXPECT_EQ(query.Joins().Item(1)->RightColumn(), column) << "the join has lost its column";
+}
+
+TEST_F(ASavedQuery, KeepsAColumnThatIsUsedInAnyOneWay) {
+    inner->ColumnDefinitions().Remove(inner->ColumnDefinitions().Item(1)->Key());
+    const auto column = paid->columnNamed(u"id");
+    const auto isUsed = [&] { return query.refusalOf(*paid, saved(inner)).has_value(); };
+    EXPECT_FALSE(isUsed());
+    join();
+    EXPECT_TRUE(isUsed()) << "on the right of a join";
+    query.Joins().Remove(query.Joins().Item(1)->Key());
+    const auto turned = platform::makeRef<model::Join>();
+    turned->LeftColumn(column);
+    turned->RightColumn(small.orders->columnNamed(u"id"));
+    query.AddJoin(turned);
+    EXPECT_TRUE(isUsed()) << "on the left of a join";
+    query.Joins().Remove(turned->Key());
+    output(column);
+    EXPECT_TRUE(isUsed()) << "as an output column";
+    query.ColumnDefinitions().Remove(first()->Key());
+    output(small.orders->columnNamed(u"id"));
+    first()->AddCriterium(u"> paid.id", u"4");
+    EXPECT_TRUE(isUsed()) << "in a criterion";
+    query.ColumnDefinitions().Remove(first()->Key());
+    const auto expression = platform::makeRef<model::ColumnDefinition>();
+    expression->expression(u"paid.id + 1");
+    query.AddColumnDefinition(expression);
+    EXPECT_TRUE(isUsed()) << "in an expression";
+    query.ColumnDefinitions().Remove(expression->Key());
+    EXPECT_FALSE(isUsed());
 }
 
 TEST_F(ASavedQuery, IsAskedAboutWithoutAChange) {

@@ -1,3 +1,5 @@
+#include "CriteriaReading.h"
+
 #include <Zandor/Library.h>
 #include <Zandor/sql/Builder.h>
 
@@ -230,4 +232,40 @@ TEST_F(AFinding, IsOneLineWhateverIsInTheNames) {
               "No join connects c   d with a b, so that every row of one comes "
               "with every row of the other: draw a join between them, add "
               "the table that lies between, or delete one.");
+}
+
+TEST(AllColumnsOfATable, ComeOutOnlyWhereTheyAreVisible) {
+    model::Query query;
+    const auto table = query.addTable(AllTypes::described(u"t"));
+    const auto all = platform::makeRef<model::ColumnDefinition>();
+    all->Column(table->Columns().Item(1));
+    all->Visible(false);
+    query.AddColumnDefinition(all);
+    const auto one = platform::makeRef<model::ColumnDefinition>();
+    one->Column(table->columnNamed(u"whole"));
+    query.AddColumnDefinition(one);
+    const auto statement = [&] {
+        return platform::toUtf8(model::sql::statementText(query, model::sql::Dialect::SQLite,
+                                                          model::sql::ValueForm::literal)
+                                    .text);
+    };
+    EXPECT_EQ(statement(), "SELECT\n    t.whole\nFROM t");
+    all->Visible(true);
+    EXPECT_EQ(statement(), "SELECT\n    t.*,\n    t.whole\nFROM t");
+}
+
+TEST(AllColumnsOfATable, CannotBeAskedForAValueAndMayHaveABlankCell) {
+    model::Query query;
+    const auto table = query.addTable(AllTypes::described(u"t"));
+    const auto all = platform::makeRef<model::ColumnDefinition>();
+    all->Column(table->Columns().Item(1));
+    all->AddCriterium(u"  ", u"4");
+    query.AddColumnDefinition(all);
+    EXPECT_TRUE(model::sql::build(query).findings.empty());
+    all->AddCriterium(u"> 1", u"5");
+    const auto findings = model::sql::build(query).findings;
+    ASSERT_EQ(findings.size(), 1U);
+    EXPECT_EQ(findings[0].kind, Finding::Kind::badCriterion);
+    EXPECT_EQ(findings[0].definition, all->Key());
+    EXPECT_EQ(findings[0].row, 5);
 }
