@@ -40,7 +40,14 @@ struct TheJoinUnderAPoint : JoinScene {
         join();
         join();
         bind();
-        for (const std::int16_t n : {1, 2, 3}) line(n).setEnds(-9000, -9000, -8000, -9000);
+        for (const std::int16_t n : {1, 2, 3}) put(n, -9000, -9000, -8000, -9000);
+    }
+
+    /// A record that names a line which there is not, and so cannot be drawn.
+    void loseLine(const String& key) {
+        record(key)->JoinLineIndex(99);
+        Back::DrawJoin(control, *record(key));
+        forget();
     }
 
     Record hit;
@@ -52,7 +59,7 @@ struct TheJoinUnderAPoint : JoinScene {
 };
 
 TEST_F(TheJoinUnderAPoint, IsOneCloserThan50) {
-    line(1).setEnds(1000, 1000, 3000, 1000);
+    put(1, 1000, 1000, 3000, 1000);
     EXPECT_TRUE(isHit(2000, 1049.9F));
     EXPECT_EQ(hit, record(u"1"));
     EXPECT_FALSE(isHit(2000, 1050));
@@ -62,7 +69,7 @@ TEST_F(TheJoinUnderAPoint, IsOneCloserThan50) {
 }
 
 TEST_F(TheJoinUnderAPoint, IsOneWhoseRangeOfXHoldsThePointEndsIncluded) {
-    line(1).setEnds(1000, 1000, 3000, 1000);
+    put(1, 1000, 1000, 3000, 1000);
     EXPECT_TRUE(isHit(1000, 1000));
     EXPECT_TRUE(isHit(3000, 1000));
     EXPECT_FALSE(isHit(999.9F, 1000));
@@ -70,7 +77,7 @@ TEST_F(TheJoinUnderAPoint, IsOneWhoseRangeOfXHoldsThePointEndsIncluded) {
 }
 
 TEST_F(TheJoinUnderAPoint, IsNeverBeyondTheRangeOfXOfASteepLineHoweverClose) {
-    line(1).setEnds(1000, 1000, 1010, 5000);
+    put(1, 1000, 1000, 1010, 5000);
     EXPECT_TRUE(isHit(1005, 3000));
     EXPECT_FALSE(isHit(999, 1001));
     EXPECT_FALSE(isHit(1011, 4999));
@@ -78,21 +85,21 @@ TEST_F(TheJoinUnderAPoint, IsNeverBeyondTheRangeOfXOfASteepLineHoweverClose) {
 
 TEST_F(TheJoinUnderAPoint, IsNotTestedForTheRangeOfY) {
     // Past the end of the steep line, in line with it and within its range of X.
-    line(1).setEnds(1000, 1000, 1010, 5000);
+    put(1, 1000, 1000, 1010, 5000);
     EXPECT_TRUE(isHit(1010, 5030));
 }
 
 TEST_F(TheJoinUnderAPoint, IsFoundWhicheverEndOfItsLineIsTheWesternOne) {
-    line(1).setEnds(3000, 2000, 1000, 1000);
+    put(1, 3000, 2000, 1000, 1000);
     EXPECT_TRUE(isHit(2000, 1500));
     EXPECT_FALSE(isHit(2000, 1600));
     EXPECT_FALSE(isHit(3001, 2000));
 }
 
 TEST_F(TheJoinUnderAPoint, IsTheNearest) {
-    line(1).setEnds(1000, 1000, 3000, 1000);
-    line(2).setEnds(1000, 1030, 3000, 1030);
-    line(3).setEnds(1000, 1060, 3000, 1060);
+    put(1, 1000, 1000, 3000, 1000);
+    put(2, 1000, 1030, 3000, 1030);
+    put(3, 1000, 1060, 3000, 1060);
     EXPECT_TRUE(isHit(2000, 1028));
     EXPECT_EQ(hit, record(u"2"));
     EXPECT_TRUE(isHit(2000, 1058));
@@ -102,14 +109,14 @@ TEST_F(TheJoinUnderAPoint, IsTheNearest) {
 }
 
 TEST_F(TheJoinUnderAPoint, IsTheEarlierOfTwoAtTheSameDistance) {
-    line(2).setEnds(1000, 1040, 3000, 1040);
-    line(3).setEnds(1000, 1000, 3000, 1000);
+    put(2, 1000, 1040, 3000, 1040);
+    put(3, 1000, 1000, 3000, 1000);
     EXPECT_TRUE(isHit(2000, 1020));
     EXPECT_EQ(hit, record(u"2"));
 }
 
 TEST_F(TheJoinUnderAPoint, IsAVerticalOneOnlyAtExactlyItsX) {
-    line(1).setEnds(2000, 1000, 2000, 3000);
+    put(1, 2000, 1000, 2000, 3000);
     EXPECT_TRUE(isHit(2000, 2000));
     EXPECT_FALSE(isHit(2000.5F, 2000));
     EXPECT_FALSE(isHit(1999.5F, 2000));
@@ -122,7 +129,7 @@ TEST_F(TheJoinUnderAPoint, IsTheOneHandedInWhenNoLineIsNear) {
 }
 
 TEST_F(TheJoinUnderAPoint, ReplacesTheOneHandedIn) {
-    line(1).setEnds(1000, 1000, 3000, 1000);
+    put(1, 1000, 1000, 3000, 1000);
     hit = record(u"2");
     EXPECT_TRUE(at(2000, 1000));
     EXPECT_EQ(hit, record(u"1"));
@@ -138,23 +145,23 @@ const Stage::Box noLine =
     controlErrorBox(u"JoinHitTest", 340, u"Control array element '99' doesn't exist");
 
 TEST_F(TheJoinUnderAPoint, IsAnsweredWithYesWhenTheSearchFails) {
-    record(u"1")->JoinLineIndex(99);
+    loseLine(u"1");
     EXPECT_TRUE(isHit(2000, 1000));
     EXPECT_EQ(hit, nullptr);
     EXPECT_EQ(stage->boxes, Boxes{noLine});
 }
 
 TEST_F(TheJoinUnderAPoint, IsTheOneFoundBeforeAFailureEndsTheSearch) {
-    line(1).setEnds(1000, 1030, 3000, 1030);
-    record(u"2")->JoinLineIndex(99);
-    line(3).setEnds(1000, 1000, 3000, 1000);
+    put(1, 1000, 1030, 3000, 1030);
+    loseLine(u"2");
+    put(3, 1000, 1000, 3000, 1000);
     EXPECT_TRUE(isHit(2000, 1000));
     EXPECT_EQ(hit, record(u"1"));
     EXPECT_EQ(stage->boxes, Boxes{noLine});
 }
 
 TEST_F(TheJoinUnderAPoint, IsOneOfNoLengthAtItsXBecauseTheFailedDistanceIsZero) {
-    line(1).setEnds(2000, 1000, 2000, 1000);
+    put(1, 2000, 1000, 2000, 1000);
     EXPECT_TRUE(isHit(2000, 7000));
     EXPECT_EQ(hit, record(u"1"));
     EXPECT_EQ(stage->boxes, Boxes{controlErrorBox(u"DeltaJoinLine", 11, u"Division by zero")});

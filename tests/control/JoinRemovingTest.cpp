@@ -151,7 +151,7 @@ TEST_F(ARemovedJoin, IsNoneWhereNoLineIsNear) {
 }
 
 TEST_F(ARemovedJoin, IsNoneWhereTheLineIs50Away) {
-    line().setEnds(3000, 1000, 5000, 1000);
+    put(1, 3000, 1000, 5000, 1000);
     Back::mPopupX(control) = 4000;
     Back::mPopupY(control) = 1050;
     Back::mnuJoinDelete_Click(control);

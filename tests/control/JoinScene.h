@@ -61,6 +61,10 @@ struct JoinScene : ::testing::Test {
     }
     Record record(const String& key = u"1") { return Back::mJoinLines(control).Item(key); }
     zandor::platform::Line& line(std::int16_t index = 1) { return *Back::linJoin(control)(index); }
+    /// Puts the line of a record where a test needs it.
+    void put(std::int16_t index, float x1, float y1, float x2, float y2) {
+        Back::PlaceLine(control, *record(zandor::platform::decimal(index)), x1, y1, x2, y2);
+    }
     std::int32_t joinCount() { return Back::mJoinLines(control).Count(); }
     bool isFree(std::int32_t number) { return Back::mJoinFreeList(control)->IsFree(number); }
 

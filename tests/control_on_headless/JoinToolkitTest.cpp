@@ -79,6 +79,48 @@ TEST_F(AJoinOnAFailingToolkit, ReportsEachStepOfADrawing) {
     }
 }
 
+TEST_F(AJoinOnAFailingToolkit, HasItsEndsLookedForOnceAndNotAtEveryStepOfAMove) {
+    const auto calls =
+        callsOf([this] { Back::lstTable_Moving(control, std::int16_t{1}); },
+                [](const std::string& call) {
+                    return call.ends_with(".Text") || call.ends_with(").ColumnItems.Item");
+                });
+    EXPECT_EQ(calls, (std::vector<std::string>{"lstTable(1).ColumnItems.Item",
+                                               "lstTable(2).ColumnItems.Item"}));
+}
+
+TEST_F(AJoinOnAFailingToolkit, IsInPlaceAtTheNextStepWhateverCallOfAStepFails) {
+    const auto step = [this](float left) {
+        table(1).Left(left);
+        Back::lstTable_Moving(control, std::int16_t{1});
+    };
+    const auto look = [this] {
+        const Stage::Seen seen = stage->look("linJoin(1)");
+        return std::vector{seen.X1,
+                           seen.Y1,
+                           seen.X2,
+                           seen.Y2,
+                           stage->look("shpJoin(1)").bounds.Left,
+                           stage->look("shpJoin(2)").bounds.Left};
+    };
+    step(1200);
+    const auto wanted = look();
+    const auto all = callsOf([&] { step(1200); }, [](const std::string&) { return true; }).size();
+    ASSERT_GT(all, 20U);
+    for (std::size_t failing = 0; failing < all; ++failing) {
+        step(9000);
+        std::size_t passed = 0;
+        table(1).Left(1200);
+        toolkit.faults.onPass = [&](const std::string&) {
+            if (passed++ == failing) throw invalidPropertyValue();
+        };
+        Back::lstTable_Moving(control, std::int16_t{1});
+        toolkit.faults.onPass = nullptr;
+        step(1200);
+        EXPECT_EQ(look(), wanted) << failing;
+    }
+}
+
 TEST_F(AJoinOnAFailingToolkit, OverflowsWhereALineEndIsBeyondAllNumbers) {
     line().setEnds(1, 2, 3, 4);
     table(1).setBounds({3e38F, 500, 3e38F, 2000});
@@ -106,8 +148,9 @@ TEST_F(AJoinOnAFailingToolkit, HasItsMarkAtTheEdgeOfATableWhoseTopCannotBeRead) 
 
 TEST_F(AJoinOnAFailingToolkit, ReportsALineThatCannotBeReadWhileSearching) {
     Record hit;
+    pointAt();
     toolkit.faults.failNext("linJoin(1).Y2", invalidPropertyValue());
-    EXPECT_TRUE(Back::JoinHitTest(control, hit, 4000.0F, 1000.0F));
+    EXPECT_TRUE(Back::JoinHitTest(control, hit, Back::mPopupX(control), Back::mPopupY(control)));
     EXPECT_EQ(hit, nullptr);
     EXPECT_EQ(stage->boxes, Boxes{controlErrorBox(u"JoinHitTest", 380, invalidValue)});
 }

@@ -64,3 +64,31 @@ TEST_F(AReadyMadeQuery, IsShownWithItsTotalsAndExpressionsAndLosesThemWithTheirT
     EXPECT_EQ(small.query->ColumnDefinitions().Count(), 1);
     EXPECT_TRUE(stage->boxes.empty());
 }
+
+TEST_F(AReadyMadeQuery, HasThoseColumnsActivatedWhoseEntriesAreSelected) {
+    stage->control().P_SET_Zandor(small.query);
+    const auto activated = [&](const char16_t* name) {
+        return small.orders->columnNamed(name)->activated();
+    };
+    stage->selectEntries(1, {2, 3});
+    stage->pressEntry(1, 3, 1);
+    EXPECT_EQ(activated(u"id"), 1);
+    EXPECT_EQ(activated(u"name"), 1);
+    stage->releaseEntry(1, 3, 1);
+    EXPECT_EQ(activated(u"id"), 0);
+    EXPECT_EQ(activated(u"name"), 1);
+    EXPECT_TRUE(stage->boxes.empty());
+}
+
+TEST_F(AReadyMadeQuery, TracesEachSelectedColumnAsAnyOtherDoes) {
+    stage->control().P_SET_Zandor(small.query);
+    stage->selectEntries(1, {2});
+    stage->boxes.clear();
+    stage->control().DebugSwitch(1);
+    stage->pressEntry(1, 2, 1);
+    stage->control().DebugSwitch(0);
+    ASSERT_EQ(stage->boxes.size(), 3U);
+    EXPECT_EQ(stage->boxes[1].text, u"Selected column found: id");
+    EXPECT_EQ(stage->boxes[2].text, u"Tabulet Column selected: id");
+    EXPECT_EQ(small.orders->columnNamed(u"id")->activated(), 1);
+}

@@ -132,3 +132,16 @@ TEST(ATable, RefusesANameThatIsEmptyOrTaken) {
     EXPECT_EQ(small.orders->Name(), u"orders");
     EXPECT_EQ(other.orders->Name(), u"orders");
 }
+
+TEST(ATable, HasTheColumnsActivatedThatItIsToldOfAndNoOthers) {
+    SmallQuery small;
+    const auto id = small.orders->columnNamed(u"id");
+    const auto name = small.orders->columnNamed(u"name");
+    name->activated(1);
+    small.orders->Activate({id->Key()});
+    EXPECT_EQ(id->activated(), 1);
+    EXPECT_EQ(name->activated(), 0);
+    EXPECT_EQ(errorOf([&] { small.orders->Activate({name->Key(), u"none"}); }), 5);
+    EXPECT_EQ(id->activated(), 0);
+    EXPECT_EQ(name->activated(), 1);
+}

@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <random>
+
 using namespace zandor;
 
 using platform::Each;
@@ -101,4 +103,31 @@ TEST(AnEmptyCollection, IsWalkedInNoStep) {
     const KeyedCollection<int> none;
     for (const auto& item : Each<int>(none)) FAIL() << *item;
     EXPECT_EQ(none.Count(), 0);
+}
+
+TEST(AKeyedCollectionOfMany, FindsEachByItsKeyWhateverCameAndWent) {
+    std::mt19937 dice{7};
+    KeyedCollection<int> items;
+    std::vector<int> expected;
+    for (int step = 0; step < 3000; ++step) {
+        const auto count = static_cast<std::uint32_t>(expected.size());
+        if (count > 0 && dice() % 3 == 0) {
+            const auto at = static_cast<std::ptrdiff_t>(dice() % count);
+            items.Remove(platform::decimal(expected[static_cast<std::size_t>(at)]));
+            expected.erase(expected.begin() + at);
+        } else {
+            const auto at = static_cast<std::ptrdiff_t>(dice() % (count + 1));
+            items.Insert(static_cast<std::int32_t>(at) + 1, makeRef<int>(step),
+                         platform::decimal(step));
+            expected.insert(expected.begin() + at, step);
+        }
+    }
+    ASSERT_GT(expected.size(), 500U);
+    std::int32_t position = 0;
+    for (const int value : expected) {
+        EXPECT_EQ(*items.Item(++position), value);
+        EXPECT_EQ(*items.Item(platform::decimal(value)), value);
+    }
+    EXPECT_EQ(items.Count(), position);
+    EXPECT_FALSE(items.Contains(u"3000"));
 }

@@ -54,6 +54,7 @@ struct ZandorBackstage {
     ZANDOR_PROCEDURE(GetDragColumns)
     ZANDOR_PROCEDURE(DrawJoin)
     ZANDOR_PROCEDURE(DrawJoins)
+    ZANDOR_PROCEDURE(PlaceLine)
     ZANDOR_PROCEDURE(DeltaJoinLine)
     ZANDOR_PROCEDURE(JoinHitTest)
     ZANDOR_PROCEDURE(JoinAllreadyExists)

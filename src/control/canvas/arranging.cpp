@@ -27,10 +27,10 @@ void Zandor::OrganizeTables() {
 void Zandor::lstTable_Moving(std::int16_t Index) {
     Guard(u"lstTable_Moving", [&] {
         const std::int32_t table = lstTable(Index)->TableHandle();
-        for (const auto& record : platform::Each<clsJoinLine>(mJoinLines)) {
-            if (record->LeftTablehwnd() != table && record->RightTablehwnd() != table) continue;
+        for (std::int32_t n = 1; n <= mJoinLines.Count(); ++n) {
+            clsJoinLine& record = *mJoinLines.Peek(n);
             // What fails is reported once, where the move ends, not at every step of the mouse.
-            quietly([&] { PlaceJoin(*record); });
+            if (record.IsOf(table)) quietly([&] { FollowJoin(record); });
         }
     });
 }

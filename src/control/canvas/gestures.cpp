@@ -18,13 +18,27 @@ Held<TalvikZandorLib::ZDTable> Zandor::TableOf(const Held<Tabulet>& element) {
     return Tables().Item(key);
 }
 
+/// Whether a table takes its selection at once, which it is told of then.
+bool Zandor::ActivateSelected(const Held<Tabulet>& element,
+                              const Held<TalvikZandorLib::ZDTable>& table) {
+    const auto all = Hold(Ref<TalvikZandorLib::ActivatedColumns>(
+        std::dynamic_pointer_cast<TalvikZandorLib::ActivatedColumns>(table.pointer())));
+    if (!all) return false;
+    std::vector<String> keys;
+    for (const auto& entry : element->ColumnItems().Selected()) keys.push_back(entry->Key());
+    all->Activate(keys);
+    return true;
+}
+
 /// Makes the model's columns active as far as their entries are selected. Without a title nothing
 /// is traced.
 void Zandor::CopySelection(std::int16_t Index, platform::StringView traceTitle) {
     const auto element = Hold(lstTable(Index));
+    const bool quiet = traceTitle.empty() || mDebugSwitch == 0;
     for (std::int32_t n = 1; n <= element->ColumnItems().Count(); ++n) {
         const auto entry = Hold(element->ColumnItems().Item(n));
         const auto table = TableOf(element);
+        if (n == 1 && quiet && ActivateSelected(element, table)) return;
         const auto column = List(table, &TalvikZandorLib::ZDTable::Columns).Item(entry->Key());
         const bool selected = entry->Selected();
         const bool traced = selected && !traceTitle.empty();

@@ -67,6 +67,7 @@ bool Zandor::DrawNewJoin(Ref<clsJoinLine>& NewJoinLine, const Ref<Tabulet>& left
         record->RightColumnName(rightColumn->ColumnItemName());
         record->Index(toInteger(n));
         mJoinLines.Add(record, decimal(n));
+        mReaches.forget(record->Index());
 
         DrawJoin(*record);
         // Where the drawing failed, the host may have answered the report by closing a table.
@@ -129,10 +130,12 @@ bool Zandor::RemoveJoin(const Ref<clsJoinLine> record) {
     bool result = false;
     Guard(u"RemoveJoin", [&] {
         const std::int16_t n = record->Index();
+        mReaches.forget(n);
         linJoin.Unload(n);
         shpJoin.Unload(toInteger(2.0 * n - 1));
         shpJoin.Unload(toInteger(2.0 * n));
         mJoinLines.Remove(decimal(n));
+        mReaches.remove(n);
         mJoinFreeList->FreeIndex(n);
         // Its line has gone; the next click would look for it to take the highlight back.
         if (mLastJoin == record) mLastJoin = nullptr;

@@ -115,6 +115,15 @@ Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Add(const String& key, c
     return items.emplace_back(std::move(entry));
 }
 
+std::vector<Ref<TalvikTabulet::ColumnItem>> TabuletAdapter::Entries::Selected() const {
+    std::vector<Ref<TalvikTabulet::ColumnItem>> selected;
+    if (!mTable.mWidget) return selected;
+    QModelIndexList rows = mTable.mWidget->list().selectionModel()->selectedIndexes();
+    std::sort(rows.begin(), rows.end());
+    for (const QModelIndex& row : rows) selected.push_back(Item(row.row() + 1));
+    return selected;
+}
+
 TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus,
                                TabuletSurroundings& surroundings, std::int16_t index,
                                const TalvikTabulet::TabuletEvents& events)

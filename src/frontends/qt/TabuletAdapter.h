@@ -61,6 +61,7 @@ private:
         std::int32_t Count() const override;
         const Ref<TalvikTabulet::ColumnItem>& Item(std::int32_t position) const override;
         Ref<TalvikTabulet::ColumnItem> Add(const String& key, const String& text) override;
+        std::vector<Ref<TalvikTabulet::ColumnItem>> Selected() const override;
 
         std::vector<Ref<TalvikTabulet::ColumnItem>> items;
 

@@ -5,6 +5,7 @@
 #include <Zandor/control/ControlArray.h>
 #include <Zandor/control/Events.h>
 #include <Zandor/control/Hooks.h>
+#include <Zandor/control/LineReaches.h>
 #include <Zandor/control/ModelList.h>
 #include <Zandor/control/Reached.h>
 #include <Zandor/control/basZandor.h>
@@ -232,7 +233,7 @@ private:
     using ZDColumnRef = Ref<TalvikZandorLib::ZDColumn>;
 
     static constexpr std::int16_t lastTableSlot = 16;
-    static constexpr std::int16_t lastJoinSlot = 64;
+    static constexpr std::int16_t lastJoinSlot = LineReaches::most;
 
     // Errors and traces
     template <class Body>
@@ -356,6 +357,8 @@ private:
     void lstTable_ColumnMouseUp(std::int16_t Index, const Ref<ColumnItem>& Column,
                                 std::int16_t Button, std::int16_t Shift);
     void lstTable_SelectionChanged(std::int16_t Index);
+    bool ActivateSelected(const Held<Tabulet>& element,
+                          const Held<TalvikZandorLib::ZDTable>& table);
     void CopySelection(std::int16_t Index, platform::StringView traceTitle);
     void lstTable_DragOver(std::int16_t Index, platform::Control* Source, float X, float Y,
                            std::int16_t State);
@@ -370,7 +373,11 @@ private:
 
     // Joins
     bool DrawJoin(clsJoinLine& JoinLine);
-    void PlaceJoin(const clsJoinLine& JoinLine);
+    void PlaceJoin(clsJoinLine& JoinLine);
+    void FollowJoin(clsJoinLine& JoinLine);
+    void FindEnds(clsJoinLine& JoinLine);
+    Tabulet* TableAt(const DrawnEnd& end, std::int32_t handle) const;
+    platform::Line& PlaceLine(clsJoinLine& JoinLine, float X1, float Y1, float X2, float Y2);
     void DrawJoins();
     float DeltaJoinLine(float X, float Y, float X1, float Y1, float X2, float Y2);
     bool JoinHitTest(Ref<clsJoinLine>& JoinLine, float X, float Y);
@@ -480,6 +487,7 @@ private:
     Ref<clsFreeList> mTableFreeList;
     Ref<clsFreeList> mJoinFreeList;
     platform::KeyedCollection<clsJoinLine> mJoinLines; ///< keyed by the digits of the join's number
+    LineReaches mReaches; ///< of their lines, by the join's number
     std::vector<Ref<clsDragColumn>> mDragColumns;
     std::int16_t mDragTableIndex = 0;
     std::int16_t mActiveTableIndex = 0;

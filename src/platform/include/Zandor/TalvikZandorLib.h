@@ -3,6 +3,8 @@
 #include <Zandor/platform/Ref.h>
 #include <Zandor/platform/export.h>
 
+#include <vector>
+
 /// What the control asks of the host's query model. A host implements these classes over its own;
 /// an exception thrown from any of them is reported to the user and ends the procedure that called.
 namespace TalvikZandorLib {
@@ -50,8 +52,8 @@ public:
     virtual void activated(std::int16_t value) = 0;
 };
 
-/// A table on the canvas. Placement is in twips; a negative Left or Top, and a Width or Height of 0 or less, leave the
-/// place, respectively the size, to the control.
+/// A table on the canvas. Placement is in twips; a negative Left or Top, and a Width or Height of 0
+/// or less, leave the place, respectively the size, to the control.
 class ZANDOR_CONTROL_EXPORT ZDTable {
 public:
     virtual ~ZDTable() = default;
@@ -142,7 +144,7 @@ public:
 class ZANDOR_CONTROL_EXPORT Zandor {
 public:
     virtual ~Zandor() = default;
-    virtual Collection<ZDTable>& Tables() = 0;        ///< lives as long as the query
+    virtual Collection<ZDTable>& Tables() = 0;       ///< lives as long as the query
     virtual EditableCollection<ZDJoin>& Joins() = 0; ///< lives as long as the query
     /// In the order of the grid's columns; lives as long as the query.
     virtual EditableCollection<ZDColumnDefinition>& ColumnDefinitions() = 0;
@@ -165,6 +167,17 @@ public:
     /// when that is nothing.
     virtual void StandsBehind(const Ref<ZDColumnDefinition>& definition,
                               const Ref<ZDColumnDefinition>& predecessor) = 0;
+};
+
+/// What a table may be besides: one that is told of its whole selection at once. The control asks
+/// for it by a cast of the table and never requires it; where it is missing, `ZDColumn::activated`
+/// is called for each column at each press on an entry.
+class ZANDOR_CONTROL_EXPORT ActivatedColumns {
+public:
+    virtual ~ActivatedColumns() = default;
+    /// The columns with these keys are activated now, and no others. Error 5 when no column has one
+    /// of the keys; those before it are activated then.
+    virtual void Activate(const std::vector<String>& keys) = 0;
 };
 
 /// What a definition may be besides: one that keeps how wide its column of the grid is. It is asked

@@ -1,9 +1,11 @@
 #pragma once
 
+#include <Zandor/control/DrawnEnd.h>
 #include <Zandor/control/basZandor.h>
 #include <Zandor/platform/Variant.h>
 #include <Zandor/platform/export.h>
 
+#include <optional>
 #include <utility>
 
 namespace TalvikDBxZandor {
@@ -19,9 +21,9 @@ public:
 
     // clang-format off
     std::int32_t LeftTablehwnd() const { return Get(u"P_GET LeftTablehwnd", &Fields::LeftTablehwnd); }
-    void LeftTablehwnd(std::int32_t v) { Let(u"P_LET LeftTablehwnd", &Fields::LeftTablehwnd, v); }
+    void LeftTablehwnd(std::int32_t v) { Let(u"P_LET LeftTablehwnd", &Fields::LeftTablehwnd, v); LeftEnd = {}; }
     std::int32_t RightTablehwnd() const { return Get(u"P_GET RightTablehwnd", &Fields::RightTablehwnd); }
-    void RightTablehwnd(std::int32_t v) { Let(u"P_LET RightTablehwnd", &Fields::RightTablehwnd, v); }
+    void RightTablehwnd(std::int32_t v) { Let(u"P_LET RightTablehwnd", &Fields::RightTablehwnd, v); RightEnd = {}; }
     String LeftColumnText() const { return Get(u"P_GET LeftColumnText", &Fields::LeftColumnText); }
     void LeftColumnText(const String& v) { Let(u"P_LET LeftColumnText", &Fields::LeftColumnText, v); }
     String RightColumnText() const { return Get(u"P_GET RightColumnText", &Fields::RightColumnText); }
@@ -29,21 +31,21 @@ public:
     std::int32_t CompareOperator() const { return Get(u"P_GET CompareOperator", &Fields::CompareOperator); }
     void CompareOperator(std::int32_t v) { Let(u"P_LET CompareOperator", &Fields::CompareOperator, v); }
     std::int32_t JoinType() const { return Get(u"P_GET JoinType", &Fields::JoinType); }
-    void JoinType(std::int32_t v) { Let(u"P_LET JoinType", &Fields::JoinType, v); }
+    void JoinType(std::int32_t v) { Let(u"P_LET JoinType", &Fields::JoinType, v); Drawn = {}; }
     String LeftTableName() const { return Get(u"P_GET LeftTableName", &Fields::LeftTableName); }
     void LeftTableName(const String& v) { Let(u"P_LET LeftTableName", &Fields::LeftTableName, v); }
     String LeftColumnName() const { return Get(u"P_GET LeftColumnName", &Fields::LeftColumnName); }
-    void LeftColumnName(const String& v) { Let(u"P_LET LeftColumnName", &Fields::LeftColumnName, v); }
+    void LeftColumnName(const String& v) { Let(u"P_LET LeftColumnName", &Fields::LeftColumnName, v); LeftEnd = {}; }
     String RightTableName() const { return Get(u"P_GET RightTableName", &Fields::RightTableName); }
     void RightTableName(const String& v) { Let(u"P_LET RightTableName", &Fields::RightTableName, v); }
     String RightColumnName() const { return Get(u"P_GET RightColumnName", &Fields::RightColumnName); }
-    void RightColumnName(const String& v) { Let(u"P_LET RightColumnName", &Fields::RightColumnName, v); }
+    void RightColumnName(const String& v) { Let(u"P_LET RightColumnName", &Fields::RightColumnName, v); RightEnd = {}; }
     std::int32_t JoinLineIndex() const { return Get(u"P_GET JoinLineIndex", &Fields::JoinLineIndex); }
-    void JoinLineIndex(std::int32_t v) { Let(u"P_LET JoinLineIndex", &Fields::JoinLineIndex, v); }
+    void JoinLineIndex(std::int32_t v) { Let(u"P_LET JoinLineIndex", &Fields::JoinLineIndex, v); Drawn = {}; }
     std::int32_t LeftConnectorIndex() const { return Get(u"P_GET LeftConnectorIndex", &Fields::LeftConnectorIndex); }
-    void LeftConnectorIndex(std::int32_t v) { Let(u"P_LET LeftConnectorIndex", &Fields::LeftConnectorIndex, v); }
+    void LeftConnectorIndex(std::int32_t v) { Let(u"P_LET LeftConnectorIndex", &Fields::LeftConnectorIndex, v); Drawn = {}; }
     std::int32_t RightConnectorIndex() const { return Get(u"P_GET RightConnectorIndex", &Fields::RightConnectorIndex); }
-    void RightConnectorIndex(std::int32_t v) { Let(u"P_LET RightConnectorIndex", &Fields::RightConnectorIndex, v); }
+    void RightConnectorIndex(std::int32_t v) { Let(u"P_LET RightConnectorIndex", &Fields::RightConnectorIndex, v); Drawn = {}; }
     std::int16_t Index() const { return Get(u"P_GET Index", &Fields::Index); }
     void Index(std::int16_t v) { Let(u"P_LET Index", &Fields::Index, v); }
     platform::Variant Tag() const { return Get(u"P_GET Tag", &Fields::Tag); }
@@ -54,12 +56,25 @@ public:
     void CopyFields(const clsJoinLine& other) {
         Fields copy = other.mFields; // all or none
         mFields = std::move(copy);
+        LeftEnd = RightEnd = {};
+        Drawn = {};
     }
 
     /// Whether a side names a column of this name, without copying the name: drawing asks this
     /// once for every entry of a table.
     bool IsLeftColumn(platform::StringView name) const { return mFields.LeftColumnName == name; }
     bool IsRightColumn(platform::StringView name) const { return mFields.RightColumnName == name; }
+    /// Whether a side is in the table list of a handle; asked of all joins at each step of a move.
+    bool IsOf(std::int32_t handle) const {
+        return mFields.LeftTablehwnd == handle || mFields.RightTablehwnd == handle;
+    }
+
+    // What the control has drawn last. A field that it was found by makes it unknown again.
+    DrawnEnd LeftEnd;  ///< by LeftTablehwnd and LeftColumnName
+    DrawnEnd RightEnd; ///< by RightTablehwnd and RightColumnName
+    /// Whether line and marks are as they are to be, but for their places, with the left end in the
+    /// west.
+    std::optional<bool> Drawn;
 
 private:
     struct Fields {

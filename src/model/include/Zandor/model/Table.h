@@ -17,7 +17,8 @@ struct TableContents {
 /// A database table, or a saved query, as it stands in the query: the same one may stand there
 /// several times, each time under a name of its own. Its first column is the entry for all columns,
 /// "*".
-class ZANDOR_MODEL_EXPORT Table final : public TalvikZandorLib::ZDTable {
+class ZANDOR_MODEL_EXPORT Table final : public TalvikZandorLib::ZDTable,
+                                        public TalvikZandorLib::ActivatedColumns {
 public:
     /// Query::addTable and Query::addQuery make tables.
     Table(TablePlace place, String name, String schema, String sourceName, TableContents contents);
@@ -42,6 +43,7 @@ public:
     TalvikZandorLib::Collection<TalvikZandorLib::ZDColumn>& Columns() override {
         return (*mContents)->columns;
     }
+    void Activate(const std::vector<String>& keys) override;
 
     /// Name of the table or view in the database, or of the saved query.
     const String& sourceName() const { return mSourceName; }

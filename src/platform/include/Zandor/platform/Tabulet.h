@@ -6,6 +6,7 @@
 #include <Zandor/platform/export.h>
 
 #include <functional>
+#include <vector>
 
 /// The table-list control: a frame with a title bar, a close button and a scrollable list of
 /// columns, which the user moves by its title and resizes by its border.
@@ -57,6 +58,13 @@ public:
     /// Position is 1-based; error 9 outside 1 to Count.
     virtual const Ref<ColumnItem>& Item(std::int32_t position) const = 0;
     virtual Ref<ColumnItem> Add(const String& key, const String& text) = 0; ///< behind the others
+    /// The selected entries, in their order; asked one by one where the toolkit knows no better.
+    virtual std::vector<Ref<ColumnItem>> Selected() const {
+        std::vector<Ref<ColumnItem>> selected;
+        for (std::int32_t n = 1; n <= Count(); ++n)
+            if (const auto& entry = Item(n); entry->Selected()) selected.push_back(entry);
+        return selected;
+    }
 };
 
 /// A table list on the canvas.
