@@ -15,7 +15,12 @@ struct Overloaded : Ts... {
 template <class... Ts>
 Overloaded(Ts...) -> Overloaded<Ts...>;
 
-std::string quoted(const std::string& text) { return nlohmann::json(text).dump(); }
+/// Most texts have nothing that is written otherwise than it is.
+std::string quoted(const std::string& text) {
+    const bool plain = std::ranges::all_of(
+        text, [](char c) { return c >= ' ' && c < '\x7f' && c != '"' && c != '\\'; });
+    return plain ? '"' + text + '"' : nlohmann::json(text).dump();
+}
 
 /// Writes a value in one line up to `limit` characters; false when it needs more.
 bool printLine(const Value& value, std::string& out, std::size_t limit) {
