@@ -235,3 +235,10 @@ TEST_F(ASavedQuery, TakesWhatHangsOnItAlongWhenItIsDeleted) {
     EXPECT_EQ(query.Joins().Count(), 0);
     EXPECT_EQ(query.ColumnDefinitions().Count(), 0);
 }
+
+TEST_F(ASavedQuery, HasNoTwoColumnsThatDifferByCapitalsAlone) {
+    inner->ColumnDefinitions().Item(1)->Synonym(u"CALLED");
+    const auto table = query.addQuery(u"twice", saved(inner));
+    EXPECT_EQ(table->Columns().Item(2)->Name(), u"CALLED");
+    EXPECT_EQ(table->Columns().Item(3)->Name(), u"called_1");
+}
