@@ -209,3 +209,17 @@ TEST_F(TheDialogByItself, ReportsAMissingRecord) {
 }
 
 } // namespace
+
+TEST_F(TheDialogByItself, HasNothingToTakeBackWithoutARecord) {
+    stage->onDialog = [this] {
+        stage->clickButton("cmdCancel");
+        EXPECT_EQ(stage->boxes, Boxes{dialogErrorBox(u"cmdCancel_Click", 91, objectNotSet)});
+        forget();
+        dialog.JoinLine(nullptr);
+        stage->clickButton("cmdCancel");
+        EXPECT_EQ(stage->boxes, (Boxes{dialogErrorBox(u"P_SET JoinLine", 91, objectNotSet),
+                                       dialogErrorBox(u"cmdCancel_Click", 91, objectNotSet)}));
+        dialog.form->Hide();
+    };
+    dialog.form->ShowModal();
+}

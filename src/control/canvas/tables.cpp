@@ -148,12 +148,14 @@ bool Zandor::RemoveTable(std::int16_t Index) {
         DeletedTable = name;
         RemoveColumnsOf(name);
 
-        // By name, as hosts know it; by handle for one that there was no memory to write a name to.
-        const std::int32_t handle = table->TableHandle();
+        // A record without a name is one that there was no memory to write it to.
+        const auto isOf = [&](const String& side, std::int32_t handle) {
+            return side == name || (side.empty() && handle == table->TableHandle());
+        };
         std::vector<Ref<clsJoinLine>> joins;
         for (const auto& record : platform::Each<clsJoinLine>(mJoinLines))
-            if (record->LeftTableName() == name || record->RightTableName() == name ||
-                record->LeftTablehwnd() == handle || record->RightTablehwnd() == handle)
+            if (isOf(record->LeftTableName(), record->LeftTablehwnd()) ||
+                isOf(record->RightTableName(), record->RightTablehwnd()))
                 joins.push_back(record);
         for (const auto& record : joins)
             if (Draws(record)) RemoveJoin(record);

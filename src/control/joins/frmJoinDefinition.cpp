@@ -127,7 +127,7 @@ void frmJoinDefinition::cmdOk_Click() {
 void frmJoinDefinition::cmdCancel_Click() {
     Guard(u"cmdCancel_Click", [&] {
         // Where nothing could be saved, nothing was changed either.
-        if (mSavedLine) mJoinLine->CopyFields(*mSavedLine);
+        if (mSavedLine || !mJoinLine) mJoinLine->CopyFields(*mSavedLine);
         form->Hide();
     });
 }
