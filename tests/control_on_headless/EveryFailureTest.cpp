@@ -80,6 +80,16 @@ std::string listOf(HostedControl& hosted, platform::StringView title) {
     return "a table that is not shown";
 }
 
+/// What a failing toolkit had to show is shown in part, for the steps before the failure stay done:
+/// a query until it is bound again, a place of the canvas until it is scrolled again.
+void showAgain(HostedControl& c) {
+    c.bind(c.model);
+    for (const std::int16_t place : {std::int16_t{15}, std::int16_t{0}}) {
+        c.control().HorizontalScrollbarPos(place);
+        c.control().VerticalScrollbarPos(place);
+    }
+}
+
 /// What does not work of what a user does next, with a model freshly bound.
 std::string nextActs(HostedControl& c) {
     std::string wrong;
@@ -126,6 +136,7 @@ Outcome played(const Play& play, Failing failing, std::size_t nth) {
     outcome.where = countdown.where;
     if (!c.gone()) outcome.reports = reportsOf(c);
     if (failing != Failing::model) c.invariants().loseSlots();
+    if (failing == Failing::toolkit && !c.gone()) showAgain(c);
     outcome.wrong = c.broken();
     if (c.gone()) return outcome;
     const std::size_t before = reportsOf(c);
