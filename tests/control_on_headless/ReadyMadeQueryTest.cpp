@@ -80,6 +80,30 @@ TEST_F(AReadyMadeQuery, HasThoseColumnsActivatedWhoseEntriesAreSelected) {
     EXPECT_TRUE(stage->boxes.empty());
 }
 
+TEST_F(AReadyMadeQuery, HasAColumnThatItsSavedQueryNoLongerGivesReported) {
+    const auto inner = [](const char16_t* second) {
+        const auto query = platform::makeRef<model::Query>();
+        const auto table = query->addTable(SmallQuery::described(u"payments"));
+        for (const char16_t* name : {u"id", second}) {
+            const auto definition = platform::makeRef<model::ColumnDefinition>();
+            definition->Column(table->columnNamed(u"name"));
+            definition->Synonym(name);
+            query->AddColumnDefinition(definition);
+        }
+        return model::SavedQuery{u"paid.json", query->record()};
+    };
+    const auto paid = small.query->addQuery(u"paid", inner(u"called"));
+    stage->control().P_SET_Zandor(small.query);
+    stage->selectEntries(3, {2});
+    stage->pressEntry(3, 2, 1);
+    EXPECT_EQ(paid->columnNamed(u"id")->activated(), 1);
+    EXPECT_TRUE(stage->boxes.empty());
+    small.query->refreshQuery(paid, inner(u"titled")); // as many columns as before
+    stage->pressEntry(3, 2, 1);
+    ASSERT_EQ(stage->boxes.size(), 1U);
+    EXPECT_NE(stage->boxes[0].text.find(u"lstTable_ColumnMouseDown"), String::npos);
+}
+
 TEST_F(AReadyMadeQuery, TracesEachSelectedColumnAsAnyOtherDoes) {
     stage->control().P_SET_Zandor(small.query);
     stage->selectEntries(1, {2});

@@ -138,7 +138,7 @@ TEST(ATable, HasTheColumnsActivatedThatItIsToldOfAndNoOthers) {
     const auto id = small.orders->columnNamed(u"id");
     const auto name = small.orders->columnNamed(u"name");
     name->activated(1);
-    small.orders->Activate({id->Key()});
+    EXPECT_TRUE(small.orders->Activate({id->Key()}));
     EXPECT_EQ(id->activated(), 1);
     EXPECT_EQ(name->activated(), 0);
     EXPECT_EQ(errorOf([&] { small.orders->Activate({name->Key(), u"none"}); }), 5);

@@ -9,10 +9,11 @@
 namespace {
 
 /// Where it is depends on the kind of machine; empty when it is nowhere.
-QString fileOf(const QString& driver) {
+QString fileOf(const OdbcDriver& driver) {
     const QDir lib(QStringLiteral("/usr/lib"));
     for (const QString& folder : lib.entryList({QStringLiteral("*-linux-gnu*")}, QDir::Dirs)) {
-        const QString file = lib.filePath(folder + QStringLiteral("/odbc/") + driver);
+        const QString file =
+            lib.filePath(folder + QStringLiteral("/odbc/") + QLatin1String(driver.file));
         if (QFile::exists(file)) return file;
     }
     return {};
@@ -20,11 +21,11 @@ QString fileOf(const QString& driver) {
 
 } // namespace
 
-std::optional<QString> OdbcSources::missing(const QString& driver, const QString& package) {
+std::optional<QString> OdbcSources::missing(const OdbcDriver& driver) {
     if (!QSqlDatabase::isDriverAvailable(QStringLiteral("QODBC")))
         return QStringLiteral("the package libqt6sql6-odbc is not installed");
     if (fileOf(driver).isEmpty())
-        return QStringLiteral("the package %1 is not installed").arg(package);
+        return QStringLiteral("the package %1 is not installed").arg(QLatin1String(driver.package));
     return {};
 }
 
@@ -38,7 +39,7 @@ OdbcSources::~OdbcSources() {
     qunsetenv("ODBCINI");
 }
 
-QString OdbcSources::add(const QString& driver, const QStringList& settings) {
+QString OdbcSources::add(const OdbcDriver& driver, const QStringList& settings) {
     static int sources = 0;
     const QString name = QStringLiteral("source%1").arg(++sources);
     QFile file(mFolder.filePath(QStringLiteral("odbc.ini")));

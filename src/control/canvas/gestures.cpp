@@ -26,8 +26,7 @@ bool Zandor::ActivateSelected(const Held<Tabulet>& element,
     if (!all) return false;
     std::vector<String> keys;
     for (const auto& entry : element->ColumnItems().Selected()) keys.push_back(entry->Key());
-    all->Activate(keys);
-    return true;
+    return all->Activate(keys);
 }
 
 /// Makes the model's columns active as far as their entries are selected. Without a title nothing

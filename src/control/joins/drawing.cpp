@@ -157,9 +157,8 @@ void Zandor::PlaceJoin(clsJoinLine& JoinLine) {
 
     const platform::Bounds placeA = markA.bounds();
     const platform::Bounds placeB = markB.bounds();
-    platform::Line& line = PlaceLine(
-        JoinLine, single(westPoint.X + placeA.Width), single(placeA.Top + placeA.Height / 2),
-        single(eastPoint.X - placeB.Width), single(placeB.Top + placeB.Height / 2));
+    const LineEnds ends = lineBetween(westPoint.X, placeA, eastPoint.X, placeB);
+    platform::Line& line = PlaceLine(JoinLine, ends.X1, ends.Y1, ends.X2, ends.Y2);
     if (const auto& placed = mHooks.JoinPlaced)
         placed({.LeftTable = leftTable.Text(),
                 .LeftColumn = left.Item->Text(),

@@ -10,9 +10,11 @@ namespace zandor::platform::qt {
 /// the canvas, scrolling moves its pixels instead of painting them anew. It begins where the
 /// control does, so that the canvas has the same place in both.
 class CanvasWindow : public QWidget {
-    Q_OBJECT // of a plain QWidget a style sheet would paint frame and background
+    // Of a plain QWidget a style sheet would paint frame and background.
+    Q_OBJECT
 
-        public : explicit CanvasWindow(QWidget* surface);
+public:
+    explicit CanvasWindow(QWidget* surface);
 
     /// Ends at the bar for as long as that is shown.
     void endAt(QScrollBar& bar);

@@ -16,11 +16,13 @@ void Table::Top(float value) { mTop = platform::toLong(value); }
 void Table::Width(float value) { mWidth = platform::toLong(value); }
 void Table::Height(float value) { mHeight = platform::toLong(value); }
 
-void Table::Activate(const std::vector<String>& keys) {
+bool Table::Activate(const std::vector<String>& keys) {
+    if (savedQuery()) return false;
     const auto& columns = (*mContents)->columns;
     for (std::int32_t position = 1; position <= columns.Count(); ++position)
         columns.Peek(position)->activated(0);
     for (const String& key : keys) columns.Item(key)->activated(1);
+    return true;
 }
 
 Ref<Column> Table::column(const String& key) const {

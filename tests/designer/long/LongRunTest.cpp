@@ -5,9 +5,11 @@
 #include <Zandor/Query.h>
 #include <Zandor/ZandorWidget.h>
 
+#include <QClipboard>
 #include <QElapsedTimer>
 #include <QFile>
 #include <QGridLayout>
+#include <QGuiApplication>
 #include <QPixmapCache>
 
 #include <algorithm>
@@ -37,7 +39,8 @@ struct Memory {
     double resident; ///< KiB
 
     static Memory now() {
-        QPixmapCache::clear(); // it grows to a limit of its own
+        QPixmapCache::clear();                 // it grows to a limit of its own
+        QGuiApplication::clipboard()->clear(); // a copied picture is larger than all else
         malloc_trim(0);
         QFile file(QStringLiteral("/proc/self/statm"));
         EXPECT_TRUE(file.open(QIODevice::ReadOnly));
@@ -65,18 +68,31 @@ void expectFlat(std::vector<double> samples, const char* what) {
 
 class ALongRun : public OpenWindow {
 protected:
-    /// The window with nothing in it that the user has made.
+    void open() {
+        OpenWindow::open();
+        mSize = window->size();
+        mLayout = window->saveState();
+    }
+
+    /// The window as it was opened: nothing in it that the user has made, and its panels where they
+    /// were, for one that floats has memory of its own.
     void clear(RandomHands& user) {
         user.leave(true);
         command("new");
         calm();
         user.leave(false);
+        EXPECT_TRUE(window->restoreState(mLayout));
+        window->resize(mSize);
+        calm();
     }
+
+private:
+    QSize mSize;
+    QByteArray mLayout;
 };
 
 TEST_F(ALongRun, OfRandomWorkKeepsTheMemoryFlat) {
     open();
-    window->resize(1366, 800);
     const auto seed = qEnvironmentVariableIntValue("ZANDOR_SEED");
     RandomHands user(*window, static_cast<unsigned>(seed));
     QElapsedTimer clock;

@@ -30,11 +30,11 @@ protected:
 class OnPostgresBehindOdbc : public OnOdbc {
 protected:
     void SetUp() override {
-        const QString driver = QStringLiteral("psqlodbcw.so");
-        if (const auto missing = OdbcSources::missing(driver, QStringLiteral("odbc-postgresql")))
+        if (const auto missing = OdbcSources::missing(odbcOfPostgres))
             GTEST_SKIP() << missing->toStdString();
-        address = "odbc://" + sources.add(driver, {"Servername=" + oneServer.server().folder(),
-                                                   "Database=postgres", "Username=postgres"});
+        address =
+            "odbc://" + sources.add(odbcOfPostgres, {"Servername=" + oneServer.server().folder(),
+                                                     "Database=postgres", "Username=postgres"});
         runOnServer({"DROP TABLE IF EXISTS moments"});
     }
 };
@@ -42,23 +42,22 @@ protected:
 class OnMariaBehindOdbc : public OnOdbc {
 protected:
     void SetUp() override {
-        const QString driver = QStringLiteral("libmaodbc.so");
-        if (const auto missing = OdbcSources::missing(driver, QStringLiteral("odbc-mariadb")))
+        if (const auto missing = OdbcSources::missing(odbcOfMaria))
             GTEST_SKIP() << missing->toStdString();
         if (const auto missing = MariaServer::missing()) GTEST_SKIP() << missing->toStdString();
         runOnMaria({"CREATE OR REPLACE DATABASE here"});
-        address = "odbc://" + sources.add(driver, {"SOCKET=" + oneMariaServer.server().socket(),
-                                                   "DATABASE=here", "USER=root"});
+        address =
+            "odbc://" + sources.add(odbcOfMaria, {"SOCKET=" + oneMariaServer.server().socket(),
+                                                  "DATABASE=here", "USER=root"});
     }
 };
 
 class OnSqliteBehindOdbc : public OnOdbc {
 protected:
     void SetUp() override {
-        const QString driver = QStringLiteral("libsqlite3odbc.so");
-        if (const auto missing = OdbcSources::missing(driver, QStringLiteral("libsqliteodbc")))
+        if (const auto missing = OdbcSources::missing(odbcOfSqlite))
             GTEST_SKIP() << missing->toStdString();
-        address = "odbc://" + sources.add(driver, {"Database=" + database.path()});
+        address = "odbc://" + sources.add(odbcOfSqlite, {"Database=" + database.path()});
     }
     TemporaryDatabase database{{
         QStringLiteral("CREATE TABLE moments (d date, m timestamp, c time, t text, n integer)"),

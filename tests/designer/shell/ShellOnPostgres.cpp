@@ -112,12 +112,11 @@ TEST_F(InAShellOnPostgres, TakesThePasswordFromWhereItIsHidden) {
 }
 
 TEST_F(InAShellOnPostgres, SaysInOneLineWhatWasRefusedBehindOdbc) {
-    const QString driver = QStringLiteral("psqlodbcw.so");
-    if (const auto missing = OdbcSources::missing(driver, QStringLiteral("odbc-postgresql")))
+    if (const auto missing = OdbcSources::missing(odbcOfPostgres))
         GTEST_SKIP() << missing->toStdString();
     OdbcSources sources;
-    const QString source = sources.add(driver, {"Servername=" + oneServer.server().folder(),
-                                                "Database=postgres", "Username=postgres"});
+    const QString source = sources.add(odbcOfPostgres, {"Servername=" + oneServer.server().folder(),
+                                                        "Database=postgres", "Username=postgres"});
     runOnServer({"CREATE TABLE \"Brief\" (n int)"});
     const QString address = "odbc://" + source;
     const QString query = saved(draw(address, {"Brief"}, {{"Brief.n", {"< 5"}}}), address);

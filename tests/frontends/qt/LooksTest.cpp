@@ -1,6 +1,7 @@
 #include "frontends/qt/CanvasItems.h"
 #include "frontends/qt/Desk.h"
 #include "frontends/qt/GridCells.h"
+#include "frontends/qt/darkPalette.h"
 
 #include <Zandor/qt/Twips.h>
 
@@ -26,16 +27,6 @@ QString toolTipAt(QWidget& widget, QPoint at) {
     while (QToolTip::isVisible() && QToolTip::text() == before && !moment.hasExpired())
         qApp->processEvents(QEventLoop::WaitForMoreEvents, 50);
     return QToolTip::isVisible() ? QToolTip::text() : QString();
-}
-
-QPalette dark() {
-    QPalette palette;
-    palette.setColor(QPalette::Window, QColor(45, 45, 48));
-    palette.setColor(QPalette::WindowText, Qt::white);
-    palette.setColor(QPalette::Base, QColor(30, 30, 32));
-    palette.setColor(QPalette::Text, Qt::white);
-    palette.setColor(QPalette::Highlight, QColor(38, 120, 200));
-    return palette;
 }
 
 class Looks : public Desk {};
@@ -114,16 +105,16 @@ TEST_F(Looks, HaveNoSeamBetweenTheCanvasAndWhatLiesBeyondIt) {
 TEST_F(Looks, FollowADarkPalette) {
     show();
     bind();
-    widget->setPalette(dark());
+    widget->setPalette(darkPalette());
     settle();
     const QImage image = widget->grab().toImage();
     const qreal ratio = image.devicePixelRatio();
     const auto colour = [&](QPoint at) {
         return image.pixelColor((QPointF(at) * ratio).toPoint());
     };
-    EXPECT_EQ(colour({700, 150}), dark().color(QPalette::Window)) << "the canvas";
+    EXPECT_EQ(colour({700, 150}), darkPalette().color(QPalette::Window)) << "the canvas";
     const QPoint list = table(2).mapTo(widget.get(), QPoint(100, 105));
-    EXPECT_EQ(colour(list), dark().color(QPalette::Base)) << "a list below its entries";
+    EXPECT_EQ(colour(list), darkPalette().color(QPalette::Base)) << "a list below its entries";
     EXPECT_LT(colour(table(2).mapTo(widget.get(), QPoint(100, 3))).lightness(), 100) << "a title";
 }
 

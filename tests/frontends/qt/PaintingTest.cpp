@@ -1,4 +1,5 @@
 #include "frontends/qt/Desk.h"
+#include "frontends/qt/darkPalette.h"
 
 #include "frontends/qt/CanvasItems.h"
 #include "frontends/qt/CanvasWindow.h"
@@ -121,16 +122,6 @@ std::string difference(const QImage& one, const QImage& other) {
     return "by up to " + std::to_string(most) + ", " + std::to_string(place.width()) + "x" +
            std::to_string(place.height()) + " pixels at " + std::to_string(place.left()) + "," +
            std::to_string(place.top());
-}
-
-QPalette darkPalette() {
-    QPalette palette;
-    palette.setColor(QPalette::Window, QColor(45, 45, 48));
-    palette.setColor(QPalette::WindowText, Qt::white);
-    palette.setColor(QPalette::Base, QColor(30, 30, 32));
-    palette.setColor(QPalette::Text, Qt::white);
-    palette.setColor(QPalette::Highlight, QColor(38, 120, 200));
-    return palette;
 }
 
 } // namespace

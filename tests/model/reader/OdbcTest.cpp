@@ -98,12 +98,12 @@ private:
 class PostgresOverOdbc : public OverOdbc {
 protected:
     void SetUp() override {
-        const QString driver = QStringLiteral("psqlodbcw.so");
-        if (const auto missing = OdbcSources::missing(driver, QStringLiteral("odbc-postgresql")))
+        if (const auto missing = OdbcSources::missing(odbcOfPostgres))
             GTEST_SKIP() << missing->toStdString();
-        mSource = mSources.add(
-            driver, {QStringLiteral("Servername=") + postgresServer.server().folder(),
-                     QStringLiteral("Database=postgres"), QStringLiteral("Username=postgres")});
+        mSource = mSources.add(odbcOfPostgres,
+                               {QStringLiteral("Servername=") + postgresServer.server().folder(),
+                                QStringLiteral("Database=postgres"),
+                                QStringLiteral("Username=postgres")});
         run({sql("SET client_min_messages = warning"), sql("DROP SCHEMA IF EXISTS aside CASCADE"),
              sql("DROP SCHEMA public CASCADE"), sql("CREATE SCHEMA public"),
              sql("CREATE SCHEMA aside")});
@@ -118,13 +118,12 @@ protected:
 class MariaOverOdbc : public OverOdbc {
 protected:
     void SetUp() override {
-        const QString driver = QStringLiteral("libmaodbc.so");
-        if (const auto missing = OdbcSources::missing(driver, QStringLiteral("odbc-mariadb")))
+        if (const auto missing = OdbcSources::missing(odbcOfMaria))
             GTEST_SKIP() << missing->toStdString();
         if (const auto missing = MariaServer::missing()) GTEST_SKIP() << missing->toStdString();
-        mSource =
-            mSources.add(driver, {QStringLiteral("SOCKET=") + mariaServer.server().socket(),
-                                  QStringLiteral("DATABASE=here"), QStringLiteral("USER=root")});
+        mSource = mSources.add(odbcOfMaria,
+                               {QStringLiteral("SOCKET=") + mariaServer.server().socket(),
+                                QStringLiteral("DATABASE=here"), QStringLiteral("USER=root")});
         run({sql("SET foreign_key_checks = 0"), sql("CREATE OR REPLACE DATABASE here")});
     }
     static void run(const QStringList& statements) {
@@ -138,10 +137,9 @@ protected:
 class SqliteOverOdbc : public OverOdbc {
 protected:
     void SetUp() override {
-        const QString driver = QStringLiteral("libsqlite3odbc.so");
-        if (const auto missing = OdbcSources::missing(driver, QStringLiteral("libsqliteodbc")))
+        if (const auto missing = OdbcSources::missing(odbcOfSqlite))
             GTEST_SKIP() << missing->toStdString();
-        mSource = mSources.add(driver, {QStringLiteral("Database=") + mDatabase.path()});
+        mSource = mSources.add(odbcOfSqlite, {QStringLiteral("Database=") + mDatabase.path()});
     }
     void run(const QStringList& statements) { writeSqlite(mDatabase.path(), statements); }
 

@@ -176,8 +176,9 @@ class ZANDOR_CONTROL_EXPORT ActivatedColumns {
 public:
     virtual ~ActivatedColumns() = default;
     /// The columns with these keys are activated now, and no others. Error 5 when no column has one
-    /// of the keys; those before it are activated then.
-    virtual void Activate(const std::vector<String>& keys) = 0;
+    /// of the keys; those before it are activated then. False, and nothing has happened, where
+    /// columns may be others by now than those that were listed: each is called for then.
+    virtual bool Activate(const std::vector<String>& keys) = 0;
 };
 
 /// What a definition may be besides: one that keeps how wide its column of the grid is. It is asked

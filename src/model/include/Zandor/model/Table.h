@@ -43,7 +43,8 @@ public:
     TalvikZandorLib::Collection<TalvikZandorLib::ZDColumn>& Columns() override {
         return (*mContents)->columns;
     }
-    void Activate(const std::vector<String>& keys) override;
+    /// Not the columns of a saved query: those change when it is read again.
+    bool Activate(const std::vector<String>& keys) override;
 
     /// Name of the table or view in the database, or of the saved query.
     const String& sourceName() const { return mSourceName; }
