@@ -5,6 +5,7 @@
 
 #include <iostream>
 #include <new>
+#include <set>
 #include <stdexcept>
 
 using namespace zandor;
@@ -63,14 +64,19 @@ private:
 
 struct Outcome {
     std::size_t calls = 0;
-    std::size_t reports = 0;
+    std::size_t told = 0;   ///< reports of the failure itself
+    std::size_t others = 0; ///< of what could not be done without it, and the play's own
     std::string where;
     std::string wrong;
 };
 
-std::size_t reportsOf(const HostedControl& hosted) {
-    return static_cast<std::size_t>(std::ranges::count(
-        hosted.stage->boxes, Stage::String(u"Unexpected Error:"), &Stage::Box::title));
+/// The reports so far with these words among theirs.
+std::size_t reportsOf(const HostedControl& hosted, platform::StringView words = u"") {
+    return static_cast<std::size_t>(
+        std::ranges::count_if(hosted.toolkit.boxes(), [&](const auto& box) {
+            return box.title == u"Unexpected Error:" &&
+                   box.prompt.find(words) != platform::String::npos;
+        }));
 }
 
 /// The table list that shows a table now.
@@ -134,7 +140,8 @@ Outcome played(const Play& play, Failing failing, std::size_t nth) {
     }
     outcome.calls = countdown.stop();
     outcome.where = countdown.where;
-    if (!c.gone()) outcome.reports = reportsOf(c);
+    outcome.told = reportsOf(c, failing == Failing::memory ? u"\tOut of memory" : u"\tIt fails.");
+    outcome.others = reportsOf(c) - outcome.told;
     if (failing != Failing::model) c.invariants().loseSlots();
     if (failing == Failing::toolkit && !c.gone()) showAgain(c);
     outcome.wrong = c.broken();
@@ -155,28 +162,34 @@ std::size_t stepOf(Failing failing) {
 
 class EveryFailure : public testing::TestWithParam<Play> {};
 
+// A failure is reported once. Never is one of what may fail in silence: a line that follows a table
+// in the user's hand, which is drawn at the drop, or a focus; nor one of the script's own memory.
+// What the failure leaves undone may be missed by the procedure that called, and reported by it.
 // Each play begins at another of the first calls, so that the steps do not all fall on the same.
 void tryAll(const Play& play, Failing failing) {
     const Outcome whole = played(play, failing, 0);
     ASSERT_EQ(whole.wrong, "") << "with nothing failing";
     const std::size_t step = stepOf(failing);
-    std::size_t tried = 0, silent = 0, several = 0, most = 0;
+    std::size_t tried = 0, silent = 0, followed = 0;
+    std::set<std::string> silentAt;
     int failures = 0;
     for (std::size_t nth = 1 + play.name.size() % step; nth <= whole.calls; nth += step) {
         const Outcome outcome = played(play, failing, nth);
         ++tried;
-        const std::size_t reports = std::max(outcome.reports, whole.reports) - whole.reports;
-        silent += reports == 0;
-        several += reports > 1;
-        most = std::max(most, reports);
-        if (outcome.wrong.empty()) continue;
-        ADD_FAILURE() << name(failing) << ' ' << nth << " (" << outcome.where
-                      << "): " << outcome.wrong;
+        silent += outcome.told == 0;
+        followed += outcome.others > whole.others;
+        if (outcome.told == 0) silentAt.insert(outcome.where);
+        if (outcome.wrong.empty() && outcome.told <= 1) continue;
+        ADD_FAILURE() << name(failing) << ' ' << nth << " (" << outcome.where << "), reported "
+                      << outcome.told << " times: " << outcome.wrong;
         if (++failures == 10) GTEST_FAIL() << "and so on";
     }
     std::cout << "[ FAULTS   ] " << tried << " of " << whole.calls << " of the " << name(failing)
-              << " tried in " << play.name << "; without a report " << silent << ", with several "
-              << several << ", at most " << most << '\n';
+              << " tried in " << play.name << "; reported once " << tried - silent << ", never "
+              << silent << ", with what followed from it " << followed;
+    for (const std::string& where : silentAt)
+        std::cout << (where.empty() ? "" : "; silent: ") << where;
+    std::cout << '\n';
 }
 
 TEST_P(EveryFailure, OfTheToolkitLeavesAControlThatGoesOn) { tryAll(GetParam(), Failing::toolkit); }

@@ -68,6 +68,10 @@ void expectFlat(std::vector<double> samples, const char* what) {
 
 class ALongRun : public OpenWindow {
 protected:
+    // Full from the first minute on. To clear it would keep the names of all that was in it.
+    ALongRun() { QPixmapCache::setCacheLimit(512); }
+    ~ALongRun() override { QPixmapCache::setCacheLimit(mCacheLimit); }
+
     void open() {
         OpenWindow::open();
         mSize = window->size();
@@ -87,6 +91,7 @@ protected:
     }
 
 private:
+    const int mCacheLimit = QPixmapCache::cacheLimit();
     QSize mSize;
     QByteArray mLayout;
 };
