@@ -17,20 +17,16 @@ Whole toWhole(double value) {
     if (rest > 0.5 || (rest == 0.5 && std::fmod(rounded, 2.0) != 0.0)) rounded += 1.0;
     if (!(rounded >= std::numeric_limits<Whole>::min() &&
           rounded <= std::numeric_limits<Whole>::max()))
-        throw errors::overflow();
+        throwOverflow();
     return static_cast<Whole>(rounded);
 }
 
 } // namespace
 
+void throwOverflow() { throw errors::overflow(); }
+
 std::int16_t toInteger(double value) { return toWhole<std::int16_t>(value); }
 
 std::int32_t toLong(double value) { return toWhole<std::int32_t>(value); }
-
-float single(double value) {
-    const auto rounded = static_cast<float>(value);
-    if (!std::isfinite(rounded)) throw errors::overflow();
-    return rounded;
-}
 
 } // namespace zandor::platform

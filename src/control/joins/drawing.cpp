@@ -2,6 +2,7 @@
 
 #include <Zandor/platform/Numbers.h>
 
+#include <bit>
 #include <cmath>
 
 namespace TalvikDBxZandor {
@@ -230,14 +231,11 @@ bool Zandor::JoinHitTest(Ref<clsJoinLine>& JoinLine, float X, float Y) {
     bool result = true;
     Guard(u"JoinHitTest", [&] {
         // Of all lines there are, hardly one comes to the exact test.
-        const bool within = std::fabs(X) <= LineReaches::rim && std::fabs(Y) <= LineReaches::rim;
-        std::uint64_t near = within ? mReaches.near(X, Y) : ~std::uint64_t{0};
         float best = 1E+38F;
-        for (std::int32_t n = 1; near != 0 && n <= mJoinLines.Count(); ++n) {
-            const std::uint64_t bit = LineReaches::bit(mJoinLines.Peek(n)->Index());
-            if ((near & bit) == 0) continue;
-            near &= ~bit;
-            Ref<clsJoinLine> record = mJoinLines.Item(n);
+        for (std::uint64_t near = mReaches.near(X, Y); near != 0; near &= near - 1) {
+            const std::int32_t n = std::countr_zero(near) + 1;
+            if (n > mJoinLines.Count()) break; // a host has removed joins at a report
+            Ref<clsJoinLine> record = mJoinLines.Peek(n);
             const platform::Line& line = *linJoin(record->JoinLineIndex());
             float firstX = line.X1(), firstY = line.Y1();
             float secondX = line.X2(), secondY = line.Y2();

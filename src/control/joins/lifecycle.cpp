@@ -67,7 +67,7 @@ bool Zandor::DrawNewJoin(Ref<clsJoinLine>& NewJoinLine, const Ref<Tabulet>& left
         record->RightColumnName(rightColumn->ColumnItemName());
         record->Index(toInteger(n));
         mJoinLines.Add(record, decimal(n));
-        mReaches.forget(record->Index());
+        mReaches.add(record->Index());
 
         DrawJoin(*record);
         // Where the drawing failed, the host may have answered the report by closing a table.

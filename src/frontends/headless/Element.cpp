@@ -7,19 +7,18 @@
 
 namespace zandor::platform::headless {
 
-Object::Object(Toolkit& toolkit, std::string name) : mToolkit(toolkit), mName(std::move(name)) {
+Object::Object(Toolkit& toolkit, std::string name)
+    : mToolkit(toolkit), mFaults(toolkit.faults), mName(std::move(name)) {
     mToolkit.enrol(*this);
 }
 
 Object::~Object() { mToolkit.strike(*this); }
 
-void Object::called(const char* member) const {
-    Faults& faults = mToolkit.faults;
-    if (!faults.listening()) return;
-    faults.pass(mName + "." + member);
+void Object::pass(const char* member) const {
+    mFaults.pass(mName + "." + member);
     // An element of a control array can also be named without its index.
     if (const auto index = mName.find('('); index != std::string::npos)
-        faults.pass(mName.substr(0, index) + "." + member);
+        mFaults.pass(mName.substr(0, index) + "." + member);
 }
 
 Element::Element(Toolkit& toolkit, const Design& design, Element* container)

@@ -487,7 +487,7 @@ private:
     Ref<clsFreeList> mTableFreeList;
     Ref<clsFreeList> mJoinFreeList;
     platform::KeyedCollection<clsJoinLine> mJoinLines; ///< keyed by the digits of the join's number
-    LineReaches mReaches; ///< of their lines, by the join's number
+    LineReaches mReaches;                              ///< of their lines, in the same order
     std::vector<Ref<clsDragColumn>> mDragColumns;
     std::int16_t mDragTableIndex = 0;
     std::int16_t mActiveTableIndex = 0;

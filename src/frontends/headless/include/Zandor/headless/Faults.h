@@ -18,14 +18,21 @@ public:
     template <class Error>
     void failNext(const std::string& call, const Error& error, int nth = 1) {
         mArmed[call] = {nth, std::make_exception_ptr(error)};
+        weigh();
     }
 
     /// Whether a failure of that name has been armed and not met yet.
     bool isArmed(const std::string& call) const { return mArmed.count(call) != 0; }
-    void disarm() { mArmed.clear(); }
+    void disarm() {
+        mArmed.clear();
+        weigh();
+    }
 
     /// Off at first, because every call costs a text while it is on.
-    void remember(bool on) { mRemembering = on; }
+    void remember(bool on) {
+        mRemembering = on;
+        weigh();
+    }
     const std::vector<std::string>& calls() const { return mCalls; }
     void forget() { mCalls.clear(); }
 
@@ -33,7 +40,7 @@ public:
     std::function<void(const std::string& call)> onPass;
 
     /// False while nobody asks for names: the caller need not make one.
-    bool listening() const { return mRemembering || !mArmed.empty() || onPass; }
+    bool listening() const { return mWanted || onPass; }
 
     void pass(const std::string& call) {
         if (onPass) onPass(call);
@@ -42,6 +49,7 @@ public:
         if (armed == mArmed.end() || --armed->second.countdown > 0) return;
         const std::exception_ptr error = armed->second.error;
         mArmed.erase(armed);
+        weigh();
         std::rethrow_exception(error);
     }
 
@@ -51,9 +59,12 @@ private:
         std::exception_ptr error;
     };
 
+    void weigh() { mWanted = mRemembering || !mArmed.empty(); }
+
     std::map<std::string, Armed> mArmed;
     std::vector<std::string> mCalls;
     bool mRemembering = false;
+    bool mWanted = false; ///< whether a name is remembered or armed: each call asks
 };
 
 } // namespace zandor::platform::headless
