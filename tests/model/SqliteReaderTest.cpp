@@ -39,6 +39,29 @@ TEST(TheSqliteReader, ListsATableWhoseNameOnlyBeginsLikeThoseOfSqlite) {
     ASSERT_EQ(tables->size(), 1U);
 }
 
+TEST(TheSqliteReader, OrdersTablesByNameWithoutRegardToTheCaseOfLetters) {
+    TemporaryDatabase database(
+        {"CREATE TABLE prefix_b (y)", "CREATE TABLE PREFIX_C (y)", "CREATE VIEW prefix AS SELECT 1",
+         "CREATE TABLE Prefix_a (y)", "CREATE TABLE prefix_bcdefghijk (y)",
+         "CREATE TABLE prefix_bcdefghij_ (y)", QStringLiteral("CREATE TABLE \"prefix_\uFFFD\" (y)"),
+         QStringLiteral("CREATE TABLE \"prefix_\U0001F600\" (y)"), "CREATE TABLE \"a\nb\" (y)"});
+    const auto tables = database.reader().tables();
+    ASSERT_TRUE(tables) << tables.error().toStdString();
+    std::vector<platform::String> names;
+    for (const auto& entry : *tables) names.push_back(entry.id.name);
+    EXPECT_EQ(names, (std::vector<platform::String>{
+                         u"a\nb", u"prefix", u"Prefix_a", u"prefix_b", u"prefix_bcdefghij_",
+                         u"prefix_bcdefghijk", u"PREFIX_C", u"prefix_\uFFFD",
+                         u"prefix_\U0001F600"})); // by character, and not by unit
+}
+
+TEST(TheSqliteReader, ListsNothingInAnEmptyFile) {
+    TemporaryDatabase database({"VACUUM"});
+    const auto tables = database.reader().tables();
+    ASSERT_TRUE(tables) << tables.error().toStdString();
+    EXPECT_TRUE(tables->empty());
+}
+
 TEST(TheSqliteReader, ReadsColumnsWithTypeAndPrimaryKey) {
     TemporaryDatabase database({"CREATE TABLE line (amount DECIMAL(8, 2), pos smallint, doc INT, "
                                 "free, PRIMARY KEY (doc, pos))"});

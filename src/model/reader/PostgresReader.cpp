@@ -1,8 +1,13 @@
 #include <Zandor/DatabaseReader.h>
 
 #include "model/reader/columnType.h"
+#include "model/reader/namesInJson.h"
+#include "model/reader/sortByName.h"
 
 #include <Zandor/reader/rows.h>
+
+#include <unordered_set>
+#include <utility>
 
 namespace zandor::reader {
 
@@ -22,13 +27,13 @@ private:
     QSqlDatabase mDatabase;
 };
 
-/// A table's schema, empty when a statement finds the table without being told: when it is in the
-/// default schema and the engine, which searches its own first, has none of that name. The engine's
-/// function for that looks up every table by itself, which takes several times as long.
-const QString toldSchema = QStringLiteral(
-    "CASE WHEN %1.nspname = (SELECT current_schema()) AND NOT EXISTS (SELECT FROM "
-    "pg_catalog.pg_class hides WHERE hides.relnamespace = 'pg_catalog'::regnamespace "
-    "AND hides.relname = %2.relname) THEN '' ELSE %1.nspname END");
+/// A table's schema as ids have it: empty when a statement finds the table without being told,
+/// which is when it is in the default schema and the engine, which searches its own first, has none
+/// of that name. The engine's function for that looks up every table by itself, which takes several
+/// times as long.
+String toldSchema(const String& schema, bool isDefault, bool engineHasTheName) {
+    return isDefault && !engineHasTheName ? String() : schema;
+}
 
 /// The table that an id names; two parameters, schema and name. Not to_regclass, which reads the
 /// name as SQL does.
@@ -83,20 +88,38 @@ platform::String declaredAs(const QSqlQuery& row) {
 
 Result<std::vector<TableEntry>> PostgresReader::tables() {
     std::vector<TableEntry> entries;
-    // A partition is a part of its table, of which there may be thousands.
+    std::unordered_set<String> engines; // the names that it has of its own
+    String defaultSchema;
+    // A partition is a part of its table, of which there may be thousands. A row for each table
+    // takes longer than the rest together, and a join with the schemas would be made for each.
     const auto error = readRows(
         mDatabase, model::say<MessageCode::tablesNotRead>(),
-        QStringLiteral("SELECT %1, c.relname, c.relkind IN ('v', 'm') "
-                       "FROM pg_catalog.pg_class c "
-                       "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
-                       "WHERE c.relkind IN ('r', 'p', 'f', 'v', 'm') AND NOT c.relispartition "
-                       "AND n.nspname <> 'information_schema' AND n.nspname NOT LIKE 'pg\\_%' "
-                       "ORDER BY lower(c.relname), c.relname, n.nspname")
-            .arg(toldSchema.arg(QStringLiteral("n"), QStringLiteral("c"))),
+        QStringLiteral(
+            "SELECT n.nspname, n.nspname = current_schema(), are.views, "
+            "n.oid = 'pg_catalog'::regnamespace, are.names FROM ("
+            "SELECT relnamespace, relkind IN ('v', 'm') AS views, json_agg(relname) AS names "
+            "FROM pg_catalog.pg_class WHERE relnamespace = 'pg_catalog'::regnamespace OR "
+            "relkind IN ('r', 'p', 'f', 'v', 'm') AND NOT relispartition AND relnamespace = ANY ("
+            "ARRAY(SELECT oid FROM pg_catalog.pg_namespace WHERE nspname <> 'information_schema' "
+            "AND nspname NOT LIKE 'pg\\_%')) GROUP BY relnamespace, views) are "
+            "JOIN pg_catalog.pg_namespace n ON n.oid = are.relnamespace"),
         {}, [&](const QSqlQuery& row) {
-            entries.push_back({{textAt(row, 0), textAt(row, 1)}, row.value(2).toBool()});
+            const String schema = textAt(row, 0);
+            if (row.value(1).toBool()) defaultSchema = schema;
+            const bool areViews = row.value(2).toBool();
+            const bool areTheEngines = row.value(3).toBool();
+            forEachName(row.value(4).toString(), [&](String name) {
+                if (areTheEngines)
+                    engines.insert(std::move(name));
+                else
+                    entries.push_back({{schema, std::move(name)}, areViews});
+            });
         });
     if (error) return *error;
+    sortByName(entries); // by all schemas, told or not
+    for (TableEntry& entry : entries)
+        entry.id.schema = toldSchema(entry.id.schema, entry.id.schema == defaultSchema,
+                                     engines.contains(entry.id.name));
     return entries;
 }
 
@@ -153,7 +176,10 @@ Result<std::vector<ForeignKey>> PostgresReader::foreignKeys(const TableId& child
         mDatabase, model::say<MessageCode::foreignKeysNotRead>(child.name),
         // A key to a partitioned table stands there once more for every partition: those are left
         // out. One that a partition has from its parent is its own.
-        QStringLiteral("SELECT pair.position, %2, p.relname, ca.attname, pa.attname "
+        QStringLiteral("SELECT pair.position, pn.nspname, pn.nspname = current_schema(), EXISTS ("
+                       "SELECT FROM pg_catalog.pg_class hides WHERE hides.relname = p.relname AND "
+                       "hides.relnamespace = 'pg_catalog'::regnamespace), "
+                       "p.relname, ca.attname, pa.attname "
                        "FROM pg_catalog.pg_constraint k "
                        "JOIN pg_catalog.pg_class c ON c.oid = k.conrelid "
                        "JOIN pg_catalog.pg_namespace n ON n.oid = c.relnamespace "
@@ -169,11 +195,15 @@ Result<std::vector<ForeignKey>> PostgresReader::foreignKeys(const TableId& child
                        "WHERE k.contype = 'f' AND %1 "
                        "AND origin.conrelid IS DISTINCT FROM k.conrelid "
                        "ORDER BY k.oid, pair.position")
-            .arg(isNamed, toldSchema.arg(QStringLiteral("pn"), QStringLiteral("p"))),
+            .arg(isNamed),
         {toQt(child.schema), toQt(child.name)}, [&](const QSqlQuery& row) {
             if (row.value(0).toInt() == 1)
-                keys.push_back({child, {textAt(row, 1), textAt(row, 2)}, {}});
-            keys.back().columns.emplace_back(textAt(row, 3), textAt(row, 4));
+                keys.push_back(
+                    {child,
+                     {toldSchema(textAt(row, 1), row.value(2).toBool(), row.value(3).toBool()),
+                      textAt(row, 4)},
+                     {}});
+            keys.back().columns.emplace_back(textAt(row, 5), textAt(row, 6));
         });
     if (error) return *error;
     return keys;

@@ -1,8 +1,12 @@
 #include <Zandor/DatabaseReader.h>
 
 #include "model/reader/columnType.h"
+#include "model/reader/namesInJson.h"
+#include "model/reader/sortByName.h"
 
 #include <Zandor/reader/rows.h>
+
+#include <utility>
 
 namespace zandor::reader {
 
@@ -29,34 +33,36 @@ private:
 
 Result<std::vector<TableEntry>> SqliteReader::tables() {
     const auto failed = model::say<MessageCode::tablesNotRead>();
-    const QString order = QStringLiteral(" AND name NOT LIKE 'sqlite\\_%' ESCAPE '\\' "
-                                         "ORDER BY name COLLATE NOCASE, name");
+    const QString notItsOwn = QStringLiteral(" AND name NOT LIKE 'sqlite\\_%' ESCAPE '\\'");
     std::vector<TableEntry> entries;
     bool hasVirtual = false;
-    const auto add = [&](const QSqlQuery& row) {
-        entries.push_back({{{}, textAt(row, 0)}, row.value(1).toBool()});
-    };
     // Neither a view nor a virtual table has a page of its own.
     auto error = readRows(mDatabase, failed,
-                          QStringLiteral("SELECT name, type = 'view', rootpage FROM sqlite_master "
-                                         "WHERE type IN ('table', 'view')") +
-                              order,
+                          QStringLiteral("SELECT name, type = 'view' FROM sqlite_master "
+                                         "WHERE rootpage = 0 AND type IN ('table', 'view')") +
+                              notItsOwn,
                           {}, [&](const QSqlQuery& row) {
-                              add(row);
-                              hasVirtual |= !entries.back().isView && row.value(2).toInt() == 0;
+                              if (row.value(1).toBool())
+                                  entries.push_back({{{}, textAt(row, 0)}, true});
+                              else
+                                  hasVirtual = true;
                           });
-    if (hasVirtual && !error) {
-        // Only this tells the tables that a virtual one keeps for itself, but it reads the columns
-        // of all tables for it.
-        entries.clear();
-        error =
-            readRows(mDatabase, failed,
-                     QStringLiteral("SELECT name, type = 'view' FROM pragma_table_list WHERE "
-                                    "schema = 'main' AND type IN ('table', 'view', 'virtual')") +
-                         order,
-                     {}, add);
-    }
     if (error) return *error;
+    // The list of tables alone tells those that a virtual one keeps for itself, but it reads the
+    // columns of all tables for it.
+    error = readRows(mDatabase, failed,
+                     QStringLiteral("SELECT json_group_array(name) FROM ") +
+                         (hasVirtual ? QStringLiteral("pragma_table_list WHERE schema = 'main' AND "
+                                                      "type IN ('table', 'virtual')")
+                                     : QStringLiteral("sqlite_master WHERE type = 'table'")) +
+                         notItsOwn,
+                     {}, [&](const QSqlQuery& row) {
+                         forEachName(row.value(0).toString(), [&](String name) {
+                             entries.push_back({{{}, std::move(name)}, false});
+                         });
+                     });
+    if (error) return *error;
+    sortByName(entries);
     return entries;
 }
 

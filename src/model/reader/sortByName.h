@@ -4,8 +4,9 @@
 
 namespace zandor::reader {
 
-/// Puts tables into the order of their names as people read them, where an engine's own order
-/// depends on how it was set up.
+/// Puts tables into the order of their names as people read them, A beside a, other characters by
+/// their code points; equal names by that of their schemas. An engine's own order may depend on how
+/// it was set up.
 void sortByName(std::vector<TableEntry>& entries);
 
 } // namespace zandor::reader

@@ -1,6 +1,7 @@
 #include "OneServer.h"
 
 #include <Zandor/reader/addTables.h>
+#include <Zandor/reader/rows.h>
 
 #include <algorithm>
 
@@ -74,6 +75,27 @@ TEST_F(PostgresReader, NamesTheSchemaOfATableThatAnotherOneHides) {
     runOnServer({sql("CREATE TABLE pg_class (x int)")}); // the engine's own comes first
     EXPECT_EQ(tables(), (std::vector<reader::TableEntry>{{{u"public", u"pg_class"}, false}}));
     EXPECT_EQ(columns({u"public", u"pg_class"}).size(), 1U);
+}
+
+TEST_F(PostgresReader, OrdersTablesByNameWithoutRegardToTheCaseOfLetters) {
+    runOnServer({sql("CREATE TABLE \"b\" (x int)"), sql("CREATE TABLE \"A\" (x int)"),
+                 sql("CREATE TABLE \"a\" (x int)"), sql("CREATE VIEW \"B_\" AS SELECT 1 AS x"),
+                 sql("CREATE TABLE \"ä\" (x int)"), sql("CREATE TABLE \"Ä\" (x int)"),
+                 sql("CREATE TABLE \"table_10\" (x int)"),
+                 sql("CREATE TABLE \"TABLE_9\" (x int)")});
+    std::vector<platform::String> names;
+    for (const auto& entry : tables()) names.push_back(entry.id.name);
+    EXPECT_EQ(names, (std::vector<platform::String>{u"A", u"a", u"b", u"B_", u"table_10",
+                                                    u"TABLE_9", u"Ä", u"ä"}));
+}
+
+TEST_F(PostgresReader, ListsTablesWithLineBreaksInTheirNames) {
+    const platform::String names[] = {u"\n", u"\n\n", u"a\n", u"a\n b", u"b\n\n \n", u"c"};
+    for (const auto& name : names)
+        runOnServer({sql("CREATE TABLE \"%1\" (x int)").arg(reader::toQt(name))});
+    std::vector<platform::String> listed;
+    for (const auto& entry : tables()) listed.push_back(entry.id.name);
+    EXPECT_EQ(listed, std::vector<platform::String>(std::begin(names), std::end(names)));
 }
 
 TEST_F(PostgresReader, ReadsColumnsWithDeclaredTypeAndMeaning) {
