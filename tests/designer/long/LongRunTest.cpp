@@ -68,8 +68,8 @@ void expectFlat(std::vector<double> samples, const char* what) {
 
 class ALongRun : public OpenWindow {
 protected:
-    // Full from the first minute on. To clear it would keep the names of all that was in it.
-    ALongRun() { QPixmapCache::setCacheLimit(512); }
+    // Qt keeps the names of all pictures that have ever been in its cache: none gets in.
+    ALongRun() { QPixmapCache::setCacheLimit(0); }
     ~ALongRun() override { QPixmapCache::setCacheLimit(mCacheLimit); }
 
     void open() {
