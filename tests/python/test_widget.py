@@ -4,8 +4,9 @@ import gc
 
 import pytest
 from conftest import settle
-from PyQt6.QtCore import QPoint, QPointF, Qt
-from PyQt6.QtWidgets import QAbstractItemView, QWidget
+from PyQt6.QtCore import QEvent, QPoint, QPointF, Qt
+from PyQt6.QtGui import QMouseEvent
+from PyQt6.QtWidgets import QAbstractItemView, QApplication, QWidget
 
 import zandor
 
@@ -242,7 +243,12 @@ def test_columns_of_a_model_in_python_are_marked_as_coming_out(application, boxe
     widget.setComforts(zandor.Flags.all())
     widget.setModel(model)
     settle()
-    entries = widget.findChild(QWidget, "lstTable(1)").findChild(QAbstractItemView).model()
+    table = widget.findChild(QWidget, "lstTable(1)")
+    at = QPointF(5, 5)
+    nothing = Qt.MouseButton.NoButton, Qt.MouseButton.NoButton, Qt.KeyboardModifier.NoModifier
+    # The list is there as soon as the mouse is.
+    QApplication.sendEvent(table, QMouseEvent(QEvent.Type.MouseMove, at, at, *nothing))
+    entries = table.findChild(QAbstractItemView).model()
     role = Qt.ItemDataRole.AccessibleDescriptionRole
     marked = [entries.index(row, 0).data(role) == "comes out" for row in range(4)]
     assert marked == [False, False, False, True]

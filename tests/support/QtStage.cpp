@@ -321,6 +321,7 @@ public:
 private:
     static std::string tableName(int index) { return "lstTable(" + std::to_string(index) + ")"; }
     static QWidget& focusable(QWidget& given) {
+        if (const auto* table = dynamic_cast<TabuletWidget*>(&given)) return table->list();
         return given.focusProxy() ? *given.focusProxy() : given;
     }
 

@@ -152,7 +152,7 @@ void Canvas::paintEvent(QPaintEvent* event) {
     const QRect seen = mView.seen();
     for (QObject* child : children())
         if (auto* const box = qobject_cast<TabuletWidget*>(child))
-            seen.intersects(box->geometry()) ? box->picture().keep() : box->picture().drop();
+            if (!seen.intersects(box->geometry())) box->picture().drop();
     QPainter painter(this);
     // A picture of the whole canvas is seldom asked for, and needs none of what would be kept.
     const bool kept = paintsOwnPixels(painter, *this) && Backdrop::worksAt(devicePixelRatioF()) &&

@@ -113,11 +113,34 @@ private:
     Canvas& canvas() const { return *static_cast<Canvas*>(widget()); }
 };
 
+/// Who reads a table finds its list and its button, which are made for that.
+class TabuletAccessible final : public QAccessibleWidget {
+public:
+    explicit TabuletAccessible(TabuletWidget& box)
+        : QAccessibleWidget(&box, QAccessible::Window), mBox(box) {}
+
+    int childCount() const override {
+        mBox.list();
+        return QAccessibleWidget::childCount();
+    }
+    QAccessibleInterface* child(int index) const override {
+        mBox.list();
+        return QAccessibleWidget::child(index);
+    }
+    QAccessibleInterface* childAt(int x, int y) const override {
+        mBox.list();
+        return QAccessibleWidget::childAt(x, y);
+    }
+
+private:
+    TabuletWidget& mBox;
+};
+
 QAccessibleInterface* make(const QString& className, QObject* object) {
     if (className == QLatin1String(Canvas::staticMetaObject.className()))
         return new CanvasAccessible(*static_cast<Canvas*>(object));
     if (className == QLatin1String(TabuletWidget::staticMetaObject.className()))
-        return new QAccessibleWidget(static_cast<QWidget*>(object), QAccessible::Window);
+        return new TabuletAccessible(*static_cast<TabuletWidget*>(object));
     if (className == QLatin1String(PaneHandle::staticMetaObject.className()))
         return new QAccessibleWidget(static_cast<QWidget*>(object), QAccessible::Splitter);
     if (className == QLatin1String("ZandorWidget"))

@@ -100,7 +100,8 @@ void Navigation::go(const Stop& stop, bool next) {
     Canvas* const canvas = mView.canvas();
     if (stop.widget == canvas) return canvas->focusOn(stop.line, reason(next));
     const QPointer<QWidget> wanted = stop.widget;
-    if (dynamic_cast<TabuletWidget*>(stop.widget)) {
+    if (auto* const table = dynamic_cast<TabuletWidget*>(stop.widget)) {
+        table->list(); // has the keys, and the focus in its place
         stop.widget->raise();
         mView.reveal(stop.widget->geometry());
     }

@@ -33,7 +33,7 @@ void RestingPicture::drop() {
     mPicture = QPixmap();
 }
 
-void RestingPicture::keep() {
+void RestingPicture::take() {
     if (!mPicture.isNull() || mPaintings < paintingsAtRest) return;
     const qreal scale = mBox.devicePixelRatioF();
     const QSizeF size = QSizeF(mBox.size()) * scale;
@@ -59,7 +59,9 @@ bool RestingPicture::eventFilter(QObject* watched, QEvent* event) {
     case QEvent::Paint:
         if (!mPicture.isNull())
             return paint(static_cast<QWidget&>(*watched), static_cast<QPaintEvent&>(*event));
-        if (watched == &mBox) ++mPaintings;
+        // Not while the box itself is painted.
+        if (watched == &mBox && ++mPaintings == paintingsAtRest)
+            QMetaObject::invokeMethod(this, &RestingPicture::take, Qt::QueuedConnection);
         return false;
     case QEvent::Move:
     case QEvent::MouseMove:

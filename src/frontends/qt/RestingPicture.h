@@ -10,23 +10,23 @@ class QWidget;
 namespace zandor::platform::qt {
 
 /// What a box with all its parts looks like while nothing happens to them, kept so that being
-/// uncovered is a matter of copying pixels. Any event of the box or of a part other than to be
-/// painted ends the rest.
+/// uncovered is a matter of copying pixels. It is taken once the box has been painted a few times
+/// at rest; any event of the box or of a part other than to be painted ends that.
 class RestingPicture : public QObject {
 public:
     /// An opaque box, which the picture belongs to.
     explicit RestingPicture(QWidget& box);
 
-    /// Takes the picture if the box has been painted often enough at rest. Not to be called while
-    /// the box itself is painted.
-    void keep();
+    /// Has a part asked about before its own event filters are. To be called with one that has been
+    /// made after the picture, when it has all of those.
+    void watch(QWidget& part);
     /// To be called when the box looks otherwise without an event that says so.
     void drop();
 
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
-    void watch(QWidget& part);
+    void take();
     bool isRight() const;
     bool paint(QWidget& part, const QPaintEvent& event);
 

@@ -48,6 +48,11 @@ void CanvasScrollBar::focusOutEvent(QFocusEvent* event) {
     update();
 }
 
+void CanvasScrollBar::sliderChange(SliderChange change) {
+    mPicture.drop();
+    QScrollBar::sliderChange(change);
+}
+
 ScrollBarAdapter::ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, ScrollBarEvents events)
     : Adapter(widget, focus) {
     widget->setRange(0, 0);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "frontends/qt/Adapter.h"
+#include "frontends/qt/RestingPicture.h"
 
 #include <Zandor/platform/Intrinsic.h>
 
@@ -19,6 +20,10 @@ protected:
     void paintEvent(QPaintEvent* event) override;
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
+    void sliderChange(SliderChange change) override;
+
+private:
+    RestingPicture mPicture{*this}; ///< styles take their time to paint a bar
 };
 
 class ScrollBarAdapter final : public Adapter<platform::ScrollBar, QScrollBar> {

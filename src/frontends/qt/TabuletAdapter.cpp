@@ -38,13 +38,16 @@ public:
     const String& Key() const override { return mKey; }
 
     bool Selected() const override {
-        return live() ? list().selectionModel()->isSelected(index()) : mSelected;
+        if (!live()) return mSelected;
+        // Without a list nothing was selected.
+        const ColumnListView* const made = mTable->mWidget->madeList();
+        return made && made->selectionModel()->isSelected(index());
     }
 
     void Selected(bool value) override {
         mSelected = value;
         if (mTable && value) mTable->mEntryTaken = true;
-        if (live())
+        if (live() && value != Selected())
             list().selectionModel()->select(index(), value ? QItemSelectionModel::Select
                                                            : QItemSelectionModel::Deselect);
     }
@@ -60,7 +63,7 @@ public:
     }
 
     void Refresh() override {
-        if (live()) list().update(index());
+        if (live() && mTable->mWidget->madeList()) list().update(index());
     }
 
     void EnsureVisible() override {
@@ -86,9 +89,8 @@ private:
     TalvikTabulet::Point edge(float side) const {
         if (!live()) throw errors::objectNotSet();
         const Bounds box = mTable->bounds();
-        const ColumnListView& view = list();
-        const float row = static_cast<float>(view.rowHeight());
-        const float middle = static_cast<float>(view.y() + view.firstEntry()) +
+        const float row = static_cast<float>(mTable->mWidget->rowHeight());
+        const float middle = static_cast<float>(mTable->mWidget->firstEntry()) +
                              row * (static_cast<float>(mRow) + 0.5F);
         return {box.Left + side * box.Width, box.Top + middle * twipsPerPixel};
     }
@@ -117,7 +119,7 @@ Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Add(const String& key, c
 
 std::vector<Ref<TalvikTabulet::ColumnItem>> TabuletAdapter::Entries::Selected() const {
     std::vector<Ref<TalvikTabulet::ColumnItem>> selected;
-    if (!mTable.mWidget) return selected;
+    if (!mTable.mWidget || !mTable.mWidget->madeList()) return selected;
     QModelIndexList rows = mTable.mWidget->list().selectionModel()->selectedIndexes();
     std::sort(rows.begin(), rows.end());
     for (const QModelIndex& row : rows) selected.push_back(Item(row.row() + 1));
@@ -130,9 +132,6 @@ TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus,
     : Adapter(widget, focus), mSurroundings(surroundings), mDrags(surroundings.drags),
       mIndex(index), mHandle(nextHandle()), mEvents(events) {
     widget->setListener(this);
-    mFocus.watch(&widget->list(), [this] {
-        if (mEvents.GotFocus) mEvents.GotFocus(mIndex);
-    });
 }
 
 TabuletAdapter::~TabuletAdapter() { leave(); }
@@ -143,7 +142,7 @@ void TabuletAdapter::leave() {
     if (mSurroundings.current == this) mSurroundings.current = nullptr;
     if (!mWidget) return;
     mWidget->setListener(nullptr);
-    mFocus.forget(&mWidget->list());
+    if (mWidget->madeList()) mFocus.forget(mWidget->madeList());
     dropWidget();
 }
 
@@ -205,8 +204,7 @@ void TabuletAdapter::Drag(std::int16_t action) {
 void TabuletAdapter::Complete() {
     if (!mWidget) return;
     // Laid out at once: the ends of join lines depend on how far the list is scrolled.
-    mWidget->list().doItemsLayout();
-    mWidget->update();
+    mWidget->layOut();
 }
 
 void TabuletAdapter::Terminate() {
@@ -257,6 +255,12 @@ void TabuletAdapter::selectionChanged() {
 
 void TabuletAdapter::listScrolled() {
     if (mEvents.Scroll) mEvents.Scroll(mIndex);
+}
+
+void TabuletAdapter::listMade(ColumnListView& list) {
+    mFocus.watch(&list, [this] {
+        if (mEvents.GotFocus) mEvents.GotFocus(mIndex);
+    });
 }
 
 void TabuletAdapter::closeClicked() {

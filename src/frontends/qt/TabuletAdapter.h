@@ -77,6 +77,7 @@ private:
     void listScrolled() override;
     void menuKey(int row, QPoint at) override;
     void deleteKey(int row) override;
+    void listMade(ColumnListView& list) override;
     void closeClicked() override;
     void titleClicked() override { mSurroundings.comforts.titleClicked(mIndex); }
     void gestureBegan() override;

@@ -2,10 +2,13 @@
 
 #include "frontends/qt/Canvas.h"
 #include "frontends/qt/CanvasView.h"
+#include "frontends/qt/ColumnDelegate.h"
 #include "frontends/qt/ColumnListModel.h"
 #include "frontends/qt/ElisionToolTip.h"
 #include "frontends/qt/KeyCodes.h"
+#include "frontends/qt/ListAtRest.h"
 #include "frontends/qt/ShownText.h"
+#include "frontends/qt/TitleCross.h"
 #include "frontends/qt/mixed.h"
 
 #include <Zandor/qt/Text.h>
@@ -27,55 +30,6 @@ namespace {
 constexpr int border = 4;       ///< resizes the box; its outermost pixel is the frame line
 constexpr int keyStep = 10;     ///< 150 twips
 constexpr int cornerReach = 14; ///< how far a corner reaches along its edges
-
-struct TitleColours {
-    QColor back;
-    QColor text;
-    QColor frame;
-};
-
-TitleColours titleColours(const TabuletWidget& box) {
-    const QPalette palette = box.palette();
-    const QColor window = palette.color(QPalette::Window);
-    const QColor windowText = palette.color(QPalette::WindowText);
-    const QColor highlight = palette.color(QPalette::Active, QPalette::Highlight);
-    const bool focused = box.list().hasFocus() && box.isActiveWindow();
-    if (focused)
-        return {highlight, palette.color(QPalette::Active, QPalette::HighlightedText), highlight};
-    if (box.isCurrent())
-        return {mixed(window, highlight, 0.3), windowText, mixed(window, highlight, 0.7)};
-    return {mixed(window, windowText, 0.08), windowText, mixed(window, windowText, 0.35)};
-}
-
-/// The cross in the title bar.
-class CloseButton : public QAbstractButton {
-public:
-    explicit CloseButton(TabuletWidget& box) : QAbstractButton(&box), mBox(box) {
-        setFocusPolicy(Qt::NoFocus);
-        setCursor(Qt::ArrowCursor);
-        setAttribute(Qt::WA_Hover);
-    }
-
-protected:
-    void paintEvent(QPaintEvent*) override {
-        QPainter painter(this);
-        painter.setRenderHint(QPainter::Antialiasing);
-        const TitleColours colours = titleColours(mBox);
-        if (underMouse()) {
-            painter.setPen(Qt::NoPen);
-            painter.setBrush(mixed(colours.back, colours.text, isDown() ? 0.35 : 0.2));
-            painter.drawRoundedRect(rect(), 3, 3);
-        }
-        const QPointF middle = QRectF(rect()).center();
-        const qreal arm = width() * 0.22;
-        painter.setPen(QPen(colours.text, 1.3, Qt::SolidLine, Qt::RoundCap));
-        painter.drawLine(middle + QPointF(-arm, -arm), middle + QPointF(arm, arm));
-        painter.drawLine(middle + QPointF(-arm, arm), middle + QPointF(arm, -arm));
-    }
-
-private:
-    TabuletWidget& mBox;
-};
 
 /// A triangle with a mark in it, on whatever colour.
 void paintWarning(QPainter& painter, const QRectF& place) {
@@ -110,29 +64,100 @@ Qt::CursorShape cursorFor(Qt::Edges edges) {
 
 TabuletWidget::TabuletWidget(int slot, Canvas& canvas)
     : QWidget(&canvas), mCanvas(canvas), mSlot(slot), mModel(new ColumnListModel(this)),
-      mList(new ColumnListView(this)), mClose(new CloseButton(*this)),
       mScroller(Qt::Vertical, [this](QPoint direction) { scrollUnderDrag(direction); }),
       mPicture(*this) {
     // Opaque, so that moving the box moves its pixels instead of painting it anew.
     setAttribute(Qt::WA_OpaquePaintEvent);
     setMouseTracking(true);
     setAcceptDrops(true);
-    setFocusProxy(mList);
-    mList->setModel(mModel);
-    mList->installEventFilter(this);
-    mList->viewport()->installEventFilter(this);
-    connect(mClose, &QAbstractButton::clicked, this, [this] {
-        if (mListener) mListener->closeClicked();
-    });
-    const auto otherwise = [this] { mPicture.drop(); };
+    const auto otherwise = [this] { mList ? mPicture.drop() : paintAnew(); };
     connect(mModel, &QAbstractItemModel::dataChanged, this, otherwise);
     connect(mModel, &QAbstractItemModel::rowsInserted, this, otherwise);
     connect(mModel, &QAbstractItemModel::modelReset, this, otherwise);
+    measure();
+}
+
+void TabuletWidget::makeParts() {
+    const int rowBefore = rowHeight();
+    const int firstBefore = firstEntry();
+    mList = new ColumnListView(this);
+    mList->setModel(mModel);
+    mList->setListener(mListener);
+    mList->setAccessibleName(accessibleName());
+    mList->setAccessibleDescription(accessibleDescription());
+    mList->installEventFilter(this);
+    mList->viewport()->installEventFilter(this);
+    const auto otherwise = [this] { mPicture.drop(); };
     connect(mList->selectionModel(), &QItemSelectionModel::selectionChanged, this, otherwise);
     connect(mList->selectionModel(), &QItemSelectionModel::currentChanged, this, otherwise);
     connect(mList->verticalScrollBar(), &QScrollBar::valueChanged, this, otherwise);
     connect(mList->verticalScrollBar(), &QScrollBar::rangeChanged, this, otherwise);
-    measure();
+
+    mClose = new TitleCross(*this);
+    mClose->setToolTip(mRemoveWord);
+    mClose->setAccessibleName(mRemoveWord);
+    connect(mClose, &QAbstractButton::clicked, this, [this] {
+        if (mListener) mListener->closeClicked();
+    });
+
+    mPicture.watch(*mList);
+    arrange();
+    mList->show();
+    mClose->setVisible(!mLocked);
+    setFocusProxy(mList);
+    mList->doItemsLayout(); // whoever has it made wants to scroll it, or to know where entries are
+    if (mListener) mListener->listMade(*mList);
+    if (rowHeight() != rowBefore || firstEntry() != firstBefore) tellOfMovedEntries();
+}
+
+/// A list that looks otherwise than the box takes it for has to be there to be seen.
+void TabuletWidget::makePartsIfNeeded() {
+    if (!mList && !canStandForList(*this, listPlace())) makeParts();
+}
+
+ColumnListView& TabuletWidget::list() const {
+    // It looks as what the box has shown of it.
+    if (!mList) const_cast<TabuletWidget*>(this)->makeParts();
+    return *mList;
+}
+
+QAbstractButton& TabuletWidget::closeButton() const {
+    list();
+    return *mClose;
+}
+
+int TabuletWidget::rowHeight() const {
+    return mList ? mList->rowHeight() : ColumnDelegate::rowHeight(fontMetrics());
+}
+
+int TabuletWidget::firstEntry() const { return mTitleHeight + (mList ? mList->firstEntry() : 0); }
+
+void TabuletWidget::layOut() {
+    makePartsIfNeeded();
+    if (mList) mList->doItemsLayout();
+    update();
+}
+
+/// Joins end at entries.
+void TabuletWidget::tellOfMovedEntries() {
+    QMetaObject::invokeMethod(
+        this,
+        [this] {
+            if (mListener) mListener->listScrolled();
+        },
+        Qt::QueuedConnection);
+}
+
+TitleColours TabuletWidget::titleColours() const {
+    const QColor window = palette().color(QPalette::Window);
+    const QColor windowText = palette().color(QPalette::WindowText);
+    const QColor highlight = palette().color(QPalette::Active, QPalette::Highlight);
+    const bool focused = mList && mList->hasFocus() && isActiveWindow();
+    if (focused)
+        return {highlight, palette().color(QPalette::Active, QPalette::HighlightedText), highlight};
+    if (isCurrent())
+        return {mixed(window, highlight, 0.3), windowText, mixed(window, highlight, 0.7)};
+    return {mixed(window, windowText, 0.08), windowText, mixed(window, windowText, 0.35)};
 }
 
 void TabuletWidget::paintAnew() {
@@ -142,19 +167,23 @@ void TabuletWidget::paintAnew() {
 
 void TabuletWidget::setListener(TabuletListener* listener) {
     mListener = listener;
+    if (!mList) return;
     mList->setListener(listener);
+    if (listener) listener->listMade(*mList);
 }
 
 void TabuletWidget::setWords(const Words& words) {
-    mClose->setToolTip(toQt(words.RemoveTable));
-    mClose->setAccessibleName(mClose->toolTip());
     mModel->setWords(words);
+    mRemoveWord = toQt(words.RemoveTable);
+    if (!mClose) return;
+    mClose->setToolTip(mRemoveWord);
+    mClose->setAccessibleName(mRemoveWord);
 }
 
 void TabuletWidget::setTitle(const QString& title) {
     mTitle = asSigns(title);
     setAccessibleName(mTitle);
-    mList->setAccessibleName(mTitle);
+    if (mList) mList->setAccessibleName(mTitle);
     paintAnew();
 }
 
@@ -162,13 +191,13 @@ void TabuletWidget::setNote(const QString& note) {
     if (mNote == note) return;
     mNote = note;
     setAccessibleDescription(asSigns(note));
-    mList->setAccessibleDescription(asSigns(note));
+    if (mList) mList->setAccessibleDescription(asSigns(note));
     paintAnew();
 }
 
 void TabuletWidget::setLocked(bool locked) {
     mLocked = locked;
-    mClose->setVisible(!locked);
+    if (mClose) mClose->setVisible(!locked);
     unsetCursor();
     paintAnew();
     if (locked && stopGesture() && mListener) mListener->gestureTakenBack();
@@ -181,7 +210,7 @@ void TabuletWidget::setCurrent(bool current) {
 }
 
 QSize TabuletWidget::smallest() const {
-    return {mTitleHeight * 3, mTitleHeight + mList->rowHeight() + border};
+    return {mTitleHeight * 3, mTitleHeight + rowHeight() + border};
 }
 
 QRect TabuletWidget::titlePlace() const {
@@ -199,29 +228,54 @@ QFont TabuletWidget::titleFont() const {
 
 QRect TabuletWidget::titleBar() const { return {0, 0, width(), mTitleHeight}; }
 
+QRect TabuletWidget::crossPlace() const {
+    const int side = mTitleHeight - 8;
+    return {width() - side - border, 4, side, side};
+}
+
+QRect TabuletWidget::listPlace() const {
+    return rect().adjusted(border, mTitleHeight, -border, -border);
+}
+
 void TabuletWidget::measure() {
-    mTitleHeight = fontMetrics().height() + 10;
+    const int before = std::exchange(mTitleHeight, fontMetrics().height() + 10);
     arrange();
+    // A list tells it itself.
+    if (!mList && before != 0 && before != mTitleHeight) tellOfMovedEntries();
 }
 
 void TabuletWidget::arrange() {
-    const int side = mTitleHeight - 8;
-    mClose->setGeometry(width() - side - border, 4, side, side);
-    mList->setGeometry(
-        QRect(border, mTitleHeight, width() - 2 * border, height() - mTitleHeight - border));
+    if (!mList) return;
+    mClose->setGeometry(crossPlace());
+    mList->setGeometry(listPlace());
 }
 
-void TabuletWidget::resizeEvent(QResizeEvent*) { arrange(); }
+/// For whoever gives it to the box: the keys are the list's.
+void TabuletWidget::focusInEvent(QFocusEvent* event) { list().setFocus(event->reason()); }
+
+void TabuletWidget::resizeEvent(QResizeEvent*) {
+    makePartsIfNeeded();
+    arrange();
+}
 
 void TabuletWidget::changeEvent(QEvent* event) {
     QWidget::changeEvent(event);
-    if (event->type() == QEvent::FontChange || event->type() == QEvent::StyleChange) measure();
-    if (event->type() == QEvent::ActivationChange) update();
+    switch (event->type()) {
+    case QEvent::FontChange:
+    case QEvent::StyleChange: measure(); [[fallthrough]];
+    case QEvent::PaletteChange:
+    case QEvent::LayoutDirectionChange:
+        // Not while the host's style sheet goes from widget to widget.
+        QMetaObject::invokeMethod(this, &TabuletWidget::makePartsIfNeeded, Qt::QueuedConnection);
+        break;
+    case QEvent::ActivationChange: update(); break;
+    default: break;
+    }
 }
 
 void TabuletWidget::paintEvent(QPaintEvent*) {
     QPainter painter(this);
-    const TitleColours colours = titleColours(*this);
+    const TitleColours colours = titleColours();
     painter.fillRect(rect(), palette().base());
     painter.fillRect(titleBar(), colours.back);
 
@@ -237,9 +291,13 @@ void TabuletWidget::paintEvent(QPaintEvent*) {
 
     painter.setPen(colours.frame);
     painter.drawRect(rect().adjusted(0, 0, -1, -1));
+    if (mList) return;
+    if (!mLocked) paintCross(painter, crossPlace(), colours.text);
+    paintListAtRest(painter, *this, listPlace(), *mModel);
 }
 
 bool TabuletWidget::event(QEvent* event) {
+    if (handOn(*event)) return true;
     if (event->type() == QEvent::ToolTip) {
         const auto& help = *static_cast<QHelpEvent*>(event);
         if (titleBar().contains(help.pos()) && !mNote.isEmpty())
@@ -249,6 +307,44 @@ bool TabuletWidget::event(QEvent* event) {
         return true;
     }
     return QWidget::event(event);
+}
+
+/// What brings the mouse to a box without parts is for the one that is made there, and with a
+/// press all until the button comes up.
+bool TabuletWidget::handOn(QEvent& event) {
+    switch (event.type()) {
+    case QEvent::MouseMove:
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonDblClick:
+    case QEvent::MouseButtonRelease:
+    case QEvent::Wheel: break;
+    default: return false;
+    }
+    const auto& at = static_cast<const QSinglePointEvent&>(event);
+    if (!mList) {
+        makeParts();
+        mHandedTo = childAt(at.position().toPoint());
+        // Qt has looked for whom to give the focus to before.
+        if (mHandedTo && mHandedTo != mClose && at.button() != Qt::NoButton)
+            mList->setFocus(Qt::MouseFocusReason);
+    }
+    QWidget* const part = mHandedTo;
+    if (!part) return false;
+    if (at.buttons() == Qt::NoButton) mHandedTo = nullptr;
+    const QPointF inside = part->mapFrom(this, at.position());
+    if (event.type() == QEvent::Wheel) {
+        const auto& turn = static_cast<const QWheelEvent&>(event);
+        QWheelEvent own(inside, turn.globalPosition(), turn.pixelDelta(), turn.angleDelta(),
+                        turn.buttons(), turn.modifiers(), turn.phase(), turn.inverted(),
+                        turn.source(), turn.pointingDevice());
+        QCoreApplication::sendEvent(part, &own);
+    } else {
+        QMouseEvent own(event.type(), inside, at.scenePosition(), at.globalPosition(), at.button(),
+                        at.buttons(), at.modifiers(), at.pointingDevice());
+        QCoreApplication::sendEvent(part, &own);
+    }
+    event.accept();
+    return true;
 }
 
 bool TabuletWidget::eventFilter(QObject* watched, QEvent* event) {
@@ -305,10 +401,10 @@ Qt::Edges TabuletWidget::edgesAt(QPoint at) const {
 void TabuletWidget::mousePressEvent(QMouseEvent* event) {
     raise();
     if (event->button() != Qt::LeftButton) return;
-    if (isLocked()) return mList->setFocus(Qt::MouseFocusReason);
+    if (isLocked()) return list().setFocus(Qt::MouseFocusReason);
     mPressedAt = event->globalPosition();
     beginGesture(edgesAt(event->position().toPoint()));
-    mList->setFocus(Qt::MouseFocusReason);
+    list().setFocus(Qt::MouseFocusReason);
 }
 
 void TabuletWidget::mouseMoveEvent(QMouseEvent* event) {
@@ -359,15 +455,15 @@ void TabuletWidget::dragMoveEvent(QDragMoveEvent* event) {
     event->setAccepted(mListener && mListener->draggedOver(event->mimeData(), mDraggedAt, 2));
     if (!event->isAccepted()) return;
     // The list first: below its edge the canvas would run away.
-    const bool scrolls = mList->verticalScrollBar()->maximum() > 0;
-    if (scrolls && mScroller.hover(mDraggedAt.toPoint(), mList->geometry()))
+    const bool scrolls = list().verticalScrollBar()->maximum() > 0;
+    if (scrolls && mScroller.hover(mDraggedAt.toPoint(), listPlace()))
         mCanvas.dragGone();
     else
         mCanvas.dragHovers(mapToParent(mDraggedAt.toPoint()));
 }
 
 void TabuletWidget::scrollUnderDrag(QPoint direction) {
-    QScrollBar& bar = *mList->verticalScrollBar();
+    QScrollBar& bar = *list().verticalScrollBar();
     const int before = bar.value();
     bar.setValue(before + direction.y() * bar.singleStep() / 2);
     if (bar.value() != before && mListener) mListener->draggedOver(nullptr, mDraggedAt, 2);

@@ -9,6 +9,8 @@
 #include <Zandor/platform/Words.h>
 
 #include <QAbstractButton>
+#include <QColor>
+#include <QPointer>
 #include <QWidget>
 
 namespace zandor::platform::qt {
@@ -18,6 +20,8 @@ class ColumnListModel;
 
 class ZANDOR_WIDGETS_EXPORT TabuletListener : public EntryListener {
 public:
+    /// The table has its list from now on.
+    virtual void listMade(ColumnListView& list) = 0;
     virtual void closeClicked() = 0;
     /// The right button has come up over the title.
     virtual void titleClicked() = 0;
@@ -33,7 +37,15 @@ public:
     virtual bool dropped(const QMimeData* data, QPointF at) = 0;
 };
 
+struct TitleColours {
+    QColor back;
+    QColor text;
+    QColor frame;
+};
+
 /// A table as a box: title bar with name and close button, list of columns, a border to resize by.
+/// List and button are made when they are first asked for, by the mouse, the keyboard, a screen
+/// reader or whoever selects an entry; until then the box paints what they would.
 class ZANDOR_WIDGETS_EXPORT TabuletWidget : public QWidget {
     Q_OBJECT
 
@@ -45,9 +57,12 @@ public:
 
     void setListener(TabuletListener* listener);
     void setWords(const Words& words);
-    ColumnListView& list() const { return *mList; }
+    /// Made by asking, with the button.
+    ColumnListView& list() const;
+    QAbstractButton& closeButton() const;
+    /// nullptr as long as nobody has asked for it.
+    ColumnListView* madeList() const { return mList; }
     ColumnListModel& model() const { return *mModel; }
-    QAbstractButton& closeButton() const { return *mClose; }
     RestingPicture& picture() { return mPicture; }
 
     void setTitle(const QString& title);
@@ -62,6 +77,13 @@ public:
     void setCurrent(bool current);
     bool isCurrent() const { return mCurrent; }
 
+    /// To be called when all entries are there.
+    void layOut();
+    int rowHeight() const;
+    /// Where the first entry begins inside the box; above the list when that is scrolled.
+    int firstEntry() const;
+    TitleColours titleColours() const;
+
     /// Top of the list inside the box, the same at every size.
     int listTop() const { return mTitleHeight; }
     /// The smallest box that still shows its name and one entry.
@@ -74,6 +96,7 @@ protected:
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
     void changeEvent(QEvent* event) override;
+    void focusInEvent(QFocusEvent* event) override;
     void mousePressEvent(QMouseEvent* event) override;
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
@@ -86,8 +109,14 @@ protected:
 private:
     enum class Gesture { none, move, resize };
 
+    void makeParts();
+    void makePartsIfNeeded();
+    bool handOn(QEvent& event);
     void measure();
+    void tellOfMovedEntries();
     void paintAnew();
+    QRect listPlace() const;
+    QRect crossPlace() const;
     QRect titlePlace() const;
     QFont titleFont() const;
     void arrange();
@@ -103,8 +132,10 @@ private:
     const int mSlot;
     TabuletListener* mListener = nullptr;
     ColumnListModel* mModel;
-    ColumnListView* mList;
-    QAbstractButton* mClose;
+    ColumnListView* mList = nullptr;
+    QAbstractButton* mClose = nullptr;
+    QPointer<QWidget> mHandedTo; ///< has the mouse while a button is down
+    QString mRemoveWord;
     QString mTitle;
     QString mNote;
     bool mCurrent = false;

@@ -40,14 +40,23 @@ public:
     }
 };
 
-/// Counts the entries of lists that are drawn.
+/// Counts the entries of lists that are drawn, and scroll bars.
 class CountingStyle : public QProxyStyle {
 public:
     mutable int entries = 0;
+    mutable int bars = 0;
+
+    void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
+                            QPainter* painter, const QWidget* on) const override {
+        if (control == CC_ScrollBar) ++bars;
+        QProxyStyle::drawComplexControl(control, option, painter, on);
+    }
 
     void drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
                        const QWidget* on) const override {
-        if (element == PE_PanelItemViewItem && qobject_cast<const QListView*>(on)) ++entries;
+        const bool ofTable =
+            qobject_cast<const QListView*>(on) || qobject_cast<const TabuletWidget*>(on);
+        if (element == PE_PanelItemViewItem && ofTable) ++entries;
         QProxyStyle::drawPrimitive(element, option, painter, on);
     }
 };
@@ -169,21 +178,40 @@ TEST_F(Painting, OfAStepOfADragLeavesTheTablesAloneThatStandStill) {
 }
 
 TEST_F(Painting, OfWhatRestsIsACopyOfWhatWasPainted) {
+    // Before the lists are there, and with them.
+    for (const bool made : {false, true}) {
+        if (made)
+            for (const int slot : {1, 2, 3}) table(slot).list();
+        CountingStyle style;
+        widget->setStyle(&style);
+        for (auto* part : widget->findChildren<QWidget*>()) part->setStyle(&style);
+        pictureAtRest();
+        EXPECT_TRUE(line(0).rests());
+        style.entries = 0;
+        picture();
+        EXPECT_EQ(style.entries, 0);
+        made ? table(2).list().selectAll() : table(2).setTitle("ANOTHER");
+        settle();
+        style.entries = 0;
+        widget->grab();
+        EXPECT_EQ(style.entries, 4) << "those of the table that has changed";
+        for (auto* part : widget->findChildren<QWidget*>()) part->setStyle(nullptr);
+        widget->setStyle(nullptr);
+    }
+}
+
+TEST_F(Painting, OfABarThatRestsIsACopyOfWhatWasPainted) {
     CountingStyle style;
-    widget->setStyle(&style);
-    for (auto* part : widget->findChildren<QWidget*>()) part->setStyle(&style);
+    auto& bar = child<QScrollBar>("vsbTable");
+    bar.setStyle(&style);
     pictureAtRest();
-    EXPECT_TRUE(line(0).rests());
-    style.entries = 0;
-    picture();
-    EXPECT_EQ(style.entries, 0);
-    table(2).list().selectAll();
-    settle();
-    style.entries = 0;
-    widget->grab();
-    EXPECT_EQ(style.entries, 4) << "those of the table that has changed";
-    for (auto* part : widget->findChildren<QWidget*>()) part->setStyle(nullptr);
-    widget->setStyle(nullptr);
+    style.bars = 0;
+    const QImage before = picture();
+    EXPECT_EQ(style.bars, 0);
+    bar.setValue(300);
+    EXPECT_NE(bar.grab().toImage(), before.copy(bar.geometry()));
+    EXPECT_GT(style.bars, 0);
+    bar.setStyle(nullptr);
 }
 
 TEST_F(Painting, OfALineThatMovesWaitsUntilItRests) {
