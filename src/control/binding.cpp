@@ -219,7 +219,7 @@ void Zandor::SetCurrentTable(const String& given) {
         const auto found = std::find_if(lstTable.begin(), lstTable.end(), [&](const auto& element) {
             return element.second->Text() == TabName;
         });
-        if (found != lstTable.end()) MakeCurrent(Hold(found->second));
+        if (found != lstTable.end()) MakeCurrent(Hold((*found).second));
     });
 }
 

@@ -76,6 +76,19 @@ TEST_F(TheJoinRecord, KeepsEachOfItsFifteenFieldsApart) {
     expectFilled(record);
 }
 
+TEST_F(TheJoinRecord, KeepsItsOtherTextsWhenOneBecomesLongerOrShorter) {
+    fill(record);
+    for (const auto* other : {u"", u"a far longer text than before", u"x"}) {
+        record.LeftColumnText(other);
+        record.RightTableName(other);
+        EXPECT_EQ(record.LeftColumnText(), other);
+        EXPECT_EQ(record.RightTableName(), other);
+    }
+    record.LeftColumnText(u"left text");
+    record.RightTableName(u"right table");
+    expectFilled(record);
+}
+
 TEST_F(TheJoinRecord, TakesOverAllFifteenFieldsOfAnother) {
     clsJoinLine other(boxes);
     fill(other);

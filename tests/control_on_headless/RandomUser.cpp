@@ -284,7 +284,7 @@ std::pair<float, float> RandomUser::placeOnCanvas() {
     if (lines.Count() > 1 && chance(70)) {
         auto at = lines.begin();
         std::advance(at, number(1, static_cast<std::int32_t>(lines.Count()) - 1));
-        const auto& line = *at->second;
+        const auto& line = *(*at).second;
         return {(line.X1() + line.X2()) / 2, (line.Y1() + line.Y2()) / 2};
     }
     return {static_cast<float>(number(0, 12000)), static_cast<float>(number(0, 9000))};

@@ -84,6 +84,7 @@ TEST_F(AControlArray, NamesTheElementThatDoesNotExist) {
     EXPECT_EQ(errorOf([&] { elements(7); }).Description, expected);
     EXPECT_EQ(errorOf([&] { elements.Unload(7); }).Description, expected);
     EXPECT_EQ(errorOf([&] { elements(-1); }).Number, 340);
+    EXPECT_EQ(errorOf([&] { elements.Load(-1); }).Number, 340);
 }
 
 TEST_F(AControlArray, DoesNotMistakeALongIndexForAShortOne) {

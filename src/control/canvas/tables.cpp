@@ -101,7 +101,7 @@ bool Zandor::FindColumn(const Ref<Tabulet>& Table, const String& ColumnName,
         Column = nullptr;
         auto& entries = Table->ColumnItems();
         for (std::int32_t n = 1; n <= entries.Count(); ++n) {
-            if (entries.Item(n)->Text() != ColumnName) continue;
+            if (!entries.Reads(n, ColumnName)) continue;
             Column = entries.Item(n);
             break;
         }

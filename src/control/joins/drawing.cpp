@@ -83,13 +83,10 @@ void Zandor::FindEnds(clsJoinLine& JoinLine) {
         const auto& entries = table->ColumnItems();
         end.Slot = index;
         end.Count = entries.Count();
-        for (std::int32_t n = 1; n <= end.Count; ++n) {
-            const auto& entry = entries.Item(n);
-            const String& name = entry->ColumnItemName();
-            if (left ? !JoinLine.IsLeftColumn(name) : !JoinLine.IsRightColumn(name)) continue;
-            end.Position = n;
-            end.Item = entry;
-        }
+        const platform::StringView name = left ? JoinLine.LeftColumn() : JoinLine.RightColumn();
+        for (std::int32_t n = 1; n <= end.Count; ++n)
+            if (entries.Reads(n, name)) end.Position = n;
+        if (end.Position > 0) end.Item = entries.Item(end.Position);
     }
     JoinLine.LeftEnd = leftEnd;
     JoinLine.RightEnd = rightEnd;
@@ -101,7 +98,7 @@ TalvikTabulet::Tabulet* Zandor::TableAt(const DrawnEnd& end, std::int32_t handle
     Tabulet* const table = end.Item ? lstTable.Peek(end.Slot) : nullptr;
     if (!table || table->TableHandle() != handle) return nullptr;
     const auto& entries = table->ColumnItems();
-    const bool same = entries.Count() == end.Count && entries.Item(end.Position) == end.Item;
+    const bool same = entries.Count() == end.Count && entries.IsAt(end.Position, *end.Item);
     return same ? table : nullptr;
 }
 

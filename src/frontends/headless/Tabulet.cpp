@@ -271,10 +271,21 @@ std::int32_t Tabulet::Count() const {
     return static_cast<std::int32_t>(mItems.size());
 }
 
-const Ref<TalvikTabulet::ColumnItem>& Tabulet::Item(std::int32_t position) const {
+Ref<TalvikTabulet::ColumnItem> Tabulet::Item(std::int32_t position) const {
     called("ColumnItems.Item");
     entry(position);
     return mItems[static_cast<std::size_t>(position) - 1];
+}
+
+// Both pass where the longer way passes, so that they can be made to fail there.
+bool Tabulet::Reads(std::int32_t position, StringView text) const {
+    called("ColumnItems.Item");
+    return entry(position).Text() == text;
+}
+
+bool Tabulet::IsAt(std::int32_t position, const TalvikTabulet::ColumnItem& item) const {
+    called("ColumnItems.Item");
+    return &entry(position) == &item;
 }
 
 Ref<TalvikTabulet::ColumnItem> Tabulet::Add(const String& key, const String& text) {

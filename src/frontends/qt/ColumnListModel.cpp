@@ -14,7 +14,7 @@ int ColumnListModel::rowCount(const QModelIndex& parent) const {
 
 QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid() || index.row() >= rowCount()) return {};
-    if (role == Qt::DisplayRole) return asSigns(at(index.row()).text);
+    if (role == Qt::DisplayRole) return asSigns(text(index.row()));
     if (role == pictureRole && picture(index.row())) return static_cast<int>(*picture(index.row()));
     if (role == outputRole) return at(index.row()).comesOut;
     if (role == Qt::AccessibleDescriptionRole) return description(at(index.row()));
@@ -28,11 +28,19 @@ QVariant ColumnListModel::description(const Row& row) const {
     return parts.isEmpty() ? QVariant() : parts.join(QStringLiteral(", "));
 }
 
-void ColumnListModel::append(const QString& text) {
+QString ColumnListModel::text(int row) const { return toQt(mTexts->text(row)); }
+
+void ColumnListModel::append(StringView text, StringView key) {
     const int row = rowCount();
+    mTexts->add(key, text);
     beginInsertRows({}, row, row);
-    mRows.push_back({text, {}});
+    mRows.emplace_back();
     endInsertRows();
+}
+
+void ColumnListModel::squeeze() {
+    mTexts->squeeze();
+    mRows.shrink_to_fit();
 }
 
 void ColumnListModel::setPicture(int row, std::optional<Picture> picture) {
@@ -53,6 +61,7 @@ void ColumnListModel::setWords(const Words& words) {
 void ColumnListModel::clear() {
     beginResetModel();
     mRows.clear();
+    mTexts->clear();
     endResetModel();
 }
 

@@ -1,10 +1,13 @@
 #pragma once
 
+#include "frontends/qt/EntryTexts.h"
+
 #include <Zandor/platform/ImageList.h>
 #include <Zandor/platform/Words.h>
 
 #include <QAbstractListModel>
 
+#include <memory>
 #include <vector>
 
 namespace zandor::platform::qt {
@@ -22,9 +25,13 @@ public:
     int rowCount(const QModelIndex& parent = {}) const override;
     QVariant data(const QModelIndex& index, int role) const override;
 
-    const QString& text(int row) const { return mRows[static_cast<std::size_t>(row)].text; }
+    QString text(int row) const;
     std::optional<Picture> picture(int row) const { return at(row).picture; }
-    void append(const QString& text);
+    void append(StringView text, StringView key = {});
+    /// Gives back what there was room for beyond the last entry.
+    void squeeze();
+    /// Of the rows; whoever shares them may outlive the model.
+    const std::shared_ptr<EntryTexts>& texts() const { return mTexts; }
     void setPicture(int row, std::optional<Picture> picture);
     void setComesOut(int row, bool comesOut);
     void clear();
@@ -32,7 +39,6 @@ public:
 
 private:
     struct Row {
-        QString text;
         std::optional<Picture> picture;
         bool comesOut = false;
     };
@@ -41,6 +47,7 @@ private:
     Row& at(int row) { return mRows[static_cast<std::size_t>(row)]; }
     const Row& at(int row) const { return mRows[static_cast<std::size_t>(row)]; }
 
+    std::shared_ptr<EntryTexts> mTexts = std::make_shared<EntryTexts>();
     std::vector<Row> mRows;
     QString mKeyColumn;
     QString mComesOut;

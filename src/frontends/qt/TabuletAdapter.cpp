@@ -23,19 +23,23 @@ std::int32_t nextHandle() {
 
 } // namespace
 
-/// An entry outlives its list where somebody still holds it; it then keeps what it last said.
+/// An entry is made when somebody asks for it, and is there as long as somebody holds it. It may
+/// outlive its list; it then keeps what it last said.
 class TabuletAdapter::Entry final : public TableEntry, public std::enable_shared_from_this<Entry> {
 public:
-    Entry(TabuletAdapter& table, int row, const String& key, const String& text)
-        : mTable(&table), mRow(row), mKey(key), mText(text) {}
+    Entry(TabuletAdapter& table, int row) : mTable(&table), mRow(row) {}
+    ~Entry() override {
+        if (mTable) mTable->mEntries.forget(mRow);
+    }
 
     void detach() {
+        said();
         mSelected = Selected();
         mTable = nullptr;
     }
 
-    const String& Text() const override { return mText; }
-    const String& Key() const override { return mKey; }
+    const String& Text() const override { return said().text; }
+    const String& Key() const override { return said().key; }
 
     bool Selected() const override {
         if (!live()) return mSelected;
@@ -80,6 +84,7 @@ public:
     }
 
     const TalvikTabulet::Tabulet* table() const override { return mTable; }
+    Ref<TalvikTabulet::ColumnItem> held() { return shared_from_this(); }
 
 private:
     bool live() const { return mTable && mTable->mWidget; }
@@ -95,26 +100,60 @@ private:
         return {box.Left + side * box.Width, box.Top + middle * twipsPerPixel};
     }
 
+    struct Said {
+        String key, text;
+    };
+    const Said& said() const {
+        if (mSaid) return *mSaid;
+        const EntryTexts& texts = mTable->mEntries.texts();
+        mSaid.reset(new Said{String(texts.key(mRow)), String(texts.text(mRow))});
+        return *mSaid;
+    }
+
     TabuletAdapter* mTable;
     const int mRow;
-    const String mKey;
-    const String mText;
+    mutable std::unique_ptr<const Said> mSaid;
     bool mSelected = false;
 };
 
-std::int32_t TabuletAdapter::Entries::Count() const {
-    return static_cast<std::int32_t>(items.size());
+int TabuletAdapter::Entries::rowOf(std::int32_t position) const {
+    if (position < 1 || position > Count()) throw errors::subscriptOutOfRange();
+    return position - 1;
 }
 
-const Ref<TalvikTabulet::ColumnItem>& TabuletAdapter::Entries::Item(std::int32_t position) const {
-    if (position < 1 || position > Count()) throw errors::subscriptOutOfRange();
-    return items[static_cast<std::size_t>(position) - 1];
+Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Item(std::int32_t position) const {
+    const int row = rowOf(position);
+    if (const auto held = mHeld.find(row); held != mHeld.end()) return held->second->held();
+    const auto entry = std::make_shared<Entry>(mTable, row);
+    mHeld.emplace(row, entry.get());
+    return entry;
+}
+
+bool TabuletAdapter::Entries::Reads(std::int32_t position, StringView text) const {
+    return mTexts->text(rowOf(position)) == text;
+}
+
+bool TabuletAdapter::Entries::IsAt(std::int32_t position,
+                                   const TalvikTabulet::ColumnItem& entry) const {
+    const auto held = mHeld.find(rowOf(position));
+    return held != mHeld.end() && held->second == &entry;
 }
 
 Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Add(const String& key, const String& text) {
-    auto entry = std::make_shared<Entry>(mTable, Count(), key, text);
-    if (mTable.mWidget) mTable.mWidget->model().append(toQt(text));
-    return items.emplace_back(std::move(entry));
+    if (mTable.mWidget)
+        mTable.mWidget->model().append(text, key);
+    else
+        mTexts->add(key, text);
+    return Item(Count());
+}
+
+void TabuletAdapter::Entries::dropAll() {
+    for (const auto& [row, entry] : mHeld) entry->detach();
+    mHeld.clear();
+    if (mTable.mWidget)
+        mTable.mWidget->model().clear();
+    else
+        mTexts->clear();
 }
 
 std::vector<Ref<TalvikTabulet::ColumnItem>> TabuletAdapter::Entries::Selected() const {
@@ -130,7 +169,8 @@ TabuletAdapter::TabuletAdapter(TabuletWidget* widget, FocusTracker& focus,
                                TabuletSurroundings& surroundings, std::int16_t index,
                                const TalvikTabulet::TabuletEvents& events)
     : Adapter(widget, focus), mSurroundings(surroundings), mDrags(surroundings.drags),
-      mIndex(index), mHandle(nextHandle()), mEvents(events) {
+      mIndex(index), mHandle(nextHandle()), mEvents(events),
+      mEntries(*this, widget->model().texts()) {
     widget->setListener(this);
 }
 
@@ -185,7 +225,7 @@ Ref<TalvikTabulet::ColumnItem> TabuletAdapter::ColumnAt(float X, float Y) const 
     if (!view.viewport()->rect().contains(inside)) return {};
     const QModelIndex index = view.indexAt(inside);
     if (!index.isValid()) return {};
-    return mEntries.items[static_cast<std::size_t>(index.row())];
+    return mEntries.Item(index.row() + 1);
 }
 
 void TabuletAdapter::ZOrder() {
@@ -196,22 +236,18 @@ void TabuletAdapter::Drag(std::int16_t action) {
     if (action == 0) mDrags.giveUp(this);
     if (action != 1 || !mWidget) return;
     QStringList names;
-    for (const auto& entry : mEntries.items)
-        if (entry->Selected()) names += toQt(entry->Text());
+    for (const auto& entry : mEntries.Selected()) names += toQt(entry->Text());
     mDrags.request(&mWidget->list(), this, names);
 }
 
 void TabuletAdapter::Complete() {
     if (!mWidget) return;
+    mWidget->model().squeeze();
     // Laid out at once: the ends of join lines depend on how far the list is scrolled.
     mWidget->layOut();
 }
 
-void TabuletAdapter::Terminate() {
-    for (const auto& entry : mEntries.items) static_cast<Entry&>(*entry).detach();
-    mEntries.items.clear();
-    if (mWidget) mWidget->model().clear();
-}
+void TabuletAdapter::Terminate() { mEntries.dropAll(); }
 
 void TabuletAdapter::report(const TalvikTabulet::TabuletEvents::Mouse& handler, int row,
                             std::int16_t button, std::int16_t shift) {

@@ -1,12 +1,14 @@
 #pragma once
 
 #include "frontends/qt/Adapter.h"
+#include "frontends/qt/EntryTexts.h"
 #include "frontends/qt/LineEnds.h"
 #include "frontends/qt/TabuletWidget.h"
 
 #include <Zandor/comforts/Comforts.h>
 #include <Zandor/platform/Tabulet.h>
 
+#include <unordered_map>
 #include <vector>
 
 namespace zandor::platform::qt {
@@ -57,16 +59,25 @@ private:
     class Entry;
     class Entries final : public TalvikTabulet::ColumnList {
     public:
-        explicit Entries(TabuletAdapter& table) : mTable(table) {}
-        std::int32_t Count() const override;
-        const Ref<TalvikTabulet::ColumnItem>& Item(std::int32_t position) const override;
+        Entries(TabuletAdapter& table, std::shared_ptr<EntryTexts> texts)
+            : mTable(table), mTexts(std::move(texts)) {}
+        std::int32_t Count() const override { return mTexts->count(); }
+        Ref<TalvikTabulet::ColumnItem> Item(std::int32_t position) const override;
+        bool Reads(std::int32_t position, StringView text) const override;
+        bool IsAt(std::int32_t position, const TalvikTabulet::ColumnItem& entry) const override;
         Ref<TalvikTabulet::ColumnItem> Add(const String& key, const String& text) override;
         std::vector<Ref<TalvikTabulet::ColumnItem>> Selected() const override;
 
-        std::vector<Ref<TalvikTabulet::ColumnItem>> items;
+        const EntryTexts& texts() const { return *mTexts; }
+        void forget(int row) { mHeld.erase(row); }
+        void dropAll();
 
     private:
+        int rowOf(std::int32_t position) const;
+
         TabuletAdapter& mTable;
+        const std::shared_ptr<EntryTexts> mTexts;
+        mutable std::unordered_map<int, Entry*> mHeld; ///< by row; they say themselves when they go
     };
 
     void entryPressed(int row, std::int16_t button, std::int16_t shift) override;
@@ -96,7 +107,7 @@ private:
     const std::int16_t mIndex;
     const std::int32_t mHandle;
     const TalvikTabulet::TabuletEvents& mEvents;
-    Entries mEntries{*this};
+    Entries mEntries;
     String mText;
     String mTag;
     Ref<ImageList> mImages;

@@ -298,7 +298,7 @@ TEST_F(Painting, IsTheSameWithWhatWasKeptAsAnew) {
         {"a list scrolled", [&] { table(1).list().verticalScrollBar()->setValue(23); }},
         {"a column that comes out", [&] { table(1).model().setComesOut(4, true); }},
         {"a key", [&] { table(1).model().setPicture(5, platform::Picture::key); }},
-        {"one more column", [&] { table(2).model().append("ONE_MORE"); }},
+        {"one more column", [&] { table(2).model().append(u"ONE_MORE"); }},
         {"a table moved",
          [&] {
              drag(table(2), {{3, 2}, {31, 45}});

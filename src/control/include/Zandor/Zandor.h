@@ -18,6 +18,7 @@
 #include <Zandor/platform/Words.h>
 #include <Zandor/platform/export.h>
 
+#include <map>
 #include <optional>
 
 namespace zandor::comforts {

@@ -3,9 +3,9 @@
 #include <Zandor/control/Life.h>
 #include <Zandor/platform/Ref.h>
 
-#include <algorithm>
 #include <functional>
-#include <map>
+#include <iterator>
+#include <utility>
 #include <vector>
 
 namespace TalvikDBxZandor {
@@ -23,21 +23,22 @@ public:
         add(0, mFactory(0, nullptr));
     }
 
-    /// Error 360 when the element is loaded already.
+    /// Error 360 when the element is loaded already, 340 for an index below 0.
     void Load(std::int16_t index) {
         mLife.check();
-        if (mElements.count(index)) throw platform::errors::alreadyLoaded();
-        add(index, mFactory(index, mElements.at(0).get()));
+        if (index < 0) throw platform::errors::noSuchElement(index);
+        if (find(index)) throw platform::errors::alreadyLoaded();
+        add(index, mFactory(index, mElements.front().get()));
     }
 
     /// Error 340 when there is no such element, 362 for the one of design time.
     void Unload(std::int16_t index) {
         mLife.check();
         if (index == 0) throw platform::errors::cannotUnloadDesignElement();
+        if (!find(index)) throw platform::errors::noSuchElement(index);
         // Out of the array first: the end of an element may be told to the host.
-        const auto gone = mElements.extract(index);
-        if (gone.empty()) throw platform::errors::noSuchElement(index);
-        if (index > 0) mPlaces[static_cast<std::size_t>(index)] = nullptr;
+        const auto gone = std::exchange(mElements[static_cast<std::size_t>(index)], nullptr);
+        --mCount;
     }
 
     /// Error 340 when there is no such element.
@@ -59,36 +60,64 @@ public:
         return at ? at->get() : nullptr;
     }
 
-    std::size_t Count() const { return mElements.size(); }
-    auto begin() const {
+    std::size_t Count() const { return mCount; }
+
+    /// Stands at an element, and tells its index with it.
+    class Iterator {
+    public:
+        using iterator_category = std::input_iterator_tag;
+        using value_type = std::pair<std::int16_t, platform::Ref<T>>;
+        using reference = std::pair<std::int16_t, const platform::Ref<T>&>;
+        using difference_type = std::ptrdiff_t;
+        using pointer = void;
+
+        Iterator(const std::vector<platform::Ref<T>>& elements, std::size_t place)
+            : mElements(&elements), mPlace(place) {
+            passGaps();
+        }
+        reference operator*() const {
+            return {static_cast<std::int16_t>(mPlace), (*mElements)[mPlace]};
+        }
+        Iterator& operator++() {
+            ++mPlace;
+            passGaps();
+            return *this;
+        }
+        friend bool operator==(const Iterator&, const Iterator&) = default;
+
+    private:
+        void passGaps() {
+            while (mPlace < mElements->size() && !(*mElements)[mPlace].get()) ++mPlace;
+        }
+
+        const std::vector<platform::Ref<T>>* mElements;
+        std::size_t mPlace;
+    };
+    Iterator begin() const {
         mLife.check();
-        return mElements.begin();
+        return {mElements, 0};
     }
-    auto end() const { return mElements.end(); }
+    Iterator end() const { return {mElements, mElements.size()}; }
 
 private:
     void add(std::int16_t index, platform::Ref<T> element) {
-        const auto place = static_cast<std::size_t>(std::max<std::int16_t>(index, 0));
-        if (place >= mPlaces.size()) mPlaces.resize(place + 1);
-        const auto at = mElements.emplace(index, std::move(element)).first;
-        if (index >= 0) mPlaces[place] = &at->second;
+        const auto place = static_cast<std::size_t>(index);
+        if (place >= mElements.size()) mElements.resize(place + 1);
+        mElements[place] = std::move(element);
+        ++mCount;
     }
 
     const platform::Ref<T>* find(std::int32_t index) const {
         mLife.check();
-        if (index >= 0)
-            return static_cast<std::size_t>(index) < mPlaces.size()
-                       ? mPlaces[static_cast<std::size_t>(index)]
-                       : nullptr;
-        if (index != static_cast<std::int16_t>(index)) return nullptr;
-        const auto at = mElements.find(static_cast<std::int16_t>(index));
-        return at == mElements.end() ? nullptr : &at->second;
+        const auto place = static_cast<std::size_t>(index);
+        return index >= 0 && place < mElements.size() && mElements[place].get() ? &mElements[place]
+                                                                                : nullptr;
     }
 
     const Life& mLife;
     Factory mFactory;
-    std::map<std::int16_t, platform::Ref<T>> mElements;
-    std::vector<const platform::Ref<T>*> mPlaces; ///< of the elements, by index from 0 on
+    std::vector<platform::Ref<T>> mElements; ///< by index; gaps hold nothing
+    std::size_t mCount = 0;
 };
 
 } // namespace TalvikDBxZandor

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <Zandor/control/DrawnEnd.h>
+#include <Zandor/control/PackedTexts.h>
 #include <Zandor/control/basZandor.h>
 #include <Zandor/platform/Variant.h>
 #include <Zandor/platform/export.h>
@@ -24,22 +25,22 @@ public:
     void LeftTablehwnd(std::int32_t v) { Let(u"P_LET LeftTablehwnd", &Fields::LeftTablehwnd, v); LeftEnd = {}; }
     std::int32_t RightTablehwnd() const { return Get(u"P_GET RightTablehwnd", &Fields::RightTablehwnd); }
     void RightTablehwnd(std::int32_t v) { Let(u"P_LET RightTablehwnd", &Fields::RightTablehwnd, v); RightEnd = {}; }
-    String LeftColumnText() const { return Get(u"P_GET LeftColumnText", &Fields::LeftColumnText); }
-    void LeftColumnText(const String& v) { Let(u"P_LET LeftColumnText", &Fields::LeftColumnText, v); }
-    String RightColumnText() const { return Get(u"P_GET RightColumnText", &Fields::RightColumnText); }
-    void RightColumnText(const String& v) { Let(u"P_LET RightColumnText", &Fields::RightColumnText, v); }
+    String LeftColumnText() const { return Get(u"P_GET LeftColumnText", leftColumnText); }
+    void LeftColumnText(const String& v) { Let(u"P_LET LeftColumnText", leftColumnText, v); }
+    String RightColumnText() const { return Get(u"P_GET RightColumnText", rightColumnText); }
+    void RightColumnText(const String& v) { Let(u"P_LET RightColumnText", rightColumnText, v); }
     std::int32_t CompareOperator() const { return Get(u"P_GET CompareOperator", &Fields::CompareOperator); }
     void CompareOperator(std::int32_t v) { Let(u"P_LET CompareOperator", &Fields::CompareOperator, v); }
     std::int32_t JoinType() const { return Get(u"P_GET JoinType", &Fields::JoinType); }
     void JoinType(std::int32_t v) { Let(u"P_LET JoinType", &Fields::JoinType, v); Drawn = {}; }
-    String LeftTableName() const { return Get(u"P_GET LeftTableName", &Fields::LeftTableName); }
-    void LeftTableName(const String& v) { Let(u"P_LET LeftTableName", &Fields::LeftTableName, v); }
-    String LeftColumnName() const { return Get(u"P_GET LeftColumnName", &Fields::LeftColumnName); }
-    void LeftColumnName(const String& v) { Let(u"P_LET LeftColumnName", &Fields::LeftColumnName, v); LeftEnd = {}; }
-    String RightTableName() const { return Get(u"P_GET RightTableName", &Fields::RightTableName); }
-    void RightTableName(const String& v) { Let(u"P_LET RightTableName", &Fields::RightTableName, v); }
-    String RightColumnName() const { return Get(u"P_GET RightColumnName", &Fields::RightColumnName); }
-    void RightColumnName(const String& v) { Let(u"P_LET RightColumnName", &Fields::RightColumnName, v); RightEnd = {}; }
+    String LeftTableName() const { return Get(u"P_GET LeftTableName", leftTableName); }
+    void LeftTableName(const String& v) { Let(u"P_LET LeftTableName", leftTableName, v); }
+    String LeftColumnName() const { return Get(u"P_GET LeftColumnName", leftColumnName); }
+    void LeftColumnName(const String& v) { Let(u"P_LET LeftColumnName", leftColumnName, v); LeftEnd = {}; }
+    String RightTableName() const { return Get(u"P_GET RightTableName", rightTableName); }
+    void RightTableName(const String& v) { Let(u"P_LET RightTableName", rightTableName, v); }
+    String RightColumnName() const { return Get(u"P_GET RightColumnName", rightColumnName); }
+    void RightColumnName(const String& v) { Let(u"P_LET RightColumnName", rightColumnName, v); RightEnd = {}; }
     std::int32_t JoinLineIndex() const { return Get(u"P_GET JoinLineIndex", &Fields::JoinLineIndex); }
     void JoinLineIndex(std::int32_t v) { Let(u"P_LET JoinLineIndex", &Fields::JoinLineIndex, v); Drawn = {}; }
     std::int32_t LeftConnectorIndex() const { return Get(u"P_GET LeftConnectorIndex", &Fields::LeftConnectorIndex); }
@@ -60,10 +61,11 @@ public:
         Drawn = {};
     }
 
-    /// Whether a side names a column of this name, without copying the name: drawing asks this
-    /// once for every entry of a table.
-    bool IsLeftColumn(platform::StringView name) const { return mFields.LeftColumnName == name; }
-    bool IsRightColumn(platform::StringView name) const { return mFields.RightColumnName == name; }
+    /// The names of the columns without a copy, for as long as they stay what they are.
+    platform::StringView LeftColumn() const { return mFields.Texts[leftColumnName]; }
+    platform::StringView RightColumn() const { return mFields.Texts[rightColumnName]; }
+    bool IsLeftColumn(platform::StringView name) const { return LeftColumn() == name; }
+    bool IsRightColumn(platform::StringView name) const { return RightColumn() == name; }
     /// Whether a side is in the table list of a handle; asked of all joins at each step of a move.
     bool IsOf(std::int32_t handle) const {
         return mFields.LeftTablehwnd == handle || mFields.RightTablehwnd == handle;
@@ -77,15 +79,19 @@ public:
     std::optional<bool> Drawn;
 
 private:
+    enum TextField : std::uint8_t {
+        leftColumnName,
+        leftColumnText,
+        rightColumnText,
+        rightColumnName,
+        leftTableName,
+        rightTableName,
+        textCount
+    };
     struct Fields {
         std::int32_t JoinType = 0;
         std::int32_t CompareOperator = 0;
-        String LeftColumnName;
-        String LeftColumnText;
-        String RightColumnText;
-        String RightColumnName;
-        String LeftTableName;
-        String RightTableName;
+        PackedTexts<textCount> Texts;
         std::int32_t LeftTablehwnd = 0;
         std::int32_t RightTablehwnd = 0;
         std::int32_t JoinLineIndex = -1;
@@ -105,6 +111,16 @@ private:
     template <class T>
     void Let(platform::StringView procedure, T Fields::*field, const T& value) {
         basZandor::Guard(*mBoxes, ModuleName, procedure, [&] { mFields.*field = value; });
+    }
+
+    String Get(platform::StringView procedure, TextField field) const {
+        String result;
+        basZandor::Guard(*mBoxes, ModuleName, procedure, [&] { result = mFields.Texts[field]; });
+        return result;
+    }
+
+    void Let(platform::StringView procedure, TextField field, const String& value) {
+        basZandor::Guard(*mBoxes, ModuleName, procedure, [&] { mFields.Texts.set(field, value); });
     }
 
     platform::MessageBoxes* mBoxes;

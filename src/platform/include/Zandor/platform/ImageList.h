@@ -8,7 +8,7 @@
 namespace zandor::platform {
 
 /// What an image shows; each toolkit draws it in its own way.
-enum class Picture { key };
+enum class Picture : std::uint8_t { key };
 
 /// Images for other controls, which know them by their numbers from 1 on.
 class ZANDOR_CONTROL_EXPORT ImageList {

@@ -55,8 +55,18 @@ class ZANDOR_CONTROL_EXPORT ColumnList {
 public:
     virtual ~ColumnList() = default;
     virtual std::int32_t Count() const = 0; ///< how many there are
-    /// Position is 1-based; error 9 outside 1 to Count.
-    virtual const Ref<ColumnItem>& Item(std::int32_t position) const = 0;
+    /// Position is 1-based; error 9 outside 1 to Count. A toolkit may make an entry when it is asked
+    /// for: as long as somebody holds it, it is the same one.
+    virtual Ref<ColumnItem> Item(std::int32_t position) const = 0;
+    /// Whether the entry of a position shows a text. For this and the next the entry need not be
+    /// made; errors as of Item.
+    virtual bool Reads(std::int32_t position, platform::StringView text) const {
+        return Item(position)->Text() == text;
+    }
+    /// Whether an entry that somebody holds is the one of a position.
+    virtual bool IsAt(std::int32_t position, const ColumnItem& entry) const {
+        return Item(position).get() == &entry;
+    }
     virtual Ref<ColumnItem> Add(const String& key, const String& text) = 0; ///< behind the others
     /// The selected entries, in their order; asked one by one where the toolkit knows no better.
     virtual std::vector<Ref<ColumnItem>> Selected() const {

@@ -118,7 +118,9 @@ private:
     friend class ColumnItem;
 
     std::int32_t Count() const override;
-    const Ref<TalvikTabulet::ColumnItem>& Item(std::int32_t position) const override;
+    Ref<TalvikTabulet::ColumnItem> Item(std::int32_t position) const override;
+    bool Reads(std::int32_t position, StringView text) const override;
+    bool IsAt(std::int32_t position, const TalvikTabulet::ColumnItem& item) const override;
     Ref<TalvikTabulet::ColumnItem> Add(const String& key, const String& text) override;
     void gotFocus() override;
     void dropEntries();
