@@ -19,7 +19,8 @@ protected:
         show();
         bind();
         table(2).model().setComesOut(2, true);
-        for (const char* more : {"STREET", "HOUSE", "COUNTRY"}) table(2).model().append(more);
+        for (const char16_t* more : {u"STREET", u"HOUSE", u"COUNTRY"})
+            table(2).model().append(more);
         table(2).resize(160, 100); // with a bar
         settle();
     }
@@ -128,7 +129,8 @@ protected:
     AListAtRest() {
         settle();
         EXPECT_EQ(table(2).madeList(), nullptr);
-        for (const char* more : {"STREET", "HOUSE", "COUNTRY"}) table(2).model().append(more);
+        for (const char16_t* more : {u"STREET", u"HOUSE", u"COUNTRY"})
+            table(2).model().append(more);
         table(2).resize(160, 100); // with a bar
     }
 
