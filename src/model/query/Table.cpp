@@ -19,8 +19,10 @@ void Table::Height(float value) { mHeight = platform::toLong(value); }
 bool Table::Activate(const std::vector<String>& keys) {
     if (savedQuery()) return false;
     const auto& columns = (*mContents)->columns;
-    for (std::int32_t position = 1; position <= columns.Count(); ++position)
-        columns.Peek(position)->activated(0);
+    // Of a table of thousands each press comes by all of them.
+    const std::int32_t count = columns.Count();
+    for (std::int32_t position = 1; position <= count; ++position)
+        static_cast<Column&>(*columns.Peek(position)).activated(0);
     for (const String& key : keys) columns.Item(key)->activated(1);
     return true;
 }
