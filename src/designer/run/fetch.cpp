@@ -7,6 +7,7 @@
 
 #include <Zandor/reader/dialectOf.h>
 
+#include <QCoreApplication>
 #include <QSqlError>
 #include <QSqlQuery>
 
@@ -16,7 +17,13 @@ namespace {
 
 QString words(const QSqlError& error) {
     const QString said = error.databaseText().trimmed();
-    if (said.isEmpty()) return error.driverText().trimmed();
+    if (said.isEmpty()) {
+        // A server that dies before its first row leaves its driver without a word.
+        const QString driver = error.driverText().trimmed();
+        return driver.isEmpty() ? QCoreApplication::translate("zandor::designer::ResultsPanel",
+                                                              "The server does not answer.")
+                                : driver;
+    }
     // A server that another one reads from is gone: what follows is for those who run it.
     const bool connection = error.nativeErrorCode().startsWith(QLatin1String("08"));
     return connection ? said.section(u'\n', 0, 0) : said;
