@@ -66,6 +66,20 @@ TEST_F(AControlArray, IsWalkedByAscendingIndexWhateverTheOrderOfLoading) {
     EXPECT_EQ(indexes(), (std::vector<std::int16_t>{0, 2, 5, 9}));
 }
 
+TEST_F(AControlArray, IsWalkedOnWhileElementsComeAndGo) {
+    elements.Load(2);
+    elements.Load(3);
+    std::vector<std::int16_t> seen;
+    for (const auto& [index, element] : elements) {
+        seen.push_back(index);
+        if (index != 2) continue;
+        elements.Unload(3);
+        elements.Load(40);
+        EXPECT_EQ(element->index, 2);
+    }
+    EXPECT_EQ(seen, (std::vector<std::int16_t>{0, 2, 40}));
+}
+
 TEST_F(AControlArray, RefusesToLoadAnElementTwice) {
     elements.Load(3);
     const Element* const held = elements(3).get();

@@ -3,10 +3,11 @@
 #include <Zandor/control/Life.h>
 #include <Zandor/platform/Ref.h>
 
+#include <deque>
 #include <functional>
 #include <iterator>
+#include <limits>
 #include <utility>
-#include <vector>
 
 namespace TalvikDBxZandor {
 
@@ -15,6 +16,10 @@ namespace TalvikDBxZandor {
 /// is made over a copy. Each use ends the procedure at hand in quiet once the control has ended.
 template <class T>
 class ControlArray {
+    // Its elements stay where they are when another one comes.
+    using Elements = std::deque<platform::Ref<T>>;
+    static constexpr std::size_t behindAll = std::numeric_limits<std::size_t>::max();
+
 public:
     /// Makes the element of an index; pattern is element 0, nullptr when that is the one to make.
     using Factory = std::function<platform::Ref<T>(std::int16_t index, const T* pattern)>;
@@ -62,7 +67,8 @@ public:
 
     std::size_t Count() const { return mCount; }
 
-    /// Stands at an element, and tells its index with it.
+    /// Stands at an element, and tells its index with it. What is loaded and unloaded meanwhile
+    /// leaves it where it stands.
     class Iterator {
     public:
         using iterator_category = std::input_iterator_tag;
@@ -71,7 +77,7 @@ public:
         using difference_type = std::ptrdiff_t;
         using pointer = void;
 
-        Iterator(const std::vector<platform::Ref<T>>& elements, std::size_t place)
+        Iterator(const Elements& elements, std::size_t place)
             : mElements(&elements), mPlace(place) {
             passGaps();
         }
@@ -88,16 +94,17 @@ public:
     private:
         void passGaps() {
             while (mPlace < mElements->size() && !(*mElements)[mPlace].get()) ++mPlace;
+            if (mPlace >= mElements->size()) mPlace = behindAll;
         }
 
-        const std::vector<platform::Ref<T>>* mElements;
+        const Elements* mElements;
         std::size_t mPlace;
     };
     Iterator begin() const {
         mLife.check();
         return {mElements, 0};
     }
-    Iterator end() const { return {mElements, mElements.size()}; }
+    Iterator end() const { return {mElements, behindAll}; }
 
 private:
     void add(std::int16_t index, platform::Ref<T> element) {
@@ -116,7 +123,7 @@ private:
 
     const Life& mLife;
     Factory mFactory;
-    std::vector<platform::Ref<T>> mElements; ///< by index; gaps hold nothing
+    Elements mElements; ///< by index; gaps hold nothing
     std::size_t mCount = 0;
 };
 
