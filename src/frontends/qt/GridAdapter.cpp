@@ -104,8 +104,10 @@ void GridAdapter::TextMatrix(std::int32_t row, std::int32_t col, const String& v
 
 void GridAdapter::CellNote(std::int32_t row, std::int32_t col, const String& value) {
     mustBeCell(row, col);
+    const QString& before = grid().model().note(row, col);
+    if (value.empty() && before.isEmpty()) return;
     const QString note = toQt(value);
-    if (grid().model().note(row, col) == note) return;
+    if (before == note) return;
     grid().model().setNote(row, col, note);
     grid().touch();
 }
@@ -122,7 +124,10 @@ float GridAdapter::RowPos(std::int32_t row) const {
 
 float GridAdapter::ColWidth(std::int32_t col) const {
     mustBeCol(col);
-    if (col == 0) grid().bringUpToDate();
+    if (col == 0) {
+        grid().view();
+        grid().bringUpToDate();
+    }
     return grid().model().width(col);
 }
 

@@ -105,8 +105,11 @@ QSize GridHeader::sizeFor(const QString& text) const {
 
 void GridHeader::changeEvent(QEvent* event) {
     QHeaderView::changeEvent(event);
-    if (event->type() != QEvent::StyleChange || !testAttribute(Qt::WA_StyleSheet)) return;
-    if (styleSheet().isEmpty())
+    if (event->type() == QEvent::StyleChange) dropFrame();
+}
+
+void GridHeader::dropFrame() {
+    if (testAttribute(Qt::WA_StyleSheet) && styleSheet().isEmpty())
         setStyleSheet(QStringLiteral("QHeaderView { border: 0; padding: 0; margin: 0 }"));
 }
 

@@ -41,6 +41,8 @@ public:
     QSize sizeFor(const QString& text) const;
     /// Of a header of a fixed size, which the view asks for at every change, no text is measured.
     QSize sizeHint() const override;
+    /// What a host's style sheet puts around headers would move them off their cells.
+    void dropFrame();
 
 protected:
     void changeEvent(QEvent* event) override;

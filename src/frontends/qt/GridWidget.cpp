@@ -5,6 +5,7 @@
 #include "frontends/qt/GridCorner.h"
 #include "frontends/qt/GridModel.h"
 #include "frontends/qt/KeyCodes.h"
+#include "frontends/qt/OwnLooks.h"
 #include "frontends/qt/PaneHandle.h"
 #include "frontends/qt/ShownText.h"
 
@@ -44,10 +45,20 @@ void prepareHeader(QHeaderView& header) {
 } // namespace
 
 GridWidget::GridWidget(int rows, int cols, QWidget* parent)
-    : QWidget(parent), mModel(new GridModel(rows, cols, this)), mView(new TableView(this)),
-      mTitles(new FieldTitles(*this, mView)), mGestures(*mTitles),
-      mCorner(new GridCorner(*mModel, mView)), mHandle(new PaneHandle(this)) {
+    : QWidget(parent), mModel(new GridModel(rows, cols, this)), mHandle(new PaneHandle(this)) {
     setAcceptDrops(true);
+    for (int col = 0; col < cols; ++col) mModel->setWidth(col, designWidth);
+    makeViewIfNeeded();
+    fitColumnsToFont();
+    if (mView) measure();
+}
+
+void GridWidget::makeView() {
+    mView = new TableView(this);
+    mTitles = new FieldTitles(*this, mView);
+    mGestures.emplace(*mTitles);
+    mGestures->setListener(mListener);
+    mCorner = new GridCorner(*mModel, mView);
     setFocusProxy(mView);
     mView->setFocusPolicy(Qt::ClickFocus);
     mView->setHorizontalHeader(mTitles);
@@ -71,8 +82,7 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
     prepareHeader(*mView->horizontalHeader());
     prepareHeader(*mView->verticalHeader());
     mView->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    for (int col = 0; col < cols; ++col) mModel->setWidth(col, designWidth);
-    fitColumnsToFont();
+    mView->setAccessibleName(mName);
 
     mView->installEventFilter(this);
     for (QWidget* part : {mView->viewport(), mView->horizontalHeader()->viewport(),
@@ -99,24 +109,56 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
                 mRow = current.row() + 1;
                 mCol = current.column() + 1;
             });
-    measure();
+    // In a host that is dressed already they are told of no change.
+    for (GridHeader* header : {&fields(), &titles()}) {
+        header->ensurePolished();
+        header->dropFrame();
+    }
+    mHandle->raise();
+    arrange();
+    mView->show();
+}
+
+void GridWidget::makeViewIfNeeded() {
+    if (!mView && haveOwnLooks(*this, {"QTableView", "QHeaderView", "QAbstractItemView",
+                                       "QAbstractScrollArea", "QFrame"}))
+        makeView();
+}
+
+QTableView& GridWidget::view() const {
+    // It shows what the grid has to show anyway.
+    if (!mView) {
+        auto& self = *const_cast<GridWidget*>(this);
+        self.makeView();
+        self.measure();
+        // A view without a current cell takes the first for it as soon as it has the focus.
+        bringUpToDate();
+    }
+    return *mView;
+}
+
+void GridWidget::setVisible(bool visible) {
+    if (visible) view();
+    if (visible) bringUpToDate();
+    QWidget::setVisible(visible);
 }
 
 GridHeader& GridWidget::fields() const {
-    return static_cast<GridHeader&>(*mView->horizontalHeader());
+    return static_cast<GridHeader&>(*view().horizontalHeader());
 }
 
 GridHeader& GridWidget::titles() const {
-    return static_cast<GridHeader&>(*mView->verticalHeader());
+    return static_cast<GridHeader&>(*view().verticalHeader());
 }
 
 void GridWidget::setListener(GridListener* listener) {
     mListener = listener;
-    mGestures.setListener(listener);
+    if (mGestures) mGestures->setListener(listener);
 }
 
 void GridWidget::setWords(const Words& words) {
-    mView->setAccessibleName(toQt(words.Grid));
+    mName = toQt(words.Grid);
+    if (mView) mView->setAccessibleName(mName);
     mOffer = toQt(words.AddField);
     mModel->setWords(words);
     mHandle->setWords(words);
@@ -141,7 +183,7 @@ void GridWidget::measure() {
 
 qreal GridWidget::textWidth(const QString& text) const {
     const qreal plain = QFontMetricsF(font()).horizontalAdvance(text);
-    const bool styled = fields().testAttribute(Qt::WA_StyleSheet);
+    const bool styled = mView && fields().testAttribute(Qt::WA_StyleSheet);
     return styled ? std::max<qreal>(plain, fields().sizeFor(text).width()) : plain;
 }
 
@@ -149,9 +191,11 @@ void GridWidget::fitColumnsToFont() {
     // The longest word that the control itself writes, roughly.
     const QString word = QStringLiteral("Descending");
     const Sample before = std::exchange(mSample, {});
-    mSample.text = std::max({fontMetrics().horizontalAdvance(word),
-                             mView->fontMetrics().horizontalAdvance(word),
-                             fields().fontMetrics().horizontalAdvance(word)});
+    int widest = fontMetrics().horizontalAdvance(word);
+    if (mView)
+        widest = std::max({widest, mView->fontMetrics().horizontalAdvance(word),
+                           fields().fontMetrics().horizontalAdvance(word)});
+    mSample.text = widest;
     mSample.around = std::max<qreal>(0, textWidth(word) - mSample.text);
     const qreal design = toPixels(designWidth);
     for (int col = 1; col < mModel->cols(); ++col) {
@@ -165,7 +209,7 @@ void GridWidget::fitColumnsToFont() {
 }
 
 void GridWidget::touch() {
-    if (std::exchange(mStale, true)) return;
+    if (!mView || std::exchange(mStale, true)) return;
     QMetaObject::invokeMethod(
         this, [this] { bringUpToDate(); }, Qt::QueuedConnection);
 }
@@ -224,18 +268,21 @@ void GridWidget::fitLabels() {
 }
 
 int GridWidget::firstRow() const {
+    QTableView& shown = view();
     bringUpToDate();
-    return mView->verticalHeader()->visualIndexAt(0) + 1;
+    return shown.verticalHeader()->visualIndexAt(0) + 1;
 }
 
 int GridWidget::firstCol() const {
+    QTableView& shown = view();
     bringUpToDate();
-    return mView->horizontalHeader()->visualIndexAt(0) + 1;
+    return shown.horizontalHeader()->visualIndexAt(0) + 1;
 }
 
 int GridWidget::columnWidth(int col) const { return toPixels(mModel->width(col)); }
 
 QRect GridWidget::cellRect(int row, int col) const {
+    view();
     bringUpToDate();
     QRect cell(0, 0, columnWidth(col), mRowHeight);
     if (col > 0)
@@ -252,7 +299,7 @@ void GridWidget::showHandle(bool shown) {
 void GridWidget::arrange() {
     const int above = mHandle->isHidden() ? 0 : PaneHandle::thickness;
     mHandle->setGeometry(0, 0, width(), PaneHandle::thickness);
-    mView->setGeometry(rect().adjusted(0, above, 0, 0));
+    if (mView) mView->setGeometry(rect().adjusted(0, above, 0, 0));
 }
 
 void GridWidget::resizeEvent(QResizeEvent*) { arrange(); }
@@ -260,10 +307,13 @@ void GridWidget::resizeEvent(QResizeEvent*) { arrange(); }
 void GridWidget::changeEvent(QEvent* event) {
     QWidget::changeEvent(event);
     if (event->type() != QEvent::FontChange && event->type() != QEvent::StyleChange) return;
+    makeViewIfNeeded();
+    if (!mView) return fitColumnsToFont();
     // Qt hands a font down a list of children in which a view moves its scroll bars meanwhile, and
-    // so may miss a header.
-    for (GridHeader* header : {&fields(), &titles()})
-        if (!header->testAttribute(Qt::WA_StyleSheet)) header->setFont(QFont());
+    // so may miss a part.
+    for (QWidget* part : {static_cast<QWidget*>(&fields()), static_cast<QWidget*>(&titles()),
+                          static_cast<QWidget*>(mCorner)})
+        if (!part->testAttribute(Qt::WA_StyleSheet)) part->setFont(QFont());
     measure();
     fitColumnsToFont();
 }
@@ -290,7 +340,7 @@ bool GridWidget::eventFilter(QObject* watched, QEvent* event) {
         mListener->asked(static_cast<QInputMethodQueryEvent&>(*event));
         return true;
     case QEvent::MouseMove:
-        if (part == mTitles->viewport()) mGestures.moved(static_cast<QMouseEvent&>(*event));
+        if (part == mTitles->viewport()) mGestures->moved(static_cast<QMouseEvent&>(*event));
         // No selecting along the way of a held button; headers need it for their widths.
         if (part == mView->viewport()) return true;
         break;
@@ -326,7 +376,7 @@ bool GridWidget::mouse(QWidget* part, QMouseEvent* event) {
     }
     const QPointF at = part->mapTo(this, event->position());
     const bool field = part == mTitles->viewport();
-    if (field && pressed) mGestures.pressed(*event);
+    if (field && pressed) mGestures->pressed(*event);
     const QPointer<GridWidget> alive = this;
     if (mListener && pressed)
         mListener->pressed(event->button(), event->modifiers(), at);
@@ -335,7 +385,7 @@ bool GridWidget::mouse(QWidget* part, QMouseEvent* event) {
     if (!alive || !field || pressed) return body;
     if (const int resized = std::exchange(mResized, 0); resized > 0 && mListener)
         mListener->borderDragged(resized);
-    if (alive) mGestures.released(*event);
+    if (alive) mGestures->released(*event);
     return false;
 }
 
@@ -349,7 +399,7 @@ int GridWidget::offeredColumn() const {
 
 void GridWidget::offerAnew() {
     const int offered = offeredColumn();
-    if (std::exchange(mOffered, offered) != offered) mTitles->viewport()->update();
+    if (std::exchange(mOffered, offered) != offered && mTitles) mTitles->viewport()->update();
 }
 
 void GridWidget::walkTo(int row, int col) {
@@ -380,6 +430,7 @@ bool GridWidget::walkFields(const QKeyEvent& event) {
 }
 
 void GridWidget::showCurrentCell() {
+    view();
     bringUpToDate();
     const QModelIndex shown = mModel->index(std::max(mRow, 1) - 1, std::max(mCol, 1) - 1);
     mView->scrollTo(shown);
@@ -401,7 +452,7 @@ bool GridWidget::keyPressed(QKeyEvent& event) {
         mListener->deleteKey(middleOfCurrentCell());
         return true;
     }
-    if (event.key() == Qt::Key_Escape && mGestures.cancel()) return true;
+    if (event.key() == Qt::Key_Escape && mGestures->cancel()) return true;
     if (walkFields(event)) return true;
     if (modifiersOf(event) == Qt::AltModifier && arrowOf(event).x() != 0)
         return mListener->moveKey(arrowOf(event).x());

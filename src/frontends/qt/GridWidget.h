@@ -7,6 +7,7 @@
 #include <QTableView>
 
 #include <functional>
+#include <optional>
 
 class QInputMethodEvent;
 class QInputMethodQueryEvent;
@@ -57,7 +58,8 @@ public:
     virtual bool dropped(const QMimeData* data, QPointF at) = 0;
 };
 
-/// The grid of output columns: a table view whose headers are the fixed row and column. The view
+/// The grid of output columns: a table view whose headers are the fixed row and column. It is made
+/// when the grid is first shown, or asked for a place, for many hosts have the canvas alone. It
 /// follows the model's data, widths and current cell when the events at hand have been dealt with,
 /// or at once by `bringUpToDate`.
 class GridWidget : public QWidget {
@@ -67,7 +69,7 @@ public:
     void setListener(GridListener* listener);
     void setWords(const Words& words);
     GridModel& model() const { return *mModel; }
-    QTableView& view() const { return *mView; }
+    QTableView& view() const;
     /// Stands above the cells while it is shown.
     PaneHandle& handle() const { return *mHandle; }
     void showHandle(bool shown);
@@ -91,13 +93,14 @@ public:
     int firstRow() const;
     int firstCol() const;
     int columnWidth(int col) const;
-    int rowHeight() const { return mRowHeight; }
+    int rowHeight() const { return view(), mRowHeight; }
     /// The width that a text takes in a column, without the margins of every column.
     qreal textWidth(const QString& text) const;
     /// The rectangle of a cell in the grid's own coordinates, in logical pixels.
     QRect cellRect(int row, int col) const;
     void setLabelWidth(float twips);
 
+    void setVisible(bool visible) override;
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 protected:
@@ -114,6 +117,9 @@ private:
         qreal around = 0; ///< what a style sheet adds
     };
 
+    void makeView();
+    /// As it is not there, a view that looks otherwise than the grid takes it for.
+    void makeViewIfNeeded();
     GridHeader& fields() const;
     GridHeader& titles() const;
     void arrange();
@@ -133,15 +139,16 @@ private:
 
     GridListener* mListener = nullptr;
     GridModel* mModel;
-    QTableView* mView;
-    FieldTitles* mTitles;
-    FieldGestures mGestures;
-    GridCorner* mCorner;
+    QTableView* mView = nullptr;
+    FieldTitles* mTitles = nullptr;
+    std::optional<FieldGestures> mGestures;
+    GridCorner* mCorner = nullptr;
     PaneHandle* mHandle;
     int mRow = 1;
     int mCol = 1;
     int mRowHeight = 0;
     QString mOffer;
+    QString mName; ///< as it is spoken
     Sample mSample;
     int mResized = 0; ///< the column whose border the mouse drags
     int mOffered = 0; ///< as it was painted, as far as is known

@@ -226,7 +226,6 @@ ComboBoxAdapter::ComboBoxAdapter(ChoiceBox* widget, FocusTracker& focus,
     : Adapter(widget, focus) {
     for (const String& item : items) widget->addItem(toQt(item));
     widget->setCurrentIndex(-1);
-    widget->setSizeAdjustPolicy(QComboBox::AdjustToContents);
     new InputKeys(widget, std::move(KeyDown), comforts);
     QObject::connect(widget, &QComboBox::activated, widget, [widget, &comforts] {
         if (!widget->isWalking()) comforts.choiceMade();
@@ -250,7 +249,10 @@ void ComboBoxAdapter::DropDown() {
 String ComboBoxAdapter::Text() const { return mWidget ? fromQt(mWidget->currentText()) : String(); }
 
 void ComboBoxAdapter::Clear() {
-    if (mWidget) mWidget->clear();
+    if (!mWidget) return;
+    // Not before, for with it Qt makes the list that drops down.
+    mWidget->setSizeAdjustPolicy(QComboBox::AdjustToContents);
+    mWidget->clear();
 }
 
 void ComboBoxAdapter::AddItem(const String& text) {

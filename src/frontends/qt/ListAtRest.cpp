@@ -2,12 +2,10 @@
 
 #include "frontends/qt/ColumnDelegate.h"
 #include "frontends/qt/ColumnListModel.h"
+#include "frontends/qt/OwnLooks.h"
 
-#include <QApplication>
 #include <QPainter>
 #include <QStyleOptionSlider>
-
-#include <algorithm>
 
 namespace zandor::platform::qt {
 
@@ -36,18 +34,15 @@ QStyleOptionSlider barOf(const QWidget& box) {
 } // namespace
 
 bool canStandForList(const QWidget& box, const QRect& place) {
+    if (box.isRightToLeft() ||
+        haveOwnLooks(box, {"QListView", "QAbstractItemView", "QAbstractScrollArea", "QFrame"}))
+        return false;
     const QStyle& style = *box.style();
-    if (style.inherits("QStyleSheetStyle") || box.isRightToLeft()) return false;
     if (style.styleHint(QStyle::SH_ScrollBar_Transient, nullptr, &box) ||
         style.pixelMetric(QStyle::PM_ScrollView_ScrollBarOverlap, nullptr, &box) != 0)
         return false;
     const QSize least = barOf(box).rect.size();
-    if (place.width() < least.width() || place.height() < least.height()) return false;
-    const char* const kinds[] = {"QListView", "QAbstractItemView", "QAbstractScrollArea", "QFrame"};
-    return std::all_of(std::begin(kinds), std::end(kinds), [](const char* kind) {
-        return QApplication::font(kind) == QApplication::font() &&
-               QApplication::palette(kind) == QApplication::palette();
-    });
+    return place.width() >= least.width() && place.height() >= least.height();
 }
 
 void paintListAtRest(QPainter& painter, const QWidget& box, const QRect& place,

@@ -185,7 +185,7 @@ std::unique_ptr<MSFlexGridLib::MSFlexGrid> QtToolkit::makeGrid(const Design& des
                                                                MSFlexGridLib::GridEvents events) {
     auto* grid = new GridWidget(rows, cols, parentOf(design));
     mGrid = grid;
-    mFocus.setFallback(&grid->view());
+    mFocus.setFallback(grid);
     mNavigation.setGrid(grid);
     return adapt<GridAdapter>(design, Role::field, grid, mDrags, mMenu, mComforts,
                               std::move(events));
