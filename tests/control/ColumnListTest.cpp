@@ -27,6 +27,12 @@ TEST_F(TheEntriesOfATableList, SayTheirTextsAndKeysInTheirOrder) {
                                                         {u"", u"without a key"},
                                                         {u"without a text", u""},
                                                         {u"", u""},
+                                                        {u"na\u00EFve", u"\u00FF"},
+                                                        {u"k2", u"\u65E5\u672C\u8A9E"},
+                                                        {u"\u65E5\u672C", u"\u0100"},
+                                                        {u"\u65E5", u"\u65E5"},
+                                                        {u"half a letter", String(1, u'\xD800')},
+                                                        {u"nul", String(2, u'\0')},
                                                         {u"last", u"LAST"}};
     for (const auto& [key, text] : all) {
         const auto made = entries().Add(key, text);
@@ -41,6 +47,8 @@ TEST_F(TheEntriesOfATableList, SayTheirTextsAndKeysInTheirOrder) {
         EXPECT_EQ(entry->Text(), text);
         EXPECT_TRUE(entries().Reads(position, text));
         EXPECT_FALSE(entries().Reads(position, text + u"x"));
+        EXPECT_FALSE(entries().Reads(position, u"\u6500" + text));
+        EXPECT_FALSE(entries().Reads(position, key + u"y"));
     }
     EXPECT_EQ(entries().Item(1)->Text(), u"ORDER_NUMBER");
     EXPECT_FALSE(entries().Reads(1, u"ORDER_NUMBE"));

@@ -3,57 +3,45 @@
 #include <Zandor/platform/String.h>
 
 #include <cstddef>
+#include <cstdint>
+#include <string>
 #include <vector>
 
 namespace zandor::platform::qt {
 
-/// What the entries of a list say, in one piece: a drawing has thousands of entries, and few of
-/// them are ever asked for by themselves.
+/// What the entries of a list say, in one piece and a byte for each letter where that will do: a
+/// drawing has thousands of entries, and few of them are ever asked for by themselves.
 class EntryTexts {
 public:
     int count() const { return static_cast<int>(mEnds.size()); }
 
-    /// By row; until the next change.
-    StringView text(int row) const {
-        const std::size_t from = begin(row);
-        return StringView(mAll).substr(from, end(row).text - from);
-    }
-    StringView key(int row) const {
-        const End& ends = end(row);
-        return ends.keyIsText ? text(row)
-                              : StringView(mAll).substr(ends.text, ends.key - ends.text);
-    }
+    /// By row.
+    String text(int row) const;
+    String key(int row) const;
+    bool reads(int row, StringView text) const;
 
-    void add(StringView key, StringView text) {
-        // What an attempt that failed has left goes.
-        mAll.resize(begin(count()));
-        mAll += text;
-        const auto textEnd = static_cast<std::uint32_t>(mAll.size());
-        const bool same = key == text;
-        if (!same) mAll += key;
-        mEnds.push_back({textEnd, static_cast<std::uint32_t>(mAll.size()) & 0x7FFFFFFFU, same});
-    }
-
+    void add(StringView key, StringView text);
     void clear() { *this = {}; }
-
     /// Gives back what there was room for beyond the last entry.
-    void squeeze() {
-        mAll.shrink_to_fit();
-        mEnds.shrink_to_fit();
-    }
+    void squeeze();
 
 private:
-    struct End {
-        std::uint32_t text;
+    /// Where a text and the key behind it end. What takes two bytes a letter is wide.
+    struct Ends {
+        std::uint32_t text : 30;
+        std::uint32_t textIsWide : 1;
+        std::uint32_t keyIsText : 1; ///< and stands there once
         std::uint32_t key : 31;
-        std::uint32_t keyIsText : 1;
+        std::uint32_t keyIsWide : 1;
     };
 
-    const End& end(int row) const { return mEnds[static_cast<std::size_t>(row)]; }
-    std::size_t begin(int row) const { return row == 0 ? 0 : end(row - 1).key; }
+    const Ends& ends(int row) const { return mEnds[static_cast<std::size_t>(row)]; }
+    std::size_t begin(int row) const { return row == 0 ? 0 : ends(row - 1).key; }
+    bool append(StringView text);
+    String unpacked(std::size_t from, std::size_t to, bool wide) const;
 
-    String mAll; ///< each text with its key behind it
-    std::vector<End> mEnds;
+    std::string mBytes;
+    std::vector<Ends> mEnds;
 };
 
 } // namespace zandor::platform::qt

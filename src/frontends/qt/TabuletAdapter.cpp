@@ -106,7 +106,7 @@ private:
     const Said& said() const {
         if (mSaid) return *mSaid;
         const EntryTexts& texts = mTable->mEntries.texts();
-        mSaid.reset(new Said{String(texts.key(mRow)), String(texts.text(mRow))});
+        mSaid.reset(new Said{texts.key(mRow), texts.text(mRow)});
         return *mSaid;
     }
 
@@ -130,7 +130,7 @@ Ref<TalvikTabulet::ColumnItem> TabuletAdapter::Entries::Item(std::int32_t positi
 }
 
 bool TabuletAdapter::Entries::Reads(std::int32_t position, StringView text) const {
-    return mTexts->text(rowOf(position)) == text;
+    return mTexts->reads(rowOf(position), text);
 }
 
 bool TabuletAdapter::Entries::IsAt(std::int32_t position,
