@@ -97,6 +97,7 @@ TEST_F(AColumnCommand, ClearsEveryCellOfADeletedColumn) {
     for (std::int32_t row = 0; row < grid().Rows(); ++row)
         EXPECT_EQ(grid().TextMatrix(row, last), u"") << row;
     EXPECT_EQ(grid().ColWidth(last), grid().ColWidth(0));
+    EXPECT_EQ(grid().ColData(last), 0) << "and names no definition";
 }
 
 TEST_F(AColumnCommand, MovesTheColumnsBehindADeletedOneWithTheirTies) {
@@ -173,6 +174,18 @@ TEST_F(AColumnCommand, JoinsTheFirstCopiedColumnToTheColumnUnderTheMenu) {
 TEST_F(AColumnCommand, JoinsNoTwoColumnsOfOneTable) {
     copy(1, {customer});
     Backstage::mnuTableDefinitionPaste_Click(control());
+    EXPECT_EQ(model->joinCount(), 0);
+    EXPECT_FALSE(stage->exists("linJoin(1)"));
+    EXPECT_EQ(stage->boxes, Boxes{});
+}
+
+TEST_F(AColumnCommand, JoinsNothingToNorFromTheEntryForAllColumns) {
+    copy(1, {allColumns});
+    stage->selectEntries(2, {name});
+    menuOverEntry(2, name, "mnuTableDefinitionPaste");
+    copy(1, {id});
+    stage->selectEntries(2, {allColumns});
+    menuOverEntry(2, allColumns, "mnuTableDefinitionPaste");
     EXPECT_EQ(model->joinCount(), 0);
     EXPECT_FALSE(stage->exists("linJoin(1)"));
     EXPECT_EQ(stage->boxes, Boxes{});

@@ -47,6 +47,17 @@ TEST_F(ADropOnTheGrid, MakesVisibleUnsortedDefinitionsWithoutSynonym) {
     EXPECT_EQ(stage->cell(sortRow, 1), u"");
 }
 
+TEST_F(ADropOnTheGrid, SaysEverythingOfANewDefinitionItselfAndLeavesNothingToTheLibrary) {
+    Names calls;
+    library.calls->onPass = [&](const std::string& call) {
+        if (call.starts_with("ZDColumnDefinition.") && call.ends_with("=")) calls.push_back(call);
+    };
+    drag(1, {id}, 1);
+    library.calls->onPass = nullptr;
+    EXPECT_EQ(calls, (Names{"ZDColumnDefinition.Column=", "ZDColumnDefinition.Visible=",
+                            "ZDColumnDefinition.SortOrder=", "ZDColumnDefinition.Synonym="}));
+}
+
 TEST_F(ADropOnTheGrid, MakesAColumnAsWideAsItsFieldAnd120Twips) {
     drag(1, {customer}, 2);
     EXPECT_EQ(grid().ColWidth(2), stage->toolkit().TextWidth(u"ORDERS.CUSTOMER") + 120);

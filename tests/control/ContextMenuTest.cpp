@@ -122,6 +122,16 @@ TEST_F(TheContextMenu, RaisesActivateBeforeItOpens) {
     EXPECT_EQ(stage->transcript, (Names{"event:Activate", "message:0", "menu", "message:1"}));
 }
 
+TEST_F(TheContextMenu, OffersWhatTheHostLeavesOfItInActivate) {
+    stage->onEvent = [this] {
+        EXPECT_FALSE(Backstage::mMenuPrepared(control()));
+        control().ReadOnly(true);
+    };
+    menuOverEntry(1, id);
+    EXPECT_EQ(enabled(), Names{"mnuTableDefinitionCopy"});
+    EXPECT_EQ(events(), Names{"Activate"});
+}
+
 TEST_F(TheContextMenu, TellsTheWindowWhenItOpensAndWhenItHasClosed) {
     menuOverEntry(1, id);
     ASSERT_EQ(stage->messages.size(), 2U);

@@ -55,6 +55,7 @@ TEST_F(TheGridHitTest, GivesAPointInTheFieldRowOfAScrolledGridToTheRowBeforeTheF
     stage->scrollGrid(4, 1);
     ASSERT_EQ(grid().TopRow(), 4);
     EXPECT_EQ(at(0, 30).row, 3);
+    EXPECT_EQ(at(0, -30).row, 3) << "above the grid, where a held button may be let go";
 }
 
 } // namespace gridstage

@@ -284,6 +284,19 @@ TEST_F(AChangeInTheJoinDialog, IsWrittenToTheModelAndToldToTheHost) {
     EXPECT_EQ(stage->transcript, (std::vector<std::string>{"dialog", "event:JoinModified"}));
 }
 
+TEST_F(AChangeInTheJoinDialog, IsOfOneJoinAndNoOther) {
+    join();
+    join(2, 4);
+    bind();
+    put(2, 9000, 100, 9500, 100); // out of the first one's way
+    change(3, 5);
+    EXPECT_EQ(record(u"1")->JoinType(), 3);
+    EXPECT_EQ(record(u"1")->CompareOperator(), 5);
+    EXPECT_EQ(record(u"2")->JoinType(), 2);
+    EXPECT_EQ(record(u"2")->CompareOperator(), 4);
+    EXPECT_EQ(model->joinAt(2).joinType, 2);
+}
+
 TEST_F(AChangeInTheJoinDialog, MayBeOfTheTypeAlone) {
     bindJoin(0, 4);
     change(2, 4);
@@ -404,6 +417,20 @@ TEST_F(AChangeInTheJoinDialog, IsDroppedByEscape) {
         stage->key("cboJoinType", escape);
     });
     EXPECT_EQ(stored().joinType, 0);
+    EXPECT_EQ(events(), std::vector<Event>());
+    EXPECT_EQ(stage->boxes, Boxes());
+    EXPECT_FALSE(stage->exists("frmJoinDefinition"));
+}
+
+TEST_F(AChangeInTheJoinDialog, IsDroppedByTheDialogsCross) {
+    bindJoin(1, 2);
+    open([this] {
+        record()->JoinType(3); // as a dialog in between would have left it
+        stage->choose("cboJoinType", 2);
+    });
+    EXPECT_EQ(opened, 1);
+    EXPECT_EQ(record()->JoinType(), 1);
+    EXPECT_EQ(stored().joinType, 1);
     EXPECT_EQ(events(), std::vector<Event>());
     EXPECT_EQ(stage->boxes, Boxes());
     EXPECT_FALSE(stage->exists("frmJoinDefinition"));

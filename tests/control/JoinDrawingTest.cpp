@@ -121,6 +121,16 @@ TEST_F(ADrawnJoin, LosesTheCircleOfAnEarlierType) {
     EXPECT_EQ(east().shape, square);
 }
 
+TEST_F(ADrawnJoin, LosesTheCircleOfAnEarlierTypeAtItsWesternEndToo) {
+    customers->place(1000, 4000, 2000, 2000);
+    join(1);
+    bind();
+    ASSERT_EQ(west().shape, circle);
+    record()->JoinType(0);
+    EXPECT_TRUE(Back::DrawJoin(control, *record()));
+    EXPECT_EQ(west().shape, square);
+}
+
 /// Orders has more columns than its list shows; the join is at a row of it.
 struct ADrawnJoinOfALongList : ADrawnJoin {
     ADrawnJoinOfALongList() {

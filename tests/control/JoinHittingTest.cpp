@@ -28,6 +28,13 @@ TEST_F(TheDistanceFromAJoinLine, IsThatFromTheInfiniteLine) {
     EXPECT_FLOAT_EQ(delta(-5000, 10, 0, 0, 100, 0), 10);
 }
 
+TEST_F(TheDistanceFromAJoinLine, IsThatOfSinglesAtEachStep) {
+    // To the last digit: length, both directions and the line's own distance are rounded.
+    EXPECT_EQ(delta(5387, 6482, 3645, 9090, 8355, 1995), 8.902226448059082F);
+    EXPECT_EQ(delta(8265, 4450, 7275, 9600, 8910, 1005), 10.149930000305176F);
+    EXPECT_EQ(delta(7441, 3931, 7200, 3975, 8460, 3585), 29.227083206176758F);
+}
+
 TEST_F(TheDistanceFromAJoinLine, IsZeroAndReportedWhenBothEndsCoincide) {
     EXPECT_EQ(delta(20, 10, 5, 5, 5, 5), 0);
     EXPECT_EQ(stage->boxes, Boxes{controlErrorBox(u"DeltaJoinLine", 11, u"Division by zero")});
@@ -68,6 +75,11 @@ TEST_F(TheJoinUnderAPoint, IsOneCloserThan50) {
     EXPECT_FALSE(isHit(2000, 950));
 }
 
+TEST_F(TheJoinUnderAPoint, IsOneThatSinglesPutWithinItsReach) {
+    put(1, 8085, 11815, 9105, 2745);
+    EXPECT_TRUE(isHit(8984, 4268.359375F)) << "49.9995 twips away, and more in doubles";
+}
+
 TEST_F(TheJoinUnderAPoint, IsOneWhoseRangeOfXHoldsThePointEndsIncluded) {
     put(1, 1000, 1000, 3000, 1000);
     EXPECT_TRUE(isHit(1000, 1000));
@@ -81,6 +93,25 @@ TEST_F(TheJoinUnderAPoint, IsNeverBeyondTheRangeOfXOfASteepLineHoweverClose) {
     EXPECT_TRUE(isHit(1005, 3000));
     EXPECT_FALSE(isHit(999, 1001));
     EXPECT_FALSE(isHit(1011, 4999));
+}
+
+TEST_F(TheJoinUnderAPoint, IsNoneThatEndsBeforeItHoweverFarAway) {
+    put(1, 1000, 1000, 3000, 1000);
+    for (const float away : {-4e5F, -1000.0F, 999.9F, 3000.1F, 9000.0F, 4e5F})
+        EXPECT_FALSE(isHit(away, 1000)) << away;
+    // Lines and points beyond all screens, where each line is looked at.
+    put(2, 3e5F, 1000, 5e5F, 1000);
+    EXPECT_TRUE(isHit(4e5F, 1000));
+    EXPECT_EQ(hit, record(u"2"));
+    EXPECT_FALSE(isHit(6e5F, 1000));
+    EXPECT_FALSE(isHit(2e5F, 1000));
+}
+
+TEST_F(TheJoinUnderAPoint, IsFoundHoweverFarDownItsLineEnds) {
+    put(1, 1000, 0, 1100, 1e38F);
+    EXPECT_TRUE(isHit(1020, 500));
+    put(1, 1000, 1e38F, 1100, 0);
+    EXPECT_TRUE(isHit(1080, 500));
 }
 
 TEST_F(TheJoinUnderAPoint, IsNotTestedForTheRangeOfY) {

@@ -128,6 +128,14 @@ TEST_F(TheWidthThatADefinitionKeeps, StaysWhereTheModelRefusesAnother) {
     EXPECT_EQ(events(), Names{});
 }
 
+TEST_F(TheWidthThatADefinitionKeeps, IsNotChangedInADrawingThatIsOnlyRead) {
+    control().ReadOnly(true);
+    stage->dragBorder(1, 3000);
+    EXPECT_EQ(first->width, 0);
+    EXPECT_EQ(events(), Names{});
+    EXPECT_NEAR(width(1), 3000, 15) << "who looks may make it wider";
+}
+
 TEST_F(TheWidthThatADefinitionKeeps, IsNotThatOfAnotherModelThatIsBoundMeanwhile) {
     const auto other = library.newModel();
     const auto table = other->table(u"OTHERS", {u"*", u"ID"});

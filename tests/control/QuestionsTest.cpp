@@ -169,6 +169,34 @@ TEST_P(EachAct, IsAskedAboutNoLongerOnceTheHostHasHadEnough) {
 
 INSTANTIATE_TEST_SUITE_P(Of, EachAct, testing::Range<std::size_t>(0, 6));
 
+TEST_F(AHostThatIsAsked, KeepsAJoinThatItPutInThePlaceOfTheOneToBeRemoved) {
+    host->first = [this] {
+        if (host->questions.empty()) return; // the menu is asked about before
+        model->joins.items = {};
+        model->join(orders, u"ID", customers, u"NAME");
+        control().ShowAnew();
+    };
+    menuOverTheLine("mnuJoinDelete");
+    EXPECT_EQ(model->joinCount(), 1);
+    EXPECT_TRUE(stage->exists("linJoin(1)"));
+    EXPECT_EQ(events(), Names{"Activate"});
+    EXPECT_EQ(stage->boxes, Boxes{});
+}
+
+TEST_F(AHostThatIsAsked, KeepsTheColumnThatItShowsInThePlaceOfTheOneToBeRemoved) {
+    model->definition(orders, u"TOTAL");
+    control().ShowAnew();
+    host->first = [this] {
+        if (host->questions.empty()) return; // the menu is asked about before
+        model->definitions.items.Remove(u"x1");
+        control().ShowAnew();
+    };
+    menuOverCell(synonymRow, 1, "mnuColumnDefinitionDelete");
+    EXPECT_EQ(fields(2), (Texts{u"TOTAL", u""}));
+    EXPECT_EQ(events(), Names{"Activate"});
+    EXPECT_EQ(stage->boxes, Boxes{});
+}
+
 TEST_F(AHostThatIsAsked, IsAskedAboutEachOfSeveralColumns) {
     host->first = [this] { host->says = host->questions.back() != u"come out CUSTOMER"; };
     drag(1, {id, customer, total}, 2);
@@ -262,6 +290,14 @@ TEST_F(AHostThatIsAsked, IsToldWhatTheMenuOpensOver) {
     ASSERT_TRUE(cell.Definition);
     EXPECT_EQ(cell.Definition->Key(), u"x1");
     EXPECT_FALSE(host->places[4].Definition);
+}
+
+TEST_F(AHostThatIsAsked, IsToldOfNoJoinWhereItsModelNeverTookTheLine) {
+    Backstage::mJoinLines(control()).Item(1)->Tag({});
+    menuOverTheLine();
+    ASSERT_EQ(host->places.size(), 1U);
+    EXPECT_FALSE(host->places[0].Join);
+    EXPECT_EQ(stage->boxes, Boxes{});
 }
 
 TEST_F(AHostThatIsAsked, HearsOfAFailureOfAnEntryOfItsOwn) {

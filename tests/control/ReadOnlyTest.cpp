@@ -164,6 +164,25 @@ TEST_F(ADrawingThatIsOnlyRead, ShowsWhatItsHostChanges) {
     EXPECT_EQ(stage->boxes, Boxes{});
 }
 
+TEST_F(ADrawingThatIsOnlyRead, TakesNothingFromAMenuThatWasOpenBefore) {
+    control().ReadOnly(false);
+    copy(1, {total});
+    stage->selectEntries(2, {name});
+    changes.clear();
+    for (const std::string entry : {"mnuTableDefinitionPaste", "mnuTableDefinitionDelete"}) {
+        stage->onMenu = [&](const std::vector<Stage::Entry>&) {
+            control().ReadOnly(true);
+            return zandor::platform::fromUtf8(entry);
+        };
+        stage->pressEntry(2, name, right);
+        changes.clear(); // of the selection
+        stage->releaseEntry(2, name, right);
+        expectUnchanged();
+        EXPECT_FALSE(stage->exists("linJoin(2)")) << entry;
+        control().ReadOnly(false);
+    }
+}
+
 TEST_F(ADrawingThatIsOnlyRead, IsWorkedInAgainOnceItMay) {
     control().ReadOnly(false);
     stage->moveTable(1, 3000, 900);

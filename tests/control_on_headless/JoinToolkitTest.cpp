@@ -4,6 +4,7 @@
 #include <Zandor/headless/User.h>
 
 #include <algorithm>
+#include <utility>
 
 using namespace zandor;
 
@@ -251,6 +252,16 @@ TEST_F(AJoinOnAFailingToolkit, CannotBeChangedThroughALockedDialog) {
     });
     EXPECT_EQ(model->joinAt(1).joinType, 0);
     EXPECT_EQ(events(), std::vector<Event>());
+}
+
+TEST_F(AJoinOnAFailingToolkit, IsHandedToNobodyOnceTheHostHasClosedItsTable) {
+    bool closed = false;
+    toolkit.onBox = [&](const platform::headless::MessageBox&) {
+        if (!std::exchange(closed, true)) Back::RemoveTable(control, 2);
+    };
+    toolkit.faults.failNext("linJoin(2).setEnds", invalidPropertyValue());
+    EXPECT_EQ(draw(entry(1, 1), entry(2, 1)), nullptr);
+    EXPECT_EQ(joinCount(), 0);
 }
 
 } // namespace

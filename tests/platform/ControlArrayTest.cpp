@@ -55,6 +55,15 @@ TEST_F(AControlArray, HasElementZeroFromDesignTimeOn) {
     EXPECT_EQ(elements(0)->pattern, nullptr);
 }
 
+TEST_F(AControlArray, HasNoElementWhoseIndexOnlyEndsLikeOne) {
+    elements.Load(5);
+    for (const std::int32_t index : {65536 + 5, 5 - 65536}) {
+        EXPECT_FALSE(elements.Find(index)) << index;
+        EXPECT_EQ(elements.Peek(index), nullptr);
+        EXPECT_EQ(errorOf([&] { elements(index); }).Number, 340);
+    }
+}
+
 TEST_F(AControlArray, LoadsItsElementsAfterThePatternOfElementZero) {
     elements.Load(5);
     EXPECT_EQ(elements(5)->index, 5);

@@ -56,6 +56,8 @@ TEST(MalformedUtf8, CostsOneReplacementCharacterForEachBadByte) {
         {"\xE0\x80\xAF", u"\uFFFD\uFFFD\uFFFD"},           // overlong slash
         {"\xF0\x80\x80\xAF", u"\uFFFD\uFFFD\uFFFD\uFFFD"}, // overlong slash
         {"\xED\xA0\x80", u"\uFFFD\uFFFD\uFFFD"},           // a surrogate
+        {"\xED\xB0\x80", u"\uFFFD\uFFFD\uFFFD"},           // the other half of one
+        {"\xED\xBF\xBF", u"\uFFFD\uFFFD\uFFFD"},           // the last of them
         {"\xF4\x90\x80\x80", u"\uFFFD\uFFFD\uFFFD\uFFFD"}, // beyond the last plane
         {"\xF5\x80\x80\x80", u"\uFFFD\uFFFD\uFFFD\uFFFD"}, // beyond the last plane
         {"\xE6\xB3z", u"\uFFFD\uFFFDz"},                   // the second tail missing
@@ -69,5 +71,7 @@ TEST(UnpairedSurrogates, BecomeReplacementCharacters) {
                                               "a");
     EXPECT_EQ(toUtf8(String({0xDC00, u'a'})), "\xEF\xBF\xBD"
                                               "a");
+    EXPECT_EQ(toUtf8(String({0xDC00, 0xDC00})), "\xEF\xBF\xBD\xEF\xBF\xBD");
+    EXPECT_EQ(toUtf8(String({0xD800, 0xE000})), "\xEF\xBF\xBD\xEE\x80\x80");
     EXPECT_EQ(toUtf8(String({0xD800, 0xD83D, 0xDDC4})), "\xEF\xBF\xBD\xF0\x9F\x97\x84");
 }

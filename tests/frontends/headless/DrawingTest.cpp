@@ -101,6 +101,31 @@ TEST_F(ADrawing, CutsALongNameBetweenCharacters) {
     EXPECT_FALSE(has(drawn, "\xEF\xBF\xBD")) << drawn;
 }
 
+TEST_F(ADrawing, CutsNoNameThatFitsAndNoneWithinACharacter) {
+    const platform::String fits = u"ABCDEFGHIJKLMNOPQRSTU"; // 21 letters of 7 pixels in 152
+    model->table(fits, {u"A"})->place(300, 300, 2400, 2400);
+    model->table(fits + u"V", {u"A"})->place(3000, 300, 2400, 2400);
+    platform::String smileys = u"a";
+    for (int n = 0; n < 50; ++n) smileys += u"😀";
+    model->table(smileys, {u"A"})->place(6000, 300, 2400, 2400);
+    const std::string drawn = svg();
+    EXPECT_TRUE(has(drawn, ">ABCDEFGHIJKLMNOPQRSTU</text>")) << drawn;
+    EXPECT_TRUE(has(drawn, ">ABCDEFGHIJKLMNOPQRST…</text>")) << drawn;
+    EXPECT_TRUE(has(drawn, "😀…</text>")) << drawn;
+    EXPECT_FALSE(has(drawn, "\xEF\xBF\xBD")) << drawn;
+}
+
+TEST_F(ADrawing, HasNoLineBreakInAName) {
+    model->table(u"T", {u"a\nb\tc\u001Fd"})->place(300, 300, 2400, 2400);
+    EXPECT_TRUE(has(svg(), ">a b c d</text>")) << svg();
+}
+
+TEST_F(ADrawing, EndsWithTheTableThatReachesFarthest) {
+    model->table(u"EAST", {u"A", u"B"})->place(6000, 300, 2400, 2400);
+    model->table(u"WEST", {u"A"})->place(300, 300, 2400, 2400);
+    EXPECT_TRUE(has(svg(), "width=\"580\" height=\"93\"")) << svg();
+}
+
 TEST_F(ADrawing, OfNothingIsAnEmptyPicture) {
     const std::string drawn = svg();
     EXPECT_TRUE(has(drawn, "<svg "));

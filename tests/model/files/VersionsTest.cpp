@@ -49,6 +49,23 @@ TEST(AFileOfVersion1, IsGivenTheLastKeysOfWhatIsThere) {
     EXPECT_EQ(last, (model::LastKeys{.table = 4, .column = 9, .join = 3, .definition = 2}));
 }
 
+TEST(AFileOfVersion1, IsGivenTheLastColumnOfWhicheverTableHasIt) {
+    std::string text = contentOf(testFile("version-1.json"));
+    const std::string key = "\"c3\"";
+    for (std::size_t at; (at = text.find(key)) != std::string::npos;)
+        text.replace(at, key.size(), "\"c30\"");
+    EXPECT_EQ(documentOf(text).query->record().lastKeys.column, 30);
+}
+
+TEST(ADefinitionInAFile, IsVisibleWhereNothingIsSaidOfIt) {
+    std::string text = contentOf(testFile("version-2.json"));
+    const std::string hidden = "\"visible\": false,";
+    ASSERT_NE(text.find(hidden), std::string::npos);
+    EXPECT_FALSE(documentOf(text).query->ColumnDefinitions().Item(2)->Visible());
+    text.erase(text.find(hidden), hidden.size());
+    EXPECT_TRUE(documentOf(text).query->ColumnDefinitions().Item(2)->Visible());
+}
+
 TEST(AFileOfVersion1, IsRefusedWithACodeThatIsNone) {
     std::string text = contentOf(testFile("version-1.json"));
     const std::string code = "\"type\": 1";

@@ -66,6 +66,7 @@ TEST_F(ACondition, MayBeAPattern) {
     EXPECT_EQ(condition(u"text", u"Like 'a[*][?][[]'"), "t.text LIKE 'a*?['");
     EXPECT_EQ(condition(u"text", u"Like '[%][_]'"), "t.text LIKE '\\%\\_' ESCAPE '\\'");
     EXPECT_EQ(condition(u"text", u"Like a[*]b[%]"), "t.text LIKE 'a*b\\%' ESCAPE '\\'");
+    EXPECT_EQ(condition(u"text", u"Like x[*].[%]"), "t.text LIKE 'x*.\\%' ESCAPE '\\'");
     EXPECT_EQ(condition(u"text", u"Like '\\'"), "t.text LIKE '\\\\' ESCAPE '\\'");
     EXPECT_EQ(condition(u"text", u"Like '[x] [] ['"), "t.text LIKE '[x] [] ['");
     EXPECT_EQ(condition(u"text", u"Like ''"), "t.text LIKE ''");

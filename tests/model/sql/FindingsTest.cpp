@@ -192,6 +192,15 @@ TEST_F(AFinding, OnANameThatIsNotCarriedNamesTheTable) {
     EXPECT_EQ(only(Dialect::PostgreSQL).table, table->Key()) << "the source's name is used too";
 }
 
+TEST_F(AFinding, OnASchemaThatIsNotCarriedNamesTheTable) {
+    const auto table =
+        query->addTable({String(64, u's'), u"short", {{u"id", model::ColumnType::Integer}}});
+    EXPECT_EQ(only(Dialect::PostgreSQL).kind, Finding::Kind::nameNotCarried);
+    EXPECT_EQ(only(Dialect::PostgreSQL).table, table->Key());
+    EXPECT_FALSE(runnable(Dialect::PostgreSQL));
+    EXPECT_TRUE(runnable(Dialect::SQLite));
+}
+
 TEST_F(AFinding, OnANameThatIsNotCarriedNamesTheDefinitionOrTheJoin) {
     const auto a = added(u"a");
     const auto b = added(u"b");
