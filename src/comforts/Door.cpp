@@ -114,7 +114,7 @@ std::optional<std::int32_t> Door::storedWidth(std::int32_t column) {
 
 TalvikDBxZandor::Held<TalvikZandorLib::ZDColumnDefinition> Door::storeWidth(std::int32_t column,
                                                                             std::int32_t width) {
-    const auto definition = definitionOf(column);
+    auto definition = definitionOf(column);
     const auto sized = sizedDefinitionOf(column);
     if (!sized || sized->Width() == width) return {};
     sized->Width(width);
@@ -123,6 +123,8 @@ TalvikDBxZandor::Held<TalvikZandorLib::ZDColumnDefinition> Door::storeWidth(std:
 
 platform::Ref<TalvikZandorLib::ZDTable> Door::tableOf(const TalvikTabulet::Tabulet& element) {
     try {
+        // The model's code may end the element.
+        // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
         const String key = element.Tag();
         return control().Tables().Item(key);
     } catch (const platform::RuntimeError&) {

@@ -53,6 +53,7 @@ bool Comforts::offerFields(Door& door, std::int32_t column, const String& typed)
     door.showCurrentCell();
 
     std::vector<String> names;
+    names.reserve(fields.size());
     for (const Field& field : fields) names.push_back(field.name);
     const auto& grid = door.grid();
     const auto at = std::find(names.begin(), names.end(), grid.TextMatrix(row::field, column));

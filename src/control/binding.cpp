@@ -141,7 +141,7 @@ void Zandor::ShowDefinition(std::int32_t column,
     // Whatever the host did when it was asked, the answer goes into its own cell.
     const auto answer = [&](std::int32_t row, const auto& ask) {
         goTo(row);
-        const auto value = ask();
+        auto value = ask();
         require(binding == mBinding);
         goTo(row);
         return value;

@@ -23,7 +23,7 @@ bool Zandor::Shows(const Held<Tabulet>& element) const {
 Held<TalvikTabulet::Tabulet> Zandor::ShowTable(std::int16_t slot, const Held<ZDTable>& table,
                                                std::int32_t& cascade) {
     lstTable.Load(slot);
-    const auto element = Hold(lstTable(slot));
+    auto element = Hold(lstTable(slot));
     const String name = table->Name();
     element->Text(name);
     const String key = table->Key();

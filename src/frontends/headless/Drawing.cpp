@@ -77,7 +77,7 @@ public:
 
     std::string svg() const {
         const std::string width = number(mRight + margin), height = number(mBottom + margin);
-        return "<svg xmlns=\"http://www.w3.org/2000/svg\" width=\"" + width + "\" height=\"" +
+        return R"(<svg xmlns="http://www.w3.org/2000/svg" width=")" + width + "\" height=\"" +
                height + "\" viewBox=\"0 0 " + width + ' ' + height + "\">\n<style>" +
                std::string(style) + "</style>\n<rect class=\"page\" width=\"" + width +
                "\" height=\"" + height + "\"/>\n" + mJoins + mTables + "</svg>\n";
@@ -150,12 +150,13 @@ private:
 
     void addEntry(const ColumnItem& entry, float width, float middle) {
         if (entry.picture() == Picture::key)
-            mTables += "<path class=\"key\" transform=\"translate(7 " + number(middle - 6) +
-                       ") scale(.75)\" d=\"M8.7 6.9a4.3 4.3 0 1 0 0 2.2H10v2h2v-2h1.3v3.3h2.2V6.9z"
-                       "M4.2 6.3a1.7 1.7 0 1 1 0 3.4 1.7 1.7 0 0 1 0-3.4z\"/>";
+            mTables +=
+                R"(<path class="key" transform="translate(7 )" + number(middle - 6) +
+                R"x() scale(.75)" d="M8.7 6.9a4.3 4.3 0 1 0 0 2.2H10v2h2v-2h1.3v3.3h2.2V6.9z)x"
+                R"(M4.2 6.3a1.7 1.7 0 1 1 0 3.4 1.7 1.7 0 0 1 0-3.4z"/>)";
         addText({}, elided(entry.text(), width - beforeText - behindText), beforeText, middle);
         if (entry.comesOut())
-            mTables += "<path class=\"out\" d=\"M" + number(width - 15) + ' ' + number(middle) +
+            mTables += R"(<path class="out" d="M)" + number(width - 15) + ' ' + number(middle) +
                        "l3 3 6-7\"/>";
     }
 

@@ -9,8 +9,8 @@ namespace zandor::platform::qt {
 
 FocusTracker::FocusTracker(QWidget& surface) : mSurface(&surface) {}
 
-void FocusTracker::watch(QWidget* widget, std::function<void()> gotFocus) {
-    mNotices.insert(widget, std::move(gotFocus));
+void FocusTracker::watch(QWidget* widget, const std::function<void()>& gotFocus) {
+    mNotices.insert(widget, gotFocus);
     widget->installEventFilter(this);
     connect(widget, &QObject::destroyed, this, [this](QObject* gone) { mNotices.remove(gone); });
 }

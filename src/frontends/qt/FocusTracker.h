@@ -16,7 +16,7 @@ public:
     explicit FocusTracker(QWidget& surface);
 
     /// Calls `gotFocus` whenever the focus comes to the widget from another one.
-    void watch(QWidget* widget, std::function<void()> gotFocus);
+    void watch(QWidget* widget, const std::function<void()>& gotFocus);
 
     /// Nobody is told about the widget any more.
     void forget(QWidget* widget);

@@ -95,7 +95,7 @@ void SetButton::keyPressEvent(QKeyEvent* event) {
 }
 
 ButtonAdapter::ButtonAdapter(QAbstractButton* widget, FocusTracker& focus,
-                             CommandButtonEvents events)
+                             const CommandButtonEvents& events)
     : Adapter(widget, focus) {
     QObject::connect(widget, &QAbstractButton::clicked, widget, [click = events.Click] {
         if (click) click();

@@ -35,7 +35,7 @@ private:
 
 class ButtonAdapter final : public Adapter<platform::CommandButton, QAbstractButton> {
 public:
-    ButtonAdapter(QAbstractButton* widget, FocusTracker& focus, CommandButtonEvents events);
+    ButtonAdapter(QAbstractButton* widget, FocusTracker& focus, const CommandButtonEvents& events);
 
     void Caption(const String& value) override;
     void Enabled(bool value) override { enable(value); }

@@ -53,7 +53,8 @@ void CanvasScrollBar::sliderChange(SliderChange change) {
     QScrollBar::sliderChange(change);
 }
 
-ScrollBarAdapter::ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, ScrollBarEvents events)
+ScrollBarAdapter::ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus,
+                                   const ScrollBarEvents& events)
     : Adapter(widget, focus) {
     widget->setRange(0, 0);
     widget->setSingleStep(singleStep);

@@ -28,7 +28,7 @@ private:
 
 class ScrollBarAdapter final : public Adapter<platform::ScrollBar, QScrollBar> {
 public:
-    ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, ScrollBarEvents events);
+    ScrollBarAdapter(QScrollBar* widget, FocusTracker& focus, const ScrollBarEvents& events);
 
     /// As thick as the style has it at the moment.
     Bounds bounds() const override;

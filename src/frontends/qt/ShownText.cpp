@@ -91,7 +91,7 @@ QString asToolTip(const QString& text) {
         lines += line;
     }
     if (lines.size() > highest) lines = lines.mid(0, highest - 1) << QStringLiteral("…");
-    const QString shown = lines.join(u'\n');
+    QString shown = lines.join(u'\n');
     if (!Qt::mightBeRichText(shown)) return shown;
     return QStringLiteral("<p style='white-space:pre'>") +
            shown.toHtmlEscaped().replace(u'\n', QStringLiteral("<br>")) + QStringLiteral("</p>");

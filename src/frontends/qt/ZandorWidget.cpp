@@ -75,6 +75,8 @@ public:
 
     void takeIn(const QWidget& widget) {
         mChildren = std::make_unique<QWidget>();
+        // A copy, for whoever gets another parent leaves the list.
+        // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
         const QObjectList children = widget.children();
         for (QObject* child : children)
             if (auto* part = qobject_cast<QWidget*>(child)) part->setParent(mChildren.get());

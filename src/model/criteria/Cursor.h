@@ -19,7 +19,7 @@ public:
     bool atBegin() const { return mAt == 0; }
 
     Token take() {
-        const Token token = peek();
+        Token token = peek();
         if (mAt < mTokens.list.size() - 1) ++mAt;
         return token;
     }

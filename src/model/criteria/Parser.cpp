@@ -37,10 +37,10 @@ public:
             if (mCursor.error()) throw Error(*mCursor.error());
             if (mCursor.peek().kind != TokenKind::end) fail<MessageCode::jointMissing>();
             mReading.references = std::move(mNames.references);
-        } catch (Error& error) {
+        } catch (const Error& error) {
             mReading.condition = {};
             // What no token can be made of explains more than what was missed before it.
-            mReading.error = mCursor.error() ? *mCursor.error() : std::move(error);
+            mReading.error = mCursor.error() ? *mCursor.error() : error;
             mReading.warning.reset();
             mNames.keepKnown();
             mReading.references = std::move(mNames.references);
@@ -376,9 +376,9 @@ ExpressionReading readExpression(StringView text, const Resolver& resolver,
         reading.value = ExpressionReader(cursor, names).expression();
         if (cursor.error()) throw Error(*cursor.error());
         if (cursor.peek().kind != TokenKind::end) cursor.fail<MessageCode::operatorMissing>();
-    } catch (Error& error) {
+    } catch (const Error& error) {
         reading.value = {};
-        reading.error = cursor.error() ? *cursor.error() : std::move(error);
+        reading.error = cursor.error() ? *cursor.error() : error;
         names.keepKnown();
     }
     reading.references = std::move(names.references);

@@ -28,7 +28,7 @@ Path nameBeside(const Path& path) {
 /// that leads to itself stays one.
 Path targetOf(const Path& path) {
     std::error_code none;
-    const Path target = std::filesystem::canonical(path, none);
+    Path target = std::filesystem::canonical(path, none);
     if (!none) return target;
     Path end = std::filesystem::absolute(path, none);
     constexpr int mostLinks = 40; // as the system has it
@@ -73,7 +73,7 @@ std::optional<Error> Replacement::open() {
 }
 
 std::optional<Error> Replacement::commit() {
-    if (const auto error = flush()) return error;
+    if (auto error = flush()) return error;
     if (!isOnDisk(mFile.number()) || !mFile.close() ||
         std::rename(mBeside.c_str(), mTarget.c_str()) != 0)
         return refused(errno);

@@ -6,10 +6,10 @@
 /// no file takes long or much memory.
 namespace zandor::files::limits {
 
-inline constexpr std::size_t fileSize = 64 * 1024 * 1024; ///< bytes
-inline constexpr std::size_t depth = 64;                  ///< arrays and objects within each other
-inline constexpr std::size_t values = 2'000'000;          ///< in the whole file
-inline constexpr std::size_t textLength = 100'000;        ///< UTF-16 code units of one text
+inline constexpr std::size_t fileSize = 1 << 26;   ///< bytes
+inline constexpr std::size_t depth = 64;           ///< arrays and objects within each other
+inline constexpr std::size_t values = 2'000'000;   ///< in the whole file
+inline constexpr std::size_t textLength = 100'000; ///< UTF-16 code units of one text
 inline constexpr std::size_t tables = 1'000;
 inline constexpr std::size_t columnsOfTable = 5'000;
 inline constexpr std::size_t columns = 100'000; ///< of all tables

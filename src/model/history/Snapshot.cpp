@@ -10,16 +10,16 @@ namespace zandor::model {
 
 namespace {
 
-TableState stateOf(Ref<Table> table) {
+TableState stateOf(const Ref<Table>& table) {
     return {table,          table->Name(),   table->Left(),    table->Top(),
             table->Width(), table->Height(), table->contents()};
 }
 
-JoinState stateOf(Ref<Join> join) {
+JoinState stateOf(const Ref<Join>& join) {
     return {join, join->left(), join->right(), join->JoinType(), join->CompareOperator()};
 }
 
-DefinitionState stateOf(Ref<ColumnDefinition> definition) {
+DefinitionState stateOf(const Ref<ColumnDefinition>& definition) {
     DefinitionState state{definition,
                           definition->place(),
                           definition->Synonym(),

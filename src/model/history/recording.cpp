@@ -88,7 +88,7 @@ QueryRecord Query::record() const {
 
 Ref<Query> Query::restored(const QueryRecord& record) {
     if (faultOf(record)) throw platform::errors::invalidProcedureCall();
-    const auto query = makeRef<Query>();
+    auto query = makeRef<Query>();
     query->mLastTable = record.lastKeys.table;
     query->mLastColumn = record.lastKeys.column;
     query->mLastJoin = record.lastKeys.join;

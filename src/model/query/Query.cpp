@@ -111,7 +111,7 @@ Ref<Table> Query::add(const TableDescription& source, SavedQueryRef saved) {
     addColumn({.name = String(Column::allColumns)});
     for (const auto& column : source.columns) addColumn(column);
 
-    const auto table =
+    auto table =
         makeRef<Table>(place, std::move(name), source.schema, source.name, std::move(contents));
     mTables->Add(table);
     return table;

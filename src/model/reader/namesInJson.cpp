@@ -8,7 +8,7 @@ namespace zandor::reader {
 
 void forEachName(const QString& array, const std::function<void(platform::String)>& use) {
     if (array.contains(u'\\')) {
-        for (const QJsonValue& text : QJsonDocument::fromJson(array.toUtf8()).array())
+        for (const auto& text : QJsonDocument::fromJson(array.toUtf8()).array())
             use(text.toString().toStdU16String());
         return;
     }

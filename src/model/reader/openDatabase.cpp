@@ -83,7 +83,9 @@ Result<QStringList> driverOptions(const Engine& engine, const QUrlQuery& query) 
     QStringList options;
     const Option& timeout = engine.options.back();
     bool timed = false;
-    for (auto [name, value] : query.queryItems(QUrl::FullyDecoded)) {
+    for (const auto& item : query.queryItems(QUrl::FullyDecoded)) {
+        const QString& name = item.first;
+        QString value = item.second;
         const auto known = std::ranges::find_if(
             engine.options, [&](const Option& each) { return name == QLatin1String(each.name); });
         if (known == engine.options.end() && name != hostOption) {

@@ -33,7 +33,8 @@ bool operator<(const Key& left, const Key& right) {
 void writeHeads(std::vector<Key>& keys) {
     std::string_view common = keys.front().folded;
     for (const Key& key : keys)
-        common = {common.begin(), std::ranges::mismatch(common, key.folded).in1};
+        common.remove_suffix(
+            static_cast<std::size_t>(common.end() - std::ranges::mismatch(common, key.folded).in1));
     for (Key& key : keys)
         for (std::size_t n = 0; n < sizeof key.head; ++n) {
             const std::size_t at = common.size() + n;

@@ -58,7 +58,7 @@ private:
         std::vector<Ref<const ColumnDefinition>> all;
         for (const auto& item :
              platform::Each<TalvikZandorLib::ZDColumnDefinition>(mQuery.ColumnDefinitions()))
-            all.push_back(std::static_pointer_cast<const ColumnDefinition>(item));
+            all.emplace_back(std::static_pointer_cast<const ColumnDefinition>(item));
         return all;
     }
 
@@ -117,7 +117,7 @@ private:
         String name = definition.Synonym();
         const auto* column = std::get_if<ColumnRef>(&subject.node->node);
         if (name.empty() && !column) name = nameOf(subject);
-        mNames.push_back({&definition, name.empty() ? column->column : name});
+        mNames.emplace_back(&definition, name.empty() ? column->column : name);
         mStatement.items.push_back({subject.node, std::move(name)});
     }
 

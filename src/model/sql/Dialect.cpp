@@ -49,7 +49,7 @@ String quotedText(StringView text, Dialect dialect) {
 /// A date, time or timestamp: a keyword before the text, a cast of it, or, where the engine keeps
 /// them as texts, the text alone.
 String moment(StringView text, StringView keyword, StringView serverType, Dialect dialect) {
-    const String quoted = u"'" + doubled(text, u'\'') + u"'";
+    String quoted = u"'" + doubled(text, u'\'') + u"'";
     if (dialect == Dialect::SQLite) return quoted;
     if (dialect == Dialect::SqlServer)
         return u"CAST(" + quoted + u" AS " + String(serverType) + u")";

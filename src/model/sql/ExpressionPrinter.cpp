@@ -160,14 +160,14 @@ void ExpressionPrinter::write(const Value& value, Tightness) {
         return;
     }
     mOut.text += placeholder(value.type, mOut.dialect);
-    mOut.bindings.push_back(value);
+    mOut.bindings.emplace_back(value);
 }
 
 void ExpressionPrinter::write(const Parameter& parameter, Tightness) {
     if (mWritesOut)
         throw Refusal{Refusal::Reason::expression,
                       say<MessageCode::parameterInGroup>(parameter.name)};
-    mOut.bindings.push_back(parameter);
+    mOut.bindings.emplace_back(parameter);
     // What the user will answer may be a fraction even where the column holds whole numbers.
     const bool whole = parameter.type == ColumnType::Integer;
     const ColumnType type = whole ? ColumnType::Decimal : parameter.type;

@@ -28,7 +28,7 @@ public:
     Joiner(Query& query, std::vector<SourceNode> leaves, Findings& findings)
         : mFindings(findings), mLeaves(std::move(leaves)) {
         for (std::int32_t i = 1; i <= query.Tables().Count(); ++i)
-            mTables.push_back(std::dynamic_pointer_cast<Table>(query.Tables().Item(i)));
+            mTables.emplace_back(std::dynamic_pointer_cast<Table>(query.Tables().Item(i)));
         for (std::int32_t i = 1; i <= query.Joins().Count(); ++i)
             addEdge(*std::dynamic_pointer_cast<Join>(query.Joins().Item(i)));
     }

@@ -81,7 +81,7 @@ std::vector<ColumnDescription> outputColumns(Query& query) {
 
 SourceNode SavedQueries::sourceOf(const Table& table, Findings& findings) {
     const SavedQueryRef& query = table.savedQuery();
-    const auto plain = std::make_shared<const Source>(
+    auto plain = std::make_shared<const Source>(
         Source{TableRef{table.schema(), table.sourceName(), table.Name()}});
     if (!query) return plain;
 

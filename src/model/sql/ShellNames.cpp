@@ -47,7 +47,7 @@ ShellNames::ShellNames(const std::vector<Binding>& bindings) {
                     add(parameter->name, simple ? parameter->name : simplified(parameter->name));
 }
 
-void ShellNames::add(const String& name, String wanted) {
+void ShellNames::add(const String& name, const String& wanted) {
     const auto isTaken = [this](const String& candidate) {
         return std::any_of(mNames.begin(), mNames.end(),
                            [&](const auto& other) { return sameName(other.second, candidate); });

@@ -19,7 +19,7 @@ public:
     String placeholder(const String& parameter, ColumnType type, Dialect dialect) const;
 
 private:
-    void add(const String& name, String wanted);
+    void add(const String& name, const String& wanted);
 
     std::map<String, String> mNames; ///< by the parameter's
 };

@@ -84,6 +84,7 @@ std::vector<Node> withLists(std::vector<Node> terms) {
 Node simplified(const Node& node, bool negated) {
     const auto each = [&](const std::vector<Node>& terms) {
         std::vector<Node> all;
+        all.reserve(terms.size());
         for (const Node& term : terms) all.push_back(simplified(term, negated));
         return all;
     };

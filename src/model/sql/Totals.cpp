@@ -9,6 +9,7 @@ namespace {
 
 Node allOf(const std::vector<Term>& terms) {
     std::vector<Node> nodes;
+    nodes.reserve(terms.size());
     for (const Term& term : terms) nodes.push_back(term.condition);
     return sql::allOf(std::move(nodes));
 }

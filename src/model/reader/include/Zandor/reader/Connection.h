@@ -11,6 +11,8 @@ namespace zandor::reader {
 class ZANDOR_READER_EXPORT Connection {
 public:
     /// Takes over an open database that nobody else uses.
+    // By value, as what is taken over, though a QSqlDatabase can only be copied.
+    // NOLINTNEXTLINE(performance-unnecessary-value-param,performance-move-const-arg)
     explicit Connection(QSqlDatabase database) : mDatabase(std::move(database)) {}
     /// The other one has no database then.
     Connection(Connection&& other) noexcept { std::swap(mDatabase, other.mDatabase); }
@@ -38,11 +40,12 @@ ZANDOR_READER_EXPORT Result<Connection> openSqlite(const QString& path);
 ///     mysql://user@host:port/database             also mariadb://
 ///     odbc://user@data-source
 ///
-/// each part but the scheme as far as the engine needs it. Behind a "?" an address may have options:
-/// connect_timeout (seconds; 10 unless given); sslrootcert, sslcert and sslkey of PostgreSQL and
-/// MySQL; sslmode and application_name of PostgreSQL; and host, the folder of PostgreSQL's socket or
-/// the socket of MySQL's server, which takes the place of the host. The password is `password`, or
-/// that of the address when it is empty; no message shows it. Needs a QCoreApplication.
+/// each part but the scheme as far as the engine needs it. Behind a "?" an address may have
+/// options: connect_timeout (seconds; 10 unless given); sslrootcert, sslcert and sslkey of
+/// PostgreSQL and MySQL; sslmode and application_name of PostgreSQL; and host, the folder of
+/// PostgreSQL's socket or the socket of MySQL's server, which takes the place of the host. The
+/// password is `password`, or that of the address when it is empty; no message shows it. Needs a
+/// QCoreApplication.
 ///
 /// Behind ODBC an engine that is none of the others can write when a view calls a function that
 /// does; its data source should have a user who may only read.
