@@ -1,4 +1,4 @@
-#include "designer/run/ResultTable.h"
+#include "designer/run/Spool.h"
 #include "designer/run/Worker.h"
 #include "support/PostgresServer.h"
 
@@ -7,7 +7,6 @@
 
 #include <QApplication>
 #include <QEventLoop>
-#include <QFile>
 #include <QProcess>
 #include <QSqlError>
 #include <QSqlQuery>
@@ -20,7 +19,7 @@
 using namespace zandor;
 
 // The designer's ways to the first rows beside the engine's own, turn by turn in one run, so that
-// the ratios hold on a busy machine as well; and the memory that a million rows take.
+// the ratios hold on a busy machine as well.
 
 namespace {
 
@@ -175,53 +174,6 @@ void firstPage(benchmark::State& state, bool onServer) {
     report(state, own, ours);
 }
 
-/// In MB, of this process.
-double memory() {
-    QFile file(QStringLiteral("/proc/self/statm"));
-    if (!file.open(QIODevice::ReadOnly)) qFatal("no /proc");
-    return file.readAll().split(' ').value(1).toDouble() * 4096 / (1 << 20);
-}
-
-/// All rows, scrolled from the first to the last and back, against one page of them.
-void scrolling(benchmark::State& state) {
-    const Million rows(false);
-    const auto show = [&](designer::ResultTable& table, qint64 limit) {
-        const auto spool = std::make_shared<designer::Spool>();
-        const std::atomic<bool> stop = false;
-        const auto outcome = designer::fetch(designer::Database::connectorTo(rows.address, {}),
-                                             rows.command(limit), *spool, stop);
-        if (outcome.rows != limit) qFatal("%s", qPrintable(outcome.message));
-        table.rows().setSpool(spool);
-        table.rows().refresh();
-        table.resize(600, 400);
-        table.show();
-        table.grab();
-    };
-    for (auto _ : state) {
-        designer::ResultTable page;
-        show(page, designer::Spool::rowsInAPage);
-        const double small = memory();
-        designer::ResultTable all;
-        double longest = 0;
-        show(all, rowCount);
-        const auto scrollTo = [&](int row) {
-            longest = std::max(longest, seconds([&] {
-                                   all.scrollTo(all.rows().index(row, 0));
-                                   all.grab();
-                               }));
-        };
-        const double start = seconds([&] {
-            for (int row = 0; row < rowCount; row += 250) scrollTo(row);
-            for (int row = rowCount - 1; row >= 0; row -= 2500) scrollTo(row);
-        });
-        state.SetIterationTime(start);
-        state.counters["page_MB"] = small;
-        state.counters["million_MB"] = memory();
-        state.counters["ratio"] = memory() / small;
-        state.counters["longest_ms"] = longest * 1000;
-    }
-}
-
 } // namespace
 
 BENCHMARK_CAPTURE(programs, sqlite, false)
@@ -240,7 +192,6 @@ BENCHMARK_CAPTURE(firstPage, postgres, true)
     ->Iterations(10)
     ->UseManualTime()
     ->Unit(benchmark::kMillisecond);
-BENCHMARK(scrolling)->Iterations(1)->UseManualTime()->Unit(benchmark::kMillisecond);
 
 int main(int argc, char** argv) {
     qputenv("QT_QPA_PLATFORM", "offscreen");

@@ -47,6 +47,7 @@ void measureBinding(Report& report);
 void measurePressing(Report& report);
 void measureProcesses(Report& report);
 void measureReaders(Report& report);
+void measureRows(Report& report);
 void measureGrowth(Report& report);
 
 } // namespace report

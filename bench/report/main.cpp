@@ -27,7 +27,8 @@ constexpr Part parts[] = {
     {"dragging", report::measureDragging},   {"core", report::measureCore},
     {"scrolling", report::measureScrolling}, {"binding", report::measureBinding},
     {"pressing", report::measurePressing},   {"processes", report::measureProcesses},
-    {"readers", report::measureReaders},     {"growth", report::measureGrowth},
+    {"readers", report::measureReaders},     {"rows", report::measureRows},
+    {"growth", report::measureGrowth},
 };
 
 } // namespace
@@ -41,10 +42,16 @@ int main(int argc, char** argv) {
                                  QStringLiteral("name"), QStringLiteral("report"));
     const QCommandLineOption form(QStringLiteral("form"), QStringLiteral("Shows one window."),
                                   QStringLiteral("form"));
+    const QCommandLineOption rows(QStringLiteral("rows"), QStringLiteral("Shows rows of a file."),
+                                  QStringLiteral("file"));
+    const QCommandLineOption count(QStringLiteral("count"), QStringLiteral("So many of them."),
+                                   QStringLiteral("count"));
     parser.addHelpOption();
-    parser.addOptions({only, out, form});
+    parser.addOptions({only, out, form, rows, count});
     parser.process(application);
     if (parser.isSet(form)) return report::showForm(parser.value(form));
+    if (parser.isSet(rows))
+        return report::showRows(parser.value(rows), parser.value(count).toLongLong());
 
     report::Report measured{
         .platform = QGuiApplication::platformName(), .figures = {}, .growths = {}};

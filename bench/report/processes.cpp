@@ -16,10 +16,6 @@
 
 namespace report {
 
-namespace {
-
-/// The resident memory of this process that is its own and not a library's on the disk, and that of
-/// the libraries with it.
 double resident() {
     QFile file(QStringLiteral("/proc/self/statm"));
     if (!file.open(QIODevice::ReadOnly)) qFatal("there is no /proc/self/statm");
@@ -27,26 +23,19 @@ double resident() {
            static_cast<double>(sysconf(_SC_PAGESIZE)) / 1024;
 }
 
-struct Run {
-    double milliseconds = 0; ///< from its start to its end
-    double kibibytes = 0;
-};
-
-Run run(const QString& form) {
+Run run(const QStringList& arguments) {
+    constexpr int patience = 600'000;
     Run result;
     QProcess process;
     process.setProcessChannelMode(QProcess::ForwardedErrorChannel);
     result.milliseconds = 1e3 * seconds([&] {
-                              process.start(QCoreApplication::applicationFilePath(),
-                                            {QStringLiteral("--form"), form});
-                              if (!process.waitForFinished() || process.exitCode() != 0)
-                                  qFatal("%s did not end well", qPrintable(form));
+                              process.start(QCoreApplication::applicationFilePath(), arguments);
+                              if (!process.waitForFinished(patience) || process.exitCode() != 0)
+                                  qFatal("%s did not end well", qPrintable(arguments.join(u' ')));
                           });
     result.kibibytes = process.readAllStandardOutput().trimmed().toDouble();
     return result;
 }
-
-} // namespace
 
 int showForm(const QString& form) {
     std::unique_ptr<QWidget> empty;
@@ -77,7 +66,7 @@ void measureProcesses(Report& report) {
     std::vector<std::vector<double>> times(3), memory(3);
     for (int round = 0; round < 15; ++round)
         for (std::size_t n = 0; n < 3; ++n) {
-            const Run once = run(forms[static_cast<qsizetype>(n)]);
+            const Run once = run({QStringLiteral("--form"), forms[static_cast<qsizetype>(n)]});
             times[n].push_back(once.milliseconds);
             memory[n].push_back(once.kibibytes);
         }
