@@ -56,7 +56,6 @@ std::string said(const std::vector<Box>& boxes) {
     return text;
 }
 
-std::string alone(std::uint32_t number) { return said(Given(number).arranged()); }
 
 /// Once more, with a table that was not there.
 std::string grown(std::uint32_t number) {
