@@ -56,6 +56,7 @@ std::string said(const std::vector<Box>& boxes) {
     return text;
 }
 
+/// Once more, with a table that was not there.
 std::string grown(std::uint32_t number) {
     Given given(number);
     const auto boxes = given.arranged();
