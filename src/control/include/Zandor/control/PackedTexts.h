@@ -15,25 +15,26 @@ namespace platform = zandor::platform;
 template <std::size_t count>
 class PackedTexts {
 public:
+    PackedTexts() { mAll.reserve(most); }
+
     /// Until the next change.
     platform::StringView operator[](std::size_t n) const {
         const std::size_t from = n == 0 ? 0 : mEnds[n - 1];
         return platform::StringView(mAll).substr(from, mEnds[n] - from);
     }
 
-    /// All stay as they were when there is no memory for it.
+    /// All stay as they were when there is no memory for it, which short ones need none of.
     void set(std::size_t n, platform::StringView value) {
         const std::size_t from = n == 0 ? 0 : mEnds[n - 1];
         const std::size_t before = mEnds[n] - from;
-        platform::String all;
-        all.reserve(mAll.size() - before + value.size());
-        all.append(mAll, 0, from).append(value).append(mAll, mEnds[n]);
-        mAll.swap(all);
+        mAll.replace(from, before, value);
         for (; n < count; ++n)
             mEnds[n] = static_cast<std::uint32_t>(mEnds[n] + value.size() - before);
     }
 
 private:
+    static constexpr std::size_t most = 39; ///< code units of a usual join
+
     platform::String mAll;
     std::array<std::uint32_t, count> mEnds{};
 };
