@@ -13,6 +13,7 @@
 
 #include <Zandor/qt/Text.h>
 
+#include <QCoreApplication>
 #include <QDropEvent>
 #include <QHelpEvent>
 #include <QPainter>
