@@ -54,12 +54,14 @@ GridWidget::GridWidget(int rows, int cols, QWidget* parent)
 }
 
 void GridWidget::makeView() {
-    mView = new TableView(this);
+    // A window that is being destroyed takes no new children.
+    if (mEnding) mViewAtTheEnd = std::make_unique<TableView>();
+    mView = mEnding ? mViewAtTheEnd.get() : new TableView(this);
     mTitles = new FieldTitles(*this, mView);
     mGestures.emplace(*mTitles);
     mGestures->setListener(mListener);
     mCorner = new GridCorner(*mModel, mView);
-    setFocusProxy(mView);
+    if (!mEnding) setFocusProxy(mView);
     mView->setFocusPolicy(Qt::ClickFocus);
     mView->setHorizontalHeader(mTitles);
     mView->setVerticalHeader(new RowTitles(mView));
@@ -116,7 +118,7 @@ void GridWidget::makeView() {
     }
     mHandle->raise();
     arrange();
-    mView->show();
+    if (!mEnding) mView->show();
 }
 
 void GridWidget::makeViewIfNeeded() {

@@ -7,6 +7,7 @@
 #include <QTableView>
 
 #include <functional>
+#include <memory>
 #include <optional>
 
 class QInputMethodEvent;
@@ -70,6 +71,9 @@ public:
     void setWords(const Words& words);
     GridModel& model() const { return *mModel; }
     QTableView& view() const;
+    /// The window around may be in the middle of its own destruction: a view that is asked for from
+    /// now on is none of its widgets.
+    void end() { mEnding = true; }
     /// Stands above the cells while it is shown.
     PaneHandle& handle() const { return *mHandle; }
     void showHandle(bool shown);
@@ -140,6 +144,8 @@ private:
     GridListener* mListener = nullptr;
     GridModel* mModel;
     QTableView* mView = nullptr;
+    std::unique_ptr<QTableView> mViewAtTheEnd;
+    bool mEnding = false;
     FieldTitles* mTitles = nullptr;
     std::optional<FieldGestures> mGestures;
     GridCorner* mCorner = nullptr;

@@ -193,6 +193,8 @@ void ZandorWidget::say(const platform::Words& words) {
 ZandorWidget::~ZandorWidget() {
     // The window around may be in the middle of its own destruction.
     mToolkit->close();
+    for (auto* const part : findChildren<QWidget*>())
+        if (auto* const grid = dynamic_cast<platform::qt::GridWidget*>(part)) grid->end();
     mToolkit->comforts().detach();
     mControl->End();
     mControl = nullptr;

@@ -71,3 +71,15 @@ TEST_F(AGridAtRest, IsThereForWhoeverAsksForAPlace) {
     EXPECT_GT(grid().cellRect(1, 1).left(), 0);
     EXPECT_TRUE(hasView());
 }
+
+TEST_F(AGridAtRest, EndsWithTheWindowAroundAControlThatWasNeverShown) {
+    open();
+    widget->setOnlyJoin(true);
+    widget->setModel(std::shared_ptr<TalvikZandorLib::Zandor>(model));
+    EXPECT_FALSE(hasView());
+    auto window = std::make_unique<QWidget>();
+    const QPointer<QWidget> part = widget.release();
+    part->setParent(window.get());
+    window.reset();
+    EXPECT_FALSE(part);
+}
