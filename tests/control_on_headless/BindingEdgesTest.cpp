@@ -1,4 +1,4 @@
-#include "control/GridStage.h"
+#include "control_on_headless/MeanwhileTest.h"
 
 #include <limits>
 
@@ -7,23 +7,13 @@ namespace gridstage {
 namespace {
 
 /// What a binding and its end leave behind where a host was in the way.
-class BindingAtItsEdges : public GridTest {
+class BindingAtItsEdges : public MeanwhileTest {
 protected:
-    ~BindingAtItsEdges() override { library.calls->onPass = nullptr; }
-
-    void once(const std::string& member, const std::function<void()>& deed) {
-        library.calls->onPass = [this, member, deed](const std::string& call) {
-            if (call != member) return;
-            const auto now = deed; // this goes
-            library.calls->onPass = nullptr;
-            now();
-        };
-    }
     bool isFree(std::int32_t slot) { return Backstage::mTableFreeList(control())->IsFree(slot); }
 };
 
 TEST_F(BindingAtItsEdges, KeepsTheModelThatIsBoundWhileAnEmptyOneIsMade) {
-    once("Library.NewZandor",
+    when("Library.NewZandor",
          [this] { control().P_SET_Zandor(std::shared_ptr<TalvikZandorLib::Zandor>(model)); });
     EXPECT_EQ(control().P_GET_Zandor(), model);
     EXPECT_EQ(control().P_GET_Zandor(), model);
@@ -40,7 +30,7 @@ TEST_F(BindingAtItsEdges, LeavesOutAJoinOfWhichEitherTableWasClosedMeanwhile) {
     for (const std::int16_t slot : {std::int16_t{1}, std::int16_t{2}}) {
         model->joins.items = {};
         model->join(orders, u"CUSTOMER", customers, u"ID");
-        once("ZDJoin.CompareOperator", [&] { Backstage::RemoveTable(control(), slot); });
+        when("ZDJoin.CompareOperator", [&] { Backstage::RemoveTable(control(), slot); });
         control().P_SET_Zandor(std::shared_ptr<TalvikZandorLib::Zandor>(model));
         library.calls->onPass = nullptr;
         EXPECT_EQ(stage->boxes, Boxes{});

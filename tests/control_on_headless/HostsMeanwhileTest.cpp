@@ -1,23 +1,11 @@
-#include "control/GridStage.h"
+#include "control_on_headless/MeanwhileTest.h"
 
 namespace gridstage {
 
 namespace {
 
-/// A host that does something while its model is called.
-class AHostInTheMiddle : public GridTest {
+class AHostInTheMiddle : public MeanwhileTest {
 protected:
-    ~AHostInTheMiddle() override { library.calls->onPass = nullptr; }
-
-    /// At the nth call of a member from now on.
-    void when(const std::string& member, const std::function<void()>& deed, int nth = 1) {
-        library.calls->onPass = [this, member, deed, nth](const std::string& call) mutable {
-            if (call != member || --nth > 0) return;
-            const auto now = deed; // this goes
-            library.calls->onPass = nullptr;
-            now();
-        };
-    }
     void bindAnother() { control().P_SET_Zandor(library.newModel()); }
 };
 

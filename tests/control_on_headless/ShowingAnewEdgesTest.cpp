@@ -1,29 +1,17 @@
-#include "control/GridStage.h"
+#include "control_on_headless/MeanwhileTest.h"
 
 namespace gridstage {
 
 namespace {
 
 /// Showing a model anew whose host has left it unfinished, or changes it meanwhile.
-class ShowingAnewWhatIsUnfinished : public GridTest {
+class ShowingAnewWhatIsUnfinished : public MeanwhileTest {
 protected:
-    ~ShowingAnewWhatIsUnfinished() override { library.calls->onPass = nullptr; }
-
     void showAnew() {
         forget();
         control().ShowAnew();
         library.calls->onPass = nullptr;
         EXPECT_EQ(stage->boxes, Boxes{});
-    }
-
-    /// What the host does at the nth call of a member from now on.
-    void when(const std::string& member, const std::function<void()>& deed, int nth = 1) {
-        library.calls->onPass = [this, member, deed, nth](const std::string& call) mutable {
-            if (call != member || --nth > 0) return;
-            const auto now = deed; // this goes
-            library.calls->onPass = nullptr;
-            now();
-        };
     }
 
     Stage::Seen table(std::int16_t slot) {
@@ -59,22 +47,18 @@ TEST_F(ShowingAnewWhatIsUnfinished, DoesNotLookAtTablesBeyondTheLastSlot) {
 }
 
 TEST_F(ShowingAnewWhatIsUnfinished, LeavesOutAJoinThatLacksAnEnd) {
-    for (const auto end : {&fake::Join::leftColumn, &fake::Join::rightColumn}) {
+    const auto without = [&](auto end) {
         const auto join = model->join(orders, u"CUSTOMER", customers, u"ID");
         bind();
         (*join).*end = nullptr;
         showAnew();
         EXPECT_FALSE(stage->exists("linJoin(1)"));
         model->joins.items = {};
-    }
-    for (const auto end : {&fake::Join::leftTable, &fake::Join::rightTable}) {
-        const auto join = model->join(orders, u"CUSTOMER", customers, u"ID");
-        bind();
-        (*join).*end = nullptr;
-        showAnew();
-        EXPECT_FALSE(stage->exists("linJoin(1)"));
-        model->joins.items = {};
-    }
+    };
+    without(&fake::Join::leftColumn);
+    without(&fake::Join::rightColumn);
+    without(&fake::Join::leftTable);
+    without(&fake::Join::rightTable);
 }
 
 TEST_F(ShowingAnewWhatIsUnfinished, GivesAColumnItsNewNameAndItsNewKey) {

@@ -1,5 +1,6 @@
 #include "frontends/qt/ColumnListModel.h"
 #include "frontends/qt/KeyDesk.h"
+#include "frontends/qt/darkPalette.h"
 
 #include <QAccessible>
 #include <QApplication>
@@ -57,11 +58,7 @@ TEST_F(PaintingOfAListAtRest, IsThatOfAList) {
 }
 
 TEST_F(PaintingOfAListAtRest, HasTheColoursOfThePalette) {
-    QPalette dark;
-    dark.setColor(QPalette::Window, QColor(45, 45, 48));
-    dark.setColor(QPalette::WindowText, Qt::white);
-    dark.setColor(QPalette::Base, QColor(30, 30, 32));
-    dark.setColor(QPalette::Text, Qt::white);
+    QPalette dark = darkPalette();
     dark.setColor(QPalette::Button, QColor(60, 60, 60));
     widget->setPalette(dark);
     EXPECT_EQ(difference(), "");
