@@ -127,7 +127,6 @@ Node ExpressionReader::conditionFrom(Node left) {
     const Token at = mCursor.peek();
     if (at.kind == TokenKind::comparison) {
         mCursor.take();
-        if (mCursor.at(u"Null")) mCursor.fail<MessageCode::equalToNull>();
         Node right = value();
         pair(left, right, at);
         return sql::make(sql::Compare{comparisonOf(at.text), std::move(left), std::move(right)});

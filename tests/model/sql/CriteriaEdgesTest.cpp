@@ -44,3 +44,47 @@ TEST_F(AtTheEdges, WordsWithACommaAreNoNumberWithOne) {
     EXPECT_EQ(condition(u"whole", u"a,b"), condition(u"whole", u"ab"));
     EXPECT_NE(condition(u"whole", u"1,5"), condition(u"whole", u"15,,"));
 }
+
+TEST_F(AtTheEdges, NotIsTakenIntoWhatItStandsBefore) {
+    EXPECT_EQ(where(u"whole", u"Not Not 1"), "t.whole = 1");
+    EXPECT_EQ(where(u"whole", u"Not (1 Or 2)"), "t.whole <> 1\n    AND t.whole <> 2");
+    EXPECT_EQ(where(u"text", u"Not (Not Like 'a')"), "t.text LIKE 'a'");
+    EXPECT_EQ(where(u"whole", u"Not (Not In (1, 2))"), "t.whole IN (1, 2)");
+}
+
+TEST_F(AtTheEdges, OnlyWhatOneColumnMayBeEqualToBecomesAList) {
+    EXPECT_EQ(where(u"whole", u"1 Or 2 Or In (3, 1)"), "t.whole IN (1, 2, 3)");
+    EXPECT_EQ(where(u"whole", u"In (1, 2) Or 1"), "t.whole IN (1, 2)");
+    EXPECT_EQ(where(u"whole", u"< 1 Or 2"), "t.whole < 1\n    OR t.whole = 2");
+    EXPECT_EQ(where(u"whole", u"Not In (1) Or 2"), "t.whole NOT IN (1)\n    OR t.whole = 2");
+    EXPECT_EQ(where(u"whole", u"1 Or [number] = 2"), "t.whole = 1\n    OR t.number = 2");
+    EXPECT_EQ(where(u"anything", u"1 Or 'x'"), "t.anything = 1\n    OR t.anything = 'x'");
+}
+
+TEST_F(AtTheEdges, ANameEndsBeforeABlankOfAnyKind) {
+    EXPECT_EQ(condition(u"whole", u"> [number]\u00A0+\u00A01"), "t.whole > t.number + 1");
+    EXPECT_EQ(condition(u"whole", u"> number_\u2003+ 1").rfind("At character 3", 0), 0U);
+    EXPECT_EQ(condition(u"whole", u"Abs(number\u3000) > 1"), "ABS(t.number) > 1");
+}
+
+TEST_F(AtTheEdges, ANameMayHaveADollarInIt) {
+    query->addTable({u"", u"costs", {{u"cost$", model::ColumnType::Integer}}});
+    EXPECT_EQ(condition(u"whole", u"> Abs(cost$)"), "t.whole > ABS(costs.cost$)");
+    EXPECT_EQ(condition(u"whole", u"> costs.cost$"), "t.whole > costs.cost$");
+}
+
+TEST_F(AtTheEdges, ADotAloneIsNoNameBeforeABracket) {
+    EXPECT_EQ(condition(u"text", u".[whole]"),
+              "At character 2: put And or Or between two conditions, or quotes around a text.");
+}
+
+TEST_F(AtTheEdges, QuotedWordsWithACommaAreNoNumberWithOne) {
+    EXPECT_EQ(condition(u"whole", u"'a,b'"), condition(u"whole", u"'ab'"));
+    EXPECT_NE(condition(u"whole", u"'1,5'"), condition(u"whole", u"'ab'"));
+}
+
+TEST_F(AtTheEdges, OfTwoPatternsWithoutLikeTheFirstIsToldOf) {
+    const auto warning = read(u"text", u"a* Or b*").warning;
+    ASSERT_TRUE(warning);
+    EXPECT_EQ(warning->position, 0U);
+}

@@ -137,10 +137,19 @@ TEST(AName, IsNotCarriedWithACharacterThatIsNone) {
         EXPECT_EQ(refused(u"", dialect), who + " takes no name that is empty: write one.");
         for (const platform::String& torn :
              {platform::String(u"a\xD83D"), platform::String(u"\xDE00z"),
-              platform::String(u"\xD83D\xD83D\xDE00")})
+              platform::String(u"\xD83D\xD83D\xDE00"),
+              platform::String(u"\xD83D"
+                               u"a"),
+              platform::String(u"a\xDBFF"), platform::String(u"\xDFFF")})
             EXPECT_EQ(refused(torn, dialect),
                       who + " takes no name with half a character in it: type it afresh.");
     }
+}
+
+TEST(AName, IsCarriedWithTheFirstAndTheLastOfTheRareCharacters) {
+    for (const auto* name : {u"\U00010000", u"\U000103FF", u"\U0010FC00", u"\U0010FFFF"})
+        for (const Dialect dialect : {Dialect::SQLite, Dialect::PostgreSQL, Dialect::SqlServer})
+            EXPECT_EQ(refused(name, dialect), "");
 }
 
 TEST(AName, IsNotCarriedByMySqlWhenItLiesBeyondTheBasicPlaneOrEndsWithABlank) {
@@ -160,6 +169,13 @@ TEST(AName, IsShortenedInAMessageBetweenTwoCharacters) {
               "The name \"" + std::string(39, 'n') +
                   "…\" is too long for Standard SQL, which takes 128 characters: choose a shorter "
                   "one.");
+}
+
+TEST(AName, OfFortyLettersStandsWholeInAMessage) {
+    const platform::String name = platform::String(39, u'n') + u' ';
+    EXPECT_EQ(refused(name, Dialect::MySQL),
+              "The name \"" + toUtf8(name) +
+                  "\" ends with a blank, which MySQL/MariaDB does not take: write it without.");
 }
 
 TEST(ALiteral, OfTextHasItsApostrophesDoubled) {

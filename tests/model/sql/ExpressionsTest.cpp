@@ -48,11 +48,17 @@ TEST_F(Expressions, HoldTogetherAsTheyWereTyped) {
     EXPECT_EQ(shown("-whole * -(-number)"), "-(t.whole) * (-(-(t.number)))");
     EXPECT_EQ(shown("-5 - -5"), "-5 - -5");
     EXPECT_EQ(shown("1e-3 - 1E+2 - 1e2"), "1e-3 - 1e+2 - 1e2");
+    EXPECT_EQ(shown("1.5 - .5e-3"), "1.5 - 0.5e-3");
+    EXPECT_EQ(shown("- -5"), "5");
     EXPECT_EQ(shown("text & whole + 1 & '!'"), "(t.text || CAST(t.whole + 1 AS TEXT)) || '!'");
     EXPECT_EQ(shown("Not whole = 1 Or number = 2 And truth"),
               "NOT (t.whole = 1) OR (t.number = 2 AND t.truth)");
     EXPECT_EQ(shown("(whole > 1) = truth"), "(t.whole > 1) = t.truth");
     EXPECT_EQ(shown("If(truth, 1, 2) + 1"), "CASE WHEN t.truth THEN 1 ELSE 2 END + 1");
+    EXPECT_EQ(shown("If(text Is Null, 1, 2)"), "CASE WHEN t.text IS NULL THEN 1 ELSE 2 END");
+    EXPECT_EQ(shown("If(text Is Not Null, 1, 2)"),
+              "CASE WHEN t.text IS NOT NULL THEN 1 ELSE 2 END");
+    EXPECT_EQ(shown("upper(text)"), "UPPER(t.text)");
 }
 
 TEST_F(Expressions, NameColumnsInEveryWay) {
@@ -69,6 +75,7 @@ TEST_F(Expressions, NameColumnsInEveryWay) {
 TEST_F(Expressions, KnowTheKindsOfTheirValues) {
     EXPECT_EQ(in(postgres, "on_day > '2024-05-01'"), "t.on_day > DATE '2024-05-01'");
     EXPECT_EQ(in(postgres, "on_day + 1"), "(t.on_day + CAST(1 AS integer))");
+    EXPECT_EQ(in(postgres, "1 + on_day"), in(postgres, "on_day + 1"));
     EXPECT_EQ(in(postgres, "on_day - 1"), "(t.on_day + CAST(-1 AS integer))");
     EXPECT_EQ(in(postgres, "moment + 1"), "(t.moment + CAST(1 AS integer) * INTERVAL '1 day')");
     EXPECT_EQ(in(postgres, "moment > on_day"), "t.moment > CAST(t.on_day AS timestamp)");
@@ -152,6 +159,8 @@ TEST_F(Expressions, SayWhatIsWrongWithThem) {
         {"truth * 2", "At character 7: a number is needed here"},
         {"-text", "At character 1: a number is needed here"},
         {"on_day + 1.5", "At character 8: a whole number is needed here"},
+        {"on_day + 7 / 2", "At character 8: a whole number is needed here"},
+        {"1else", "At character 2: put an operator between two values, such as + or &"},
         {"Berlin", "At character 1: the query has no column Berlin, and a text stands in quotes"},
         {"t.Berlin",
          "At character 1: the query has no column t.Berlin, and a text stands in quotes"},

@@ -192,6 +192,18 @@ TEST_F(AFinding, OnANameThatIsNotCarriedNamesTheTable) {
     EXPECT_EQ(only(Dialect::PostgreSQL).table, table->Key()) << "the source's name is used too";
 }
 
+TEST_F(AFinding, OnANameThatIsNotCarriedIsMadeOfTheTablesOwnNameAndOfItsSources) {
+    const auto renamed = added(u"short");
+    query->renameTable(renamed, String(64, u'n'));
+    EXPECT_EQ(only(Dialect::PostgreSQL).table, renamed->Key());
+    query->DeleteTable(renamed);
+    const auto table =
+        query->addTable({u"sales", String(64, u'n'), {{u"id", model::ColumnType::Integer}}});
+    query->renameTable(table, u"short");
+    EXPECT_EQ(only(Dialect::PostgreSQL).table, table->Key());
+    EXPECT_TRUE(runnable(Dialect::MySQL));
+}
+
 TEST_F(AFinding, OnASchemaThatIsNotCarriedNamesTheTable) {
     const auto table =
         query->addTable({String(64, u's'), u"short", {{u"id", model::ColumnType::Integer}}});
@@ -217,6 +229,43 @@ TEST_F(AFinding, OnANameThatIsNotCarriedNamesTheDefinitionOrTheJoin) {
               "MySQL/MariaDB takes no name with the character zero in it: choose another one.");
     for (const auto& finding : findings) EXPECT_EQ(finding.kind, Finding::Kind::nameNotCarried);
 }
+
+TEST_F(AFinding, OnANameThatIsNotCarriedIsMadeOfEitherEndOfAJoin) {
+    const auto a = added(u"a");
+    const auto b = added(u"b");
+    const auto join = joined(a, b, 0, String(70, u'l'), u"id");
+    EXPECT_EQ(only(Dialect::PostgreSQL).join, join->Key());
+    query->Joins().Remove(join->Key());
+    const auto other = joined(a, b, 0, u"id", String(70, u'l'));
+    EXPECT_EQ(only(Dialect::PostgreSQL).join, other->Key());
+}
+
+TEST_F(AFinding, IsNotMadeOfAJoinThatLostAColumnForItJoinsNothing) {
+    const auto a = added(u"a");
+    const auto b = added(u"b");
+    const auto c = added(u"c");
+    joined(a, b);
+    joined(b, c);
+    for (const bool left : {true, false}) {
+        const auto join = joined(a, b, 1);
+        left ? join->LeftTable(c) : join->RightTable(c);
+        EXPECT_TRUE(model::sql::validate(*query, Dialect::SQLite).empty());
+        EXPECT_TRUE(runnable(Dialect::SQLite));
+        query->Joins().Remove(join->Key());
+    }
+}
+
+TEST_F(AFinding, OnAPatternWithoutLikeIsOnlyAWord) {
+    const auto definition = defined(added(u"a"), u"word");
+    definition->AddCriterium(u"Berl*", u"5");
+    EXPECT_EQ(only().kind, Finding::Kind::patternWithoutLike);
+    EXPECT_EQ(only().definition, definition->Key());
+    EXPECT_EQ(only().row, 5);
+    EXPECT_FALSE(only().isError());
+    EXPECT_TRUE(runnable(Dialect::SQLite));
+}
+
+TEST(AText, ThatIsEmptyIsNotRun) { EXPECT_FALSE(model::sql::Text().runnable()); }
 
 TEST_F(AFinding, OnANameThatOnlyACriterionUsesIsMadeAsWell) {
     const auto a = added(u"a");

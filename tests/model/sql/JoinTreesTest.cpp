@@ -104,6 +104,10 @@ TEST(InnerJoins, CloseACycleInTheOnThatSeesAllOfIt) {
               "a = b on ab = c on ac = d on cd AND bd AND ad");
 }
 
+TEST(InnerJoins, LetATableInWhichAnOuterJoinReachesFirst) {
+    EXPECT_EQ(from({"abc", {"a>b", "b=c", "c=a"}}), "a = c on ca = b on ab AND bc");
+}
+
 TEST(OuterJoins, FollowEachOtherInAChain) {
     EXPECT_EQ(from({"abc", {"a>b", "b>c"}}), "a > b on ab > c on bc");
     EXPECT_EQ(from({"cba", {"b>c", "a>b"}}), "a > b on ab > c on bc");
@@ -162,6 +166,13 @@ TEST(OuterJoins, ThatReadOneWayOnlyAreNotAmbiguous) {
                                           << toUtf8(findings[0].text());
         }
     }
+}
+
+TEST(OuterJoins, ThatFillTheFirstTableLeaveNothingOpenAlone) {
+    model::Findings findings;
+    EXPECT_EQ(from({"abc", {"b>a", "b>c", "c>b"}}, &findings), "a < b on ba > c on bc AND cb");
+    ASSERT_EQ(findings.size(), 1u) << "that b and c contradict each other";
+    EXPECT_EQ(findings[0].join, u"j3");
 }
 
 TEST(OuterJoins, InACircleOfFillingBeginAtTheFirstTable) {

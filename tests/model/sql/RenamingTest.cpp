@@ -193,3 +193,24 @@ TEST_F(CriteriaThatNameTables, AreLeftAloneByAFailedRenaming) {
     EXPECT_EQ(text(definition), "b.id");
     EXPECT_EQ(where(), "a.id = b.id");
 }
+
+TEST_F(CriteriaThatNameTables, StayWithTheOthersWhenOneOfThemIsGone) {
+    const auto c = query->addTable(described(u"c", u"height"));
+    const auto definition = defined(a, u"id", u"b.id Or c.id Or c.height");
+    query->DeleteTable(b);
+    query->renameTable(c, u"d");
+    query->renameTable(c, u"e");
+    EXPECT_EQ(text(definition), "b.id Or e.id Or e.height");
+}
+
+TEST_F(CriteriaThatNameTables, AreReadOverAndOverAsTheSame) {
+    defined(a, u"id", u"> [limit]")->AddCriterium(u"later.name", u"5");
+    const auto words = query->addTable({u"", u"words", {{u"word", model::ColumnType::Text}}});
+    defined(words, u"word", u"later.name");
+    for (const char16_t* const name : {u"c", u"d", u"e"}) {
+        query->renameTable(b, name);
+        for (const auto& each : query->record().definitions)
+            EXPECT_LE(each.criteria.front().names.size(), 1U) << toUtf8(name);
+        EXPECT_FALSE(model::faultOf(query->record()));
+    }
+}

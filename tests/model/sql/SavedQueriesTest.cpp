@@ -174,3 +174,16 @@ TEST_F(SavedQueries, AreReadAgainWhereTheirColumnsAreOthers) {
     query = model::Query::restored(record);
     EXPECT_EQ(findings(), "t1: In some: The query has no tables: add one first. (error)\n");
 }
+
+// Only a damaged file can bring such a query into another one.
+TEST_F(SavedQueries, OfWhichNothingComesOutAreAFinding) {
+    const auto inner = reading(u"orders");
+    query->addQuery(u"late", saved(inner));
+    auto record = query->record();
+    auto empty = inner->record();
+    empty.tables.front().columns.resize(1);
+    record.tables.front().query = model::SavedQueryRef(SavedQuery{u"", empty});
+    query = model::Query::restored(record);
+    EXPECT_NE(findings().find("No column comes out of that query"), std::string::npos)
+        << findings();
+}

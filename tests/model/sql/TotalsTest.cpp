@@ -274,3 +274,57 @@ TEST_F(Totals, AreDifferentInMySqlByASelectAroundThem) {
     add(u"number", Total::Average)->Synonym(u"TEXT");
     EXPECT_EQ(sql(Dialect::MySQL).substr(0, 16), "SELECT DISTINCT\n");
 }
+
+TEST_F(Totals, AGroupAlonePutsRowsTogether) {
+    add(u"text", Total::Group);
+    EXPECT_EQ(sql(), "SELECT\n    t.text\nFROM t\nGROUP BY t.text");
+    add(u"text", Total::Group)->Synonym(u"again");
+    EXPECT_EQ(sql(), "SELECT\n    t.text,\n    t.text AS again\nFROM t\nGROUP BY t.text");
+}
+
+TEST_F(Totals, OfSeveralValuesAreAList) {
+    add(u"whole", Total::Sum)->AddCriterium(u"1 Or 2", u"4");
+    EXPECT_EQ(sql(), "SELECT\n    SUM(t.whole) AS \"sum(t.whole)\"\nFROM t\n"
+                     "HAVING SUM(t.whole) IN (1, 2)");
+}
+
+TEST_F(Totals, OfSeveralRowsAreAskedWithTheirGroupsRowByRow) {
+    add(u"text")->AddCriterium(u"Berlin", u"4");
+    const auto sum = add(u"whole", Total::Sum);
+    sum->AddCriterium(u"> 5", u"4");
+    sum->AddCriterium(u"> 9", u"5");
+    const std::string text = sql();
+    EXPECT_EQ(text.substr(text.find("GROUP BY")),
+              "GROUP BY t.text\nHAVING (t.text = 'Berlin' AND SUM(t.whole) > 5)\n"
+              "    OR SUM(t.whole) > 9");
+}
+
+TEST_F(Totals, ThatAreNoneLeaveConditionsInTheirOrder) {
+    add(u"text", Total::Condition)->AddCriterium(u"Berlin", u"4");
+    add(u"whole")->AddCriterium(u"1", u"4");
+    EXPECT_EQ(sql(), "SELECT\n    t.whole\nFROM t\nWHERE t.text = 'Berlin'\n    AND t.whole = 1");
+}
+
+TEST_F(Totals, AndConditionsStandBesideThatOfATableOnItself) {
+    const auto join = platform::makeRef<model::Join>();
+    join->LeftColumn(table->columnNamed(u"whole"));
+    join->RightColumn(table->columnNamed(u"number"));
+    query->AddJoin(join);
+    add(u"text")->AddCriterium(u"Berlin", u"4");
+    EXPECT_EQ(sql(), "SELECT\n    t.text\nFROM t\nWHERE t.whole = t.number\n"
+                     "    AND t.text = 'Berlin'");
+}
+
+TEST_F(Totals, ASortByAConstantIsNone) {
+    addExpression(u"2")->SortOrder(1);
+    add(u"text");
+    EXPECT_EQ(sql().find("ORDER BY"), std::string::npos) << sql();
+}
+
+TEST_F(Totals, WhatHasNoPrioritySortsBehindWhatHas) {
+    add(u"text")->SortOrder(1);
+    const auto first = add(u"whole");
+    first->SortOrder(2);
+    first->sortPriority(1);
+    EXPECT_EQ(sql(), "SELECT\n    t.text,\n    t.whole\nFROM t\nORDER BY t.whole DESC, t.text");
+}
