@@ -76,6 +76,8 @@ TEST_F(EveryChange, OfADefinitionIsSeen) {
 
 TEST_F(EveryChange, OfCriteriaIsSeen) {
     isSeen("AddCriterium", [&] { definition->AddCriterium(u"7", u"5"); });
+    isSeen("the first of a definition",
+           [&] { query.ColumnDefinitions().Item(2)->AddCriterium(u"7", u"4"); });
     isSeen("Criterium", [&] { definition->Criteria().Item(u"4")->Criterium(u"8"); });
     isSeen("Criterium by row", [&] { definition->Criteria().Item(1)->Criterium(u"8"); });
     isSeen("Remove", [&] { definition->Criteria().Remove(u"4"); });
