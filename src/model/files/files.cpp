@@ -40,7 +40,7 @@ Result<QueryDocument> loadQuery(const Path& path) {
     std::string text;
     // One byte more than a file may have, by which the reader sees that it has too many.
     constexpr std::size_t most = limits::fileSize + 1;
-    constexpr std::size_t piece = 1 << 16;
+    constexpr std::size_t piece = std::size_t{64} * 1024;
     while (text.size() < most) {
         const std::size_t before = text.size();
         text.resize(std::min(most, before + piece));

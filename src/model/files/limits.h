@@ -6,7 +6,7 @@
 /// no file takes long or much memory.
 namespace zandor::files::limits {
 
-inline constexpr std::size_t fileSize = 1 << 26;   ///< bytes
+inline constexpr std::size_t fileSize = std::size_t{64} * 1024 * 1024; ///< bytes
 inline constexpr std::size_t depth = 64;           ///< arrays and objects within each other
 inline constexpr std::size_t values = 2'000'000;   ///< in the whole file
 inline constexpr std::size_t textLength = 100'000; ///< UTF-16 code units of one text

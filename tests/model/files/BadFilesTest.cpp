@@ -40,3 +40,8 @@ TEST(ABadFile, HasItsLineExpected) {
     EXPECT_EQ(files, expected);
     EXPECT_GT(files.size(), 80U);
 }
+
+TEST(ABadFile, IsBrokenInAColumnThatCountsLetters) {
+    EXPECT_EQ(files::fromJson("{\n \"\u00e4\u6f22\U0001f600\": x}").error(),
+              "Line 2, column 9: invalid literal. Mend the file there, or restore it from a copy.");
+}

@@ -146,6 +146,21 @@ TEST(ASavedQuery, IsRefusedWhenItCouldNotBeReadAgain) {
     EXPECT_TRUE(files::toJson(small.query));
 }
 
+TEST(ASavedQuery, IsRefusedWhenItWouldBeReadAsAnotherOne) {
+    SmallQuery small;
+    small.query->AddColumnDefinition(small.newDefinition(small.orders));
+    auto record = small.query->record();
+    record.definitions.front().names = {{0, 0, u"", u""}}; // of an expression that there is none of
+    EXPECT_EQ(files::toJson(model::Query::restored(record)).error(),
+              "The query would not be the same when read again. Report this, please.");
+}
+
+TEST(ASavedQuery, HasItsFirstRowAlone) {
+    SmallQuery small;
+    small.query->options({.first = 1});
+    EXPECT_EQ(documentOf(jsonOf(small.query)).query->options().first, 1);
+}
+
 TEST(ASavedQuery, RemembersItsDatabase) {
     SmallQuery small;
     files::QueryDocument document(small.query);
@@ -164,7 +179,9 @@ TEST(ASavedQuery, KnowsWhatTheNamesInItsCriteriaMeant) {
     small.query->addTable(SmallQuery::described(u"customers"));
     small.query->addTable({u"", u"limits", {{u"limit", model::ColumnType::Integer}}});
 
-    const auto loaded = documentOf(jsonOf(small.query)).query;
+    const std::string text = jsonOf(small.query);
+    EXPECT_EQ(text.find("\"table\": \"\""), std::string::npos) << "what is no name has no table";
+    const auto loaded = documentOf(text).query;
     EXPECT_EQ(loaded->record(), small.query->record());
     loaded->renameTable(loaded->tableNamed(u"customers"), u"buyers");
     loaded->renameTable(loaded->tableNamed(u"limits"), u"bounds");

@@ -1,8 +1,11 @@
 #include "Files.h"
 
 #include "model/SmallQuery.h"
+#include "support/FailingFiles.h"
 
 #include <Zandor/files/SavedQueries.h>
+
+#include <functional>
 
 using namespace zandor;
 
@@ -78,6 +81,65 @@ TEST_F(SavedQueriesInFiles, LeaveTheirOwnDrawingBehind) {
     inner->tableNamed(u"orders")->Left(3000);
     save("inner.json", inner);
     EXPECT_TRUE(files::readSavedAgain(*outer).changed.empty());
+}
+
+TEST_F(SavedQueriesInFiles, AreTheSameHoweverTheyAreDrawn) {
+    const auto inner = reading(u"orders");
+    const auto definition = platform::makeRef<model::ColumnDefinition>();
+    const auto table = inner->tableNamed(u"orders");
+    definition->Column(table->columnNamed(u"id"));
+    inner->AddColumnDefinition(definition);
+    save("inner.json", inner);
+    const auto outer = around(folder / "inner.json");
+    const auto isTheSame = [&](const char* what, const std::function<void()>& change) {
+        const auto before = inner->record();
+        change();
+        EXPECT_NE(inner->record(), before) << what;
+        save("inner.json", inner);
+        EXPECT_TRUE(files::readSavedAgain(*outer).changed.empty()) << what;
+    };
+    isTheSame("moved down", [&] { table->Top(1500); });
+    isTheSame("made wider", [&] { table->Width(4500); });
+    isTheSame("made higher", [&] { table->Height(4500); });
+    isTheSame("selected", [&] { table->Selected(-1); });
+    isTheSame("with a selected column", [&] { table->columnNamed(u"id")->Selected(true); });
+    isTheSame("with a wider output column", [&] { definition->Width(3000); });
+}
+
+TEST_F(SavedQueriesInFiles, HaveNoFileWhereTheyNeverHadOne) {
+    const auto outer = platform::makeRef<model::Query>();
+    outer->addQuery(u"inner", {u"", reading(u"orders")->record()});
+    EXPECT_TRUE(files::readSavedAgain(*outer).kept.empty());
+    save("outer.json", outer);
+    EXPECT_EQ(contentOf(folder / "outer.json").find("\"file\""), std::string::npos);
+    const auto document = files::loadQuery(folder / "outer.json");
+    ASSERT_TRUE(document) << document.error();
+    EXPECT_EQ(document->query->tableNamed(u"inner")->savedQuery()->file, u"");
+}
+
+TEST_F(SavedQueriesInFiles, KeepTheNameOfAFileThatCannotBeFollowed) {
+    save("inner.json", reading(u"orders"));
+    save("outer.json", around(folder / "inner.json"));
+    fs::remove(folder / "inner.json");
+    fs::create_symlink("inner.json", folder / "inner.json"); // to itself
+    const auto document = files::loadQuery(folder / "outer.json");
+    ASSERT_TRUE(document) << document.error();
+    EXPECT_EQ(fs::path(toUtf8(document->query->tableNamed(u"inner")->savedQuery()->file)),
+              fs::canonical(folder / "") / "inner.json");
+}
+
+TEST_F(SavedQueriesInFiles, AreReadOnceHoweverManyReadFromThem) {
+    save("inner.json", reading(u"orders"));
+    const auto outer = around(folder / "inner.json");
+    const auto calls = [&] {
+        const FailingFiles counting(fs::canonical(folder / ""), 0);
+        EXPECT_TRUE(files::readSavedAgain(*outer).kept.empty());
+        return counting.calls();
+    };
+    const std::size_t once = calls();
+    EXPECT_GT(once, 0U);
+    add(outer, u"again", folder / "inner.json");
+    EXPECT_LT(calls(), once + once / 2) << "its name is looked up again, and no more";
 }
 
 TEST_F(SavedQueriesInFiles, AreReadAgainWhereSomethingIsNew) {

@@ -3,7 +3,11 @@
 #include "model/SmallQuery.h"
 #include "support/NoRoom.h"
 
+#include <Zandor/files/Descriptor.h>
+
 #include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 using namespace zandor;
 
@@ -17,6 +21,26 @@ std::string errorOfSaving(const fs::path& path, const files::QueryDocument& docu
 }
 
 class AQuerysFile : public WithoutRoom {};
+
+/// What something says when it is done by a user with no rights but those of everybody.
+std::string withoutRights(const std::function<std::string()>& run) {
+    int ends[2] = {};
+    EXPECT_EQ(::pipe(ends), 0);
+    const pid_t child = ::fork();
+    if (child == 0) {
+        constexpr uid_t nobody = 65534;
+        const bool done = ::geteuid() != 0 || ::setuid(nobody) == 0;
+        const std::string said = done ? run() : "no other user";
+        files::writeAll(ends[1], said);
+        ::_exit(0);
+    }
+    ::close(ends[1]);
+    std::string said(1000, ' ');
+    said.resize(static_cast<std::size_t>(std::max<ssize_t>(::read(ends[0], said.data(), 1000), 0)));
+    ::close(ends[0]);
+    ::waitpid(child, nullptr, 0);
+    return said;
+}
 
 } // namespace
 
@@ -85,6 +109,20 @@ TEST(SavingAQuery, KeepsThePermissionsOfTheFile) {
     ASSERT_EQ(::chmod((folder / "a.json").c_str(), 0640), 0);
     ASSERT_EQ(errorOfSaving(folder / "a.json", small.query), "");
     EXPECT_EQ(fs::status(folder / "a.json").permissions(), fs::perms(0640));
+}
+
+TEST(SavingAQuery, LeavesAFileThatIsProtected) {
+    const TemporaryFolder folder;
+    SmallQuery small;
+    const fs::path path = folder / "a.json";
+    ASSERT_EQ(errorOfSaving(path, small.query), "");
+    const std::string before = contentOf(path);
+    ASSERT_EQ(::chmod((folder / "").c_str(), 0777), 0); // in which anybody may replace one
+    ASSERT_EQ(::chmod(path.c_str(), 0444), 0);
+    small.query->addTable(SmallQuery::described(u"third"));
+    EXPECT_EQ(withoutRights([&] { return errorOfSaving(path, small.query); }),
+              "The file \"" + path.string() + "\" is write-protected; save under another name.");
+    EXPECT_EQ(contentOf(path), before);
 }
 
 TEST(SavingAQuery, ThroughALinkReplacesTheFileAndNotTheLink) {

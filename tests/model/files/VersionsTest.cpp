@@ -57,6 +57,26 @@ TEST(AFileOfVersion1, IsGivenTheLastColumnOfWhicheverTableHasIt) {
     EXPECT_EQ(documentOf(text).query->record().lastKeys.column, 30);
 }
 
+TEST(AFileOfVersion1, KeepsTheLastKeysThatSomebodyWroteIntoIt) {
+    std::string text = contentOf(testFile("version-1.json"));
+    const std::string version = "\"version\": 1,";
+    text.insert(text.find(version) + version.size(),
+                R"("lastKeys": {"table": 9, "column": 90, "join": 8, "definition": 7},)");
+    const auto document = documentOf(text);
+    EXPECT_EQ(document.query->record().lastKeys,
+              (model::LastKeys{.table = 9, .column = 90, .join = 8, .definition = 7}));
+    EXPECT_EQ(documentOf(jsonOf(document)).query->record(), document.query->record());
+}
+
+TEST(ATableInAFile, IsNotSelectedWhereNothingIsSaidOfIt) {
+    std::string text = contentOf(testFile("version-2.json"));
+    const std::string selected = "\"selected\": -1,";
+    ASSERT_NE(text.find(selected), std::string::npos);
+    EXPECT_EQ(documentOf(text).query->record().tables.front().selected, -1);
+    text.erase(text.find(selected), selected.size());
+    EXPECT_EQ(documentOf(text).query->record().tables.front().selected, 0);
+}
+
 TEST(ADefinitionInAFile, IsVisibleWhereNothingIsSaidOfIt) {
     std::string text = contentOf(testFile("version-2.json"));
     const std::string hidden = "\"visible\": false,";

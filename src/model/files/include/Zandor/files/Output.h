@@ -23,7 +23,7 @@ public:
 class ZANDOR_FILES_EXPORT Stream final : public Output {
 public:
     /// Bytes that wait before they are written.
-    static constexpr std::size_t usuallyWaiting = 1 << 16;
+    static constexpr std::size_t usuallyWaiting = std::size_t{64} * 1024;
     static constexpr std::size_t nothingWaits = 0; ///< for a stream that writes at once
 
     /// `failed` is what an error says of a failure, without a full stop: "The output cannot be
