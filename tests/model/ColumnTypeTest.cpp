@@ -33,6 +33,8 @@ TEST(TheColumnType, OfAnUnknownWordFollowsItsParts) {
     EXPECT_EQ(columnType(u"NATIVE CHARACTER(70)"), ColumnType::Text);
     EXPECT_EQ(columnType(u"DOUBLE PRECISION"), ColumnType::Decimal);
     EXPECT_EQ(columnType(u"MEDIUMTEXT"), ColumnType::Text);
+    EXPECT_EQ(columnType(u"clob"), ColumnType::Text);
+    EXPECT_EQ(columnType(u"NCLOB(9)"), ColumnType::Text);
 }
 
 TEST(TheColumnType, IsUnknownForWhatIsNoneOfThese) {
@@ -41,5 +43,6 @@ TEST(TheColumnType, IsUnknownForWhatIsNoneOfThese) {
     EXPECT_EQ(columnType(u"GEOMETRY"), ColumnType::Unknown);
     EXPECT_EQ(columnType(u"INTERVAL"), ColumnType::Unknown);
     EXPECT_EQ(columnType(u"POINT"), ColumnType::Unknown);
+    EXPECT_EQ(columnType(u"bit varying(5)"), ColumnType::Unknown);
     EXPECT_EQ(columnType(u"größe"), ColumnType::Unknown);
 }

@@ -1,5 +1,6 @@
 #include "model/TemporaryDatabase.h"
 
+#include <QElapsedTimer>
 #include <QFile>
 #include <QSqlQuery>
 
@@ -145,8 +146,11 @@ TEST_F(OpeningASqliteFile, SaysWhenAnotherProgramKeepsItLocked) {
     const reader::Connection closes(std::exchange(other, {}));
     QSqlQuery lock(closes.database());
     ASSERT_TRUE(lock.exec(QStringLiteral("BEGIN EXCLUSIVE")));
+    QElapsedTimer waiting;
+    waiting.start();
     EXPECT_EQ(errorFor(path), "The database \"busy.sqlite\" cannot be opened (database is locked): "
                               "another program is writing to it; try again in a moment.");
+    EXPECT_LT(waiting.elapsed(), 20'000) << "nobody waits for that long";
 }
 
 TEST_F(OpeningASqliteFile, LeavesNoConnectionBehindWhenItFails) {

@@ -43,7 +43,8 @@ TEST(TheSqliteReader, OrdersTablesByNameWithoutRegardToTheCaseOfLetters) {
     TemporaryDatabase database(
         {"CREATE TABLE prefix_b (y)", "CREATE TABLE PREFIX_C (y)", "CREATE VIEW prefix AS SELECT 1",
          "CREATE TABLE Prefix_a (y)", "CREATE TABLE prefix_bcdefghijk (y)",
-         "CREATE TABLE prefix_bcdefghij_ (y)", QStringLiteral("CREATE TABLE \"prefix_\uFFFD\" (y)"),
+         "CREATE TABLE prefix_bcdefghij_ (y)", "CREATE TABLE PREFIX_BCDEFGHIJL (y)",
+         QStringLiteral("CREATE TABLE \"prefix_\uFFFD\" (y)"),
          QStringLiteral("CREATE TABLE \"prefix_\U0001F600\" (y)"), "CREATE TABLE \"a\nb\" (y)"});
     const auto tables = database.reader().tables();
     ASSERT_TRUE(tables) << tables.error().toStdString();
@@ -51,7 +52,7 @@ TEST(TheSqliteReader, OrdersTablesByNameWithoutRegardToTheCaseOfLetters) {
     for (const auto& entry : *tables) names.push_back(entry.id.name);
     EXPECT_EQ(names, (std::vector<platform::String>{
                          u"a\nb", u"prefix", u"Prefix_a", u"prefix_b", u"prefix_bcdefghij_",
-                         u"prefix_bcdefghijk", u"PREFIX_C", u"prefix_\uFFFD",
+                         u"prefix_bcdefghijk", u"PREFIX_BCDEFGHIJL", u"PREFIX_C", u"prefix_\uFFFD",
                          u"prefix_\U0001F600"})); // by character, and not by unit
 }
 
@@ -91,6 +92,19 @@ TEST(TheSqliteReader, ReadsGeneratedColumns) {
     const auto table = database.reader().table({u"", u"t"});
     ASSERT_TRUE(table);
     EXPECT_EQ(table->columns.size(), 3U);
+}
+
+TEST(TheSqliteReader, KnowsOfAVirtualTableWhatAUserMaySee) {
+    TemporaryDatabase database(
+        {"CREATE VIRTUAL TABLE notes USING fts5(body)", "CREATE TABLE t (x)"});
+    const auto tables = database.reader().tables();
+    ASSERT_TRUE(tables) << tables.error().toStdString();
+    EXPECT_EQ(*tables, (std::vector<TableEntry>{{{u"", u"notes"}, false}, {{u"", u"t"}, false}}))
+        << "and not what it keeps for itself";
+    const auto notes = database.reader().table({u"", u"notes"});
+    ASSERT_TRUE(notes) << notes.error().toStdString();
+    ASSERT_EQ(notes->columns.size(), 1U) << "and not those that only searches have";
+    EXPECT_EQ(notes->columns.front().name, u"body");
 }
 
 TEST(TheSqliteReader, SaysWhenATableIsNotThere) {

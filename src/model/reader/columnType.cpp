@@ -12,9 +12,8 @@ using model::ColumnType;
 namespace {
 
 // By the first word. INTERVAL and POINT stand here because they have INT in them.
-constexpr std::array<std::pair<std::string_view, ColumnType>, 33> byFirstWord = {{
+constexpr std::array<std::pair<std::string_view, ColumnType>, 32> byFirstWord = {{
     {"BINARY", ColumnType::Blob},
-    {"BIT", ColumnType::Unknown},
     {"BOOL", ColumnType::Boolean},
     {"BOOLEAN", ColumnType::Boolean},
     {"BYTEA", ColumnType::Blob},
