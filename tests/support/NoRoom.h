@@ -36,14 +36,15 @@ private:
     void (*mSignal)(int) = nullptr;
 };
 
-/// A disk of 64 KB, where the system lets a test mount one.
+/// A small disk, where the system lets a test mount one.
 class SmallDisk {
 public:
-    SmallDisk() {
+    explicit SmallDisk(const std::string& size = "64k") {
         std::string name = std::filesystem::temp_directory_path() / "zandor-disk-XXXXXX";
         if (!::mkdtemp(name.data())) throw std::runtime_error("no folder for the test");
         mPath = name;
-        if (::mount("tmpfs", mPath.c_str(), "tmpfs", 0, "size=64k,mode=700") == 0) return;
+        const std::string options = "mode=700,size=" + size;
+        if (::mount("tmpfs", mPath.c_str(), "tmpfs", 0, options.c_str()) == 0) return;
         mComplaint = std::strerror(errno);
     }
     SmallDisk(const SmallDisk&) = delete;

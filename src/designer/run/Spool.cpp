@@ -19,9 +19,8 @@ namespace zandor::designer {
 
 namespace {
 
-constexpr qsizetype mostPending = 1 << 18;
-constexpr qint64 bytesBetweenLooks = 1 << 26;
-constexpr qint64 roomLeftToOthers = 1 << 28;
+constexpr qsizetype mostPending = qsizetype{256} * 1024;
+constexpr qint64 roomLeftToOthers = qint64{256} * 1024 * 1024;
 
 void append(QByteArray& bytes, const Cell& cell) {
     bytes += static_cast<char>(cell.kind);
@@ -79,7 +78,7 @@ public:
 
 private:
     bool fetch() {
-        constexpr qsizetype piece = 1 << 16;
+        constexpr qsizetype piece = qsizetype{64} * 1024;
         mPiece.resize(piece);
         mPlace = 0;
         ssize_t count = 0;

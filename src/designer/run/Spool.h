@@ -37,6 +37,9 @@ public:
     std::vector<Row> page(qint64 number, qint64 mostBytes);
 
 private:
+    static constexpr qint64 bytesBetweenLooks =
+        qint64{64} * 1024 * 1024; ///< at the room on the disk
+
     std::optional<QString> flush();
     std::optional<QString> written() const;
 
@@ -45,7 +48,7 @@ private:
     files::Descriptor mFile; ///< that has no name: it is gone with the process, however that ends
     QByteArray mPending;     ///< not in the file yet
     qint64 mEnd = 0;         ///< of the file and what is pending
-    qint64 mNextLook = 1 << 26; ///< at the room on the disk: when so much is written
+    qint64 mNextLook = bytesBetweenLooks; ///< when so much is written
     qint64 mRows = 0;
     qint64 mReadable = 0;       ///< those in the file
     std::vector<qint64> mPages; ///< where they begin

@@ -29,6 +29,18 @@ void fill(Spool& spool, int rows) {
     for (int n = 0; n < rows; ++n) ASSERT_FALSE(spool.add(numbered(n)));
 }
 
+/// While it lives, spools have their files in a folder.
+class SpoolsIn {
+public:
+    explicit SpoolsIn(const QString& folder) { qputenv("TMPDIR", folder.toLocal8Bit()); }
+    SpoolsIn(const SpoolsIn&) = delete;
+    SpoolsIn& operator=(const SpoolsIn&) = delete;
+    ~SpoolsIn() { mBefore.isNull() ? qunsetenv("TMPDIR") : qputenv("TMPDIR", mBefore); }
+
+private:
+    const QByteArray mBefore = qgetenv("TMPDIR");
+};
+
 } // namespace
 
 TEST(TheSpool, GivesBackRowsPageByPage) {
@@ -91,18 +103,36 @@ TEST(TheSpool, CanBeReadWhileRowsAreComing) {
 
 TEST(TheSpool, HasAFileOfNoNameThatIsGoneWithTheProcessHoweverThatEnds) {
     const QTemporaryDir folder;
-    const QByteArray before = qgetenv("TMPDIR");
-    qputenv("TMPDIR", folder.path().toLocal8Bit());
-    {
-        Spool spool;
-        fill(spool, 100'000);
-        EXPECT_EQ(spool.rows(), 100'000);
-        EXPECT_EQ(
-            QDir(folder.path()).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
-            QStringList());
-        EXPECT_EQ(spool.page(300, all)[7], numbered(300 * 256 + 7));
+    const SpoolsIn there(folder.path());
+    Spool spool;
+    fill(spool, 100'000);
+    EXPECT_EQ(spool.rows(), 100'000);
+    EXPECT_EQ(QDir(folder.path()).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot),
+              QStringList());
+    EXPECT_EQ(spool.page(300, all)[7], numbered(300 * 256 + 7));
+}
+
+TEST(TheSpool, LeavesSomeRoomOnItsDiskToOthers) {
+    const SmallDisk disk("300m");
+    if (!disk.complaint().empty()) GTEST_SKIP() << "no disk can be mounted: " << disk.complaint();
+    const QString folder = QString::fromStdString(disk.path());
+    const SpoolsIn there(folder);
+    const QString megabyte(1024 * 1024, u'x');
+    Spool spool;
+    ASSERT_FALSE(spool.begin({"text"}));
+    int rows = 0;
+    std::optional<QString> failure;
+    while (!failure && rows < 100) {
+        failure = spool.add({{Kind::text, megabyte}});
+        ++rows;
     }
-    before.isNull() ? qunsetenv("TMPDIR") : qputenv("TMPDIR", before);
+    EXPECT_EQ(failure.value_or("").toStdString(),
+              ("The rows would fill the disk with the folder \"" + folder +
+               "\": make room there, or ask for fewer rows.")
+                  .toStdString());
+    EXPECT_EQ(rows, 64) << "so many megabytes may come between two looks";
+    EXPECT_EQ(spool.rows(), rows - 1);
+    EXPECT_EQ(spool.finish(), failure);
 }
 
 TEST(TheSpool, SaysWhyItHasNoRoom) {
