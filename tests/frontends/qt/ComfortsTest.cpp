@@ -162,6 +162,11 @@ TEST_F(Comforts, LeadToTheFieldsByTheUpKeyAndFromThereToTheList) {
     EXPECT_EQ(grid().currentRow(), 0);
     press(Qt::Key_Right);
     EXPECT_EQ(grid().currentCol(), 4);
+    press(Qt::Key_End);
+    EXPECT_EQ(grid().currentCol(), grid().model().cols() - 1);
+    press(Qt::Key_Home);
+    EXPECT_EQ(grid().currentCol(), 1);
+    repeat(Qt::Key_Right, 3);
     press(Qt::Key_F2);
     ASSERT_TRUE(fields().isVisible());
     EXPECT_TRUE(fields().box().hasFocus());

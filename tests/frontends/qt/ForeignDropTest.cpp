@@ -81,6 +81,10 @@ protected:
             // And to the part itself, past the window's own judgement.
             for (QWidget* w = part; w && w != widget.get(); w = w->parentWidget())
                 if (w->acceptDrops()) {
+                    QDragEnterEvent entering(w->mapFrom(widget.get(), place), actions, &data,
+                                             Qt::LeftButton, Qt::NoModifier);
+                    QCoreApplication::sendEvent(w, &entering);
+                    EXPECT_FALSE(entering.isAccepted()) << w->objectName().toStdString();
                     QDropEvent straight(w->mapFrom(widget.get(), place), actions, &data,
                                         Qt::NoButton, Qt::NoModifier);
                     QCoreApplication::sendEvent(w, &straight);

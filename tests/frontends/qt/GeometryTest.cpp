@@ -38,6 +38,7 @@ TEST(Pixels, AreFifteenTwipsEachAndKeepNeighboursTogetherAtEveryFraction) {
     const QRect left = toPixels(Bounds{7.4F, 0, 1000.3F, 15});
     const QRect right = toPixels(Bounds{7.4F + 1000.3F, 0, 333.3F, 15});
     EXPECT_EQ(left.right() + 1, right.left());
+    EXPECT_EQ(toPixels(Bounds{7, 0, 7, 15}), QRect(0, 0, 1, 1)) << "the next one begins at 14";
 }
 
 TEST(Pixels, StayInReachForValuesThatNoScreenHas) {
@@ -89,6 +90,26 @@ TEST_F(Geometry, IsNotReportedForAClickOnATitle) {
     QObject::connect(widget.get(), &ZandorWidget::TableMoved, [&moved] { ++moved; });
     hands::click(table(2), QRectF(table(2).titleBar()).center());
     EXPECT_EQ(moved, 0);
+}
+
+TEST_F(Geometry, IsNotReportedForATitleThatIsHeldStill) {
+    show();
+    bind();
+    int moved = 0;
+    QObject::connect(widget.get(), &ZandorWidget::TableMoved, [&moved] { ++moved; });
+    drag(table(2), QRectF(table(2).titleBar()).center(), {0, 0});
+    EXPECT_EQ(moved, 0);
+}
+
+TEST_F(Geometry, StaysWhenTheButtonCameUpOverAnotherWindow) {
+    show();
+    bind();
+    auto& box = table(2);
+    const QRect before = box.geometry();
+    const QPointF grip = QRectF(box.titleBar()).center();
+    hands::mouse(box, QEvent::MouseButtonPress, grip, Qt::LeftButton, Qt::LeftButton);
+    hands::mouse(box, QEvent::MouseMove, grip + QPointF(50, 20), Qt::NoButton);
+    EXPECT_EQ(box.geometry(), before);
 }
 
 TEST_F(Geometry, OfATableShrinksNoFurtherThanItsNameAndOneEntry) {

@@ -35,8 +35,8 @@ public:
 
 class Hands : public Desk {
 protected:
-    void wheel(QWidget& over, QPointF at, QPoint turn) {
-        QWheelEvent event(at, over.mapToGlobal(at), QPoint(), turn, Qt::NoButton, Qt::NoModifier,
+    void wheel(QWidget& over, QPointF at, QPoint turn, Qt::KeyboardModifiers held = {}) {
+        QWheelEvent event(at, over.mapToGlobal(at), QPoint(), turn, Qt::NoButton, held,
                           Qt::NoScrollPhase, false);
         QSpontaneKeyEvent::setSpontaneous(&event);
         qApp->notify(&over, &event);
@@ -76,6 +76,23 @@ TEST_F(Hands, ThatTurnTheWheelScrollTheCanvasBelowThem) {
     EXPECT_EQ(child<QWidget>("fraTable").y(), -bar.value() / 15);
     wheel(child<QWidget>("fraTable"), {600, 200}, {-120, 0});
     EXPECT_GT(child<QScrollBar>("hsbTable").value(), 0);
+}
+
+TEST_F(Hands, ThatTurnTheWheelAndHoldShiftScrollAcross) {
+    show();
+    bind();
+    wheel(child<QWidget>("fraTable"), {600, 200}, {0, -120}, Qt::ShiftModifier);
+    EXPECT_GT(child<QScrollBar>("hsbTable").value(), 0);
+    EXPECT_EQ(child<QScrollBar>("vsbTable").value(), 0);
+}
+
+TEST_F(Hands, ThatTurnTheWheelScrollNothingWhereTheBarsAreOff) {
+    show();
+    bind();
+    auto& bar = child<QScrollBar>("vsbTable");
+    bar.setEnabled(false);
+    wheel(child<QWidget>("fraTable"), {600, 200}, {0, -120});
+    EXPECT_EQ(bar.value(), 0);
 }
 
 TEST_F(Hands, ThatTurnTheWheelOverAListScrollTheListOnly) {
@@ -195,6 +212,21 @@ TEST_F(Hands, ThatDropOnAnEntryJoinItWithTheDraggedColumn) {
     EXPECT_EQ(model->joinAt(before + 1).leftColumn->Name(), u"FREIGHT");
     EXPECT_EQ(model->joinAt(before + 1).rightColumn->Name(),
               u"AMOUNT_OF_MONEY_INCLUDING_EVERY_TAX_THERE_IS");
+}
+
+TEST_F(Hands, ThatDropSeveralEntriesDropThemAsTheyStand) {
+    show();
+    bind();
+    auto& list = table(1).list();
+    for (const int row : {4, 2}) // from below
+        list.selectionModel()->select(list.model()->index(row, 0), QItemSelectionModel::Select);
+    widget->toolkit().drags().setCarrier(
+        [&](QDrag& drag) { hands::carry(drag, grid(), grid().cellRect(1, 5).center()); });
+    drag(1, 4);
+    settle();
+    ASSERT_EQ(model->definitionCount(), 5);
+    EXPECT_EQ(model->definitionAt(4).column->Name(), u"CUSTOMER_ID");
+    EXPECT_EQ(model->definitionAt(5).column->Name(), u"ORDERED_ON");
 }
 
 TEST_F(Hands, ThatOpenTheMenuAreToldOfToTheHostsFilter) {

@@ -141,6 +141,53 @@ TEST_F(AJoinToRead, OpensItsDefinitionByADoubleClick) {
     }
 }
 
+TEST_F(AJoinToRead, OpensNothingByADoubleClickOfAnotherButton) {
+    join(0, 0);
+    bool opened = false;
+    hands::click(canvas(), middle());
+    hands::mouse(canvas(), QEvent::MouseButtonDblClick, middle(), Qt::RightButton, Qt::RightButton);
+    QTimer::singleShot(0, [&] { // behind what the press has asked for
+        auto* open = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+        opened = open != nullptr;
+        if (open) open->reject();
+    });
+    settle();
+    EXPECT_FALSE(opened);
+}
+
+TEST_F(AJoinToRead, HasATooltipOfItsOwnBesideAnotherOne) {
+    join(0, 0);
+    model->join(orders, u"*", lines, u"ORDER_ID")->compareOperator = 2;
+    widget->showAnew();
+    settle();
+    const auto both = canvas().lines();
+    ASSERT_EQ(both.size(), 2U);
+    for (const auto* each : both) {
+        const QPointF near = each->at(0.85);
+        ASSERT_LT(both[0]->distanceTo(near) + both[1]->distanceTo(near), 90) << "they converge";
+        EXPECT_EQ(toolTip((near / 15).toPoint()), platform::toUtf8(each->notes().Sentence));
+    }
+}
+
+TEST_F(AJoinToRead, HasNoTooltipBeyondItsEnds) {
+    join(0, 0);
+    EXPECT_EQ(toolTip((line().at(1.2) / 15).toPoint()), "");
+    EXPECT_EQ(toolTip((line().at(-0.2) / 15).toPoint()), "");
+}
+
+TEST_F(AJoinToRead, HasItsWordsAtTheirEnds) {
+    // The line runs down to the right; a word stands out above its beginning, or below its end.
+    const auto isPainted = [&](double share, int below) {
+        return line().extent().contains((line().at(share) / 15).toPoint() + QPoint(0, below));
+    };
+    join(1, 0);
+    EXPECT_TRUE(isPainted(0.06, -5));
+    EXPECT_FALSE(isPainted(0.94, 5));
+    join(2, 0);
+    EXPECT_FALSE(isPainted(0.06, -5));
+    EXPECT_TRUE(isPainted(0.94, 5));
+}
+
 TEST_F(AJoinToRead, TakesItsNotesAwayWithTheComfort) {
     join(3, 2);
     ASSERT_NE(line().notes(), platform::LineNotes());

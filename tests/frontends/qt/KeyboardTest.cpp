@@ -348,3 +348,32 @@ TEST_F(Keyboard, ComesBeforeTheShortcutsOfTheHostWhereItActs) {
     EXPECT_EQ(customers->left, 5250);
     EXPECT_EQ(stolen, 0);
 }
+
+TEST_F(Keyboard, LeavesDeleteToTheHostWhereThereIsNothingToDelete) {
+    struct : QObject {
+        bool eventFilter(QObject*, QEvent* event) override {
+            keys += event->type() == QEvent::KeyPress;
+            return false;
+        }
+        int keys = 0;
+    } filter;
+    host.installEventFilter(&filter);
+    canvas().focusOn(nullptr, Qt::TabFocusReason);
+    press(Qt::Key_Delete);
+    EXPECT_EQ(filter.keys, 1);
+    EXPECT_EQ(menus.opened, 0);
+}
+
+TEST_F(Keyboard, DeletesNoColumnWhileControlIsHeld) {
+    tabTo("sprColumn");
+    currentCell(4, 2);
+    press(Qt::Key_Delete, Qt::ControlModifier);
+    EXPECT_EQ(model->definitionCount(), 3);
+}
+
+TEST_F(Keyboard, KeepsATableInViewThatItMoves) {
+    tabTo("lstTable(2)");
+    for (int i = 0; i < 50; ++i) press(Qt::Key_Right, Qt::AltModifier);
+    EXPECT_GT(table(2).x(), 800);
+    EXPECT_TRUE(widget->toolkit().view().seen().contains(table(2).geometry()));
+}

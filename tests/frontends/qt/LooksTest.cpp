@@ -281,6 +281,7 @@ TEST_F(Looks, ShowTheLineWithTheFocus) {
     auto& canvas = child<platform::qt::Canvas>("fraTable");
     auto* line = canvas.lines().front();
     const QPoint mark = (line->at(0) / 15).toPoint() - QPoint(5, 0);
+    const QPoint other = (line->at(1) / 15).toPoint() + QPoint(5, 0);
     const auto colour = [&](QPoint at) {
         const QImage image = canvas.grab().toImage();
         return image.pixelColor((QPointF(at) * image.devicePixelRatio()).toPoint());
@@ -290,7 +291,29 @@ TEST_F(Looks, ShowTheLineWithTheFocus) {
     canvas.focusOn(line, Qt::TabFocusReason);
     settle();
     EXPECT_EQ(colour(mark), highlight) << "the mark at its end is filled";
+    EXPECT_EQ(colour(other), highlight) << "and that at the other";
     table(1).list().setFocus();
     settle();
     EXPECT_NE(colour(mark), highlight);
+}
+
+TEST_F(Looks, OfAnOuterJoinHaveACircleAtTheTableThatKeepsItsRows) {
+    show();
+    bind();
+    auto& canvas = child<platform::qt::Canvas>("fraTable");
+    const QImage image = canvas.grab().toImage();
+    const auto colour = [&](double x, double y) {
+        return image.pixelColor((QPointF(x, y) / 15 * image.devicePixelRatio()).toPoint());
+    };
+    int circles = 0, squares = 0;
+    for (const auto* item : canvas.items()) {
+        const auto* mark = dynamic_cast<const platform::qt::CanvasShape*>(item);
+        if (!mark || !mark->visible()) continue;
+        const auto [left, top, width, height] = mark->bounds();
+        const bool hasCorner = colour(left, top) == colour(left + width / 2, top);
+        ++(hasCorner ? squares : circles);
+        EXPECT_NE(hasCorner, mark->shapeStyle() == platform::shapeCircle);
+    }
+    EXPECT_EQ(circles, 1);
+    EXPECT_EQ(squares, 3);
 }

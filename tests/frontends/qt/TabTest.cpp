@@ -77,9 +77,55 @@ TEST_F(TabKey, BringsTheTableToTheFrontAndIntoView) {
     EXPECT_TRUE(widget->toolkit().view().seen().contains(table(3).geometry()));
 }
 
+TEST_F(TabKey, PassesATableByThatNobodySees) {
+    table(2).hide();
+    before.setFocus();
+    repeat(Qt::Key_Tab, 2);
+    EXPECT_EQ(focus(), "lstTable(3)");
+}
+
+TEST_F(TabKey, BringsALineIntoView) {
+    host.resize(500, 700);
+    settle();
+    tabTo("linJoin(1)");
+    const auto isSeen = [this] {
+        const QRect place = canvas().currentLine()->extent().boundingRect();
+        return widget->toolkit().view().seen().contains(place);
+    };
+    EXPECT_TRUE(isSeen());
+    auto& across = child<QScrollBar>("hsbTable");
+    across.setValue(across.maximum());
+    ASSERT_FALSE(isSeen());
+    tab();
+    EXPECT_EQ(focus(), "linJoin(2)");
+    EXPECT_TRUE(isSeen());
+}
+
+TEST_F(TabKey, PassesByWhatIsSwitchedOff) {
+    child<QWidget>("cmdHome").setEnabled(false);
+    tabTo("sprColumn");
+    tab();
+    EXPECT_EQ(focus(), "after");
+}
+
+TEST_F(TabKey, LeavesToNoFieldOfTheHostThatTakesNoTab) {
+    after.setFocusPolicy(Qt::ClickFocus);
+    tabTo("cmdHome");
+    tab();
+    EXPECT_EQ(focus(), "before");
+}
+
+TEST_F(TabKey, F6LeadsToTheCurrentTableFromAGridThatWasClicked) {
+    tabTo("lstTable(2)");
+    grid().view().setFocus(Qt::MouseFocusReason);
+    press(Qt::Key_F6);
+    EXPECT_EQ(focus(), "lstTable(2)");
+}
+
 TEST_F(TabKey, MakesTheTableTheCurrentOne) {
     before.setFocus();
     repeat(Qt::Key_Tab, 2);
+    EXPECT_FALSE(table(1).isCurrent());
     EXPECT_NE(customers->selected, 0);
     EXPECT_EQ(orders->selected, 0);
     EXPECT_TRUE(table(2).isCurrent());
