@@ -20,14 +20,16 @@ using platform::qt::asToolTip;
 namespace {
 
 constexpr qint64 mostBytesOfACell = 4000; // more than anybody reads in a table
-constexpr qsizetype pageMemory = 16 << 20;
+constexpr qsizetype memoryInOrder = 1 << 20;
+constexpr qsizetype memorySorted = 16 << 20; // each row on the screen is of another page
 constexpr qint64 mostCellsCopied = 500'000;
 constexpr qsizetype mostShown = 300; // characters of a cell; what is wider is cut off anyway
 
 qsizetype memoryOf(const std::vector<Row>& page) {
+    constexpr qsizetype header = 32; // of a text, and what an allocation rounds up to
     qsizetype bytes = 0;
     for (const Row& row : page)
-        for (const Cell& cell : row) bytes += sizeof(Cell) + 2 * cell.text.size();
+        for (const Cell& cell : row) bytes += sizeof(Cell) + header + 2 * cell.text.size();
     return bytes;
 }
 
@@ -52,7 +54,7 @@ void ResultModel::setSpool(const std::shared_ptr<Spool>& spool) {
     mOrder.clear();
     mRows = 0;
     mPages.clear();
-    mPages.setMaxCost(pageMemory);
+    mPages.setMaxCost(memoryInOrder);
     endResetModel();
 }
 
@@ -80,6 +82,7 @@ bool ResultModel::setFormats(const ColumnFormats& formats) {
 
 void ResultModel::setOrder(RowOrder order) {
     mOrder = std::move(order);
+    mPages.setMaxCost(mOrder.empty() ? memoryInOrder : memorySorted);
     if (mRows > 0) emit dataChanged(index(0, 0), index(mRows - 1, columnCount() - 1));
 }
 
@@ -133,7 +136,9 @@ Cell ResultModel::cell(const QModelIndex& index) const {
     if (!page) {
         auto read = std::make_unique<std::vector<Row>>(mSpool->page(number, mostBytesOfACell));
         page = read.get();
-        const qsizetype cost = std::min(memoryOf(*page), pageMemory);
+        const qsizetype cost = memoryOf(*page);
+        // Where one ends, rows of two are on the screen.
+        mPages.setMaxCost(std::max(mPages.maxCost(), 2 * cost));
         mPages.insert(number, read.release(), cost);
     }
     const auto row = static_cast<std::size_t>(place % Spool::rowsInAPage);

@@ -103,7 +103,7 @@ ZandorWidget::ZandorWidget(QWidget* parent)
     setAutoFillBackground(true);
     setBackgroundRole(QPalette::Window);
     setFocusPolicy(Qt::TabFocus);
-    resize(sizeHint());
+    resize(ZandorWidget::sizeHint());
     mToolkit->drags().setKeeper(mHouse);
     mHouse->control.emplace(*mToolkit, mHouse->library, mHouse->events, mHouse);
     mControl = &*mHouse->control;
