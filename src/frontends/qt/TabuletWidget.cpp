@@ -329,9 +329,10 @@ bool TabuletWidget::handOn(QEvent& event) {
         if (mHandedTo && mHandedTo != mClose && at.button() != Qt::NoButton)
             mList->setFocus(Qt::MouseFocusReason);
     }
-    QWidget* const part = mHandedTo;
+    // What the part does not take comes back here, and is the box's own then.
+    const QPointer<QWidget> part = std::exchange(mHandedTo, nullptr);
     if (!part) return false;
-    if (at.buttons() == Qt::NoButton) mHandedTo = nullptr;
+    const QPointer<TabuletWidget> alive = this;
     const QPointF inside = part->mapFrom(this, at.position());
     if (event.type() == QEvent::Wheel) {
         const auto& turn = static_cast<const QWheelEvent&>(event);
@@ -344,6 +345,7 @@ bool TabuletWidget::handOn(QEvent& event) {
                         at.buttons(), at.modifiers(), at.pointingDevice());
         QCoreApplication::sendEvent(part, &own);
     }
+    if (alive && at.buttons() != Qt::NoButton) mHandedTo = part;
     event.accept();
     return true;
 }

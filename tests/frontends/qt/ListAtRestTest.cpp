@@ -196,6 +196,19 @@ TEST_F(AListAtRest, LetsTheCrossBePressed) {
     EXPECT_FALSE(alive);
 }
 
+TEST_F(AListAtRest, LeavesToItsTableWhatTheCrossDoesNotTake) {
+    TabuletWidget& box = table(2);
+    const int side = box.titleBar().height();
+    const QPointF cross(box.width() - side / 2.0, side / 2.0);
+    hands::mouse(box, QEvent::MouseButtonPress, cross, Qt::RightButton, Qt::RightButton);
+    hands::mouse(box, QEvent::MouseMove, cross + QPointF(30, 0), Qt::NoButton, Qt::RightButton);
+    hands::mouse(box, QEvent::MouseButtonRelease, cross, Qt::RightButton);
+    settle();
+    EXPECT_EQ(box.pos(), QPoint(340, 30));
+    hands::click(box, QRectF(box.titleBar()).center());
+    EXPECT_TRUE(box.isCurrent());
+}
+
 TEST_F(AListAtRest, TakesTheFocusThatItsTableIsGiven) {
     table(2).setFocus(Qt::OtherFocusReason);
     EXPECT_TRUE(table(2).list().hasFocus());
