@@ -399,8 +399,7 @@ void DesignerWindow::connectParts() {
 std::optional<QString> DesignerWindow::openAtFirst(const Arguments& arguments,
                                                    const QString& sample) {
     if (arguments.file.endsWith(QLatin1String(".json"), Qt::CaseInsensitive)) {
-        const auto error = mFile.open(arguments.file);
-        if (error) return error;
+        if (auto error = mFile.open(arguments.file)) return error;
         mDatabases->followFile();
         mSavedQueries->followFiles();
         return {};

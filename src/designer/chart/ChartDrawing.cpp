@@ -125,7 +125,7 @@ void ChartDrawing::placeLabels() {
         const double wide = metrics.horizontalAdvance(QStringLiteral("00.00.00000"));
         for (const TimeMark& mark : timeMarks(mData.moments.front(), mData.moments.back(),
                                               static_cast<int>(mPlot.width() / wide))) {
-            const double span =
+            const auto span =
                 static_cast<double>(mData.moments.front().msecsTo(mData.moments.back()));
             const double share =
                 span > 0 ? static_cast<double>(mData.moments.front().msecsTo(mark.at)) / span : 0.5;
@@ -319,7 +319,7 @@ void ChartDrawing::paintLines(QPainter& painter) const {
             const QPointF at(across(point), height(*value));
             isBroken ? path.moveTo(at) : path.lineTo(at);
             const bool isLast =
-                point + 1 == mData.points() || !values[static_cast<std::size_t>(point + 1)];
+                point + 1 == mData.points() || !values[static_cast<std::size_t>(point) + 1];
             const bool isAlone = isBroken && isLast;
             isBroken = false;
             // A line that goes on is told by a shape now and then, each by its own.

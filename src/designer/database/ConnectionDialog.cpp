@@ -116,7 +116,7 @@ void ConnectionDialog::lay() {
 
     auto* const buttons = new QDialogButtonBox(QDialogButtonBox::Open | QDialogButtonBox::Cancel);
     mOpen = buttons->button(QDialogButtonBox::Open);
-    connect(buttons, &QDialogButtonBox::accepted, this, &ConnectionDialog::open);
+    connect(buttons, &QDialogButtonBox::accepted, this, &ConnectionDialog::connectToIt);
     connect(buttons, &QDialogButtonBox::rejected, this, &QDialog::reject);
 
     auto* const layout = new QVBoxLayout(this);
@@ -209,7 +209,7 @@ void ConnectionDialog::browse() {
     if (!file.isEmpty()) mFile->setText(file);
 }
 
-void ConnectionDialog::open() {
+void ConnectionDialog::connectToIt() {
     mError->say({});
     const QString password = engine() == Engine::SQLite ? QString() : mPassword->text();
     const Opening opening = openPatiently(mDatabase, address(), password, this);

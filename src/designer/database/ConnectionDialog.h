@@ -38,7 +38,7 @@ private:
     void takeAddress();
     void takeFields();
     void browse();
-    void open();
+    void connectToIt();
 
     Database& mDatabase;
     QString mOptions; ///< of the address, for which there are no fields

@@ -20,7 +20,6 @@ public:
 
     QSize minimumSizeHint() const override { return {200, 120}; }
 
-public slots:
     /// Listens to a control from now on, as long as it is there.
     void watch(ZandorWidget* control);
     void clear();

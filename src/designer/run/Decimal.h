@@ -24,7 +24,7 @@ struct Decimal {
     Decimal rounded(int decimals) const;
 
     friend std::strong_ordering operator<=>(const Decimal& a, const Decimal& b);
-    friend bool operator==(const Decimal& a, const Decimal& b) { return (a <=> b) == 0; }
+    friend bool operator==(const Decimal& a, const Decimal& b) { return std::is_eq(a <=> b); }
 };
 
 /// Adds decimals without losing a digit, up to some thousand millions of them.

@@ -57,7 +57,7 @@ DrawingPicture ShowCommands::picture() const {
 }
 
 QString ShowCommands::proposedName() const {
-    if (const QString beside = mFile.besideWith(QStringLiteral("png")); !beside.isEmpty())
+    if (QString beside = mFile.besideWith(QStringLiteral("png")); !beside.isEmpty())
         return beside;
     return QDir(QStandardPaths::writableLocation(QStandardPaths::PicturesLocation))
         .filePath(tr("drawing.png"));

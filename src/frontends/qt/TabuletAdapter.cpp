@@ -94,7 +94,7 @@ private:
     TalvikTabulet::Point edge(float side) const {
         if (!live()) throw errors::objectNotSet();
         const Bounds box = mTable->bounds();
-        const float row = static_cast<float>(mTable->mWidget->rowHeight());
+        const auto row = static_cast<float>(mTable->mWidget->rowHeight());
         const float middle = static_cast<float>(mTable->mWidget->firstEntry()) +
                              row * (static_cast<float>(mRow) + 0.5F);
         return {box.Left + side * box.Width, box.Top + middle * twipsPerPixel};
@@ -106,7 +106,7 @@ private:
     const Said& said() const {
         if (mSaid) return *mSaid;
         const EntryTexts& texts = mTable->mEntries.texts();
-        mSaid.reset(new Said{texts.key(mRow), texts.text(mRow)});
+        mSaid = std::make_unique<const Said>(Said{texts.key(mRow), texts.text(mRow)});
         return *mSaid;
     }
 
