@@ -17,6 +17,8 @@ std::string houseOf(const std::string& file) {
     const auto startsWith = [&](const char* prefix) { return file.rfind(prefix, 0) == 0; };
     if (startsWith("model/reader/")) return "reader";
     if (startsWith("model/files/")) return "files";
+    if (startsWith("frontends/windows/automation/")) return "frontends/windows/automation";
+    if (startsWith("frontends/windows/toolkit/")) return "frontends/windows/toolkit";
     if (startsWith("frontends/")) return file.substr(0, file.find('/', sizeof "frontends"));
     return file.substr(0, file.find('/'));
 }
@@ -27,6 +29,11 @@ const std::map<std::string, Houses> mayInclude = {
     {"comforts", {"comforts", "control", "platform"}},
     {"frontends/headless", {"frontends/headless", "comforts", "control", "platform"}},
     {"frontends/qt", {"frontends/qt", "comforts", "control", "platform"}},
+    {"frontends/windows/toolkit",
+     {"frontends/windows/toolkit", "comforts", "control", "platform"}},
+    {"frontends/windows/automation",
+     {"frontends/windows/automation", "frontends/windows/toolkit", "frontends/headless", "model",
+      "comforts", "control", "platform"}},
     {"frontends/qt_designer",
      {"frontends/qt_designer", "frontends/qt", "model", "comforts", "control", "platform"}},
     {"model", {"model", "platform"}},
