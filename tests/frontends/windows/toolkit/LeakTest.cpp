@@ -1,0 +1,90 @@
+#include "support/FakeModel.h"
+#include "support/WindowsHands.h"
+
+#include <Zandor/windows/WindowControl.h>
+
+#include <gtest/gtest.h>
+
+#include <cstdint>
+#include <cstdio>
+
+using namespace zandor;
+
+namespace {
+
+class NobodyHears final : public TalvikDBxZandor::ZandorEvents {
+public:
+    void Raise(TalvikDBxZandor::Event, const TalvikDBxZandor::EventArguments&) override {}
+};
+
+/// The objects of this process that the system counts; where it does not count them, as Wine does
+/// not, those that there is a handle of.
+struct Objects {
+    int drawing = 0;
+    int windows = 0;
+
+    static Objects now() {
+        Objects objects{static_cast<int>(GetGuiResources(GetCurrentProcess(), GR_GDIOBJECTS)),
+                        static_cast<int>(GetGuiResources(GetCurrentProcess(), GR_USEROBJECTS))};
+        if (objects.drawing != 0) return objects;
+        for (std::uintptr_t handle = 1; handle <= 0xFFFF; ++handle)
+            if (GetObjectType(reinterpret_cast<HGDIOBJ>(handle))) ++objects.drawing;
+        for (std::uintptr_t handle = 0x20; handle <= 0xFFFF; handle += 2) {
+            DWORD process = 0;
+            GetWindowThreadProcessId(reinterpret_cast<HWND>(handle), &process);
+            if (process == GetCurrentProcessId() || IsMenu(reinterpret_cast<HMENU>(handle)))
+                ++objects.windows;
+        }
+        return objects;
+    }
+};
+
+/// A host's window with a control over two tables, a join and an output column, shown, scrolled,
+/// edited and closed.
+void openAndClose() {
+    fake::Library library;
+    NobodyHears nobody;
+    const auto model = library.newModel();
+    const auto orders = model->table(u"ORDERS", {u"*", u"ID", u"CUSTOMER"});
+    const auto customers = model->table(u"CUSTOMERS", {u"*", u"ID", u"NAME"});
+    model->join(orders, u"CUSTOMER", customers, u"ID");
+    model->definition(orders, u"ID");
+    const HWND host =
+        CreateWindowExW(0, hands::hostClass(&DefWindowProcW), L"Host", WS_OVERLAPPEDWINDOW, 0, 0,
+                        800, 600, nullptr, nullptr, GetModuleHandleW(nullptr), nullptr);
+    {
+        platform::windows::WindowControl control(host, library, nobody);
+        control.control().DebugSwitch(0);
+        control.control().OnlyJoin(false);
+        control.setBounds({0, 0, 780, 560});
+        control.show(true);
+        ShowWindow(host, SW_SHOWNOACTIVATE);
+        control.control().P_SET_Zandor(std::shared_ptr<TalvikZandorLib::Zandor>(model));
+        hands::pump();
+        const HWND grid = FindWindowExW(control.window(), nullptr, nullptr, L"Output columns");
+        EXPECT_TRUE(grid);
+        hands::click(grid, {150, 90});
+        hands::pump();
+        RedrawWindow(control.window(), nullptr, nullptr, RDW_INVALIDATE | RDW_ALLCHILDREN);
+        hands::pump();
+        control.control().Terminate();
+    }
+    DestroyWindow(host);
+    hands::pump();
+}
+
+} // namespace
+
+TEST(AThousandControls, LeaveNoObjectOfTheSystemsBehind) {
+    constexpr int controls = 1000;
+    constexpr int settled = 10;
+    for (int i = 0; i < settled; ++i) openAndClose();
+    const Objects before = Objects::now();
+    for (int i = 0; i < controls; ++i) openAndClose();
+    const Objects after = Objects::now();
+    std::printf("%d controls: %d drawing objects before, %d after; %d windows before, %d after\n",
+                controls, before.drawing, after.drawing, before.windows, after.windows);
+    EXPECT_GT(before.drawing, 0);
+    EXPECT_LE(after.drawing, before.drawing);
+    EXPECT_LE(after.windows, before.windows);
+}
