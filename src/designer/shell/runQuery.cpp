@@ -68,10 +68,10 @@ reader::Result<Opened> openDatabase(const QString& address) {
 std::optional<QString> complaint(const std::vector<Question>& questions, const Answers& values) {
     for (const Question& question : questions) {
         if (!values.contains(question.name))
-            return Words::tr("The query asks for \"%1\"; give it with --set \"%1=VALUE\".")
+            return Words::tr(R"(The query asks for "%1"; give it with --set "%1=VALUE".)")
                 .arg(question.name);
         if (!fits(question, values[question.name]))
-            return Words::tr("The query asks for \"%1\", which has to be %2; \"%3\" is not.")
+            return Words::tr(R"(The query asks for "%1", which has to be %2; "%3" is not.)")
                 .arg(question.name, wanted(question), values[question.name]);
     }
     for (const QString& name : values.keys()) {
