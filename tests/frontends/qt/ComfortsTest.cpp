@@ -184,6 +184,29 @@ TEST_F(Comforts, LeadToTheFieldsByTheUpKeyAndFromThereToTheList) {
     EXPECT_EQ(grid().currentCol(), 4);
 }
 
+TEST_F(Comforts, OfferFieldsToAHandThatTrembles) {
+    const QPoint place = grid().cellRect(0, 4).center();
+    QWidget& part = *grid().childAt(place);
+    const QPointF at = part.mapFrom(&grid(), place);
+    hands::mouse(part, QEvent::MouseButtonPress, at, Qt::LeftButton, Qt::LeftButton);
+    hands::mouse(part, QEvent::MouseMove, at + QPointF(2, 1), Qt::NoButton, Qt::LeftButton);
+    hands::mouse(part, QEvent::MouseButtonRelease, at + QPointF(2, 1), Qt::LeftButton);
+    settle();
+    EXPECT_TRUE(fields().isVisible());
+}
+
+TEST_F(Comforts, OfferNoFieldsToAClickThatEndsOverAnotherField) {
+    const QPoint place = grid().cellRect(0, 4).center();
+    QWidget& part = *grid().childAt(place);
+    hands::mouse(part, QEvent::MouseButtonPress, part.mapFrom(&grid(), place), Qt::LeftButton,
+                 Qt::LeftButton);
+    hands::mouse(part, QEvent::MouseButtonRelease,
+                 part.mapFrom(&grid(), grid().cellRect(0, 3).center()), Qt::LeftButton);
+    settle();
+    const auto* const list = widget->findChild<QWidget*>("lstFields");
+    EXPECT_FALSE(list && list->isVisible());
+}
+
 TEST_F(Comforts, FilterTheFieldsByEachWordTyped) {
     clickField(4);
     fields().box().setFocus();
@@ -376,6 +399,17 @@ TEST_F(Comforts, LeaveACellAsItWasWhenAnInputMethodGivesUp) {
     hands::key(child<QWidget>("txtValue"), Qt::Key_Return);
     calm();
     EXPECT_EQ(criterion(), u"> 1000");
+}
+
+TEST_F(Comforts, TypeInAnotherCellAfterAnInputMethodWasLeft) {
+    standOn(criteriaRow, 1);
+    compose("か");
+    after.setFocus(Qt::MouseFocusReason);
+    calm();
+    standOn(criteriaRow, 2);
+    press(0, {}, "9");
+    press(Qt::Key_Return);
+    EXPECT_EQ(model->definitionAt(2).criterion(u"4"), u"9");
 }
 
 TEST_F(Comforts, LetAnInputMethodLookForAField) {

@@ -81,6 +81,21 @@ TEST_F(ADrag, ShowsWhereADropCounts) {
     });
 }
 
+TEST_F(ADrag, ThatIsGivenUpBeforeItsDropIsDealtWithDropsNothing) {
+    show();
+    bind();
+    const int before = model->joinCount();
+    for (const bool givenUp : {true, false}) {
+        drag(2, [&](QDrag& drag) {
+            auto& drags = widget->toolkit().drags();
+            hands::carry(drag, *table(2).list().viewport(), entry(2, 1));
+            if (givenUp) drags.giveUp(drags.source());
+        });
+        settle();
+        EXPECT_EQ(model->joinCount(), givenUp ? before : before + 1);
+    }
+}
+
 TEST_F(ADrag, ScrollsTheListNearItsEdges) {
     show();
     bind();

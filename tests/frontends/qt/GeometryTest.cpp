@@ -233,6 +233,36 @@ TEST_F(Geometry, StacksTheCanvasBelowTheGridTheBarsTheHomeButtonAndTheEditors) {
     EXPECT_EQ(children.last(), widget->findChild<QWidget*>("fraSortOrder"));
 }
 
+TEST_F(Geometry, OfAListEndsWithItsLastPixel) {
+    show();
+    bind();
+    const auto* tabulet = dynamic_cast<TalvikTabulet::Tabulet*>(static_cast<platform::Control*>(
+        table(1).property(platform::qt::controlProperty).value<void*>()));
+    ASSERT_TRUE(tabulet);
+    QWidget& viewport = *table(1).list().viewport();
+    const QRect inside(viewport.mapTo(&table(1), QPoint()), viewport.size());
+    const auto hasEntryAt = [&](double x, double y) {
+        return tabulet->ColumnAt(static_cast<float>(x * 15), static_cast<float>(y * 15)) != nullptr;
+    };
+    const double y = inside.top() + 5;
+    EXPECT_FALSE(hasEntryAt(inside.left() - 0.5, y));
+    EXPECT_TRUE(hasEntryAt(inside.left(), y));
+    EXPECT_TRUE(hasEntryAt(inside.right() + 0.5, y));
+    EXPECT_FALSE(hasEntryAt(inside.right() + 1, y));
+    EXPECT_FALSE(hasEntryAt(inside.left(), inside.top() - 0.5)) << "the title";
+}
+
+TEST_F(Geometry, OfAListIsSuchThatASelectedColumnIsSeen) {
+    show();
+    bind();
+    orders->place(600, 600, 2400, 1500);
+    orders->column(u"PRIORITY").selected = true;
+    widget->setModel(std::shared_ptr<TalvikZandorLib::Zandor>(model));
+    settle();
+    auto& list = table(1).list();
+    EXPECT_TRUE(list.viewport()->rect().contains(list.visualRect(list.model()->index(9, 0))));
+}
+
 TEST_F(Geometry, PutsATableThatIsPressedInFrontOfTheOthers) {
     show();
     bind();

@@ -95,6 +95,14 @@ TEST_F(Hands, ThatTurnTheWheelScrollNothingWhereTheBarsAreOff) {
     EXPECT_EQ(bar.value(), 0);
 }
 
+TEST_F(Hands, ThatTurnTheWheelOverATitleScrollNothing) {
+    show();
+    bind();
+    table(1).list(); // with it the title is the box's own
+    wheel(table(1), {60, 8}, {0, -120});
+    EXPECT_EQ(child<QScrollBar>("vsbTable").value(), 0);
+}
+
 TEST_F(Hands, ThatTurnTheWheelOverAListScrollTheListOnly) {
     show();
     bind();
@@ -199,6 +207,24 @@ TEST_F(Hands, ThatDragShowThePickedNames) {
     ASSERT_FALSE(picture.isNull());
     EXPECT_GE(picture.width() / picture.devicePixelRatio(),
               widget->fontMetrics().horizontalAdvance("CUSTOMER_ID"));
+}
+
+TEST_F(Hands, ThatDragShowNamesAsTheyStandHoweverTheyWerePicked) {
+    show();
+    bind();
+    std::vector<QImage> pictures;
+    widget->toolkit().drags().setCarrier(
+        [&](QDrag& drag) { pictures.push_back(drag.pixmap().toImage()); });
+    auto& list = table(1).list();
+    for (const auto& rows : {std::pair(2, 4), std::pair(4, 2)}) {
+        list.clearSelection();
+        for (const int row : {rows.first, rows.second})
+            list.selectionModel()->select(list.model()->index(row, 0), QItemSelectionModel::Select);
+        drag(1, 4);
+        settle();
+    }
+    ASSERT_EQ(pictures.size(), 2U);
+    EXPECT_EQ(pictures[0], pictures[1]);
 }
 
 TEST_F(Hands, ThatDropOnAnEntryJoinItWithTheDraggedColumn) {

@@ -188,6 +188,27 @@ TEST_F(AJoinToRead, HasItsWordsAtTheirEnds) {
     EXPECT_TRUE(isPainted(0.94, 5));
 }
 
+TEST_F(AJoinToRead, HasItsWordsOnOnePlateWhereTheLineIsShort) {
+    join(3, 2);
+    const int end = table(1).geometry().right();
+    table(2).move(end + 24, table(2).y());
+    settle();
+    QFont font = canvas().font();
+    font.setPointSizeF(font.pointSizeF() * 0.85);
+    EXPECT_GE(line().extent().boundingRect().width(),
+              QFontMetrics(font).horizontalAdvance("all < all"));
+}
+
+TEST_F(AJoinToRead, IsPaintedAsWideAsItShinesWithTheFocus) {
+    join(0, 0, false, false);
+    const auto reaches = [&](int above) {
+        return line().extent().contains((line().at(0) / 15).toPoint() + QPoint(1, -above));
+    };
+    EXPECT_FALSE(reaches(3));
+    canvas().focusOn(&line(), Qt::TabFocusReason);
+    EXPECT_TRUE(reaches(3));
+}
+
 TEST_F(AJoinToRead, TakesItsNotesAwayWithTheComfort) {
     join(3, 2);
     ASSERT_NE(line().notes(), platform::LineNotes());

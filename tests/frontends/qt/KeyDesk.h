@@ -17,6 +17,7 @@ public:
         auto* menu = event->type() == QEvent::Show ? qobject_cast<QMenu*>(watched) : nullptr;
         if (!menu) return false;
         ++opened;
+        font = menu->font();
         enabled.clear();
         for (const QAction* action : menu->actions())
             if (action->isEnabled() && action->isVisible() && !action->isSeparator())
@@ -37,6 +38,7 @@ public:
     QStringList enabled;
     QString highlighted; ///< the entry that Enter would take
     QPoint at;
+    QFont font;
 };
 
 /// The control in a host's window, between two fields of the host's, and a user without a mouse.

@@ -1,3 +1,4 @@
+#include "frontends/qt/ColumnListModel.h"
 #include "frontends/qt/KeyDesk.h"
 
 #include <QDialog>
@@ -87,6 +88,15 @@ TEST_F(Keyboard, HighlightsTheFirstEntryThatCanBeTaken) {
     hands::mouse(canvas(), QEvent::MouseButtonRelease, {600, 30}, Qt::RightButton);
     EXPECT_EQ(menus.highlighted, "");
     EXPECT_EQ(menus.opened, 4);
+}
+
+TEST_F(Keyboard, OpensMenusInTheFontOfTheControl) {
+    QFont large = widget->font();
+    large.setPointSizeF(large.pointSizeF() + 7);
+    widget->setFont(large);
+    tabTo("lstTable(1)");
+    menuKey();
+    EXPECT_EQ(menus.font.pointSizeF(), large.pointSizeF());
 }
 
 TEST_F(Keyboard, OpensTheMenuOfATableWithoutEntries) {
@@ -376,4 +386,19 @@ TEST_F(Keyboard, KeepsATableInViewThatItMoves) {
     for (int i = 0; i < 50; ++i) press(Qt::Key_Right, Qt::AltModifier);
     EXPECT_GT(table(2).x(), 800);
     EXPECT_TRUE(widget->toolkit().view().seen().contains(table(2).geometry()));
+}
+
+TEST_F(Keyboard, SelectsAnEntryThatGoesMeanwhile) {
+    tabTo("lstTable(1)");
+    repeat(Qt::Key_Down, 9);
+    bool gone = false;
+    model->calls->onPass = [&](const std::string& call) {
+        if (call != "ZDColumn.activated=" || std::exchange(gone, true)) return;
+        orders->columns.items.Remove(u"kPRIORITY");
+        widget->showAnew();
+    };
+    press(Qt::Key_Space, Qt::ControlModifier);
+    model->calls->onPass = {};
+    EXPECT_TRUE(gone);
+    EXPECT_EQ(table(1).model().rowCount(), 9);
 }

@@ -30,10 +30,12 @@ public:
 
     int events = 0;
     int pixels = 0;
+    QRegion region;
 
     bool eventFilter(QObject*, QEvent* event) override {
         if (event->type() != QEvent::Paint) return false;
         ++events;
+        region += static_cast<QPaintEvent*>(event)->region();
         for (const QRect& part : static_cast<QPaintEvent*>(event)->region())
             pixels += part.width() * part.height();
         return false;
@@ -212,6 +214,18 @@ TEST_F(Painting, OfABarThatRestsIsACopyOfWhatWasPainted) {
     EXPECT_NE(bar.grab().toImage(), before.copy(bar.geometry()));
     EXPECT_GT(style.bars, 0);
     bar.setStyle(nullptr);
+}
+
+TEST_F(Painting, OfALineThatMovesIsAlsoWhereItWas) {
+    CanvasLine& moved = line(0);
+    const QPoint before = (moved.at(0.5) / 15).toPoint();
+    const Painted painted({&canvas()});
+    moved.setEnds(moved.X1(), moved.Y1() + 900, moved.X2(), moved.Y2() + 900);
+    const QPoint after = (moved.at(0.5) / 15).toPoint();
+    settle();
+    EXPECT_TRUE(painted.region.contains(after));
+    EXPECT_TRUE(painted.region.contains(before)) << "it leaves a trace";
+    EXPECT_FALSE(painted.region.contains((before + after) / 2));
 }
 
 TEST_F(Painting, OfALineThatMovesWaitsUntilItRests) {
