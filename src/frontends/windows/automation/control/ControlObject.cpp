@@ -1,0 +1,93 @@
+#include "frontends/windows/automation/control/ControlObject.h"
+
+#include "frontends/windows/automation/com/ListEnumerator.h"
+#include "frontends/windows/automation/com/ids.h"
+#include "frontends/windows/automation/control/invoke.h"
+
+namespace zandor::automation {
+
+namespace {
+
+constexpr DWORD safety = INTERFACESAFE_FOR_UNTRUSTED_CALLER | INTERFACESAFE_FOR_UNTRUSTED_DATA;
+
+IConnectionPoint* lendPoint(const Held<IConnectionPoint>& point) { return point.copy(); }
+
+} // namespace
+
+ControlObject::ControlObject()
+    : mHouse(House::build(
+          [this](TalvikDBxZandor::Event event, const TalvikDBxZandor::EventArguments& arguments) {
+              // The host may let go of its last reference as it hears it.
+              const Held<_Zandor> meanwhile(this);
+              mEvents.raise(event, arguments);
+          })) {}
+
+ControlObject::~ControlObject() { mHouse->end(); }
+
+void* ControlObject::findMore(REFIID iid) {
+    if (iid == IID_IProvideClassInfo) return static_cast<IProvideClassInfo2*>(this);
+    return nullptr;
+}
+
+STDMETHODIMP ControlObject::Invoke(DISPID member, REFIID iid, LCID, WORD flags,
+                                   DISPPARAMS* arguments, VARIANT* result, EXCEPINFO* failure,
+                                   UINT* wrong) {
+    if (iid != IID_NULL) return DISP_E_UNKNOWNINTERFACE;
+    if (!arguments) return E_POINTER;
+    const Held<_Zandor> meanwhile(this);
+    return invoke(mHouse->control(), member, flags, *arguments, result, failure, wrong);
+}
+
+STDMETHODIMP ControlObject::EnumConnectionPoints(IEnumConnectionPoints** points) {
+    return answer([&] {
+        using Point = Held<IConnectionPoint>;
+        placeOf(points) =
+            ListEnumerator<IEnumConnectionPoints, IConnectionPoint*, Point, &lendPoint>::begin(
+                {Point(&mEvents)});
+    });
+}
+
+STDMETHODIMP ControlObject::FindConnectionPoint(REFIID iid, IConnectionPoint** point) {
+    if (!point) return E_POINTER;
+    *point = nullptr;
+    // A script knows the events by their dispatch ids alone.
+    if (iid != ids::controlEvents && iid != IID_IDispatch) return CONNECT_E_NOCONNECTION;
+    *point = Held<IConnectionPoint>(&mEvents).detach();
+    return S_OK;
+}
+
+STDMETHODIMP ControlObject::GetClassInfo(ITypeInfo** info) {
+    return answer([&] { placeOf(info) = module::typeInfo(ids::control).detach(); });
+}
+
+STDMETHODIMP ControlObject::GetGUID(DWORD kind, GUID* id) {
+    if (!id) return E_POINTER;
+    if (kind != GUIDKIND_DEFAULT_SOURCE_DISP_IID) {
+        *id = GUID_NULL;
+        return E_INVALIDARG;
+    }
+    *id = ids::controlEvents;
+    return S_OK;
+}
+
+STDMETHODIMP ControlObject::GetInterfaceSafetyOptions(REFIID iid, DWORD* supported,
+                                                      DWORD* enabled) {
+    if (!supported || !enabled) return E_POINTER;
+    *supported = *enabled = 0;
+    Held<IUnknown> there;
+    if (FAILED(QueryInterface(iid, there.slotOfAny()))) return E_NOINTERFACE;
+    *supported = safety;
+    *enabled = mSafety;
+    return S_OK;
+}
+
+STDMETHODIMP ControlObject::SetInterfaceSafetyOptions(REFIID iid, DWORD mask, DWORD enabled) {
+    Held<IUnknown> there;
+    if (FAILED(QueryInterface(iid, there.slotOfAny()))) return E_NOINTERFACE;
+    // Neither reads nor writes anything but the model that it is handed, so it is safe as it is.
+    if (mask & enabled & ~safety) return E_FAIL;
+    mSafety = (mSafety & ~mask) | (enabled & mask);
+    return S_OK;
+}
+
+} // namespace zandor::automation
