@@ -66,12 +66,11 @@ QString withOffset(const QString& time, const Moment& moment) {
 QString shownMoment(const Moment& moment, Format format) {
     const QLocale locale;
     const auto& [date, time, offset] = moment;
-    const QString clock = time.isValid()
-                              ? withOffset(locale.toString(time, QLocale::ShortFormat), moment)
-                              : QString();
+    QString clock = time.isValid() ? withOffset(locale.toString(time, QLocale::ShortFormat), moment)
+                                   : QString();
     if (format == Format::Time) return clock;
     if (!date.isValid()) return {};
-    const QString day = locale.toString(date, QLocale::ShortFormat);
+    QString day = locale.toString(date, QLocale::ShortFormat);
     switch (format) {
     case Format::ShortDate: return day;
     case Format::LongDate: return locale.toString(date, QLocale::LongFormat);

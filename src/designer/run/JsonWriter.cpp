@@ -22,7 +22,7 @@ QByteArray written(const Cell& cell) {
     case Cell::Kind::null: return "null";
     case Cell::Kind::boolean: return cell.text.toLatin1();
     case Cell::Kind::number:
-        if (const QByteArray text = cell.text.toLatin1(); isJsonNumber(text)) return text;
+        if (QByteArray text = cell.text.toLatin1(); isJsonNumber(text)) return text;
         break;
     case Cell::Kind::blob: return quoted(cell.blob.toBase64());
     case Cell::Kind::text: break;

@@ -236,7 +236,7 @@ void ResultsPanel::askForFile() {
 }
 
 QString ResultsPanel::whyEmpty() const {
-    const QString none = tr("The query finds no rows.");
+    QString none = tr("The query finds no rows.");
     if (!mComparesTexts) return none;
     return none + u'\n' +
            tr("A text has to be the same as a whole, and on most databases in capital and small "

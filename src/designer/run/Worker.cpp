@@ -15,12 +15,12 @@ public:
     explicit Counter(Worker& worker) : mWorker(worker) {}
 
     std::optional<QString> begin(const QStringList& columns) override {
-        const auto error = mWorker.mSink->begin(columns);
+        auto error = mWorker.mSink->begin(columns);
         emit mWorker.progressed();
         return error;
     }
     std::optional<QString> add(const Row& row) override {
-        const auto error = mWorker.mSink->add(row);
+        auto error = mWorker.mSink->add(row);
         if (++mWorker.mRows == firstLook) emit mWorker.progressed();
         return error;
     }
