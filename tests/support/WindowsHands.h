@@ -23,10 +23,18 @@ inline const wchar_t* hostClass(WNDPROC procedure) {
     return name;
 }
 
+/// Of the keys that a message of the mouse tells of: it comes from these hands. The system sends
+/// some of its own, from wherever its pointer happens to be.
+inline constexpr WPARAM ours = 0x8000;
+
 /// Deals with all that is in the queue; `dialog` has its keys first.
 inline void pump(HWND dialog = nullptr) {
     MSG message{};
     while (PeekMessageW(&message, nullptr, 0, 0, PM_REMOVE)) {
+        if (message.message >= WM_MOUSEFIRST && message.message <= WM_MOUSELAST) {
+            if (!(message.wParam & ours)) continue;
+            message.wParam &= ~ours;
+        }
         if (dialog && IsWindow(dialog) && IsDialogMessageW(dialog, &message)) continue;
         TranslateMessage(&message);
         DispatchMessageW(&message);
@@ -47,7 +55,7 @@ inline UINT releaseOf(int button) {
 }
 
 inline void mouse(HWND window, UINT message, POINT at, WPARAM keys) {
-    PostMessageW(window, message, keys, MAKELPARAM(at.x, at.y));
+    PostMessageW(window, message, keys | ours, MAKELPARAM(at.x, at.y));
 }
 
 inline POINT middleOf(HWND window) {

@@ -2,6 +2,7 @@
 
 #include "frontends/windows/toolkit/Drawing.h"
 #include "frontends/windows/toolkit/Surroundings.h"
+#include "frontends/windows/toolkit/partsIn.h"
 
 #include <utility>
 
@@ -41,13 +42,7 @@ void ControlWindow::dpiChanged() {
     if (dpi == surroundings().scale.dpi()) return;
     surroundings().scale = Scale(dpi);
     surroundings().fonts.setDpi(dpi);
-    EnumChildWindows(
-        hwnd(),
-        [](HWND child, LPARAM) -> BOOL {
-            if (Window* const part = of(child)) part->applyScale();
-            return TRUE;
-        },
-        0);
+    for (const auto& part : partsIn(hwnd())) part->applyScale();
     surroundings().fonts.dropOld();
     if (const PlainEvent resized = onResize) resized();
 }

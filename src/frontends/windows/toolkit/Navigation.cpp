@@ -5,6 +5,7 @@
 #include "frontends/windows/toolkit/Frames.h"
 #include "frontends/windows/toolkit/Grid.h"
 #include "frontends/windows/toolkit/TableWindow.h"
+#include "frontends/windows/toolkit/partsIn.h"
 
 #include <algorithm>
 
@@ -85,16 +86,10 @@ void Navigation::go(const Stop& stop) {
 /// An open editor is a world of its own: Enter and Escape lead out of it.
 bool Navigation::goOnInEditor(const RowWindow& editor, bool next) const {
     std::vector<HWND> parts;
-    EnumChildWindows(
-        editor.hwnd(),
-        [](HWND child, LPARAM list) -> BOOL {
-            const Window* const part = Window::of(child);
-            if (part && part->isEnabled() && IsWindowVisible(child) &&
-                !dynamic_cast<const RowWindow*>(part))
-                reinterpret_cast<std::vector<HWND>*>(list)->push_back(child);
-            return TRUE;
-        },
-        reinterpret_cast<LPARAM>(&parts));
+    for (const auto& part : partsIn(editor.hwnd()))
+        if (part->isEnabled() && IsWindowVisible(part->hwnd()) &&
+            !dynamic_cast<const RowWindow*>(part.get()))
+            parts.push_back(part->hwnd());
     // The system has what was made last first.
     std::ranges::reverse(parts);
     const auto here = std::ranges::find(parts, focused());

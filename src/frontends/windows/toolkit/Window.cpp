@@ -150,7 +150,10 @@ void Window::end() {
 }
 
 void Window::destroyIfIdle() {
-    if (mEnded && mDepth == 0 && mHandle) DestroyWindow(mHandle);
+    if (!mEnded || mDepth != 0 || !mHandle) return;
+    // Its last messages are part of this and do not begin it again.
+    mDepth = 1;
+    DestroyWindow(mHandle);
 }
 
 LRESULT Window::handle(const Message& message) {

@@ -12,6 +12,7 @@
 #include "frontends/windows/toolkit/ScrollBar.h"
 #include "frontends/windows/toolkit/Tabulet.h"
 #include "frontends/windows/toolkit/Text.h"
+#include "frontends/windows/toolkit/partsIn.h"
 
 #include <Zandor/platform/RuntimeError.h>
 
@@ -68,13 +69,7 @@ void WindowsToolkit::setFont(HFONT font) {
     LOGFONTW look{};
     if (!font || !GetObjectW(font, sizeof look, &look)) return;
     mSurroundings->fonts.setOwn(look, mSurroundings->scale.dpi());
-    EnumChildWindows(
-        window(),
-        [](HWND child, LPARAM) -> BOOL {
-            if (Window* const part = Window::of(child)) part->applyFont();
-            return TRUE;
-        },
-        0);
+    for (const auto& part : partsIn(window())) part->applyFont();
     mSurroundings->fonts.dropOld();
     if (const PlainEvent resized = mSurface->onResize) resized();
 }
