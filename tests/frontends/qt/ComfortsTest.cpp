@@ -407,6 +407,9 @@ TEST_F(Comforts, TypeInAnotherCellAfterAnInputMethodWasLeft) {
     after.setFocus(Qt::MouseFocusReason);
     calm();
     standOn(criteriaRow, 2);
+    press(Qt::Key_Up);
+    EXPECT_EQ(grid().currentRow(), criteriaRow - 1) << "the key is the grid's";
+    press(Qt::Key_Down);
     press(0, {}, "9");
     press(Qt::Key_Return);
     EXPECT_EQ(model->definitionAt(2).criterion(u"4"), u"9");
