@@ -77,30 +77,22 @@ void ChoiceWindow::choose(int index) {
 void ChoiceWindow::clear() {
     SendMessageW(hwnd(), CB_RESETCONTENT, 0, 0);
     mWidest = 0;
-    fitList();
 }
 
 void ChoiceWindow::add(const String& item) {
     SendMessageW(hwnd(), CB_ADDSTRING, 0, reinterpret_cast<LPARAM>(wide(item)));
     mWidest = std::max(mWidest, surroundings().fonts.widthOf(fontHandle(), item));
-    fitList();
     if (auto* const row = dynamic_cast<RowWindow*>(of(GetParent(hwnd())))) row->arrange();
 }
 
-/// To the system, the height of the box is that of the list that drops down from it.
+/// To the system, the height that a box is given is that of the list that drops down from it, too.
 void ChoiceWindow::fitList() const {
     RECT place{};
     GetWindowRect(hwnd(), &place);
-    SetWindowPos(hwnd(), nullptr, 0, 0, place.right - place.left, place.bottom - place.top,
-                 SWP_NOMOVE | SWP_NOZORDER | SWP_NOACTIVATE);
-}
-
-void ChoiceWindow::addListTo(WINDOWPOS& position) const {
-    if (position.flags & SWP_NOSIZE) return;
-    RECT place{};
-    GetWindowRect(hwnd(), &place);
     const int row = static_cast<int>(SendMessageW(hwnd(), CB_GETITEMHEIGHT, 0, 0));
-    position.cy = place.bottom - place.top + 2 + row * std::clamp(count(), 1, mostDropped);
+    const int list = 2 + row * std::clamp(count(), 1, mostDropped);
+    SetWindowPos(hwnd(), nullptr, 0, 0, place.right - place.left, place.bottom - place.top + list,
+                 SWP_NOMOVE | SWP_NOZORDER | SWP_NOACTIVATE);
 }
 
 String ChoiceWindow::item(int index) const {
@@ -140,7 +132,6 @@ void ChoiceWindow::drop() {
 LRESULT ChoiceWindow::handle(const Message& message) {
     switch (message.id) {
     case dropMessage: drop(); return 0;
-    case WM_WINDOWPOSCHANGING: addListTo(*reinterpret_cast<WINDOWPOS*>(message.l)); break;
     case WM_SHOWWINDOW:
         if (message.w) break;
         mDrops = mDroppedItself = false;
@@ -180,6 +171,7 @@ bool ChoiceWindow::keyInList(WPARAM key) {
 std::optional<LRESULT> ChoiceWindow::told(const Message& message) {
     if (message.id != WM_COMMAND) return {};
     const UINT code = HIWORD(message.w);
+    if (code == CBN_DROPDOWN) fitList();
     if (code == CBN_CLOSEUP) mDroppedItself = false;
     if (code == CBN_SELCHANGE)
         if (const PlainEvent changed = mChanged) changed();

@@ -64,7 +64,6 @@ protected:
 private:
     void drop();
     void fitList() const;
-    void addListTo(WINDOWPOS& position) const;
 
     PlainEvent mChanged;
     bool mWalking = false;       ///< a key or the wheel chooses, rather than a pick
