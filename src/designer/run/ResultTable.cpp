@@ -53,11 +53,10 @@ ResultTable::ResultTable(QWidget* parent)
     setHorizontalScrollMode(ScrollPerPixel);
     setTabKeyNavigation(false);
     setContextMenuPolicy(Qt::ActionsContextMenu);
-    // One height for all: the header then need not ask for that of each row.
-    verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    verticalHeader()->setDefaultSectionSize(fontMetrics().height() + roomInARow);
-    verticalHeader()->setHighlightSections(false);
-    verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    numberRows();
+    connect(mModel, &ResultModel::modelReset, this, [this] {
+        if (mModel->rowCount() == 0) numberRows();
+    });
     horizontalHeader()->setHighlightSections(false);
     horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     horizontalHeader()->setMinimumSectionSize(narrowestColumn);
@@ -96,6 +95,18 @@ QAction* ResultTable::addCommand(const QString& text, const char* name,
     connect(action, &QAction::triggered, this, what);
     addAction(action);
     return action;
+}
+
+/// By a new header, for one that has had a million rows keeps its room for them.
+void ResultTable::numberRows() {
+    setVerticalHeader(new QHeaderView(Qt::Vertical, this));
+    verticalHeader()->setSectionsClickable(true);
+    // One height for all: the header then need not ask for that of each row.
+    verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    verticalHeader()->setDefaultSectionSize(fontMetrics().height() + roomInARow);
+    verticalHeader()->setHighlightSections(false);
+    verticalHeader()->setDefaultAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    verticalHeader()->show();
 }
 
 void ResultTable::showSorting(int column, Qt::SortOrder direction) {

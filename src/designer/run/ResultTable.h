@@ -38,6 +38,7 @@ protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
+    void numberRows();
     void copy();
 
     ResultModel* mModel;

@@ -10,7 +10,10 @@
 #include <QApplication>
 #include <QClipboard>
 #include <QFile>
+#include <QHeaderView>
 #include <QScrollBar>
+
+#include <malloc.h>
 
 using namespace zandor;
 
@@ -192,6 +195,30 @@ TEST_F(ShownRows, DoNotFillTheMemoryWhenTheyAreScrolled) {
     const qint64 before = memory();
     for (int row = 0; row < 300'000; row += 200) scrollTo(row);
     for (int row = 299'999; row >= 0; row -= 5000) scrollTo(row);
-    EXPECT_LT(memory() - before, 40 << 20);
+    EXPECT_LT(memory() - before, 16 << 20);
     EXPECT_EQ(at(123'456, 1), "row 123456");
+}
+
+TEST_F(ShownRows, GiveTheirRoomBackWhenTheyGo) {
+    const auto inUse = [] {
+        const auto all = mallinfo2();
+        return all.uordblks + all.hblkhd;
+    };
+    const auto before = inUse();
+    addNumbered(600'000);
+    table.rows().setSpool(nullptr);
+    spool.reset();
+    EXPECT_LT(inUse(), before + (std::size_t{1} << 20));
+}
+
+TEST_F(ShownRows, AreNumberedAfterOthers) {
+    addNumbered(3);
+    spool = std::make_shared<Spool>();
+    SetUp();
+    addNumbered(2);
+    EXPECT_TRUE(table.verticalHeader()->isVisible());
+    EXPECT_EQ(table.verticalHeader()->count(), 2);
+    const QPoint second(5, table.rowViewportPosition(1) + table.rowHeight(1) / 2);
+    hands::click(*table.verticalHeader()->viewport(), second);
+    EXPECT_TRUE(table.selectionModel()->isRowSelected(1));
 }
