@@ -11,7 +11,7 @@ sys.path.insert(0, str(PLACE))
 COMPILER = sys.argv.pop() if len(sys.argv) > 1 and not sys.argv[-1].startswith("-") else "c++"
 
 from schemata import Schemata, blocks_of
-from slips import Slip
+from slips import ROOT, Slip, chosen
 
 SOURCE = """#include <cstdio>
 #include <initializer_list>
@@ -113,6 +113,13 @@ class ManySlips(unittest.TestCase):
             errors = compiled(made.text, folder)
         lines = [int(line.split(":")[1]) for line in errors.splitlines() if ": error: " in line]
         self.assertEqual([made.at_line(line) for line in lines], [[bad]])
+
+
+class TheSlips(unittest.TestCase):
+    def test_have_their_places_in_the_sources(self):
+        lost = [each.name for each in chosen([])
+                if each.place((ROOT / each.file).read_text()) is None]
+        self.assertEqual(lost, [], "a line that a slip names has changed: write it there, too")
 
 
 if __name__ == "__main__":
