@@ -33,11 +33,15 @@ protected:
 
     void show() {
         widget->show();
-        // A display gives the keyboard when it finds the time.
-        const QDeadlineTimer end(5'000);
-        while (widget->isVisible() && !widget->isActiveWindow() && !end.hasExpired())
-            qApp->processEvents(QEventLoop::AllEvents, 10);
+        waitForKeyboard(*widget);
         settle();
+    }
+
+    /// A display gives the keyboard to a window that is shown when it finds the time.
+    static void waitForKeyboard(const QWidget& window) {
+        const QDeadlineTimer end(5'000);
+        while (window.isVisible() && !window.isActiveWindow() && !end.hasExpired())
+            qApp->processEvents(QEventLoop::AllEvents, 10);
     }
 
     /// Shows three tables, two joins and three output columns.

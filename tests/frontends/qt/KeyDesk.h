@@ -55,6 +55,7 @@ protected:
         host.resize(900, 700);
         host.show();
         host.activateWindow();
+        waitForKeyboard(host);
         bind();
         before.setFocus();
     }
