@@ -45,7 +45,8 @@ struct Memory {
         QFile file(QStringLiteral("/proc/self/statm"));
         EXPECT_TRUE(file.open(QIODevice::ReadOnly));
         const auto pages = file.readAll().split(' ').value(1).toDouble();
-        return {static_cast<double>(mallinfo2().uordblks) / 1024,
+        const auto all = mallinfo2();
+        return {static_cast<double>(all.uordblks + all.hblkhd) / 1024,
                 pages * static_cast<double>(sysconf(_SC_PAGESIZE)) / 1024};
     }
 };
