@@ -28,7 +28,9 @@ void drawFigure(QPainter& painter, const Figure& figure, int top) {
     painter.fillRect(bar, figure.met() ? good : bad);
     painter.setPen(Qt::black);
     painter.drawLine(middle, top, middle, top + rowHeight);
-    painter.drawText(QRectF(bar.right() + 6, top, 180, rowHeight), Qt::AlignVCenter,
+    // Behind the mark of the goal, too.
+    painter.drawText(QRectF(std::max<double>(bar.right(), middle) + 6, top, 180, rowHeight),
+                     Qt::AlignVCenter,
                      QStringLiteral("%1 of %2").arg(figure.value(), 0, 'g', 3).arg(figure.goal));
 }
 
