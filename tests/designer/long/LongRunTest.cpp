@@ -15,7 +15,6 @@
 #include <algorithm>
 #include <cstdio>
 #include <malloc.h>
-#include <unistd.h>
 
 using namespace zandor;
 
@@ -36,18 +35,25 @@ constexpr int roundsToTell = 200;
 
 struct Memory {
     double heap;     ///< KiB in use
-    double resident; ///< KiB
+    double resident; ///< KiB of its own: pages of libraries and fonts come as they are used
 
     static Memory now() {
         QPixmapCache::clear();                 // it grows to a limit of its own
         QGuiApplication::clipboard()->clear(); // a copied picture is larger than all else
         malloc_trim(0);
-        QFile file(QStringLiteral("/proc/self/statm"));
-        EXPECT_TRUE(file.open(QIODevice::ReadOnly));
-        const auto pages = file.readAll().split(' ').value(1).toDouble();
         const auto all = mallinfo2();
-        return {static_cast<double>(all.uordblks + all.hblkhd) / 1024,
-                pages * static_cast<double>(sysconf(_SC_PAGESIZE)) / 1024};
+        return {static_cast<double>(all.uordblks + all.hblkhd) / 1024, residentOfItsOwn()};
+    }
+
+private:
+    static double residentOfItsOwn() {
+        QFile status(QStringLiteral("/proc/self/status"));
+        EXPECT_TRUE(status.open(QIODevice::ReadOnly));
+        for (const QByteArray& line : status.readAll().split('\n'))
+            if (line.startsWith("RssAnon:"))
+                return line.simplified().split(' ').value(1).toDouble();
+        ADD_FAILURE() << "the system does not say how much of the memory is the process's own";
+        return 0;
     }
 };
 
