@@ -25,16 +25,21 @@ void CellComposer::goOn(QInputMethodEvent& event) {
     QCoreApplication::sendEvent(mBox, &event);
     if (!event.preeditString().isEmpty() || !mBox) return;
     QWidget* const box = std::exchange(mBox, nullptr);
-    auto* const line = qobject_cast<QLineEdit*>(box);
-    if (line && line->text().isEmpty() && event.commitString().isEmpty()) {
-        // Given up: the cell has what it had.
-        line->setText(mBefore);
-        line->selectAll();
-    }
+    if (event.commitString().isEmpty()) giveUp(*box);
     if (box->isVisible()) mFocus.take(box);
 }
 
-void CellComposer::breakOff() { mBox = nullptr; }
+void CellComposer::breakOff() {
+    if (QWidget* const box = std::exchange(mBox, nullptr)) giveUp(*box);
+}
+
+/// Where nothing has been composed yet, the cell has what it had.
+void CellComposer::giveUp(QWidget& box) const {
+    auto* const line = qobject_cast<QLineEdit*>(&box);
+    if (!line || !line->text().isEmpty()) return;
+    line->setText(mBefore);
+    line->selectAll();
+}
 
 void CellComposer::answer(QInputMethodQueryEvent& query, const QWidget& asked) const {
     for (std::uint32_t bit = 1; bit != 0; bit <<= 1) {

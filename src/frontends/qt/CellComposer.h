@@ -26,6 +26,8 @@ public:
     void answer(QInputMethodQueryEvent& query, const QWidget& asked) const;
 
 private:
+    void giveUp(QWidget& box) const;
+
     FocusTracker& mFocus;
     QPointer<QWidget> mBox;
     QString mBefore; ///< what stood in the box

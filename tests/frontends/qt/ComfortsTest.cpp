@@ -415,6 +415,16 @@ TEST_F(Comforts, TypeInAnotherCellAfterAnInputMethodWasLeft) {
     EXPECT_EQ(model->definitionAt(2).criterion(u"4"), u"9");
 }
 
+TEST_F(Comforts, LeaveACellAsItWasWhenAnInputMethodWasLeft) {
+    standOn(criteriaRow, 1);
+    compose("か");
+    after.setFocus(Qt::MouseFocusReason);
+    calm();
+    EXPECT_EQ(child<QLineEdit>("txtValue").text(), "> 1000");
+    widget->takeOver();
+    EXPECT_EQ(criterion(), u"> 1000");
+}
+
 TEST_F(Comforts, LetAnInputMethodLookForAField) {
     standOn(0, 4);
     compose("to");
