@@ -24,11 +24,13 @@ class TableWindow;
 /// the toolkit where the host ends the control from within a message.
 class Surroundings {
 public:
-    Surroundings(Toolkit& toolkit, int dpi)
-        : scale(dpi), fonts(dpi), drags(*this), navigation(*this), comforts(toolkit) {}
+    Surroundings(Toolkit& toolkit, int dpi, std::shared_ptr<void> keeper)
+        : keeper(std::move(keeper)), scale(dpi), fonts(dpi), drags(*this), navigation(*this),
+          comforts(toolkit) {}
     Surroundings(const Surroundings&) = delete;
     Surroundings& operator=(const Surroundings&) = delete;
 
+    const std::shared_ptr<void> keeper; ///< of the host's; goes last
     Scale scale;
     Fonts fonts;
     Words words;

@@ -7,7 +7,8 @@
 namespace zandor::platform::windows {
 
 struct WindowControl::House final : TalvikDBxZandor::ZandorEvents {
-    House(HWND parent, TalvikDBxZandor::ZandorEvents& host) : toolkit(parent), host(host) {}
+    House(HWND parent, TalvikDBxZandor::ZandorEvents& host, std::shared_ptr<void> keeper)
+        : toolkit(parent, std::move(keeper)), host(host) {}
 
     void Raise(TalvikDBxZandor::Event event,
                const TalvikDBxZandor::EventArguments& arguments) override {
@@ -20,8 +21,8 @@ struct WindowControl::House final : TalvikDBxZandor::ZandorEvents {
 };
 
 WindowControl::WindowControl(HWND parent, TalvikZandorLib::Library& library,
-                             TalvikDBxZandor::ZandorEvents& events)
-    : mHouse(std::make_shared<House>(parent, events)) {
+                             TalvikDBxZandor::ZandorEvents& events, std::shared_ptr<void> keeper)
+    : mHouse(std::make_shared<House>(parent, events, std::move(keeper))) {
     mHouse->control.emplace(mHouse->toolkit, library, *mHouse, mHouse);
     // Not held by itself: it ends with this.
     House& house = *mHouse;

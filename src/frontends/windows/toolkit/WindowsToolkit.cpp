@@ -55,8 +55,8 @@ String sentenceOf(const FormWindow& form, const comforts::Comforts& comforts) {
 
 } // namespace
 
-WindowsToolkit::WindowsToolkit(HWND parent)
-    : mSurroundings(std::make_shared<Surroundings>(*this, dpiOf(parent))),
+WindowsToolkit::WindowsToolkit(HWND parent, std::shared_ptr<void> keeper)
+    : mSurroundings(std::make_shared<Surroundings>(*this, dpiOf(parent), std::move(keeper))),
       mSurface(std::make_shared<ControlWindow>(mSurroundings, parent)) {
     mSurroundings->surface = mSurface.get();
     mSurroundings->focus.setSurface(mSurface.get());

@@ -15,7 +15,8 @@ namespace zandor::platform::windows {
 class WindowsToolkit final : public Toolkit {
 public:
     /// The control's window begins without a size and hidden, until `setBounds` and `show`.
-    explicit WindowsToolkit(HWND parent);
+    /// `keeper` stays as long as one of the windows.
+    explicit WindowsToolkit(HWND parent, std::shared_ptr<void> keeper = {});
     ~WindowsToolkit() override;
 
     /// The control's own window; nullptr once it has gone with its host's.

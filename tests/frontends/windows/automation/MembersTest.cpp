@@ -1,3 +1,4 @@
+#include "Boxes.h"
 #include "Dll.h"
 #include "Late.h"
 
@@ -244,8 +245,10 @@ TEST_F(TheControl, LeavesWordsForACallerWhoErrs) {
 TEST_F(TheControl, FailsForNobodyWhereItReportsToItsUser) {
     // Beyond the scroll range: a box for the user, and the value stays.
     SetErrorInfo(0, nullptr);
+    Boxes::taken();
     EXPECT_EQ(early->put_HorizontalScrollbarPos(32000), S_OK);
     EXPECT_TRUE(control.put(L"VerticalScrollbarPos", std::int32_t{-5}));
+    EXPECT_EQ(Boxes::taken(), (std::vector<std::string>{"Unexpected Error:", "Unexpected Error:"}));
     Held<IErrorInfo> words;
     EXPECT_EQ(GetErrorInfo(0, words.slot()), S_FALSE);
     short value = -1;

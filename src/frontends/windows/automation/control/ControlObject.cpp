@@ -2,13 +2,12 @@
 
 #include "frontends/windows/automation/com/ListEnumerator.h"
 #include "frontends/windows/automation/com/ids.h"
+#include "frontends/windows/automation/control/Safety.h"
 #include "frontends/windows/automation/control/invoke.h"
 
 namespace zandor::automation {
 
 namespace {
-
-constexpr DWORD safety = INTERFACESAFE_FOR_UNTRUSTED_CALLER | INTERFACESAFE_FOR_UNTRUSTED_DATA;
 
 IConnectionPoint* lendPoint(const Held<IConnectionPoint>& point) { return point.copy(); }
 
@@ -20,12 +19,17 @@ ControlObject::ControlObject()
               // The host may let go of its last reference as it hears it.
               const Held<_Zandor> meanwhile(this);
               mEvents.raise(event, arguments);
-          })) {}
+          })) {
+    _Zandor& whole = *this;
+    mFacets.push_back(std::make_unique<Safety>(whole));
+}
 
 ControlObject::~ControlObject() { mHouse->end(); }
 
 void* ControlObject::findMore(REFIID iid) {
     if (iid == IID_IProvideClassInfo) return static_cast<IProvideClassInfo2*>(this);
+    for (const auto& facet : mFacets)
+        if (void* const found = facet->find(iid)) return found;
     return nullptr;
 }
 
@@ -67,26 +71,6 @@ STDMETHODIMP ControlObject::GetGUID(DWORD kind, GUID* id) {
         return E_INVALIDARG;
     }
     *id = ids::controlEvents;
-    return S_OK;
-}
-
-STDMETHODIMP ControlObject::GetInterfaceSafetyOptions(REFIID iid, DWORD* supported,
-                                                      DWORD* enabled) {
-    if (!supported || !enabled) return E_POINTER;
-    *supported = *enabled = 0;
-    Held<IUnknown> there;
-    if (FAILED(QueryInterface(iid, there.slotOfAny()))) return E_NOINTERFACE;
-    *supported = safety;
-    *enabled = mSafety;
-    return S_OK;
-}
-
-STDMETHODIMP ControlObject::SetInterfaceSafetyOptions(REFIID iid, DWORD mask, DWORD enabled) {
-    Held<IUnknown> there;
-    if (FAILED(QueryInterface(iid, there.slotOfAny()))) return E_NOINTERFACE;
-    // Neither reads nor writes anything but the model that it is handed, so it is safe as it is.
-    if (mask & enabled & ~safety) return E_FAIL;
-    mSafety = (mSafety & ~mask) | (enabled & mask);
     return S_OK;
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "frontends/windows/automation/com/Dual.h"
+#include "frontends/windows/automation/com/Facet.h"
 #include "frontends/windows/automation/control/ConnectionPoint.h"
 #include "frontends/windows/automation/control/House.h"
 
@@ -11,8 +12,7 @@ namespace zandor::automation {
 /// The control as an object of automation: its public interface early- and late-bound, its events,
 /// and what a host asks about it. No member of the public interface fails for what the control
 /// reports to its user.
-class ControlObject final
-    : public Dual<_Zandor, IConnectionPointContainer, IProvideClassInfo2, IObjectSafety> {
+class ControlObject final : public Dual<_Zandor, IConnectionPointContainer, IProvideClassInfo2> {
 public:
     ControlObject();
     ~ControlObject() override;
@@ -48,8 +48,6 @@ public:
     // What it is
     STDMETHODIMP GetClassInfo(ITypeInfo** info) override;
     STDMETHODIMP GetGUID(DWORD kind, GUID* id) override;
-    STDMETHODIMP GetInterfaceSafetyOptions(REFIID iid, DWORD* supported, DWORD* enabled) override;
-    STDMETHODIMP SetInterfaceSafetyOptions(REFIID iid, DWORD mask, DWORD enabled) override;
 
 protected:
     void* findMore(REFIID iid) override;
@@ -64,7 +62,7 @@ private:
 
     ConnectionPoint mEvents{*this};
     const std::shared_ptr<House> mHouse;
-    DWORD mSafety = 0; ///< as somebody has asked for it
+    std::vector<std::unique_ptr<Facet>> mFacets; ///< what else it is
 };
 
 } // namespace zandor::automation

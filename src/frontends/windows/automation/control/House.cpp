@@ -4,15 +4,15 @@ namespace zandor::automation {
 
 std::shared_ptr<House> House::build(Sink sink) {
     const std::shared_ptr<House> house(new House(std::move(sink)));
-    house->mControl.emplace(*house->mToolkit, house->mLibrary, *house, house);
-    house->mLibrary.serve(*house->mControl);
-    house->mControl->UserControl_Resize();
+    house->mControl.emplace(house->mHidden.handle(), house->mLibrary, *house, house);
+    house->mZandor = &house->mControl->control();
+    house->mLibrary.serve(*house->mZandor);
     return house;
 }
 
 void House::end() {
     mSink = {};
-    mControl->End();
+    mControl.reset();
 }
 
 } // namespace zandor::automation

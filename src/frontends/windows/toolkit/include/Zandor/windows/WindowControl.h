@@ -24,10 +24,11 @@ namespace zandor::platform::windows {
 class WindowControl {
 public:
     /// The window begins without a size and hidden, until `setBounds` and `show`. Library and
-    /// events outlive this; `events` is told what the comforts leave of them. std::bad_alloc where
-    /// the system has no window to give.
+    /// events outlive this; `events` is told what the comforts leave of them. `keeper` is held
+    /// until the last message of the last of its windows has been dealt with, which may be after
+    /// this has gone. std::bad_alloc where the system has no window to give.
     WindowControl(HWND parent, TalvikZandorLib::Library& library,
-                  TalvikDBxZandor::ZandorEvents& events);
+                  TalvikDBxZandor::ZandorEvents& events, std::shared_ptr<void> keeper = {});
     WindowControl(const WindowControl&) = delete;
     WindowControl& operator=(const WindowControl&) = delete;
     /// Ends the control; its closing boxes are shown. Its boxes, its dialog, its menu and its drag
