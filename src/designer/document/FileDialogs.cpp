@@ -20,7 +20,7 @@ void prepare(QFileDialog& dialog, const QueryFile& file) {
     dialog.setNameFilters(
         {FileDialogs::tr("Zandor queries (*.json)"), FileDialogs::tr("All files (*)")});
     dialog.setDefaultSuffix(QStringLiteral("json"));
-    const QString path = file.path();
+    const QString& path = file.path();
     dialog.setDirectory(path.isEmpty()
                             ? QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation)
                             : QFileInfo(path).absolutePath());

@@ -79,7 +79,7 @@ QString StepName::of(const Change& change) {
         if (!alike(pair.before, pair.after)) definitionsChanged.push_back(pair);
 
     // What hangs on a table goes and is written anew with it.
-    const QString ofTables = tables(change);
+    QString ofTables = tables(change);
     if (!ofTables.isEmpty()) return ofTables;
     const QString ofJoins = joins(change.joins);
     const QString ofDefinitions = definitions(change.definitions, definitionsChanged);

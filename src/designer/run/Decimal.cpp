@@ -153,8 +153,9 @@ Decimal DecimalSum::total() const {
         result.negative = true;
         blocks = carried(-1).first;
     }
-    for (auto block = blocks.rbegin(); block != blocks.rend(); ++block)
-        result.digits += QByteArray::number(*block).rightJustified(digitsOfABlock, '0');
+    std::ranges::reverse(blocks);
+    for (const qint64 block : blocks)
+        result.digits += QByteArray::number(block).rightJustified(digitsOfABlock, '0');
     // The blocks may go further behind the point than any value does.
     result.digits.chop(-lowest * digitsOfABlock - mScale);
     dropZerosInFront(result.digits);
