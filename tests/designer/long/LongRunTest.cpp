@@ -75,8 +75,13 @@ void expectFlat(std::vector<double> samples, const char* what) {
 
 class ALongRun : public OpenWindow {
 protected:
-    // Qt keeps the names of all pictures that have ever been in its cache: none gets in.
-    ALongRun() { QPixmapCache::setCacheLimit(0); }
+    ALongRun() {
+        // Qt keeps the names of all pictures that have ever been in its cache: none gets in.
+        QPixmapCache::setCacheLimit(0);
+        // The allocator keeps room for each thread, which malloc_trim() leaves: here they share
+        // one.
+        mallopt(M_ARENA_MAX, 1);
+    }
     ~ALongRun() override { QPixmapCache::setCacheLimit(mCacheLimit); }
 
     void open() {
