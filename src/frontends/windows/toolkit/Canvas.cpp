@@ -87,7 +87,8 @@ void Canvas::makeCurrent(CanvasLine* line) {
 LRESULT Canvas::handle(const Message& message) {
     switch (message.id) {
     case WM_ERASEBKGND: return 1;
-    case WM_PAINT: paint(); return 0;
+    case WM_PRINTCLIENT:
+    case WM_PAINT: paint(message); return 0;
     case WM_SETFOCUS:
     case WM_KILLFOCUS: repaint(); return 0;
     case WM_LBUTTONDOWN:
@@ -116,12 +117,12 @@ LRESULT Canvas::handle(const Message& message) {
     return Window::handle(message);
 }
 
-void Canvas::paint() {
-    const Painting painting(hwnd());
+void Canvas::paint(const Message& message) {
+    const Painting painting(hwnd(), message);
     const RECT& stale = painting.place();
     if (IsRectEmpty(&stale)) return;
     const Buffer buffer(painting.dc(), stale);
-    fill(buffer.dc(), stale, systemColour(COLOR_BTNFACE));
+    fill(buffer.dc(), stale, surroundings().ground());
     std::vector<const CanvasItem*> shown;
     for (const CanvasItem* item : mItems) {
         if (!item->visible()) continue;

@@ -49,7 +49,7 @@ protected:
     void forget() override;
 
 private:
-    void paint();
+    void paint(const Message& message);
     void press(const Message& message);
     void report(const MouseEvent& handler, const Message& message) const;
     bool keyPressed(const Message& message);

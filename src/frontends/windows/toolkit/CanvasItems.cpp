@@ -13,8 +13,8 @@ namespace {
 
 constexpr int haloWidth = 7; ///< of the shine around a line with the focus, in logical pixels
 
-COLORREF outline() {
-    return mixed(systemColour(COLOR_BTNFACE), systemColour(COLOR_WINDOWTEXT), 0.6);
+COLORREF outline(const Surroundings& around, double share = 0.6) {
+    return mixed(around.ground(), around.ink(), share);
 }
 
 } // namespace
@@ -22,7 +22,9 @@ COLORREF outline() {
 CanvasItem::CanvasItem(const std::shared_ptr<Canvas>& canvas, StringView name, std::int16_t index)
     : mCanvas(canvas), mName(String(name) + u'(' + decimal(index) + u')'), mIndex(index) {}
 
-const Scale& CanvasItem::scale() const { return mCanvas->surroundings().scale; }
+Surroundings& CanvasItem::around() const { return mCanvas->surroundings(); }
+
+const Scale& CanvasItem::scale() const { return around().scale; }
 
 POINT CanvasItem::pixelPoint(float x, float y) const {
     return {scale().toPixels(x), scale().toPixels(y)};
@@ -169,17 +171,14 @@ void CanvasLine::paint(HDC dc) const {
     const POINT to = pixelPoint(mX2, mY2);
     const COLORREF highlight = systemColour(COLOR_HIGHLIGHT);
     if (focused())
-        line(dc, from, to, mixed(systemColour(COLOR_BTNFACE), highlight, 0.35),
-             scale().pixels(haloWidth));
+        line(dc, from, to, mixed(around().ground(), highlight, 0.35), scale().pixels(haloWidth));
     const int width = highlighted ? std::max<int>(mBorderWidth, 2) : 1;
-    line(dc, from, to, highlighted ? highlight : outline(), scale().pixels(width));
+    line(dc, from, to, highlighted ? highlight : outline(around()), scale().pixels(width));
 }
 
 void CanvasLine::paintAbove(HDC dc) const {
     const bool highlighted = mBorderWidth > 1 || focused();
-    const COLORREF edge =
-        highlighted ? systemColour(COLOR_HIGHLIGHT)
-                    : mixed(systemColour(COLOR_BTNFACE), systemColour(COLOR_WINDOWTEXT), 0.45);
+    const COLORREF edge = highlighted ? systemColour(COLOR_HIGHLIGHT) : outline(around(), 0.45);
     for (const Plate& plate : plates()) {
         const HGDIOBJ pen = SelectObject(dc, GetStockObject(DC_PEN));
         const HGDIOBJ brush = SelectObject(dc, GetStockObject(DC_BRUSH));
@@ -233,7 +232,7 @@ bool CanvasShape::touchesFocus() const {
 void CanvasShape::paint(HDC dc) const {
     const bool filled = touchesFocus();
     const RECT box = scale().toPixels(mBounds);
-    const COLORREF edge = filled ? systemColour(COLOR_HIGHLIGHT) : outline();
+    const COLORREF edge = filled ? systemColour(COLOR_HIGHLIGHT) : outline(around());
     const COLORREF filling = filled ? edge : systemColour(COLOR_WINDOW);
     const HGDIOBJ pen = SelectObject(dc, GetStockObject(DC_PEN));
     const HGDIOBJ brush = SelectObject(dc, GetStockObject(DC_BRUSH));

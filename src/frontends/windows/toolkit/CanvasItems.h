@@ -40,6 +40,7 @@ protected:
     void leave();
     Canvas* canvas() const { return mCanvas->isAlive() ? mCanvas.get() : nullptr; }
     POINT pixelPoint(float x, float y) const;
+    Surroundings& around() const;
     const Scale& scale() const;
 
 private:

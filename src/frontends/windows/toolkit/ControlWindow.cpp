@@ -28,6 +28,7 @@ void ControlWindow::forget() {
     onResize = nullptr;
     onPaint = nullptr;
     onLeave = nullptr;
+    surroundings().onFocus = nullptr;
     surroundings().surface = nullptr;
 }
 
@@ -62,11 +63,12 @@ LRESULT ControlWindow::handle(const Message& message) {
         if (const PlainEvent paint = onPaint) paint();
         return 0;
     case WM_ERASEBKGND: return 1;
+    case WM_PRINTCLIENT:
     case WM_PAINT: {
         RECT stale{};
-        if (!GetUpdateRect(hwnd(), &stale, FALSE)) paintLater();
-        const Painting painting(hwnd());
-        fill(painting.dc(), painting.place(), systemColour(COLOR_BTNFACE));
+        if (message.id == WM_PAINT && !GetUpdateRect(hwnd(), &stale, FALSE)) paintLater();
+        const Painting painting(hwnd(), message);
+        fill(painting.dc(), painting.place(), surroundings().ground());
         return 0;
     }
     case WM_SETFOCUS:

@@ -1,6 +1,7 @@
 #include "frontends/windows/toolkit/Drawing.h"
 
 #include "frontends/windows/toolkit/Text.h"
+#include "frontends/windows/toolkit/Window.h"
 
 #include <cmath>
 
@@ -19,6 +20,20 @@ Buffer::~Buffer() {
     SelectObject(mDc, mBefore);
     DeleteObject(mBitmap);
     DeleteDC(mDc);
+}
+
+Painting::Painting(HWND window, const Message& message)
+    : mWindow(message.id == WM_PAINT ? window : nullptr) {
+    if (mWindow) {
+        BeginPaint(mWindow, &mPaint);
+    } else {
+        mPaint.hdc = reinterpret_cast<HDC>(message.w);
+        GetClientRect(window, &mPaint.rcPaint);
+    }
+}
+
+Painting::~Painting() {
+    if (mWindow) EndPaint(mWindow, &mPaint);
 }
 
 COLORREF mixed(COLORREF one, COLORREF other, double share) {

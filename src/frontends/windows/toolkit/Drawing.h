@@ -6,6 +6,8 @@
 
 namespace zandor::platform::windows {
 
+struct Message;
+
 /// A picture in memory that is shown at once when it is done, so that nothing flickers. Drawing
 /// goes by the coordinates of what it is shown in.
 class Buffer {
@@ -26,19 +28,20 @@ private:
     HGDIOBJ mBefore;
 };
 
-/// What a window paints when the system asks it to.
+/// What a window paints when it is asked to: by the system the part that is stale (WM_PAINT), for a
+/// picture of it the whole (WM_PRINTCLIENT).
 class Painting {
 public:
-    explicit Painting(HWND window) : mWindow(window) { BeginPaint(window, &mPaint); }
+    Painting(HWND window, const Message& message);
     Painting(const Painting&) = delete;
     Painting& operator=(const Painting&) = delete;
-    ~Painting() { EndPaint(mWindow, &mPaint); }
+    ~Painting();
 
     HDC dc() const { return mPaint.hdc; }
     const RECT& place() const { return mPaint.rcPaint; }
 
 private:
-    HWND mWindow;
+    HWND mWindow; ///< nullptr: for a picture
     PAINTSTRUCT mPaint{};
 };
 

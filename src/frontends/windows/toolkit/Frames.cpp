@@ -95,8 +95,9 @@ LRESULT RowWindow::handle(const Message& message) {
     case WM_ERASEBKGND: return 1;
     case WM_LBUTTONDOWN: return 0;
     case WM_CTLCOLORSTATIC: return reinterpret_cast<LRESULT>(GetSysColorBrush(COLOR_BTNFACE));
+    case WM_PRINTCLIENT:
     case WM_PAINT: {
-        const Painting painting(hwnd());
+        const Painting painting(hwnd(), message);
         fill(painting.dc(), area(), systemColour(COLOR_BTNFACE));
         if (mOutermost) frame(painting.dc(), area(), systemColour(COLOR_HIGHLIGHT));
         return 0;

@@ -192,8 +192,8 @@ void GridWindow::resizeColumn(std::int32_t col, int pixels) {
     widthsChanged();
 }
 
-void GridWindow::paint() {
-    const Painting painting(hwnd());
+void GridWindow::paint(const Message& message) {
+    const Painting painting(hwnd(), message);
     const RECT& stale = painting.place();
     if (IsRectEmpty(&stale)) return;
     const Buffer buffer(painting.dc(), stale);
@@ -274,7 +274,8 @@ void GridWindow::paintCell(HDC dc, std::int32_t row, std::int32_t col) const {
 LRESULT GridWindow::handle(const Message& message) {
     switch (message.id) {
     case WM_ERASEBKGND: return 1;
-    case WM_PAINT: paint(); return 0;
+    case WM_PRINTCLIENT:
+    case WM_PAINT: paint(message); return 0;
     case WM_SIZE: showRanges(); return 0;
     case WM_SHOWWINDOW: showRanges(); break;
     case WM_HSCROLL:

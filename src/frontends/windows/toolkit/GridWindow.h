@@ -61,7 +61,7 @@ protected:
     void fontChanged() override;
 
 private:
-    void paint();
+    void paint(const Message& message);
     void paintCell(HDC dc, std::int32_t row, std::int32_t col) const;
     String shownText(std::int32_t row, const String& text, int room) const;
     void showRanges();

@@ -272,8 +272,9 @@ LRESULT PickWindow::handle(const Message& message) {
     switch (message.id) {
     case WM_SIZE: arrange(); return 0;
     case WM_ERASEBKGND: return 1;
+    case WM_PRINTCLIENT:
     case WM_PAINT: {
-        const Painting painting(hwnd());
+        const Painting painting(hwnd(), message);
         fill(painting.dc(), area(), systemColour(COLOR_WINDOW));
         frame(painting.dc(), area(), systemColour(COLOR_HIGHLIGHT));
         return 0;

@@ -24,6 +24,10 @@ UINT wheelLines() {
 
 } // namespace
 
+COLORREF Surroundings::ground() const { return hostsGround.value_or(GetSysColor(COLOR_BTNFACE)); }
+
+COLORREF Surroundings::ink() const { return hostsInk.value_or(GetSysColor(COLOR_WINDOWTEXT)); }
+
 bool Surroundings::holds(HWND window) const {
     const HWND own = surfaceHandle();
     return own && window && (window == own || IsChild(own, window));

@@ -52,8 +52,17 @@ public:
     PopupMenu* contextMenu = nullptr;
     PopupMenu* openMenu = nullptr; ///< while it stands open
 
+    // The host's, where it has some for what stands in it.
+    std::optional<COLORREF> hostsGround, hostsInk;
+    /// What the canvas is painted with, and its lines.
+    COLORREF ground() const;
+    COLORREF ink() const;
+
     /// Whether a window is the control's own or one in it.
     bool holds(HWND window) const;
+    /// The focus has come into the control from elsewhere, or has gone there.
+    std::function<void(bool has)> onFocus;
+
     /// The control's own window as a handle; nullptr: it has gone.
     HWND surfaceHandle() const { return surface ? surface->hwnd() : nullptr; }
     /// The part of the canvas that is not scrolled away or covered by bars and grid, in its own

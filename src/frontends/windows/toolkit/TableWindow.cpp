@@ -120,8 +120,8 @@ TableWindow::Colours TableWindow::colours() const {
     return {mixed(window, text, 0.08), text, mixed(window, text, 0.35)};
 }
 
-void TableWindow::paint() {
-    const Painting painting(hwnd());
+void TableWindow::paint(const Message& message) {
+    const Painting painting(hwnd(), message);
     if (IsRectEmpty(&painting.place())) return;
     const Buffer buffer(painting.dc(), painting.place());
     const Colours looks = colours();
@@ -175,7 +175,8 @@ LRESULT TableWindow::handle(const Message& message) {
         repaint();
         return 0;
     case WM_ERASEBKGND: return 1;
-    case WM_PAINT: paint(); return 0;
+    case WM_PRINTCLIENT:
+    case WM_PAINT: paint(message); return 0;
     case WM_SETFOCUS: SetFocus(mList->hwnd()); return 0;
     case WM_SETCURSOR:
         if (LOWORD(message.l) == HTCLIENT && reinterpret_cast<HWND>(message.w) == hwnd() &&

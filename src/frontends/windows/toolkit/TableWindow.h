@@ -72,7 +72,7 @@ private:
     RECT listPlace() const;
     unsigned edgesAt(POINT at) const;
     void arrange();
-    void paint();
+    void paint(const Message& message);
     void press(const Message& message);
     void move(const Message& message);
     void release(const Message& message);

@@ -117,6 +117,7 @@ LRESULT Window::dispatch(const Message& message) {
         result = mEnded || !held ? passOn(message) : handle(message);
         if (message.id == WM_SETFOCUS && isAlive()) mSurroundings->focus.entered(*this);
         if (message.id == WM_KILLFOCUS) lostFocus(reinterpret_cast<HWND>(message.w));
+        tellHostOfFocus(message);
     }
     --mDepth;
     destroyIfIdle();
@@ -131,6 +132,13 @@ void Window::lostFocus(HWND to) {
     if (!editor || !to || IsChild(editor->hwnd(), to)) return;
     if (GetAncestor(to, GA_ROOT) == GetAncestor(mHandle, GA_ROOT))
         mSurroundings->comforts.editorLeft();
+}
+
+void Window::tellHostOfFocus(const Message& message) const {
+    if (message.id != WM_SETFOCUS && message.id != WM_KILLFOCUS) return;
+    if (!mSurroundings->holds(mHandle) || mSurroundings->holds(reinterpret_cast<HWND>(message.w)))
+        return;
+    if (const auto tell = mSurroundings->onFocus) tell(message.id == WM_SETFOCUS);
 }
 
 LRESULT Window::passOn(const Message& message) const {

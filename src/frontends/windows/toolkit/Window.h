@@ -103,6 +103,7 @@ private:
     LRESULT dispatch(const Message& message);
     void destroyIfIdle();
     void lostFocus(HWND to);
+    void tellHostOfFocus(const Message& message) const;
 
     const std::shared_ptr<Surroundings> mSurroundings;
     std::shared_ptr<Window> mSelf; ///< from its end until the system's window has gone

@@ -1,6 +1,7 @@
 #include <Zandor/windows/WindowControl.h>
 
 #include "frontends/windows/toolkit/WindowsToolkit.h"
+#include "frontends/windows/toolkit/print.h"
 
 #include <optional>
 
@@ -57,6 +58,20 @@ void WindowControl::setFont(HFONT font) const { mHouse->toolkit.setFont(font); }
 
 void WindowControl::onLeave(std::function<bool(bool next)> leave) const {
     mHouse->toolkit.onLeave(std::move(leave));
+}
+
+void WindowControl::onFocus(std::function<void(bool has)> change) const {
+    mHouse->toolkit.onFocus(std::move(change));
+}
+
+void WindowControl::setColours(std::optional<COLORREF> ground, std::optional<COLORREF> ink) const {
+    mHouse->toolkit.setColours(ground, ink);
+}
+
+void WindowControl::setSilent(bool value) const { mHouse->toolkit.setSilent(value); }
+
+void WindowControl::print(HDC dc) const {
+    if (const HWND own = window()) windows::print(own, dc);
 }
 
 void WindowControl::close() const { mHouse->toolkit.close(); }

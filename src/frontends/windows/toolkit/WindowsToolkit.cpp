@@ -74,6 +74,13 @@ void WindowsToolkit::setFont(HFONT font) {
     if (const PlainEvent resized = mSurface->onResize) resized();
 }
 
+void WindowsToolkit::setColours(std::optional<COLORREF> ground, std::optional<COLORREF> ink) {
+    mSurroundings->hostsGround = ground;
+    mSurroundings->hostsInk = ink;
+    for (const auto& part : partsIn(window())) part->repaint();
+    mSurface->repaint();
+}
+
 void WindowsToolkit::setWords(const Words& words) {
     mSurroundings->words = words;
     // Spoken.

@@ -26,6 +26,8 @@ public:
     void show(bool value) { mSurface->show(value); }
     /// The font of the host's surroundings; the host keeps its handle. nullptr: the system's own.
     void setFont(HFONT font);
+    /// What the canvas and its lines are painted with; none: the system's own.
+    void setColours(std::optional<COLORREF> ground, std::optional<COLORREF> ink);
     /// What the parts say that no property of the control does.
     void setWords(const Words& words);
     comforts::Comforts& comforts() { return mSurroundings->comforts; }
@@ -36,6 +38,7 @@ public:
     void onResize(PlainEvent event) { mSurface->onResize = std::move(event); }
     void onPaint(PlainEvent event) { mSurface->onPaint = std::move(event); }
     void onLeave(std::function<bool(bool next)> event) { mSurface->onLeave = std::move(event); }
+    void onFocus(std::function<void(bool has)> event) { mSurroundings->onFocus = std::move(event); }
     /// onPaint follows from the message loop.
     void paintLater() { mSurface->paintLater(); }
     /// Boxes are left out.

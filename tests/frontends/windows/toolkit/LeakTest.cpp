@@ -1,11 +1,11 @@
 #include "support/FakeModel.h"
+#include "support/SystemObjects.h"
 #include "support/WindowsHands.h"
 
 #include <Zandor/windows/WindowControl.h>
 
 #include <gtest/gtest.h>
 
-#include <cstdint>
 #include <cstdio>
 #include <cstdlib>
 
@@ -16,28 +16,6 @@ namespace {
 class NobodyHears final : public TalvikDBxZandor::ZandorEvents {
 public:
     void Raise(TalvikDBxZandor::Event, const TalvikDBxZandor::EventArguments&) override {}
-};
-
-/// The objects of this process that the system counts; where it does not count them, as Wine does
-/// not, those that there is a handle of.
-struct Objects {
-    int drawing = 0;
-    int windows = 0;
-
-    static Objects now() {
-        Objects objects{static_cast<int>(GetGuiResources(GetCurrentProcess(), GR_GDIOBJECTS)),
-                        static_cast<int>(GetGuiResources(GetCurrentProcess(), GR_USEROBJECTS))};
-        if (objects.drawing != 0) return objects;
-        for (std::uintptr_t handle = 1; handle <= 0xFFFF; ++handle)
-            if (GetObjectType(reinterpret_cast<HGDIOBJ>(handle))) ++objects.drawing;
-        for (std::uintptr_t handle = 0x20; handle <= 0xFFFF; handle += 2) {
-            DWORD process = 0;
-            GetWindowThreadProcessId(reinterpret_cast<HWND>(handle), &process);
-            if (process == GetCurrentProcessId() || IsMenu(reinterpret_cast<HMENU>(handle)))
-                ++objects.windows;
-        }
-        return objects;
-    }
 };
 
 /// A host's window with a control over two tables, a join and an output column, shown, scrolled,
@@ -82,9 +60,9 @@ TEST(ControlsOpenedAndClosed, LeaveNoObjectOfTheSystemsBehind) {
     const int controls = given ? std::atoi(given) : 100;
     constexpr int settled = 10;
     for (int i = 0; i < settled; ++i) openAndClose();
-    const Objects before = Objects::now();
+    const SystemObjects before = SystemObjects::now();
     for (int i = 0; i < controls; ++i) openAndClose();
-    const Objects after = Objects::now();
+    const SystemObjects after = SystemObjects::now();
     std::printf("%d controls: %d drawing objects before, %d after; %d windows before, %d after\n",
                 controls, before.drawing, after.drawing, before.windows, after.windows);
     EXPECT_GT(before.drawing, 0);

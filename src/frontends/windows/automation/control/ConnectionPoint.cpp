@@ -41,7 +41,20 @@ std::vector<Value> argumentsOf(Event event, const EventArguments& given) {
 
 } // namespace
 
+void ConnectionPoint::thaw() {
+    if (mFrozen == 0 || --mFrozen > 0) return;
+    while (mFrozen == 0 && !mWaiting.empty()) {
+        const auto next = std::move(mWaiting.front());
+        mWaiting.pop_front();
+        raise(next.first, next.second);
+    }
+}
+
 void ConnectionPoint::raise(Event event, const EventArguments& given) {
+    if (mFrozen > 0) {
+        mWaiting.emplace_back(event, given);
+        return;
+    }
     const std::vector<Sink> sinks = mSinks;
     std::vector<Value> arguments = argumentsOf(event, given);
     for (const Sink& sink : sinks) {

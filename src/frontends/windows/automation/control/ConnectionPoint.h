@@ -4,6 +4,8 @@
 
 #include <Zandor/control/Events.h>
 
+#include <deque>
+#include <utility>
 #include <vector>
 
 namespace zandor::automation {
@@ -17,6 +19,10 @@ public:
     /// Tells all that listen, in the order in which they came. One that goes meanwhile is not told,
     /// and what one answers is nobody's business.
     void raise(TalvikDBxZandor::Event event, const TalvikDBxZandor::EventArguments& arguments);
+    /// From now on nobody is told anything, as often as this is said, until it is taken back as
+    /// often; then all are told what has happened meanwhile, in that order.
+    void freeze() { ++mFrozen; }
+    void thaw();
     /// Lets go of all that listen.
     void forget() { mSinks.clear(); }
 
@@ -41,6 +47,8 @@ private:
 
     IConnectionPointContainer& mWhole;
     std::vector<Sink> mSinks;
+    std::deque<std::pair<TalvikDBxZandor::Event, TalvikDBxZandor::EventArguments>> mWaiting;
+    int mFrozen = 0;
     DWORD mLastCookie = 0;
 };
 

@@ -56,6 +56,7 @@ HRESULT ControlObject::write(std::uint32_t number, Raw value) {
         const Held<_Zandor> meanwhile(this);
         const auto& member = memberOf(number);
         member.set(mHouse->control(), fromHost(member.type, lent(value)));
+        pictureChanged();
     });
 }
 
@@ -88,6 +89,7 @@ HRESULT ControlObject::readObject(std::uint32_t number, Object** value) {
         return answer([&] { \
             const Held<_Zandor> meanwhile(this); \
             memberOf(number).set(mHouse->control(), fromHost<TalvikZandorLib::Zandor>(value)); \
+            pictureChanged(); \
         }); \
     }
 #define ZANDOR_NOTHING(number, type, name) \
@@ -98,6 +100,7 @@ HRESULT ControlObject::readObject(std::uint32_t number, Object** value) {
 STDMETHODIMP ControlObject::Terminate() {
     const Held<_Zandor> meanwhile(this);
     mHouse->control().Terminate();
+    pictureChanged();
     return S_OK;
 }
 
@@ -105,6 +108,7 @@ STDMETHODIMP ControlObject::SelectColumnNames(BSTR* TabName, BSTR* ColName) {
     return answer([&] {
         const Held<_Zandor> meanwhile(this);
         mHouse->control().SelectColumnNames(textOf(placeOf(TabName)), textOf(placeOf(ColName)));
+        pictureChanged();
     });
 }
 
@@ -112,6 +116,7 @@ STDMETHODIMP ControlObject::SetCurrentTable(BSTR TabName) {
     return answer([&] {
         const Held<_Zandor> meanwhile(this);
         mHouse->control().SetCurrentTable(textOf(TabName));
+        pictureChanged();
     });
 }
 

@@ -2,6 +2,10 @@
 
 #include "frontends/windows/automation/com/ListEnumerator.h"
 #include "frontends/windows/automation/com/ids.h"
+#include "frontends/windows/automation/container/ControlSide.h"
+#include "frontends/windows/automation/container/InPlaceObject.h"
+#include "frontends/windows/automation/container/OleObject.h"
+#include "frontends/windows/automation/container/QuickActivation.h"
 #include "frontends/windows/automation/control/Safety.h"
 #include "frontends/windows/automation/control/invoke.h"
 
@@ -19,12 +23,28 @@ ControlObject::ControlObject()
               // The host may let go of its last reference as it hears it.
               const Held<_Zandor> meanwhile(this);
               mEvents.raise(event, arguments);
-          })) {
+          })),
+      mPlacement(static_cast<_Zandor&>(*this), *mHouse, [this] { pictureChanged(); }) {
     _Zandor& whole = *this;
+    auto view = std::make_unique<View>(whole, *mHouse, mPlacement);
+    mView = view.get();
     mFacets.push_back(std::make_unique<Safety>(whole));
+    mFacets.push_back(std::make_unique<OleObject>(whole, mPlacement));
+    mFacets.push_back(std::make_unique<InPlaceObject>(whole, mPlacement));
+    mFacets.push_back(std::make_unique<ControlSide>(whole, mPlacement, mEvents));
+    mFacets.push_back(std::make_unique<QuickActivation>(whole, mPlacement, *view, mEvents));
+    mFacets.push_back(std::move(view));
 }
 
-ControlObject::~ControlObject() { mHouse->end(); }
+ControlObject::~ControlObject() {
+    mPlacement.end();
+    mHouse->end();
+}
+
+void ControlObject::pictureChanged() {
+    // On the screen everybody sees it.
+    if (mView && !mPlacement.isActive()) mView->changed();
+}
 
 void* ControlObject::findMore(REFIID iid) {
     if (iid == IID_IProvideClassInfo) return static_cast<IProvideClassInfo2*>(this);
@@ -39,7 +59,10 @@ STDMETHODIMP ControlObject::Invoke(DISPID member, REFIID iid, LCID, WORD flags,
     if (iid != IID_NULL) return DISP_E_UNKNOWNINTERFACE;
     if (!arguments) return E_POINTER;
     const Held<_Zandor> meanwhile(this);
-    return invoke(mHouse->control(), member, flags, *arguments, result, failure, wrong);
+    const HRESULT answered =
+        invoke(mHouse->control(), member, flags, *arguments, result, failure, wrong);
+    if (SUCCEEDED(answered) && !(flags & DISPATCH_PROPERTYGET)) pictureChanged();
+    return answered;
 }
 
 STDMETHODIMP ControlObject::EnumConnectionPoints(IEnumConnectionPoints** points) {

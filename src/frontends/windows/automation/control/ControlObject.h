@@ -2,6 +2,8 @@
 
 #include "frontends/windows/automation/com/Dual.h"
 #include "frontends/windows/automation/com/Facet.h"
+#include "frontends/windows/automation/container/Placement.h"
+#include "frontends/windows/automation/container/View.h"
 #include "frontends/windows/automation/control/ConnectionPoint.h"
 #include "frontends/windows/automation/control/House.h"
 
@@ -53,6 +55,7 @@ protected:
     void* findMore(REFIID iid) override;
 
 private:
+    void pictureChanged();
     template <class Value>
     HRESULT read(std::uint32_t member, Value* value);
     template <class Value>
@@ -62,6 +65,8 @@ private:
 
     ConnectionPoint mEvents{*this};
     const std::shared_ptr<House> mHouse;
+    Placement mPlacement;
+    View* mView = nullptr;                       ///< one of the following
     std::vector<std::unique_ptr<Facet>> mFacets; ///< what else it is
 };
 

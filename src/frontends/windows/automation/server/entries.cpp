@@ -4,6 +4,7 @@
 #include "frontends/windows/automation/com/Module.h"
 #include "frontends/windows/automation/com/Text.h"
 #include "frontends/windows/automation/com/ids.h"
+#include "frontends/windows/automation/container/status.h"
 #include "frontends/windows/automation/server/classes.h"
 
 #include <array>
@@ -29,11 +30,6 @@ constexpr const wchar_t* marshaler = L"{00020424-0000-0000-C000-000000000046}";
 constexpr const wchar_t* categories[] = {L"{40FC6ED4-2438-11CF-A3DB-080036F12502}",
                                          L"{7DD95801-9882-11CF-9FA9-00AA006C42C4}",
                                          L"{7DD95802-9882-11CF-9FA9-00AA006C42C4}"};
-/// As GetMiscStatus has it.
-constexpr DWORD status = OLEMISC_RECOMPOSEONRESIZE | OLEMISC_INSIDEOUT |
-                         OLEMISC_ACTIVATEWHENVISIBLE | OLEMISC_CANTLINKINSIDE |
-                         OLEMISC_SETCLIENTSITEFIRST;
-
 struct Library {
     const GUID* id;
     int number; ///< of the resource
@@ -57,7 +53,9 @@ void add(std::vector<Entry>& entries, const CreatableClass& made, const wstring&
     if (!made.isControl) return;
     entries.push_back({key + L"\\Control", L"", L""});
     entries.push_back({key + L"\\MiscStatus", L"", L"0"});
-    entries.push_back({key + L"\\MiscStatus\\1", L"", std::to_wstring(status)});
+    entries.push_back({key + L"\\MiscStatus\\1", L"", std::to_wstring(miscStatus)});
+    entries.push_back({key + L"\\Verb", L"", L""});
+    entries.push_back({key + L"\\Verb\\0", L"", L"&Edit,0,2"});
     entries.push_back({key + L"\\ToolboxBitmap32", L"", file + L", 101"});
     for (const wchar_t* const category : categories)
         entries.push_back({key + L"\\Implemented Categories\\" + category, L"", L""});

@@ -7,6 +7,7 @@
 
 #include <functional>
 #include <memory>
+#include <optional>
 
 #include <windows.h>
 
@@ -49,11 +50,19 @@ public:
     /// Of the host's surroundings; the host keeps its handle. nullptr changes nothing: at first it
     /// is the font of the system's message boxes.
     void setFont(HFONT font) const;
+    /// What the canvas and its lines are painted with; none: the system's own.
+    void setColours(std::optional<COLORREF> ground, std::optional<COLORREF> ink) const;
+    /// Message boxes are left out.
+    void setSilent(bool value) const;
+    /// A picture of the control as large as it is, shown or not: from the device's origin on.
+    void print(HDC dc) const;
     /// Of control, comforts and toolkit.
     void setWords(const Words& words) const;
     /// Tab or Shift+Tab has left the last stop; the answer says whether the focus has gone on.
     /// Unset: the next tab stop of the window around has it.
     void onLeave(std::function<bool(bool next)> leave) const;
+    /// The focus has come into the control from elsewhere, or has gone there.
+    void onFocus(std::function<void(bool has)> change) const;
     /// The host's window is about to go: boxes shown from now on stand on their own.
     void close() const;
 
