@@ -1,5 +1,7 @@
 #include "Scripted.h"
 
+#include "frontends/windows/automation/com/Failure.h"
+
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -20,6 +22,13 @@ std::string kindOf(const VARIANT& value) {
     case VT_DISPATCH: return "DISPATCH";
     default: return std::to_string(value.vt);
     }
+}
+
+HRESULT fail(EXCEPINFO* failure, const Scripted::Failure& thrown) {
+    if (!failure) return DISP_E_EXCEPTION;
+    failure->scode = thrown.code;
+    failure->bstrDescription = newText(thrown.text);
+    return DISP_E_EXCEPTION;
 }
 
 } // namespace
@@ -115,8 +124,8 @@ STDMETHODIMP Scripted::Invoke(DISPID id, REFIID, LCID, WORD how, DISPPARAMS* arg
         if (result) answered.moveTo(*result);
         return S_OK;
     } catch (const Failure& thrown) {
-        failure->scode = thrown.code;
-        failure->bstrDescription = newText(thrown.text);
-        return DISP_E_EXCEPTION;
+        return fail(failure, thrown);
+    } catch (const platform::RuntimeError& error) {
+        return fail(failure, {codeOf(error.Number), error.Description});
     }
 }

@@ -1,5 +1,9 @@
 #include "frontends/windows/automation/host/HostObject.h"
 
+#include "frontends/windows/automation/com/Text.h"
+
+#include <dispex.h>
+
 namespace zandor::automation {
 
 namespace {
@@ -18,9 +22,24 @@ platform::RuntimeError errorOf(EXCEPINFO& failure) {
     return error;
 }
 
+// Objects of a script may have their members by IDispatchEx alone.
+
 HRESULT find(IDispatch& object, const wchar_t* member, DISPID& number) {
     auto* name = const_cast<wchar_t*>(member);
-    return object.GetIDsOfNames(IID_NULL, &name, 1, LOCALE_USER_DEFAULT, &number);
+    const HRESULT found = object.GetIDsOfNames(IID_NULL, &name, 1, LOCALE_USER_DEFAULT, &number);
+    const auto extended = found == E_NOTIMPL ? Held<IDispatchEx>::of(&object) : nullptr;
+    if (!extended) return found;
+    const Text text(reinterpret_cast<const char16_t*>(member));
+    return extended->GetDispID(text.get(), fdexNameCaseInsensitive, &number);
+}
+
+HRESULT run(IDispatch& object, DISPID number, WORD how, DISPPARAMS& given, VARIANT* result,
+            EXCEPINFO& failure) {
+    const HRESULT code = object.Invoke(number, IID_NULL, LOCALE_USER_DEFAULT, how, &given, result,
+                                       &failure, nullptr);
+    const auto extended = code == E_NOTIMPL ? Held<IDispatchEx>::of(&object) : nullptr;
+    if (!extended) return code;
+    return extended->InvokeEx(number, LOCALE_USER_DEFAULT, how, &given, result, &failure, nullptr);
 }
 
 } // namespace
@@ -31,7 +50,7 @@ bool HostObject::has(const wchar_t* member) const {
 }
 
 Value HostObject::get(const wchar_t* member) const {
-    return invoke(member, DISPATCH_PROPERTYGET | DISPATCH_METHOD, nullptr, 0);
+    return invoke(member, DISPATCH_PROPERTYGET, nullptr, 0);
 }
 
 void HostObject::put(const wchar_t* member, Value value) const {
@@ -53,12 +72,16 @@ Value HostObject::invoke(const wchar_t* member, WORD how, Value* arguments,
     }
     Value result;
     EXCEPINFO failure{};
-    HRESULT code = mObject->Invoke(number, IID_NULL, LOCALE_USER_DEFAULT, how, &given,
-                                   writes ? nullptr : &result, &failure, nullptr);
-    // Some know objects as values alone.
+    const auto tried = [&](WORD way) {
+        return run(*mObject.get(), number, way, given, writes ? nullptr : &result, failure);
+    };
+    HRESULT code = tried(how);
+    // Some know objects as values alone, and some values as what is called. Both ways at once would
+    // have a script's engine call what is a value.
     if (code == DISP_E_MEMBERNOTFOUND && how == DISPATCH_PROPERTYPUTREF)
-        code = mObject->Invoke(number, IID_NULL, LOCALE_USER_DEFAULT, DISPATCH_PROPERTYPUT, &given,
-                               nullptr, &failure, nullptr);
+        code = tried(DISPATCH_PROPERTYPUT);
+    else if (code == DISP_E_MEMBERNOTFOUND && how == DISPATCH_PROPERTYGET)
+        code = tried(DISPATCH_METHOD);
     if (code == DISP_E_EXCEPTION) throw errorOf(failure);
     require(code);
     return result;
