@@ -8,6 +8,7 @@
 #include "frontends/windows/automation/container/QuickActivation.h"
 #include "frontends/windows/automation/control/Safety.h"
 #include "frontends/windows/automation/control/invoke.h"
+#include "frontends/windows/automation/keeping/Persistence.h"
 
 namespace zandor::automation {
 
@@ -33,6 +34,7 @@ ControlObject::ControlObject()
     mFacets.push_back(std::make_unique<InPlaceObject>(whole, mPlacement));
     mFacets.push_back(std::make_unique<ControlSide>(whole, mPlacement, mEvents));
     mFacets.push_back(std::make_unique<QuickActivation>(whole, mPlacement, *view, mEvents));
+    mFacets.push_back(std::make_unique<Persistence>(whole, *mHouse));
     mFacets.push_back(std::move(view));
 }
 
