@@ -133,9 +133,10 @@ QRegion CanvasLine::area() const {
     const QPointF from = pixelPoint(mX1, mY1);
     const QPointF way = pixelPoint(mX2, mY2) - from;
     const qreal margin = (focused() ? haloWidth : mBorderWidth) / 2.0 + 1;
-    // A slanting line in pieces: its bounding box is far larger than what it changes.
+    // A slanting line in pieces: its bounding box is far larger than what it changes. More pieces
+    // cost more in regions than they spare in pixels.
     const qreal thin = std::min(std::abs(way.x()), std::abs(way.y()));
-    const int pieces = std::clamp(static_cast<int>(thin / 64), 1, 8);
+    const int pieces = std::clamp(static_cast<int>(thin / 128), 1, 3);
     QRegion region;
     for (int i = 0; i < pieces; ++i) {
         const QPointF start = from + way * i / pieces;
