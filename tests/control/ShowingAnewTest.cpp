@@ -1,5 +1,8 @@
 #include "GridStage.h"
 
+#include "support/Sample.h"
+
+#include <algorithm>
 #include <random>
 #include <set>
 
@@ -561,7 +564,8 @@ TEST_F(ShowingAnewAtRandom, LeadsToWhatANewControlShows) {
     const auto seed = std::random_device()();
     random.seed(seed);
     SCOPED_TRACE("seed " + std::to_string(seed));
-    for (int round = 0; round < 60; ++round) {
+    const int rounds = std::max(3, 60 / sampleStep());
+    for (int round = 0; round < rounds; ++round) {
         for (int n = upTo(6); n >= 0; --n) change();
         showAnew();
         const auto fresh = Stage::open(library);

@@ -205,6 +205,7 @@ TEST_F(TheSlotFreeList, ReportsAnOverflowOfTheRange) {
 }
 
 TEST_F(TheSlotFreeList, ReportsAnOverflowOfTheCountWithTheIndexFreedAlready) {
+    if (sizeof(void*) == 4) GTEST_SKIP() << "32 bits have no room for so many slots";
     ASSERT_TRUE(list.CreateList(0, highest - 1));
     EXPECT_EQ(take(), 0);
     EXPECT_TRUE(list.FreeIndex(1));
