@@ -70,10 +70,67 @@ TEST_F(TheControl, ReadsAndWritesEveryPlainMemberLateBound) {
             EXPECT_EQ(control.get(name.c_str()).value.boolVal, VARIANT_FALSE);
             ASSERT_TRUE(control.put(name.c_str(), true)); // which may have another name
             break;
-        case Type::Integer: ASSERT_EQ(before.value.vt, VT_I2); break;
+        case Type::Integer:
+            ASSERT_EQ(before.value.vt, VT_I2);
+            ASSERT_TRUE(control.put(name.c_str(), before.value.iVal));
+            EXPECT_EQ(control.get(name.c_str()).value.iVal, before.value.iVal);
+            break;
         default: FAIL() << platform::toUtf8(member.name);
         }
     }
+}
+
+TEST_F(TheControl, ReadsAndWritesEveryPlainMemberEarlyBound) {
+    // Which calls each method by its place in the interface.
+    Held<ITypeInfo> info;
+    ASSERT_EQ(early->GetTypeInfo(0, LOCALE_USER_DEFAULT, info.slot()), S_OK);
+    const auto run = [&](const Member& member, WORD how, DISPPARAMS given, Value& result) {
+        return info->Invoke(early.get(), static_cast<MEMBERID>(member.dispatchId), how, &given,
+                            &result, nullptr, nullptr);
+    };
+    for (const Member& member : TalvikDBxZandor::automation::members()) {
+        if (member.setter == Setter::none || member.setter == Setter::object) continue;
+        const std::string name = platform::toUtf8(member.name);
+        Value before;
+        ASSERT_EQ(run(member, DISPATCH_PROPERTYGET, {}, before), S_OK) << name;
+        EXPECT_EQ(control.get(wideName(member).c_str()).value.vt, before.vt) << name;
+        const auto write = [&](Value value) {
+            DISPID written = DISPID_PROPERTYPUT;
+            Value ignored;
+            return run(member, DISPATCH_PROPERTYPUT, {&value, &written, 1, 1}, ignored);
+        };
+        Value after;
+        switch (member.type) {
+        case Type::String:
+            ASSERT_EQ(write(Value(platform::StringView(u"\u00DC ber"))), S_OK) << name;
+            ASSERT_EQ(run(member, DISPATCH_PROPERTYGET, {}, after), S_OK) << name;
+            EXPECT_EQ(textOf(after.bstrVal), u"\u00DC ber") << name;
+            break;
+        case Type::Boolean:
+            ASSERT_EQ(write(Value(false)), S_OK) << name;
+            ASSERT_EQ(run(member, DISPATCH_PROPERTYGET, {}, after), S_OK) << name;
+            EXPECT_EQ(after.boolVal, VARIANT_FALSE) << name;
+            ASSERT_EQ(write(Value(true)), S_OK) << name; // which may have another name
+            break;
+        default:
+            ASSERT_EQ(write(Value(before.iVal)), S_OK) << name;
+            ASSERT_EQ(run(member, DISPATCH_PROPERTYGET, {}, after), S_OK) << name;
+            EXPECT_EQ(after.iVal, before.iVal) << name;
+        }
+    }
+    // What is an object of a kind is called itself.
+    Held<_ZDJoin> join;
+    Held<_ZDTable> table;
+    Held<_ZDColumn> column;
+    EXPECT_EQ(early->get_lastjoin(join.slot()), S_OK);
+    EXPECT_EQ(early->get_activetable(table.slot()), S_OK);
+    EXPECT_EQ(early->get_ActiveColumn(column.slot()), S_OK);
+    EXPECT_FALSE(join || table || column);
+    const auto query = newQuery();
+    Held<_ZDQuery> bound;
+    EXPECT_EQ(early->putref_Zandor(query.get()), S_OK);
+    EXPECT_EQ(early->get_Zandor(bound.slot()), S_OK);
+    EXPECT_EQ(bound.get(), query.get());
 }
 
 TEST_F(TheControl, HasTrueAsMinusOne) {

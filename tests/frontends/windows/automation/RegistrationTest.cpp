@@ -92,6 +92,26 @@ TEST(Registering, SaysWhereTheControlIsAndWhatItIs) {
     EXPECT_EQ(strike(), S_OK);
 }
 
+TEST(Registering, SaysWhatAFormEditorAsksForAndTheLibraryHasIt) {
+    ASSERT_EQ(enrol(), S_OK);
+    const Export all = exported(HKEY_LOCAL_MACHINE);
+    const std::wstring key = L"CLSID\\" + spelled(ids::control);
+    EXPECT_EQ(valueAt(all, key + L"\\ToolboxBitmap32@"), Dll::get().path() + L", 101");
+    EXPECT_EQ(valueAt(all, key + L"\\Version@"), L"1.0");
+    EXPECT_EQ(valueAt(all, key + L"\\MiscStatus@"), L"0");
+    EXPECT_NE(valueAt(all, key + L"\\MiscStatus\\1@"), L"(none)");
+    EXPECT_TRUE(isThere(L"Software\\Classes\\" + key + L"\\Control"));
+    EXPECT_FALSE(isThere(L"Software\\Classes\\" + key + L"\\Insertable"));
+    const HBITMAP picture = LoadBitmapW(Dll::get().module(), MAKEINTRESOURCEW(101));
+    BITMAP about{};
+    EXPECT_NE(GetObjectW(picture, sizeof about, &about), 0);
+    EXPECT_EQ(about.bmWidth, 16);
+    EXPECT_EQ(about.bmHeight, 15);
+    DeleteObject(picture);
+    EXPECT_TRUE(FindResourceW(Dll::get().module(), MAKEINTRESOURCEW(1), RT_VERSION));
+    EXPECT_EQ(strike(), S_OK);
+}
+
 TEST(Registering, LeavesTheLibrariesWhereTheSystemLoadsThemFrom) {
     ASSERT_EQ(enrol(), S_OK);
     for (const GUID& id : {ids::controlLibrary, ids::modelLibrary}) {
