@@ -1,7 +1,6 @@
 #include "Picture.h"
 
-#include <cstdlib>
-#include <fstream>
+#include "writeBitmap.h"
 
 using namespace zandor::automation;
 
@@ -44,15 +43,5 @@ int Picture::otherThan(COLORREF colour) const {
 }
 
 void Picture::keep(const std::string& name) const {
-    const char* const folder = std::getenv("ZANDOR_PICTURES");
-    if (!folder) return;
-    const DWORD bytes = static_cast<DWORD>(mSize.cx * mSize.cy * 4);
-    BITMAPFILEHEADER header{};
-    header.bfType = 0x4D42;
-    header.bfOffBits = sizeof header + sizeof mInfo.bmiHeader;
-    header.bfSize = header.bfOffBits + bytes;
-    std::ofstream file(std::string(folder) + '/' + name + ".bmp", std::ios::binary);
-    file.write(reinterpret_cast<const char*>(&header), sizeof header);
-    file.write(reinterpret_cast<const char*>(&mInfo.bmiHeader), sizeof mInfo.bmiHeader);
-    file.write(reinterpret_cast<const char*>(mPoints), bytes);
+    writeBitmap(mDc, {0, 0, mSize.cx, mSize.cy}, name);
 }
