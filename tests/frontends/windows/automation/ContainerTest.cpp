@@ -171,6 +171,35 @@ TEST_F(AForm, ClosesItsControlAndMayUseItAfterwards) {
     EXPECT_TRUE(IsWindowVisible(own));
 }
 
+TEST_F(AForm, IsAskedToSaveAChangedControlThatIsClosed) {
+    form.tell(OLEIVERB_INPLACEACTIVATE);
+    const auto object = form.as<IOleObject>();
+    EXPECT_EQ(object->Close(7), E_INVALIDARG);
+    EXPECT_TRUE(form.controlWindow());
+    Held<IStream> stream;
+    ASSERT_EQ(CreateStreamOnHGlobal(nullptr, TRUE, stream.slot()), S_OK);
+    EXPECT_EQ(form.as<IPersistStreamInit>()->Save(stream.get(), TRUE), S_OK);
+    form.calls();
+    EXPECT_EQ(object->Close(OLECLOSE_SAVEIFDIRTY), S_OK); // nothing has changed since
+    EXPECT_EQ(form.calls(), Calls{"OnInPlaceDeactivate"});
+
+    VARIANT_BOOL before = VARIANT_FALSE;
+    EXPECT_EQ(form.control()->get_OnlyJoin(&before), S_OK);
+    EXPECT_EQ(form.control()->put_OnlyJoin(before ? VARIANT_FALSE : VARIANT_TRUE), S_OK);
+    form.tell(OLEIVERB_INPLACEACTIVATE);
+    form.calls();
+    form.on["SaveObject"] = [] { return STG_E_MEDIUMFULL; };
+    EXPECT_EQ(object->Close(OLECLOSE_SAVEIFDIRTY), STG_E_MEDIUMFULL);
+    EXPECT_EQ(form.calls(), Calls{"SaveObject"});
+    EXPECT_TRUE(IsWindowVisible(form.controlWindow())) << "what is not saved is not lost";
+    EXPECT_EQ(object->Close(OLECLOSE_PROMPTSAVE), S_OK);
+    EXPECT_EQ(form.calls(), (Calls{"SaveObject", "OnInPlaceDeactivate"}));
+    form.tell(OLEIVERB_INPLACEACTIVATE);
+    form.calls();
+    EXPECT_EQ(object->Close(OLECLOSE_NOSAVE), S_OK);
+    EXPECT_EQ(form.calls(), Calls{"OnInPlaceDeactivate"});
+}
+
 TEST_F(AForm, MayRefuseEachStep) {
     form.on["CanInPlaceActivate"] = [] { return S_FALSE; };
     EXPECT_EQ(form.tell(OLEIVERB_SHOW), E_FAIL);

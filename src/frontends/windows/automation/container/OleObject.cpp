@@ -24,11 +24,23 @@ STDMETHODIMP OleObject::SetHostNames(LPCOLESTR application, LPCOLESTR) {
     return application ? S_OK : E_POINTER;
 }
 
-STDMETHODIMP OleObject::Close(DWORD) {
+STDMETHODIMP OleObject::Close(DWORD save) {
+    if (save > OLECLOSE_PROMPTSAVE) return E_INVALIDARG;
     const Held<IUnknown> meanwhile(&whole());
+    // Whether to ask is for a form to say: a control in it has no question of its own.
+    if (save != OLECLOSE_NOSAVE && isChanged())
+        if (const Held<IOleClientSite> site = mPlacement.site()) {
+            const HRESULT saved = site->SaveObject();
+            if (FAILED(saved)) return saved;
+        }
     mPlacement.deactivate();
     if (const Held<IOleAdviseHolder> advised = mAdvised) advised->SendOnClose();
     return S_OK;
+}
+
+bool OleObject::isChanged() const {
+    const auto kept = Held<IPersistStreamInit>::of(&whole());
+    return kept && kept->IsDirty() == S_OK;
 }
 
 STDMETHODIMP OleObject::GetMoniker(DWORD, DWORD, IMoniker** moniker) {

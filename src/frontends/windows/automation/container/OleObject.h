@@ -36,6 +36,8 @@ public:
 private:
     HRESULT show(bool ui);
     HRESULT showProperties();
+    /// Since it was saved or loaded last.
+    bool isChanged() const;
 
     Placement& mPlacement;
     Held<IOleAdviseHolder> mAdvised;
