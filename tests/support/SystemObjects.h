@@ -1,6 +1,10 @@
 #pragma once
 
+#include <gtest/gtest.h>
+
 #include <cstdint>
+#include <cstdio>
+#include <cstdlib>
 
 #include <windows.h>
 
@@ -26,3 +30,20 @@ struct SystemObjects {
         return objects;
     }
 };
+
+/// That what is done over and over, as often as ZANDOR_ROUNDS says, leaves no object behind.
+template <class Work>
+void expectNothingLeftBehind(const Work& work) {
+    const char* const given = std::getenv("ZANDOR_ROUNDS");
+    const int rounds = given ? std::atoi(given) : 100;
+    constexpr int settled = 10;
+    for (int i = 0; i < settled; ++i) work();
+    const SystemObjects before = SystemObjects::now();
+    for (int i = 0; i < rounds; ++i) work();
+    const SystemObjects after = SystemObjects::now();
+    std::printf("%d rounds: %d drawing objects before, %d after; %d windows before, %d after\n",
+                rounds, before.drawing, after.drawing, before.windows, after.windows);
+    EXPECT_GT(before.drawing, 0);
+    EXPECT_LE(after.drawing, before.drawing);
+    EXPECT_LE(after.windows, before.windows);
+}
