@@ -33,6 +33,7 @@ protected:
 
     void show() {
         widget->show();
+        widget->activateWindow(); // a display without a window manager waits to be asked
         waitForKeyboard(*widget);
         settle();
     }
