@@ -149,9 +149,8 @@ void Door::markOutput(bool marks) {
             if (open != String::npos && name.back() == u')')
                 names.insert(name.substr(open + 1, name.size() - open - 2));
         }
-    const bool any = !columns.empty();
-    if (!any && !mMarked) return;
-    mMarked = true; // also where only some of it is done
+    if (columns.empty() && !mMarked) return;
+    mMarked = true;
     for (const auto& [slot, table] : tables()) {
         const auto held = control().Hold(tableOf(*table));
         if (!held) continue;

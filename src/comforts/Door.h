@@ -88,7 +88,6 @@ public:
     void markOutput(bool marks);
     void clearNotes();
     void note(std::int32_t row, std::int32_t column, const String& text) {
-        mNoted = true;
         control().sprColumn->CellNote(row, column, text);
     }
     /// Writes a text into a definition of whatever model, as the control does for a cell of a row;
@@ -150,8 +149,7 @@ private:
 
     TalvikDBxZandor::Zandor* mControl;
     std::weak_ptr<TalvikZandorLib::Zandor> mModel; ///< the one last seen
-    bool mMarked = false;                          ///< whether an entry may be marked
-    bool mNoted = false;                           ///< whether a cell may have a note
+    bool mMarked = false;                          ///< whether an entry has ever been marked
 };
 
 } // namespace zandor::comforts

@@ -18,6 +18,7 @@ bool CellComposer::begin(const std::function<void()>& open) {
     mBox = focus->taker();
     const auto* const line = qobject_cast<const QLineEdit*>(mBox.data());
     mBefore = line ? line->text() : QString();
+    if (mBox) mBox->installEventFilter(this);
     return mBox;
 }
 
@@ -31,6 +32,11 @@ void CellComposer::goOn(QInputMethodEvent& event) {
 
 void CellComposer::breakOff() {
     if (QWidget* const box = std::exchange(mBox, nullptr)) giveUp(*box);
+}
+
+bool CellComposer::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == mBox && event->type() == QEvent::Hide) mBox = nullptr;
+    return false;
 }
 
 /// Where nothing has been composed yet, the cell has what it had.

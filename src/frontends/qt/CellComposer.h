@@ -10,7 +10,7 @@ namespace zandor::platform::qt {
 /// A text that an input method composes while the grid has the focus. The cell's editor opens for
 /// it and shows it; the focus stays with the grid until the text is whole, for an input method
 /// breaks off when the focus moves.
-class CellComposer {
+class CellComposer : public QObject {
 public:
     explicit CellComposer(FocusTracker& focus) : mFocus(focus) {}
 
@@ -24,6 +24,9 @@ public:
     void breakOff();
     /// Answers an input method for the box, in the coordinates of a widget.
     void answer(QInputMethodQueryEvent& query, const QWidget& asked) const;
+
+    /// An editor that closes has the text no more, whatever cell it opens for afterwards.
+    bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
     void giveUp(QWidget& box) const;

@@ -425,6 +425,28 @@ TEST_F(Comforts, LeaveACellAsItWasWhenAnInputMethodWasLeft) {
     EXPECT_EQ(criterion(), u"> 1000");
 }
 
+TEST_F(Comforts, WriteNothingIntoTheCellThatAnInputMethodIsLeftFor) {
+    standOn(criteriaRow, 1);
+    compose("か");
+    Desk::press(criteriaRow, 2);
+    EXPECT_EQ(child<QLineEdit>("txtValue").text(), "");
+    widget->takeOver();
+    EXPECT_EQ(model->definitionAt(2).criteria.Count(), 0);
+}
+
+TEST_F(Comforts, KnowNoEditorAnyMoreThatHasClosedOverAnInputMethod) {
+    standOn(criteriaRow, 1);
+    compose("か");
+    compose("かん");
+    widget->takeOver();
+    Desk::press(criteriaRow, 2);
+    after.setFocus(Qt::MouseFocusReason);
+    calm();
+    EXPECT_EQ(child<QLineEdit>("txtValue").text(), "");
+    widget->takeOver();
+    EXPECT_EQ(model->definitionAt(2).criteria.Count(), 0);
+}
+
 TEST_F(Comforts, LetAnInputMethodLookForAField) {
     standOn(0, 4);
     compose("to");
