@@ -77,6 +77,10 @@ public:
     /// Stands above the cells while it is shown.
     PaneHandle& handle() const { return *mHandle; }
     void showHandle(bool shown);
+    /// The cell being composed in has what was committed, or what it had.
+    void breakOffComposing() {
+        if (mListener) mListener->left();
+    }
 
     /// The model has changed.
     void touch();

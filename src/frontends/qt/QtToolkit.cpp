@@ -56,6 +56,11 @@ QWidget* QtToolkit::parentOf(const Design& design) const {
     return holder ? holder->widget() : &mSurface;
 }
 
+void QtToolkit::finishComposing() const {
+    QGuiApplication::inputMethod()->commit();
+    if (grid()) grid()->breakOffComposing();
+}
+
 GridWidget* QtToolkit::grid() const { return static_cast<GridWidget*>(mGrid.data()); }
 
 QWidget* QtToolkit::window() const { return mClosing ? nullptr : mSurface.window(); }
@@ -128,8 +133,7 @@ std::unique_ptr<Frame> QtToolkit::makeFrame(const Design& design, FrameEvents ev
         });
     if (!design.Container)
         new EditorWatch(*frame, [this] {
-            // A text still being composed is a text typed.
-            QGuiApplication::inputMethod()->commit();
+            finishComposing();
             mComforts.editorLeft();
         });
     return adapt<RowFrameAdapter>(design, Role::frame, frame);

@@ -38,6 +38,8 @@ public:
     comforts::Comforts& comforts() { return mComforts; }
     /// nullptr before it is made.
     GridWidget* grid() const;
+    /// A text still being composed is a text typed; one that its input method keeps back is none.
+    void finishComposing() const;
 
     void MsgBox(const String& prompt, std::int32_t style, const String& title) override;
     std::unique_ptr<Frame> makeFrame(const Design& design, FrameEvents events) override;

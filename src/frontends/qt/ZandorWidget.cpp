@@ -15,8 +15,6 @@
 #include <Zandor/qt/Text.h>
 #include <Zandor/qt/Twips.h>
 
-#include <QGuiApplication>
-#include <QInputMethod>
 #include <QKeyEvent>
 #include <QPaintEvent>
 #include <QPointer>
@@ -218,7 +216,7 @@ bool ZandorWidget::showCell(const QString& definition, int row) {
 }
 
 void ZandorWidget::takeOver() {
-    QGuiApplication::inputMethod()->commit(); // a text still being composed is a text typed
+    mToolkit->finishComposing();
     mToolkit->comforts().takeOver();
 }
 

@@ -434,6 +434,21 @@ TEST_F(Comforts, WriteNothingIntoTheCellThatAnInputMethodIsLeftFor) {
     EXPECT_EQ(model->definitionAt(2).criteria.Count(), 0);
 }
 
+TEST_F(Comforts, LeaveACellAsItWasWhenAnInputMethodIsLeftForAnotherCell) {
+    standOn(criteriaRow, 1);
+    compose("か");
+    Desk::press(criteriaRow, 2);
+    EXPECT_EQ(criterion(), u"> 1000");
+    EXPECT_TRUE(grid().view().hasFocus() || child<QLineEdit>("txtValue").hasFocus());
+}
+
+TEST_F(Comforts, LeaveACellAsItWasWhenItsTypingIsTakenOverFromAnInputMethod) {
+    standOn(criteriaRow, 1);
+    compose("か");
+    widget->takeOver();
+    EXPECT_EQ(criterion(), u"> 1000");
+}
+
 TEST_F(Comforts, KnowNoEditorAnyMoreThatHasClosedOverAnInputMethod) {
     standOn(criteriaRow, 1);
     compose("か");
