@@ -7,6 +7,7 @@
 namespace {
 
 thread_local std::vector<std::string> seen;
+thread_local std::function<void(HWND)> instead;
 
 constexpr wchar_t known[] = L"ZandorTestSeen";
 
@@ -19,7 +20,10 @@ void close(HWND box) {
     wchar_t title[200] = {};
     GetWindowTextW(box, title, 200);
     seen.push_back(zandor::platform::toUtf8(reinterpret_cast<const char16_t*>(title)));
-    PostMessageW(box, WM_COMMAND, IDOK, 0);
+    if (instead)
+        std::exchange(instead, {})(box);
+    else
+        PostMessageW(box, WM_COMMAND, IDOK, 0);
 }
 
 LRESULT CALLBACK activated(int code, WPARAM w, LPARAM l) {
@@ -32,5 +36,7 @@ LRESULT CALLBACK activated(int code, WPARAM w, LPARAM l) {
 Boxes::Boxes() : mHook(SetWindowsHookExW(WH_CBT, &activated, nullptr, GetCurrentThreadId())) {}
 
 Boxes::~Boxes() { UnhookWindowsHookEx(mHook); }
+
+void Boxes::meetNext(std::function<void(HWND)> user) { instead = std::move(user); }
 
 std::vector<std::string> Boxes::taken() { return std::exchange(seen, {}); }

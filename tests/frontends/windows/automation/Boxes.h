@@ -2,6 +2,7 @@
 
 #include "frontends/windows/automation/com/system.h"
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -15,6 +16,8 @@ public:
 
     /// The titles of those that have come in this thread since it was asked last.
     static std::vector<std::string> taken();
+    /// What is done with the next one instead of closing it, as it comes to the front.
+    static void meetNext(std::function<void(HWND)> user);
 
 private:
     HHOOK mHook;

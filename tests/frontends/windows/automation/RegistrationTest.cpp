@@ -100,6 +100,7 @@ TEST(Registering, SaysWhatAFormEditorAsksForAndTheLibraryHasIt) {
     EXPECT_EQ(valueAt(all, key + L"\\Version@"), L"1.0");
     EXPECT_EQ(valueAt(all, key + L"\\MiscStatus@"), L"0");
     EXPECT_NE(valueAt(all, key + L"\\MiscStatus\\1@"), L"(none)");
+    EXPECT_EQ(valueAt(all, key + L"\\Verb\\-7@"), L"&Properties...,0,2");
     EXPECT_TRUE(isThere(L"Software\\Classes\\" + key + L"\\Control"));
     EXPECT_FALSE(isThere(L"Software\\Classes\\" + key + L"\\Insertable"));
     const HBITMAP picture = LoadBitmapW(Dll::get().module(), MAKEINTRESOURCEW(101));
@@ -109,6 +110,30 @@ TEST(Registering, SaysWhatAFormEditorAsksForAndTheLibraryHasIt) {
     EXPECT_EQ(about.bmHeight, 15);
     DeleteObject(picture);
     EXPECT_TRUE(FindResourceW(Dll::get().module(), MAKEINTRESOURCEW(1), RT_VERSION));
+    EXPECT_EQ(strike(), S_OK);
+}
+
+TEST(Registering, SaysWhereThePropertyPageIsAndNothingThatAScriptWouldMakeItBy) {
+    ASSERT_EQ(enrol(), S_OK);
+    const Export all = exported(HKEY_LOCAL_MACHINE);
+    const std::wstring key = L"CLSID\\" + spelled(ids::propertyPage);
+    EXPECT_EQ(valueAt(all, key + L"\\InprocServer32@"), Dll::get().path());
+    EXPECT_EQ(valueAt(all, key + L"\\InprocServer32@ThreadingModel"), L"Apartment");
+    EXPECT_EQ(valueAt(all, key + L"\\ProgID@"), L"(none)");
+    Held<IPropertyPage> page;
+    EXPECT_EQ(CoCreateInstance(ids::propertyPage, nullptr, CLSCTX_INPROC_SERVER, IID_IPropertyPage,
+                               page.slotOfAny()),
+              S_OK);
+    EXPECT_TRUE(page);
+    Held<IEnumOLEVERB> verbs;
+    ASSERT_EQ(OleRegEnumVerbs(ids::control, verbs.slot()), S_OK);
+    std::set<LONG> numbers;
+    OLEVERB verb{};
+    while (verbs->Next(1, &verb, nullptr) == S_OK) {
+        numbers.insert(verb.lVerb);
+        CoTaskMemFree(verb.lpszVerbName);
+    }
+    EXPECT_EQ(numbers, (std::set<LONG>{OLEIVERB_PRIMARY, OLEIVERB_PROPERTIES}));
     EXPECT_EQ(strike(), S_OK);
 }
 

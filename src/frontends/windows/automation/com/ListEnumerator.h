@@ -1,8 +1,7 @@
 #pragma once
 
-#include "frontends/windows/automation/com/Module.h"
+#include "frontends/windows/automation/com/Counted.h"
 
-#include <atomic>
 #include <vector>
 
 namespace zandor::automation {
@@ -10,27 +9,13 @@ namespace zandor::automation {
 /// Walks a list as it was when the walk began: IEnumConnections, IEnumConnectionPoints.
 /// `Item` is what is kept, from which `lend` makes what the caller gets.
 template <class Interface, class Raw, class Item, Raw (*lend)(const Item&)>
-class ListEnumerator final : public Interface {
+class ListEnumerator final : public Counted<Interface> {
 public:
     /// For who asked.
     static Interface* begin(std::vector<Item> items, std::size_t place = 0) {
         auto* const made = new ListEnumerator(std::move(items), place);
         made->AddRef();
         return made;
-    }
-
-    STDMETHODIMP QueryInterface(REFIID iid, void** object) override {
-        if (!object) return E_POINTER;
-        *object = iid == IID_IUnknown || iid == __uuidof(Interface) ? this : nullptr;
-        if (!*object) return E_NOINTERFACE;
-        AddRef();
-        return S_OK;
-    }
-    STDMETHODIMP_(ULONG) AddRef() override { return ++mReferences; }
-    STDMETHODIMP_(ULONG) Release() override {
-        const ULONG left = --mReferences;
-        if (left == 0) delete this;
-        return left;
     }
 
     STDMETHODIMP Next(ULONG count, Raw* items, ULONG* fetched) override {
@@ -60,8 +45,6 @@ private:
     ListEnumerator(std::vector<Item> items, std::size_t place)
         : mItems(std::move(items)), mPlace(place) {}
 
-    const Keeping mKeeping;
-    std::atomic<ULONG> mReferences = 0;
     const std::vector<Item> mItems;
     std::size_t mPlace;
 };

@@ -39,6 +39,7 @@ inline constexpr GUID controlLibrary = ZANDOR_ID(ZANDOR_LIBID_CONTROL);
 inline constexpr GUID modelLibrary = ZANDOR_ID(ZANDOR_LIBID_MODEL);
 inline constexpr GUID control = ZANDOR_ID(ZANDOR_CLSID_CONTROL);
 inline constexpr GUID controlEvents = ZANDOR_ID(ZANDOR_IID_CONTROL_EVENTS);
+inline constexpr GUID propertyPage = ZANDOR_ID(ZANDOR_CLSID_PROPERTY_PAGE);
 inline constexpr GUID query = ZANDOR_ID(ZANDOR_CLSID_QUERY);
 inline constexpr GUID join = ZANDOR_ID(ZANDOR_CLSID_JOIN);
 inline constexpr GUID columnDefinition = ZANDOR_ID(ZANDOR_CLSID_COLUMN_DEFINITION);

@@ -9,6 +9,7 @@
 #include "frontends/windows/automation/control/Safety.h"
 #include "frontends/windows/automation/control/invoke.h"
 #include "frontends/windows/automation/keeping/Persistence.h"
+#include "frontends/windows/automation/pages/SpecifiedPages.h"
 
 namespace zandor::automation {
 
@@ -35,6 +36,7 @@ ControlObject::ControlObject()
     mFacets.push_back(std::make_unique<ControlSide>(whole, mPlacement, mEvents));
     mFacets.push_back(std::make_unique<QuickActivation>(whole, mPlacement, *view, mEvents));
     mFacets.push_back(std::make_unique<Persistence>(whole, *mHouse));
+    mFacets.push_back(std::make_unique<SpecifiedPages>(whole));
     mFacets.push_back(std::move(view));
 }
 

@@ -57,31 +57,46 @@ State stateOf(Zandor& control) {
     return state;
 }
 
+const std::vector<std::size_t>& writingOrder() {
+    static const std::vector<std::size_t> order = [] {
+        const auto& members = keptMembers();
+        const std::size_t traces = placeOf(u"DebugSwitch");
+        const std::size_t layout = placeOf(u"OnlyJoin");
+        std::vector<std::size_t> places;
+        const auto add = [&](TalvikDBxZandor::automation::Kind kind) {
+            for (std::size_t n = 0; n < members.size(); ++n)
+                if (members[n]->kind == kind && n != traces && n != layout) places.push_back(n);
+        };
+        // The grid takes its titles with the layout, which comes before all places.
+        add(TalvikDBxZandor::automation::Kind::field);
+        places.push_back(layout);
+        add(TalvikDBxZandor::automation::Kind::property);
+        places.push_back(traces);
+        return places;
+    }();
+    return order;
+}
+
 void restore(Zandor& control, const State& state) {
-    const auto& members = keptMembers();
-    const auto write = [&](std::size_t n) { members[n]->set(control, state[n]); };
-    const std::size_t traces = placeOf(u"DebugSwitch");
-    const std::size_t layout = placeOf(u"OnlyJoin");
     control.DebugSwitch(0);
-    // The grid takes its titles with this one, which lays out anew and so comes before all places.
+    for (const std::size_t n : writingOrder()) keptMembers()[n]->set(control, state[n]);
+}
+
+std::optional<std::size_t> impossibleIn(const State& state) {
+    const auto& members = keptMembers();
     for (std::size_t n = 0; n < members.size(); ++n)
-        if (members[n]->kind == TalvikDBxZandor::automation::Kind::field) write(n);
-    write(layout);
-    for (std::size_t n = 0; n < members.size(); ++n)
-        if (members[n]->kind == TalvikDBxZandor::automation::Kind::property && n != traces &&
-            n != layout)
-            write(n);
-    write(traces);
+        if (!isOfType(state[n], members[n]->type)) return n;
+    if (!isWithin(state, u"HorizontalScrollbarPos", u"HorizMaxScrollPos"))
+        return placeOf(u"HorizontalScrollbarPos");
+    if (!isWithin(state, u"VerticalScrollbarPos", u"VertMaxScrollPos"))
+        return placeOf(u"VerticalScrollbarPos");
+    for (const StringView frame : {u"VisibleFrameLeft", u"VisibleFrameTop"})
+        if (numberAt(state, frame) < 0) return placeOf(frame);
+    return {};
 }
 
 bool isPossible(const State& state) {
-    const auto& members = keptMembers();
-    if (state.size() != members.size()) return false;
-    for (std::size_t n = 0; n < members.size(); ++n)
-        if (!isOfType(state[n], members[n]->type)) return false;
-    return isWithin(state, u"HorizontalScrollbarPos", u"HorizMaxScrollPos") &&
-           isWithin(state, u"VerticalScrollbarPos", u"VertMaxScrollPos") &&
-           numberAt(state, u"VisibleFrameLeft") >= 0 && numberAt(state, u"VisibleFrameTop") >= 0;
+    return state.size() == keptMembers().size() && !impossibleIn(state);
 }
 
 } // namespace zandor::automation

@@ -4,22 +4,6 @@
 
 namespace zandor::automation {
 
-STDMETHODIMP ClassFactory::QueryInterface(REFIID iid, void** object) {
-    if (!object) return E_POINTER;
-    *object = iid == IID_IUnknown || iid == IID_IClassFactory ? this : nullptr;
-    if (!*object) return E_NOINTERFACE;
-    AddRef();
-    return S_OK;
-}
-
-STDMETHODIMP_(ULONG) ClassFactory::AddRef() { return ++mReferences; }
-
-STDMETHODIMP_(ULONG) ClassFactory::Release() {
-    const ULONG left = --mReferences;
-    if (left == 0) delete this;
-    return left;
-}
-
 STDMETHODIMP ClassFactory::CreateInstance(IUnknown* outer, REFIID iid, void** object) {
     if (!object) return E_POINTER;
     *object = nullptr;

@@ -4,6 +4,7 @@
 #include "frontends/windows/automation/control/ControlObject.h"
 #include "frontends/windows/automation/model/Exchange.h"
 #include "frontends/windows/automation/model/TableDescriptionObject.h"
+#include "frontends/windows/automation/pages/PropertyPage.h"
 
 #include <Zandor/Query.h>
 
@@ -20,6 +21,8 @@ Held<IUnknown> makeOfModel() {
 const CreatableClass classes[] = {
     {ids::control, L"TalvikDBxZandor.Zandor", L"Zandor query designer", &ids::controlLibrary,
      [] { return Held<IUnknown>(static_cast<_Zandor*>(new ControlObject)); }, true},
+    {ids::propertyPage, nullptr, L"Property page of the Zandor query designer", nullptr,
+     [] { return Held<IUnknown>(new PropertyPage); }},
     {ids::query, L"TalvikZandorLib.Zandor", L"Zandor query", &ids::modelLibrary,
      makeOfModel<TalvikZandorLib::Zandor, model::Query>},
     {ids::join, L"TalvikZandorLib.ZDJoin", L"Join of a Zandor query", &ids::modelLibrary,

@@ -9,9 +9,10 @@ namespace zandor::automation {
 /// A class that hosts make objects of.
 struct CreatableClass {
     GUID id;
-    const wchar_t* name;  ///< as scripts write it: "TalvikDBxZandor.Zandor"
+    /// As scripts write it: "TalvikDBxZandor.Zandor"; nullptr where it is of no use to them.
+    const wchar_t* name;
     const wchar_t* title; ///< for people
-    const GUID* library;  ///< in which it is declared
+    const GUID* library;  ///< in which it is declared; nullptr: in none
     Held<IUnknown> (*make)();
     bool isControl = false; ///< whether a form can hold it
 };

@@ -41,11 +41,14 @@ constexpr Library libraries[] = {{&ids::controlLibrary, 1, L"Zandor visual query
 void add(std::vector<Entry>& entries, const CreatableClass& made, const wstring& file) {
     const wstring id = textOf(made.id);
     const wstring key = L"CLSID\\" + id;
-    entries.push_back({made.name, L"", made.title});
-    entries.push_back({wstring(made.name) + L"\\CLSID", L"", id});
+    if (made.name) {
+        entries.push_back({made.name, L"", made.title});
+        entries.push_back({wstring(made.name) + L"\\CLSID", L"", id});
+    }
     entries.push_back({key, L"", made.title});
     entries.push_back({key + L"\\InprocServer32", L"", file});
     entries.push_back({key + L"\\InprocServer32", L"ThreadingModel", L"Apartment"});
+    if (!made.name) return;
     entries.push_back({key + L"\\ProgID", L"", made.name});
     entries.push_back({key + L"\\TypeLib", L"", textOf(*made.library)});
     entries.push_back({key + L"\\Version", L"", version});
@@ -56,6 +59,8 @@ void add(std::vector<Entry>& entries, const CreatableClass& made, const wstring&
     entries.push_back({key + L"\\MiscStatus\\1", L"", std::to_wstring(miscStatus)});
     entries.push_back({key + L"\\Verb", L"", L""});
     entries.push_back({key + L"\\Verb\\0", L"", L"&Edit,0,2"});
+    static_assert(OLEIVERB_PROPERTIES == -7);
+    entries.push_back({key + L"\\Verb\\-7", L"", L"&Properties...,0,2"});
     entries.push_back({key + L"\\ToolboxBitmap32", L"", file + L", 101"});
     for (const wchar_t* const category : categories)
         entries.push_back({key + L"\\Implemented Categories\\" + category, L"", L""});
