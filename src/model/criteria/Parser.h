@@ -7,7 +7,7 @@
 namespace zandor::model::criteria {
 
 /// What a criterion speaks about.
-struct Subject {
+struct ZANDOR_MODEL_EXPORT Subject {
     Subject() = default;
     Subject(const sql::ColumnRef& column); ///< a column as it is
     /// What comes out of a definition, by its total.
@@ -28,7 +28,7 @@ struct Reading {
 /// Reads the condition that a text sets to a subject. Whatever is typed becomes a tree of values,
 /// columns and parameters or an error: never SQL text. Names at the place of a `known` reference
 /// mean what that says, all others what the resolver finds.
-Reading read(StringView text, const Subject& subject, const Resolver& resolver,
+ZANDOR_MODEL_EXPORT Reading read(StringView text, const Subject& subject, const Resolver& resolver,
              const References& known = {});
 
 struct ExpressionReading {
@@ -38,7 +38,8 @@ struct ExpressionReading {
 };
 
 /// Reads an expression by the same rules.
-ExpressionReading readExpression(StringView text, const Resolver& resolver,
+ZANDOR_MODEL_EXPORT ExpressionReading
+readExpression(StringView text, const Resolver& resolver,
                                  const References& known = {});
 
 } // namespace zandor::model::criteria

@@ -64,6 +64,14 @@ const Signature* signatureOf(StringView name) {
     return at == all.end() ? nullptr : &*at;
 }
 
+const Signature* signatureOf(sql::Function function) {
+    const auto& all = signatures();
+    const auto at = std::find_if(all.begin(), all.end(), [&](const Signature& signature) {
+        return signature.function == function;
+    });
+    return at == all.end() ? nullptr : &*at;
+}
+
 bool isTotalName(StringView name) {
     constexpr std::array<StringView, 7> names = {u"Sum", u"Count", u"Avg",  u"Average",
                                                  u"Min", u"Max",   u"Total"};

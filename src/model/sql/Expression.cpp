@@ -25,30 +25,50 @@ Node joined(std::vector<Node> terms) {
 
 namespace {
 
-/// The lists below name the parts of a kind of node that are nodes, and those that are not.
+/// What is done with each part of a node that is a node, in their order. The list below names them.
+template <class Kind, class Do>
+void eachPart(Kind& x, Do take) {
+    const auto each = [&](auto& list) {
+        for (auto& node : list) take(node);
+    };
+    using Plain = std::remove_const_t<Kind>;
+    constexpr bool leaf = std::is_same_v<Plain, ColumnRef> || std::is_same_v<Plain, Value> ||
+                          std::is_same_v<Plain, Parameter>;
+    if constexpr (leaf) {
+    } else if constexpr (std::is_same_v<Plain, Choice>) {
+        take(x.condition), take(x.then), take(x.otherwise);
+    } else if constexpr (requires { x.terms; }) {
+        each(x.terms);
+    } else if constexpr (requires { x.arguments; }) {
+        each(x.arguments);
+    } else if constexpr (requires { x.left; }) {
+        take(x.left), take(x.right);
+    } else {
+        take(x.operand);
+        if constexpr (requires { x.pattern; }) take(x.pattern);
+        if constexpr (requires { x.low; }) take(x.low), take(x.high);
+        if constexpr (requires { x.list; }) each(x.list);
+    }
+}
+
 struct Parts {
     std::vector<Node> nodes;
-    void add(const Node& node) {
-        if (node) nodes.push_back(node);
+    template <class Kind>
+    void operator()(const Kind& x) {
+        eachPart(x, [this](const Node& node) {
+            if (node) nodes.push_back(node);
+        });
     }
-    void add(const std::vector<Node>& more) { nodes.insert(nodes.end(), more.begin(), more.end()); }
+};
 
-    void operator()(const ColumnRef&) {}
-    void operator()(const Value&) {}
-    void operator()(const Parameter&) {}
-    void operator()(const Compare& x) { add(x.left), add(x.right); }
-    void operator()(const Like& x) { add(x.operand), add(x.pattern); }
-    void operator()(const Between& x) { add(x.operand), add(x.low), add(x.high); }
-    void operator()(const In& x) { add(x.operand), add(x.list); }
-    void operator()(const IsNull& x) { add(x.operand); }
-    void operator()(const Not& x) { add(x.operand); }
-    void operator()(const And& x) { add(x.terms); }
-    void operator()(const Or& x) { add(x.terms); }
-    void operator()(const Operation& x) { add(x.left), add(x.right); }
-    void operator()(const Negative& x) { add(x.operand); }
-    void operator()(const Call& x) { add(x.arguments); }
-    void operator()(const Choice& x) { add(x.condition), add(x.then), add(x.otherwise); }
-    void operator()(const Aggregate& x) { add(x.operand); }
+struct Replacing {
+    std::vector<Node>::iterator next;
+    template <class Kind>
+    void operator()(Kind& x) {
+        eachPart(x, [this](Node& node) {
+            if (node) node = std::move(*next++);
+        });
+    }
 };
 
 bool alike(const ColumnRef& a, const ColumnRef& b) { return a == b; }
@@ -95,6 +115,13 @@ std::vector<Node> partsOf(const Expression& expression) {
     Parts parts;
     std::visit(parts, expression.node);
     return std::move(parts.nodes);
+}
+
+Node withParts(const Expression& expression, std::vector<Node> parts) {
+    Expression other = expression;
+    Replacing replacing{parts.begin()};
+    std::visit(replacing, other.node);
+    return std::make_shared<const Expression>(std::move(other));
 }
 
 bool same(const Node& left, const Node& right) {

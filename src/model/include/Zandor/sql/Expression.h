@@ -194,6 +194,9 @@ ZANDOR_MODEL_EXPORT bool same(const Node& left, const Node& right);
 /// The nodes right below one, in the order in which they are written; none is nothing.
 ZANDOR_MODEL_EXPORT std::vector<Node> partsOf(const Expression& expression);
 
+/// The same with other nodes right below, as many and in the same order as partsOf has them.
+ZANDOR_MODEL_EXPORT Node withParts(const Expression& expression, std::vector<Node> parts);
+
 /// Whether a node of a kind is it, or stands below it.
 template <class Kind>
 bool holds(const Expression& expression) {

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "model/sql_reader/Drawing.h"
+
+#include "model/criteria/Parser.h"
+
+namespace zandor::sql_reader {
+
+/// The output columns of a query that is being drawn, by what comes out of them.
+class Columns {
+public:
+    explicit Columns(Query& query, const Selected& selected);
+
+    /// Those that come out, and those that rows are put together by.
+    void addItems();
+    /// Which of them sort, and in which order.
+    void sort();
+
+    /// What a cell of criteria belongs to.
+    struct Column {
+        model::criteria::Subject subject;
+        Ref<model::ColumnDefinition> definition;
+    };
+    /// The column that a condition on rows as they are stands under, made where there is none; one
+    /// that only chooses (`apart`) where rows are put together and it means those before.
+    Column& forCondition(const Node& subject, bool apart);
+
+    /// Rows are put together.
+    bool isGrouped() const { return mGrouped; }
+
+private:
+    Column& add(const Node& subject, bool visible, const String& name = {});
+    void addAllOf(const String& table);
+    void fill(model::ColumnDefinition& definition, const Node& subject);
+    void fillValue(model::ColumnDefinition& definition, const Node& value);
+    Column* find(const Node& subject, bool apart);
+
+    Query& mQuery;
+    const Selected& mSelected;
+    bool mGrouped = false;
+    bool mTotals = false; ///< some column has one
+    std::vector<Column> mColumns;
+};
+
+} // namespace zandor::sql_reader

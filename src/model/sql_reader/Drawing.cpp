@@ -1,0 +1,163 @@
+#include "model/sql_reader/Drawing.h"
+
+#include "model/criteria/QueryColumns.h"
+#include "model/criteria/Writer.h"
+#include "model/sql/Simplify.h"
+#include "model/sql_reader/Columns.h"
+#include "model/sql_reader/Refused.h"
+#include "model/sql_reader/Terms.h"
+#include "model/sql_reader/Sameness.h"
+
+#include <Zandor/sql/Builder.h>
+
+#include <algorithm>
+#include <array>
+
+namespace zandor::sql_reader {
+
+namespace sql = model::sql;
+
+namespace {
+
+/// How conditions stand in the grid: each in one cell where they speak of one column alone; a row
+/// for each way in which they hold; all in the first row, in cells that name other columns too.
+enum class Layout { cells, rows, mixed };
+
+/// What a condition speaks about: the first value in it that is no constant.
+Node subjectOf(const Node& condition) {
+    const auto parts = sql::partsOf(*condition);
+    if (std::holds_alternative<sql::Compare>(condition->node)) {
+        const bool constant = std::holds_alternative<sql::Value>(parts[0]->node) ||
+                              std::holds_alternative<sql::Parameter>(parts[0]->node);
+        return constant ? parts[1] : parts[0];
+    }
+    if (sql::isCondition(*condition) && !std::holds_alternative<sql::And>(condition->node) &&
+        !std::holds_alternative<sql::Or>(condition->node) &&
+        !std::holds_alternative<sql::Not>(condition->node))
+        return parts[0];
+    return parts.empty() ? condition : subjectOf(parts[0]);
+}
+
+/// Whether all of a condition speaks about one value.
+bool isAbout(const Node& condition, const Node& subject) {
+    const bool joint = std::holds_alternative<sql::And>(condition->node) ||
+                       std::holds_alternative<sql::Or>(condition->node) ||
+                       std::holds_alternative<sql::Not>(condition->node);
+    if (!joint) return sql::same(subjectOf(condition), subject);
+    const auto parts = sql::partsOf(*condition);
+    return std::all_of(parts.begin(), parts.end(),
+                       [&](const Node& part) { return isAbout(part, subject); });
+}
+
+class Drawing {
+public:
+    Drawing(const Selected& selected, Layout layout) : mSelected(selected), mLayout(layout) {}
+
+    Ref<Query> draw() {
+        const std::vector<Node> rest = drawSources(*mQuery, mSelected);
+        Columns columns(*mQuery, mSelected);
+        columns.addItems();
+        columns.sort();
+        addCriteria(columns, simplifiedTerms(rest),
+                    termsOf(sql::simplified(mSelected.statement.having)));
+        model::QueryOptions options;
+        options.distinct = mSelected.statement.distinct;
+        options.first = static_cast<std::int32_t>(mSelected.statement.limit.value_or(0));
+        mQuery->options(std::move(options));
+        return mQuery;
+    }
+
+private:
+    static std::vector<Node> simplifiedTerms(const std::vector<Node>& terms) {
+        std::vector<Node> all;
+        for (const Node& term : terms)
+            for (const Node& each : termsOf(sql::simplified(term))) all.push_back(each);
+        return all;
+    }
+
+    /// The place of a condition, also of one that was made of it.
+    [[noreturn]] void refuseCondition() const {
+        const Node& where = mSelected.statement.where;
+        const auto terms = termsOf(where ? where : mSelected.statement.having);
+        refuse<MessageCode::criterionNotDrawn>(
+            terms.empty() ? mSelected.place : mSelected.placeOf(terms.front()));
+    }
+
+    void addCriteria(Columns& columns, const std::vector<Node>& before,
+                     const std::vector<Node>& behind) {
+        const std::vector<Node>& ways = behind.empty() ? before : behind;
+        constexpr std::size_t mostRows = 12; // of the grid
+        std::vector<std::vector<Node>> rows{ways};
+        if (mLayout == Layout::rows) {
+            auto all = waysOf(ways, mostRows);
+            if (!all || all->size() > mostRows) refuseCondition();
+            rows = std::move(*all);
+        }
+        if (mLayout == Layout::cells)
+            for (const Node& term : ways)
+                if (!isAbout(term, subjectOf(term))) refuseCondition();
+        std::int16_t row = model::Criteria::firstRow;
+        for (const auto& way : rows) {
+            addRow(columns, way, row, false);
+            if (!behind.empty()) addRow(columns, before, row, rows.size() > 1);
+            ++row;
+        }
+    }
+
+    void addRow(Columns& columns, const std::vector<Node>& terms, std::int16_t row, bool apart) {
+        std::vector<std::pair<Node, std::vector<Node>>> cells;
+        for (const Node& term : terms) {
+            const Node subject = subjectOf(term);
+            const auto known = std::find_if(cells.begin(), cells.end(), [&](const auto& cell) {
+                return sql::same(cell.first, subject);
+            });
+            if (known == cells.end())
+                cells.push_back({subject, {term}});
+            else
+                known->second.push_back(term);
+        }
+        const model::criteria::QueryColumns names(mQuery->Tables());
+        for (const auto& [subject, each] : cells) {
+            const Columns::Column& column = columns.forCondition(subject, apart);
+            const auto text =
+                model::criteria::written(sql::allOf(each), column.subject, names);
+            const String key = platform::decimal(row);
+            if (!text || column.definition->HasCriterium(key)) refuseCondition();
+            column.definition->AddCriterium(*text, key);
+        }
+    }
+
+    const Selected& mSelected;
+    const Layout mLayout;
+    const Ref<Query> mQuery = platform::makeRef<Query>();
+};
+
+/// Why a query does not say what a statement does; nothing where it does.
+std::optional<model::Message> whyNot(Query& query, const sql::Statement& statement) {
+    const sql::Built built = sql::build(query);
+    for (const model::Finding& finding : built.findings)
+        if (finding.isError())
+            return model::say<MessageCode::notUnderstood>(finding.message);
+    const auto other = difference(statement, *built.statement);
+    if (!other) return {};
+    return model::say<MessageCode::otherMeaning>(*other);
+}
+
+} // namespace
+
+Ref<Query> drawn(const Selected& selected) {
+    std::optional<Refused> first;
+    for (const Layout layout : {Layout::cells, Layout::rows, Layout::mixed}) {
+        try {
+            const auto query = Drawing(selected, layout).draw();
+            const auto why = whyNot(*query, selected.statement);
+            if (!why) return query;
+            if (!first) first = Refused{*why, selected.place};
+        } catch (const Refused& refused) {
+            if (!first || refused.place != selected.place) first = refused;
+        }
+    }
+    throw Refused(*first);
+}
+
+} // namespace zandor::sql_reader

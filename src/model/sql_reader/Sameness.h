@@ -1,0 +1,30 @@
+#pragma once
+
+#include <Zandor/sql/Statement.h>
+#include <Zandor/sql_reader/Messages.h>
+
+#include <optional>
+#include <set>
+#include <vector>
+
+/// Whether two statements say the same. What is taken for different may still be the same; what is
+/// taken for the same is.
+namespace zandor::sql_reader {
+
+using model::sql::Node;
+using model::sql::Statement;
+using platform::String;
+
+/// What they differ in, in words; nothing where they say the same. The columns of what comes out
+/// may have other names where the first gives them none.
+std::optional<model::Message> difference(const Statement& read, const Statement& drawn);
+
+/// A condition as the ways in which it holds: one of these rows, in which all stands. Nothing where
+/// there are too many.
+using Ways = std::vector<std::vector<Node>>;
+std::optional<Ways> waysOf(const std::vector<Node>& terms, std::size_t most);
+
+/// A text that two nodes share exactly when they say the same by the same parts.
+String keyOf(const Node& node);
+
+} // namespace zandor::sql_reader

@@ -1,0 +1,29 @@
+#pragma once
+
+#include "model/sql_reader/Scope.h"
+
+#include <Zandor/model/Record.h>
+
+#include <map>
+
+namespace zandor::sql_reader {
+
+/// Where nodes of a statement were read, in bytes of what was parsed.
+using Places = std::map<Node, std::size_t>;
+
+/// A statement with what its names mean.
+struct Selected {
+    model::sql::Statement statement;
+    Scope scope;                                        ///< of its FROM
+    std::map<String, model::TableDescription> tables;   ///< of the database, by what they are called
+    std::map<String, model::SavedQuery> queries;        ///< those that it reads from, likewise
+    std::size_t place = 0;                              ///< of its first token
+    Places places;
+
+    std::size_t placeOf(const Node& node) const {
+        const auto known = places.find(node);
+        return known == places.end() ? place : known->second;
+    }
+};
+
+} // namespace zandor::sql_reader

@@ -1,0 +1,208 @@
+#include "model/sql_reader/StatementReader.h"
+
+#include "model/sql_reader/Refused.h"
+
+#include <Zandor/model/Names.h>
+#include <Zandor/model/QueryOptions.h>
+
+#include <algorithm>
+
+namespace zandor::sql_reader {
+
+namespace sql = model::sql;
+
+namespace {
+
+/// Whether all columns are meant: "*" or "table.*".
+bool isStar(const Tree& tree) {
+    return tree.is("ColumnRef") && tree.list("fields").back().is("A_Star");
+}
+
+/// A name without a table before it; empty for all else.
+String bareName(const Tree& tree) {
+    if (!tree.is("ColumnRef")) return {};
+    const auto fields = tree.list("fields");
+    return fields.size() == 1 && fields.front().is("String") ? fields.front().text("sval")
+                                                             : String();
+}
+
+bool isGrouped(const Node& node, const std::vector<Node>& groups) {
+    const bool group = std::any_of(groups.begin(), groups.end(),
+                                   [&](const Node& each) { return sql::same(each, node); });
+    if (group || std::holds_alternative<sql::Aggregate>(node->node)) return true;
+    return false;
+}
+
+} // namespace
+
+Selected StatementReader::select(const Tree& tree) {
+    if (!tree.is("SelectStmt")) refuse<MessageCode::selectOnly>(tree.place());
+    if (tree.word("op") != "SETOP_NONE") refusePart<MessageCode::aSetOperation>(tree.place());
+    if (tree.has("lockingClause")) refusePart<MessageCode::aLock>(tree.place());
+    if (tree.has("windowClause")) refusePart<MessageCode::aWindow>(tree.place());
+    tree.only({"distinctClause", "targetList", "fromClause", "whereClause", "groupClause",
+               "havingClause", "sortClause", "limitOffset", "limitCount", "limitOption",
+               "withClause", "op"});
+    const std::size_t known = mNamed.size();
+    if (tree.has("withClause")) with(tree.part("withClause"));
+
+    Selected selected;
+    selected.place = tree.place();
+    if (!tree.has("fromClause")) refusePart<MessageCode::noTable>(tree.place());
+    for (const Tree& each : tree.list("fromClause"))
+        selected.statement.from.push_back(source(each, selected.scope, selected));
+
+    ValueReader values(selected.scope, mText, mDialect, selected.places);
+    items(tree, values, selected);
+    for (const Tree& target : tree.list("targetList"))
+        if (target.has("name")) values.add(target.text("name"), target.node("val"));
+    if (tree.has("whereClause"))
+        selected.statement.where =
+            sql::allOf(ValueReader(selected.scope, mText, mDialect, selected.places)
+                           .conditions(tree.node("whereClause")));
+    for (const Tree& each : tree.list("groupClause")) {
+        if (each.is("GroupingSet")) refusePart<MessageCode::groupingSets>(each.place());
+        selected.statement.group.push_back(byNameOrPlace(each, values, selected, false));
+    }
+    if (tree.has("havingClause"))
+        selected.statement.having = sql::allOf(values.conditions(tree.node("havingClause")));
+    order(tree, values, selected);
+    limits(tree, selected);
+    checkGroups(selected, tree.place());
+    mNamed.erase(mNamed.begin() + static_cast<std::ptrdiff_t>(known), mNamed.end());
+    return selected;
+}
+
+void StatementReader::with(const Tree& tree) {
+    if (tree.flag("recursive")) refusePart<MessageCode::recursiveWith>(tree.place());
+    for (const Tree& each : tree.list("ctes")) {
+        if (each.has("aliascolnames")) refusePart<MessageCode::namedColumns>(each.place());
+        each.only({"ctename", "ctequery", "ctematerialized"});
+        mNamed.push_back(named(each.node("ctequery"), each.text("ctename")));
+    }
+}
+
+void StatementReader::items(const Tree& tree, const ValueReader& values, Selected& into) {
+    if (tree.has("distinctClause")) {
+        for (const Tree& each : tree.list("distinctClause"))
+            if (!each.kind().empty()) refusePart<MessageCode::distinctOn>(each.place());
+        into.statement.distinct = true;
+    }
+    if (!tree.has("targetList")) refusePart<MessageCode::noTable>(tree.place());
+    for (const Tree& target : tree.list("targetList")) item(target, values, into);
+}
+
+void StatementReader::item(const Tree& target, const ValueReader& values, Selected& into) {
+    target.only({"name", "val"});
+    const Tree value = target.node("val");
+    auto& items = into.statement.items;
+    if (value.is("FuncCall") && value.names("funcname").back() == topFunction) {
+        limit(value.list("args").front(), into);
+        return;
+    }
+    if (!isStar(value)) {
+        items.push_back({values.value(value), target.text("name")});
+        return;
+    }
+    const auto fields = value.list("fields");
+    if (fields.size() > 1) {
+        const String name = fields[fields.size() - 2].text("sval");
+        const ScopedTable* table = into.scope.tableNamed(name);
+        if (!table) refuse<MessageCode::unknownSource>(value.place(), name);
+        items.push_back({sql::AllColumns{table->alias}, {}});
+    } else if (const auto all = into.scope.everything()) {
+        for (const ColumnRef& column : *all) items.push_back({sql::make(column), {}});
+    } else {
+        for (const ScopedTable& table : into.scope.tables())
+            items.push_back({sql::AllColumns{table.alias}, {}});
+    }
+}
+
+void StatementReader::limits(const Tree& tree, Selected& into) {
+    if (tree.word("limitOption") == "LIMIT_OPTION_WITH_TIES")
+        refusePart<MessageCode::ties>(tree.node("limitCount").place());
+    if (tree.has("limitOffset")) {
+        const Tree offset = tree.node("limitOffset");
+        const bool none = offset.is("A_Const") && offset.has("ival") &&
+                          offset.part("ival").number("ival") == 0;
+        if (!none) refusePart<MessageCode::anOffset>(offset.place());
+    }
+    if (tree.has("limitCount")) limit(tree.node("limitCount"), into);
+}
+
+void StatementReader::limit(const Tree& count, Selected& into) const {
+    const bool constant = count.is("A_Const");
+    if (constant && count.has("isnull")) return;
+    const bool whole = constant && count.has("ival");
+    const std::int64_t rows = whole ? count.part("ival").number("ival") : 0;
+    // SQLite takes a negative one for none.
+    if (whole && rows < 0 && mDialect == Dialect::SQLite) return;
+    constexpr std::int32_t most = model::QueryOptions::greatestFirst;
+    if (rows < 1 || rows > most)
+        refuse<MessageCode::noPlaceFor>(count.place(), model::say<MessageCode::aLimit>(most));
+    into.statement.limit = rows;
+}
+
+/// What GROUP BY and ORDER BY have: the number or the name of what comes out, or a value.
+Node StatementReader::byNameOrPlace(const Tree& tree, const ValueReader& values, const Selected& in,
+                                    bool outputFirst) const {
+    const auto& items = in.statement.items;
+    if (tree.is("A_Const") && tree.has("ival")) {
+        const std::int64_t place = tree.part("ival").number("ival");
+        const auto beyond = static_cast<std::int64_t>(items.size()) + 1;
+        if (place < 1 || place >= beyond) refuse<MessageCode::noSuchPosition>(tree.place(), place);
+        const bool counts = std::none_of(items.begin(), items.begin() + place, [](const auto& item) {
+            return std::holds_alternative<sql::AllColumns>(item.what);
+        });
+        if (!counts) refuse<MessageCode::noSuchPosition>(tree.place(), place);
+        return std::get<Node>(items[static_cast<std::size_t>(place - 1)].what);
+    }
+    const String name = bareName(tree);
+    if (name.empty() || (!outputFirst && in.scope.find(name, tree.place())))
+        return values.value(tree);
+    const Node* found = nullptr;
+    for (const auto& item : items) {
+        const auto* value = std::get_if<Node>(&item.what);
+        if (!value || !model::sameName(item.name, name)) continue;
+        if (found && !sql::same(*found, *value)) refuse<MessageCode::sameOutput>(tree.place(), name);
+        found = value;
+    }
+    return found ? *found : values.value(tree);
+}
+
+void StatementReader::order(const Tree& tree, const ValueReader& values, Selected& into) const {
+    for (const Tree& each : tree.list("sortClause")) {
+        const Tree node = each.node("node");
+        // SQL Server asks for an order where rows are counted, whatever it is.
+        if (mDialect == Dialect::SqlServer && node.is("SubLink")) continue;
+        if (each.word("sortby_nulls") != "SORTBY_NULLS_DEFAULT")
+            refusePart<MessageCode::nullsPlaced>(each.place());
+        each.only({"node", "sortby_dir", "sortby_nulls"});
+        into.statement.order.push_back({byNameOrPlace(node, values, into, true),
+                                        each.word("sortby_dir") == "SORTBY_DESC"});
+    }
+}
+
+/// Where rows are put together, what comes out is a total or what they are put together by.
+void StatementReader::checkGroups(const Selected& selected, std::size_t place) const {
+    const sql::Statement& statement = selected.statement;
+    const auto isTotal = [](const Node& node) {
+        return node && sql::holds<sql::Aggregate>(*node);
+    };
+    bool grouped = !statement.group.empty() || isTotal(statement.having);
+    for (const auto& item : statement.items)
+        if (const auto* node = std::get_if<Node>(&item.what)) grouped = grouped || isTotal(*node);
+    for (const auto& item : statement.order) grouped = grouped || isTotal(item.value);
+    if (!grouped) {
+        if (statement.having) refuse<MessageCode::criterionNotDrawn>(place);
+        return;
+    }
+    for (const auto& item : statement.items) {
+        const auto* node = std::get_if<Node>(&item.what);
+        if (!node || !isGrouped(*node, statement.group)) refuse<MessageCode::ungrouped>(place);
+    }
+    for (const auto& item : statement.order)
+        if (!isGrouped(item.value, statement.group)) refuse<MessageCode::ungrouped>(place);
+}
+
+} // namespace zandor::sql_reader

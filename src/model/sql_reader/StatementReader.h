@@ -1,0 +1,57 @@
+#pragma once
+
+#include "model/sql_reader/Lexer.h"
+#include "model/sql_reader/Selected.h"
+#include "model/sql_reader/Tree.h"
+#include "model/sql_reader/ValueReader.h"
+
+namespace zandor::sql_reader {
+
+/// Reads the parser's tree into a statement whose names are looked up. Throws Refused.
+class StatementReader {
+public:
+    /// What is given must outlive it.
+    StatementReader(const Schema& schema, const ParserText& text, Dialect dialect)
+        : mSchema(schema), mText(text), mDialect(dialect) {}
+
+    /// Of a SelectStmt.
+    Selected select(const Tree& tree);
+
+private:
+    /// A query that others read from.
+    struct Named {
+        String name;
+        std::shared_ptr<const model::sql::Statement> statement;
+        model::SavedQuery query;
+        std::vector<model::ColumnDescription> columns;
+    };
+    using Source = model::sql::SourceNode;
+
+    // Sources.cpp
+    Source source(const Tree& tree, Scope& scope, Selected& into);
+    Source table(const Tree& tree, Scope& scope, Selected& into);
+    Source subSelect(const Tree& tree, Scope& scope, Selected& into);
+    Source join(const Tree& tree, Scope& scope, Selected& into);
+    Source queryAs(const Named& query, const String& alias, std::size_t place, Scope& scope,
+                   Selected& into);
+    std::vector<Node> shared(const Tree& tree, const Scope& left, const Scope& right, Scope& both);
+    Named named(const Tree& select, String name);
+
+    void with(const Tree& tree);
+    void items(const Tree& tree, const ValueReader& values, Selected& into);
+    void item(const Tree& target, const ValueReader& values, Selected& into);
+    void limits(const Tree& tree, Selected& into);
+    void limit(const Tree& count, Selected& into) const;
+    Node byNameOrPlace(const Tree& tree, const ValueReader& values, const Selected& in,
+                       bool outputFirst) const;
+    void order(const Tree& tree, const ValueReader& values, Selected& into) const;
+    void checkGroups(const Selected& selected, std::size_t place) const;
+
+    const Schema& mSchema;
+    const ParserText& mText;
+    const Dialect mDialect;
+    std::vector<Named> mNamed;
+    int mDepth = 0;
+};
+
+} // namespace zandor::sql_reader

@@ -1,0 +1,631 @@
+#include "model/sql_reader/ValueReader.h"
+
+#include "model/criteria/Parser.h"
+#include "model/criteria/Tokens.h"
+#include "model/sql/Templates.h"
+#include "model/sql_reader/Forms.h"
+#include "model/sql_reader/Refused.h"
+
+#include <Zandor/model/Functions.h>
+#include <Zandor/model/Names.h>
+
+#include <algorithm>
+#include <array>
+
+namespace zandor::sql_reader {
+
+using model::ColumnType;
+using model::Total;
+using model::sameName;
+using model::criteria::inBrackets;
+
+namespace {
+
+/// The table whose columns stand for totals while a condition is read.
+constexpr StringView tableOfTotals = u"\uE002";
+
+bool isNamed(const Tree& type, std::initializer_list<StringView> names) {
+    if (type.has("typmods") || type.has("arrayBounds")) return false;
+    const auto all = type.names("names");
+    return std::any_of(names.begin(), names.end(),
+                       [&](StringView each) { return sameName(all.back(), each); });
+}
+
+bool isCastTo(const Tree& tree, std::initializer_list<StringView> types) {
+    return tree.is("TypeCast") && isNamed(tree.part("typeName"), types);
+}
+
+String operatorOf(const Tree& tree) { return tree.names("name").back(); }
+
+bool isOperation(const Tree& tree, StringView symbol) {
+    return tree.is("A_Expr") && tree.word("kind") == "AEXPR_OP" && operatorOf(tree) == symbol;
+}
+
+bool isConstant(const Tree& tree, const char* kind) {
+    return tree.is("A_Const") && tree.has(kind);
+}
+
+bool isFraction(const Tree& tree) { return isConstant(tree, "fval"); }
+
+bool isScale(const Tree& tree) {
+    return isFraction(tree) && sameName(tree.part("fval").text("fval"), u"1e0");
+}
+
+/// Whether the engine calculates with fractions here, whatever the columns hold.
+bool isReal(const Tree& tree) {
+    if (isFraction(tree) || isCastTo(tree, {u"float4", u"float8", u"double", u"real"})) return true;
+    for (const StringView symbol : {u"+", u"-", u"*", u"/"})
+        if (isOperation(tree, symbol))
+            return (tree.has("lexpr") && isReal(tree.node("lexpr"))) || isReal(tree.node("rexpr"));
+    return false;
+}
+
+bool isNotZero(const Tree& tree) {
+    if (isConstant(tree, "ival")) return tree.part("ival").number("ival") != 0;
+    if (!isFraction(tree)) return false;
+    const String digits = tree.part("fval").text("fval");
+    return digits.find_first_of(u"123456789") < digits.find_first_of(u"eE");
+}
+
+/// Conditions where a value stands alone: that it is true.
+Node asCondition(const Node& node) {
+    namespace sql = model::sql;
+    const bool joint = std::holds_alternative<sql::And>(node->node) ||
+                       std::holds_alternative<sql::Or>(node->node) ||
+                       std::holds_alternative<sql::Not>(node->node);
+    if (joint) {
+        auto parts = sql::partsOf(*node);
+        for (Node& part : parts) part = asCondition(part);
+        return sql::withParts(*node, std::move(parts));
+    }
+    if (sql::isCondition(*node)) return node;
+    return sql::make(sql::Compare{sql::Comparison::equal, node,
+                                  sql::make(sql::Value{ColumnType::Boolean, u"true"})});
+}
+
+/// SQLite compares moments as texts, so that one written otherwise is another.
+void checkMoments(const Node& node, const std::vector<String>& texts, std::size_t place) {
+    if (const auto* value = std::get_if<model::sql::Value>(&node->node)) {
+        const bool moment = value->type == ColumnType::Date || value->type == ColumnType::Time ||
+                            value->type == ColumnType::Timestamp;
+        if (moment && std::find(texts.begin(), texts.end(), value->text) == texts.end())
+            refuse<MessageCode::momentWritten>(place, value->text);
+    }
+    for (const Node& part : model::sql::partsOf(*node)) checkMoments(part, texts, place);
+}
+
+/// A pattern as expressions have it, of one whose `escape` makes the next sign an ordinary one.
+String typedPattern(StringView pattern, char16_t escape, bool brackets, std::size_t place) {
+    String out;
+    for (std::size_t i = 0; i < pattern.size(); ++i) {
+        char16_t c = pattern[i];
+        const bool itself = escape != 0 && c == escape && i + 1 < pattern.size();
+        if (itself) c = pattern[++i];
+        if (!itself && c == u'[' && brackets) refuse<MessageCode::unknownOperator>(place, u"LIKE [");
+        if (!itself && (c == u'%' || c == u'_'))
+            out += c == u'%' ? u'*' : u'?';
+        else if (StringView(u"*?%_[").find(c) != StringView::npos)
+            out += String(u"[") + c + u']';
+        else
+            out += c;
+    }
+    return out;
+}
+
+bool hasCase(StringView pattern) {
+    return std::any_of(pattern.begin(), pattern.end(), [](char16_t c) {
+        return (c >= u'a' && c <= u'z') || (c >= u'A' && c <= u'Z') || c > 0x7F;
+    });
+}
+
+/// A condition that holds in every row, as people write to have an AND before each of the others.
+bool holdsAlways(const Node& node) {
+    const auto* compare = std::get_if<model::sql::Compare>(&node->node);
+    return compare && compare->comparison == model::sql::Comparison::equal &&
+           std::holds_alternative<model::sql::Value>(compare->left->node) &&
+           model::sql::same(compare->left, compare->right);
+}
+
+} // namespace
+
+/// One expression being read: the totals in it have names for as long.
+class ValueReader::Pass final : public model::criteria::Resolver {
+public:
+    explicit Pass(const Scope& scope) : mScope(scope) {}
+
+    String nameFor(Node total) {
+        mTotals.push_back(std::move(total));
+        return inBrackets(tableOfTotals) + u".[" +
+               platform::decimal(static_cast<std::int64_t>(mTotals.size())) + u']';
+    }
+
+    /// With the totals in it instead of their names.
+    Node filled(const Node& node) const {
+        const auto* column = std::get_if<ColumnRef>(&node->node);
+        if (column && column->table == tableOfTotals) return mTotals[numberOf(column->column)];
+        auto parts = model::sql::partsOf(*node);
+        if (parts.empty()) return node;
+        for (Node& part : parts) part = filled(part);
+        return model::sql::withParts(*node, std::move(parts));
+    }
+
+    std::vector<model::criteria::NamedColumn> columnsNamed(StringView table,
+                                                           StringView column) const override {
+        if (table != tableOfTotals) return mScope.columnsNamed(table, column);
+        const Node& total = mTotals[numberOf(column)];
+        return {{{String(table), String(column), model::sql::typeOf(*total), {}}, {}}};
+    }
+    std::vector<model::criteria::NamedColumn> columnsNamed(StringView column) const override {
+        return mScope.columnsNamed(column);
+    }
+
+    int depth = 0;
+    /// Texts of the statement, as they stand.
+    std::vector<String> texts;
+
+private:
+    static std::size_t numberOf(StringView name) {
+        std::size_t number = 0;
+        for (const char16_t c : name) number = number * 10 + static_cast<std::size_t>(c - u'0');
+        return number - 1;
+    }
+
+    const Scope& mScope;
+    std::vector<Node> mTotals;
+};
+
+std::optional<Total> totalOf(const Tree& call) {
+    if (!call.is("FuncCall")) return {};
+    const String name = call.names("funcname").back();
+    const bool rows = call.flag("agg_star");
+    if (call.list("args").size() != (rows ? 0U : 1U)) return {};
+    if (sameName(name, u"count"))
+        return call.flag("agg_distinct") ? Total::CountDifferent : Total::Count;
+    if (sameName(name, u"sum")) return Total::Sum;
+    if (sameName(name, u"avg")) return Total::Average;
+    if (sameName(name, u"min")) return Total::Smallest;
+    if (sameName(name, u"max")) return Total::Largest;
+    return {};
+}
+
+Node ValueReader::value(const Tree& tree) const {
+    if (totalOf(tree)) {
+        Node node = total(tree);
+        mPlaces.emplace(node, tree.place());
+        return node;
+    }
+    Pass pass(mScope);
+    Node node = read(tree, pass);
+    if (model::sql::holds<model::sql::Aggregate>(*node))
+        refusePart<MessageCode::totalWithin>(tree.place());
+    mPlaces.emplace(node, tree.place());
+    return node;
+}
+
+std::vector<Node> ValueReader::conditions(const Tree& tree) const {
+    std::vector<Node> all;
+    if (tree.is("BoolExpr") && tree.word("boolop") == "AND_EXPR") {
+        for (const Tree& term : tree.list("args"))
+            for (Node& node : conditions(term)) all.push_back(std::move(node));
+        return all;
+    }
+    Pass pass(mScope);
+    Node node = read(tree, pass);
+    if (const auto* value = std::get_if<model::sql::Value>(&node->node))
+        if (value->type == ColumnType::Boolean && value->text == u"true") return all;
+    if (!model::sql::isCondition(*node) && model::sql::typeOf(*node) != ColumnType::Boolean)
+        refuse<MessageCode::criterionNotDrawn>(tree.place());
+    node = asCondition(node);
+    mPlaces.emplace(node, tree.place());
+    if (!holdsAlways(node)) all.push_back(std::move(node));
+    return all;
+}
+
+Node ValueReader::read(const Tree& tree, Pass& pass) const {
+    const String typed = text(tree, pass);
+    auto reading = model::criteria::readExpression(typed, pass);
+    if (reading.error)
+        refuse<MessageCode::notUnderstood>(blame(tree, pass), std::move(reading.error->message));
+    if (mDialect == Dialect::SQLite) checkMoments(reading.value, pass.texts, tree.place());
+    return pass.filled(reading.value);
+}
+
+/// Where the smallest part stands that is no expression.
+std::size_t ValueReader::blame(const Tree& tree, Pass& pass) const {
+    std::vector<Tree> below;
+    for (const char* name : {"lexpr", "rexpr", "arg"})
+        if (tree.has(name) && tree.node(name).kind() != "List") below.push_back(tree.node(name));
+    for (const char* name : {"args"})
+        for (const Tree& each : tree.list(name))
+            if (!each.is("CaseWhen")) below.push_back(each);
+    for (const Tree& each : below) {
+        try {
+            if (model::criteria::readExpression(text(each, pass), pass).error)
+                return blame(each, pass);
+        } catch (const Refused&) {
+            continue; // it means something only where it stands
+        }
+    }
+    return tree.place();
+}
+
+Node ValueReader::total(const Tree& tree) const {
+    if (tree.has("over")) refusePart<MessageCode::aWindow>(tree.place());
+    tree.only({"funcname", "args", "agg_star", "agg_distinct", "funcformat"});
+    const Total total = *totalOf(tree);
+    if (tree.flag("agg_distinct") && total != Total::CountDifferent)
+        refusePart<MessageCode::totalWithin>(tree.place());
+    Node operand;
+    if (!tree.flag("agg_star")) {
+        Tree of = tree.list("args").front();
+        const bool average = total == Total::Average;
+        // What the printer adds for an average that is a fraction.
+        if (average && mDialect == Dialect::MySQL && isOperation(of, u"*") &&
+            isScale(of.node("rexpr")))
+            of = of.node("lexpr");
+        const bool cast = average && isCastTo(of, {u"float8"});
+        if (cast && mDialect == Dialect::SqlServer) of = of.node("arg");
+        operand = value(of);
+        if (average && mDialect == Dialect::SqlServer && !cast &&
+            model::sql::typeOf(*operand) == ColumnType::Integer)
+            refuse<MessageCode::otherDivision>(tree.place(), u"AVG(CAST(x AS float))");
+        if (model::sql::holds<model::sql::Aggregate>(*operand))
+            refusePart<MessageCode::totalWithin>(tree.place());
+    }
+    const ColumnType type = operand ? model::sql::typeOf(*operand) : ColumnType::Unknown;
+    return model::sql::make(
+        model::sql::Aggregate{total, std::move(operand), model::typeOf(total, type)});
+}
+
+String ValueReader::text(const Tree& tree, Pass& pass) const {
+    constexpr int deepest = 100;
+    struct Deeper {
+        explicit Deeper(int& depth) : depth(++depth) {}
+        ~Deeper() { --depth; }
+        int& depth;
+    } const deeper(pass.depth);
+    if (pass.depth > deepest) refuse<MessageCode::tooDeep>(tree.place());
+
+    if (tree.is("A_Const")) {
+        if (tree.has("sval")) pass.texts.push_back(tree.part("sval").text("sval"));
+        return constant(tree);
+    }
+    if (tree.is("ColumnRef")) return column(tree, pass);
+    if (tree.is("ParamRef")) return parameter(tree);
+    if (tree.is("SubLink")) refusePart<MessageCode::aSubSelect>(tree.place());
+    if (auto known = byForm(tree, pass)) return *known;
+    if (tree.is("TypeCast")) return cast(tree, pass);
+    if (tree.is("A_Expr")) return operation(tree, pass);
+    if (tree.is("BoolExpr")) {
+        tree.only({"boolop", "args"});
+        if (tree.word("boolop") == "AND_EXPR") return joined(tree, u" And ", pass);
+        if (tree.word("boolop") == "OR_EXPR") return joined(tree, u" Or ", pass);
+        return u"(Not (" + text(tree.list("args").front(), pass) + u"))";
+    }
+    if (tree.is("NullTest")) {
+        tree.only({"arg", "nulltesttype", "argisrow"});
+        return u'(' + text(tree.node("arg"), pass) +
+               (tree.word("nulltesttype") == "IS_NULL" ? u" Is Null)" : u" Is Not Null)");
+    }
+    if (tree.is("CaseExpr")) return choice(tree, pass);
+    if (tree.is("CoalesceExpr")) {
+        tree.only({"args"});
+        return u"Coalesce(" + list(tree, "args", pass) + u')';
+    }
+    if (tree.is("FuncCall")) return call(tree, pass);
+    refuse<MessageCode::noPlaceFor>(tree.place(), model::say<MessageCode::thisPart>(tree.kind()));
+}
+
+String ValueReader::constant(const Tree& tree) const {
+    tree.only({"ival", "fval", "sval", "boolval", "bsval", "isnull"});
+    if (tree.has("isnull")) refuse<MessageCode::nullValue>(tree.place());
+    if (tree.has("ival")) {
+        const std::int64_t number = tree.part("ival").number("ival");
+        const String digits = platform::decimal(number);
+        return number < 0 ? u'(' + digits + u')' : digits;
+    }
+    if (tree.has("fval")) {
+        const String digits = tree.part("fval").text("fval");
+        return digits.front() == u'-' ? u'(' + digits + u')' : digits;
+    }
+    if (tree.has("boolval")) return tree.part("boolval").flag("boolval") ? u"True" : u"False";
+    if (tree.has("bsval")) return u"x'" + tree.part("bsval").text("bsval").substr(1) + u'\'';
+    String out = u"'";
+    for (const char16_t c : tree.part("sval").text("sval")) {
+        out += c;
+        if (c == u'\'') out += c;
+    }
+    return out + u'\'';
+}
+
+String ValueReader::column(const Tree& tree, Pass& pass) const {
+    std::vector<String> names;
+    for (const Tree& field : tree.list("fields")) {
+        if (!field.is("String")) refuse<MessageCode::notUnderstood>(tree.place(), u"*");
+        names.push_back(field.text("sval"));
+    }
+    if (names.size() > 3) refuse<MessageCode::unknownColumn>(tree.place(), names.back());
+    // A schema before the table says what the table says already.
+    const String table = names.size() > 1 ? names[names.size() - 2] : String();
+    const auto alias = mAliases.find(model::foldedName(names.back()));
+    if (names.size() == 1 && alias != mAliases.end() && !mScope.find(names.back(), tree.place()))
+        return text(alias->second, pass);
+    const ColumnRef found = mScope.column(table, names.back(), tree.place());
+    return inBrackets(found.table) + u'.' + inBrackets(found.column);
+}
+
+String ValueReader::parameter(const Tree& tree) const {
+    const std::int64_t number = tree.number("number");
+    String name = number >= 1 && static_cast<std::size_t>(number) <= mText.parameters.size()
+                      ? mText.parameters[static_cast<std::size_t>(number) - 1]
+                      : platform::decimal(number);
+    return model::criteria::isBareName(name) ? u':' + name : inBrackets(name);
+}
+
+String ValueReader::cast(const Tree& tree, Pass& pass) const {
+    tree.only({"arg", "typeName"});
+    const Tree of = tree.node("arg");
+    const Tree type = tree.part("typeName");
+    // A parameter takes its type from what it stands beside.
+    if (of.is("ParamRef")) return parameter(of);
+    if (isConstant(of, "sval")) {
+        const String content = of.part("sval").text("sval");
+        pass.texts.push_back(content);
+        if (isNamed(type, {u"date", u"time", u"timestamp", u"datetime", u"datetime2"}))
+            return u'#' + content + u'#';
+        if (isNamed(type, {u"bytea"}) && content.starts_with(u"\\x"))
+            return u"x'" + content.substr(2) + u'\'';
+    }
+    refuse<MessageCode::unknownCast>(tree.place());
+}
+
+ColumnType ValueReader::typeOf(const Tree& tree, Pass& pass) const {
+    const auto reading = model::criteria::readExpression(text(tree, pass), pass);
+    return reading.value ? model::sql::typeOf(*reading.value) : ColumnType::Unknown;
+}
+
+String ValueReader::operation(const Tree& tree, Pass& pass) const {
+    tree.only({"kind", "name", "lexpr", "rexpr"});
+    const std::string_view kind = tree.word("kind");
+    const String symbol = operatorOf(tree);
+    if (kind == "AEXPR_OP") {
+        if (tree.node("rexpr").is("SubLink")) refusePart<MessageCode::aSubSelect>(tree.place());
+        if (!tree.has("lexpr")) {
+            if (symbol == u"-") return u"(-" + text(tree.node("rexpr"), pass) + u')';
+            if (symbol == u"+") return text(tree.node("rexpr"), pass);
+            refuse<MessageCode::unknownOperator>(tree.place(), symbol);
+        }
+        for (const StringView each : {u"=", u"<>", u"<", u">", u"<=", u">="})
+            if (symbol == each) return comparison(tree, each, pass);
+        if (symbol == u"/") return division(tree, pass);
+        for (const StringView each : {u"+", u"-", u"*"})
+            if (symbol == each) return arithmetic(tree, each, pass);
+        // MySQL's || is an OR.
+        if (symbol == u"||" && mDialect != Dialect::MySQL && mDialect != Dialect::SqlServer) {
+            for (const char* side : {"lexpr", "rexpr"})
+                if (typeOf(tree.node(side), pass) == ColumnType::Boolean)
+                    refuse<MessageCode::unknownOperator>(tree.place(), symbol);
+            return u'(' + text(tree.node("lexpr"), pass) + u" & " +
+                   text(tree.node("rexpr"), pass) + u')';
+        }
+    }
+    if (kind == "AEXPR_LIKE" || kind == "AEXPR_ILIKE") return like(tree, pass);
+    if (kind == "AEXPR_IN") {
+        const Tree of = tree.node("lexpr");
+        const Tree choices = tree.node("rexpr");
+        String items;
+        for (const Tree& item : choices.list("items")) {
+            if (!items.empty()) items += u", ";
+            items += side(item, of, pass);
+        }
+        return u'(' + text(of, pass) + (symbol == u"=" ? u" In (" : u" Not In (") + items + u"))";
+    }
+    if (kind == "AEXPR_BETWEEN" || kind == "AEXPR_NOT_BETWEEN") {
+        const Tree of = tree.node("lexpr");
+        const auto bounds = tree.node("rexpr").list("items");
+        return u'(' + text(of, pass) +
+               (kind == "AEXPR_BETWEEN" ? u" Between " : u" Not Between ") +
+               side(bounds[0], of, pass) + u" And " + side(bounds[1], of, pass) + u')';
+    }
+    refuse<MessageCode::unknownOperator>(tree.place(), symbol);
+}
+
+String ValueReader::comparison(const Tree& tree, StringView symbol, Pass& pass) const {
+    const Tree left = tree.node("lexpr");
+    const Tree right = tree.node("rexpr");
+    return u'(' + side(left, right, pass) + u' ' + String(symbol) + u' ' +
+           side(right, left, pass) + u')';
+}
+
+/// What is compared with another.
+String ValueReader::side(const Tree& tree, const Tree& other, Pass& pass) const {
+    const StringView moment =
+        model::sql::templateOf(model::sql::Function::moment, 1, mDialect);
+    // A date beside a moment is made one by itself.
+    const bool cast = mDialect != Dialect::SQLite &&
+                      isCastTo(tree, {u"timestamp", u"datetime", u"datetime2"}) &&
+                      !moment.empty() && !isConstant(tree.node("arg"), "sval");
+    if (cast && typeOf(tree.node("arg"), pass) == ColumnType::Date &&
+        typeOf(other, pass) == ColumnType::Timestamp)
+        return text(tree.node("arg"), pass);
+    // Elsewhere than in PostgreSQL truth is a number.
+    const bool truth = isConstant(tree, "ival") && mDialect != Dialect::PostgreSQL;
+    if (truth && typeOf(other, pass) == ColumnType::Boolean) {
+        const std::int64_t number = tree.part("ival").number("ival");
+        if (number == 0 || number == 1) return number == 1 ? u"True" : u"False";
+    }
+    return text(tree, pass);
+}
+
+String ValueReader::arithmetic(const Tree& tree, StringView symbol, Pass& pass) const {
+    Tree left = tree.node("lexpr");
+    const Tree right = tree.node("rexpr");
+    // What the printer adds so that a product has room.
+    if (symbol == u"*" && isCastTo(left, {u"int8"}) &&
+        typeOf(left.node("arg"), pass) == ColumnType::Integer &&
+        typeOf(right, pass) == ColumnType::Integer)
+        left = left.node("arg");
+    const ColumnType one = typeOf(left, pass);
+    const ColumnType two = typeOf(right, pass);
+    StringView word = symbol;
+    if (mDialect == Dialect::SqlServer && symbol == u"+" &&
+        (one == ColumnType::Text || two == ColumnType::Text))
+        word = u"&";
+    const auto isMoment = [](ColumnType type) {
+        return type == ColumnType::Date || type == ColumnType::Timestamp || type == ColumnType::Time;
+    };
+    // Days are added to dates by an operator nowhere else.
+    const bool dates = isMoment(one) || isMoment(two);
+    const bool asWell = mDialect == Dialect::PostgreSQL && one != ColumnType::Timestamp &&
+                        two != ColumnType::Timestamp;
+    if (dates && !asWell) refuse<MessageCode::unknownOperator>(tree.place(), symbol);
+    return u'(' + text(left, pass) + u' ' + String(word) + u' ' + text(right, pass) + u')';
+}
+
+String ValueReader::division(const Tree& tree, Pass& pass) const {
+    const Tree left = tree.node("lexpr");
+    const Tree right = tree.node("rexpr");
+    const auto divided = [&](const Tree& by, const Tree& with) {
+        return u'(' + text(by, pass) + u" / " + text(with, pass) + u')';
+    };
+    if (mDialect == Dialect::MySQL) {
+        if (isOperation(left, u"*") && isScale(left.node("rexpr")))
+            return divided(left.node("lexpr"), right);
+        refuse<MessageCode::otherDivision>(tree.place(), u"x * 1e0 / y");
+    }
+    const bool cast = isCastTo(left, {u"float4", u"float8", u"double", u"real"});
+    if (mDialect == Dialect::SQLite) {
+        if (cast) return divided(left.node("arg"), right);
+        if (isReal(left) || isReal(right)) return divided(left, right);
+        refuse<MessageCode::otherDivision>(tree.place(), u"CAST(x AS REAL) / y");
+    }
+    const bool guarded = right.is("A_Expr") && right.word("kind") == "AEXPR_NULLIF" &&
+                         isConstant(right.node("rexpr"), "ival") &&
+                         !isNotZero(right.node("rexpr"));
+    if (cast && !isCastTo(left, {u"float4"}) && (guarded || isNotZero(right)))
+        return divided(left.node("arg"), guarded ? right.node("lexpr") : right);
+    refuse<MessageCode::otherDivision>(tree.place(), mDialect == Dialect::SqlServer
+                                                         ? u"CAST(x AS float) / NULLIF(y, 0)"
+                                                         : u"CAST(x AS double precision) / "
+                                                           u"NULLIF(y, 0)");
+}
+
+String ValueReader::like(const Tree& tree, Pass& pass) const {
+    const bool negated = operatorOf(tree).front() == u'!';
+    Tree pattern = tree.node("rexpr");
+    const bool byDefault = mDialect == Dialect::PostgreSQL || mDialect == Dialect::MySQL;
+    char16_t escape = byDefault ? u'\\' : u'\0';
+    if (pattern.is("FuncCall") && sameName(pattern.names("funcname").back(), u"like_escape")) {
+        const auto arguments = pattern.list("args");
+        const String sign =
+            isConstant(arguments[1], "sval") ? arguments[1].part("sval").text("sval") : String();
+        if (sign.size() != 1) refuse<MessageCode::unknownOperator>(tree.place(), u"LIKE");
+        escape = sign.front();
+        pattern = arguments[0];
+    }
+    const bool tellsCase =
+        mDialect == Dialect::PostgreSQL && tree.word("kind") == "AEXPR_LIKE";
+    String right;
+    if (isConstant(pattern, "sval")) {
+        const String content = pattern.part("sval").text("sval");
+        if (tellsCase && hasCase(content)) refuse<MessageCode::caseOfLike>(tree.place());
+        const String typed = typedPattern(content, escape, mDialect == Dialect::SqlServer,
+                                          pattern.place());
+        right = u'\'';
+        for (const char16_t c : typed) {
+            right += c;
+            if (c == u'\'') right += c;
+        }
+        right += u'\'';
+    } else if (pattern.is("ParamRef") && !tellsCase) {
+        right = parameter(pattern);
+    } else {
+        refuse<MessageCode::unknownOperator>(pattern.place(), u"LIKE");
+    }
+    return u'(' + text(tree.node("lexpr"), pass) + (negated ? u" Not Like " : u" Like ") + right +
+           u')';
+}
+
+String ValueReader::joined(const Tree& tree, StringView word, Pass& pass) const {
+    String out = u"(";
+    for (const Tree& term : tree.list("args")) {
+        if (out.size() > 1) out += word;
+        out += text(term, pass);
+    }
+    return out + u')';
+}
+
+String ValueReader::choice(const Tree& tree, Pass& pass) const {
+    tree.only({"arg", "args", "defresult"});
+    String out;
+    String close;
+    for (const Tree& when : tree.list("args")) {
+        const Tree condition = when.node("expr");
+        if (!out.empty()) out += u", ";
+        out += u"If(";
+        if (tree.has("arg"))
+            out += text(tree.node("arg"), pass) + u" = " +
+                   side(condition, tree.node("arg"), pass);
+        else
+            out += text(condition, pass);
+        out += u", " + text(when.node("result"), pass);
+        close += u')';
+    }
+    const bool otherwise = tree.has("defresult") && !tree.node("defresult").has("isnull");
+    if (otherwise) out += u", " + text(tree.node("defresult"), pass);
+    return out + close;
+}
+
+String ValueReader::list(const Tree& tree, const char* name, Pass& pass) const {
+    String out;
+    for (const Tree& each : tree.list(name)) {
+        if (!out.empty()) out += u", ";
+        out += text(each, pass);
+    }
+    return out;
+}
+
+String ValueReader::call(const Tree& tree, Pass& pass) const {
+    if (tree.has("over")) refusePart<MessageCode::aWindow>(tree.place());
+    if (totalOf(tree)) return pass.nameFor(total(tree));
+    const String name = tree.names("funcname").back();
+    const auto arguments = tree.list("args");
+    if (mDialect == Dialect::MySQL && sameName(name, u"concat") && arguments.size() > 1) {
+        tree.only({"funcname", "args", "funcformat"});
+        String out = u"(";
+        for (const Tree& each : arguments) {
+            if (out.size() > 1) out += u" & ";
+            out += text(each, pass);
+        }
+        return out + u')';
+    }
+    refuse<MessageCode::unknownFunction>(tree.place(), name);
+}
+
+/// What has one of the forms that stand for a function; the first that comes to it.
+std::optional<String> ValueReader::byForm(const Tree& tree, Pass& pass) const {
+    if (!tree.is("FuncCall") && !tree.is("TypeCast") && !tree.is("A_Expr") &&
+        !tree.is("SQLValueFunction") && !tree.is("MinMaxExpr"))
+        return {};
+    for (const Form& form : formsOf(mDialect)) {
+        const auto arguments = form.match(tree);
+        if (!arguments) continue;
+        String out;
+        for (std::size_t at = 0; at < form.expression.size(); ++at) {
+            if (form.expression[at] != u'{') {
+                out += form.expression[at];
+                continue;
+            }
+            out += text(arguments->at(form.expression[at + 1] - u'0'), pass);
+            at += 2;
+        }
+        if (!form.function || *form.function == model::sql::Function::text) return out;
+        const auto reading = model::criteria::readExpression(out, pass);
+        const auto* call =
+            reading.value ? std::get_if<model::sql::Call>(&reading.value->node) : nullptr;
+        if (reading.error || (call && call->function == *form.function)) return out;
+    }
+    return {};
+}
+
+} // namespace zandor::sql_reader
