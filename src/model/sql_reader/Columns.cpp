@@ -4,6 +4,8 @@
 #include "model/sql_reader/Refused.h"
 #include "model/sql_reader/Sameness.h"
 
+#include <Zandor/sql/Builder.h>
+
 #include <algorithm>
 
 namespace zandor::sql_reader {
@@ -47,10 +49,10 @@ Columns::Column& Columns::add(const Node& subject, bool visible, const String& n
     fill(*definition, subject);
     definition->Visible(visible);
     mQuery.AddColumnDefinition(definition);
-    const String own = definition->Column()->Name();
     const auto* column = std::get_if<ColumnRef>(&subject->node);
-    if (!name.empty() && name != (column ? column->column : own)) definition->Synonym(name);
-    mColumns.push_back({model::criteria::Subject(subject, own), definition});
+    if (!column || column->column != name) definition->Synonym(name);
+    mColumns.push_back(
+        {model::criteria::Subject(subject, definition->Column()->Name()), definition});
     return mColumns.back();
 }
 
@@ -86,19 +88,46 @@ Columns::Column* Columns::find(const Node& subject, bool apart) {
     return at == mColumns.end() ? nullptr : &*at;
 }
 
-Columns::Column& Columns::forCondition(const Node& subject, bool apart) {
+Columns::Column* Columns::knownFor(const Node& subject, bool apart) {
     const bool total = std::holds_alternative<sql::Aggregate>(subject->node);
-    if (!mGrouped || total) {
-        if (Column* known = find(subject, false)) return *known;
-        return add(subject, false);
-    }
+    if (!mGrouped || total) return find(subject, false);
     // What rows are put together by can as well be asked before.
     Column* grouped = apart ? nullptr : find(subject, false);
-    if (grouped) return *grouped;
-    if (Column* known = find(subject, true)) return *known;
+    return grouped ? grouped : find(subject, true);
+}
+
+Columns::Column& Columns::forCondition(const Node& subject, bool apart) {
+    if (Column* known = knownFor(subject, apart)) return *known;
     Column& made = add(subject, false);
-    made.definition->total(model::Total::Condition);
+    const bool total = std::holds_alternative<sql::Aggregate>(subject->node);
+    if (mGrouped && !total) made.definition->total(model::Total::Condition);
     return made;
+}
+
+void Columns::moveNewestBefore(const Column& other) {
+    Ref<TalvikZandorLib::ZDColumnDefinition> before;
+    for (const auto& each :
+         platform::Each<TalvikZandorLib::ZDColumnDefinition>(mQuery.ColumnDefinitions())) {
+        if (each == other.definition) break;
+        before = each;
+    }
+    mQuery.StandsBehind(mColumns.back().definition, before);
+}
+
+void Columns::dropOwnNames() {
+    std::vector<std::pair<Ref<model::ColumnDefinition>, String>> named;
+    for (const Column& column : mColumns)
+        if (column.definition->comesOut()) {
+            named.emplace_back(column.definition, column.definition->Synonym());
+            column.definition->Synonym({});
+        }
+    const sql::Built built = sql::build(mQuery);
+    std::size_t next = 0;
+    for (const auto& item : built.statement->items) {
+        if (std::holds_alternative<sql::AllColumns>(item.what) || next == named.size()) continue;
+        const auto& [definition, name] = named[next++];
+        if (name != item.name) definition->Synonym(name);
+    }
 }
 
 void Columns::sort() {

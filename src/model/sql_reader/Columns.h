@@ -4,6 +4,8 @@
 
 #include "model/criteria/Parser.h"
 
+#include <deque>
+
 namespace zandor::sql_reader {
 
 /// The output columns of a query that is being drawn, by what comes out of them.
@@ -16,6 +18,9 @@ public:
     /// Which of them sort, and in which order.
     void sort();
 
+    /// Leaves out names under which columns come out by themselves.
+    void dropOwnNames();
+
     /// What a cell of criteria belongs to.
     struct Column {
         model::criteria::Subject subject;
@@ -24,6 +29,10 @@ public:
     /// The column that a condition on rows as they are stands under, made where there is none; one
     /// that only chooses (`apart`) where rows are put together and it means those before.
     Column& forCondition(const Node& subject, bool apart);
+    /// The same, nothing where there is none yet.
+    Column* knownFor(const Node& subject, bool apart);
+    /// Brings the newest column before another, so that conditions keep their order.
+    void moveNewestBefore(const Column& other);
 
     /// Rows are put together.
     bool isGrouped() const { return mGrouped; }
@@ -39,7 +48,7 @@ private:
     const Selected& mSelected;
     bool mGrouped = false;
     bool mTotals = false; ///< some column has one
-    std::vector<Column> mColumns;
+    std::deque<Column> mColumns; ///< in the order in which they were made
 };
 
 } // namespace zandor::sql_reader

@@ -49,6 +49,9 @@ bool isAbout(const Node& condition, const Node& subject) {
                        [&](const Node& part) { return isAbout(part, subject); });
 }
 
+/// Conditions of a row by what they speak about.
+using Cells = std::vector<std::pair<Node, std::vector<Node>>>;
+
 class Drawing {
 public:
     Drawing(const Selected& selected, Layout layout) : mSelected(selected), mLayout(layout) {}
@@ -64,6 +67,7 @@ public:
         options.distinct = mSelected.statement.distinct;
         options.first = static_cast<std::int32_t>(mSelected.statement.limit.value_or(0));
         mQuery->options(std::move(options));
+        columns.dropOwnNames();
         return mQuery;
     }
 
@@ -89,7 +93,9 @@ private:
         constexpr std::size_t mostRows = 12; // of the grid
         std::vector<std::vector<Node>> rows{ways};
         if (mLayout == Layout::rows) {
-            auto all = waysOf(ways, mostRows);
+            auto all = waysOf(ways, mostRows, [](const Node& condition) {
+                return isAbout(condition, subjectOf(condition));
+            });
             if (!all || all->size() > mostRows) refuseCondition();
             rows = std::move(*all);
         }
@@ -105,7 +111,7 @@ private:
     }
 
     void addRow(Columns& columns, const std::vector<Node>& terms, std::int16_t row, bool apart) {
-        std::vector<std::pair<Node, std::vector<Node>>> cells;
+        Cells cells;
         for (const Node& term : terms) {
             const Node subject = subjectOf(term);
             const auto known = std::find_if(cells.begin(), cells.end(), [&](const auto& cell) {
@@ -117,14 +123,28 @@ private:
                 known->second.push_back(term);
         }
         const model::criteria::QueryColumns names(mQuery->Tables());
-        for (const auto& [subject, each] : cells) {
-            const Columns::Column& column = columns.forCondition(subject, apart);
+        for (std::size_t n = 0; n < cells.size(); ++n) {
+            const auto& [subject, each] = cells[n];
+            const Columns::Column& column = columnFor(columns, cells, n, apart);
             const auto text =
                 model::criteria::written(sql::allOf(each), column.subject, names);
             const String key = platform::decimal(row);
             if (!text || column.definition->HasCriterium(key)) refuseCondition();
             column.definition->AddCriterium(*text, key);
         }
+    }
+
+    /// Made where there is none, before those of the conditions behind it.
+    static Columns::Column& columnFor(Columns& columns, const Cells& cells, std::size_t n,
+                                      bool apart) {
+        if (auto* known = columns.knownFor(cells[n].first, apart)) return *known;
+        Columns::Column& made = columns.forCondition(cells[n].first, apart);
+        for (std::size_t behind = n + 1; behind < cells.size(); ++behind)
+            if (const auto* other = columns.knownFor(cells[behind].first, apart)) {
+                columns.moveNewestBefore(*other);
+                break;
+            }
+        return made;
     }
 
     const Selected& mSelected;
@@ -152,9 +172,9 @@ Ref<Query> drawn(const Selected& selected) {
             const auto query = Drawing(selected, layout).draw();
             const auto why = whyNot(*query, selected.statement);
             if (!why) return query;
-            if (!first) first = Refused{*why, selected.place};
+            first = Refused{*why, selected.place};
         } catch (const Refused& refused) {
-            if (!first || refused.place != selected.place) first = refused;
+            if (!first) first = refused;
         }
     }
     throw Refused(*first);

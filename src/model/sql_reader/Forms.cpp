@@ -138,11 +138,11 @@ private:
         }
         static constexpr std::array<StringView, 5> forms = {
             u"MAX({1}, {2})", u"CAST(CASE WHEN {1} < {2} THEN {2} ELSE {1} END AS integer)",
-            u"GREATEST({1}, {2})", u"CASE WHEN {1} < {2} THEN {2} ELSE {1} END", u"{1}"};
+            u"GREATEST({1}, {2})", u"CASE WHEN {1} < {2} THEN {2} ELSE {1} END",
+            u"CASE WHEN {1} < {2} THEN {2} ELSE {1} END"};
         Matching inner(mDialect);
         const Json form = parsed(forms[static_cast<std::size_t>(mDialect)], mDialect);
         if (!inner.match(form, given)) return nullptr;
-        if (mDialect == Dialect::Standard) return inner.found[1];
         const Json* limit = inner.found[2];
         if (!isWhole(*limit)) return nullptr;
         const auto value = (*limit)["A_Const"]["ival"].value("ival", 0);
@@ -203,6 +203,8 @@ constexpr auto customs = std::to_array<Custom>({
     {mysql, u"EXTRACT(DAY FROM {1})", u"Day({1})"},
     {mysql, u"DAYOFMONTH({1})", u"Day({1})"},
     {server, u"ISNULL({1}, {2})", u"Coalesce({1}, {2})"},
+    // It has bits for values, and conditions.
+    {server, u"CASE WHEN {1} THEN 1 WHEN NOT ({1}) THEN 0 END", u"({1})"},
     {server, u"DATEPART(year, {1})", u"Year({1})"},
     {server, u"DATEPART(month, {1})", u"Month({1})"},
     {server, u"DATEPART(day, {1})", u"Day({1})"},
@@ -249,6 +251,18 @@ std::optional<std::map<int, Tree>> Form::match(const Tree& node) const {
     std::map<int, Tree> arguments;
     for (const auto& [number, json] : matching.found) arguments.emplace(number, *json);
     return arguments;
+}
+
+const Form& momentOf(Dialect dialect) {
+    static const std::array<Form, 5> all = [] {
+        std::array<Form, 5> forms;
+        for (const Dialect each : model::sql::allDialects) {
+            const StringView form = model::sql::templateOf(Function::moment, 1, each);
+            forms[static_cast<std::size_t>(each)] = {parsed(form, each), u"{1}", {}, each};
+        }
+        return forms;
+    }();
+    return all[static_cast<std::size_t>(dialect)];
 }
 
 const std::vector<Form>& formsOf(Dialect dialect) {

@@ -27,6 +27,9 @@ struct Form {
     std::optional<std::map<int, Tree>> match(const Tree& node) const;
 };
 
+/// How the printer makes a moment of a date, for which expressions have no word.
+const Form& momentOf(Dialect dialect);
+
 /// What the printer writes in a dialect, and what else people write there that means the same.
 const std::vector<Form>& formsOf(Dialect dialect);
 

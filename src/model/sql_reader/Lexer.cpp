@@ -312,10 +312,16 @@ private:
 
     /// Whether the parser would take a word for its own that the dialect takes for a name.
     bool isNameHere(const String& folded, bool called) const {
-        constexpr std::array names = std::to_array<StringView>(
-            {u"user", u"analyse", u"analyze", u"placing", u"symmetric", u"asymmetric", u"variadic",
-             u"do", u"initially", u"column", u"grant", u"tablesample", u"verbose", u"freeze"});
-        return !called && std::find(names.begin(), names.end(), folded) != names.end() &&
+        constexpr std::array clauses = std::to_array<StringView>(
+            {u"asc", u"both", u"case", u"cast", u"collate", u"cross", u"current_date",
+             u"current_time", u"current_timestamp", u"desc", u"distinct", u"else", u"end",
+             u"except", u"false", u"fetch", u"for", u"from", u"full", u"group", u"having", u"ilike",
+             u"inner", u"intersect", u"join", u"lateral", u"leading", u"left", u"like", u"limit",
+             u"localtime", u"localtimestamp", u"natural", u"not", u"null", u"offset", u"on", u"only",
+             u"order", u"outer", u"right", u"select", u"similar", u"then", u"trailing", u"true",
+             u"union", u"using", u"when", u"where", u"window", u"with"});
+        return !called && std::find(clauses.begin(), clauses.end(), folded) == clauses.end() &&
+               model::sql::isReserved(folded, Dialect::PostgreSQL) &&
                !model::sql::isReserved(folded, mDialect);
     }
 

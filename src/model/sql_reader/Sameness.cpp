@@ -69,11 +69,14 @@ Node plain(const Node& node) {
 
 class Normal {
 public:
-    explicit Normal(std::size_t most) : mMost(most) {}
+    using IsWhole = std::function<bool(const Node&)>;
+    explicit Normal(std::size_t most, IsWhole isWhole = {})
+        : mMost(most), mIsWhole(std::move(isWhole)) {}
 
     /// Nothing where there are too many ways.
     std::optional<Ways> of(const Node& given) {
-        const Node node = plain(given);
+        if (mIsWhole && mIsWhole(given)) return Ways{{given}};
+        const Node node = mIsWhole ? given : plain(given);
         if (const auto* any = std::get_if<sql::Or>(&node->node)) {
             Ways all;
             for (const Node& term : any->terms) {
@@ -106,6 +109,7 @@ public:
 
 private:
     const std::size_t mMost;
+    const IsWhole mIsWhole;
 };
 
 /// The ways that no other one is a part of; two conditions have the same exactly when they are the
@@ -333,8 +337,9 @@ String keyOf(const Node& given) {
     return key + u')';
 }
 
-std::optional<Ways> waysOf(const std::vector<Node>& terms, std::size_t most) {
-    return Normal(most).product(terms);
+std::optional<Ways> waysOf(const std::vector<Node>& terms, std::size_t most,
+                           const std::function<bool(const Node&)>& isWhole) {
+    return Normal(most, isWhole).product(terms);
 }
 
 std::optional<model::Message> difference(const Statement& read, const Statement& drawn) {

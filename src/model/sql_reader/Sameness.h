@@ -3,6 +3,7 @@
 #include <Zandor/sql/Statement.h>
 #include <Zandor/sql_reader/Messages.h>
 
+#include <functional>
 #include <optional>
 #include <set>
 #include <vector>
@@ -20,9 +21,10 @@ using platform::String;
 std::optional<model::Message> difference(const Statement& read, const Statement& drawn);
 
 /// A condition as the ways in which it holds: one of these rows, in which all stands. Nothing where
-/// there are too many.
+/// there are too many. What `isWhole` says so of is not taken apart.
 using Ways = std::vector<std::vector<Node>>;
-std::optional<Ways> waysOf(const std::vector<Node>& terms, std::size_t most);
+std::optional<Ways> waysOf(const std::vector<Node>& terms, std::size_t most,
+                           const std::function<bool(const Node&)>& isWhole);
 
 /// A text that two nodes share exactly when they say the same by the same parts.
 String keyOf(const Node& node);

@@ -1,11 +1,13 @@
 #include "model/sql_reader/StatementReader.h"
 
 #include "model/sql_reader/Refused.h"
+#include "model/sql_reader/Terms.h"
 
 #include <Zandor/model/Names.h>
 #include <Zandor/model/QueryOptions.h>
 
 #include <algorithm>
+#include <functional>
 
 namespace zandor::sql_reader {
 
@@ -33,6 +35,17 @@ bool isGrouped(const Node& node, const std::vector<Node>& groups) {
     return false;
 }
 
+/// Sources that nothing joins stand beside each other.
+void addSources(const sql::SourceNode& source, std::vector<sql::SourceNode>& all) {
+    const auto* join = std::get_if<sql::JoinSource>(&source->node);
+    if (!join || join->kind != sql::JoinKind::inner || !termsOf(join->on).empty()) {
+        all.push_back(source);
+        return;
+    }
+    addSources(join->left, all);
+    addSources(join->right, all);
+}
+
 } // namespace
 
 Selected StatementReader::select(const Tree& tree) {
@@ -45,12 +58,19 @@ Selected StatementReader::select(const Tree& tree) {
                "withClause", "op"});
     const std::size_t known = mNamed.size();
     if (tree.has("withClause")) with(tree.part("withClause"));
+    if (const auto inner = differsAround(tree)) {
+        Selected selected = select(*inner);
+        selected.statement.distinct = true;
+        order(tree, ValueReader(selected.scope, mText, mDialect, selected.places), selected);
+        limits(tree, selected);
+        return selected;
+    }
 
     Selected selected;
     selected.place = tree.place();
     if (!tree.has("fromClause")) refusePart<MessageCode::noTable>(tree.place());
     for (const Tree& each : tree.list("fromClause"))
-        selected.statement.from.push_back(source(each, selected.scope, selected));
+        addSources(source(each, selected.scope, selected), selected.statement.from);
 
     ValueReader values(selected.scope, mText, mDialect, selected.places);
     items(tree, values, selected);
@@ -65,12 +85,46 @@ Selected StatementReader::select(const Tree& tree) {
         selected.statement.group.push_back(byNameOrPlace(each, values, selected, false));
     }
     if (tree.has("havingClause"))
-        selected.statement.having = sql::allOf(values.conditions(tree.node("havingClause")));
+        selected.statement.having = behindGroups(values.conditions(tree.node("havingClause")),
+                                                 selected.statement.group);
     order(tree, values, selected);
     limits(tree, selected);
     checkGroups(selected, tree.place());
     mNamed.erase(mNamed.begin() + static_cast<std::ptrdiff_t>(known), mNamed.end());
     return selected;
+}
+
+/// MySQL knows no expression again behind GROUP BY, so that the printer asks for the smallest of
+/// what is the same in a whole group.
+Node StatementReader::behindGroups(std::vector<Node> terms, const std::vector<Node>& groups) const {
+    const std::function<Node(const Node&)> plain = [&](const Node& node) {
+        const auto* total = std::get_if<sql::Aggregate>(&node->node);
+        if (total && total->total == model::Total::Smallest && isGrouped(total->operand, groups))
+            return total->operand;
+        auto parts = sql::partsOf(*node);
+        if (parts.empty()) return node;
+        for (Node& part : parts) part = plain(part);
+        return sql::withParts(*node, std::move(parts));
+    };
+    if (mDialect == Dialect::MySQL)
+        for (Node& term : terms) term = plain(term);
+    return sql::allOf(std::move(terms));
+}
+
+/// The select within another that does nothing but leave equal rows out, as the printer has it for
+/// totals in MySQL.
+std::optional<Tree> StatementReader::differsAround(const Tree& tree) const {
+    if (mDialect != Dialect::MySQL || !tree.has("distinctClause")) return {};
+    for (const char* part : {"whereClause", "groupClause", "havingClause"})
+        if (tree.has(part)) return {};
+    const auto from = tree.list("fromClause");
+    const auto targets = tree.list("targetList");
+    if (from.size() != 1 || targets.size() != 1 || !from.front().is("RangeSubselect")) return {};
+    if (!isStar(targets.front().node("val"))) return {};
+    const Tree inner = from.front().node("subquery");
+    for (const char* part : {"distinctClause", "sortClause", "limitCount", "limitOffset"})
+        if (inner.has(part)) return {};
+    return inner;
 }
 
 void StatementReader::with(const Tree& tree) {

@@ -38,6 +38,8 @@ private:
     Named named(const Tree& select, String name);
 
     void with(const Tree& tree);
+    std::optional<Tree> differsAround(const Tree& tree) const;
+    Node behindGroups(std::vector<Node> terms, const std::vector<Node>& groups) const;
     void items(const Tree& tree, const ValueReader& values, Selected& into);
     void item(const Tree& target, const ValueReader& values, Selected& into);
     void limits(const Tree& tree, Selected& into);

@@ -2,7 +2,6 @@
 
 #include "model/criteria/Parser.h"
 #include "model/criteria/Tokens.h"
-#include "model/sql/Templates.h"
 #include "model/sql_reader/Forms.h"
 #include "model/sql_reader/Refused.h"
 
@@ -210,7 +209,8 @@ std::vector<Node> ValueReader::conditions(const Tree& tree) const {
         return all;
     }
     Pass pass(mScope);
-    Node node = read(tree, pass);
+    Node node = columnsCompared(tree);
+    if (!node) node = read(tree, pass);
     if (const auto* value = std::get_if<model::sql::Value>(&node->node))
         if (value->type == ColumnType::Boolean && value->text == u"true") return all;
     if (!model::sql::isCondition(*node) && model::sql::typeOf(*node) != ColumnType::Boolean)
@@ -219,6 +219,30 @@ std::vector<Node> ValueReader::conditions(const Tree& tree) const {
     mPlaces.emplace(node, tree.place());
     if (!holdsAlways(node)) all.push_back(std::move(node));
     return all;
+}
+
+/// Two columns by an operator, whatever they hold: joins may compare what criteria may not.
+Node ValueReader::columnsCompared(const Tree& tree) const {
+    if (!tree.is("A_Expr") || tree.word("kind") != "AEXPR_OP" || !tree.has("lexpr")) return {};
+    const auto column = [&](const char* side) -> Node {
+        const Tree of = tree.node(side);
+        if (!of.is("ColumnRef")) return {};
+        const auto reading = [&]() -> Node {
+            Pass pass(mScope);
+            return model::criteria::readExpression(text(of, pass), pass).value;
+        }();
+        const bool plain = reading && std::holds_alternative<ColumnRef>(reading->node);
+        return plain ? reading : nullptr;
+    };
+    const String symbol = operatorOf(tree);
+    constexpr std::array symbols = std::to_array<StringView>({u"=", u"<>", u"<", u">", u"<=", u">="});
+    const auto at = std::find(symbols.begin(), symbols.end(), symbol);
+    if (at == symbols.end()) return {};
+    Node left = column("lexpr");
+    Node right = column("rexpr");
+    if (!left || !right) return {};
+    return model::sql::make(model::sql::Compare{
+        static_cast<model::sql::Comparison>(at - symbols.begin()), left, right});
 }
 
 Node ValueReader::read(const Tree& tree, Pass& pass) const {
@@ -293,8 +317,9 @@ String ValueReader::text(const Tree& tree, Pass& pass) const {
     if (tree.is("ColumnRef")) return column(tree, pass);
     if (tree.is("ParamRef")) return parameter(tree);
     if (tree.is("SubLink")) refusePart<MessageCode::aSubSelect>(tree.place());
+    if (auto moment = momentWritten(tree, pass)) return *moment;
     if (auto known = byForm(tree, pass)) return *known;
-    if (tree.is("TypeCast")) return cast(tree, pass);
+    if (tree.is("TypeCast")) return cast(tree);
     if (tree.is("A_Expr")) return operation(tree, pass);
     if (tree.is("BoolExpr")) {
         tree.only({"boolop", "args"});
@@ -362,20 +387,24 @@ String ValueReader::parameter(const Tree& tree) const {
     return model::criteria::isBareName(name) ? u':' + name : inBrackets(name);
 }
 
-String ValueReader::cast(const Tree& tree, Pass& pass) const {
-    tree.only({"arg", "typeName"});
-    const Tree of = tree.node("arg");
+/// A date, time or moment, or bytes, written out: a text by its type.
+std::optional<String> ValueReader::momentWritten(const Tree& tree, Pass& pass) const {
+    if (!tree.is("TypeCast") || !isConstant(tree.node("arg"), "sval")) return {};
     const Tree type = tree.part("typeName");
-    // A parameter takes its type from what it stands beside.
-    if (of.is("ParamRef")) return parameter(of);
-    if (isConstant(of, "sval")) {
-        const String content = of.part("sval").text("sval");
+    const String content = tree.node("arg").part("sval").text("sval");
+    if (isNamed(type, {u"date", u"time", u"timestamp", u"datetime", u"datetime2"})) {
         pass.texts.push_back(content);
-        if (isNamed(type, {u"date", u"time", u"timestamp", u"datetime", u"datetime2"}))
-            return u'#' + content + u'#';
-        if (isNamed(type, {u"bytea"}) && content.starts_with(u"\\x"))
-            return u"x'" + content.substr(2) + u'\'';
+        return u'#' + content + u'#';
     }
+    if (isNamed(type, {u"bytea"}) && content.starts_with(u"\\x"))
+        return u"x'" + content.substr(2) + u'\'';
+    return {};
+}
+
+String ValueReader::cast(const Tree& tree) const {
+    tree.only({"arg", "typeName"});
+    // A parameter takes its type from what it stands beside.
+    if (tree.node("arg").is("ParamRef")) return parameter(tree.node("arg"));
     refuse<MessageCode::unknownCast>(tree.place());
 }
 
@@ -439,15 +468,13 @@ String ValueReader::comparison(const Tree& tree, StringView symbol, Pass& pass) 
 
 /// What is compared with another.
 String ValueReader::side(const Tree& tree, const Tree& other, Pass& pass) const {
-    const StringView moment =
-        model::sql::templateOf(model::sql::Function::moment, 1, mDialect);
     // A date beside a moment is made one by itself.
-    const bool cast = mDialect != Dialect::SQLite &&
-                      isCastTo(tree, {u"timestamp", u"datetime", u"datetime2"}) &&
-                      !moment.empty() && !isConstant(tree.node("arg"), "sval");
-    if (cast && typeOf(tree.node("arg"), pass) == ColumnType::Date &&
-        typeOf(other, pass) == ColumnType::Timestamp)
-        return text(tree.node("arg"), pass);
+    if (const auto moment = momentOf(mDialect).match(tree)) {
+        const Tree& date = moment->at(1);
+        if (!isConstant(date, "sval") && typeOf(date, pass) == ColumnType::Date &&
+            typeOf(other, pass) == ColumnType::Timestamp)
+            return text(date, pass);
+    }
     // Elsewhere than in PostgreSQL truth is a number.
     const bool truth = isConstant(tree, "ival") && mDialect != Dialect::PostgreSQL;
     if (truth && typeOf(other, pass) == ColumnType::Boolean) {
@@ -605,18 +632,24 @@ String ValueReader::call(const Tree& tree, Pass& pass) const {
 /// What has one of the forms that stand for a function; the first that comes to it.
 std::optional<String> ValueReader::byForm(const Tree& tree, Pass& pass) const {
     if (!tree.is("FuncCall") && !tree.is("TypeCast") && !tree.is("A_Expr") &&
-        !tree.is("SQLValueFunction") && !tree.is("MinMaxExpr"))
+        !tree.is("SQLValueFunction") && !tree.is("CaseExpr"))
         return {};
     for (const Form& form : formsOf(mDialect)) {
         const auto arguments = form.match(tree);
         if (!arguments) continue;
+        const bool addsDays = form.function == model::sql::Function::addDays ||
+                              form.function == model::sql::Function::addDaysLater;
         String out;
         for (std::size_t at = 0; at < form.expression.size(); ++at) {
             if (form.expression[at] != u'{') {
                 out += form.expression[at];
                 continue;
             }
-            out += text(arguments->at(form.expression[at + 1] - u'0'), pass);
+            const Tree& argument = arguments->at(form.expression[at + 1] - u'0');
+            // SQLite writes a date as a text, which cannot be told from others elsewhere.
+            const bool date = addsDays && isConstant(argument, "sval");
+            const String typed = text(argument, pass);
+            out += date ? u'#' + typed.substr(1, typed.size() - 2) + u'#' : typed;
             at += 2;
         }
         if (!form.function || *form.function == model::sql::Function::text) return out;

@@ -32,6 +32,7 @@ private:
     class Pass;
 
     Node read(const Tree& tree, Pass& pass) const;
+    Node columnsCompared(const Tree& tree) const;
     Node total(const Tree& tree) const;
     std::size_t blame(const Tree& tree, Pass& pass) const;
 
@@ -39,7 +40,8 @@ private:
     String constant(const Tree& tree) const;
     String column(const Tree& tree, Pass& pass) const;
     String parameter(const Tree& tree) const;
-    String cast(const Tree& tree, Pass& pass) const;
+    std::optional<String> momentWritten(const Tree& tree, Pass& pass) const;
+    String cast(const Tree& tree) const;
     String operation(const Tree& tree, Pass& pass) const;
     String comparison(const Tree& tree, StringView symbol, Pass& pass) const;
     String side(const Tree& tree, const Tree& other, Pass& pass) const;

@@ -98,6 +98,11 @@ private:
         case sql::JoinKind::rightOuter: type = along ? keepsRight : keepsLeft; break;
         case sql::JoinKind::fullOuter: type = keepsBoth; break;
         }
+        // What stands about one table chooses among its rows before they are added.
+        const bool chooses = one.table == other.table &&
+                             ((kind == sql::JoinKind::leftOuter && right.contains(one.table)) ||
+                              (kind == sql::JoinKind::rightOuter && left.contains(one.table)));
+        if (chooses) type = 0;
         if (type != 0 && !along && !against) return false;
         add(one, other, type, std::get<sql::Compare>(term->node).comparison);
         return true;

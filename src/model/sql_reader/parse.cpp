@@ -37,6 +37,24 @@ bool isTooDeep(std::string_view tree) {
     return false;
 }
 
+/// The tree has no numbers below zero: they are taken from the text, where their signs stand, maybe
+/// several and with parentheses between.
+void fillNegative(nlohmann::json& node, const std::string& text) {
+    if (!node.is_structured()) return;
+    for (auto& below : node) fillNegative(below, text);
+    if (!node.is_object() || !node.contains("ival") || !node.contains("location")) return;
+    auto& number = node["ival"];
+    if (!number.is_object() || !number.empty()) return;
+    std::size_t at = node["location"].get<std::size_t>();
+    bool negative = false;
+    for (; at < text.size() && (text[at] < '0' || text[at] > '9'); ++at)
+        negative = negative != (text[at] == '-');
+    std::int64_t value = 0;
+    for (; at < text.size() && text[at] >= '0' && text[at] <= '9'; ++at)
+        value = value * 10 + (text[at] - '0');
+    number["ival"] = negative ? -value : value;
+}
+
 } // namespace
 
 nlohmann::json parse(const std::string& text) {
@@ -53,7 +71,9 @@ nlohmann::json parse(const std::string& text) {
     }
     if (isTooDeep(result.parse_tree))
         throw freed(Refused{model::say<MessageCode::tooDeep>(), 0});
-    return freed(nlohmann::json::parse(result.parse_tree));
+    nlohmann::json tree = freed(nlohmann::json::parse(result.parse_tree));
+    fillNegative(tree, text);
+    return tree;
 }
 
 } // namespace zandor::sql_reader
