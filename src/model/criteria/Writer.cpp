@@ -50,17 +50,6 @@ StringView symbolOf(sql::Comparison comparison) {
     return symbols[static_cast<std::size_t>(comparison)];
 }
 
-/// The same with its sides changed.
-sql::Comparison mirrored(sql::Comparison comparison) {
-    switch (comparison) {
-    case sql::Comparison::less: return sql::Comparison::greater;
-    case sql::Comparison::greater: return sql::Comparison::less;
-    case sql::Comparison::lessEqual: return sql::Comparison::greaterEqual;
-    case sql::Comparison::greaterEqual: return sql::Comparison::lessEqual;
-    default: return comparison;
-    }
-}
-
 String nameOf(const sql::ColumnRef& column) {
     return writtenName(column.table) + u'.' + writtenName(column.column);
 }
@@ -239,9 +228,9 @@ private:
         std::vector<String> all;
         if (const auto* x = std::get_if<sql::Compare>(&node->node)) {
             if (isSubject(x->left)) compared(all, x->comparison, x->right);
-            if (isSubject(x->right)) compared(all, mirrored(x->comparison), x->left);
+            if (isSubject(x->right)) compared(all, sql::mirrored(x->comparison), x->left);
             if (std::holds_alternative<sql::Value>(x->left->node))
-                add(all, sql::make(sql::Compare{mirrored(x->comparison), x->right, x->left}));
+                add(all, sql::make(sql::Compare{sql::mirrored(x->comparison), x->right, x->left}));
         } else if (const auto* x = std::get_if<sql::Like>(&node->node)) {
             if (isSubject(x->operand)) like(all, *x);
         } else if (const auto* x = std::get_if<sql::Between>(&node->node)) {

@@ -100,6 +100,16 @@ struct Types {
 
 } // namespace
 
+Comparison mirrored(Comparison comparison) {
+    switch (comparison) {
+    case Comparison::less: return Comparison::greater;
+    case Comparison::greater: return Comparison::less;
+    case Comparison::lessEqual: return Comparison::greaterEqual;
+    case Comparison::greaterEqual: return Comparison::lessEqual;
+    default: return comparison;
+    }
+}
+
 ColumnType typeOf(const Expression& expression) { return std::visit(Types(), expression.node); }
 
 bool isCondition(const Expression& expression) {

@@ -35,16 +35,6 @@ String own(const Part& x) {
     return {};
 }
 
-sql::Comparison mirrored(sql::Comparison comparison) {
-    switch (comparison) {
-    case sql::Comparison::less: return sql::Comparison::greater;
-    case sql::Comparison::greater: return sql::Comparison::less;
-    case sql::Comparison::lessEqual: return sql::Comparison::greaterEqual;
-    case sql::Comparison::greaterEqual: return sql::Comparison::lessEqual;
-    default: return comparison;
-    }
-}
-
 Node compare(sql::Comparison comparison, const Node& left, const Node& right) {
     return sql::make(sql::Compare{comparison, left, right});
 }
@@ -330,7 +320,7 @@ String keyOf(const Node& given) {
     Node node = given;
     if (const auto* x = std::get_if<sql::Compare>(&node->node))
         if (keyOf(x->right) < keyOf(x->left))
-            node = compare(mirrored(x->comparison), x->right, x->left);
+            node = compare(sql::mirrored(x->comparison), x->right, x->left);
     String key = u"(" + number(node->node.index()) +
                  std::visit([](const auto& part) { return own(part); }, node->node);
     for (const Node& part : sql::partsOf(*node)) key += keyOf(part);

@@ -9,22 +9,10 @@
 
 namespace zandor::sql_reader {
 
-using model::sameName;
-
 namespace {
 
 ColumnRef refTo(const ScopedTable& table, const model::ColumnDescription& column) {
     return {table.alias, column.name, column.type, column.declaredType};
-}
-
-/// The column of exactly the name, else one that differs in case.
-const model::ColumnDescription* columnOf(const ScopedTable& table, StringView name) {
-    const model::ColumnDescription* found = nullptr;
-    for (const auto& column : table.columns) {
-        if (column.name == name) return &column;
-        if (!found && sameName(column.name, name)) found = &column;
-    }
-    return found;
 }
 
 /// How many signs must be put in, taken out or changed.
@@ -57,6 +45,21 @@ std::optional<String> nearest(StringView name, const std::vector<String>& names)
     return found;
 }
 
+/// PostgreSQL's parser has made small letters of what stands without quotes.
+bool Scope::isSame(StringView left, StringView right) const {
+    return mDialect == Dialect::PostgreSQL ? left == right : model::sameName(left, right);
+}
+
+/// The column of exactly the name, else one that differs in case.
+const model::ColumnDescription* Scope::columnOf(const ScopedTable& table, StringView name) const {
+    const model::ColumnDescription* found = nullptr;
+    for (const auto& column : table.columns) {
+        if (column.name == name) return &column;
+        if (!found && isSame(column.name, name)) found = &column;
+    }
+    return found;
+}
+
 void Scope::add(ScopedTable table, std::size_t place) {
     if (tableNamed(table.alias)) refuse<MessageCode::sameAlias>(place, table.alias);
     mTables.push_back(std::move(table));
@@ -69,7 +72,7 @@ void Scope::add(const Scope& other, std::size_t place) {
 
 const ScopedTable* Scope::tableNamed(StringView alias) const {
     const auto at = std::find_if(mTables.begin(), mTables.end(), [&](const ScopedTable& table) {
-        return sameName(table.alias, alias);
+        return isSame(table.alias, alias);
     });
     return at == mTables.end() ? nullptr : &*at;
 }
@@ -114,8 +117,9 @@ ColumnRef Scope::column(StringView table, StringView name, std::size_t place) co
 std::optional<std::vector<ColumnRef>> Scope::everything() const {
     if (mShared.empty()) return {};
     std::vector<ColumnRef> all;
+    // SQLite leaves them where they stand in their tables.
     for (const Shared& shared : mShared)
-        if (!isHidden(shared.kept) && std::find(all.begin(), all.end(), shared.kept) == all.end())
+        if (mDialect != Dialect::SQLite && !isHidden(shared.kept) && std::find(all.begin(), all.end(), shared.kept) == all.end())
             all.push_back(shared.kept);
     for (const ScopedTable& table : mTables)
         for (const auto& column : table.columns) {

@@ -20,6 +20,8 @@ struct ScopedTable {
 /// The names that a place of a statement may use: those of the tables in its FROM.
 class Scope final : public model::criteria::Resolver {
 public:
+    explicit Scope(Dialect dialect = Dialect::SQLite) : mDialect(dialect) {}
+
     /// Throws Refused where the name is taken.
     void add(ScopedTable table, std::size_t place);
     void add(const Scope& other, std::size_t place);
@@ -49,7 +51,10 @@ private:
         ColumnRef other;
     };
     bool isHidden(const ColumnRef& column) const;
+    bool isSame(StringView left, StringView right) const;
+    const model::ColumnDescription* columnOf(const ScopedTable& table, StringView name) const;
 
+    Dialect mDialect;
     std::vector<ScopedTable> mTables;
     std::vector<Shared> mShared;
 };

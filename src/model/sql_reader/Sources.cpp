@@ -44,7 +44,7 @@ StatementReader::Source StatementReader::source(const Tree& tree, Scope& scope, 
     if (tree.is("RangeSubselect")) return subSelect(tree, scope, into);
     if (tree.is("JoinExpr")) return join(tree, scope, into);
     if (tree.is("RangeFunction")) refusePart<MessageCode::aTableFunction>(tree.place());
-    refuse<MessageCode::noPlaceFor>(tree.place(), model::say<MessageCode::thisPart>(tree.kind()));
+    refuse<MessageCode::noPlaceFor>(tree.place(), model::say<MessageCode::thisPart>(tree.sqlName()));
 }
 
 StatementReader::Source StatementReader::table(const Tree& tree, Scope& scope, Selected& into) {
@@ -140,8 +140,8 @@ std::vector<Node> StatementReader::shared(const Tree& tree, const Scope& left, c
 
 StatementReader::Source StatementReader::join(const Tree& tree, Scope& scope, Selected& into) {
     tree.only({"jointype", "isNatural", "larg", "rarg", "usingClause", "quals", "rtindex"});
-    Scope leftScope;
-    Scope rightScope;
+    Scope leftScope(mDialect);
+    Scope rightScope(mDialect);
     Source left = source(tree.node("larg"), leftScope, into);
     Source right = source(tree.node("rarg"), rightScope, into);
     Scope both = leftScope;

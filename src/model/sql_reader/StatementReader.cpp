@@ -29,10 +29,22 @@ String bareName(const Tree& tree) {
 }
 
 bool isGrouped(const Node& node, const std::vector<Node>& groups) {
+    return std::holds_alternative<sql::Aggregate>(node->node) ||
+           std::any_of(groups.begin(), groups.end(),
+                       [&](const Node& each) { return sql::same(each, node); });
+}
+
+/// Whether all columns in a node stand in one of these; and no total.
+bool isMadeOf(const Node& node, const std::vector<Node>& groups) {
     const bool group = std::any_of(groups.begin(), groups.end(),
                                    [&](const Node& each) { return sql::same(each, node); });
-    if (group || std::holds_alternative<sql::Aggregate>(node->node)) return true;
-    return false;
+    if (group) return true;
+    if (std::holds_alternative<ColumnRef>(node->node) ||
+        std::holds_alternative<sql::Aggregate>(node->node))
+        return false;
+    const auto parts = sql::partsOf(*node);
+    return std::all_of(parts.begin(), parts.end(),
+                       [&](const Node& part) { return isMadeOf(part, groups); });
 }
 
 /// Sources that nothing joins stand beside each other.
@@ -67,6 +79,7 @@ Selected StatementReader::select(const Tree& tree) {
     }
 
     Selected selected;
+    selected.scope = Scope(mDialect);
     selected.place = tree.place();
     if (!tree.has("fromClause")) refusePart<MessageCode::noTable>(tree.place());
     for (const Tree& each : tree.list("fromClause"))
@@ -87,9 +100,10 @@ Selected StatementReader::select(const Tree& tree) {
     if (tree.has("havingClause"))
         selected.statement.having = behindGroups(values.conditions(tree.node("havingClause")),
                                                  selected.statement.group);
+    askBefore(selected);
     order(tree, values, selected);
     limits(tree, selected);
-    checkGroups(selected, tree.place());
+    checkGroups(selected);
     mNamed.erase(mNamed.begin() + static_cast<std::ptrdiff_t>(known), mNamed.end());
     return selected;
 }
@@ -109,6 +123,18 @@ Node StatementReader::behindGroups(std::vector<Node> terms, const std::vector<No
     if (mDialect == Dialect::MySQL)
         for (Node& term : terms) term = plain(term);
     return sql::allOf(std::move(terms));
+}
+
+/// A condition on nothing but what rows are put together by can be asked of the rows before.
+void StatementReader::askBefore(Selected& selected) {
+    sql::Statement& statement = selected.statement;
+    if (statement.group.empty()) return;
+    std::vector<Node> before = termsOf(statement.where);
+    std::vector<Node> behind;
+    for (const Node& term : termsOf(statement.having))
+        (isMadeOf(term, statement.group) ? before : behind).push_back(term);
+    statement.where = sql::allOf(std::move(before));
+    statement.having = sql::allOf(std::move(behind));
 }
 
 /// The select within another that does nothing but leave equal rows out, as the printer has it for
@@ -142,7 +168,7 @@ void StatementReader::items(const Tree& tree, const ValueReader& values, Selecte
             if (!each.kind().empty()) refusePart<MessageCode::distinctOn>(each.place());
         into.statement.distinct = true;
     }
-    if (!tree.has("targetList")) refusePart<MessageCode::noTable>(tree.place());
+    if (!tree.has("targetList")) refusePart<MessageCode::noColumns>(tree.place());
     for (const Tree& target : tree.list("targetList")) item(target, values, into);
 }
 
@@ -238,7 +264,7 @@ void StatementReader::order(const Tree& tree, const ValueReader& values, Selecte
 }
 
 /// Where rows are put together, what comes out is a total or what they are put together by.
-void StatementReader::checkGroups(const Selected& selected, std::size_t place) const {
+void StatementReader::checkGroups(const Selected& selected) {
     const sql::Statement& statement = selected.statement;
     const auto isTotal = [](const Node& node) {
         return node && sql::holds<sql::Aggregate>(*node);
@@ -248,15 +274,18 @@ void StatementReader::checkGroups(const Selected& selected, std::size_t place) c
         if (const auto* node = std::get_if<Node>(&item.what)) grouped = grouped || isTotal(*node);
     for (const auto& item : statement.order) grouped = grouped || isTotal(item.value);
     if (!grouped) {
-        if (statement.having) refuse<MessageCode::criterionNotDrawn>(place);
+        if (statement.having)
+            refuse<MessageCode::criterionNotDrawn>(selected.placeOf(statement.having));
         return;
     }
     for (const auto& item : statement.items) {
         const auto* node = std::get_if<Node>(&item.what);
-        if (!node || !isGrouped(*node, statement.group)) refuse<MessageCode::ungrouped>(place);
+        if (!node || !isGrouped(*node, statement.group))
+            refuse<MessageCode::ungrouped>(node ? selected.placeOf(*node) : selected.place);
     }
     for (const auto& item : statement.order)
-        if (!isGrouped(item.value, statement.group)) refuse<MessageCode::ungrouped>(place);
+        if (!isGrouped(item.value, statement.group))
+            refuse<MessageCode::ungrouped>(selected.placeOf(item.value));
 }
 
 } // namespace zandor::sql_reader

@@ -47,7 +47,8 @@ private:
     Node byNameOrPlace(const Tree& tree, const ValueReader& values, const Selected& in,
                        bool outputFirst) const;
     void order(const Tree& tree, const ValueReader& values, Selected& into) const;
-    void checkGroups(const Selected& selected, std::size_t place) const;
+    static void askBefore(Selected& selected);
+    static void checkGroups(const Selected& selected);
 
     const Schema& mSchema;
     const ParserText& mText;

@@ -3,6 +3,7 @@
 #include "model/sql_reader/Refused.h"
 
 #include <algorithm>
+#include <array>
 #include <optional>
 
 namespace zandor::sql_reader {
@@ -33,11 +34,35 @@ Tree::Tree(const Json& node) : mNode(&node), mParts(&node) {
     mParts = &node.begin().value();
 }
 
+std::string_view Tree::sqlNameOf(std::string_view kind) {
+    using Pair = std::pair<std::string_view, std::string_view>;
+    static constexpr auto names = std::to_array<Pair>({
+        {"A_ArrayExpr", "ARRAY"},
+        {"A_Indirection", "[ ]"},
+        {"agg_filter", "FILTER"},
+        {"agg_order", "ORDER BY"},
+        {"agg_within_group", "WITHIN GROUP"},
+        {"BooleanTest", "IS TRUE"},
+        {"CollateClause", "COLLATE"},
+        {"groupDistinct", "GROUP BY DISTINCT"},
+        {"intoClause", "INTO"},
+        {"MinMaxExpr", "GREATEST"},
+        {"NamedArgExpr", "=>"},
+        {"RangeTableSample", "TABLESAMPLE"},
+        {"RowExpr", "(a, b)"},
+        {"SQLValueFunction", "CURRENT_USER"},
+        {"valuesLists", "VALUES"},
+    });
+    const auto at = std::find_if(names.begin(), names.end(),
+                                 [&](const Pair& pair) { return pair.first == kind; });
+    return at == names.end() ? kind : at->second;
+}
+
 const Tree& Tree::only(std::initializer_list<std::string_view> names) const {
     for (const auto& [name, value] : mParts->items()) {
         if (name == "location" || name == "stmt_len") continue;
         if (std::find(names.begin(), names.end(), name) == names.end())
-            refuse<MessageCode::noPlaceFor>(place(), model::say<MessageCode::thisPart>(name));
+            refuse<MessageCode::noPlaceFor>(place(), model::say<MessageCode::thisPart>(sqlNameOf(name)));
     }
     return *this;
 }

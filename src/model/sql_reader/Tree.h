@@ -21,7 +21,11 @@ public:
     static Tree ofParts(const Json& parts) { return {{}, parts}; }
 
     std::string_view kind() const { return mKind; }
+    /// What people call it, for messages.
+    std::string_view sqlName() const { return sqlNameOf(mKind); }
     bool is(std::string_view kind) const { return mKind == kind; }
+
+    static std::string_view sqlNameOf(std::string_view kind);
 
     /// Refuses parts of other names.
     const Tree& only(std::initializer_list<std::string_view> names) const;

@@ -66,7 +66,12 @@ bool isNotZero(const Tree& tree) {
     return digits.find_first_of(u"123456789") < digits.find_first_of(u"eE");
 }
 
-/// Conditions where a value stands alone: that it is true.
+bool isConstant(const Node& node) {
+    return std::holds_alternative<model::sql::Value>(node->node) ||
+           std::holds_alternative<model::sql::Parameter>(node->node);
+}
+
+/// A condition with what it speaks about on the left, and for a value alone that it is true.
 Node asCondition(const Node& node) {
     namespace sql = model::sql;
     const bool joint = std::holds_alternative<sql::And>(node->node) ||
@@ -77,6 +82,10 @@ Node asCondition(const Node& node) {
         for (Node& part : parts) part = asCondition(part);
         return sql::withParts(*node, std::move(parts));
     }
+    if (const auto* compare = std::get_if<sql::Compare>(&node->node))
+        if (isConstant(compare->left) && !isConstant(compare->right))
+            return sql::make(sql::Compare{sql::mirrored(compare->comparison), compare->right,
+                                          compare->left});
     if (sql::isCondition(*node)) return node;
     return sql::make(sql::Compare{sql::Comparison::equal, node,
                                   sql::make(sql::Value{ColumnType::Boolean, u"true"})});
@@ -338,7 +347,7 @@ String ValueReader::text(const Tree& tree, Pass& pass) const {
         return u"Coalesce(" + list(tree, "args", pass) + u')';
     }
     if (tree.is("FuncCall")) return call(tree, pass);
-    refuse<MessageCode::noPlaceFor>(tree.place(), model::say<MessageCode::thisPart>(tree.kind()));
+    refuse<MessageCode::noPlaceFor>(tree.place(), model::say<MessageCode::thisPart>(tree.sqlName()));
 }
 
 String ValueReader::constant(const Tree& tree) const {
@@ -456,6 +465,11 @@ String ValueReader::operation(const Tree& tree, Pass& pass) const {
                (kind == "AEXPR_BETWEEN" ? u" Between " : u" Not Between ") +
                side(bounds[0], of, pass) + u" And " + side(bounds[1], of, pass) + u')';
     }
+    if (kind == "AEXPR_OP_ANY" || kind == "AEXPR_OP_ALL")
+        refuse<MessageCode::unknownOperator>(tree.place(), symbol + u" ANY");
+    if (kind == "AEXPR_DISTINCT" || kind == "AEXPR_NOT_DISTINCT")
+        refuse<MessageCode::unknownOperator>(tree.place(), u"IS DISTINCT FROM");
+    if (kind == "AEXPR_NULLIF") refuse<MessageCode::unknownFunction>(tree.place(), u"NULLIF");
     refuse<MessageCode::unknownOperator>(tree.place(), symbol);
 }
 

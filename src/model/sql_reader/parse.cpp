@@ -65,8 +65,12 @@ nlohmann::json parse(const std::string& text) {
     };
     if (result.error) {
         const std::size_t place = byteOf(text, result.error->cursorpos);
+        // Names have come here in quotes of their own.
+        std::string words = result.error->message;
+        for (std::size_t at = 0; (at = words.find("\"\"", at)) != std::string::npos;)
+            words.erase(at, 1);
         const model::Message message = model::say<MessageCode::notParsed>(
-            model::oneLine(platform::fromUtf8(std::string_view(result.error->message))));
+            model::oneLine(platform::fromUtf8(std::string_view(words))));
         throw freed(Refused{message, place});
     }
     if (isTooDeep(result.parse_tree))

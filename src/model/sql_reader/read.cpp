@@ -3,7 +3,10 @@
 #include "model/sql_reader/StatementReader.h"
 #include "model/sql_reader/parse.h"
 
+#include <Zandor/model/Names.h>
+
 #include <algorithm>
+#include <array>
 
 namespace zandor::sql_reader {
 
@@ -19,6 +22,21 @@ Refusal refusalAt(StringView text, Message message, std::size_t position) {
     const std::size_t begin = lineBreak == StringView::npos ? 0 : lineBreak + 1;
     return {std::move(message), position, static_cast<std::int32_t>(lines + 1),
             static_cast<std::int32_t>(position - begin + 1)};
+}
+
+/// The first word, where it is one that other statements begin with.
+bool isOtherStatement(StringView text) {
+    constexpr auto words = std::to_array<StringView>(
+        {u"alter", u"begin", u"call", u"commit", u"create", u"delete", u"describe", u"drop",
+         u"exec", u"execute", u"explain", u"grant", u"insert", u"merge", u"pragma", u"replace",
+         u"revoke", u"rollback", u"set", u"show", u"truncate", u"update", u"use"});
+    const auto isLetter = [](char16_t c) {
+        return (c >= u'a' && c <= u'z') || (c >= u'A' && c <= u'Z');
+    };
+    const auto begin = std::find_if(text.begin(), text.end(), isLetter);
+    const auto end = std::find_if_not(begin, text.end(), isLetter);
+    const String first = model::foldedName(StringView(begin, end));
+    return std::find(words.begin(), words.end(), first) != words.end();
 }
 
 Ref<model::Query> readParsed(const ParserText& text, Dialect dialect, const Schema& schema) {
@@ -44,6 +62,8 @@ Drawn read(StringView text, Dialect dialect, const Schema& schema) {
     } catch (const Refused& refused) {
         return refusalAt(text, refused.message, refused.place);
     }
+    if (isOtherStatement(platform::fromUtf8(std::string_view(lexedText.text))))
+        return refusalAt(text, model::say<MessageCode::selectOnly>(), lexedText.origin(0));
     try {
         return readParsed(lexedText, dialect, schema);
     } catch (const Refused& refused) {

@@ -48,6 +48,9 @@ struct Parameter {
 /// In the order of the joins' operator codes.
 enum class Comparison { equal, notEqual, less, greater, lessEqual, greaterEqual };
 
+/// The one that says the same of two values that have changed places.
+ZANDOR_MODEL_EXPORT Comparison mirrored(Comparison comparison);
+
 /// Two values by an operator.
 struct Compare {
     Comparison comparison; ///< the operator
