@@ -2,6 +2,8 @@
 
 #include <Zandor/control/KeyNumber.h>
 
+#include <Zandor/comforts/Spoken.h>
+
 #include <algorithm>
 #include <set>
 
@@ -164,6 +166,23 @@ void Door::markOutput(bool marks) {
                             names.contains(table->Text() + u'.' + entry->Text()));
         }
     }
+}
+
+platform::String Door::nameOf(const platform::Line& line) {
+    const auto sideOf = [&](const TalvikDBxZandor::DrawnEnd& end) -> std::optional<JoinSide> {
+        const TalvikTabulet::Tabulet* const table = control().lstTable.Peek(end.Slot);
+        if (!table || !end.Item) return {};
+        return JoinSide{table->Tag(), end.Item->Key(), table->Text() + u'.' + end.Item->Text()};
+    };
+    for (const auto& join : platform::Each(control().mJoinLines)) {
+        if (control().linJoin.Peek(join->JoinLineIndex()) != &line) continue;
+        const auto left = sideOf(join->LeftEnd);
+        const auto right = sideOf(join->RightEnd);
+        if (!left || !right) return {};
+        return join->Drawn.value_or(true) ? nameOfJoin(control(), *left, *right)
+                                          : nameOfJoin(control(), *right, *left);
+    }
+    return {};
 }
 
 void Door::clearNotes() {

@@ -103,6 +103,8 @@ public:
 
     // Canvas and menu
     void drawJoins() { control().DrawJoins(); }
+    /// The join of a line as it is spoken; empty for a line of none.
+    String nameOf(const platform::Line& line);
     /// Opens the menu as over the list of the table in a slot.
     void popUpOver(std::int16_t table);
     /// In the menu, as the last of the entries that are about tables.

@@ -1,4 +1,5 @@
 #include "comforts/Door.h"
+#include "comforts/filled.h"
 
 #include <Zandor/control/symbols.h>
 
@@ -19,20 +20,6 @@ constexpr std::int32_t bothOuter = 3;
 
 bool keepsLeft(std::int32_t type) { return type == leftOuter || type == bothOuter; }
 bool keepsRight(std::int32_t type) { return type == rightOuter || type == bothOuter; }
-
-/// Puts names into their places; those that stand in a name stay as they are.
-String filled(const String& pattern, const String& first, const String& second) {
-    String text;
-    for (std::size_t i = 0; i < pattern.size(); ++i) {
-        const bool place = pattern[i] == u'%' && i + 1 < pattern.size() &&
-                           (pattern[i + 1] == u'1' || pattern[i + 1] == u'2');
-        if (!place)
-            text += pattern[i];
-        else
-            text += pattern[++i] == u'1' ? first : second;
-    }
-    return text;
-}
 
 /// Empty for "=" and for a code that there is none of.
 platform::StringView unusualOperator(std::int32_t code) {
@@ -58,8 +45,8 @@ String Comforts::sentenceOf(const PlacedJoin& join) const {
     const String& pattern = join.JoinType == bothOuter          ? mWords.AllOfBoth
                             : keepsLeft(join.JoinType) || right ? mWords.AllOfOne
                                                                 : mWords.Matching;
-    String sentence = right ? filled(pattern, join.RightTable, join.LeftTable)
-                            : filled(pattern, join.LeftTable, join.RightTable);
+    String sentence = right ? filled(pattern, {join.RightTable, join.LeftTable})
+                            : filled(pattern, {join.LeftTable, join.RightTable});
     const auto symbol = unusualOperator(join.CompareOperator);
     if (symbol.empty()) return sentence;
     sentence += u": " + join.LeftTable + u"." + join.LeftColumn + u" ";
@@ -75,6 +62,11 @@ platform::LineNotes Comforts::notesOf(const PlacedJoin& join) const {
             .Middle = String(join.LeftIsWest ? symbol : turned(symbol)),
             .Second = keepsEast ? mWords.All : String(),
             .Sentence = sentenceOf(join)};
+}
+
+String Comforts::spokenName(const platform::Line& line) {
+    const auto door = mDoor; // which the model's code may end
+    return door && door->isOpen() ? door->nameOf(line) : String();
 }
 
 /// Only while it has something to say, so that placing joins costs nothing else.

@@ -22,10 +22,8 @@ QVariant ColumnListModel::data(const QModelIndex& index, int role) const {
 }
 
 QVariant ColumnListModel::description(const Row& row) const {
-    QStringList parts;
-    if (row.picture == Picture::key) parts += mKeyColumn;
-    if (row.comesOut) parts += mComesOut;
-    return parts.isEmpty() ? QVariant() : parts.join(QStringLiteral(", "));
+    const String said = comforts::spokenOfEntry(mWords, row.picture, row.comesOut);
+    return said.empty() ? QVariant() : toQt(said);
 }
 
 QString ColumnListModel::text(int row) const { return toQt(mTexts->text(row)); }
@@ -51,11 +49,6 @@ void ColumnListModel::setPicture(int row, std::optional<Picture> picture) {
 void ColumnListModel::setComesOut(int row, bool comesOut) {
     if (std::exchange(at(row).comesOut, comesOut) == comesOut) return;
     Q_EMIT dataChanged(index(row), index(row), {outputRole, Qt::AccessibleDescriptionRole});
-}
-
-void ColumnListModel::setWords(const Words& words) {
-    mKeyColumn = toQt(words.KeyColumn);
-    mComesOut = toQt(words.ComesOut);
 }
 
 void ColumnListModel::clear() {

@@ -2,6 +2,7 @@
 
 #include "frontends/qt/EntryTexts.h"
 
+#include <Zandor/comforts/Spoken.h>
 #include <Zandor/platform/ImageList.h>
 #include <Zandor/platform/Words.h>
 
@@ -35,7 +36,7 @@ public:
     void setPicture(int row, std::optional<Picture> picture);
     void setComesOut(int row, bool comesOut);
     void clear();
-    void setWords(const Words& words);
+    void setWords(const Words& words) { mWords = comforts::EntryWords(words); }
 
 private:
     struct Row {
@@ -49,8 +50,7 @@ private:
 
     std::shared_ptr<EntryTexts> mTexts = std::make_shared<EntryTexts>();
     std::vector<Row> mRows;
-    QString mKeyColumn;
-    QString mComesOut;
+    comforts::EntryWords mWords;
 };
 
 } // namespace zandor::platform::qt

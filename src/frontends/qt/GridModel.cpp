@@ -47,7 +47,7 @@ void GridModel::setAlignment(int row, int col, std::int16_t alignment) {
 void GridModel::setWords(const Words& words) {
     mAscending = toQt(words.Ascending);
     mDescending = toQt(words.Descending);
-    mNumbered = toQt(words.Column);
+    mWords = words;
 }
 
 void GridModel::move(int from, int to) {
@@ -80,14 +80,12 @@ QVariant GridModel::valueOf(const Cell& cell, int role) {
     return {};
 }
 
+comforts::CellText GridModel::reader() const {
+    return [this](std::int32_t row, std::int32_t col) { return fromQt(text(row, col)); };
+}
+
 QString GridModel::titleOf(int row, int col) const {
-    // Rows without a title of their own go on with the one above.
-    int titled = row;
-    while (titled > 0 && text(titled, 0).isEmpty()) --titled;
-    QString title = text(titled, 0);
-    if (title.endsWith(u':')) title.chop(1);
-    const QString& field = text(0, col);
-    return asSigns(title + QStringLiteral(", ") + (field.isEmpty() ? mNumbered.arg(col) : field));
+    return asSigns(toQt(comforts::titleOfCell(mWords, reader(), row, col)));
 }
 
 QVariant GridModel::arrow(int row, int col) const {
@@ -101,9 +99,8 @@ QVariant GridModel::arrow(int row, int col) const {
 QVariant GridModel::data(const QModelIndex& index, int role) const {
     if (!index.isValid()) return {};
     if (role == Qt::AccessibleTextRole) {
-        const QString& written = text(index.row() + 1, index.column() + 1);
-        const QString title = titleOf(index.row() + 1, index.column() + 1);
-        return written.isEmpty() ? title : title + QStringLiteral(": ") + asSigns(written);
+        return asSigns(
+            toQt(comforts::nameOfCell(mWords, reader(), index.row() + 1, index.column() + 1)));
     }
     if (role == arrowRole) return arrow(index.row() + 1, index.column() + 1);
     return valueOf(cell(index.row() + 1, index.column() + 1), role);

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/comforts/Spoken.h>
 #include <Zandor/platform/Words.h>
 
 #include <QAbstractTableModel>
@@ -69,11 +70,12 @@ private:
     Cell& writable(int row, int col);
 
     QVariant arrow(int row, int col) const;
+    comforts::CellText reader() const;
 
     const int mRows;
     QString mAscending;
     QString mDescending;
-    QString mNumbered; ///< a column without a field
+    Words mWords;
     std::vector<Column> mColumns;
 };
 

@@ -1,5 +1,6 @@
 #include "frontends/windows/toolkit/Canvas.h"
 
+#include "frontends/windows/toolkit/Accessible.h"
 #include "frontends/windows/toolkit/CanvasItems.h"
 #include "frontends/windows/toolkit/Drawing.h"
 #include "frontends/windows/toolkit/TableWindow.h"
@@ -73,15 +74,19 @@ const CanvasLine* Canvas::focusedLine() const {
 }
 
 void Canvas::focusOn(CanvasLine* line) {
-    mCurrent = line;
+    const bool another = std::exchange(mCurrent, line) != line;
+    const bool told = GetFocus() != hwnd(); // as it comes
     SetFocus(hwnd());
+    if (another && !told) tellReader(*this);
     mFocusShown = true;
     repaint();
     if (line) surroundings().reveal(line->place());
 }
 
 void Canvas::makeCurrent(CanvasLine* line) {
-    if (std::exchange(mCurrent, line) != line) repaint();
+    if (std::exchange(mCurrent, line) == line) return;
+    repaint();
+    tellReader(*this);
 }
 
 LRESULT Canvas::handle(const Message& message) {
@@ -89,7 +94,7 @@ LRESULT Canvas::handle(const Message& message) {
     case WM_ERASEBKGND: return 1;
     case WM_PRINTCLIENT:
     case WM_PAINT: paint(message); return 0;
-    case WM_SETFOCUS:
+    case WM_SETFOCUS: tellReader(*this); [[fallthrough]];
     case WM_KILLFOCUS: repaint(); return 0;
     case WM_LBUTTONDOWN:
     case WM_RBUTTONDOWN:

@@ -8,6 +8,8 @@
 #include <algorithm>
 #include <utility>
 
+#include <oleacc.h>
+
 namespace zandor::platform::windows {
 
 namespace {
@@ -338,7 +340,7 @@ bool EntryList::keyPressed(const Message& message) {
         mListener->deleteKey(row);
         return true;
     case VK_RETURN:
-        if (row >= 0) mListener->entryDoubleClicked(row);
+        if (row >= 0) open(row);
         return true;
     case VK_SPACE: {
         if (row < 0) return true;
@@ -379,6 +381,20 @@ bool EntryList::walk(WPARAM key) {
     repaint();
     tellOfKeys(before);
     return true;
+}
+
+void EntryList::take(int row, LONG how) {
+    const auto before = selected();
+    if (how & SELFLAG_TAKEFOCUS) SetFocus(hwnd());
+    if (!isAlive()) return;
+    if (how & SELFLAG_TAKESELECTION) selectOnly(row, row);
+    if (how & SELFLAG_EXTENDSELECTION) selectOnly(mAnchor, row);
+    if (how & SELFLAG_ADDSELECTION) select(row, true);
+    if (how & SELFLAG_REMOVESELECTION) select(row, false);
+    if (!(how & SELFLAG_EXTENDSELECTION)) mAnchor = row;
+    setCaret(row);
+    repaint();
+    tellOfKeys(before);
 }
 
 /// To the control, selecting is what a press of the mouse has done.

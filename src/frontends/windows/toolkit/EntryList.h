@@ -60,6 +60,14 @@ public:
     bool isSelected(int row) const;
     void select(int row, bool value);
     std::vector<int> selected() const;
+    /// The row that keys go from; -1: there is none.
+    int caret() const { return count() == 0 ? -1 : static_cast<int>(ask(LB_GETCARETINDEX)); }
+    /// As a user does by keys, for who works by a screen reader; by SELFLAG_, added up.
+    void take(int row, LONG how);
+    /// As Enter does.
+    void open(int row) {
+        if (mListener) mListener->entryDoubleClicked(row);
+    }
     void repaintRow(int row) const;
     EntryLook lookOf(int row) const { return mListener ? mListener->lookOf(row) : EntryLook{}; }
 
@@ -83,7 +91,6 @@ private:
     void selectOnly(int from, int to);
     void selectAlone(int row);
     void setCaret(int row);
-    int caret() const { return count() == 0 ? -1 : static_cast<int>(ask(LB_GETCARETINDEX)); }
     int rowsInView() const;
     void tellOfKeys(const std::vector<int>& before);
     void checkTop();

@@ -2,7 +2,9 @@
 
 #include "frontends/windows/toolkit/Buttons.h"
 #include "frontends/windows/toolkit/Drawing.h"
+#include "frontends/windows/toolkit/GridWindow.h"
 #include "frontends/windows/toolkit/Inputs.h"
+#include "frontends/windows/toolkit/Text.h"
 
 #include <algorithm>
 
@@ -123,6 +125,9 @@ void RowFrame::setBounds(const Bounds& wanted) {
 
 void RowFrame::Visible(bool value) {
     if (value && !mWindow->isLaidOut()) mWindow->place(surroundings().scale.toPixels(bounds()));
+    // Spoken, of what is opened over a cell.
+    if (value && mWindow->isOutermost() && surroundings().grid)
+        SetWindowTextW(mWindow->hwnd(), wide(surroundings().grid->titleOfCurrent()));
     mWindow->show(value);
 }
 

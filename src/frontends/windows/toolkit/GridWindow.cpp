@@ -1,7 +1,10 @@
 #include "frontends/windows/toolkit/GridWindow.h"
 
+#include "frontends/windows/toolkit/Accessible.h"
 #include "frontends/windows/toolkit/Drawing.h"
 #include "frontends/windows/toolkit/Inputs.h"
+
+#include <Zandor/comforts/Spoken.h>
 
 #include <algorithm>
 #include <utility>
@@ -161,9 +164,11 @@ void GridWindow::scrolledByBar(const Message& message) {
 }
 
 void GridWindow::setCurrent(std::int32_t row, std::int32_t col) {
+    const bool same = row == mRow && col == mCol;
     mRow = row;
     mCol = col;
     repaint();
+    if (!same) tellReader(*this);
 }
 
 void GridWindow::showCurrent() {
@@ -288,7 +293,7 @@ LRESULT GridWindow::handle(const Message& message) {
             scrollTo(mTopRow + way, mLeftCol);
         return 0;
     }
-    case WM_SETFOCUS:
+    case WM_SETFOCUS: tellReader(*this); [[fallthrough]];
     case WM_KILLFOCUS: repaint(); return 0;
     case WM_SETCURSOR: {
         POINT at{};
@@ -432,7 +437,13 @@ bool GridWindow::typed(char16_t unit) {
     return used;
 }
 
-/// For the keyboard, what a click on the current cell is for the mouse.
+String GridWindow::titleOfCurrent() const {
+    return comforts::titleOfCell(
+        surroundings().words,
+        [this](std::int32_t row, std::int32_t col) { return mCells.cell(row, col).text; }, mRow,
+        mCol);
+}
+
 void GridWindow::openEditor() {
     if (surroundings().comforts.cellOpened() || !isAlive()) return;
     const POINT at = middleOfCurrent();

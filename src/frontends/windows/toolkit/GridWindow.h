@@ -29,6 +29,12 @@ public:
     void setCurrent(std::int32_t row, std::int32_t col);
     /// Scrolls as little as brings the current cell into view.
     void showCurrent();
+    /// As keys do.
+    void walkTo(std::int32_t row, std::int32_t col);
+    /// For the keyboard, what a click on the current cell is for the mouse.
+    void openEditor();
+    /// The current cell as it is spoken, without its text.
+    String titleOfCurrent() const;
     std::int32_t topRow() const { return mTopRow; }
     std::int32_t leftCol() const { return mLeftCol; }
     /// As far as there is anything to see.
@@ -72,9 +78,7 @@ private:
               POINT at) const;
     bool keyPressed(const Message& message);
     bool walk(WPARAM key);
-    void walkTo(std::int32_t row, std::int32_t col);
     bool typed(char16_t unit);
-    void openEditor();
     void clickWithRightButton();
     POINT middleOfCurrent();
     void openMenu();

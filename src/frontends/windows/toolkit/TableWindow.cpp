@@ -262,7 +262,7 @@ void TableWindow::release(const Message& message) {
         mGesture = Gesture::none;
         ReleaseCapture();
         repaint();
-        if (PtInRect(&cross, at) && mListener) mListener->closeClicked();
+        if (PtInRect(&cross, at)) pressCross();
         return;
     }
     if (button == leftButton) endGesture();

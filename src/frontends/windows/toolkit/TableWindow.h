@@ -31,6 +31,11 @@ public:
     TableWindow(std::shared_ptr<Surroundings> surroundings, HWND canvas, int slot);
     ~TableWindow() override;
 
+    /// As a click on it does.
+    void pressCross() const {
+        if (!mLocked && mListener) mListener->closeClicked();
+    }
+
     int slot() const { return mSlot; }
     void setListener(TableListener* listener);
     EntryList& list() const { return *mList; }

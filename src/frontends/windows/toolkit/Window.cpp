@@ -1,5 +1,6 @@
 #include "frontends/windows/toolkit/Window.h"
 
+#include "frontends/windows/toolkit/Accessible.h"
 #include "frontends/windows/toolkit/Frames.h"
 #include "frontends/windows/toolkit/Surroundings.h"
 #include "frontends/windows/toolkit/Text.h"
@@ -178,6 +179,9 @@ LRESULT Window::handle(const Message& message) {
     case WM_KEYDOWN:
     case WM_SYSKEYDOWN:
         if (mSurroundings->navigation.keyPressed(*this, message)) return 0;
+        break;
+    case WM_GETOBJECT:
+        if (const auto answered = answerReader(*this, message)) return *answered;
         break;
     case WM_GETDLGCODE:
         // Within the control, Tab and the like go the way of the navigation, whatever loop the

@@ -97,6 +97,8 @@ public:
     // Joins and tables
     /// A join in one sentence, with the words of the moment.
     String sentenceOf(const TalvikDBxZandor::PlacedJoin& join) const;
+    /// A join as it is spoken, by its line (Spoken.h); empty for a line of none.
+    String spokenName(const platform::Line& line);
     /// The right button has come up over the title of the table in a slot.
     bool titleClicked(std::int16_t table);
     /// The user wants another name for a table, by its key; set by the front end.
