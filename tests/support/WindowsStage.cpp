@@ -285,7 +285,7 @@ private:
 
     // What opens, answered from within its own message loop.
     static LRESULT CALLBACK activated(int code, WPARAM w, LPARAM l);
-    static LRESULT CALLBACK sent(int code, WPARAM w, LPARAM l);
+    static LRESULT CALLBACK overheard(HWND window, UINT message, WPARAM w, LPARAM l);
     static LRESULT CALLBACK backstage(HWND window, UINT message, WPARAM w, LPARAM l);
     void boxOpened(HWND box);
     void menuOpened();
@@ -295,6 +295,7 @@ private:
     static constexpr UINT dialogMessage = WM_APP + 2;
     static constexpr UINT boxMessage = WM_APP + 3;
     static inline WindowsStage* sStage = nullptr;
+    static inline WNDPROC sControls = nullptr; ///< procedure of a control's own window
 
     StageEvents mEvents;
     HWND mHost = nullptr;
@@ -302,7 +303,6 @@ private:
     HWND mDialog = nullptr; ///< the join dialog while it stands open
     bool mMenuSeen = false;
     HHOOK mActivated = nullptr;
-    HHOOK mSent = nullptr;
     WindowsStage* const mBefore = sStage; ///< a test may have two
     std::optional<toolkit::WindowControl> mControl;
 };
@@ -310,13 +310,15 @@ private:
 WindowsStage::WindowsStage(TalvikZandorLib::Library& library) : mEvents(*this) {
     sStage = this;
     mActivated = SetWindowsHookExW(WH_CBT, &activated, nullptr, GetCurrentThreadId());
-    mSent = SetWindowsHookExW(WH_CALLWNDPROC, &sent, nullptr, GetCurrentThreadId());
     const wchar_t* const hosts = hands::hostClass(&backstage);
     mHost = CreateWindowExW(0, hosts, L"Host", WS_OVERLAPPEDWINDOW | WS_CLIPCHILDREN, 60, 40, 840,
                             700, nullptr, nullptr, GetModuleHandleW(nullptr), nullptr);
     mHostField = CreateWindowExW(0, L"EDIT", L"", WS_CHILD | WS_VISIBLE | WS_TABSTOP, 0, 640, 100,
                                  20, mHost, nullptr, nullptr, nullptr);
     mControl.emplace(mHost, library, mEvents);
+    // Not by a hook, of which each message of each window would have to be asked.
+    sControls = reinterpret_cast<WNDPROC>(SetWindowLongPtrW(
+        mControl->window(), GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(&overheard)));
     mControl->setBounds({0, 0, 800, 600});
     mControl->show(true);
     ShowWindow(mHost, SW_SHOWNORMAL);
@@ -329,7 +331,6 @@ WindowsStage::~WindowsStage() {
     DestroyWindow(mHost);
     settle();
     UnhookWindowsHookEx(mActivated);
-    UnhookWindowsHookEx(mSent);
     sStage = mBefore;
 }
 
@@ -512,22 +513,22 @@ LRESULT CALLBACK WindowsStage::activated(int code, WPARAM w, LPARAM l) {
     return CallNextHookEx(nullptr, code, w, l);
 }
 
-LRESULT CALLBACK WindowsStage::sent(int code, WPARAM w, LPARAM l) {
+LRESULT CALLBACK WindowsStage::overheard(HWND window, UINT message, WPARAM w, LPARAM l) {
     static const UINT registered = RegisterWindowMessageA("TALVIKDISABLEVELT");
-    const auto& message = *reinterpret_cast<const CWPSTRUCT*>(l);
-    if (sStage && sStage->mControl && code == HC_ACTION) {
-        if (message.message == registered && message.hwnd == sStage->mControl->window()) {
-            const bool open = sStage->surroundings().openMenu != nullptr;
-            sStage->messages.push_back({u"TALVIKDISABLEVELT", message.wParam, open});
-            sStage->transcript.push_back("message:" + std::to_string(message.wParam));
-        } else if (message.message == WM_ENTERIDLE && message.wParam == MSGF_MENU &&
-                   !std::exchange(sStage->mMenuSeen, true)) {
-            PostMessageW(sStage->mHost, menuMessage, 0, 0);
-        } else if (message.message == WM_EXITMENULOOP) {
-            sStage->mMenuSeen = false;
-        }
+    WindowsStage* stage = sStage;
+    while (stage && !(stage->mControl && stage->mControl->window() == window))
+        stage = stage->mBefore;
+    if (stage && message == registered) {
+        const bool open = stage->surroundings().openMenu != nullptr;
+        stage->messages.push_back({u"TALVIKDISABLEVELT", w, open});
+        stage->transcript.push_back("message:" + std::to_string(w));
+    } else if (stage && message == WM_ENTERIDLE && w == MSGF_MENU &&
+               !std::exchange(stage->mMenuSeen, true)) {
+        PostMessageW(stage->mHost, menuMessage, 0, 0);
+    } else if (stage && message == WM_EXITMENULOOP) {
+        stage->mMenuSeen = false;
     }
-    return CallNextHookEx(nullptr, code, w, l);
+    return CallWindowProcW(sControls, window, message, w, l);
 }
 
 LRESULT CALLBACK WindowsStage::backstage(HWND window, UINT message, WPARAM w, LPARAM l) {

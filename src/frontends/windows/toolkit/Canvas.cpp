@@ -90,24 +90,14 @@ void Canvas::makeCurrent(CanvasLine* line) {
 }
 
 LRESULT Canvas::handle(const Message& message) {
+    if (isPress(message.id)) return press(message), 0;
+    if (isRelease(message.id)) return release(message), 0;
     switch (message.id) {
     case WM_ERASEBKGND: return 1;
     case WM_PRINTCLIENT:
     case WM_PAINT: paint(message); return 0;
     case WM_SETFOCUS: tellReader(*this); [[fallthrough]];
     case WM_KILLFOCUS: repaint(); return 0;
-    case WM_LBUTTONDOWN:
-    case WM_RBUTTONDOWN:
-    case WM_MBUTTONDOWN:
-    case WM_LBUTTONDBLCLK:
-    case WM_RBUTTONDBLCLK:
-    case WM_MBUTTONDBLCLK: press(message); return 0;
-    case WM_LBUTTONUP:
-    case WM_RBUTTONUP:
-    case WM_MBUTTONUP:
-        if (GetCapture() == hwnd() && buttonsOf(message.w) == 0) ReleaseCapture();
-        report(mEvents.MouseUp, message);
-        return 0;
     case WM_MOUSEMOVE: hint(message.at()); return 0;
     case openLineMessage: openCurrentLine(); return 0;
     case WM_CONTEXTMENU:
@@ -176,6 +166,11 @@ void Canvas::press(const Message& message) {
     // that. The dialog must not come up while the press is being dealt with.
     if (message.id == WM_LBUTTONDBLCLK && mCurrent && surroundings().comforts.flags().ReadsJoins)
         PostMessageW(hwnd(), openLineMessage, 0, 0);
+}
+
+void Canvas::release(const Message& message) const {
+    if (GetCapture() == hwnd() && buttonsOf(message.w) == 0) ReleaseCapture();
+    report(mEvents.MouseUp, message);
 }
 
 bool Canvas::keyPressed(const Message& message) {

@@ -51,6 +51,7 @@ protected:
 private:
     void paint(const Message& message);
     void press(const Message& message);
+    void release(const Message& message) const;
     void report(const MouseEvent& handler, const Message& message) const;
     bool keyPressed(const Message& message);
     void makeCurrent(CanvasLine* line);

@@ -13,10 +13,10 @@ namespace zandor::platform::windows {
 
 namespace {
 
-constexpr int firstButton = 100; ///< numbers of the buttons, apart from the system's own
-constexpr int narrowest = 380;   ///< of what is inside the dialog, logical pixels
+constexpr int firstButton = 100;     ///< numbers of the buttons, apart from the system's own
+constexpr int narrowestDialog = 380; ///< of what is inside the dialog, logical pixels
 constexpr int margin = 11;
-constexpr int gap = 7;
+constexpr int rowGap = 7;
 
 /// A dialog without anything in it, as the system reads it.
 struct EmptyTemplate {
@@ -76,7 +76,7 @@ Window* FormWindow::child(StringView name) const {
 void FormWindow::layOut() {
     const Scale& scale = surroundings().scale;
     const int around = scale.pixels(margin);
-    const int between = scale.pixels(gap);
+    const int between = scale.pixels(rowGap);
     int labelWidth = 0;
     int fieldWidth = 0;
     int buttonsWidth = 0;
@@ -88,7 +88,7 @@ void FormWindow::layOut() {
         if (const auto held = one.lock())
             buttonsWidth += std::max<int>(held->wanted().cx, scale.pixels(75)) + between;
     const int width =
-        std::max({scale.pixels(narrowest), labelWidth + between + fieldWidth, buttonsWidth});
+        std::max({scale.pixels(narrowestDialog), labelWidth + between + fieldWidth, buttonsWidth});
     fieldWidth = width - labelWidth - between;
     int top = around;
     for (std::size_t row = 0; row < std::max(mLabels.size(), mFields.size()); ++row) {

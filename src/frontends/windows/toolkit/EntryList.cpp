@@ -133,17 +133,10 @@ LRESULT EntryList::handle(const Message& message) {
 }
 
 LRESULT EntryList::dealWith(const Message& message) {
+    if (isPress(message.id)) return press(message), 0;
+    if (isRelease(message.id)) return release(message), 0;
     switch (message.id) {
-    case WM_LBUTTONDOWN:
-    case WM_RBUTTONDOWN:
-    case WM_MBUTTONDOWN:
-    case WM_LBUTTONDBLCLK:
-    case WM_RBUTTONDBLCLK:
-    case WM_MBUTTONDBLCLK: press(message); return 0;
     case WM_MOUSEMOVE: move(message); return 0;
-    case WM_LBUTTONUP:
-    case WM_RBUTTONUP:
-    case WM_MBUTTONUP: release(message); return 0;
     case WM_CAPTURECHANGED:
         // A box that comes up for a press takes the mouse away, and the press counts all the same.
         if (reinterpret_cast<HWND>(message.l) != hwnd()) surroundings().drags.cancel();
@@ -357,7 +350,7 @@ bool EntryList::keyPressed(const Message& message) {
 bool EntryList::walk(WPARAM key) {
     const int last = count() - 1;
     const int now = caret();
-    int to = now;
+    int to = 0;
     switch (key) {
     case VK_UP: to = now - 1; break;
     case VK_DOWN: to = now + 1; break;

@@ -12,7 +12,7 @@ namespace zandor::platform::windows {
 
 namespace {
 
-constexpr int gap = 5; ///< between children, logical pixels
+constexpr int childGap = 5; ///< between children, logical pixels
 
 } // namespace
 
@@ -36,7 +36,7 @@ SIZE RowWindow::wanted() const {
         const auto held = child.lock();
         if (!held || !held->isAlive()) continue;
         const SIZE part = held->wanted();
-        size.cx += part.cx + (first ? 0 : surroundings().scale.pixels(gap));
+        size.cx += part.cx + (first ? 0 : surroundings().scale.pixels(childGap));
         size.cy = std::max(size.cy, part.cy);
         first = false;
     }
@@ -47,7 +47,7 @@ SIZE RowWindow::wanted() const {
 void RowWindow::arrange() {
     if (auto* const around = dynamic_cast<RowWindow*>(of(GetParent(hwnd())))) around->arrange();
     const RECT room = within(area(), margin(), margin(), margin(), margin());
-    const int between = surroundings().scale.pixels(gap);
+    const int between = surroundings().scale.pixels(childGap);
     int taken = -between;
     int others = 0;
     for (const auto& child : mChildren)

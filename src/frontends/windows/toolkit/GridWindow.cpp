@@ -117,18 +117,8 @@ std::int32_t GridWindow::lastLeft() const {
 
 void GridWindow::showRanges() {
     if (!isAlive() || mRowHeight == 0) return;
-    const auto show = [this](int bar, std::int32_t position, std::int32_t last) {
-        SCROLLINFO info{};
-        info.cbSize = sizeof info;
-        info.fMask = SIF_RANGE | SIF_PAGE | SIF_POS;
-        info.nMin = 1;
-        info.nMax = last;
-        info.nPage = 1;
-        info.nPos = position;
-        SetScrollInfo(hwnd(), bar, &info, TRUE);
-    };
-    show(SB_VERT, mTopRow, lastTop());
-    show(SB_HORZ, mLeftCol, lastLeft());
+    mDown.show(hwnd(), SB_VERT, {1, lastTop(), 1, mTopRow});
+    mAcross.show(hwnd(), SB_HORZ, {1, lastLeft(), 1, mLeftCol});
 }
 
 void GridWindow::scrollTo(std::int32_t topRow, std::int32_t leftCol) {
@@ -182,10 +172,9 @@ void GridWindow::showCurrent() {
 }
 
 std::int32_t GridWindow::offeredColumn() const {
-    const auto& comforts = surroundings().comforts;
-    if (!comforts.flags().OffersFields) return 0;
+    if (!offersFields()) return 0;
     const std::int32_t blank = mCells.firstBlank();
-    return blank && const_cast<comforts::Comforts&>(comforts).hasFieldsToOffer() ? blank : 0;
+    return blank && surroundings().comforts.hasFieldsToOffer() ? blank : 0;
 }
 
 void GridWindow::showGap(std::int32_t column) {
@@ -277,6 +266,8 @@ void GridWindow::paintCell(HDC dc, std::int32_t row, std::int32_t col) const {
 }
 
 LRESULT GridWindow::handle(const Message& message) {
+    if (isPress(message.id)) return press(message), 0;
+    if (isRelease(message.id)) return release(message), 0;
     switch (message.id) {
     case WM_ERASEBKGND: return 1;
     case WM_PRINTCLIENT:
@@ -303,19 +294,10 @@ LRESULT GridWindow::handle(const Message& message) {
         SetCursor(LoadCursorW(nullptr, reinterpret_cast<const wchar_t*>(IDC_SIZEWE)));
         return TRUE;
     }
-    case WM_LBUTTONDOWN:
-    case WM_RBUTTONDOWN:
-    case WM_MBUTTONDOWN:
-    case WM_LBUTTONDBLCLK:
-    case WM_RBUTTONDBLCLK:
-    case WM_MBUTTONDBLCLK: press(message); return 0;
     case WM_MOUSEMOVE:
         mGestures.moved(message);
         if (isAlive() && buttonsOf(message.w) == 0) hint(message.at());
         return 0;
-    case WM_LBUTTONUP:
-    case WM_RBUTTONUP:
-    case WM_MBUTTONUP: release(message); return 0;
     case WM_CAPTURECHANGED:
         if (reinterpret_cast<HWND>(message.l) == hwnd()) return 0;
         mGestures.cancel();

@@ -3,6 +3,7 @@
 #include "frontends/windows/toolkit/Constituent.h"
 #include "frontends/windows/toolkit/FieldGestures.h"
 #include "frontends/windows/toolkit/GridCells.h"
+#include "frontends/windows/toolkit/ScrollRange.h"
 
 namespace zandor::platform::windows {
 
@@ -97,6 +98,7 @@ private:
     std::int32_t mCol = 1;
     std::int32_t mTopRow = 1;
     std::int32_t mLeftCol = 1;
+    ScrollRange mAcross, mDown;
     std::int32_t mGap = 0;
     int mRowHeight = 0;
     bool mLabelWidthSet = false;

@@ -3,6 +3,7 @@
 #include "frontends/windows/toolkit/Drawing.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace zandor::platform::windows {
 
@@ -13,10 +14,10 @@ class Grid16 {
 public:
     explicit Grid16(const RECT& square) : mSquare(square) {}
     int x(double x) const {
-        return mSquare.left + static_cast<int>(x * widthOf(mSquare) / 16 + 0.5);
+        return mSquare.left + static_cast<int>(std::lround(x * widthOf(mSquare) / 16));
     }
     int y(double y) const {
-        return mSquare.top + static_cast<int>(y * heightOf(mSquare) / 16 + 0.5);
+        return mSquare.top + static_cast<int>(std::lround(y * heightOf(mSquare) / 16));
     }
     POINT at(double left, double top) const { return {x(left), y(top)}; }
     RECT rect(double left, double top, double right, double bottom) const {

@@ -38,7 +38,7 @@ public:
     Request take() { return std::exchange(*mRequest, {}); }
 
 private:
-    void run(Request request, const Gesture& gesture) {
+    void run(const Request& request, const Gesture& gesture) {
         // Held, because the gesture may end the control.
         const std::shared_ptr<Request> held = mRequest;
         *held = request;

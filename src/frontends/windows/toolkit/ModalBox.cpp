@@ -2,6 +2,7 @@
 
 #include "frontends/windows/toolkit/Text.h"
 
+#include <ranges>
 #include <utility>
 
 namespace zandor::platform::windows {
@@ -53,7 +54,7 @@ void ModalBoxes::show(HWND owner, const String& prompt, std::int32_t style, cons
 }
 
 void ModalBoxes::dismiss() const {
-    for (auto box = mOpen.rbegin(); box != mOpen.rend(); ++box) PostMessageW(*box, WM_CLOSE, 0, 0);
+    for (const HWND box : mOpen | std::views::reverse) PostMessageW(box, WM_CLOSE, 0, 0);
 }
 
 } // namespace zandor::platform::windows

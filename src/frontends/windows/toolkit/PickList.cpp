@@ -12,9 +12,9 @@ namespace {
 
 constexpr int mostRows = 12;
 constexpr int fewestRows = 4;
-constexpr int narrowest = 220; // logical pixels
-constexpr int widest = 420;
-constexpr int border = 2;
+constexpr int narrowestList = 220; // logical pixels
+constexpr int widestList = 420;
+constexpr int listBorder = 2;
 
 String folded(String text) {
     CharLowerBuffW(reinterpret_cast<wchar_t*>(text.data()), static_cast<DWORD>(text.size()));
@@ -167,7 +167,7 @@ void PickWindow::close() { show(false); }
 /// Below the upper edge of a place, as high as the items need and the surface has room for.
 void PickWindow::stand(const RECT& over) {
     const Scale& scale = surroundings().scale;
-    const int edge = scale.pixels(border);
+    const int edge = scale.pixels(listBorder);
     const auto height = [&](int rows) { return boxHeight() + rows * rowHeight() + 2 * edge; };
     RECT surface{};
     GetClientRect(GetParent(hwnd()), &surface);
@@ -178,8 +178,8 @@ void PickWindow::stand(const RECT& over) {
     for (const String& item : mItems)
         wanted = std::max(wanted, surroundings().fonts.widthOf(fontHandle(), item));
     wanted += GetSystemMetrics(SM_CXVSCROLL) + scale.pixels(12);
-    const int width =
-        std::max(widthOf(over), std::clamp(wanted, scale.pixels(narrowest), scale.pixels(widest)));
+    const int width = std::max(
+        widthOf(over), std::clamp(wanted, scale.pixels(narrowestList), scale.pixels(widestList)));
     const int left = std::clamp<int>(over.left, 0, std::max<int>(0, surface.right - width));
     const int top = std::clamp<int>(over.top, 0, std::max<int>(0, surface.bottom - height(rows)));
     place({left, top, left + width, top + height(rows)});
@@ -187,7 +187,7 @@ void PickWindow::stand(const RECT& over) {
 }
 
 void PickWindow::arrange() {
-    const int edge = surroundings().scale.pixels(border);
+    const int edge = surroundings().scale.pixels(listBorder);
     const RECT inner = within(area(), edge, edge, edge, edge);
     const int below = inner.top + boxHeight();
     mBox->place({inner.left, inner.top, inner.right, below});

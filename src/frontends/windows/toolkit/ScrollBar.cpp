@@ -31,15 +31,11 @@ int ScrollBarWindow::thickness(Orientation orientation) {
     return GetSystemMetrics(orientation == Orientation::horizontal ? SM_CYHSCROLL : SM_CXVSCROLL);
 }
 
-void ScrollBarWindow::showRange() const {
+void ScrollBarWindow::showRange() {
     // The system's range goes on for as much as is seen of it.
-    SCROLLINFO info{};
-    info.cbSize = sizeof info;
-    info.fMask = SIF_RANGE | SIF_PAGE | SIF_POS | SIF_DISABLENOSCROLL;
-    info.nMax = mMax + mLargeChange - 1;
-    info.nPage = static_cast<UINT>(mLargeChange);
-    info.nPos = mValue;
-    if (hwnd()) SetScrollInfo(hwnd(), SB_CTL, &info, TRUE);
+    if (hwnd())
+        mRange.show(hwnd(), SB_CTL, {0, mMax + mLargeChange - 1, mLargeChange, mValue},
+                    SIF_DISABLENOSCROLL);
 }
 
 void ScrollBarWindow::setMax(int max) {

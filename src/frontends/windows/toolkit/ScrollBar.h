@@ -1,6 +1,7 @@
 #pragma once
 
 #include "frontends/windows/toolkit/Constituent.h"
+#include "frontends/windows/toolkit/ScrollRange.h"
 
 #include <Zandor/platform/Intrinsic.h>
 
@@ -36,13 +37,14 @@ protected:
     void forget() override;
 
 private:
-    void showRange() const;
+    void showRange();
 
     const Orientation mOrientation;
     ScrollBarEvents mEvents;
     int mValue = 0;
     int mMax = 0;
     int mLargeChange = 1;
+    ScrollRange mRange;
 };
 
 class ScrollBar final : public Constituent<platform::ScrollBar, ScrollBarWindow> {

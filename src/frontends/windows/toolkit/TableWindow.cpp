@@ -169,6 +169,8 @@ unsigned TableWindow::edgesAt(POINT at) const {
 }
 
 LRESULT TableWindow::handle(const Message& message) {
+    if (isPress(message.id)) return press(message), 0;
+    if (isRelease(message.id)) return release(message), 0;
     switch (message.id) {
     case WM_SIZE:
         arrange();
@@ -183,18 +185,9 @@ LRESULT TableWindow::handle(const Message& message) {
             showCursor())
             return TRUE;
         break;
-    case WM_LBUTTONDOWN:
-    case WM_RBUTTONDOWN:
-    case WM_MBUTTONDOWN:
-    case WM_LBUTTONDBLCLK:
-    case WM_RBUTTONDBLCLK:
-    case WM_MBUTTONDBLCLK: press(message); return 0;
     case WM_MOUSEMOVE: move(message); return 0;
     case WM_MOUSELEAVE: setCross(false); return 0;
-    case WM_LBUTTONUP:
-    case WM_RBUTTONUP:
-    case WM_MBUTTONUP: release(message); return 0;
-    case WM_MOUSEWHEEL: return 0; // the canvas below does not scroll
+    case WM_MOUSEWHEEL: // the canvas below does not scroll
     case WM_CONTEXTMENU: return 0;
     default: break;
     }

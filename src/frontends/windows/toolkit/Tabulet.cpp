@@ -131,7 +131,7 @@ void Tabulet::Activated(bool value) {
 
 Ref<TalvikTabulet::ColumnItem> Tabulet::ColumnAt(float X, float Y) const {
     if (!mWindow->isAlive()) return {};
-    const double pixel = static_cast<double>(surroundings().scale.toTwips(1));
+    const auto pixel = static_cast<double>(surroundings().scale.toTwips(1));
     POINT at{static_cast<LONG>(std::floor(static_cast<double>(X) / pixel)),
              static_cast<LONG>(std::floor(static_cast<double>(Y) / pixel))};
     MapWindowPoints(mWindow->hwnd(), mWindow->list().hwnd(), &at, 1);

@@ -57,8 +57,9 @@ Window::~Window() {
 
 void Window::create(HWND parent, DWORD style, DWORD extended) {
     static const OwnClass registered(&procedure);
-    CreateWindowExW(extended, ownClass, L"", style, 0, 0, 0, 0, parent, nullptr, instance(), this);
-    if (!mHandle) throw std::bad_alloc();
+    if (!CreateWindowExW(extended, ownClass, L"", style, 0, 0, 0, 0, parent, nullptr, instance(),
+                         this))
+        throw std::bad_alloc();
     if (style & WS_CHILD) raise();
 }
 
@@ -80,7 +81,11 @@ void Window::adopt(HWND handle) {
 }
 
 Window* Window::of(HWND handle) {
-    if (!handle || reinterpret_cast<WNDPROC>(GetWindowLongPtrW(handle, GWLP_WNDPROC)) != &procedure)
+    if (!handle) return nullptr;
+    // Of our class it is ours although a host has put a procedure of its own before.
+    const auto ours = reinterpret_cast<LONG_PTR>(&procedure);
+    if (GetWindowLongPtrW(handle, GWLP_WNDPROC) != ours &&
+        GetClassLongPtrW(handle, GCLP_WNDPROC) != static_cast<ULONG_PTR>(ours))
         return nullptr;
     return reinterpret_cast<Window*>(GetWindowLongPtrW(handle, GWLP_USERDATA));
 }

@@ -53,10 +53,7 @@ protected:
         struct Search {
             const wchar_t* title;
             HWND found;
-        } search{title, nullptr};
-        EnumChildWindows(
-            window,
-            [](HWND child, LPARAM l) -> BOOL {
+            static BOOL CALLBACK test(HWND child, LPARAM l) {
                 auto& wanted = *reinterpret_cast<Search*>(l);
                 wchar_t kind[20] = {};
                 GetClassNameW(child, kind, 20);
@@ -64,8 +61,9 @@ protected:
                     return TRUE;
                 wanted.found = child;
                 return FALSE;
-            },
-            reinterpret_cast<LPARAM>(&search));
+            }
+        } search{title, nullptr};
+        EnumChildWindows(window, &Search::test, reinterpret_cast<LPARAM>(&search));
         return search.found;
     }
     DWORD result() const {

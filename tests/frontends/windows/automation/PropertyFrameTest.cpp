@@ -44,15 +44,21 @@ protected:
 
     /// Has the frame's user do something once it stands there.
     void meetFrame(std::function<void(HWND frame)> user) {
-        static std::function<void(HWND)> then;
-        static HWND frame;
-        then = std::move(user);
-        Boxes::meetNext([](HWND sheet) {
-            frame = sheet;
-            SetTimer(nullptr, 0, 1, [](HWND, UINT, UINT_PTR timer, DWORD) {
+        struct Meeting {
+            std::function<void(HWND)> then;
+            HWND frame = nullptr;
+        };
+        static Meeting meeting;
+        struct Timer {
+            static void CALLBACK elapsed(HWND, UINT, UINT_PTR timer, DWORD) {
                 KillTimer(nullptr, timer);
-                std::exchange(then, {})(frame);
-            });
+                std::exchange(meeting.then, {})(meeting.frame);
+            }
+        };
+        meeting.then = std::move(user);
+        Boxes::meetNext([](HWND sheet) {
+            meeting.frame = sheet;
+            SetTimer(nullptr, 0, 1, &Timer::elapsed);
         });
     }
 

@@ -62,13 +62,12 @@ RuntimeError errorOf(HRESULT code) {
 
 void require(HRESULT code, IUnknown* object, REFIID iid) {
     if (SUCCEEDED(code)) return;
-    RuntimeError error = errorOf(code);
     if (const auto words = wordsLeft(object, iid)) {
         Text text;
         if (SUCCEEDED(words->GetDescription(text.slot())) && text.get())
-            error.Description = text.string();
+            throw RuntimeError{errorOf(code).Number, text.string()};
     }
-    throw error;
+    throw errorOf(code);
 }
 
 HRESULT leave(const RuntimeError& error) {

@@ -3,7 +3,7 @@
 namespace zandor::automation {
 
 std::shared_ptr<House> House::build(Sink sink) {
-    const std::shared_ptr<House> house(new House(std::move(sink)));
+    std::shared_ptr<House> house(new House(std::move(sink)));
     house->mControl.emplace(house->mHidden.handle(), house->mLibrary, *house, house);
     house->mZandor = &house->mControl->control();
     house->mLibrary.serve(*house->mZandor);

@@ -22,7 +22,7 @@ bool isOfType(const Variant& value, Type type) {
     }
 }
 
-std::size_t placeOf(StringView name) {
+std::size_t indexOf(StringView name) {
     const auto& members = keptMembers();
     return static_cast<std::size_t>(
         std::find_if(members.begin(), members.end(),
@@ -31,7 +31,7 @@ std::size_t placeOf(StringView name) {
 }
 
 std::int16_t numberAt(const State& state, StringView name) {
-    return std::get<std::int16_t>(state[placeOf(name)]);
+    return std::get<std::int16_t>(state[indexOf(name)]);
 }
 
 bool isWithin(const State& state, StringView place, StringView end) {
@@ -60,8 +60,8 @@ State stateOf(Zandor& control) {
 const std::vector<std::size_t>& writingOrder() {
     static const std::vector<std::size_t> order = [] {
         const auto& members = keptMembers();
-        const std::size_t traces = placeOf(u"DebugSwitch");
-        const std::size_t layout = placeOf(u"OnlyJoin");
+        const std::size_t traces = indexOf(u"DebugSwitch");
+        const std::size_t layout = indexOf(u"OnlyJoin");
         std::vector<std::size_t> places;
         const auto add = [&](TalvikDBxZandor::automation::Kind kind) {
             for (std::size_t n = 0; n < members.size(); ++n)
@@ -87,11 +87,11 @@ std::optional<std::size_t> impossibleIn(const State& state) {
     for (std::size_t n = 0; n < members.size(); ++n)
         if (!isOfType(state[n], members[n]->type)) return n;
     if (!isWithin(state, u"HorizontalScrollbarPos", u"HorizMaxScrollPos"))
-        return placeOf(u"HorizontalScrollbarPos");
+        return indexOf(u"HorizontalScrollbarPos");
     if (!isWithin(state, u"VerticalScrollbarPos", u"VertMaxScrollPos"))
-        return placeOf(u"VerticalScrollbarPos");
+        return indexOf(u"VerticalScrollbarPos");
     for (const StringView frame : {u"VisibleFrameLeft", u"VisibleFrameTop"})
-        if (numberAt(state, frame) < 0) return placeOf(frame);
+        if (numberAt(state, frame) < 0) return indexOf(frame);
     return {};
 }
 

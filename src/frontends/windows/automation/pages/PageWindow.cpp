@@ -14,9 +14,6 @@ namespace {
 
 using platform::String;
 
-constexpr wchar_t yes[] = L"True";
-constexpr wchar_t no[] = L"False";
-
 String textIn(HWND window) {
     String text(static_cast<std::size_t>(GetWindowTextLengthW(window)) + 1, u'\0');
     const int length = GetWindowTextW(window, reinterpret_cast<wchar_t*>(text.data()),
@@ -95,7 +92,7 @@ void PageWindow::fill() {
         entry.pszText = const_cast<wchar_t*>(wide(name));
         SendMessageW(list, LVM_INSERTITEMW, 0, reinterpret_cast<LPARAM>(&entry));
     }
-    for (const wchar_t* const word : {yes, no})
+    for (const wchar_t* const word : {L"True", L"False"})
         SendMessageW(item(ZANDOR_PAGE_FLAG), CB_ADDSTRING, 0, reinterpret_cast<LPARAM>(word));
     mFilling = false;
     refresh();
