@@ -2,9 +2,10 @@
 include(CMakePackageConfigHelpers)
 set(zandor_package_folder ${CMAKE_INSTALL_LIBDIR}/cmake/Zandor)
 
-# Called by zandor_library: HEADERS are the folders of its houses, NEEDS what it links publicly.
+# Called by zandor_library: HEADERS are the folders of its houses, NEEDS what it links publicly,
+# LIBS what a static one is linked with.
 function(zandor_install name target generated)
-    cmake_parse_arguments(PARSE_ARGV 3 given "" "" "HEADERS;NEEDS")
+    cmake_parse_arguments(PARSE_ARGV 3 given "" "" "HEADERS;NEEDS;LIBS")
     install(TARGETS ${target} EXPORT Zandor${name}Targets
         RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR} COMPONENT runtime
         LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT runtime
@@ -41,10 +42,13 @@ function(zandor_install name target generated)
         "set(zandor_needs_${name} ${components})\nset(zandor_qt_${name} ${qt})\n")
 
     set(cflags)
+    set(libs)
     get_target_property(type ${target} TYPE)
     if(type STREQUAL STATIC_LIBRARY)
         string(TOUPPER ${name} upper)
         set(cflags " -DZANDOR_${upper}_STATIC_DEFINE")
+        list(TRANSFORM given_LIBS PREPEND " -l" OUTPUT_VARIABLE libs)
+        list(JOIN libs "" libs)
     endif()
     list(JOIN modules ", " modules)
     string(TOLOWER "zandor-${name}" module)
@@ -60,7 +64,7 @@ Name: ${module}
 Description: ${PROJECT_DESCRIPTION}: ${name}
 Version: ${PROJECT_VERSION}
 Requires: ${modules}
-Libs: -L\${libdir} -lZandor${name}${postfix}
+Libs: -L\${libdir} -lZandor${name}${postfix}${libs}
 Cflags: -I\${includedir}${cflags}
 ")
     install(FILES ${CMAKE_CURRENT_BINARY_DIR}/$<CONFIG>/${module}.pc

@@ -15,11 +15,12 @@ endif()
 #     HEADERS the folders below src/ that hold its houses' include/Zandor
 #     HOUSE   the folder of Zandor/ that its export header stands in
 #     SOURCES files
-#     NEEDS   what its headers need, OWN what its sources alone need)
+#     NEEDS   what its headers need, OWN what its sources alone need
+#     LIBS    libraries of the system by their names, of those: for who links it statically)
 #
 # Makes the library zandor_name, known as Zandor::NAME here and where it is installed.
 function(zandor_library name)
-    cmake_parse_arguments(PARSE_ARGV 1 given "" "HOUSE" "HEADERS;SOURCES;NEEDS;OWN")
+    cmake_parse_arguments(PARSE_ARGV 1 given "" "HOUSE" "HEADERS;SOURCES;NEEDS;OWN;LIBS")
     string(TOLOWER ${name} lower)
     string(TOUPPER ${name} upper)
     set(target zandor_${lower})
@@ -38,6 +39,9 @@ function(zandor_library name)
     get_target_property(type ${target} TYPE)
     if(type STREQUAL STATIC_LIBRARY)
         target_compile_definitions(${target} PUBLIC ZANDOR_${upper}_STATIC_DEFINE)
+        if(given_LIBS)
+            target_link_libraries(${target} INTERFACE "$<INSTALL_INTERFACE:${given_LIBS}>")
+        endif()
     endif()
 
     target_include_directories(${target}
@@ -61,7 +65,7 @@ function(zandor_library name)
 
     if(ZANDOR_INSTALL)
         zandor_install(${name} ${target} ${generated}
-            HEADERS ${given_HEADERS} NEEDS ${given_NEEDS})
+            HEADERS ${given_HEADERS} NEEDS ${given_NEEDS} LIBS ${given_LIBS})
     endif()
 endfunction()
 

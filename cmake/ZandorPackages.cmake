@@ -28,7 +28,8 @@ set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS
     ${PROJECT_BINARY_DIR}/src/frontends/qt
     ${PROJECT_BINARY_DIR}/src/model
     ${PROJECT_BINARY_DIR}/src/model/files
-    ${PROJECT_BINARY_DIR}/src/model/reader)
+    ${PROJECT_BINARY_DIR}/src/model/reader
+    ${PROJECT_BINARY_DIR}/src/model/sql_reader)
 
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_NAME libzandor${abi})
 set(CPACK_DEBIAN_RUNTIME_PACKAGE_SECTION libs)

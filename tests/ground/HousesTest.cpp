@@ -17,6 +17,7 @@ std::string houseOf(const std::string& file) {
     const auto startsWith = [&](const char* prefix) { return file.rfind(prefix, 0) == 0; };
     if (startsWith("model/reader/")) return "reader";
     if (startsWith("model/files/")) return "files";
+    if (startsWith("model/sql_reader/")) return "sql_reader";
     if (startsWith("frontends/windows/automation/")) return "frontends/windows/automation";
     if (startsWith("frontends/windows/toolkit/")) return "frontends/windows/toolkit";
     if (startsWith("frontends/")) return file.substr(0, file.find('/', sizeof "frontends"));
@@ -38,8 +39,10 @@ const std::map<std::string, Houses> mayInclude = {
     {"model", {"model", "platform"}},
     {"reader", {"reader", "model", "platform"}},
     {"files", {"files", "model", "platform"}},
+    {"sql_reader", {"sql_reader", "model", "platform"}},
     {"designer",
-     {"designer", "files", "reader", "model", "frontends/qt", "comforts", "control", "platform"}},
+     {"designer", "files", "reader", "sql_reader", "model", "frontends/qt", "comforts", "control",
+      "platform"}},
 };
 
 /// The houses that use the standard library and nothing else.

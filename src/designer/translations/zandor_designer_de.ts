@@ -1092,6 +1092,222 @@
         <source>%1 has saved queries more than %2 deep in each other</source>
         <translation>%1 hat gespeicherte Abfragen mehr als %2 tief ineinander</translation>
     </message>
+    <message>
+        <source>this cannot be read as SQL (%1); mend it here or before.</source>
+        <translation>das lässt sich nicht als SQL lesen (%1); berichtigen Sie es hier oder davor.</translation>
+    </message>
+    <message>
+        <source>what begins here has no end; close it with %1.</source>
+        <translation>was hier beginnt, hat kein Ende; schließen Sie es mit %1.</translation>
+    </message>
+    <message>
+        <source>there is no statement; write a SELECT.</source>
+        <translation>es gibt keine Anweisung; schreiben Sie ein SELECT.</translation>
+    </message>
+    <message>
+        <source>a drawing holds one statement; leave out all but one.</source>
+        <translation>eine Zeichnung fasst eine Anweisung; lassen Sie alle bis auf eine weg.</translation>
+    </message>
+    <message>
+        <source>a drawing holds a SELECT and nothing else.</source>
+        <translation>eine Zeichnung fasst ein SELECT und nichts anderes.</translation>
+    </message>
+    <message>
+        <source>this name is too long to be read.</source>
+        <translation>dieser Name ist zu lang, um gelesen zu werden.</translation>
+    </message>
+    <message>
+        <source>the text is too long to be drawn; at most %1 characters are read.</source>
+        <translation>der Text ist zu lang, um gezeichnet zu werden; höchstens %1 Zeichen werden gelesen.</translation>
+    </message>
+    <message>
+        <source>too much stands within each other here to be drawn.</source>
+        <translation>hier ist zu viel ineinander verschachtelt, um gezeichnet zu werden.</translation>
+    </message>
+    <message>
+        <source>a drawing has no place for %1; it can be run as it is.</source>
+        <translation>eine Zeichnung hat keinen Platz für %1; ausführen lässt es sich, wie es ist.</translation>
+    </message>
+    <message>
+        <source>a window function</source>
+        <translation>eine Fensterfunktion</translation>
+    </message>
+    <message>
+        <source>UNION, INTERSECT or EXCEPT</source>
+        <translation>UNION, INTERSECT oder EXCEPT</translation>
+    </message>
+    <message>
+        <source>WITH RECURSIVE</source>
+        <translation>WITH RECURSIVE</translation>
+    </message>
+    <message>
+        <source>a LATERAL source</source>
+        <translation>eine LATERAL-Quelle</translation>
+    </message>
+    <message>
+        <source>a sub-select within a condition or value</source>
+        <translation>ein Unter-SELECT in einer Bedingung oder einem Wert</translation>
+    </message>
+    <message>
+        <source>rows left out by OFFSET</source>
+        <translation>Zeilen, die OFFSET auslässt</translation>
+    </message>
+    <message>
+        <source>a limit that is no number from 1 to %1</source>
+        <translation>eine Grenze, die keine Zahl von 1 bis %1 ist</translation>
+    </message>
+    <message>
+        <source>PERCENT or WITH TIES</source>
+        <translation>PERCENT oder WITH TIES</translation>
+    </message>
+    <message>
+        <source>a lock</source>
+        <translation>eine Sperre</translation>
+    </message>
+    <message>
+        <source>DISTINCT ON</source>
+        <translation>DISTINCT ON</translation>
+    </message>
+    <message>
+        <source>NULLS FIRST or NULLS LAST</source>
+        <translation>NULLS FIRST oder NULLS LAST</translation>
+    </message>
+    <message>
+        <source>grouping sets</source>
+        <translation>Gruppierungsmengen</translation>
+    </message>
+    <message>
+        <source>a function in the place of a table</source>
+        <translation>eine Funktion anstelle einer Tabelle</translation>
+    </message>
+    <message>
+        <source>new names for the columns of a table</source>
+        <translation>neue Namen für die Spalten einer Tabelle</translation>
+    </message>
+    <message>
+        <source>a SELECT that reads from no table</source>
+        <translation>ein SELECT, das aus keiner Tabelle liest</translation>
+    </message>
+    <message>
+        <source>a SELECT of no columns</source>
+        <translation>ein SELECT ohne Spalten</translation>
+    </message>
+    <message>
+        <source>a column that a FULL JOIN shares by USING or NATURAL</source>
+        <translation>eine Spalte, die ein FULL JOIN durch USING oder NATURAL teilt</translation>
+    </message>
+    <message>
+        <source>a total within a calculation</source>
+        <translation>eine Zusammenfassung in einer Berechnung</translation>
+    </message>
+    <message>
+        <source>this (%1)</source>
+        <translation>das hier (%1)</translation>
+    </message>
+    <message>
+        <source>a drawing does not know the function %1 as it stands here; the statement can be run as it is.</source>
+        <translation>eine Zeichnung kennt die Funktion %1 nicht, wie sie hier steht; die Anweisung lässt sich ausführen, wie sie ist.</translation>
+    </message>
+    <message>
+        <source>a drawing does not know this cast; the statement can be run as it is.</source>
+        <translation>eine Zeichnung kennt diese Umwandlung nicht; die Anweisung lässt sich ausführen, wie sie ist.</translation>
+    </message>
+    <message>
+        <source>a drawing does not know the operator %1; the statement can be run as it is.</source>
+        <translation>eine Zeichnung kennt den Operator %1 nicht; die Anweisung lässt sich ausführen, wie sie ist.</translation>
+    </message>
+    <message>
+        <source>this division may give whole numbers or stop at 0, which one of a drawing does not; write %1.</source>
+        <translation>diese Division ergibt vielleicht ganze Zahlen oder bricht bei 0 ab, was die einer Zeichnung nicht tut; schreiben Sie %1.</translation>
+    </message>
+    <message>
+        <source>a drawing writes this as &apos;%1&apos;, which compares otherwise here; write it so.</source>
+        <translation>eine Zeichnung schreibt das als &apos;%1&apos;, was sich hier anders vergleicht; schreiben Sie es so.</translation>
+    </message>
+    <message>
+        <source>LIKE tells capitals from small letters here, which a drawing does not; write ILIKE if that is meant.</source>
+        <translation>LIKE unterscheidet hier große und kleine Buchstaben, eine Zeichnung nicht; schreiben Sie ILIKE, wenn das gemeint ist.</translation>
+    </message>
+    <message>
+        <source>a drawing has no NULL as a value; write IS NULL or leave it out.</source>
+        <translation>eine Zeichnung kennt kein NULL als Wert; schreiben Sie IS NULL oder lassen Sie es weg.</translation>
+    </message>
+    <message>
+        <source>this column is neither grouped nor a total; write it into GROUP BY.</source>
+        <translation>diese Spalte ist weder gruppiert noch zusammengefasst; schreiben Sie sie in GROUP BY.</translation>
+    </message>
+    <message>
+        <source>a drawing cannot hold this: %1</source>
+        <translation>eine Zeichnung kann das nicht fassen: %1</translation>
+    </message>
+    <message>
+        <source>the condition of an outer join can compare columns of its two sides and nothing else in a drawing.</source>
+        <translation>die Bedingung einer äußeren Verknüpfung kann in einer Zeichnung Spalten ihrer beiden Seiten vergleichen und sonst nichts.</translation>
+    </message>
+    <message>
+        <source>this condition has no place in the rows of a drawing.</source>
+        <translation>diese Bedingung hat in den Zeilen einer Zeichnung keinen Platz.</translation>
+    </message>
+    <message>
+        <source>drawn, this would not say the same (%1); it can be run as it is.</source>
+        <translation>gezeichnet würde das nicht dasselbe sagen (%1); ausführen lässt es sich, wie es ist.</translation>
+    </message>
+    <message>
+        <source>the order of its joins</source>
+        <translation>die Reihenfolge seiner Verknüpfungen</translation>
+    </message>
+    <message>
+        <source>its conditions</source>
+        <translation>seine Bedingungen</translation>
+    </message>
+    <message>
+        <source>its columns</source>
+        <translation>seine Spalten</translation>
+    </message>
+    <message>
+        <source>its groups</source>
+        <translation>seine Gruppen</translation>
+    </message>
+    <message>
+        <source>its order</source>
+        <translation>seine Sortierung</translation>
+    </message>
+    <message>
+        <source>the database has no table &quot;%1&quot;.</source>
+        <translation>die Datenbank hat keine Tabelle „%1“.</translation>
+    </message>
+    <message>
+        <source>the database has no table &quot;%1&quot;; is &quot;%2&quot; meant?</source>
+        <translation>die Datenbank hat keine Tabelle „%1“; ist „%2“ gemeint?</translation>
+    </message>
+    <message>
+        <source>there is no table &quot;%1&quot; in the statement.</source>
+        <translation>es gibt keine Tabelle „%1“ in der Anweisung.</translation>
+    </message>
+    <message>
+        <source>no table has a column &quot;%1&quot;.</source>
+        <translation>keine Tabelle hat eine Spalte „%1“.</translation>
+    </message>
+    <message>
+        <source>no table has a column &quot;%1&quot;; is &quot;%2&quot; meant?</source>
+        <translation>keine Tabelle hat eine Spalte „%1“; ist „%2“ gemeint?</translation>
+    </message>
+    <message>
+        <source>several tables have a column &quot;%1&quot;; write its table before it.</source>
+        <translation>mehrere Tabellen haben eine Spalte „%1“; schreiben Sie ihre Tabelle davor.</translation>
+    </message>
+    <message>
+        <source>two tables are called &quot;%1&quot; here; give one of them another name.</source>
+        <translation>zwei Tabellen heißen hier „%1“; geben Sie einer einen anderen Namen.</translation>
+    </message>
+    <message>
+        <source>two columns come out as &quot;%1&quot;.</source>
+        <translation>zwei Spalten kommen als „%1“ heraus.</translation>
+    </message>
+    <message>
+        <source>there is no output column %1.</source>
+        <translation>es gibt keine Ausgabespalte %1.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

@@ -1092,6 +1092,222 @@
         <source>%1 has saved queries more than %2 deep in each other</source>
         <translation>%1 tiene consultas guardadas anidadas en más de %2 niveles</translation>
     </message>
+    <message>
+        <source>this cannot be read as SQL (%1); mend it here or before.</source>
+        <translation>esto no se puede leer como SQL (%1); corríjalo aquí o antes.</translation>
+    </message>
+    <message>
+        <source>what begins here has no end; close it with %1.</source>
+        <translation>lo que empieza aquí no tiene fin; ciérrelo con %1.</translation>
+    </message>
+    <message>
+        <source>there is no statement; write a SELECT.</source>
+        <translation>no hay ninguna instrucción; escriba un SELECT.</translation>
+    </message>
+    <message>
+        <source>a drawing holds one statement; leave out all but one.</source>
+        <translation>un dibujo contiene una sola instrucción; deje solo una.</translation>
+    </message>
+    <message>
+        <source>a drawing holds a SELECT and nothing else.</source>
+        <translation>un dibujo contiene un SELECT y nada más.</translation>
+    </message>
+    <message>
+        <source>this name is too long to be read.</source>
+        <translation>este nombre es demasiado largo para leerlo.</translation>
+    </message>
+    <message>
+        <source>the text is too long to be drawn; at most %1 characters are read.</source>
+        <translation>el texto es demasiado largo para dibujarlo; se leen %1 caracteres como máximo.</translation>
+    </message>
+    <message>
+        <source>too much stands within each other here to be drawn.</source>
+        <translation>aquí hay demasiado anidado para dibujarlo.</translation>
+    </message>
+    <message>
+        <source>a drawing has no place for %1; it can be run as it is.</source>
+        <translation>un dibujo no tiene lugar para %1; se puede ejecutar tal como está.</translation>
+    </message>
+    <message>
+        <source>a window function</source>
+        <translation>una función de ventana</translation>
+    </message>
+    <message>
+        <source>UNION, INTERSECT or EXCEPT</source>
+        <translation>UNION, INTERSECT o EXCEPT</translation>
+    </message>
+    <message>
+        <source>WITH RECURSIVE</source>
+        <translation>WITH RECURSIVE</translation>
+    </message>
+    <message>
+        <source>a LATERAL source</source>
+        <translation>una fuente LATERAL</translation>
+    </message>
+    <message>
+        <source>a sub-select within a condition or value</source>
+        <translation>un sub-SELECT en una condición o un valor</translation>
+    </message>
+    <message>
+        <source>rows left out by OFFSET</source>
+        <translation>filas omitidas por OFFSET</translation>
+    </message>
+    <message>
+        <source>a limit that is no number from 1 to %1</source>
+        <translation>un límite que no es un número de 1 a %1</translation>
+    </message>
+    <message>
+        <source>PERCENT or WITH TIES</source>
+        <translation>PERCENT o WITH TIES</translation>
+    </message>
+    <message>
+        <source>a lock</source>
+        <translation>un bloqueo</translation>
+    </message>
+    <message>
+        <source>DISTINCT ON</source>
+        <translation>DISTINCT ON</translation>
+    </message>
+    <message>
+        <source>NULLS FIRST or NULLS LAST</source>
+        <translation>NULLS FIRST o NULLS LAST</translation>
+    </message>
+    <message>
+        <source>grouping sets</source>
+        <translation>conjuntos de agrupación</translation>
+    </message>
+    <message>
+        <source>a function in the place of a table</source>
+        <translation>una función en lugar de una tabla</translation>
+    </message>
+    <message>
+        <source>new names for the columns of a table</source>
+        <translation>nombres nuevos para las columnas de una tabla</translation>
+    </message>
+    <message>
+        <source>a SELECT that reads from no table</source>
+        <translation>un SELECT que no lee de ninguna tabla</translation>
+    </message>
+    <message>
+        <source>a SELECT of no columns</source>
+        <translation>un SELECT sin columnas</translation>
+    </message>
+    <message>
+        <source>a column that a FULL JOIN shares by USING or NATURAL</source>
+        <translation>una columna que un FULL JOIN comparte por USING o NATURAL</translation>
+    </message>
+    <message>
+        <source>a total within a calculation</source>
+        <translation>un total dentro de un cálculo</translation>
+    </message>
+    <message>
+        <source>this (%1)</source>
+        <translation>esto (%1)</translation>
+    </message>
+    <message>
+        <source>a drawing does not know the function %1 as it stands here; the statement can be run as it is.</source>
+        <translation>un dibujo no conoce la función %1 tal como aparece aquí; la instrucción se puede ejecutar tal como está.</translation>
+    </message>
+    <message>
+        <source>a drawing does not know this cast; the statement can be run as it is.</source>
+        <translation>un dibujo no conoce esta conversión; la instrucción se puede ejecutar tal como está.</translation>
+    </message>
+    <message>
+        <source>a drawing does not know the operator %1; the statement can be run as it is.</source>
+        <translation>un dibujo no conoce el operador %1; la instrucción se puede ejecutar tal como está.</translation>
+    </message>
+    <message>
+        <source>this division may give whole numbers or stop at 0, which one of a drawing does not; write %1.</source>
+        <translation>esta división puede dar números enteros o detenerse en 0, lo que la de un dibujo no hace; escriba %1.</translation>
+    </message>
+    <message>
+        <source>a drawing writes this as &apos;%1&apos;, which compares otherwise here; write it so.</source>
+        <translation>un dibujo escribe esto como &apos;%1&apos;, que aquí se compara de otro modo; escríbalo así.</translation>
+    </message>
+    <message>
+        <source>LIKE tells capitals from small letters here, which a drawing does not; write ILIKE if that is meant.</source>
+        <translation>aquí LIKE distingue mayúsculas de minúsculas y un dibujo no; escriba ILIKE si eso es lo que se quiere.</translation>
+    </message>
+    <message>
+        <source>a drawing has no NULL as a value; write IS NULL or leave it out.</source>
+        <translation>un dibujo no tiene NULL como valor; escriba IS NULL u omítalo.</translation>
+    </message>
+    <message>
+        <source>this column is neither grouped nor a total; write it into GROUP BY.</source>
+        <translation>esta columna no está agrupada ni es un total; escríbala en GROUP BY.</translation>
+    </message>
+    <message>
+        <source>a drawing cannot hold this: %1</source>
+        <translation>un dibujo no puede contener esto: %1</translation>
+    </message>
+    <message>
+        <source>the condition of an outer join can compare columns of its two sides and nothing else in a drawing.</source>
+        <translation>en un dibujo la condición de una unión externa compara columnas de sus dos lados y nada más.</translation>
+    </message>
+    <message>
+        <source>this condition has no place in the rows of a drawing.</source>
+        <translation>esta condición no tiene lugar en las filas de un dibujo.</translation>
+    </message>
+    <message>
+        <source>drawn, this would not say the same (%1); it can be run as it is.</source>
+        <translation>dibujado, esto no diría lo mismo (%1); se puede ejecutar tal como está.</translation>
+    </message>
+    <message>
+        <source>the order of its joins</source>
+        <translation>el orden de sus uniones</translation>
+    </message>
+    <message>
+        <source>its conditions</source>
+        <translation>sus condiciones</translation>
+    </message>
+    <message>
+        <source>its columns</source>
+        <translation>sus columnas</translation>
+    </message>
+    <message>
+        <source>its groups</source>
+        <translation>sus grupos</translation>
+    </message>
+    <message>
+        <source>its order</source>
+        <translation>su orden</translation>
+    </message>
+    <message>
+        <source>the database has no table &quot;%1&quot;.</source>
+        <translation>la base de datos no tiene ninguna tabla «%1».</translation>
+    </message>
+    <message>
+        <source>the database has no table &quot;%1&quot;; is &quot;%2&quot; meant?</source>
+        <translation>la base de datos no tiene ninguna tabla «%1»; ¿se refiere a «%2»?</translation>
+    </message>
+    <message>
+        <source>there is no table &quot;%1&quot; in the statement.</source>
+        <translation>no hay ninguna tabla «%1» en la instrucción.</translation>
+    </message>
+    <message>
+        <source>no table has a column &quot;%1&quot;.</source>
+        <translation>ninguna tabla tiene una columna «%1».</translation>
+    </message>
+    <message>
+        <source>no table has a column &quot;%1&quot;; is &quot;%2&quot; meant?</source>
+        <translation>ninguna tabla tiene una columna «%1»; ¿se refiere a «%2»?</translation>
+    </message>
+    <message>
+        <source>several tables have a column &quot;%1&quot;; write its table before it.</source>
+        <translation>varias tablas tienen una columna «%1»; escriba su tabla delante.</translation>
+    </message>
+    <message>
+        <source>two tables are called &quot;%1&quot; here; give one of them another name.</source>
+        <translation>aquí dos tablas se llaman «%1»; dé otro nombre a una de ellas.</translation>
+    </message>
+    <message>
+        <source>two columns come out as &quot;%1&quot;.</source>
+        <translation>dos columnas salen como «%1».</translation>
+    </message>
+    <message>
+        <source>there is no output column %1.</source>
+        <translation>no hay columna de salida %1.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

@@ -1092,6 +1092,222 @@
         <source>%1 has saved queries more than %2 deep in each other</source>
         <translation>%1 a des requêtes enregistrées imbriquées sur plus de %2 niveaux</translation>
     </message>
+    <message>
+        <source>this cannot be read as SQL (%1); mend it here or before.</source>
+        <translation>ceci ne peut être lu comme du SQL (%1) ; corrigez-le ici ou avant.</translation>
+    </message>
+    <message>
+        <source>what begins here has no end; close it with %1.</source>
+        <translation>ce qui commence ici n&apos;a pas de fin ; fermez-le par %1.</translation>
+    </message>
+    <message>
+        <source>there is no statement; write a SELECT.</source>
+        <translation>il n&apos;y a pas d&apos;instruction ; écrivez un SELECT.</translation>
+    </message>
+    <message>
+        <source>a drawing holds one statement; leave out all but one.</source>
+        <translation>un dessin contient une seule instruction ; n&apos;en gardez qu&apos;une.</translation>
+    </message>
+    <message>
+        <source>a drawing holds a SELECT and nothing else.</source>
+        <translation>un dessin contient un SELECT et rien d&apos;autre.</translation>
+    </message>
+    <message>
+        <source>this name is too long to be read.</source>
+        <translation>ce nom est trop long pour être lu.</translation>
+    </message>
+    <message>
+        <source>the text is too long to be drawn; at most %1 characters are read.</source>
+        <translation>le texte est trop long pour être dessiné ; on lit %1 caractères au plus.</translation>
+    </message>
+    <message>
+        <source>too much stands within each other here to be drawn.</source>
+        <translation>il y a trop d&apos;imbrications ici pour un dessin.</translation>
+    </message>
+    <message>
+        <source>a drawing has no place for %1; it can be run as it is.</source>
+        <translation>un dessin n&apos;a pas de place pour %1 ; on peut l&apos;exécuter tel quel.</translation>
+    </message>
+    <message>
+        <source>a window function</source>
+        <translation>une fonction de fenêtrage</translation>
+    </message>
+    <message>
+        <source>UNION, INTERSECT or EXCEPT</source>
+        <translation>UNION, INTERSECT ou EXCEPT</translation>
+    </message>
+    <message>
+        <source>WITH RECURSIVE</source>
+        <translation>WITH RECURSIVE</translation>
+    </message>
+    <message>
+        <source>a LATERAL source</source>
+        <translation>une source LATERAL</translation>
+    </message>
+    <message>
+        <source>a sub-select within a condition or value</source>
+        <translation>un sous-SELECT dans une condition ou une valeur</translation>
+    </message>
+    <message>
+        <source>rows left out by OFFSET</source>
+        <translation>des lignes sautées par OFFSET</translation>
+    </message>
+    <message>
+        <source>a limit that is no number from 1 to %1</source>
+        <translation>une limite qui n&apos;est pas un nombre de 1 à %1</translation>
+    </message>
+    <message>
+        <source>PERCENT or WITH TIES</source>
+        <translation>PERCENT ou WITH TIES</translation>
+    </message>
+    <message>
+        <source>a lock</source>
+        <translation>un verrou</translation>
+    </message>
+    <message>
+        <source>DISTINCT ON</source>
+        <translation>DISTINCT ON</translation>
+    </message>
+    <message>
+        <source>NULLS FIRST or NULLS LAST</source>
+        <translation>NULLS FIRST ou NULLS LAST</translation>
+    </message>
+    <message>
+        <source>grouping sets</source>
+        <translation>des ensembles de regroupement</translation>
+    </message>
+    <message>
+        <source>a function in the place of a table</source>
+        <translation>une fonction à la place d&apos;une table</translation>
+    </message>
+    <message>
+        <source>new names for the columns of a table</source>
+        <translation>de nouveaux noms pour les colonnes d&apos;une table</translation>
+    </message>
+    <message>
+        <source>a SELECT that reads from no table</source>
+        <translation>un SELECT qui ne lit aucune table</translation>
+    </message>
+    <message>
+        <source>a SELECT of no columns</source>
+        <translation>un SELECT sans colonnes</translation>
+    </message>
+    <message>
+        <source>a column that a FULL JOIN shares by USING or NATURAL</source>
+        <translation>une colonne qu&apos;un FULL JOIN partage par USING ou NATURAL</translation>
+    </message>
+    <message>
+        <source>a total within a calculation</source>
+        <translation>un total dans un calcul</translation>
+    </message>
+    <message>
+        <source>this (%1)</source>
+        <translation>ceci (%1)</translation>
+    </message>
+    <message>
+        <source>a drawing does not know the function %1 as it stands here; the statement can be run as it is.</source>
+        <translation>un dessin ne connaît pas la fonction %1 sous cette forme ; on peut exécuter l&apos;instruction telle quelle.</translation>
+    </message>
+    <message>
+        <source>a drawing does not know this cast; the statement can be run as it is.</source>
+        <translation>un dessin ne connaît pas cette conversion ; on peut exécuter l&apos;instruction telle quelle.</translation>
+    </message>
+    <message>
+        <source>a drawing does not know the operator %1; the statement can be run as it is.</source>
+        <translation>un dessin ne connaît pas l&apos;opérateur %1 ; on peut exécuter l&apos;instruction telle quelle.</translation>
+    </message>
+    <message>
+        <source>this division may give whole numbers or stop at 0, which one of a drawing does not; write %1.</source>
+        <translation>cette division peut donner des nombres entiers ou s&apos;arrêter à 0, ce que celle d&apos;un dessin ne fait pas ; écrivez %1.</translation>
+    </message>
+    <message>
+        <source>a drawing writes this as &apos;%1&apos;, which compares otherwise here; write it so.</source>
+        <translation>un dessin écrit ceci &apos;%1&apos;, ce qui se compare autrement ici ; écrivez-le ainsi.</translation>
+    </message>
+    <message>
+        <source>LIKE tells capitals from small letters here, which a drawing does not; write ILIKE if that is meant.</source>
+        <translation>LIKE distingue ici les majuscules des minuscules, un dessin non ; écrivez ILIKE si c&apos;est voulu.</translation>
+    </message>
+    <message>
+        <source>a drawing has no NULL as a value; write IS NULL or leave it out.</source>
+        <translation>un dessin n&apos;a pas de NULL comme valeur ; écrivez IS NULL ou omettez-le.</translation>
+    </message>
+    <message>
+        <source>this column is neither grouped nor a total; write it into GROUP BY.</source>
+        <translation>cette colonne n&apos;est ni groupée ni un total ; mettez-la dans GROUP BY.</translation>
+    </message>
+    <message>
+        <source>a drawing cannot hold this: %1</source>
+        <translation>un dessin ne peut contenir ceci : %1</translation>
+    </message>
+    <message>
+        <source>the condition of an outer join can compare columns of its two sides and nothing else in a drawing.</source>
+        <translation>dans un dessin, la condition d&apos;une jointure externe compare des colonnes de ses deux côtés et rien d&apos;autre.</translation>
+    </message>
+    <message>
+        <source>this condition has no place in the rows of a drawing.</source>
+        <translation>cette condition n&apos;a pas de place dans les lignes d&apos;un dessin.</translation>
+    </message>
+    <message>
+        <source>drawn, this would not say the same (%1); it can be run as it is.</source>
+        <translation>dessiné, ceci ne dirait pas la même chose (%1) ; on peut l&apos;exécuter tel quel.</translation>
+    </message>
+    <message>
+        <source>the order of its joins</source>
+        <translation>l&apos;ordre de ses jointures</translation>
+    </message>
+    <message>
+        <source>its conditions</source>
+        <translation>ses conditions</translation>
+    </message>
+    <message>
+        <source>its columns</source>
+        <translation>ses colonnes</translation>
+    </message>
+    <message>
+        <source>its groups</source>
+        <translation>ses groupes</translation>
+    </message>
+    <message>
+        <source>its order</source>
+        <translation>son tri</translation>
+    </message>
+    <message>
+        <source>the database has no table &quot;%1&quot;.</source>
+        <translation>la base de données n&apos;a pas de table « %1 ».</translation>
+    </message>
+    <message>
+        <source>the database has no table &quot;%1&quot;; is &quot;%2&quot; meant?</source>
+        <translation>la base de données n&apos;a pas de table « %1 » ; s&apos;agit-il de « %2 » ?</translation>
+    </message>
+    <message>
+        <source>there is no table &quot;%1&quot; in the statement.</source>
+        <translation>il n&apos;y a pas de table « %1 » dans l&apos;instruction.</translation>
+    </message>
+    <message>
+        <source>no table has a column &quot;%1&quot;.</source>
+        <translation>aucune table n&apos;a de colonne « %1 ».</translation>
+    </message>
+    <message>
+        <source>no table has a column &quot;%1&quot;; is &quot;%2&quot; meant?</source>
+        <translation>aucune table n&apos;a de colonne « %1 » ; s&apos;agit-il de « %2 » ?</translation>
+    </message>
+    <message>
+        <source>several tables have a column &quot;%1&quot;; write its table before it.</source>
+        <translation>plusieurs tables ont une colonne « %1 » ; écrivez sa table devant.</translation>
+    </message>
+    <message>
+        <source>two tables are called &quot;%1&quot; here; give one of them another name.</source>
+        <translation>deux tables s&apos;appellent « %1 » ici ; donnez un autre nom à l&apos;une d&apos;elles.</translation>
+    </message>
+    <message>
+        <source>two columns come out as &quot;%1&quot;.</source>
+        <translation>deux colonnes sortent sous le nom « %1 ».</translation>
+    </message>
+    <message>
+        <source>there is no output column %1.</source>
+        <translation>il n&apos;y a pas de colonne de sortie %1.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>
