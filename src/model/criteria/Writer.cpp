@@ -195,9 +195,10 @@ public:
 
     String text(const Node& node, Hold around) {
         if (const auto* all = std::get_if<sql::And>(&node->node))
-            return terms(all->terms, u" And ", Hold::conjunction, around);
+            return terms(all->terms, u" And ", Hold::conjunction, around, Hold::negation);
         if (const auto* any = std::get_if<sql::Or>(&node->node))
-            return terms(any->terms, u" Or ", Hold::disjunction, around);
+            // An And within an Or needs no parentheses; people who read it do.
+            return terms(any->terms, u" Or ", Hold::disjunction, around, Hold::negation);
         if (const auto* inverse = std::get_if<sql::Not>(&node->node))
             return u"Not (" + text(inverse->operand, Hold::disjunction) + u')';
         for (const String& candidate : candidates(node))
@@ -212,11 +213,12 @@ public:
     }
 
 private:
-    String terms(const std::vector<Node>& nodes, StringView word, Hold own, Hold around) {
+    String terms(const std::vector<Node>& nodes, StringView word, Hold own, Hold around,
+                 Hold each) {
         String out;
         for (const Node& node : nodes) {
             if (!out.empty()) out += word;
-            out += text(node, own);
+            out += text(node, each);
         }
         return around > own ? u'(' + out + u')' : out;
     }

@@ -1,0 +1,137 @@
+#include "Reading.h"
+
+using Statement = Reading;
+
+TEST_F(Statement, BecomesTablesUnderItsOwnNamesAndColumnsInItsOrder) {
+    read(u"SELECT c.name, o.total AS sum FROM customers AS c JOIN orders o ON o.customer_id = c.id");
+    ASSERT_EQ(record.tables.size(), 2u);
+    EXPECT_EQ(record.tables[0].name, u"c");
+    EXPECT_EQ(record.tables[0].sourceName, u"customers");
+    EXPECT_EQ(record.tables[0].left, -1) << "places are the caller's";
+    EXPECT_EQ(columns(), (Texts{"c.name", "o.total as sum"}));
+    ASSERT_EQ(record.joins.size(), 1u);
+    EXPECT_EQ(record.joins[0].type, 0);
+}
+
+TEST_F(Statement, PutsWhatSpeaksOfOneColumnIntoItsCell) {
+    read(u"SELECT name FROM customers WHERE (city = 'New York' OR city LIKE 'W%') AND id > 5 "
+         u"AND id <> 7 AND active");
+    EXPECT_EQ(columns(), (Texts{"customers.name", "(customers.city)", "(customers.id)",
+                                "(customers.active)"}));
+    EXPECT_EQ(criteria(2), (Texts{"4: New York Or Like W*"}));
+    EXPECT_EQ(criteria(3), (Texts{"4: > 5 And <> 7"}));
+    EXPECT_EQ(criteria(4), (Texts{"4: True"}));
+}
+
+TEST_F(Statement, HasARowForEachWayInWhichItsConditionsHold) {
+    read(u"SELECT name FROM customers WHERE active AND (city = 'Wien' OR id < 5)");
+    EXPECT_EQ(columns(),
+              (Texts{"customers.name", "(customers.active)", "(customers.city)", "(customers.id)"}));
+    EXPECT_EQ(criteria(2), (Texts{"4: True", "5: True"}));
+    EXPECT_EQ(criteria(3), (Texts{"4: Wien"}));
+    EXPECT_EQ(criteria(4), (Texts{"5: < 5"}));
+}
+
+TEST_F(Statement, PutsWhatNeedsMoreThanTwelveRowsIntoOneCell) {
+    std::u16string where;
+    for (int n = 0; n < 13; ++n)
+        where += (n ? u" OR " : u"") + std::u16string(u"(id = ") +
+                 zandor::platform::decimal(n) + u" AND city = 'x')";
+    read(u"SELECT name FROM customers WHERE " + where);
+    ASSERT_EQ(columns(), (Texts{"customers.name", "(customers.id)"}));
+    EXPECT_EQ(criteria(2).size(), 1u);
+    EXPECT_NE(criteria(2)[0].find("(0 And customers.city = 'x') Or"), std::string::npos)
+        << criteria(2)[0];
+}
+
+TEST_F(Statement, DrawsAConditionOnACalculationAsAHiddenColumn) {
+    read(u"SELECT price FROM \"Order Lines\" WHERE price * Quantity > 100");
+    EXPECT_EQ(columns(),
+              (Texts{"Order Lines.price", "([Order Lines].price * [Order Lines].Quantity)"}));
+    EXPECT_EQ(criteria(2), (Texts{"4: > 100"}));
+}
+
+TEST_F(Statement, JoinsTablesBehindCommasByTheEqualitiesThatConnectThem) {
+    read(u"SELECT name FROM customers c, orders o WHERE c.id = o.customer_id AND c.id = o.id "
+         u"AND o.total > 5");
+    EXPECT_EQ(record.joins.size(), 2u);
+    EXPECT_EQ(columns(), (Texts{"c.name", "(o.total)"}));
+}
+
+TEST_F(Statement, KeepsTheSideOfAnOuterJoinWhicheverWayItIsWritten) {
+    read(u"SELECT c.name FROM customers c LEFT JOIN orders o ON o.customer_id = c.id");
+    EXPECT_EQ(record.joins[0].type, 2) << "the right end is the customer";
+    read(u"SELECT c.name FROM orders o RIGHT JOIN customers c ON c.id = o.customer_id");
+    EXPECT_EQ(record.joins[0].type, 1);
+    EXPECT_NE(text().find("FROM customers AS c\n    LEFT JOIN orders AS o"), std::string::npos)
+        << text();
+}
+
+TEST_F(Statement, HasTotalsAndGroupsAndConditionsBehindThem) {
+    read(u"SELECT city, COUNT(*) AS n, SUM(total) FROM customers c JOIN orders o "
+         u"ON o.customer_id = c.id WHERE active AND city <> 'Graz' GROUP BY city "
+         u"HAVING COUNT(*) > 3 AND MAX(total) < 100 ORDER BY n DESC");
+    // What chooses stands where its condition stood.
+    EXPECT_EQ(columns(), (Texts{"(condition(c.active))", "c.city", "count(*) as n", "sum(o.total)",
+                                "(largest(o.total))"}));
+    EXPECT_EQ(criteria(1), (Texts{"4: True"}));
+    EXPECT_EQ(criteria(2), (Texts{"4: <> Graz"}));
+    EXPECT_EQ(criteria(3), (Texts{"4: > 3"}));
+    EXPECT_EQ(criteria(5), (Texts{"4: < 100"}));
+    EXPECT_EQ(record.definitions[2].sortOrder, 2);
+}
+
+TEST_F(Statement, SortsByPrioritiesOnlyWhereTheColumnsStandInAnotherOrder) {
+    read(u"SELECT name, city FROM customers ORDER BY name, city DESC");
+    EXPECT_EQ(record.definitions[0].sortPriority, 0);
+    EXPECT_EQ(record.definitions[1].sortOrder, 2);
+    read(u"SELECT name, city FROM customers ORDER BY city, since, name");
+    EXPECT_EQ(record.definitions[1].sortPriority, 1);
+    EXPECT_EQ(record.definitions[2].sortPriority, 2);
+    EXPECT_EQ(record.definitions[0].sortPriority, 3);
+    EXPECT_FALSE(record.definitions[2].visible);
+}
+
+TEST_F(Statement, IsReadFromAnotherAsASavedQuery) {
+    read(u"WITH big AS (SELECT id, customer_id FROM orders WHERE total > 100) "
+         u"SELECT name FROM customers JOIN big ON big.customer_id = customers.id");
+    ASSERT_TRUE(record.tables[1].query);
+    EXPECT_EQ(record.tables[1].name, u"big");
+    EXPECT_EQ(record.tables[1].query->record.tables[0].sourceName, u"orders");
+}
+
+TEST_F(Statement, AsksForItsParametersByTheirNames) {
+    read(u"SELECT name FROM customers WHERE city = :city AND since >= @from AND id = ?");
+    EXPECT_EQ(criteria(2), (Texts{"4: :city"}));
+    EXPECT_EQ(criteria(3), (Texts{"4: >= :from"}));
+    EXPECT_EQ(criteria(4), (Texts{"4: [1]"}));
+}
+
+TEST_F(Statement, ComesOutOnceInTheFirstRowsOnly) {
+    read(u"SELECT DISTINCT TOP 5 city FROM customers ORDER BY city", Dialect::SqlServer);
+    EXPECT_TRUE(record.options.distinct);
+    EXPECT_EQ(record.options.first, 5);
+    read(u"SELECT city FROM customers ORDER BY city LIMIT 0, 7", Dialect::MySQL);
+    EXPECT_EQ(record.options.first, 7);
+}
+
+TEST_F(Statement, NamesSharedColumnsAsItsEngineDoes) {
+    read(u"SELECT * FROM orders JOIN customers USING (id)");
+    EXPECT_EQ(column(1), "orders.id");
+    EXPECT_EQ(column(2), "orders.customer_id");
+    EXPECT_EQ(columns().size(), 8u) << "id comes out once";
+}
+
+TEST_F(Statement, ReadsNumbersBelowZero) {
+    read(u"SELECT id * -5, id - - 3, -(7) + id FROM customers WHERE id > -12 AND id < - -4");
+    EXPECT_EQ(columns(),
+              (Texts{"customers.id * -5", "customers.id - -3", "-7 + customers.id",
+                     "(customers.id)"}));
+    EXPECT_EQ(criteria(4), (Texts{"4: > -12 And < 4"}));
+}
+
+TEST_F(Statement, OfSmallLettersMeansThoseAloneInPostgres) {
+    read(u"SELECT NAME FROM Customers", Dialect::PostgreSQL);
+    EXPECT_EQ(refusal(u"SELECT \"Name\" FROM customers", Dialect::PostgreSQL),
+              "Line 1, column 8: no table has a column \"Name\"; is \"name\" meant?");
+}

@@ -1,0 +1,63 @@
+#include "Reading.h"
+
+using Refusals = Reading;
+
+TEST_F(Refusals, SayTheLineAndColumnOfTheTextAsItWasTyped) {
+    EXPECT_EQ(refusal(u"SELECT /* nä */ [name],\n  -- what for?\n  `nmae`\nFROM customers"),
+              "Line 3, column 3: no table has a column \"nmae\"; is \"name\" meant?");
+    EXPECT_EQ(refusal(u"SELECT TOP 3 \U0001F600, name FROM customers", Dialect::SqlServer),
+              "Line 1, column 14: no table has a column \"\U0001F600\".");
+}
+
+TEST_F(Refusals, PointBehindATextThatEndsTooEarly) {
+    EXPECT_EQ(refusal(u"SELECT name\nFROM customers\nWHERE"),
+              "Line 3, column 6: this cannot be read as SQL (syntax error at end of input); mend it "
+              "here or before.");
+    EXPECT_EQ(refusal(u""), "Line 1, column 1: there is no statement; write a SELECT.");
+    EXPECT_EQ(refusal(u" ;; "), "Line 1, column 1: there is no statement; write a SELECT.");
+}
+
+TEST_F(Refusals, PointAtTheQuoteThatHasNoEnd) {
+    EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE name = 'x"),
+              "Line 1, column 41: what begins here has no end; close it with '.");
+    EXPECT_EQ(refusal(u"SELECT \"name FROM customers"),
+              "Line 1, column 8: what begins here has no end; close it with \".");
+    EXPECT_EQ(refusal(u"SELECT $a$ FROM customers", Dialect::PostgreSQL),
+              "Line 1, column 8: what begins here has no end; close it with $a$.");
+}
+
+TEST_F(Refusals, PointAtTheSmallestPartThatDoesNotFit) {
+    EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE id > 1 AND (city = 'x' OR name > 5)"),
+              "Line 1, column 60: a drawing cannot hold this: compare it with a text");
+}
+
+TEST_F(Refusals, KeepWhatOnlyLooksTheSame) {
+    // A condition behind a left join takes the rows away that it has added.
+    EXPECT_NE(refusal(u"SELECT c.name FROM customers c LEFT JOIN orders o ON o.customer_id = c.id "
+                      u"JOIN \"Order Lines\" l ON l.order_id = o.id"),
+              "drawn");
+    // Whole numbers are divided into whole numbers.
+    EXPECT_NE(refusal(u"SELECT Quantity / 2 FROM \"Order Lines\""), "drawn");
+    // Moments are texts, and a shorter one comes first.
+    EXPECT_NE(refusal(u"SELECT id FROM orders WHERE placed > '2024-01-01'"), "drawn");
+    EXPECT_NE(refusal(u"SELECT name FROM customers WHERE name LIKE 'a%'", Dialect::PostgreSQL),
+              "drawn");
+}
+
+TEST_F(Refusals, ComeOfTooMuchAndTooDeepAndNothingElseDoes) {
+    const std::u16string select = u"SELECT name FROM customers WHERE ";
+    EXPECT_NE(refusal(select + std::u16string(20'000, u'(') + u"id = 1" +
+                      std::u16string(20'000, u')')),
+              "drawn");
+    std::u16string nots;
+    for (int n = 0; n < 5'000; ++n) nots += u"NOT ";
+    EXPECT_NE(refusal(select + nots + u"id = 1"), "drawn");
+    std::u16string sums;
+    for (int n = 0; n < 5'000; ++n) sums += u"id + ";
+    EXPECT_NE(refusal(select + sums + u"1 = 1"), "drawn");
+    std::u16string subs;
+    for (int n = 0; n < 30; ++n) subs += u"SELECT id FROM (";
+    EXPECT_NE(refusal(subs + u"SELECT id FROM orders" + std::u16string(30, u')')), "drawn");
+    EXPECT_EQ(refusal(select + std::u16string(200'000, u' ')).substr(0, 24),
+              "Line 1, column 100001: t");
+}
