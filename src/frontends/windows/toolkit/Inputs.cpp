@@ -184,7 +184,8 @@ SIZE ChoiceWindow::wanted() const {
     const Scale& scale = surroundings().scale;
     RECT place{};
     GetWindowRect(hwnd(), &place);
-    return {mWidest + GetSystemMetrics(SM_CXVSCROLL) + scale.pixels(16), place.bottom - place.top};
+    return {mWidest + systemMetric(SM_CXVSCROLL, scale) + scale.pixels(16),
+            place.bottom - place.top};
 }
 
 std::int16_t ComboBox::ListIndex() const { return static_cast<std::int16_t>(mWindow->chosen()); }

@@ -2,7 +2,7 @@
 
 #include "frontends/windows/toolkit/Text.h"
 
-#include <ranges>
+#include <algorithm>
 #include <utility>
 
 namespace zandor::platform::windows {
@@ -54,7 +54,8 @@ void ModalBoxes::show(HWND owner, const String& prompt, std::int32_t style, cons
 }
 
 void ModalBoxes::dismiss() const {
-    for (const HWND box : mOpen | std::views::reverse) PostMessageW(box, WM_CLOSE, 0, 0);
+    std::for_each(mOpen.rbegin(), mOpen.rend(),
+                  [](HWND box) { PostMessageW(box, WM_CLOSE, 0, 0); });
 }
 
 } // namespace zandor::platform::windows

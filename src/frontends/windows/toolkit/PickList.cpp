@@ -177,7 +177,7 @@ void PickWindow::stand(const RECT& over) {
     int wanted = 0;
     for (const String& item : mItems)
         wanted = std::max(wanted, surroundings().fonts.widthOf(fontHandle(), item));
-    wanted += GetSystemMetrics(SM_CXVSCROLL) + scale.pixels(12);
+    wanted += systemMetric(SM_CXVSCROLL, scale) + scale.pixels(12);
     const int width = std::max(
         widthOf(over), std::clamp(wanted, scale.pixels(narrowestList), scale.pixels(widestList)));
     const int left = std::clamp<int>(over.left, 0, std::max<int>(0, surface.right - width));

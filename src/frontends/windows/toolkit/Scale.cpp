@@ -9,6 +9,13 @@ namespace {
 
 constexpr double twipsPerInch = 1440;
 
+/// A procedure that came to the system later: systems before are served, too.
+template <class Procedure>
+Procedure* later(const char* name) {
+    return reinterpret_cast<Procedure*>(
+        reinterpret_cast<void*>(GetProcAddress(GetModuleHandleW(L"user32"), name)));
+}
+
 } // namespace
 
 int Scale::toPixels(float twips) const {
@@ -34,11 +41,13 @@ Bounds Scale::toTwips(const RECT& pixels) const {
             toTwips(pixels.bottom - pixels.top)};
 }
 
+int systemMetric(int index, const Scale& scale) {
+    static const auto forDpi = later<int WINAPI(int, UINT)>("GetSystemMetricsForDpi");
+    return forDpi ? forDpi(index, static_cast<UINT>(scale.dpi())) : GetSystemMetrics(index);
+}
+
 int dpiOf(HWND window) {
-    // Systems before the one that first had it are served, too.
-    using GetDpiForWindow = UINT(WINAPI*)(HWND);
-    static const auto ofWindow = reinterpret_cast<GetDpiForWindow>(
-        reinterpret_cast<void*>(GetProcAddress(GetModuleHandleW(L"user32"), "GetDpiForWindow")));
+    static const auto ofWindow = later<UINT WINAPI(HWND)>("GetDpiForWindow");
     if (ofWindow)
         if (const UINT dpi = ofWindow(window)) return static_cast<int>(dpi);
     const HDC screen = GetDC(nullptr);

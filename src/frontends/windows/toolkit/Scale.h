@@ -29,6 +29,10 @@ private:
     int mDpi;
 };
 
+/// A measure of the system's, SM_CXVSCROLL and the like, on a monitor of so many dots to an inch; of
+/// the first screen where the system knows only that.
+int systemMetric(int index, const Scale& scale);
+
 /// Of the monitor that a window is on, where the system knows several; else of the screen.
 int dpiOf(HWND window);
 

@@ -13,7 +13,7 @@ ScrollBarWindow::ScrollBarWindow(std::shared_ptr<Surroundings> around, HWND pare
     const bool lying = orientation == Orientation::horizontal;
     createNative(L"SCROLLBAR", parent,
                  WS_CHILD | WS_VISIBLE | WS_CLIPSIBLINGS | (lying ? SBS_HORZ : SBS_VERT));
-    place(lying ? RECT{0, 0, 0, thickness(orientation)} : RECT{0, 0, thickness(orientation), 0});
+    place(lying ? RECT{0, 0, 0, thickness()} : RECT{0, 0, thickness(), 0});
     (lying ? surroundings().across : surroundings().down) = this;
     showRange();
 }
@@ -27,8 +27,9 @@ void ScrollBarWindow::forget() {
     if (known == this) known = nullptr;
 }
 
-int ScrollBarWindow::thickness(Orientation orientation) {
-    return GetSystemMetrics(orientation == Orientation::horizontal ? SM_CYHSCROLL : SM_CXVSCROLL);
+int ScrollBarWindow::thickness() const {
+    return systemMetric(mOrientation == Orientation::horizontal ? SM_CYHSCROLL : SM_CXVSCROLL,
+                        surroundings().scale);
 }
 
 void ScrollBarWindow::showRange() {
@@ -92,7 +93,7 @@ LRESULT ScrollBarWindow::handle(const Message& message) {
 Bounds ScrollBar::bounds() const {
     Bounds result = Constituent::bounds();
     const Orientation orientation = mWindow->orientation();
-    const float thick = surroundings().scale.toTwips(ScrollBarWindow::thickness(orientation));
+    const float thick = surroundings().scale.toTwips(mWindow->thickness());
     (orientation == Orientation::horizontal ? result.Height : result.Width) = thick;
     return result;
 }

@@ -24,7 +24,7 @@ public:
     void scrollTo(int value);
     void scrollBy(float twips);
     /// Of the system's bars: width of an upright, height of a lying one.
-    static int thickness(Orientation orientation);
+    int thickness() const;
 
     std::optional<LRESULT> told(const Message& message) override;
     void gotFocus() override;
