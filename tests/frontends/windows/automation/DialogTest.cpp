@@ -64,9 +64,11 @@ protected:
             reinterpret_cast<void*>(GetProcAddress(atl, "AtlAxGetControl")));
         EXPECT_TRUE(ready);
         const Template made(L"AtlAxWin", L"TalvikDBxZandor.Zandor");
-        dialog = CreateDialogIndirectParamW(
-            GetModuleHandleW(nullptr), made.get(), nullptr,
-            [](HWND, UINT, WPARAM, LPARAM) -> INT_PTR { return 0; }, 0);
+        struct Idle {
+            static INT_PTR CALLBACK deal(HWND, UINT, WPARAM, LPARAM) { return 0; }
+        };
+        dialog = CreateDialogIndirectParamW(GetModuleHandleW(nullptr), made.get(), nullptr,
+                                            &Idle::deal, 0);
         holder = GetDlgItem(dialog, 100);
         Held<IUnknown> found;
         EXPECT_EQ(control ? control(holder, found.slot()) : E_NOTIMPL, S_OK);
@@ -109,17 +111,15 @@ protected:
         struct Search {
             const wchar_t* title;
             HWND found;
-        } search{title, nullptr};
-        EnumChildWindows(
-            dialog,
-            [](HWND child, LPARAM l) -> BOOL {
+            static BOOL CALLBACK test(HWND child, LPARAM l) {
                 auto& wanted = *reinterpret_cast<Search*>(l);
                 wchar_t text[80] = {};
                 GetWindowTextW(child, text, 80);
                 if (std::wcscmp(text, wanted.title) == 0 && !wanted.found) wanted.found = child;
                 return TRUE;
-            },
-            reinterpret_cast<LPARAM>(&search));
+            }
+        } search{title, nullptr};
+        EnumChildWindows(dialog, &Search::test, reinterpret_cast<LPARAM>(&search));
         return search.found;
     }
 

@@ -144,10 +144,7 @@ protected:
             const wchar_t* title;
             const wchar_t* kind;
             HWND found = nullptr;
-        } search{title, kind};
-        EnumChildWindows(
-            above,
-            [](HWND child, LPARAM l) -> BOOL {
+            static BOOL CALLBACK test(HWND child, LPARAM l) {
                 auto& wanted = *reinterpret_cast<Search*>(l);
                 wchar_t text[80] = {};
                 wchar_t name[40] = {};
@@ -157,8 +154,9 @@ protected:
                     return TRUE;
                 wanted.found = child;
                 return FALSE;
-            },
-            reinterpret_cast<LPARAM>(&search));
+            }
+        } search{title, kind};
+        EnumChildWindows(above, &Search::test, reinterpret_cast<LPARAM>(&search));
         EXPECT_TRUE(search.found);
         return search.found;
     }
