@@ -31,11 +31,12 @@ reader::Result<Arguments> readArguments(const QStringList& arguments) {
         return reader::Error{parser.errorText() + QStringLiteral(" See --help.")};
 
     const QStringList files = parser.positionalArguments();
-    if (files.size() > 1)
+    const bool draws = parser.isSet(QStringLiteral("draw")); // any number of them
+    if (files.size() > 1 && !draws)
         return reader::Error{QStringLiteral("There are %1 files; name one.").arg(files.size())};
 
     Arguments result;
-    if (!files.isEmpty()) result.file = files.first();
+    if (!files.isEmpty() && !draws) result.file = files.first();
     for (const QString& list : parser.values(tables))
         for (const QString& name : list.split(QLatin1Char(',')))
             if (const QString trimmed = name.trimmed(); !trimmed.isEmpty())
@@ -68,7 +69,7 @@ reader::Result<Arguments> readArguments(const QStringList& arguments) {
                         !result.screenshot.isEmpty() || !result.picture.isEmpty();
     if (result.task && window)
         return reader::Error{
-            QStringLiteral("--sql and --run open no window; leave out what is for one.")};
+            QStringLiteral("--sql, --run and --draw open no window; leave out what is for one.")};
     return result;
 }
 
@@ -85,7 +86,8 @@ bool asksForPicture(const QStringList& arguments) {
 }
 
 bool asksForTask(const QStringList& arguments) {
-    return hasAny(arguments, {QStringLiteral("--sql"), QStringLiteral("--run")});
+    return hasAny(arguments,
+                  {QStringLiteral("--sql"), QStringLiteral("--run"), QStringLiteral("--draw")});
 }
 
 QString helpText() {
@@ -94,6 +96,7 @@ QString helpText() {
        zandor-designer --sql QUERY [--dialect NAME]
        zandor-designer --run QUERY [--format csv|json] [--database ADDRESS]
                        [--limit N] [--set NAME=VALUE]...
+       zandor-designer --draw STATEMENT... OUT --database ADDRESS
 Designs a query over the tables of a database, which is only read: an SQLite
 file, an address like postgresql://user@host/database, or the file of a query.
 
@@ -125,11 +128,17 @@ Without a window, over a file of a query:
   --limit N        no more than N rows
   --set NAME=VALUE the value of a parameter
 
+Without a window, over SQL text:
+  --draw STATEMENT... OUT
+                   read SELECT statements as drawings over the tables of
+                   --database: a file, or - for the standard input stream,
+                   into a query file OUT; several into a folder OUT
+
   --help, -h       show this
   --version, -v    show the version
 
-Exit codes: 0 all well, 1 the picture could not be written or the query
-not be run, 2 the arguments, a file, the database or the output cannot be used.
+Exit codes: 0 all well, 1 the picture could not be written, the query not be
+run or a statement not be drawn, 2 the arguments, a file, the database or the output cannot be used.
 )");
 }
 

@@ -27,6 +27,7 @@
 #include "designer/show/ShowCommands.h"
 #include "designer/statement/FindingPlace.h"
 #include "designer/statement/ModelWords.h"
+#include "designer/statement/SqlCommands.h"
 #include "designer/statement/StatementPanel.h"
 #include "designer/tables/MissingTables.h"
 #include "designer/tables/RenameDialog.h"
@@ -56,8 +57,7 @@ namespace {
 constexpr QSize newSize(1340, 800);   // logical pixels
 constexpr QSize aroundWindow(16, 40); // what a desktop puts around a window, more or less
 constexpr int layoutVersion = 1;      // another number forgets where the panels were
-constexpr int mostOutputColumns = 255;
-constexpr int messageTime = 10'000; // milliseconds
+constexpr int messageTime = 10'000;   // milliseconds
 
 QString paneShareKey() { return QStringLiteral("window/paneShare"); }
 QString geometryKey() { return QStringLiteral("window/geometry"); }
@@ -96,6 +96,11 @@ DesignerWindow::DesignerWindow()
     setAcceptDrops(true);
     makePanels();
     mAdding = new TableAdding(mDocument, mDatabase, *mDrawing);
+    mStatement->takeTyping(mDatabase, [this](model::Query& query) {
+        mAdding->become(StatementTyping::tr("Change the SQL"), query);
+    });
+    mSql = new SqlCommands({mDocument, mDatabase, mFile, *mFiles, *mAdding, *mStatement, *mDrawing},
+                           *this);
     mSavedQueries = new SavedQueryCommands(mDocument, mFile, *mFiles, *mAdding, this);
     makeMenus();
     connectParts();
@@ -191,11 +196,13 @@ void DesignerWindow::makeMenus() {
         mFiles->open();
     })->setShortcut(QKeySequence::Open);
     file->addMenu(recent);
+    file->addAction(&mSql->openFile);
     file->addSeparator();
     command(file, tr("&Save"), "save", [this] { mFiles->save(); })->setShortcut(QKeySequence::Save);
     command(file, tr("Save &as\u2026"), "saveAs", [this] {
         mFiles->saveAs();
     })->setShortcut(QKeySequence::SaveAs);
+    file->addAction(&mSql->saveAs);
     file->addSeparator();
     file->addAction(&mShow->exportPicture);
     file->addAction(&mShow->print);
@@ -213,6 +220,7 @@ void DesignerWindow::makeMenus() {
     edit->addAction(&mShow->copyPicture);
     mTableCommands.push_back(
         command(edit, tr("Copy &SQL"), "copySql", [this] { mStatement->copy(); }));
+    edit->addAction(&mSql->paste);
     edit->addSeparator();
     command(edit, tr("&Options\u2026"), "options", &DesignerWindow::showOptions);
 
@@ -360,6 +368,7 @@ void DesignerWindow::connectParts() {
     connect(mSavedQueries, &SavedQueryCommands::refused, this,
             [this](const QString& why) { PlainBox::warn(this, tr("Add saved query"), why); });
 
+    connect(mSql, &SqlCommands::refused, this, [this] { goTo(*mStatement); });
     connect(mStatement, &StatementPanel::findingChosen, this,
             [this](const model::Finding& finding) {
                 showPlace(mDrawing->control(), *mDocument.query(), finding);
@@ -468,6 +477,7 @@ void DesignerWindow::lookAround() {
 }
 
 void DesignerWindow::closeEvent(QCloseEvent* event) {
+    mStatement->typing()->readNow();
     if (!mFiles->mayLose()) return event->ignore();
     mResults->cancel();
     mSettings.setValue(geometryKey(), saveGeometry());
@@ -482,16 +492,24 @@ void DesignerWindow::restoreLayout() {
 }
 
 void DesignerWindow::dragEnterEvent(QDragEnterEvent* event) {
-    if (droppedDatabase(*event->mimeData())) event->acceptProposedAction();
+    const QMimeData& data = *event->mimeData();
+    if (droppedDatabase(data) || (mDatabase.isOpen() && droppedStatement(data)))
+        event->acceptProposedAction();
 }
 
 void DesignerWindow::dropEvent(QDropEvent* event) {
-    const auto path = droppedDatabase(*event->mimeData());
-    if (!path) return;
+    const auto database = droppedDatabase(*event->mimeData());
+    const auto statement = droppedStatement(*event->mimeData());
+    if (!database && !statement) return;
     event->acceptProposedAction();
     // After the drop, for there may be questions.
-    QMetaObject::invokeMethod(
-        mDatabases, [this, path] { mDatabases->openAddress(*path); }, Qt::QueuedConnection);
+    const auto open = [this, database, statement] {
+        if (database)
+            mDatabases->openAddress(*database);
+        else if (mFiles->mayLose())
+            mSql->openFrom(*statement);
+    };
+    QMetaObject::invokeMethod(this, open, Qt::QueuedConnection);
 }
 
 /// Brings a table into view, and leaves the keyboard where it is.

@@ -28,6 +28,7 @@ class ResultsPanel;
 class ShowCommands;
 class StatementPanel;
 class SavedQueryCommands;
+class SqlCommands;
 class TableAdding;
 class TablesPanel;
 class TotalCommands;
@@ -112,6 +113,7 @@ private:
     FileDialogs* mFiles;
     DatabaseCommands* mDatabases;
     ShowCommands* mShow;
+    SqlCommands* mSql;
     std::unique_ptr<Autosave> mAutosave;
 };
 

@@ -10,6 +10,8 @@ namespace zandor::designer {
 /// The canvas has room for so many; the control leaves out what is beyond.
 inline constexpr std::int32_t mostTables = 16;
 inline constexpr std::int32_t mostJoins = 64;
+/// And the grid for so many output columns.
+inline constexpr std::int32_t mostOutputColumns = 255;
 
 /// A query over a database, ready to be shown.
 struct OpenedQuery {

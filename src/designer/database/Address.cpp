@@ -110,6 +110,12 @@ PartedAddress partPassword(const QString& address) {
     return {url.toString(QUrl::FullyEncoded), password};
 }
 
+QString lastingAddress(const QString& address) {
+    const auto parts = parseAddress(address);
+    return parts && parts->engine == Engine::SQLite ? QFileInfo(parts->file).absoluteFilePath()
+                                                    : address;
+}
+
 QString nameOfDatabase(const QString& address) {
     const auto parts = parseAddress(address);
     if (!parts) return {};

@@ -35,6 +35,9 @@ struct PartedAddress {
 /// be read. A file has none.
 PartedAddress partPassword(const QString& address);
 
+/// The same address in every working folder: a file's path is absolute.
+QString lastingAddress(const QString& address);
+
 /// What a title calls a database: the file's or the database's name, the data source.
 QString nameOfDatabase(const QString& address);
 

@@ -13,13 +13,6 @@ namespace zandor::designer {
 
 namespace {
 
-/// Good in every working folder.
-QString lasting(const QString& address) {
-    const auto parts = parseAddress(address);
-    return parts && parts->engine == Engine::SQLite ? QFileInfo(parts->file).absoluteFilePath()
-                                                    : address;
-}
-
 /// All that an SQLite file says of its tables; nothing while it cannot be read.
 std::optional<QByteArray> structureOf(const reader::Connection& connection) {
     QSqlQuery query(connection.database());
@@ -74,7 +67,7 @@ std::optional<reader::Error> Database::take(const QString& address, const QStrin
     mTables = std::move(*tables);
     {
         const QMutexLocker lock(&mTarget);
-        mAddress = lasting(parted.address);
+        mAddress = lastingAddress(parted.address);
         mPassword = secret;
     }
     mLost = false;

@@ -56,34 +56,54 @@ std::optional<QString> takeRun(const QCommandLineParser& parser, Task& task) {
     return {};
 }
 
+/// What is wrong with the files of --draw, or nothing.
+std::optional<QString> takeDraw(const QCommandLineParser& parser, Task& task) {
+    task.kind = Task::Kind::drawStatements;
+    task.statements = parser.values(QStringLiteral("draw")) + parser.positionalArguments();
+    task.database = parser.value(QStringLiteral("database"));
+    if (task.statements.size() < 2 || task.statements.contains(QString()))
+        return Words::tr("--draw takes two files; write --draw statement.sql query.json.");
+    task.drawing = task.statements.takeLast();
+    if (task.database.isEmpty())
+        return Words::tr("--draw needs to know the tables; name their database with --database.");
+    return {};
+}
+
 } // namespace
 
 QList<QCommandLineOption> options() {
     QList<QCommandLineOption> result;
-    for (const char* name : {"sql", "run", "dialect", "format", "database", "limit", "set"})
+    for (const char* name : {"sql", "run", "draw", "dialect", "format", "database", "limit", "set"})
         result << QCommandLineOption(QLatin1String(name), {}, QStringLiteral("value"));
     return result;
 }
 
 reader::Result<std::optional<Task>> taskOf(const QCommandLineParser& parser) {
-    const bool prints = parser.isSet(QStringLiteral("sql"));
-    const bool runs = parser.isSet(QStringLiteral("run"));
-    if (prints && runs) return Error{Words::tr("--sql and --run go one at a time.")};
-    for (const QString& name : {QStringLiteral("format"), QStringLiteral("database"),
-                                QStringLiteral("limit"), QStringLiteral("set")})
-        if (parser.isSet(name) && !runs)
-            return Error{Words::tr("--%1 goes with --run only.").arg(name)};
-    if (parser.isSet(QStringLiteral("dialect")) && !prints)
-        return Error{Words::tr("--dialect goes with --sql only.")};
-    if (!prints && !runs) return std::optional<Task>();
+    const auto isSet = [&](const char* name) { return parser.isSet(QLatin1String(name)); };
+    const bool prints = isSet("sql");
+    const bool runs = isSet("run");
+    const bool draws = isSet("draw");
+    if (prints + runs + draws > 1)
+        return Error{Words::tr("--sql, --run and --draw go one at a time.")};
+    for (const char* name : {"format", "limit", "set"})
+        if (isSet(name) && !runs)
+            return Error{Words::tr("--%1 goes with --run only.").arg(QLatin1String(name))};
+    if (isSet("database") && !runs && !draws)
+        return Error{Words::tr("--database goes with --run and --draw only.")};
+    if (isSet("dialect") && !prints) return Error{Words::tr("--dialect goes with --sql only.")};
+    if (!prints && !runs && !draws) return std::optional<Task>();
 
     Task task;
+    if (draws) {
+        if (const auto wrong = takeDraw(parser, task)) return Error{*wrong};
+        return std::optional<Task>(task);
+    }
     task.kind = prints ? Task::Kind::printStatement : Task::Kind::runQuery;
     task.query = parser.value(prints ? QStringLiteral("sql") : QStringLiteral("run"));
     if (task.query.isEmpty())
         return Error{Words::tr("No query is named; write --%1 query.json.")
                          .arg(QLatin1String(prints ? "sql" : "run"))};
-    if (parser.isSet(QStringLiteral("dialect"))) {
+    if (isSet("dialect")) {
         const QString name = parser.value(QStringLiteral("dialect"));
         task.dialect = dialectNamed(name);
         if (!task.dialect)
@@ -97,7 +117,12 @@ reader::Result<std::optional<Task>> taskOf(const QCommandLineParser& parser) {
 }
 
 int perform(const Task& task) {
-    return task.kind == Task::Kind::printStatement ? printStatement(task) : runQuery(task);
+    switch (task.kind) {
+    case Task::Kind::printStatement: return printStatement(task);
+    case Task::Kind::runQuery: return runQuery(task);
+    case Task::Kind::drawStatements: break;
+    }
+    return drawStatements(task);
 }
 
 int print(const QByteArray& text) {

@@ -18,10 +18,12 @@ namespace zandor::designer::shell {
 enum class Format { csv, json };
 
 struct Task {
-    enum class Kind { printStatement, runQuery };
+    enum class Kind { printStatement, runQuery, drawStatements };
 
     Kind kind = Kind::printStatement;
-    QString query;                                   ///< the file
+    QString query = {};          ///< the file
+    QStringList statements = {}; ///< files to be drawn; "-" is the standard input stream
+    QString drawing = {};        ///< the query file, or the folder for several, that is written
     std::optional<model::sql::Dialect> dialect = {}; ///< nothing: that of the query's database
     Format format = Format::csv;
     QString database = {}; ///< an address; empty: the one that the query names
@@ -41,10 +43,11 @@ int perform(const Task& task);
 // What perform() is made of.
 int printStatement(const Task& task);
 int runQuery(const Task& task);
+int drawStatements(const Task& task);
 files::Stream standardOutput();
 
 inline constexpr int allWell = 0;
-inline constexpr int failed = 1;   ///< the statement could not be written or run
+inline constexpr int failed = 1;   ///< the statement could not be written, run or drawn
 inline constexpr int unusable = 2; ///< arguments, a file or the database
 
 /// Writes to the standard output stream; what could not be written is complained about. Returns the

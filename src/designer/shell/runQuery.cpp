@@ -1,13 +1,11 @@
-#include "designer/database/Address.h"
 #include "designer/document/paths.h"
 #include "designer/run/CsvWriter.h"
 #include "designer/run/JsonWriter.h"
 #include "designer/shell/Task.h"
 #include "designer/shell/Words.h"
-#include "designer/shell/askPassword.h"
 #include "designer/shell/loadForTask.h"
+#include "designer/shell/openForTask.h"
 #include "designer/statement/ModelWords.h"
-#include "model/reader/serverError.h"
 
 #include <Zandor/QueryDocument.h>
 #include <Zandor/reader/dialectOf.h>
@@ -17,8 +15,6 @@
 namespace zandor::designer::shell {
 
 namespace {
-
-constexpr int mostTries = 3; // for a password
 
 std::atomic<bool> stopWished = false;
 static_assert(std::atomic<bool>::is_always_lock_free); // a signal sets it
@@ -36,32 +32,17 @@ void heedSignals() {
     std::signal(SIGPIPE, SIG_DFL);
 }
 
-struct Opened {
-    model::sql::Dialect dialect;
-    Connector connector; ///< gives the first connection only once
-};
-
-/// Asks for a password where the server does.
-reader::Result<Opened> openDatabase(const QString& address) {
-    auto [bare, password] = partPassword(address);
-    auto connection = reader::openDatabase(bare, password);
-    for (int tries = 0; !connection && tries < mostTries; ++tries) {
-        if (!reader::asksForPassword(connection.failure())) break;
-        const auto typed = askPassword(bare);
-        if (!typed) break;
-        password = *typed;
-        connection = reader::openDatabase(bare, password);
-    }
-    if (!connection) return connection.failure();
-    const auto dialect = reader::dialectOf(connection->database());
-    const auto first = std::make_shared<std::optional<reader::Connection>>(std::move(*connection));
-    const Connector others = Database::connectorTo(bare, password);
-    return Opened{dialect, [first, others]() -> reader::Result<reader::Connection> {
-                      if (!*first) return others();
-                      reader::Connection taken = std::move(**first);
-                      first->reset();
-                      return taken;
-                  }};
+/// Gives the connection that is open already, and then others.
+Connector connectorFrom(OpenedForTask opened) {
+    const auto first =
+        std::make_shared<std::optional<reader::Connection>>(std::move(opened.connection));
+    const Connector others = Database::connectorTo(opened.address, opened.password);
+    return [first, others]() -> reader::Result<reader::Connection> {
+        if (!*first) return others();
+        reader::Connection taken = std::move(**first);
+        first->reset();
+        return taken;
+    };
 }
 
 /// What is wrong with the values for the parameters, or nothing.
@@ -113,10 +94,11 @@ int runQuery(const Task& task) {
         return complain(Words::tr("The query names no database; give one with --database.")),
                unusable;
     heedSignals();
-    const auto opened = openDatabase(address);
+    auto opened = openForTask(address);
     if (!opened) return complain(inWords(opened.failure())), unusable;
+    const auto dialect = reader::dialectOf(opened->connection.database());
 
-    const auto text = statementFor(*document->query, opened->dialect, task.limit);
+    const auto text = statementFor(*document->query, dialect, task.limit);
     if (!text.runnable()) {
         for (const model::Finding& finding : text.findings)
             if (finding.isError()) complain(inWords(finding.message));
@@ -126,9 +108,9 @@ int runQuery(const Task& task) {
         return complain(*wrong), unusable;
 
     files::Stream out = standardOutput();
-    const auto command = makeCommand(text, opened->dialect, task.values, task.limit);
+    const auto command = makeCommand(text, dialect, task.values, task.limit);
     const auto writer = makeWriter(task.format, out);
-    const Outcome outcome = fetch(opened->connector, command, *writer, stopWished);
+    const Outcome outcome = fetch(connectorFrom(std::move(*opened)), command, *writer, stopWished);
     const auto unwritten = out.flush();
     const bool ended =
         outcome.end == Outcome::End::complete || outcome.end == Outcome::End::limited;

@@ -1,7 +1,10 @@
 #include "designer/statement/StatementPanel.h"
 
+#include "designer/Banner.h"
 #include "designer/document/Document.h"
+#include "designer/statement/FindBar.h"
 #include "designer/statement/ModelWords.h"
+#include "designer/statement/NameCompletion.h"
 #include "designer/statement/SqlView.h"
 #include "frontends/qt/ShownText.h"
 
@@ -37,7 +40,8 @@ QString shownName(Dialect dialect) { return toQt(model::sql::nameOf(dialect)); }
 
 StatementPanel::StatementPanel(Document& document, QWidget* parent)
     : QWidget(parent), mDocument(document), mDialects(new QComboBox),
-      mCopy(new QPushButton(tr("Copy"))), mView(new SqlView), mList(new QListWidget),
+      mFormat(new QPushButton(tr("Format"))), mCopy(new QPushButton(tr("Copy"))),
+      mView(new SqlView), mFind(new FindBar(*mView)), mAsleep(new Banner), mList(new QListWidget),
       mParts(new QSplitter(Qt::Vertical)) {
     mDialects->addItem({});
     for (const Dialect dialect : model::sql::allDialects) mDialects->addItem(shownName(dialect));
@@ -49,6 +53,12 @@ StatementPanel::StatementPanel(Document& document, QWidget* parent)
     mDialects->setAccessibleName(tr("Dialect"));
     setDatabaseDialect(mDatabaseDialect);
     mCopy->setToolTip(tr("Copy the statement to the clipboard"));
+    mCopy->setObjectName(QStringLiteral("copy"));
+    mFormat->setObjectName(QStringLiteral("format"));
+    mFormat->setToolTip(tr("Write the statement as the drawing says it"));
+    mFormat->hide();
+    mAsleep->setObjectName(QStringLiteral("asleep"));
+    mView->setObjectName(QStringLiteral("statement"));
     mView->setAccessibleName(tr("SQL statement"));
     mView->setFrameShape(QFrame::NoFrame);
     mList->setObjectName(QStringLiteral("findings"));
@@ -65,8 +75,16 @@ StatementPanel::StatementPanel(Document& document, QWidget* parent)
     top->setSpacing(6);
     top->addWidget(mDialects, 1);
     top->addStretch();
+    top->addWidget(mFormat);
     top->addWidget(mCopy);
-    mParts->addWidget(mView);
+    auto* const editor = new QWidget;
+    auto* const below = new QVBoxLayout(editor);
+    below->setContentsMargins({});
+    below->setSpacing(0);
+    below->addWidget(mView, 1);
+    below->addWidget(mAsleep);
+    below->addWidget(mFind);
+    mParts->addWidget(editor);
     mParts->addWidget(mList);
     mParts->setChildrenCollapsible(false);
     mParts->setStretchFactor(0, 1);
@@ -90,6 +108,42 @@ StatementPanel::StatementPanel(Document& document, QWidget* parent)
     showNow();
 }
 
+StatementPanel::~StatementPanel() {
+    delete mTyping; // which the view, that loses the keyboard as it goes, would call
+}
+
+void StatementPanel::takeTyping(Database& database, StatementTyping::Draw draw) {
+    mTyping = new StatementTyping(mDocument, database, *mView, std::move(draw));
+    mTyping->setDialect(dialect());
+    new NameCompletion(*mView, database, [this] { return dialect(); });
+    mFormat->show();
+    auto* const back =
+        mAsleep->addButton(tr("&Back to the drawing"), QStringLiteral("backToDrawing"));
+    back->setToolTip(tr("The drawing's own statement takes the place of the text (Esc)"));
+    connect(back, &QPushButton::clicked, this, [this] {
+        mTyping->discard();
+        mView->setFocus();
+    });
+    connect(mFormat, &QPushButton::clicked, mTyping, &StatementTyping::discard);
+    connect(mTyping, &StatementTyping::changed, this, &StatementPanel::showTyping);
+    connect(&database, &Database::opened, this, &StatementPanel::queue);
+    showNow();
+}
+
+QString StatementPanel::text() const { return mView->text(); }
+
+/// What is typed is in one of three states: it is drawn, it is not read yet, or it cannot be.
+void StatementPanel::showTyping() {
+    mFormat->setEnabled(mTyping->isOwnText() && !mTyping->sleeps());
+    mCopy->setEnabled(!mView->text().isEmpty());
+    const auto& why = mTyping->refusal();
+    mView->setAccessibleDescription(why ? why->withPlace() : mView->placeholderText());
+    if (why)
+        mAsleep->say(tr("%1 The drawing sleeps until this can be read.").arg(why->withPlace()));
+    else
+        mAsleep->hide();
+}
+
 void StatementPanel::setDatabaseDialect(Dialect dialect) {
     mDatabaseDialect = dialect;
     mDialects->setItemText(0, tr("%1 (as the database)").arg(shownName(dialect)));
@@ -102,9 +156,11 @@ Dialect StatementPanel::dialect() const {
 }
 
 void StatementPanel::copy() {
-    const QString text =
-        toQt(model::sql::statementText(*mDocument.query(), dialect(), model::sql::ValueForm::script)
-                 .text);
+    const bool asTyped = mTyping && mTyping->sleeps();
+    const QString text = asTyped ? mView->text()
+                                 : toQt(model::sql::statementText(*mDocument.query(), dialect(),
+                                                                  model::sql::ValueForm::script)
+                                            .text);
     if (!text.isEmpty()) QGuiApplication::clipboard()->setText(text);
 }
 
@@ -144,7 +200,9 @@ void StatementPanel::showNow() {
     const QString text = toQt(written.text);
     QString instead;
     if (mDocument.query()->Tables().Count() == 0) {
-        instead = tr("Add a table to begin: the statement appears here.");
+        instead = mView->isReadOnly()
+                      ? tr("Add a table to begin: the statement appears here.")
+                      : tr("Add a table to begin, or write a SELECT here: it becomes the drawing.");
     } else if (text.isEmpty()) {
         QStringList why{tr("%1 cannot say this query:").arg(shownName(dialect()))};
         for (const model::Finding& finding : written.findings)
@@ -153,8 +211,14 @@ void StatementPanel::showNow() {
     }
     mView->setPlaceholderText(instead);
     mView->setAccessibleDescription(instead);
-    mView->setStatement(text);
-    mCopy->setEnabled(!text.isEmpty());
+    if (mTyping) {
+        mTyping->setDialect(dialect());
+        mTyping->show(text);
+        showTyping();
+    } else {
+        mView->setStatement(text);
+        mCopy->setEnabled(!text.isEmpty());
+    }
     showFindings(written.findings);
 }
 

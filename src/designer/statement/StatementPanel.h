@@ -1,5 +1,7 @@
 #pragma once
 
+#include "designer/statement/StatementTyping.h"
+
 #include <Zandor/model/Finding.h>
 #include <Zandor/sql/Dialect.h>
 
@@ -13,21 +15,34 @@ class QSplitter;
 
 namespace zandor::designer {
 
+class Banner;
 class Document;
+class FindBar;
 class SqlView;
 
 /// The statement that the document's query draws, always as it is now, and what there is to say
-/// about it. It is made when control returns to the event loop.
+/// about it. It is made when control returns to the event loop. Once it knows a database, what is
+/// typed into it becomes the drawing (see StatementTyping).
 class StatementPanel final : public QWidget {
     Q_OBJECT
 
 public:
     explicit StatementPanel(Document& document, QWidget* parent = nullptr);
+    ~StatementPanel() override;
 
     /// The dialect of the open database, which the statement is in unless another is chosen.
     void setDatabaseDialect(model::sql::Dialect dialect);
     /// The one that the statement is in.
     model::sql::Dialect dialect() const;
+
+    /// To be called once.
+    void takeTyping(Database& database, StatementTyping::Draw draw);
+    /// Puts a text there as one who types it, and reads it. Only after takeTyping().
+    void type(const QString& text) { mTyping->type(text); }
+    /// The text as it stands there.
+    QString text() const;
+    /// What is typed there; nothing before takeTyping().
+    StatementTyping* typing() const { return mTyping; }
 
     QSize minimumSizeHint() const override { return {200, 160}; }
 
@@ -39,7 +54,7 @@ signals:
 
 public slots:
     /// Puts the statement as it is now on the clipboard, as the engine's own shell takes it, if
-    /// there is one.
+    /// there is one; what was typed and is not drawn as it stands.
     void copy();
 
 protected:
@@ -53,6 +68,7 @@ private:
     void showNow();
     void showFindings(const model::Findings& findings);
     void divide();
+    void showTyping();
     void choose(int row);
 
     Document& mDocument;
@@ -63,8 +79,12 @@ private:
     bool mIsDivided = false; ///< by hand
 
     QComboBox* mDialects;
+    QPushButton* mFormat;
     QPushButton* mCopy;
     SqlView* mView;
+    FindBar* mFind;
+    Banner* mAsleep; ///< while what is typed is not drawn
+    StatementTyping* mTyping = nullptr;
     QListWidget* mList;
     QSplitter* mParts;
 };

@@ -6,6 +6,7 @@
 #include "designer/database/patiently.h"
 #include "designer/database/readTables.h"
 #include "designer/document/Document.h"
+#include "designer/document/becomeQuery.h"
 #include "designer/statement/ModelWords.h"
 #include "designer/tables/leftOutWords.h"
 #include "designer/tables/placeTables.h"
@@ -89,6 +90,22 @@ void TableAdding::make(const QString& step, std::optional<QPoint> place,
     });
     if (arranges) mPlaces.note();
     if (!last.isEmpty()) emit added(last);
+}
+
+void TableAdding::become(const QString& step, model::Query& other) {
+    mDocument.settle();
+    const bool arranged = mPlaces.areAll();
+    mDocument.change(step, [&](model::Query& query) {
+        becomeQuery(query, other);
+        placeUnplaced(query, canvasWidth());
+    });
+    if (arranged) mPlaces.note();
+}
+
+void TableAdding::open(const Ref<model::Query>& query) {
+    arrangeUnplaced(*query, canvasWidth());
+    mDocument.setQuery(query);
+    mPlaces.note();
 }
 
 void TableAdding::arrange() {

@@ -31,6 +31,11 @@ public:
     /// A saved query as a table, in the same way.
     void addQuery(const QString& name, const model::SavedQuery& saved,
                   std::optional<QPoint> place = {});
+    /// The drawing says what another query says, as one step (see becomeQuery). Tables that come
+    /// stand beside what they are joined to, and no other is moved.
+    void become(const QString& step, model::Query& other);
+    /// The document gets a query whose tables have no places yet, laid out.
+    void open(const platform::Ref<model::Query>& query);
     /// Lays all tables out anew, as one step, and from then on as the drawing grows.
     void arrange();
     /// All tables stand now where the designer has put them, and not a person.

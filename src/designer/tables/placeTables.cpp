@@ -77,6 +77,15 @@ void fit(model::Table& table) {
     table.Height(static_cast<float>(size.height));
 }
 
+/// With sizes.
+Tables unplacedOf(model::Query& query) {
+    Tables unplaced = tablesOf(query);
+    for (const auto& table : unplaced) fit(*table);
+    std::erase_if(unplaced,
+                  [](const auto& table) { return table->Left() >= 0 && table->Top() >= 0; });
+    return unplaced;
+}
+
 } // namespace
 
 void placeFree(model::Query& query, const Ref<model::Table>& added, int canvasWidth) {
@@ -109,11 +118,22 @@ void arrangeGrown(model::Query& query, const Tables& added, int canvasWidth) {
 }
 
 void arrangeUnplaced(model::Query& query, int canvasWidth) {
-    Tables unplaced = tablesOf(query);
-    for (const auto& table : unplaced) fit(*table);
-    std::erase_if(unplaced,
-                  [](const auto& table) { return table->Left() >= 0 && table->Top() >= 0; });
+    const Tables unplaced = unplacedOf(query);
     if (!unplaced.empty()) arrangeGrown(query, unplaced, canvasWidth);
+}
+
+void placeUnplaced(model::Query& query, int canvasWidth) {
+    const Tables unplaced = unplacedOf(query);
+    Tables all = unplaced; // links count those that stand behind them
+    std::vector<Box> taken;
+    for (const auto& table : tablesOf(query)) {
+        if (std::find(unplaced.begin(), unplaced.end(), table) != unplaced.end()) continue;
+        all.push_back(table);
+        taken.push_back({table->Left(), table->Top(), table->Width(), table->Height()});
+    }
+    const auto boxes =
+        model::layout::arrange(sizesOf(unplaced), linksAmong(query, all), taken, canvasWidth);
+    for (std::size_t n = 0; n < unplaced.size(); ++n) move(*unplaced[n], boxes[n], {});
 }
 
 void arrangeTables(Document& document, int canvasWidth) {

@@ -25,6 +25,10 @@ void arrangeGrown(model::Query& query, const std::vector<platform::Ref<model::Ta
 /// without a size get one that fits. Twips.
 void arrangeUnplaced(model::Query& query, int canvasWidth);
 
+/// Gives tables that have no place one beside what they are joined to, and moves no other. Tables
+/// without a size get one that fits. Twips.
+void placeUnplaced(model::Query& query, int canvasWidth);
+
 /// Lays all tables of the document out anew by their joins, as one step. Twips.
 void arrangeTables(Document& document, int canvasWidth);
 

@@ -1480,6 +1480,38 @@
         <source>Document (*.pdf)</source>
         <translation>Dokument (*.pdf)</translation>
     </message>
+    <message>
+        <source>The drawing takes %1 tables, and the statement has %2.</source>
+        <translation>Die Zeichnung fasst %1 Tabellen, und die Anweisung hat %2.</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 joins, and the statement has %2.</source>
+        <translation>Die Zeichnung fasst %1 Verknüpfungen, und die Anweisung hat %2.</translation>
+    </message>
+    <message>
+        <source>The grid takes %1 columns, and the statement has %2.</source>
+        <translation>Das Raster fasst %1 Spalten, und die Anweisung hat %2.</translation>
+    </message>
+    <message>
+        <source>There is no file &quot;%1&quot;; check the path.</source>
+        <translation>Es gibt keine Datei „%1“; prüfen Sie den Pfad.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a folder; name a file with a statement.</source>
+        <translation>„%1“ ist ein Ordner; nennen Sie eine Datei mit einer Anweisung.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read: %2.</source>
+        <translation>Die Datei „%1“ lässt sich nicht lesen: %2.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is too large for a statement.</source>
+        <translation>„%1“ ist zu groß für eine Anweisung.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no text in UTF-8; save it as such.</source>
+        <translation>„%1“ ist kein Text in UTF-8; speichern Sie die Datei so.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -2198,6 +2230,25 @@ Zeichnen Sie eine Abfrage, lesen Sie ihr SQL, führen Sie sie aus. Die Datenbank
     </message>
 </context>
 <context>
+    <name>zandor::designer::FindBar</name>
+    <message>
+        <source>Find in the statement</source>
+        <translation>In der Anweisung suchen</translation>
+    </message>
+    <message>
+        <source>Previous (Shift+Enter)</source>
+        <translation>Vorherige Stelle (Umschalt+Eingabe)</translation>
+    </message>
+    <message>
+        <source>Next (Enter)</source>
+        <translation>Nächste Stelle (Eingabe)</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Schließen</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::FlagsPage</name>
     <message>
         <source>Join types offered</source>
@@ -2850,6 +2901,49 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     </message>
 </context>
 <context>
+    <name>zandor::designer::SqlCommands</name>
+    <message>
+        <source>SQL statements (*.sql)</source>
+        <translation>SQL-Anweisungen (*.sql)</translation>
+    </message>
+    <message>
+        <source>All files (*)</source>
+        <translation>Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <source>Open SQ&amp;L…</source>
+        <translation>SQ&amp;L öffnen …</translation>
+    </message>
+    <message>
+        <source>Paste S&amp;QL</source>
+        <translation>S&amp;QL einfügen</translation>
+    </message>
+    <message>
+        <source>Sa&amp;ve SQL as…</source>
+        <translation>SQL speic&amp;hern unter …</translation>
+    </message>
+    <message>
+        <source>Open SQL</source>
+        <translation>SQL öffnen</translation>
+    </message>
+    <message>
+        <source>Paste SQL</source>
+        <translation>SQL einfügen</translation>
+    </message>
+    <message>
+        <source>The clipboard has no text; copy a SELECT statement first.</source>
+        <translation>In der Zwischenablage ist kein Text; kopieren Sie zuerst eine SELECT-Anweisung.</translation>
+    </message>
+    <message>
+        <source>Save SQL</source>
+        <translation>SQL speichern</translation>
+    </message>
+    <message>
+        <source>statement.sql</source>
+        <translation>anweisung.sql</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::StatementPanel</name>
     <message>
         <source>The dialect of SQL that the statement is written in</source>
@@ -2898,6 +2992,37 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>%1 (as the database)</source>
         <translation>%1 (wie die Datenbank)</translation>
+    </message>
+    <message>
+        <source>Format</source>
+        <translation>Formatieren</translation>
+    </message>
+    <message>
+        <source>Write the statement as the drawing says it</source>
+        <translation>Die Anweisung so schreiben, wie die Zeichnung sie sagt</translation>
+    </message>
+    <message>
+        <source>&amp;Back to the drawing</source>
+        <translation>&amp;Zurück zur Zeichnung</translation>
+    </message>
+    <message>
+        <source>The drawing&apos;s own statement takes the place of the text (Esc)</source>
+        <translation>Die Anweisung der Zeichnung tritt an die Stelle des Textes (Esc)</translation>
+    </message>
+    <message>
+        <source>%1 The drawing sleeps until this can be read.</source>
+        <translation>%1 Die Zeichnung ruht, bis sich das lesen lässt.</translation>
+    </message>
+    <message>
+        <source>Add a table to begin, or write a SELECT here: it becomes the drawing.</source>
+        <translation>Fügen Sie zuerst eine Tabelle hinzu, oder schreiben Sie hier ein SELECT: Es wird zur Zeichnung.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::StatementTyping</name>
+    <message>
+        <source>Change the SQL</source>
+        <translation>SQL ändern</translation>
     </message>
 </context>
 <context>
@@ -3307,10 +3432,6 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
         <translation>„%1“ setzt nichts; schreiben Sie --set NAME=WERT.</translation>
     </message>
     <message>
-        <source>--sql and --run go one at a time.</source>
-        <translation>--sql und --run gehen nur einzeln.</translation>
-    </message>
-    <message>
         <source>--%1 goes with --run only.</source>
         <translation>--%1 gilt nur mit --run.</translation>
     </message>
@@ -3325,6 +3446,38 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
         <translation>Einen Dialekt „%1“ gibt es nicht; bekannt sind sqlite, postgresql, mysql, sqlserver und standard.</translation>
+    </message>
+    <message>
+        <source>There is no folder &quot;%1&quot;; several statements are drawn into one that is there.</source>
+        <translation>Es gibt keinen Ordner „%1“; mehrere Anweisungen werden in einen gezeichnet, den es gibt.</translation>
+    </message>
+    <message>
+        <source>The standard input stream has no name; name a file to draw it into.</source>
+        <translation>Die Standardeingabe hat keinen Namen; nennen Sie eine Datei, in die sie gezeichnet wird.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; and &quot;%2&quot; would both become &quot;%3&quot;; draw them into two folders.</source>
+        <translation>„%1“ und „%2“ würden beide zu „%3“; zeichnen Sie sie in zwei Ordner.</translation>
+    </message>
+    <message>
+        <source>The standard input stream cannot be read.</source>
+        <translation>Die Standardeingabe lässt sich nicht lesen.</translation>
+    </message>
+    <message>
+        <source>--draw takes two files; write --draw statement.sql query.json.</source>
+        <translation>--draw nimmt zwei Dateien; schreiben Sie --draw anweisung.sql abfrage.json.</translation>
+    </message>
+    <message>
+        <source>--draw needs to know the tables; name their database with --database.</source>
+        <translation>--draw muss die Tabellen kennen; nennen Sie ihre Datenbank mit --database.</translation>
+    </message>
+    <message>
+        <source>--sql, --run and --draw go one at a time.</source>
+        <translation>--sql, --run und --draw gehen nur einzeln.</translation>
+    </message>
+    <message>
+        <source>--database goes with --run and --draw only.</source>
+        <translation>--database geht nur mit --run und --draw.</translation>
     </message>
 </context>
 </TS>

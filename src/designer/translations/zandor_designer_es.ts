@@ -1480,6 +1480,38 @@
         <source>Document (*.pdf)</source>
         <translation>Documento (*.pdf)</translation>
     </message>
+    <message>
+        <source>The drawing takes %1 tables, and the statement has %2.</source>
+        <translation>El dibujo admite %1 tablas, y la instrucción tiene %2.</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 joins, and the statement has %2.</source>
+        <translation>El dibujo admite %1 uniones, y la instrucción tiene %2.</translation>
+    </message>
+    <message>
+        <source>The grid takes %1 columns, and the statement has %2.</source>
+        <translation>La cuadrícula admite %1 columnas, y la instrucción tiene %2.</translation>
+    </message>
+    <message>
+        <source>There is no file &quot;%1&quot;; check the path.</source>
+        <translation>No hay ningún archivo «%1»; compruebe la ruta.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a folder; name a file with a statement.</source>
+        <translation>«%1» es una carpeta; indique un archivo con una instrucción.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read: %2.</source>
+        <translation>El archivo «%1» no se puede leer: %2.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is too large for a statement.</source>
+        <translation>«%1» es demasiado grande para una instrucción.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no text in UTF-8; save it as such.</source>
+        <translation>«%1» no es un texto en UTF-8; guárdelo así.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -2198,6 +2230,25 @@ Dibuje una consulta, lea su SQL, ejecútela. La base de datos solo se lee.</tran
     </message>
 </context>
 <context>
+    <name>zandor::designer::FindBar</name>
+    <message>
+        <source>Find in the statement</source>
+        <translation>Buscar en la instrucción</translation>
+    </message>
+    <message>
+        <source>Previous (Shift+Enter)</source>
+        <translation>Anterior (Mayús+Intro)</translation>
+    </message>
+    <message>
+        <source>Next (Enter)</source>
+        <translation>Siguiente (Intro)</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Cerrar</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::FlagsPage</name>
     <message>
         <source>Join types offered</source>
@@ -2850,6 +2901,49 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     </message>
 </context>
 <context>
+    <name>zandor::designer::SqlCommands</name>
+    <message>
+        <source>SQL statements (*.sql)</source>
+        <translation>Instrucciones SQL (*.sql)</translation>
+    </message>
+    <message>
+        <source>All files (*)</source>
+        <translation>Todos los archivos (*)</translation>
+    </message>
+    <message>
+        <source>Open SQ&amp;L…</source>
+        <translation>Abrir SQ&amp;L…</translation>
+    </message>
+    <message>
+        <source>Paste S&amp;QL</source>
+        <translation>Pegar S&amp;QL</translation>
+    </message>
+    <message>
+        <source>Sa&amp;ve SQL as…</source>
+        <translation>Guardar S&amp;QL como…</translation>
+    </message>
+    <message>
+        <source>Open SQL</source>
+        <translation>Abrir SQL</translation>
+    </message>
+    <message>
+        <source>Paste SQL</source>
+        <translation>Pegar SQL</translation>
+    </message>
+    <message>
+        <source>The clipboard has no text; copy a SELECT statement first.</source>
+        <translation>El portapapeles no tiene texto; copie antes una instrucción SELECT.</translation>
+    </message>
+    <message>
+        <source>Save SQL</source>
+        <translation>Guardar SQL</translation>
+    </message>
+    <message>
+        <source>statement.sql</source>
+        <translation>instruccion.sql</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::StatementPanel</name>
     <message>
         <source>The dialect of SQL that the statement is written in</source>
@@ -2898,6 +2992,37 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>%1 (as the database)</source>
         <translation>%1 (como la base de datos)</translation>
+    </message>
+    <message>
+        <source>Format</source>
+        <translation>Dar formato</translation>
+    </message>
+    <message>
+        <source>Write the statement as the drawing says it</source>
+        <translation>Escribir la instrucción como la dice el dibujo</translation>
+    </message>
+    <message>
+        <source>&amp;Back to the drawing</source>
+        <translation>&amp;Volver al dibujo</translation>
+    </message>
+    <message>
+        <source>The drawing&apos;s own statement takes the place of the text (Esc)</source>
+        <translation>La instrucción del dibujo ocupa el lugar del texto (Esc)</translation>
+    </message>
+    <message>
+        <source>%1 The drawing sleeps until this can be read.</source>
+        <translation>%1 El dibujo queda en reposo hasta que esto se pueda leer.</translation>
+    </message>
+    <message>
+        <source>Add a table to begin, or write a SELECT here: it becomes the drawing.</source>
+        <translation>Añada una tabla para empezar, o escriba aquí un SELECT: se convierte en el dibujo.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::StatementTyping</name>
+    <message>
+        <source>Change the SQL</source>
+        <translation>Cambiar el SQL</translation>
     </message>
 </context>
 <context>
@@ -3307,10 +3432,6 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
         <translation>«%1» no fija nada; escriba --set NOMBRE=VALOR.</translation>
     </message>
     <message>
-        <source>--sql and --run go one at a time.</source>
-        <translation>--sql y --run solo van por separado.</translation>
-    </message>
-    <message>
         <source>--%1 goes with --run only.</source>
         <translation>--%1 solo va con --run.</translation>
     </message>
@@ -3325,6 +3446,38 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
         <translation>No existe el dialecto «%1»; se conocen sqlite, postgresql, mysql, sqlserver y standard.</translation>
+    </message>
+    <message>
+        <source>There is no folder &quot;%1&quot;; several statements are drawn into one that is there.</source>
+        <translation>No hay ninguna carpeta «%1»; varias instrucciones se dibujan en una que exista.</translation>
+    </message>
+    <message>
+        <source>The standard input stream has no name; name a file to draw it into.</source>
+        <translation>La entrada estándar no tiene nombre; indique un archivo donde dibujarla.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; and &quot;%2&quot; would both become &quot;%3&quot;; draw them into two folders.</source>
+        <translation>«%1» y «%2» se convertirían ambos en «%3»; dibújelos en dos carpetas.</translation>
+    </message>
+    <message>
+        <source>The standard input stream cannot be read.</source>
+        <translation>La entrada estándar no se puede leer.</translation>
+    </message>
+    <message>
+        <source>--draw takes two files; write --draw statement.sql query.json.</source>
+        <translation>--draw toma dos archivos; escriba --draw instruccion.sql consulta.json.</translation>
+    </message>
+    <message>
+        <source>--draw needs to know the tables; name their database with --database.</source>
+        <translation>--draw necesita conocer las tablas; indique su base de datos con --database.</translation>
+    </message>
+    <message>
+        <source>--sql, --run and --draw go one at a time.</source>
+        <translation>--sql, --run y --draw van de uno en uno.</translation>
+    </message>
+    <message>
+        <source>--database goes with --run and --draw only.</source>
+        <translation>--database va solo con --run y --draw.</translation>
     </message>
 </context>
 </TS>

@@ -1480,6 +1480,38 @@
         <source>Document (*.pdf)</source>
         <translation>Document (*.pdf)</translation>
     </message>
+    <message>
+        <source>The drawing takes %1 tables, and the statement has %2.</source>
+        <translation>Le dessin accepte %1 tables, et l’instruction en a %2.</translation>
+    </message>
+    <message>
+        <source>The drawing takes %1 joins, and the statement has %2.</source>
+        <translation>Le dessin accepte %1 jointures, et l’instruction en a %2.</translation>
+    </message>
+    <message>
+        <source>The grid takes %1 columns, and the statement has %2.</source>
+        <translation>La grille accepte %1 colonnes, et l’instruction en a %2.</translation>
+    </message>
+    <message>
+        <source>There is no file &quot;%1&quot;; check the path.</source>
+        <translation>Il n’y a pas de fichier «&#xa0;%1&#xa0;»&#xa0;; vérifiez le chemin.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is a folder; name a file with a statement.</source>
+        <translation>«&#xa0;%1&#xa0;» est un dossier&#xa0;; indiquez un fichier avec une instruction.</translation>
+    </message>
+    <message>
+        <source>The file &quot;%1&quot; cannot be read: %2.</source>
+        <translation>Le fichier «&#xa0;%1&#xa0;» ne peut pas être lu&#xa0;: %2.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is too large for a statement.</source>
+        <translation>«&#xa0;%1&#xa0;» est trop grand pour une instruction.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; is no text in UTF-8; save it as such.</source>
+        <translation>«&#xa0;%1&#xa0;» n’est pas un texte en UTF-8&#xa0;; enregistrez-le ainsi.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -2198,6 +2230,25 @@ Dessinez une requête, lisez son SQL, exécutez-la. La base de données est seul
     </message>
 </context>
 <context>
+    <name>zandor::designer::FindBar</name>
+    <message>
+        <source>Find in the statement</source>
+        <translation>Rechercher dans l’instruction</translation>
+    </message>
+    <message>
+        <source>Previous (Shift+Enter)</source>
+        <translation>Précédent (Maj+Entrée)</translation>
+    </message>
+    <message>
+        <source>Next (Enter)</source>
+        <translation>Suivant (Entrée)</translation>
+    </message>
+    <message>
+        <source>Close</source>
+        <translation>Fermer</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::FlagsPage</name>
     <message>
         <source>Join types offered</source>
@@ -2850,6 +2901,49 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     </message>
 </context>
 <context>
+    <name>zandor::designer::SqlCommands</name>
+    <message>
+        <source>SQL statements (*.sql)</source>
+        <translation>Instructions SQL (*.sql)</translation>
+    </message>
+    <message>
+        <source>All files (*)</source>
+        <translation>Tous les fichiers (*)</translation>
+    </message>
+    <message>
+        <source>Open SQ&amp;L…</source>
+        <translation>Ouvrir du SQ&amp;L…</translation>
+    </message>
+    <message>
+        <source>Paste S&amp;QL</source>
+        <translation>Coller du S&amp;QL</translation>
+    </message>
+    <message>
+        <source>Sa&amp;ve SQL as…</source>
+        <translation>Enregistrer le SQL so&amp;us…</translation>
+    </message>
+    <message>
+        <source>Open SQL</source>
+        <translation>Ouvrir du SQL</translation>
+    </message>
+    <message>
+        <source>Paste SQL</source>
+        <translation>Coller du SQL</translation>
+    </message>
+    <message>
+        <source>The clipboard has no text; copy a SELECT statement first.</source>
+        <translation>Le presse-papiers n’a pas de texte&#xa0;; copiez d’abord une instruction SELECT.</translation>
+    </message>
+    <message>
+        <source>Save SQL</source>
+        <translation>Enregistrer le SQL</translation>
+    </message>
+    <message>
+        <source>statement.sql</source>
+        <translation>instruction.sql</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::StatementPanel</name>
     <message>
         <source>The dialect of SQL that the statement is written in</source>
@@ -2898,6 +2992,37 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>%1 (as the database)</source>
         <translation>%1 (comme la base de données)</translation>
+    </message>
+    <message>
+        <source>Format</source>
+        <translation>Mettre en forme</translation>
+    </message>
+    <message>
+        <source>Write the statement as the drawing says it</source>
+        <translation>Écrire l’instruction comme le dessin la dit</translation>
+    </message>
+    <message>
+        <source>&amp;Back to the drawing</source>
+        <translation>&amp;Revenir au dessin</translation>
+    </message>
+    <message>
+        <source>The drawing&apos;s own statement takes the place of the text (Esc)</source>
+        <translation>L’instruction du dessin prend la place du texte (Échap)</translation>
+    </message>
+    <message>
+        <source>%1 The drawing sleeps until this can be read.</source>
+        <translation>%1 Le dessin est en sommeil jusqu’à ce que ceci puisse être lu.</translation>
+    </message>
+    <message>
+        <source>Add a table to begin, or write a SELECT here: it becomes the drawing.</source>
+        <translation>Ajoutez une table pour commencer, ou écrivez un SELECT ici&#xa0;: il devient le dessin.</translation>
+    </message>
+</context>
+<context>
+    <name>zandor::designer::StatementTyping</name>
+    <message>
+        <source>Change the SQL</source>
+        <translation>Modifier le SQL</translation>
     </message>
 </context>
 <context>
@@ -3307,10 +3432,6 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
         <translation>«&#xa0;%1&#xa0;» ne fixe rien&#xa0;; écrivez --set NOM=VALEUR.</translation>
     </message>
     <message>
-        <source>--sql and --run go one at a time.</source>
-        <translation>--sql et --run ne vont qu’un à la fois.</translation>
-    </message>
-    <message>
         <source>--%1 goes with --run only.</source>
         <translation>--%1 ne va qu’avec --run.</translation>
     </message>
@@ -3325,6 +3446,38 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>There is no dialect &quot;%1&quot;; known are sqlite, postgresql, mysql, sqlserver and standard.</source>
         <translation>Il n’y a pas de dialecte «&#xa0;%1&#xa0;»&#xa0;; sont connus sqlite, postgresql, mysql, sqlserver et standard.</translation>
+    </message>
+    <message>
+        <source>There is no folder &quot;%1&quot;; several statements are drawn into one that is there.</source>
+        <translation>Il n’y a pas de dossier «&#xa0;%1&#xa0;»&#xa0;; plusieurs instructions sont dessinées dans un dossier qui existe.</translation>
+    </message>
+    <message>
+        <source>The standard input stream has no name; name a file to draw it into.</source>
+        <translation>L’entrée standard n’a pas de nom&#xa0;; indiquez un fichier où la dessiner.</translation>
+    </message>
+    <message>
+        <source>&quot;%1&quot; and &quot;%2&quot; would both become &quot;%3&quot;; draw them into two folders.</source>
+        <translation>«&#xa0;%1&#xa0;» et «&#xa0;%2&#xa0;» deviendraient tous deux «&#xa0;%3&#xa0;»&#xa0;; dessinez-les dans deux dossiers.</translation>
+    </message>
+    <message>
+        <source>The standard input stream cannot be read.</source>
+        <translation>L’entrée standard ne peut pas être lue.</translation>
+    </message>
+    <message>
+        <source>--draw takes two files; write --draw statement.sql query.json.</source>
+        <translation>--draw prend deux fichiers&#xa0;; écrivez --draw instruction.sql requete.json.</translation>
+    </message>
+    <message>
+        <source>--draw needs to know the tables; name their database with --database.</source>
+        <translation>--draw doit connaître les tables&#xa0;; indiquez leur base de données avec --database.</translation>
+    </message>
+    <message>
+        <source>--sql, --run and --draw go one at a time.</source>
+        <translation>--sql, --run et --draw vont un seul à la fois.</translation>
+    </message>
+    <message>
+        <source>--database goes with --run and --draw only.</source>
+        <translation>--database ne va qu’avec --run et --draw.</translation>
     </message>
 </context>
 </TS>

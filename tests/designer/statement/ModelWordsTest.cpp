@@ -3,6 +3,7 @@
 #include <Zandor/QueryDocument.h>
 #include <Zandor/reader/Connection.h>
 #include <Zandor/sql/Builder.h>
+#include <Zandor/sql_reader/Messages.h>
 
 #include <gtest/gtest.h>
 
@@ -39,6 +40,7 @@ std::set<std::string> textsOfTheTables() {
     for (const auto& each : model::messageTexts) texts.insert(each.english);
     for (const auto& each : files::messageTexts) texts.insert(each.english);
     for (const auto& each : reader::messageTexts) texts.insert(each.english);
+    for (const auto& each : sql_reader::messageTexts) texts.insert(each.english);
     return texts;
 }
 

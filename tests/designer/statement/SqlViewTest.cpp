@@ -64,7 +64,37 @@ TEST(TheSqlView, ShowsWhateverTextFollowsWhatever) {
     }
 }
 
-TEST(TheSqlView, CannotBeTypedInto) {
+TEST(TheSqlView, CannotBeTypedIntoUnlessItIsAllowed) {
     SqlView view;
     EXPECT_TRUE(view.isReadOnly());
+}
+
+TEST(TheSqlView, ShowsAStatementInPlaceOfWhateverWasTyped) {
+    SqlView view;
+    int typed = 0;
+    QObject::connect(&view, &SqlView::typing, [&] { ++typed; });
+    view.setReadOnly(false);
+    view.setStatement("SELECT a FROM t");
+    EXPECT_EQ(typed, 0);
+    view.type("SELECT b");
+    EXPECT_EQ(typed, 1);
+    EXPECT_EQ(view.text(), "SELECT b");
+    EXPECT_TRUE(view.document()->isUndoAvailable());
+    view.setStatement("SELECT a FROM t");
+    EXPECT_EQ(view.text(), "SELECT a FROM t");
+    EXPECT_EQ(typed, 1);
+    EXPECT_FALSE(view.document()->isUndoAvailable()) << "that belonged to the other text";
+}
+
+TEST(TheSqlView, PutsAWaveUnderTheWordAtAPlace) {
+    SqlView view;
+    view.setStatement("SELECT one, two");
+    view.mark(7);
+    EXPECT_EQ(view.marked().selectedText(), "one");
+    view.mark(10);
+    EXPECT_EQ(view.marked().selectedText(), ",");
+    view.mark(99);
+    EXPECT_EQ(view.marked().selectedText(), "o") << "something is missing behind it";
+    view.mark(-1);
+    EXPECT_FALSE(view.isMarked());
 }

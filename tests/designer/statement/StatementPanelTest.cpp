@@ -34,7 +34,7 @@ protected:
     designer::SqlView& view() { return *panel.findChild<designer::SqlView*>(); }
     QListWidget& list() { return *panel.findChild<QListWidget*>(); }
     QComboBox& dialects() { return *panel.findChild<QComboBox*>(); }
-    QPushButton& copy() { return *panel.findChild<QPushButton*>(); }
+    QPushButton& copy() { return *panel.findChild<QPushButton*>("copy"); }
     std::string text() { return view().toPlainText().toStdString(); }
     std::string instead() { return view().placeholderText().toStdString(); }
 
