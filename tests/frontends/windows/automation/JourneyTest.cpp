@@ -1,5 +1,7 @@
 #include "Container.h"
+#include "EventScripts.h"
 #include "Late.h"
+#include "ScriptHost.h"
 #include "Sink.h"
 #include "User.h"
 
@@ -24,6 +26,9 @@ protected:
         add(u"orders", {u"id", u"ordered_at", u"status"});
         Late(form.control().get()).set(L"Zandor", query.object());
         form.tell(OLEIVERB_UIACTIVATE);
+        for (auto* const script : {&basic, &java}) script->lend(L"control", form.control().get());
+        EXPECT_TRUE(basic.run(inVBScript)) << basic.failure();
+        EXPECT_TRUE(java.run(inJScript)) << java.failure();
     }
 
     void add(Word name, std::initializer_list<Word> columns) const {
@@ -122,6 +127,7 @@ protected:
         GetWindowRect(table(L"suppliers"), &right);
         const POINT line{(left.right + right.left) / 2,
                          (entry(L"customers", 3).y + entry(L"suppliers", 2).y) / 2};
+        mLine = line;
         user.click(line, true);
         user.choose(L"Show Join Definition", [this] { user.picture("container-3-menu"); });
         const auto dialog = [] { return FindWindowW(nullptr, L"Join Defintion"); };
@@ -210,11 +216,22 @@ protected:
         user.await("it is gone", [&] { return !table(L"orders"); });
         user.picture("container-9-table-deleted");
     }
+    void deleteTheJoin() {
+        user.click(mLine, true);
+        user.choose(L"Delete Join");
+        awaitEvent("-129");
+    }
 
     Container form;
     const Late query{newQuery().get()};
     Sink sink{form.control().get()};
     User user{form.window()};
+    // Who hears it all by name.
+    ScriptHost basic{L"VBScript"};
+    ScriptHost java{L"JScript"};
+
+private:
+    POINT mLine{};
 };
 
 } // namespace
@@ -246,6 +263,19 @@ TEST_F(AJourney, OnAFormWithMouseAndKeyboardLeavesTheQueryThatWasMade) {
                      "    customers.name\n"
                      "FROM customers\n"
                      "    LEFT JOIN suppliers ON customers.country = suppliers.country");
+    user.live([this] { deleteTheJoin(); });
+    Late(form.control().get()).set(L"Zandor", nullptr);
+
+    EXPECT_EQ(basic.said(),
+              std::vector<std::string>(
+                  {"TableMoved", "TableMoved", "JoinCreated 0", "Activate", "Activate",
+                   "JoinModified 1", "ColumnCreated orders.id", "ColumnCreated orders.ordered_at",
+                   "ColumnCreated orders.status", "Activate", "ColumnModified orders.status",
+                   "ColumnModified orders.ordered_at", "Activate", "Activate",
+                   "ColumnCreated customers.name", "Activate", "ColumnRemoved orders.ordered_at",
+                   "TableDeleted orders", "Activate", "JoinRemoved 1",
+                   "Error New Zanodr is nothing! -1"}));
+    EXPECT_EQ(java.said(), basic.said());
 }
 
 int main(int argc, char** argv) {
