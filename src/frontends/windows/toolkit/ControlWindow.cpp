@@ -29,6 +29,7 @@ void ControlWindow::forget() {
     onPaint = nullptr;
     onLeave = nullptr;
     surroundings().onFocus = nullptr;
+    surroundings().onModal = nullptr;
     surroundings().surface = nullptr;
 }
 

@@ -3,6 +3,7 @@
 #include "frontends/windows/toolkit/Buttons.h"
 #include "frontends/windows/toolkit/Drawing.h"
 #include "frontends/windows/toolkit/Inputs.h"
+#include "frontends/windows/toolkit/Modal.h"
 #include "frontends/windows/toolkit/Text.h"
 
 #include <algorithm>
@@ -161,6 +162,8 @@ void FormWindow::enableOthers(bool value) const {
 }
 
 void FormWindow::showModal() {
+    const auto held = shared_from_this();
+    const Modal modal(surroundings());
     if (!isAlive()) return;
     layOut();
     for (const auto& one : mButtons) {
@@ -169,7 +172,6 @@ void FormWindow::showModal() {
         if (button && button->isDefault())
             SendMessageW(hwnd(), DM_SETDEFID, static_cast<WPARAM>(GetDlgCtrlID(button->hwnd())), 0);
     }
-    const auto held = shared_from_this();
     mRunning = true;
     enableOthers(false);
     ShowWindow(hwnd(), SW_SHOW);

@@ -1,5 +1,6 @@
 #include "frontends/windows/toolkit/PopupMenu.h"
 
+#include "frontends/windows/toolkit/Modal.h"
 #include "frontends/windows/toolkit/Text.h"
 
 #include <algorithm>
@@ -86,7 +87,9 @@ std::shared_ptr<MenuItem> PopupMenu::chosenByKey(StringView name) const {
 }
 
 std::shared_ptr<MenuItem> PopupMenu::chosenByUser(std::optional<POINT> at) {
-    const HWND owner = mSurroundings->surfaceHandle();
+    const auto around = mSurroundings; // the host may end the control while the menu stands open
+    const Modal modal(*around);
+    const HWND owner = around->surfaceHandle();
     if (!owner) return {};
     const SystemMenu menu;
     std::vector<std::shared_ptr<MenuItem>> shown;
@@ -100,7 +103,6 @@ std::shared_ptr<MenuItem> PopupMenu::chosenByUser(std::optional<POINT> at) {
     if (!at) GetCursorPos(&place);
     // Who opened it by a key goes on by keys, and sees where they begin.
     if (at) PostMessageW(owner, WM_KEYDOWN, VK_DOWN, 0);
-    const auto around = mSurroundings; // the host may end the control while the menu stands open
     around->openMenu = this;
     const UINT chosen = menu.run(place, owner);
     around->openMenu = nullptr;

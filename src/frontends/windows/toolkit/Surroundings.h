@@ -62,6 +62,8 @@ public:
     bool holds(HWND window) const;
     /// The focus has come into the control from elsewhere, or has gone there.
     std::function<void(bool has)> onFocus;
+    /// Something modal opens (Modal.h); what comes back is called when it has closed.
+    std::function<std::function<void()>()> onModal;
 
     /// The control's own window as a handle; nullptr: it has gone.
     HWND surfaceHandle() const { return surface ? surface->hwnd() : nullptr; }

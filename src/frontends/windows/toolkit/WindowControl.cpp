@@ -64,6 +64,10 @@ void WindowControl::onFocus(std::function<void(bool has)> change) const {
     mHouse->toolkit.onFocus(std::move(change));
 }
 
+void WindowControl::onModal(std::function<std::function<void()>()> open) const {
+    mHouse->toolkit.onModal(std::move(open));
+}
+
 void WindowControl::setColours(std::optional<COLORREF> ground, std::optional<COLORREF> ink) const {
     mHouse->toolkit.setColours(ground, ink);
 }

@@ -7,6 +7,7 @@
 #include "frontends/windows/toolkit/Grid.h"
 #include "frontends/windows/toolkit/Images.h"
 #include "frontends/windows/toolkit/Inputs.h"
+#include "frontends/windows/toolkit/Modal.h"
 #include "frontends/windows/toolkit/PickList.h"
 #include "frontends/windows/toolkit/PopupMenu.h"
 #include "frontends/windows/toolkit/ScrollBar.h"
@@ -97,6 +98,7 @@ void WindowsToolkit::setWords(const Words& words) {
 }
 
 void WindowsToolkit::dismiss() {
+    mDismissed = true;
     mSurroundings->drags.cancel();
     mBoxes.dismiss();
     if (mSurroundings->openMenu) EndMenu();
@@ -130,6 +132,8 @@ std::unique_ptr<Part> WindowsToolkit::make(const Design& design, Arguments&&... 
 void WindowsToolkit::MsgBox(const String& prompt, std::int32_t style, const String& title) {
     if (mSilent) return;
     const auto around = mSurroundings; // the host may end the control while the box stands open
+    const Modal modal(*around);
+    if (mDismissed) return;
     const HWND root = owner();
     mBoxes.show(root && IsWindowVisible(root) ? root : nullptr, prompt, style, title);
     around->focus.restore();

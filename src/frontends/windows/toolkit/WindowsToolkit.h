@@ -39,6 +39,9 @@ public:
     void onPaint(PlainEvent event) { mSurface->onPaint = std::move(event); }
     void onLeave(std::function<bool(bool next)> event) { mSurface->onLeave = std::move(event); }
     void onFocus(std::function<void(bool has)> event) { mSurroundings->onFocus = std::move(event); }
+    void onModal(std::function<std::function<void()>()> event) {
+        mSurroundings->onModal = std::move(event);
+    }
     /// onPaint follows from the message loop.
     void paintLater() { mSurface->paintLater(); }
     /// Boxes are left out.
@@ -95,6 +98,7 @@ private:
     HWND mDialog = nullptr; ///< the last made
     bool mClosing = false;
     bool mSilent = false;
+    bool mDismissed = false;
 };
 
 } // namespace zandor::platform::windows

@@ -66,6 +66,8 @@ public:
     STDMETHODIMP_(ULONG) AddRef() override { return static_cast<ULONG>(++mReferences); }
     STDMETHODIMP_(ULONG) Release() override { return static_cast<ULONG>(--mReferences); }
     int references() const { return mReferences; }
+    /// How many boxes, dialogs and menus of the control the frame has been told of that are open.
+    int modal() const { return mModal; }
 
     // The site
     STDMETHODIMP SaveObject() override { return heard("SaveObject"); }
@@ -99,7 +101,10 @@ public:
     STDMETHODIMP SetMenu(HMENU, HOLEMENU, HWND) override { return E_NOTIMPL; }
     STDMETHODIMP RemoveMenus(HMENU) override { return E_NOTIMPL; }
     STDMETHODIMP SetStatusText(LPCOLESTR) override { return S_OK; }
-    STDMETHODIMP EnableModeless(BOOL) override { return S_OK; }
+    STDMETHODIMP EnableModeless(BOOL enable) override {
+        mModal += enable ? -1 : 1;
+        return heard(enable ? "EnableModeless" : "EnableModeless(not)");
+    }
     STDMETHODIMP TranslateAccelerator(MSG*, WORD) override { return S_FALSE; }
 
     // The control's site
@@ -131,6 +136,7 @@ private:
     HRESULT heard(const char* call);
 
     int mReferences = 0;
+    int mModal = 0;
     HWND mWindow;
     Held<_Zandor> mControl;
     Held<IOleInPlaceActiveObject> mActive;

@@ -24,6 +24,7 @@ Placement::Placement(IUnknown& whole, House& house, std::function<void()> change
     const auto& shown = mHouse.shown();
     shown.onFocus([this](bool has) { focusChanged(has); });
     shown.onLeave([this](bool next) { return leave(next); });
+    shown.onModal([this] { return disableFrame(); });
     const SIZE size = toPixels(mExtent);
     shown.setBounds({0, 0, size.cx, size.cy});
 }
@@ -31,6 +32,7 @@ Placement::Placement(IUnknown& whole, House& house, std::function<void()> change
 void Placement::end() {
     mHouse.shown().onFocus(nullptr);
     mHouse.shown().onLeave(nullptr);
+    mHouse.shown().onModal(nullptr);
     mHasUi = false;
     mInPlace = {};
     mFrame = {};
@@ -186,6 +188,15 @@ void Placement::focusChanged(bool has) {
     const Held<IUnknown> meanwhile(&mWhole);
     if (has && mInPlace) activateUi();
     if (const Held<IOleControlSite> site = mControlSite) site->OnFocus(has);
+}
+
+std::function<void()> Placement::disableFrame() const {
+    const Held<IUnknown> meanwhile(&mWhole);
+    // The same one is enabled again, wherever the control stands by then.
+    const Held<IOleInPlaceFrame> frame = mFrame;
+    if (!frame) return {};
+    frame->EnableModeless(FALSE);
+    return [frame] { frame->EnableModeless(TRUE); };
 }
 
 bool Placement::hasFocus() const {

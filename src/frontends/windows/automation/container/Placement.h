@@ -54,6 +54,9 @@ private:
     HRESULT stand(IOleInPlaceSite& site);
     HRESULT activateUi();
     void focusChanged(bool has);
+    /// What the frame has without a mode is dead while the control has a box, a dialog or a menu;
+    /// what comes back ends that.
+    std::function<void()> disableFrame() const;
     void takeFocus() const;
     bool hasFocus() const;
     void goBack() const;

@@ -63,6 +63,9 @@ public:
     void onLeave(std::function<bool(bool next)> leave) const;
     /// The focus has come into the control from elsewhere, or has gone there.
     void onFocus(std::function<void(bool has)> change) const;
+    /// A box, a dialog or a menu of the control is about to open; what comes back is called when it
+    /// has closed, even if the control has ended meanwhile.
+    void onModal(std::function<std::function<void()>()> open) const;
     /// The host's window is about to go: boxes shown from now on stand on their own.
     void close() const;
 
