@@ -28,23 +28,6 @@ String inQuotes(StringView text, char16_t quote) {
     return out + quote;
 }
 
-/// A pattern as people type it.
-String typedPattern(StringView pattern) {
-    String out;
-    for (std::size_t i = 0; i < pattern.size(); ++i) {
-        char16_t c = pattern[i];
-        const bool itself = c == u'\\' && i + 1 < pattern.size();
-        if (itself) c = pattern[++i];
-        if (!itself && (c == u'%' || c == u'_'))
-            out += c == u'%' ? u'*' : u'?';
-        else if (StringView(u"*?%_[").find(c) != StringView::npos)
-            out += String(u"[") + c + u']';
-        else
-            out += c;
-    }
-    return out;
-}
-
 StringView symbolOf(sql::Comparison comparison) {
     constexpr std::array<StringView, 6> symbols = {u"=", u"<>", u"<", u">", u"<=", u">="};
     return symbols[static_cast<std::size_t>(comparison)];
@@ -310,6 +293,22 @@ private:
 };
 
 } // namespace
+
+String typedPattern(StringView pattern) {
+    String out;
+    for (std::size_t i = 0; i < pattern.size(); ++i) {
+        char16_t c = pattern[i];
+        const bool itself = c == u'\\' && i + 1 < pattern.size();
+        if (itself) c = pattern[++i];
+        if (!itself && (c == u'%' || c == u'_'))
+            out += c == u'%' ? u'*' : u'?';
+        else if (StringView(u"*?%_[").find(c) != StringView::npos)
+            out += String(u"[") + c + u']';
+        else
+            out += c;
+    }
+    return out;
+}
 
 std::optional<String> written(const Node& node) {
     try {

@@ -7,6 +7,9 @@
 /// The way back: trees as people would type them.
 namespace zandor::model::criteria {
 
+/// A pattern as sql::Like keeps it, as people type it behind Like.
+ZANDOR_MODEL_EXPORT String typedPattern(StringView pattern);
+
 /// An expression that reads as a tree again; nothing where the language has no words for a part of
 /// it, as for totals.
 ZANDOR_MODEL_EXPORT std::optional<String> written(const sql::Node& node);

@@ -2,8 +2,12 @@
 
 #include "model/criteria/Parser.h"
 #include "model/criteria/Tokens.h"
+#include "model/criteria/Writer.h"
+#include "model/sql_reader/Conditions.h"
 #include "model/sql_reader/Forms.h"
+#include "model/sql_reader/LikePattern.h"
 #include "model/sql_reader/Refused.h"
+#include "model/sql_reader/TreeChecks.h"
 
 #include <Zandor/model/Functions.h>
 #include <Zandor/model/Names.h>
@@ -23,115 +27,13 @@ namespace {
 /// The table whose columns stand for totals while a condition is read.
 constexpr StringView tableOfTotals = u"\uE002";
 
-bool isNamed(const Tree& type, std::initializer_list<StringView> names) {
-    if (type.has("typmods") || type.has("arrayBounds")) return false;
-    const auto all = type.names("names");
-    return std::any_of(names.begin(), names.end(),
-                       [&](StringView each) { return sameName(all.back(), each); });
-}
-
-bool isCastTo(const Tree& tree, std::initializer_list<StringView> types) {
-    return tree.is("TypeCast") && isNamed(tree.part("typeName"), types);
-}
-
-String operatorOf(const Tree& tree) { return tree.names("name").back(); }
-
-bool isOperation(const Tree& tree, StringView symbol) {
-    return tree.is("A_Expr") && tree.word("kind") == "AEXPR_OP" && operatorOf(tree) == symbol;
-}
-
-bool isConstant(const Tree& tree, const char* kind) {
-    return tree.is("A_Const") && tree.has(kind);
-}
-
-bool isFraction(const Tree& tree) { return isConstant(tree, "fval"); }
-
-bool isScale(const Tree& tree) {
-    return isFraction(tree) && sameName(tree.part("fval").text("fval"), u"1e0");
-}
-
-/// Whether the engine calculates with fractions here, whatever the columns hold.
-bool isReal(const Tree& tree) {
-    if (isFraction(tree) || isCastTo(tree, {u"float4", u"float8", u"double", u"real"})) return true;
-    for (const StringView symbol : {u"+", u"-", u"*", u"/"})
-        if (isOperation(tree, symbol))
-            return (tree.has("lexpr") && isReal(tree.node("lexpr"))) || isReal(tree.node("rexpr"));
-    return false;
-}
-
-bool isNotZero(const Tree& tree) {
-    if (isConstant(tree, "ival")) return tree.part("ival").number("ival") != 0;
-    if (!isFraction(tree)) return false;
-    const String digits = tree.part("fval").text("fval");
-    return digits.find_first_of(u"123456789") < digits.find_first_of(u"eE");
-}
-
-bool isConstant(const Node& node) {
-    return std::holds_alternative<model::sql::Value>(node->node) ||
-           std::holds_alternative<model::sql::Parameter>(node->node);
-}
-
-/// A condition with what it speaks about on the left, and for a value alone that it is true.
-Node asCondition(const Node& node) {
-    namespace sql = model::sql;
-    const bool joint = std::holds_alternative<sql::And>(node->node) ||
-                       std::holds_alternative<sql::Or>(node->node) ||
-                       std::holds_alternative<sql::Not>(node->node);
-    if (joint) {
-        auto parts = sql::partsOf(*node);
-        for (Node& part : parts) part = asCondition(part);
-        return sql::withParts(*node, std::move(parts));
+String quoted(const String& text) {
+    String out = u"'";
+    for (const char16_t c : text) {
+        out += c;
+        if (c == u'\'') out += c;
     }
-    if (const auto* compare = std::get_if<sql::Compare>(&node->node))
-        if (isConstant(compare->left) && !isConstant(compare->right))
-            return sql::make(sql::Compare{sql::mirrored(compare->comparison), compare->right,
-                                          compare->left});
-    if (sql::isCondition(*node)) return node;
-    return sql::make(sql::Compare{sql::Comparison::equal, node,
-                                  sql::make(sql::Value{ColumnType::Boolean, u"true"})});
-}
-
-/// SQLite compares moments as texts, so that one written otherwise is another.
-void checkMoments(const Node& node, const std::vector<String>& texts, std::size_t place) {
-    if (const auto* value = std::get_if<model::sql::Value>(&node->node)) {
-        const bool moment = value->type == ColumnType::Date || value->type == ColumnType::Time ||
-                            value->type == ColumnType::Timestamp;
-        if (moment && std::find(texts.begin(), texts.end(), value->text) == texts.end())
-            refuse<MessageCode::momentWritten>(place, value->text);
-    }
-    for (const Node& part : model::sql::partsOf(*node)) checkMoments(part, texts, place);
-}
-
-/// A pattern as expressions have it, of one whose `escape` makes the next sign an ordinary one.
-String typedPattern(StringView pattern, char16_t escape, bool brackets, std::size_t place) {
-    String out;
-    for (std::size_t i = 0; i < pattern.size(); ++i) {
-        char16_t c = pattern[i];
-        const bool itself = escape != 0 && c == escape && i + 1 < pattern.size();
-        if (itself) c = pattern[++i];
-        if (!itself && c == u'[' && brackets) refuse<MessageCode::unknownOperator>(place, u"LIKE [");
-        if (!itself && (c == u'%' || c == u'_'))
-            out += c == u'%' ? u'*' : u'?';
-        else if (StringView(u"*?%_[").find(c) != StringView::npos)
-            out += String(u"[") + c + u']';
-        else
-            out += c;
-    }
-    return out;
-}
-
-bool hasCase(StringView pattern) {
-    return std::any_of(pattern.begin(), pattern.end(), [](char16_t c) {
-        return (c >= u'a' && c <= u'z') || (c >= u'A' && c <= u'Z') || c > 0x7F;
-    });
-}
-
-/// A condition that holds in every row, as people write to have an AND before each of the others.
-bool holdsAlways(const Node& node) {
-    const auto* compare = std::get_if<model::sql::Compare>(&node->node);
-    return compare && compare->comparison == model::sql::Comparison::equal &&
-           std::holds_alternative<model::sql::Value>(compare->left->node) &&
-           model::sql::same(compare->left, compare->right);
+    return out + u'\'';
 }
 
 } // namespace
@@ -364,12 +266,7 @@ String ValueReader::constant(const Tree& tree) const {
     }
     if (tree.has("boolval")) return tree.part("boolval").flag("boolval") ? u"True" : u"False";
     if (tree.has("bsval")) return u"x'" + tree.part("bsval").text("bsval").substr(1) + u'\'';
-    String out = u"'";
-    for (const char16_t c : tree.part("sval").text("sval")) {
-        out += c;
-        if (c == u'\'') out += c;
-    }
-    return out + u'\'';
+    return quoted(tree.part("sval").text("sval"));
 }
 
 String ValueReader::column(const Tree& tree, Pass& pass) const {
@@ -570,14 +467,8 @@ String ValueReader::like(const Tree& tree, Pass& pass) const {
     if (isConstant(pattern, "sval")) {
         const String content = pattern.part("sval").text("sval");
         if (tellsCase && hasCase(content)) refuse<MessageCode::caseOfLike>(tree.place());
-        const String typed = typedPattern(content, escape, mDialect == Dialect::SqlServer,
-                                          pattern.place());
-        right = u'\'';
-        for (const char16_t c : typed) {
-            right += c;
-            if (c == u'\'') right += c;
-        }
-        right += u'\'';
+        right = quoted(model::criteria::typedPattern(
+            likePattern(content, escape, mDialect, pattern.place())));
     } else if (pattern.is("ParamRef") && !tellsCase) {
         right = parameter(pattern);
     } else {

@@ -1,0 +1,57 @@
+#include "model/sql_reader/Conditions.h"
+
+#include "model/sql_reader/Refused.h"
+
+#include <algorithm>
+
+namespace zandor::sql_reader {
+
+using model::ColumnType;
+using platform::String;
+
+namespace {
+
+bool isGiven(const Node& node) {
+    return std::holds_alternative<model::sql::Value>(node->node) ||
+           std::holds_alternative<model::sql::Parameter>(node->node);
+}
+
+} // namespace
+
+Node asCondition(const Node& node) {
+    namespace sql = model::sql;
+    const bool joint = std::holds_alternative<sql::And>(node->node) ||
+                       std::holds_alternative<sql::Or>(node->node) ||
+                       std::holds_alternative<sql::Not>(node->node);
+    if (joint) {
+        auto parts = sql::partsOf(*node);
+        for (Node& part : parts) part = asCondition(part);
+        return sql::withParts(*node, std::move(parts));
+    }
+    if (const auto* compare = std::get_if<sql::Compare>(&node->node))
+        if (isGiven(compare->left) && !isGiven(compare->right))
+            return sql::make(sql::Compare{sql::mirrored(compare->comparison), compare->right,
+                                          compare->left});
+    if (sql::isCondition(*node)) return node;
+    return sql::make(sql::Compare{sql::Comparison::equal, node,
+                                  sql::make(sql::Value{ColumnType::Boolean, u"true"})});
+}
+
+void checkMoments(const Node& node, const std::vector<String>& texts, std::size_t place) {
+    if (const auto* value = std::get_if<model::sql::Value>(&node->node)) {
+        const bool moment = value->type == ColumnType::Date || value->type == ColumnType::Time ||
+                            value->type == ColumnType::Timestamp;
+        if (moment && std::find(texts.begin(), texts.end(), value->text) == texts.end())
+            refuse<MessageCode::momentWritten>(place, value->text);
+    }
+    for (const Node& part : model::sql::partsOf(*node)) checkMoments(part, texts, place);
+}
+
+bool holdsAlways(const Node& node) {
+    const auto* compare = std::get_if<model::sql::Compare>(&node->node);
+    return compare && compare->comparison == model::sql::Comparison::equal &&
+           std::holds_alternative<model::sql::Value>(compare->left->node) &&
+           model::sql::same(compare->left, compare->right);
+}
+
+} // namespace zandor::sql_reader
