@@ -42,6 +42,9 @@ function(zandor_library name)
         if(given_LIBS)
             target_link_libraries(${target} INTERFACE "$<INSTALL_INTERFACE:${given_LIBS}>")
         endif()
+    elseif(UNIX AND NOT APPLE AND NOT CMAKE_CXX_FLAGS MATCHES sanitize)
+        # What another library does not hand out is missed here and not when a program starts.
+        target_link_options(${target} PRIVATE LINKER:-z,defs)
     endif()
 
     target_include_directories(${target}

@@ -209,12 +209,15 @@ TEST(TheHouses, KnowOnlyThoseTheyMay) {
 }
 
 TEST(TheHouses, ReachEachOtherByWhatIsHandedOut) {
-    // The designer is of this tree, and its pages and dialogs may use what is not promised.
+    // The designer is of this tree, and its pages and dialogs may use what is not promised. The
+    // reader of statements is a wing of the model's, built apart for the parser that it needs.
+    const std::set<std::pair<std::string, std::string>> wings = {{"sql_reader", "model"}};
     for (const std::string& file : filesBelowSrc()) {
         if (houseOf(file) == "designer") continue;
         for (const sources::Include& include : sources::includesOf("src/" + file)) {
             const std::string target = resolved(file, include);
             if (target.empty() || isHandedOut(include)) continue;
+            if (wings.contains({houseOf(file), houseOf(target)})) continue;
             EXPECT_EQ(houseOf(target), houseOf(file)) << file << " includes " << include.name;
         }
     }

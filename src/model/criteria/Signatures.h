@@ -30,7 +30,7 @@ struct Signature {
 
 /// Of the function with a name, letters without regard to case; nothing when there is none. `If` is
 /// none of them, for its arguments are not all values.
-const Signature* signatureOf(StringView name);
+ZANDOR_MODEL_EXPORT const Signature* signatureOf(StringView name);
 /// Of a function; nothing for one that has no name of its own.
 const Signature* signatureOf(sql::Function function);
 

@@ -2,6 +2,7 @@
 
 #include <Zandor/model/Description.h>
 #include <Zandor/model/Messages.h>
+#include <Zandor/model/export.h>
 
 #include <optional>
 #include <vector>
@@ -53,10 +54,10 @@ std::optional<Error> unusable(StringView text);
 bool isBlank(StringView text);
 
 /// Whether a name can be written without brackets.
-bool isBareName(StringView text);
+ZANDOR_MODEL_EXPORT bool isBareName(StringView text);
 
 /// A name in its brackets, a closing one within doubled.
-String inBrackets(StringView name);
+ZANDOR_MODEL_EXPORT String inBrackets(StringView name);
 
 /// Whether a word is this keyword; letters count without regard to case.
 bool isKeyword(const Token& token, StringView keyword);

@@ -9,7 +9,7 @@ namespace zandor::model::sql {
 /// braces by their number from 1: {1} as it is, {1:0} and {1:1} a whole number that is no less
 /// than that, {1:digits} a number written out, {1:moment} cast to a moment where nobody knows its
 /// type, {1:tight} beside an operator, {*} all of them with commas between.
-StringView templateOf(Function function, std::size_t arguments, Dialect dialect);
+ZANDOR_MODEL_EXPORT StringView templateOf(Function function, std::size_t arguments, Dialect dialect);
 
 /// As the language calls it, for messages.
 StringView nameOf(Function function);
