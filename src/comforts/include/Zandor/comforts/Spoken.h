@@ -18,12 +18,13 @@ namespace zandor::comforts {
 
 /// Those that are spoken of entries, which there may be many lists of.
 struct EntryWords {
-    EntryWords() : EntryWords(platform::Words()) {}
+    EntryWords() : EntryWords(platform::Words()) {} ///< in English
+    /// Of a control's words.
     explicit EntryWords(const platform::Words& words)
         : KeyColumn(words.KeyColumn), ComesOut(words.ComesOut) {}
 
-    platform::String KeyColumn;
-    platform::String ComesOut;
+    platform::String KeyColumn; ///< as Words::KeyColumn
+    platform::String ComesOut;  ///< as Words::ComesOut
 };
 
 /// Of an entry beside its text: "key column, comes out"; empty for one that is neither.
@@ -43,9 +44,9 @@ nameOfCell(const platform::Words& words, const CellText& text, std::int32_t row,
 
 /// An entry that a join line runs to: the keys of its table and its column, and "orders.id".
 struct JoinSide {
-    platform::String Table;
-    platform::String Column;
-    platform::String Field;
+    platform::String Table;  ///< the key of its table
+    platform::String Column; ///< the key of its column
+    platform::String Field;  ///< "orders.id"
 };
 
 /// A join: "Join orders.customer_id = customers.id, Left Outer". Sides, operator and type are the
