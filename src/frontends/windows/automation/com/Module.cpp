@@ -2,7 +2,9 @@
 
 #include "frontends/windows/automation/com/Failure.h"
 
+#include <array>
 #include <atomic>
+#include <mutex>
 
 namespace zandor::automation::module {
 
@@ -10,6 +12,11 @@ namespace {
 
 HINSTANCE loaded = nullptr;
 std::atomic<long> kept = 0;
+
+// Held as long as anything keeps the module: a system that drops a library with its last reference
+// may do so while another thread finds it.
+std::mutex guard;
+std::array<Held<ITypeLib>, 2> libraries;
 
 } // namespace
 
@@ -32,19 +39,26 @@ std::wstring path() {
 
 void retain() { ++kept; }
 
-void release() { --kept; }
+void release() {
+    if (--kept != 0) return;
+    const std::lock_guard lock(guard);
+    libraries = {};
+}
 
 bool isIdle() { return kept == 0; }
 
 Held<ITypeLib> typeLibrary(int number) {
+    const std::lock_guard lock(guard);
+    Held<ITypeLib>& known = libraries.at(static_cast<std::size_t>(number - 1));
+    if (known) return known;
     Held<ITypeLib> library;
     const std::wstring place = path() + L'\\' + std::to_wstring(number);
     require(LoadTypeLibEx(place.c_str(), REGKIND_NONE, library.slot()));
+    if (!isIdle()) known = library;
     return library;
 }
 
 Held<ITypeInfo> typeInfo(REFGUID id) {
-    // The system keeps a library that is loaded, so that this is a look-up.
     for (const int number : {1, 2}) {
         Held<ITypeInfo> info;
         if (SUCCEEDED(typeLibrary(number)->GetTypeInfoOfGuid(id, info.slot()))) return info;
