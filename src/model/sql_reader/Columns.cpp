@@ -34,8 +34,22 @@ void Columns::addItems() {
         else
             add(std::get<Node>(item.what), true, item.name);
     }
-    for (const Node& group : mSelected.statement.group)
-        if (!find(group, false)) add(group, false);
+    addGroups();
+}
+
+/// Rows are put together in the order of the grid: a group that does not come out stands before the
+/// next one that does.
+void Columns::addGroups() {
+    const auto& groups = mSelected.statement.group;
+    for (auto group = groups.begin(); group != groups.end(); ++group) {
+        if (!find(*group, false).empty()) continue;
+        add(*group, false);
+        for (auto behind = group + 1; behind != groups.end(); ++behind)
+            if (const auto known = find(*behind, false); !known.empty()) {
+                moveNewestBefore(*known.front());
+                break;
+            }
+    }
 }
 
 void Columns::addAllOf(const String& table) {
@@ -80,28 +94,53 @@ void Columns::fillValue(model::ColumnDefinition& definition, const Node& value) 
     definition.expression(*text);
 }
 
-Columns::Column* Columns::find(const Node& subject, bool apart) {
-    const auto at = std::find_if(mColumns.begin(), mColumns.end(), [&](const Column& column) {
+std::vector<Columns::Column*> Columns::find(const Node& subject, bool apart) {
+    std::vector<Column*> found;
+    for (Column& column : mColumns) {
         const bool chooses = column.definition->total() == model::Total::Condition;
-        return chooses == apart && sql::same(column.subject.node, subject);
-    });
-    return at == mColumns.end() ? nullptr : &*at;
+        if (chooses == apart && sql::same(column.subject.node, subject)) found.push_back(&column);
+    }
+    return found;
 }
 
-Columns::Column* Columns::knownFor(const Node& subject, bool apart) {
+std::vector<Columns::Column*> Columns::knownFor(const Node& subject, bool apart) {
     const bool total = std::holds_alternative<sql::Aggregate>(subject->node);
-    if (!mGrouped || total) return find(subject, false);
+    std::vector<Column*> known;
     // What rows are put together by can as well be asked before.
-    Column* grouped = apart ? nullptr : find(subject, false);
-    return grouped ? grouped : find(subject, true);
+    if (!mGrouped || total || !apart) known = find(subject, false);
+    if (known.empty() && mGrouped && !total) known = find(subject, true);
+    std::sort(known.begin(), known.end(), [&](const Column* one, const Column* other) {
+        return placeOf(*one) < placeOf(*other);
+    });
+    return known;
 }
 
 Columns::Column& Columns::forCondition(const Node& subject, bool apart) {
-    if (Column* known = knownFor(subject, apart)) return *known;
+    if (const auto known = knownFor(subject, apart); !known.empty()) return *known.front();
+    return addForCondition(subject);
+}
+
+Columns::Column& Columns::addForCondition(const Node& subject) {
     Column& made = add(subject, false);
     const bool total = std::holds_alternative<sql::Aggregate>(subject->node);
     if (mGrouped && !total) made.definition->total(model::Total::Condition);
     return made;
+}
+
+Columns::Column& Columns::ownForCondition(const Node& subject, const Column* behind) {
+    Column& made = addForCondition(subject);
+    mQuery.StandsBehind(made.definition, behind ? behind->definition : nullptr);
+    return made;
+}
+
+std::size_t Columns::placeOf(const Column& column) const {
+    std::size_t place = 0;
+    for (const auto& each :
+         platform::Each<TalvikZandorLib::ZDColumnDefinition>(mQuery.ColumnDefinitions())) {
+        if (each == column.definition) break;
+        ++place;
+    }
+    return place;
 }
 
 void Columns::moveNewestBefore(const Column& other) {
@@ -131,23 +170,28 @@ void Columns::dropOwnNames() {
 }
 
 void Columns::sort() {
-    std::vector<Ref<model::ColumnDefinition>> sorted;
+    std::vector<const Column*> sorted;
     for (const auto& item : mSelected.statement.order) {
         if (std::holds_alternative<sql::Value>(item.value->node)) continue;
-        Column* known = find(item.value, false);
-        Column& column = known ? *known : add(item.value, false);
-        if (column.definition->SortOrder() != 0) continue;
-        column.definition->SortOrder(item.descending ? 2 : 1);
-        sorted.push_back(column.definition);
+        auto known = find(item.value, false);
+        if (known.empty()) known = {&add(item.value, false)};
+        const auto free = std::find_if(known.begin(), known.end(), [](const Column* column) {
+            return column->definition->SortOrder() == 0;
+        });
+        // What sorted already leaves nothing to sort.
+        if (free == known.end()) continue;
+        (*free)->definition->SortOrder(item.descending ? 2 : 1);
+        sorted.push_back(*free);
     }
-    std::vector<Ref<model::ColumnDefinition>> inOrder;
-    for (const Column& column : mColumns)
-        if (column.definition->SortOrder() != 0) inOrder.push_back(column.definition);
-    if (inOrder == sorted) return;
+    const bool inOrder =
+        std::is_sorted(sorted.begin(), sorted.end(), [&](const Column* one, const Column* other) {
+            return placeOf(*one) < placeOf(*other);
+        });
+    if (inOrder) return;
     std::int16_t priority = 0;
-    for (const auto& definition : sorted) {
+    for (const Column* column : sorted) {
         if (priority == model::ColumnDefinition::greatestSortPriority) return;
-        definition->sortPriority(++priority);
+        column->definition->sortPriority(++priority);
     }
 }
 

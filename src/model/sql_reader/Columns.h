@@ -29,10 +29,14 @@ public:
     /// The column that a condition on rows as they are stands under, made where there is none; one
     /// that only chooses (`apart`) where rows are put together and it means those before.
     Column& forCondition(const Node& subject, bool apart);
-    /// The same, nothing where there is none yet.
-    Column* knownFor(const Node& subject, bool apart);
+    /// One of its own, behind another one or before all.
+    Column& ownForCondition(const Node& subject, const Column* behind);
+    /// All that it could stand under, as they follow each other in the grid.
+    std::vector<Column*> knownFor(const Node& subject, bool apart);
     /// Brings the newest column before another, so that conditions keep their order.
     void moveNewestBefore(const Column& other);
+    /// Counted from 0, with all columns of the grid.
+    std::size_t placeOf(const Column& column) const;
 
     /// Rows are put together.
     bool isGrouped() const { return mGrouped; }
@@ -42,13 +46,15 @@ private:
     void addAllOf(const String& table);
     void fill(model::ColumnDefinition& definition, const Node& subject);
     void fillValue(model::ColumnDefinition& definition, const Node& value);
-    Column* find(const Node& subject, bool apart);
+    std::vector<Column*> find(const Node& subject, bool apart);
+    void addGroups();
+    Column& addForCondition(const Node& subject);
 
     Query& mQuery;
     const Selected& mSelected;
     bool mGrouped = false;
     bool mTotals = false; ///< some column has one
-    std::deque<Column> mColumns; ///< in the order in which they were made
+    std::deque<Column> mColumns; ///< those with a value, in the order in which they were made
 };
 
 } // namespace zandor::sql_reader

@@ -20,8 +20,10 @@ namespace sql = model::sql;
 namespace {
 
 /// How conditions stand in the grid: each in one cell where they speak of one column alone; a row
-/// for each way in which they hold; all in the first row, in cells that name other columns too.
-enum class Layout { cells, rows, mixed };
+/// for each way in which they hold, maybe beside joins of tables with themselves, or in hidden
+/// columns where nothing else keeps their order; all in the first row, in cells that name other
+/// columns too.
+enum class Layout { cells, rows, loops, ordered, mixed };
 
 /// What a condition speaks about: the first value in it that is no constant.
 Node subjectOf(const Node& condition) {
@@ -52,12 +54,41 @@ bool isAbout(const Node& condition, const Node& subject) {
 /// Conditions of a row by what they speak about.
 using Cells = std::vector<std::pair<Node, std::vector<Node>>>;
 
+/// Conditions on one value that follow each other share a cell.
+Cells runsOf(const std::vector<Node>& terms) {
+    Cells cells;
+    for (const Node& term : terms) {
+        const Node subject = subjectOf(term);
+        if (cells.empty() || !sql::same(cells.back().first, subject)) cells.push_back({subject, {}});
+        cells.back().second.push_back(term);
+    }
+    return cells;
+}
+
+/// All conditions on one value share a cell.
+Cells cellsOf(const std::vector<Node>& terms) {
+    Cells cells;
+    for (const Node& term : terms) {
+        const Node subject = subjectOf(term);
+        const auto known = std::find_if(cells.begin(), cells.end(), [&](const auto& cell) {
+            return sql::same(cell.first, subject);
+        });
+        if (known == cells.end())
+            cells.push_back({subject, {term}});
+        else
+            known->second.push_back(term);
+    }
+    return cells;
+}
+
 class Drawing {
 public:
     Drawing(const Selected& selected, Layout layout) : mSelected(selected), mLayout(layout) {}
 
     Ref<Query> draw() {
-        const std::vector<Node> rest = drawSources(*mQuery, mSelected);
+        const std::vector<Node> rest = drawSources(
+            *mQuery, mSelected,
+            mLayout == Layout::loops || mLayout == Layout::ordered ? Loops::joins : Loops::criteria);
         Columns columns(*mQuery, mSelected);
         columns.addItems();
         columns.sort();
@@ -92,7 +123,7 @@ private:
         const std::vector<Node>& ways = behind.empty() ? before : behind;
         constexpr std::size_t mostRows = 12; // of the grid
         std::vector<std::vector<Node>> rows{ways};
-        if (mLayout == Layout::rows) {
+        if (mLayout != Layout::cells && mLayout != Layout::mixed) {
             auto all = waysOf(ways, mostRows, [](const Node& condition) {
                 return isAbout(condition, subjectOf(condition));
             });
@@ -111,37 +142,55 @@ private:
     }
 
     void addRow(Columns& columns, const std::vector<Node>& terms, std::int16_t row, bool apart) {
-        Cells cells;
-        for (const Node& term : terms) {
-            const Node subject = subjectOf(term);
-            const auto known = std::find_if(cells.begin(), cells.end(), [&](const auto& cell) {
-                return sql::same(cell.first, subject);
-            });
-            if (known == cells.end())
-                cells.push_back({subject, {term}});
-            else
-                known->second.push_back(term);
+        Cells cells = runsOf(terms);
+        auto places = placesInOrder(columns, cells, apart);
+        if (places.empty()) {
+            cells = cellsOf(terms);
+            for (std::size_t n = 0; n < cells.size(); ++n)
+                places.push_back(&columnFor(columns, cells, n, apart));
         }
         const model::criteria::QueryColumns names(mQuery->Tables());
+        const String key = platform::decimal(row);
         for (std::size_t n = 0; n < cells.size(); ++n) {
-            const auto& [subject, each] = cells[n];
-            const Columns::Column& column = columnFor(columns, cells, n, apart);
+            const Columns::Column& column = *places[n];
             const auto text =
-                model::criteria::written(sql::allOf(each), column.subject, names);
-            const String key = platform::decimal(row);
+                model::criteria::written(sql::allOf(cells[n].second), column.subject, names);
             if (!text || column.definition->HasCriterium(key)) refuseCondition();
             column.definition->AddCriterium(*text, key);
         }
     }
 
+    /// Columns for the cells from left to right, as a value that comes out twice allows it; none
+    /// where there are none.
+    std::vector<Columns::Column*> placesInOrder(Columns& columns, const Cells& cells,
+                                                bool apart) const {
+        std::vector<Columns::Column*> places;
+        for (const auto& cell : cells) {
+            const auto known = columns.knownFor(cell.first, apart);
+            const auto next = std::find_if(known.begin(), known.end(), [&](const auto* column) {
+                return places.empty() ||
+                       columns.placeOf(*places.back()) < columns.placeOf(*column);
+            });
+            if (next != known.end()) {
+                places.push_back(*next);
+                continue;
+            }
+            if (mLayout != Layout::ordered) return {};
+            const auto* behind = places.empty() ? nullptr : places.back();
+            places.push_back(&columns.ownForCondition(cell.first, behind));
+        }
+        return places;
+    }
+
     /// Made where there is none, before those of the conditions behind it.
     static Columns::Column& columnFor(Columns& columns, const Cells& cells, std::size_t n,
                                       bool apart) {
-        if (auto* known = columns.knownFor(cells[n].first, apart)) return *known;
+        if (const auto known = columns.knownFor(cells[n].first, apart); !known.empty())
+            return *known.front();
         Columns::Column& made = columns.forCondition(cells[n].first, apart);
         for (std::size_t behind = n + 1; behind < cells.size(); ++behind)
-            if (const auto* other = columns.knownFor(cells[behind].first, apart)) {
-                columns.moveNewestBefore(*other);
+            if (const auto other = columns.knownFor(cells[behind].first, apart); !other.empty()) {
+                columns.moveNewestBefore(*other.front());
                 break;
             }
         return made;
@@ -152,32 +201,49 @@ private:
     const Ref<Query> mQuery = platform::makeRef<Query>();
 };
 
-/// Why a query does not say what a statement does; nothing where it does.
-std::optional<model::Message> whyNot(Query& query, const sql::Statement& statement) {
-    const sql::Built built = sql::build(query);
+/// The statement that a query says. Throws Refused where it is another than the one that was read.
+sql::Statement saidBy(Query& query, const Selected& selected) {
+    sql::Built built = sql::build(query);
     for (const model::Finding& finding : built.findings)
         if (finding.isError())
-            return model::say<MessageCode::notUnderstood>(finding.message);
-    const auto other = difference(statement, *built.statement);
-    if (!other) return {};
-    return model::say<MessageCode::otherMeaning>(*other);
+            refuse<MessageCode::notUnderstood>(selected.place, finding.message);
+    if (const auto other = difference(selected.statement, *built.statement))
+        refuse<MessageCode::otherMeaning>(selected.place, *other);
+    return std::move(*built.statement);
+}
+
+/// Whether conditions stand in the same words and order, as a statement's writer leaves them.
+bool hasSameWords(const sql::Statement& one, const sql::Statement& other) {
+    const auto same = [](const Node& left, const Node& right) {
+        const Node first = sql::simplified(left);
+        const Node second = sql::simplified(right);
+        return first && second ? sql::same(first, second) : !first && !second;
+    };
+    return same(one.where, other.where) && same(one.having, other.having);
 }
 
 } // namespace
 
-Ref<Query> drawn(const Selected& selected) {
+Ref<Query> drawn(const Selected& selected, const std::function<bool(Query&)>& isWhole) {
     std::optional<Refused> first;
-    for (const Layout layout : {Layout::cells, Layout::rows, Layout::mixed}) {
+    Ref<Query> sound;
+    const auto isDone = [&](Layout layout) {
         try {
             const auto query = Drawing(selected, layout).draw();
-            const auto why = whyNot(*query, selected.statement);
-            if (!why) return query;
-            first = Refused{*why, selected.place};
+            const bool exact = hasSameWords(saidBy(*query, selected), selected.statement);
+            if (!sound || (exact && (layout != Layout::ordered || isWhole(*query)))) sound = query;
+            return exact;
         } catch (const Refused& refused) {
             if (!first) first = refused;
+            return false;
         }
-    }
-    throw Refused(*first);
+    };
+    for (const Layout layout : {Layout::cells, Layout::rows, Layout::loops})
+        if (isDone(layout)) return sound;
+    if (!sound) isDone(Layout::mixed);
+    if (!sound) throw Refused(*first);
+    if (isWhole) isDone(Layout::ordered);
+    return sound;
 }
 
 } // namespace zandor::sql_reader

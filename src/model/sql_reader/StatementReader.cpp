@@ -70,6 +70,13 @@ Selected StatementReader::select(const Tree& tree) {
                "withClause", "op"});
     const std::size_t known = mNamed.size();
     if (tree.has("withClause")) with(tree.part("withClause"));
+    Selected selected = selectNamed(tree);
+    mNamed.erase(mNamed.begin() + static_cast<std::ptrdiff_t>(known), mNamed.end());
+    return selected;
+}
+
+/// Where WITH has given its names.
+Selected StatementReader::selectNamed(const Tree& tree) {
     if (const auto inner = differsAround(tree)) {
         Selected selected = select(*inner);
         selected.statement.distinct = true;
@@ -104,7 +111,6 @@ Selected StatementReader::select(const Tree& tree) {
     order(tree, values, selected);
     limits(tree, selected);
     checkGroups(selected);
-    mNamed.erase(mNamed.begin() + static_cast<std::ptrdiff_t>(known), mNamed.end());
     return selected;
 }
 
@@ -147,6 +153,8 @@ std::optional<Tree> StatementReader::differsAround(const Tree& tree) const {
     const auto targets = tree.list("targetList");
     if (from.size() != 1 || targets.size() != 1 || !from.front().is("RangeSubselect")) return {};
     if (!isStar(targets.front().node("val"))) return {};
+    const bool named = from.front().has("alias") && from.front().part("alias").has("colnames");
+    if (named || from.front().has("lateral")) return {};
     const Tree inner = from.front().node("subquery");
     for (const char* part : {"distinctClause", "sortClause", "limitCount", "limitOffset"})
         if (inner.has(part)) return {};

@@ -27,6 +27,8 @@ private:
     };
     using Source = model::sql::SourceNode;
 
+    Selected selectNamed(const Tree& tree);
+
     // Sources.cpp
     Source source(const Tree& tree, Scope& scope, Selected& into);
     Source table(const Tree& tree, Scope& scope, Selected& into);

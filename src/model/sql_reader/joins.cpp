@@ -23,13 +23,14 @@ constexpr std::int16_t keepsBoth = 3;
 
 class Sources {
 public:
-    Sources(Query& query, const Selected& selected) : mQuery(query), mSelected(selected) {}
+    Sources(Query& query, const Selected& selected, Loops loops)
+        : mQuery(query), mSelected(selected), mLoops(loops) {}
 
     std::vector<Node> draw() {
         for (const auto& source : mSelected.statement.from) addTables(*source);
         for (const auto& source : mSelected.statement.from) addJoins(*source, true);
         for (const Node& term : termsOf(mSelected.statement.where))
-            if (!joinsIslands(term)) mRest.push_back(term);
+            if (!joinsIslands(term) && !joinsItself(term)) mRest.push_back(term);
         return std::move(mRest);
     }
 
@@ -143,8 +144,17 @@ private:
         return true;
     }
 
+    bool joinsItself(const Node& term) {
+        const auto columns = columnsOf(term);
+        if (mLoops != Loops::joins || !columns || columns->first.table != columns->second.table)
+            return false;
+        add(columns->first, columns->second, 0, std::get<sql::Compare>(term->node).comparison);
+        return true;
+    }
+
     Query& mQuery;
     const Selected& mSelected;
+    const Loops mLoops;
     std::map<String, String> mIslands; ///< tables that are joined lead to one of them
     std::set<std::pair<String, String>> mPairs; ///< of tables that conditions on rows join
     Aliases mWhole;                             ///< of which no row is filled with nothing
@@ -153,8 +163,8 @@ private:
 
 } // namespace
 
-std::vector<Node> drawSources(Query& query, const Selected& selected) {
-    return Sources(query, selected).draw();
+std::vector<Node> drawSources(Query& query, const Selected& selected, Loops loops) {
+    return Sources(query, selected, loops).draw();
 }
 
 } // namespace zandor::sql_reader

@@ -52,6 +52,12 @@ void fillNegative(nlohmann::json& node, const std::string& text) {
     std::int64_t value = 0;
     for (; at < text.size() && text[at] >= '0' && text[at] <= '9'; ++at)
         value = value * 10 + (text[at] - '0');
+    // A zero keeps its sign, as the text has it.
+    if (value == 0 && negative) {
+        node.erase("ival");
+        node["fval"] = {{"fval", "-0"}};
+        return;
+    }
     number["ival"] = negative ? -value : value;
 }
 

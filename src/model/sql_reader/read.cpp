@@ -4,6 +4,7 @@
 #include "model/sql_reader/parse.h"
 
 #include <Zandor/model/Names.h>
+#include <Zandor/sql/Builder.h>
 
 #include <algorithm>
 #include <array>
@@ -39,7 +40,16 @@ bool isOtherStatement(StringView text) {
     return std::find(words.begin(), words.end(), first) != words.end();
 }
 
-Ref<model::Query> readParsed(const ParserText& text, Dialect dialect, const Schema& schema) {
+/// Without what stands around it.
+StringView trimmed(StringView text) {
+    constexpr StringView around = u" \t\r\n;";
+    const std::size_t begin = text.find_first_not_of(around);
+    if (begin == StringView::npos) return {};
+    return text.substr(begin, text.find_last_not_of(around) + 1 - begin);
+}
+
+Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect dialect,
+                             const Schema& schema) {
     const nlohmann::json parsed = parse(text.text);
     const Tree tree = Tree::ofParts(parsed);
     const auto statements = tree.list("stmts");
@@ -48,7 +58,11 @@ Ref<model::Query> readParsed(const ParserText& text, Dialect dialect, const Sche
         refuse<MessageCode::oneStatement>(
             static_cast<std::size_t>(parsed["stmts"][1].value("stmt_location", 0)));
     const Tree statement = Tree(parsed["stmts"][0]["stmt"]);
-    return drawn(StatementReader(schema, text, dialect).select(statement));
+    const auto isWhole = [&](model::Query& query) {
+        using model::sql::ValueForm;
+        return model::sql::statementText(query, dialect, ValueForm::literal).text == trimmed(typed);
+    };
+    return drawn(StatementReader(schema, text, dialect).select(statement), isWhole);
 }
 
 } // namespace
@@ -65,7 +79,7 @@ Drawn read(StringView text, Dialect dialect, const Schema& schema) {
     if (isOtherStatement(platform::fromUtf8(std::string_view(lexedText.text))))
         return refusalAt(text, model::say<MessageCode::selectOnly>(), lexedText.origin(0));
     try {
-        return readParsed(lexedText, dialect, schema);
+        return readParsed(text, lexedText, dialect, schema);
     } catch (const Refused& refused) {
         const bool behind = refused.place >= lexedText.text.size();
         return refusalAt(text, refused.message,

@@ -142,7 +142,7 @@ TEST(ReadBack, OfTheCorpusIsTheSameText) {
         reading.report();
         EXPECT_GT(reading.tried(), 420);
         EXPECT_LE(reading.refused(), 2);
-        EXPECT_LE(reading.writtenOtherwise(), 8);
+        EXPECT_LE(reading.writtenOtherwise(), 4);
     }
 }
 
@@ -160,6 +160,7 @@ TEST(ReadBack, OfRandomQueriesIsTheSameText) {
         }
         reading.report();
         EXPECT_GT(reading.tried(), static_cast<int>(howMany));
-        EXPECT_LT(reading.writtenOtherwise(), reading.tried() / 8);
+        // Without a column that comes out, or with outer joins that contradict each other.
+        EXPECT_LT(reading.writtenOtherwise(), reading.tried() / 40);
     }
 }

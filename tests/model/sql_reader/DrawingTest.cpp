@@ -135,3 +135,56 @@ TEST_F(Statement, OfSmallLettersMeansThoseAloneInPostgres) {
     EXPECT_EQ(refusal(u"SELECT \"Name\" FROM customers", Dialect::PostgreSQL),
               "Line 1, column 8: no table has a column \"Name\"; is \"name\" meant?");
 }
+
+TEST_F(Statement, PutsRowsTogetherInItsOwnOrder) {
+    read(u"SELECT city, COUNT(*) AS n FROM customers GROUP BY active, city");
+    EXPECT_EQ(columns(), (Texts{"(customers.active)", "customers.city", "count(*) as n"}));
+    EXPECT_NE(text().find("GROUP BY customers.active, customers.city"), std::string::npos);
+}
+
+TEST_F(Statement, SortsAColumnThatStandsTwiceTwice) {
+    read(u"SELECT name, name AS again FROM customers ORDER BY name, name DESC, name");
+    EXPECT_NE(text().find("ORDER BY customers.name, customers.name DESC"), std::string::npos);
+    EXPECT_EQ(columns().size(), 2u);
+}
+
+TEST_F(Statement, KeepsTheOrderOfConditionsWhereAColumnStandsTwice) {
+    read(u"SELECT name, city, name AS again FROM customers WHERE city > 'b' AND name > 'a'");
+    EXPECT_TRUE(criteria(1).empty());
+    EXPECT_EQ(criteria(2), (Texts{"4: > b"}));
+    EXPECT_EQ(criteria(3), (Texts{"4: > a"}));
+}
+
+TEST_F(Statement, OfAnyWriterHasNoColumnsForTheOrderOfItsConditions) {
+    read(u"SELECT name, city FROM customers WHERE city > 'b' AND name > 'a'");
+    EXPECT_EQ(columns(), (Texts{"customers.name", "customers.city"}));
+}
+
+TEST_F(Statement, ThatADrawingSaidIsWrittenTheSame) {
+    const std::u16string written = u"SELECT\n    customers.name,\n    customers.city\n"
+                                   u"FROM customers\nWHERE customers.city > 'b'\n"
+                                   u"    AND customers.name > 'a'";
+    read(written + u";\n");
+    EXPECT_EQ(text(), zandor::platform::toUtf8(written));
+    EXPECT_EQ(columns(), (Texts{"customers.name", "customers.city", "(customers.name)"}));
+}
+
+TEST_F(Statement, JoinsATableWithItselfWhereThatLeavesItsConditionsAsTheyAre) {
+    const std::u16string where = u"id < customer_id AND ((total > 5 AND id = 1) OR placed IS NULL)";
+    read(u"SELECT total FROM orders WHERE " + where);
+    EXPECT_EQ(record.joins.size(), 1u);
+    EXPECT_NE(text().find("WHERE orders.id < orders.customer_id\n"), std::string::npos) << text();
+    read(u"SELECT total FROM orders WHERE id < customer_id");
+    EXPECT_TRUE(record.joins.empty()) << "a cell says it as well";
+}
+
+TEST_F(Statement, KnowsANameOfWithOnlyWhereItStands) {
+    EXPECT_EQ(refusal(u"SELECT a.city FROM w, (WITH w AS (SELECT city FROM customers) "
+                      u"SELECT DISTINCT * FROM (SELECT city FROM w) AS q) AS a, w",
+                      Dialect::MySQL),
+              "Line 1, column 20: the database has no table \"w\".");
+    EXPECT_EQ(refusal(u"SELECT a.city FROM (WITH w AS (SELECT city FROM customers) "
+                      u"SELECT DISTINCT * FROM (SELECT city FROM w) AS q) AS a, w",
+                      Dialect::MySQL),
+              "Line 1, column 116: the database has no table \"w\".");
+}
