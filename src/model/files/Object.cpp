@@ -1,5 +1,7 @@
 #include "model/files/Object.h"
 
+#include "model/files/limits.h"
+
 #include <algorithm>
 #include <charconv>
 
@@ -29,6 +31,15 @@ platform::String Object::text(std::string_view name, std::optional<platform::Str
         as<std::string, MessageCode::notAText>(std::move(*value), mPlace / name));
 }
 
+platform::String Object::pieces(std::string_view name) {
+    json::Items items = list(name, limits::values);
+    platform::String text;
+    for (std::size_t n = 0; n < items.size(); ++n)
+        text += platform::fromUtf8(
+            as<std::string, MessageCode::notAText>(std::move(items[n]), mPlace / name / n));
+    return text;
+}
+
 platform::String Object::textOrNull(std::string_view name) {
     auto value = take(name);
     if (!value || std::holds_alternative<json::Null>(value->content)) return {};
@@ -42,9 +53,10 @@ bool Object::flag(std::string_view name, bool missing) {
                  : missing;
 }
 
-std::int16_t Object::word(std::string_view name, Words words, std::int16_t missing) {
+std::int16_t Object::word(std::string_view name, Words words, std::optional<std::int16_t> missing) {
     auto value = take(name);
-    if (!value) return missing;
+    if (!value && missing) return *missing;
+    if (!value) refuse<MessageCode::isMissing>(mPlace / name);
     const Pointer place = mPlace / name;
     return codeOf(as<std::string, MessageCode::notAText>(std::move(*value), place), words, place);
 }

@@ -23,7 +23,9 @@ public:
     Object(json::Value value, Pointer place);
 
     platform::String text(std::string_view name, std::optional<platform::String> missing = {});
-    /// The same, and null for an empty text.
+    /// A text that is a list of texts, one behind the other.
+    platform::String pieces(std::string_view name);
+    /// A text, and null for an empty one.
     platform::String textOrNull(std::string_view name);
     bool flag(std::string_view name, bool missing);
     template <class Integer>
@@ -31,7 +33,7 @@ public:
         return static_cast<Integer>(whole(name, missing, std::numeric_limits<Integer>::min(),
                                           std::numeric_limits<Integer>::max()));
     }
-    std::int16_t word(std::string_view name, Words words, std::int16_t missing);
+    std::int16_t word(std::string_view name, Words words, std::optional<std::int16_t> missing = {});
     Object object(std::string_view name);
     /// No member, for an object that has none of that name.
     Object objectOrNone(std::string_view name);

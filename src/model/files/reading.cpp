@@ -22,9 +22,11 @@ public:
 
     model::QueryRecord record = {};
     String database = {};
+    std::optional<TypedStatement> typed = {};
     Unknown unknown = {};
 
 private:
+    TypedStatement typedStatement(Object object);
     model::QueryRecord query(Object& object);
     model::SavedQueryRef savedQuery(Object& source, const std::string& owner);
     model::TableRecord table(Object object);
@@ -51,8 +53,17 @@ private:
 void Reader::read(json::Value file) {
     Object object(std::move(file), {});
     database = object.text("database", String());
+    if (object.has("typed")) typed = typedStatement(object.object("typed"));
     record = query(object);
     keep(std::move(object), "");
+}
+
+TypedStatement Reader::typedStatement(Object object) {
+    TypedStatement typed;
+    typed.dialect = static_cast<model::sql::Dialect>(object.word("dialect", words::dialects));
+    typed.text = object.pieces("text");
+    keep(std::move(object), "typed");
+    return typed;
 }
 
 model::QueryRecord Reader::query(Object& object) {
@@ -225,6 +236,7 @@ Result<QueryDocument> fromJson(std::string_view text) {
         if (const auto fault = model::faultOf(reader.record)) throw Refusal{fault->message};
         QueryDocument document(model::Query::restored(reader.record));
         document.database = std::move(reader.database);
+        document.typed = std::move(reader.typed);
         if (!reader.unknown.membersOf.empty())
             document.unknown = std::make_shared<const Unknown>(std::move(reader.unknown));
         return document;

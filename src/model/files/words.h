@@ -9,6 +9,10 @@ namespace zandor::files::words {
 
 inline constexpr std::string_view format = "zandor-query";
 
+/// model::sql::Dialect
+inline constexpr std::array<std::string_view, 5> dialects = {"sqlite", "postgresql", "mysql",
+                                                             "sqlserver", "standard"};
+
 /// model::ColumnType
 inline constexpr std::array<std::string_view, 9> columnTypes = {
     "unknown", "text", "integer", "decimal", "date", "time", "timestamp", "boolean", "blob"};

@@ -9,6 +9,7 @@ namespace zandor::files {
 namespace {
 
 using platform::String;
+using platform::StringView;
 
 /// A text of the query for the file.
 json::Value textOf(const String& text, const Pointer& place) {
@@ -28,14 +29,25 @@ std::string word(Words words, std::int16_t code) {
     return std::string(words[static_cast<std::size_t>(code)]);
 }
 
+/// Where a line of a text ends that may be longer than one text of a file.
+std::size_t endOfPiece(StringView text) {
+    const std::size_t end = text.substr(0, limits::textLength).find(u'\n');
+    if (end != StringView::npos) return end + 1;
+    if (text.size() <= limits::textLength) return text.size();
+    const char16_t last = text[limits::textLength - 1];
+    const bool isHalf = last >= 0xD800 && last < 0xDC00; // its other half comes next
+    return limits::textLength - (isHalf ? 1 : 0);
+}
+
 /// Makes the file's content of a record, each object followed by what its version did not know.
 class Writer {
 public:
     explicit Writer(const Unknown* unknown) : mUnknown(unknown) {}
 
-    json::Value file(const model::QueryRecord& record, const String& database);
+    json::Value file(const model::QueryRecord& record, const QueryDocument& document);
 
 private:
+    json::Value typed(const TypedStatement& typed) const;
     void add(json::Members& members, const model::QueryRecord& record, const Pointer& place);
     json::Value source(const model::TableRecord& table, const Pointer& place);
     json::Value table(const model::TableRecord& table, const Pointer& place);
@@ -58,13 +70,27 @@ private:
     std::string mWithin; ///< as the reader's
 };
 
-json::Value Writer::file(const model::QueryRecord& record, const String& database) {
+json::Value Writer::file(const model::QueryRecord& record, const QueryDocument& document) {
     json::Members members = {{"format", {std::string(words::format)}},
                              {"version", json::number(currentVersion)}};
-    if (!database.empty())
-        members.push_back({"database", textOf(database, Pointer() / "database")});
+    if (!document.database.empty())
+        members.push_back({"database", textOf(document.database, Pointer() / "database")});
+    if (document.typed) members.push_back({"typed", typed(*document.typed)});
     add(members, record, {});
     return whole(std::move(members), "");
+}
+
+json::Value Writer::typed(const TypedStatement& typed) const {
+    const Pointer place = Pointer() / "typed" / "text";
+    json::Items pieces;
+    for (StringView rest = typed.text; !rest.empty();) {
+        const StringView piece = rest.substr(0, endOfPiece(rest));
+        pieces.push_back(textOf(String(piece), place / pieces.size()));
+        rest.remove_prefix(piece.size());
+    }
+    return whole({{"dialect", {word(words::dialects, static_cast<std::int16_t>(typed.dialect))}},
+                  {"text", {std::move(pieces)}}},
+                 "typed");
 }
 
 void Writer::add(json::Members& members, const model::QueryRecord& record, const Pointer& place) {
@@ -212,14 +238,15 @@ Result<std::string> toJson(const QueryDocument& document) {
     const model::QueryRecord record = document.query->record();
     std::string text;
     try {
-        text = json::print(Writer(document.unknown.get()).file(record, document.database));
+        text = json::print(Writer(document.unknown.get()).file(record, document));
     } catch (const Refusal& refusal) {
         return refusal.error();
     }
     // Better no file than one that cannot be read, whatever the reason.
     const auto again = fromJson(text);
     if (!again) return Error{model::say<MessageCode::notReadAgain>(again.failure().message)};
-    if (again->query->record() != record || again->database != document.database)
+    if (again->query->record() != record || again->database != document.database ||
+        again->typed != document.typed)
         return Error{model::say<MessageCode::notTheSameAgain>()};
     return text;
 }

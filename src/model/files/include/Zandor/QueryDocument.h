@@ -3,6 +3,7 @@
 #include <Zandor/Query.h>
 #include <Zandor/files/Error.h>
 #include <Zandor/files/export.h>
+#include <Zandor/sql/Dialect.h>
 
 #include <memory>
 #include <optional>
@@ -14,6 +15,14 @@ namespace zandor::files {
 
 /// What a file has beyond what this version knows.
 struct Unknown;
+
+/// A statement that somebody has typed for a query, and that the query does not say (yet).
+struct TypedStatement {
+    platform::String text = {};
+    model::sql::Dialect dialect = model::sql::Dialect::SQLite; ///< that it is typed in
+
+    bool operator==(const TypedStatement&) const = default;
+};
 
 /// A query as a file holds it. A document made from a query alone has nothing beyond it. What the
 /// file said beyond this version's knowledge belongs to the object it stood at, by that object's
@@ -28,6 +37,8 @@ struct ZANDOR_FILES_EXPORT QueryDocument {
     /// Address of the database that the query asks, for the program that opens the file; empty:
     /// none is known. Written as it stands, so it must not have a password in it.
     platform::String database = {};
+    /// Nothing: the query itself is all that there is.
+    std::optional<TypedStatement> typed = {};
     /// What the file has beyond this version's knowledge; nothing: no more.
     std::shared_ptr<const Unknown> unknown = {};
 };
