@@ -280,7 +280,10 @@ private:
             if (value->type == ColumnType::Blob) forms.clear();
         }
         try {
-            forms.push_back(mWriter.text(node, Hold::joined));
+            const String text = mWriter.text(node, Hold::joined);
+            forms.push_back(text);
+            // A sign begins a number in a cell.
+            if (text.starts_with(u'-')) forms.push_back(u'(' + text + u')');
         } catch (const Wordless&) {
             // A total cannot be named at all.
         }

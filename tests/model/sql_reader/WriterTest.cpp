@@ -103,3 +103,16 @@ TEST_F(Writing, IsShortInTheCellOfItsColumn) {
     EXPECT_EQ(criterion(u"n", u"Length([t].[text]) < 12 And 5"), "Length(t.text) < 12 And 5");
     EXPECT_EQ(criterion(u"odd ]name", u"'5'"), "'5'") << "a bare one would be a number";
 }
+
+TEST_F(Writing, HasParenthesesAroundWhatWouldBeTakenForANumberBelowZero) {
+    const model::criteria::QueryColumns columns(query->Tables());
+    const auto value = [&](platform::StringView typed) {
+        return model::criteria::readExpression(typed, columns).value;
+    };
+    const model::criteria::Subject subject(value(u"-t.n"), u"below");
+    const auto condition = model::sql::make(model::sql::Compare{
+        model::sql::Comparison::greater, value(u"-t.n"), value(u"-Length(t.text)")});
+    const auto written = model::criteria::written(condition, subject, columns);
+    ASSERT_TRUE(written);
+    EXPECT_EQ(platform::toUtf8(*written), "> (-Length(t.text))");
+}
