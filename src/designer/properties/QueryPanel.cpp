@@ -71,8 +71,9 @@ void QueryPanel::follow() {
 }
 
 void QueryPanel::takeOver() {
-    model::QueryOptions options{mDistinct->isChecked(), mFirst->value(),
-                                mDocument.query()->options().description};
+    model::QueryOptions options = mDocument.query()->options();
+    options.distinct = mDistinct->isChecked();
+    options.first = mFirst->value();
     if (mDescription->document()->isModified())
         options.description = fromQt(mDescription->toPlainText());
     mDescription->document()->setModified(false);

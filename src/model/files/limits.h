@@ -15,5 +15,6 @@ inline constexpr std::size_t columnsOfTable = 5'000;
 inline constexpr std::size_t columns = 100'000; ///< of all tables
 inline constexpr std::size_t joins = 10'000;
 inline constexpr std::size_t definitions = 10'000;
+inline constexpr std::size_t comments = 10'000;
 
 } // namespace zandor::files::limits

@@ -35,6 +35,7 @@ private:
     model::EndRecord end(Object object, const std::string& owner);
     model::DefinitionRecord definition(Object object);
     static std::vector<model::NameRecord> names(Object& owner);
+    static std::vector<model::Comment> comments(Object& owner);
 
     static void each(json::Items items, const Pointer& list,
                      const std::function<void(Object)>& use) {
@@ -74,6 +75,7 @@ model::QueryRecord Reader::query(Object& object) {
     query.options.distinct = object.flag("distinct", false);
     query.options.first = object.integer<std::int32_t>("first", 0);
     query.options.description = object.text("description", String());
+    query.options.comments = comments(object);
     Object last = object.object("lastKeys");
     query.lastKeys = {last.integer<std::int32_t>("table"), last.integer<std::int32_t>("column"),
                       last.integer<std::int32_t>("join"), last.integer<std::int32_t>("definition")};
@@ -174,6 +176,22 @@ std::vector<model::NameRecord> Reader::names(Object& owner) {
         names.push_back(std::move(name));
     });
     return names;
+}
+
+std::vector<model::Comment> Reader::comments(Object& owner) {
+    std::vector<model::Comment> comments;
+    each(owner.listOrNone("comments", limits::comments), owner.place() / "comments",
+         [&](Object each) {
+             model::Comment comment;
+             comment.place =
+                 static_cast<model::CommentPlace>(each.word("by", words::commentPlaces));
+             comment.key = each.text("key", String());
+             comment.row = each.integer<std::int16_t>("row", std::int16_t{0});
+             comment.beside = each.flag("beside", false);
+             comment.text = each.text("text");
+             comments.push_back(std::move(comment));
+         });
+    return comments;
 }
 
 model::DefinitionRecord Reader::definition(Object object) {

@@ -25,6 +25,10 @@ inline constexpr std::array<std::string_view, 9> totals = {
     "none",    "group",    "count",   "count different", "sum",
     "average", "smallest", "largest", "condition"};
 
+/// model::CommentPlace
+inline constexpr std::array<std::string_view, 7> commentPlaces = {
+    "start", "table", "column", "criterion", "groups", "order", "end"};
+
 /// model::Format
 inline constexpr std::array<std::string_view, 11> formats = {
     "none",          "number",   "thousands",  "percent", "short date", "long date",

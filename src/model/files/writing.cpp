@@ -56,6 +56,7 @@ private:
     json::Value end(const model::EndRecord& end, const std::string& owner) const;
     json::Value definition(const model::DefinitionRecord& definition, const Pointer& place) const;
     static json::Value names(const std::vector<model::NameRecord>& names);
+    static json::Value comments(const std::vector<model::Comment>& comments, const Pointer& place);
 
     json::Value whole(json::Members members, const std::string& owner) const {
         if (mUnknown) {
@@ -105,6 +106,8 @@ void Writer::add(json::Members& members, const model::QueryRecord& record, const
     if (options.first != 0) members.push_back({"first", json::number(options.first)});
     if (!options.description.empty())
         members.push_back({"description", textOf(options.description, place / "description")});
+    if (!options.comments.empty())
+        members.push_back({"comments", comments(options.comments, place / "comments")});
     json::Items tables;
     for (const auto& each : record.tables)
         tables.push_back(table(each, place / "tables" / tables.size()));
@@ -192,6 +195,21 @@ json::Value Writer::names(const std::vector<model::NameRecord>& names) {
             members.push_back({"table", {platform::toUtf8(name.table)}});
             members.push_back({"column", {platform::toUtf8(name.column)}});
         }
+        items.push_back({std::move(members)});
+    }
+    return {std::move(items)};
+}
+
+json::Value Writer::comments(const std::vector<model::Comment>& comments, const Pointer& place) {
+    json::Items items;
+    for (const auto& comment : comments) {
+        json::Members members = {
+            {"by", {word(words::commentPlaces, static_cast<std::int16_t>(comment.place))}}};
+        const Pointer own = place / items.size();
+        if (!comment.key.empty()) members.push_back({"key", textOf(comment.key, own / "key")});
+        if (comment.row != 0) members.push_back({"row", json::number(comment.row)});
+        if (comment.beside) members.push_back({"beside", {true}});
+        members.push_back({"text", textOf(comment.text, own / "text")});
         items.push_back({std::move(members)});
     }
     return {std::move(items)};

@@ -42,6 +42,7 @@ public:
         mStatement.where = simplified(mStatement.where);
         mStatement.having = simplified(mStatement.having);
         takeOptions();
+        takeComments();
         mBuilt.statement = std::move(mStatement);
         return std::move(mBuilt);
     }
@@ -117,6 +118,7 @@ private:
         String name = definition.Synonym();
         const auto* column = std::get_if<ColumnRef>(&subject.node->node);
         if (name.empty() && !column) name = nameOf(subject);
+        mItems.emplace(definition.Key(), mStatement.items.size());
         mNames.emplace_back(&definition, name.empty() ? column->column : name);
         mStatement.items.push_back({subject.node, std::move(name)});
     }
@@ -169,7 +171,10 @@ private:
             report(Finding::Kind::badTotal, definition, say<MessageCode::totalOfAllColumns>(table));
             return;
         }
-        if (definition.Visible()) mStatement.items.push_back({AllColumns{table}, {}});
+        if (definition.Visible()) {
+            mItems.emplace(definition.Key(), mStatement.items.size());
+            mStatement.items.push_back({AllColumns{table}, {}});
+        }
         if (definition.SortOrder() != 0)
             report(Finding::Kind::sortOnAllColumns, definition,
                    say<MessageCode::sortOnAllColumns>(table));
@@ -204,7 +209,45 @@ private:
         auto& place = aggregates(total)                       ? terms.ofTotals
                       : mGrouped && total == Total::Condition ? terms.ofConditions
                                                               : terms.ofGroups;
+        mConditions.emplace(std::pair(definition.Key(), row), reading.condition);
         place.push_back({std::move(reading.condition), &definition, row});
+    }
+
+    /// What a comment stands by is left out where it does not show.
+    void takeComments() {
+        for (const Comment& comment : mQuery.options().comments)
+            if (auto by = standingBy(comment))
+                mStatement.remarks.push_back({*std::move(by), comment.beside, comment.text});
+    }
+
+    std::optional<decltype(Remark::by)> standingBy(const Comment& comment) const {
+        switch (comment.place) {
+        case CommentPlace::table:
+            for (const auto& table : platform::Each<TalvikZandorLib::ZDTable>(mQuery.Tables()))
+                if (static_cast<const Table&>(*table).Key() == comment.key) return table->Name();
+            return {};
+        case CommentPlace::column: return ofColumn(comment.key);
+        case CommentPlace::criterion: {
+            const auto condition = mConditions.find({comment.key, comment.row});
+            if (condition == mConditions.end()) return {};
+            return condition->second;
+        }
+        default: return comment.place;
+        }
+    }
+
+    /// One that does not come out shows by what else it does.
+    std::optional<decltype(Remark::by)> ofColumn(const String& key) const {
+        if (const auto item = mItems.find(key); item != mItems.end()) return item->second;
+        for (const auto& definition : each()) {
+            if (definition->Key() != key) continue;
+            if (definition->SortOrder() != 0) return CommentPlace::order;
+            const auto condition = mConditions.lower_bound({key, 0});
+            if (condition != mConditions.end() && condition->first.first == key)
+                return condition->second;
+            return CommentPlace::groups;
+        }
+        return {};
     }
 
     void selectEverything() {
@@ -235,6 +278,8 @@ private:
     std::vector<std::pair<const ColumnDefinition*, String>> mNames;
     std::map<std::int16_t, RowTerms> mRows;
     std::map<int, std::vector<OrderItem>> mOrder; ///< by priority
+    std::map<String, std::size_t> mItems; ///< of definitions, by key
+    std::map<std::pair<String, std::int16_t>, Node> mConditions; ///< by definition and row
     std::vector<Node> mTotals;
     bool mGrouped = false; ///< rows are put together
 };

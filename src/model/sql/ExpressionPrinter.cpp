@@ -122,33 +122,23 @@ void ExpressionPrinter::value(const Expression& expression, Tightness around) {
     mOut.text += u") THEN 0 END";
 }
 
-void ExpressionPrinter::terms(const Expression& expression, StringView lineBreak,
-                              Tightness around) {
-    if (const auto* all = std::get_if<And>(&expression.node))
-        joined(all->terms, u"AND ", lineBreak, Tightness::conjunction);
-    else if (const auto* any = std::get_if<Or>(&expression.node))
-        joined(any->terms, u"OR ", lineBreak, Tightness::predicate);
-    else
-        condition(expression, around);
-}
-
-void ExpressionPrinter::joined(const std::vector<Node>& parts, StringView word,
-                               StringView lineBreak, Tightness inner) {
-    bool first = true;
-    for (const auto& part : parts) {
-        if (!first) {
-            mOut.text += lineBreak;
-            mOut.text += word;
-        }
-        first = false;
-        condition(*part, inner);
-    }
+TermLines termLinesOf(const Node& condition) {
+    if (const auto* all = std::get_if<And>(&condition->node))
+        return {all->terms, u"AND ", Tightness::conjunction};
+    if (const auto* any = std::get_if<Or>(&condition->node))
+        return {any->terms, u"OR ", Tightness::predicate};
+    return {{condition}, {}, Tightness::disjunction};
 }
 
 void ExpressionPrinter::parenthesised(const std::vector<Node>& parts, StringView word,
                                       Tightness inner, bool parentheses) {
     if (parentheses) mOut.text += u'(';
-    joined(parts, word, u" ", inner);
+    bool first = true;
+    for (const auto& part : parts) {
+        if (!first) mOut.text += u' ' + String(word);
+        first = false;
+        condition(*part, inner);
+    }
     if (parentheses) mOut.text += u')';
 }
 

@@ -17,11 +17,20 @@ struct Output {
     ShellNames names{}; ///< where the form is that of the engine's shell
     String text{};
     std::vector<Binding> bindings{};
+    std::size_t commentEnd = 0; ///< of the newest comment; 0: none
 
     /// A name in the dialect's quotes. Throws a Refusal where it cannot carry it.
     void name(StringView name);
     void column(const ColumnRef& column);
 };
+
+/// A condition in pieces for a line each.
+struct TermLines {
+    std::vector<Node> terms; ///< those of an And or Or, else the condition itself
+    StringView word;         ///< before each but the first
+    Tightness around;        ///< each of them
+};
+TermLines termLinesOf(const Node& condition);
 
 /// Writes conditions and values.
 class ExpressionPrinter {
@@ -41,12 +50,8 @@ public:
     void item(const Expression& expression);
     void condition(const Expression& expression, Tightness around);
     void value(const Expression& expression, Tightness around);
-    /// The terms of a top-level And or Or, a line each; anything else on one line.
-    void terms(const Expression& expression, StringView lineBreak, Tightness around);
 
 private:
-    void joined(const std::vector<Node>& parts, StringView word, StringView lineBreak,
-                Tightness inner);
     void parenthesised(const std::vector<Node>& parts, StringView word, Tightness inner,
                        bool parentheses);
     void any(const Expression& expression, Tightness around);

@@ -1,10 +1,12 @@
 #include <Zandor/sql/Printer.h>
 
 #include "model/sql/ExpressionPrinter.h"
+#include "model/sql/Remarks.h"
 
 #include <Zandor/model/Names.h>
 
 #include <algorithm>
+#include <map>
 #include <set>
 #include <unordered_map>
 
@@ -81,10 +83,21 @@ class Printer {
 public:
     /// Writes behind what is there, each line after `indent`, within so many statements; `shared`
     /// have names already.
-    Printer(Output& out, const SharedQueries& shared, String indent, int depth)
-        : mOut(out), mShared(shared), mIndent(std::move(indent)), mDepth(depth) {}
+    Printer(Output& out, const Statement& statement, const SharedQueries& shared, String indent,
+            int depth)
+        : mOut(out), mStatement(statement), mShared(shared), mIndent(std::move(indent)),
+          mDepth(depth) {}
 
-    void print(const Statement& statement) {
+    /// What stands above the whole statement.
+    void head() {
+        const auto remarks = mRemarks.of(CommentPlace::start);
+        for (const String& each : remarks.above) mOut.text += each + u'\n' + mIndent;
+        mBesideSelect = remarks.beside;
+    }
+
+    /// All behind it.
+    void body() {
+        const Statement& statement = mStatement;
         writeGroupsOut(statement);
         const bool around = differsAround(statement);
         if (around) {
@@ -92,19 +105,25 @@ public:
             line(u"");
         }
         mOut.text += statement.distinct && !around ? u"SELECT DISTINCT" : u"SELECT";
-        for (const auto& item : statement.items) {
-            if (&item != &statement.items.front()) mOut.text += u',';
+        String beside = mBesideSelect;
+        for (std::size_t n = 0; n < statement.items.size(); ++n) {
+            if (n > 0) mOut.text += u',';
+            comment(beside);
+            const auto remarks = mRemarks.of(n);
+            lines(remarks.above, inside);
+            beside = remarks.beside;
             line(inside);
-            selectItem(item);
+            selectItem(statement.items[n]);
         }
-        line(u"FROM ");
+        comment(beside);
         from(statement.from);
-        filter(statement.where);
+        filter(statement);
         group(statement);
         if (statement.having) having(statement);
         if (around) line(u") AS totals");
         order(statement, around);
         paging(statement);
+        end();
     }
 
 private:
@@ -114,8 +133,26 @@ private:
         mOut.text += begin;
     }
 
-    /// What begins a line within a clause.
-    String nextLine() const { return u'\n' + mIndent + String(inside); }
+    /// Comments before what comes next.
+    void lines(const std::vector<String>& comments, StringView within) {
+        for (const String& each : comments) line(String(within) + each);
+    }
+
+    /// A comment at the end of a line.
+    void comment(StringView beside) {
+        mOut.text += beside;
+        if (!beside.empty()) mOut.commentEnd = mOut.text.size();
+    }
+
+    void end() {
+        Remarks::Lines remarks = mRemarks.of(CommentPlace::end);
+        const Remarks::Lines rest = mRemarks.rest();
+        comment(remarks.beside);
+        remarks.above.insert(remarks.above.end(), rest.above.begin(), rest.above.end());
+        if (!rest.beside.empty()) remarks.above.push_back(rest.beside.substr(1));
+        lines(remarks.above, {});
+        if (!remarks.above.empty()) mOut.commentEnd = mOut.text.size();
+    }
 
     bool isFor(Dialect dialect) const { return mOut.dialect == dialect; }
 
@@ -161,27 +198,46 @@ private:
         return numbers && holds<Parameter>(*node) && itemOf(statement, node) != 0;
     }
 
-    void filter(const Node& condition) {
-        if (!condition) return;
-        check(*condition);
-        line(u"WHERE ");
-        mExpressions.terms(*condition, nextLine(), Tightness::disjunction);
+    void filter(const Statement& statement) {
+        if (!statement.where) return;
+        check(*statement.where);
+        terms(statement.where, u"WHERE ", mExpressions, !statement.having);
+    }
+
+    /// A line for each; in the `last` ones stands what was said of those that are no more.
+    void terms(const Node& condition, StringView word, ExpressionPrinter& printer, bool last) {
+        const TermLines all = termLinesOf(condition);
+        std::vector<Remarks::Lines> remarks;
+        for (const Node& term : all.terms) remarks.push_back(mRemarks.within(term));
+        if (last) {
+            const Remarks::Lines others = mRemarks.ofOtherConditions();
+            auto& above = remarks.front().above;
+            if (!others.beside.empty()) above.insert(above.begin(), others.beside.substr(1));
+            above.insert(above.begin(), others.above.begin(), others.above.end());
+        }
+        for (std::size_t n = 0; n < all.terms.size(); ++n) {
+            lines(remarks[n].above, n == 0 ? u"" : inside);
+            line(n == 0 ? String(word) : String(inside) + String(all.word));
+            printer.condition(*all.terms[n], all.around);
+            comment(remarks[n].beside);
+        }
     }
 
     void having(const Statement& statement) {
         ExpressionPrinter behind = mExpressions;
         behind.standBehind(statement.group);
         check(*statement.having);
-        line(u"HAVING ");
-        behind.terms(*statement.having, nextLine(), Tightness::disjunction);
+        terms(statement.having, u"HAVING ", behind, true);
     }
 
     void group(const Statement& statement) {
         bool first = true;
+        String beside;
         for (const Node& node : statement.group) {
             // Engines take a number alone for that of a column, or nothing alone at all.
             const bool alone = std::holds_alternative<Value>(node->node);
             if (alone && isFor(Dialect::SqlServer)) continue;
+            if (first) beside = besideBehind(CommentPlace::groups);
             begin(first, u"GROUP BY ");
             if (groupedByNumber(statement, node)) {
                 mOut.text += platform::decimal(static_cast<std::int64_t>(itemOf(statement, node)));
@@ -191,6 +247,14 @@ private:
                 if (alone) mOut.text += u", NULL)";
             }
         }
+        comment(beside);
+    }
+
+    /// Writes what stands above a clause, and returns what stands beside it.
+    String besideBehind(CommentPlace clause) {
+        const auto remarks = mRemarks.of(clause);
+        lines(remarks.above, {});
+        return remarks.beside;
     }
 
     /// Before the first of several a line with `word`, before the others a comma.
@@ -219,11 +283,9 @@ private:
     void from(const std::vector<SourceNode>& sources) {
         bool first = true;
         for (const auto& source : sources) {
-            if (!first) {
-                line(inside);
-                mOut.text += u"CROSS JOIN ";
-            }
             const bool joined = std::holds_alternative<JoinSource>(source->node);
+            if (first || !joined) lines(above(*source), first ? u"" : inside);
+            line(first ? u"FROM " : String(inside) + u"CROSS JOIN ");
             // A tree after the first would otherwise swallow what stands before it.
             if (joined && !first)
                 inParentheses(*source, inside);
@@ -236,34 +298,50 @@ private:
     void inParentheses(const Source& source, StringView within) {
         const String deeper = String(within) + String(inside);
         mOut.text += u'(';
+        lines(above(source), deeper);
         line(deeper);
         sourceLines(source, deeper, deeper);
         line(within);
         mOut.text += u')';
     }
 
+    /// What stands above a source, or above the first of joined ones.
+    std::vector<String> above(const Source& source) {
+        Remarks::Lines remarks = mRemarks.of(aliasOf(source));
+        mBeside[aliasOf(source)] = std::move(remarks.beside);
+        return std::move(remarks.above);
+    }
+
     /// A source with each of its joins on a line of its own, which is indented by `joins`; `within`
     /// is how far the line is in which it begins.
     void sourceLines(const Source& source, StringView joins, StringView within) {
-        if (const auto* table = std::get_if<TableRef>(&source.node)) {
-            tableRef(*table);
+        const auto* join = std::get_if<JoinSource>(&source.node);
+        if (!join) {
+            single(source, within);
+            comment(mBeside[aliasOf(source)]);
             return;
         }
-        if (const auto* query = std::get_if<SubSelect>(&source.node)) {
-            subSelect(*query, within);
-            return;
-        }
-        const auto& join = std::get<JoinSource>(source.node);
-        check(join);
-        sourceLines(*join.left, joins, within);
+        check(*join);
+        sourceLines(*join->left, joins, within);
+        const Source& right = *join->right;
+        const bool several = std::holds_alternative<JoinSource>(right.node);
+        if (!several) lines(above(right), joins);
         line(joins);
-        mOut.text += words(join.kind);
-        if (std::holds_alternative<JoinSource>(join.right->node))
-            inParentheses(*join.right, joins);
+        mOut.text += words(join->kind);
+        if (several)
+            inParentheses(right, joins);
         else
-            sourceLines(*join.right, joins, joins);
+            single(right, joins);
         mOut.text += u" ON ";
-        mExpressions.condition(*join.on, Tightness::conjunction);
+        mExpressions.condition(*join->on, Tightness::conjunction);
+        if (!several) comment(mBeside[aliasOf(right)]);
+    }
+
+    void single(const Source& source, StringView within) {
+        if (const auto* table = std::get_if<TableRef>(&source.node))
+            tableRef(*table);
+        else
+            subSelect(std::get<SubSelect>(source.node), within);
     }
 
     void check(const JoinSource& join) const {
@@ -307,7 +385,9 @@ private:
         }
         const String indent = mIndent + String(within);
         mOut.text += u"(\n" + indent + String(inside);
-        Printer(mOut, mShared, indent + String(inside), mDepth + 1).print(*query.statement);
+        Printer inner(mOut, *query.statement, mShared, indent + String(inside), mDepth + 1);
+        inner.head();
+        inner.body();
         mOut.text += u'\n' + indent + u") AS ";
         mOut.name(query.alias);
     }
@@ -318,7 +398,9 @@ private:
         if (statement.order.empty() && needed)
             line(statement.distinct ? u"ORDER BY 1" : u"ORDER BY (SELECT NULL)");
         bool first = true;
+        String beside;
         for (const auto& item : statement.order) {
+            if (first) beside = besideBehind(CommentPlace::order);
             begin(first, u"ORDER BY ");
             const bool plain = std::holds_alternative<ColumnRef>(item.value->node);
             const std::size_t number = plain && !byNumber ? 0 : itemOf(statement, item.value);
@@ -328,6 +410,7 @@ private:
                 mExpressions.value(*item.value, Tightness::disjunction);
             if (item.descending) mOut.text += u" DESC";
         }
+        comment(beside);
     }
 
     /// Whether all columns of a table come before an item, so that nobody knows its number.
@@ -361,9 +444,13 @@ private:
     }
 
     Output& mOut;
+    const Statement& mStatement;
     const SharedQueries& mShared;
     const String mIndent;
     const int mDepth;
+    Remarks mRemarks{mStatement, mOut.form != ValueForm::bound};
+    String mBesideSelect;
+    std::map<String, String> mBeside; ///< of sources, by alias
     ExpressionPrinter mExpressions{mOut};
 };
 
@@ -415,19 +502,25 @@ private:
 Printed whole(const Statement& statement, Output out) {
     Sharing sharing(statement);
     SharedQueries shared;
+    Printer all(out, statement, shared, {}, 0);
+    all.head();
     StringView before = u"WITH ";
     for (const SubSelect* query : sharing.queries()) {
         const String name = sharing.nameFor(*query);
         out.text += before;
         out.name(name);
         out.text += u" AS (\n" + String(inside);
-        Printer(out, shared, String(inside), 1).print(*query->statement);
+        Printer inner(out, *query->statement, shared, String(inside), 1);
+        inner.head();
+        inner.body();
         out.text += u"\n)";
         shared.emplace(query->statement.get(), name);
         before = u",\n";
     }
     if (!shared.empty()) out.text += u'\n';
-    Printer(out, shared, {}, 0).print(statement);
+    all.body();
+    // A comment would swallow it.
+    if (out.form == ValueForm::script) out.text += out.commentEnd == out.text.size() ? u"\n;" : u";";
     return {std::move(out.text), std::move(out.bindings)};
 }
 
@@ -438,9 +531,7 @@ std::variant<Printed, Refusal> print(const Statement& statement, Dialect dialect
         if (form != ValueForm::script) return whole(statement, {dialect, form});
         // What one parameter is called depends on all of them.
         const Printed shown = whole(statement, {dialect, ValueForm::literal});
-        Printed written = whole(statement, {dialect, form, ShellNames(shown.bindings)});
-        written.text += u';';
-        return written;
+        return whole(statement, {dialect, form, ShellNames(shown.bindings)});
     } catch (Refusal& refusal) {
         return std::move(refusal);
     }

@@ -35,7 +35,9 @@ void give(SelectItem& item, const String& name) {
 
 void writeColumnsOut(Statement& statement, Query& query) {
     std::vector<SelectItem> items;
+    std::vector<std::size_t> places;
     for (SelectItem& item : statement.items) {
+        places.push_back(items.size());
         const auto* all = std::get_if<AllColumns>(&item.what);
         if (!all) {
             items.push_back(std::move(item));
@@ -52,6 +54,8 @@ void writeColumnsOut(Statement& statement, Query& query) {
     for (std::size_t n = 0; n < items.size(); ++n)
         give(items[n], unused(nameOf(items[n], n + 1), taken));
     statement.items = std::move(items);
+    for (Remark& remark : statement.remarks)
+        if (auto* item = std::get_if<std::size_t>(&remark.by)) *item = places[*item];
 }
 
 std::vector<String> namesOf(const Statement& statement) {

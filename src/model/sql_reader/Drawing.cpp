@@ -228,13 +228,15 @@ Ref<Query> drawn(const Selected& selected, const std::function<bool(Query&)>& is
     std::optional<Refused> first;
     Ref<Query> sound;
     const auto isDone = [&](Layout layout) {
+        Ref<Query> query;
         try {
-            const auto query = Drawing(selected, layout).draw();
+            query = Drawing(selected, layout).draw();
             const bool exact = hasSameWords(saidBy(*query, selected), selected.statement);
             if (!sound || (exact && (layout != Layout::ordered || isWhole(*query)))) sound = query;
             return exact;
         } catch (const Refused& refused) {
-            if (!first) first = refused;
+            // What was drawn and says something else tells more than what was not.
+            if (!first || query) first = refused;
             return false;
         }
     };

@@ -228,6 +228,28 @@ Joined joined(const sql::Source& source) {
     return {{leaf}, {alias}, {}, {}};
 }
 
+bool speaksOf(const std::set<String>& needs, const std::set<String>& names) {
+    return std::any_of(names.begin(), names.end(),
+                       [&](const String& name) { return needs.contains(name); });
+}
+
+/// Whether what only adds rows can as well be added before another step: neither speaks of the
+/// other's rows, and it finds nothing for those that FULL JOIN brings along.
+bool canComeBefore(const Joined::Step& step, const Joined::Step& other) {
+    if (speaksOf(step.needs, other.right.names)) return false;
+    if (!other.full) return true;
+    return !speaksOf(other.needs, step.right.names) && !isWithin(step.needs, step.right.names);
+}
+
+std::vector<Joined::Step> earliestFirst(std::vector<Joined::Step> steps) {
+    for (std::size_t n = 1; n < steps.size(); ++n)
+        for (std::size_t at = n; at > 0 && !steps[at].full; --at) {
+            if (!canComeBefore(steps[at], steps[at - 1])) break;
+            std::swap(steps[at], steps[at - 1]);
+        }
+    return steps;
+}
+
 String joinedKey(const Joined& joined, bool withConditions) {
     String key = u"(";
     for (const String& leaf : joined.leaves) key += leaf + u' ';
@@ -243,7 +265,7 @@ String joinedKey(const Joined& joined, bool withConditions) {
         for (const String& each : run) key += each;
         run.clear();
     };
-    for (const auto& step : joined.steps) {
+    for (const auto& step : earliestFirst(joined.steps)) {
         String one = step.full ? u"F" : u"L";
         one += joinedKey(step.right, true) + u'[';
         for (const String& term : step.on) one += term + u' ';

@@ -1,8 +1,8 @@
 #pragma once
 
-#include <Zandor/platform/String.h>
+#include <Zandor/model/Comment.h>
 
-#include <cstdint>
+#include <vector>
 
 namespace zandor::model {
 
@@ -14,6 +14,7 @@ struct QueryOptions {
     bool distinct = false;             ///< rows that are equal come out once
     std::int32_t first = 0;            ///< no more rows than these, 0 to greatestFirst; 0: all
     platform::String description = {}; ///< for people
+    std::vector<Comment> comments = {}; ///< of its statement, in the order in which they stand there
 
     friend bool operator==(const QueryOptions&, const QueryOptions&) = default;
 };

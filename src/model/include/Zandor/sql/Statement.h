@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/model/Comment.h>
 #include <Zandor/sql/Expression.h>
 
 #include <optional>
@@ -63,6 +64,15 @@ struct OrderItem {
     bool descending = false; ///< the greatest first
 };
 
+/// A comment within a statement.
+struct Remark {
+    /// What it stands by: a clause, an item by its number from 0, a source by its alias, or a
+    /// condition.
+    std::variant<CommentPlace, std::size_t, String, Node> by;
+    bool beside = false; ///< behind it on its line; else before it on lines of its own
+    String text;         ///< without marks; lines end with U+000A
+};
+
 /// A SELECT statement.
 struct Statement {
     bool distinct = false;         ///< rows that are equal come out once
@@ -74,6 +84,7 @@ struct Statement {
     std::vector<OrderItem> order;  ///< the first sorts first
     std::optional<std::int64_t> limit; ///< of rows; nothing: all
     std::int64_t offset = 0;           ///< rows left out before the first
+    std::vector<Remark> remarks;       ///< shown, and not run
 };
 
 } // namespace zandor::model::sql
