@@ -18,7 +18,8 @@ bool isTotal(const Node& node) { return node && sql::holds<sql::Aggregate>(*node
 
 } // namespace
 
-Columns::Columns(Query& query, const Selected& selected) : mQuery(query), mSelected(selected) {
+Columns::Columns(Query& query, const Selected& selected, bool written)
+    : mQuery(query), mSelected(selected), mWritten(written) {
     const sql::Statement& statement = selected.statement;
     mTotals = isTotal(statement.having);
     for (const auto& item : statement.items)
@@ -27,12 +28,21 @@ Columns::Columns(Query& query, const Selected& selected) : mQuery(query), mSelec
     mGrouped = mTotals || !statement.group.empty();
 }
 
+/// Where nothing is shown, all that rows are put together by and into comes out, without names.
+bool Columns::isNameless() const {
+    const auto& items = mSelected.statement.items;
+    return mWritten && mGrouped && std::all_of(items.begin(), items.end(), [](const auto& item) {
+               return item.name.empty();
+           });
+}
+
 void Columns::addItems() {
+    const bool shown = !isNameless();
     for (const auto& item : mSelected.statement.items) {
         if (const auto* all = std::get_if<sql::AllColumns>(&item.what))
             addAllOf(all->table);
         else
-            add(std::get<Node>(item.what), true, item.name);
+            mItems.push_back(add(std::get<Node>(item.what), shown, item.name).definition);
     }
     addGroups();
 }
@@ -56,6 +66,7 @@ void Columns::addAllOf(const String& table) {
     const auto definition = platform::makeRef<model::ColumnDefinition>();
     definition->Column(mQuery.tableNamed(table)->Columns().Item(1));
     mQuery.AddColumnDefinition(definition);
+    mItems.push_back(definition);
 }
 
 Columns::Column& Columns::add(const Node& subject, bool visible, const String& name) {
@@ -179,9 +190,10 @@ void Columns::sort() {
             return column->definition->SortOrder() == 0;
         });
         // What sorted already leaves nothing to sort.
-        if (free == known.end()) continue;
-        (*free)->definition->SortOrder(item.descending ? 2 : 1);
-        sorted.push_back(*free);
+        if (free == known.end() && !mWritten) continue;
+        Column& column = free == known.end() ? add(item.value, false) : **free;
+        column.definition->SortOrder(item.descending ? 2 : 1);
+        sorted.push_back(&column);
     }
     const bool inOrder =
         std::is_sorted(sorted.begin(), sorted.end(), [&](const Column* one, const Column* other) {

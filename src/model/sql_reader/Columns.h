@@ -11,12 +11,18 @@ namespace zandor::sql_reader {
 /// The output columns of a query that is being drawn, by what comes out of them.
 class Columns {
 public:
-    explicit Columns(Query& query, const Selected& selected);
+    /// As a statement `written` for a drawing has them, those that leave no other trace in it too.
+    Columns(Query& query, const Selected& selected, bool written);
 
     /// Those that come out, and those that rows are put together by.
     void addItems();
     /// Which of them sort, and in which order.
     void sort();
+
+    /// What one item comes out of; `item` is counted from 0.
+    const Ref<model::ColumnDefinition>& definitionOf(std::size_t item) const {
+        return mItems[item];
+    }
 
     /// Leaves out names under which columns come out by themselves.
     void dropOwnNames();
@@ -48,12 +54,15 @@ private:
     void fillValue(model::ColumnDefinition& definition, const Node& value);
     std::vector<Column*> find(const Node& subject, bool apart);
     void addGroups();
+    bool isNameless() const;
     Column& addForCondition(const Node& subject);
 
     Query& mQuery;
     const Selected& mSelected;
+    const bool mWritten;
     bool mGrouped = false;
     bool mTotals = false; ///< some column has one
+    std::vector<Ref<model::ColumnDefinition>> mItems;
     std::deque<Column> mColumns; ///< those with a value, in the order in which they were made
 };
 

@@ -89,7 +89,7 @@ public:
         const std::vector<Node> rest = drawSources(
             *mQuery, mSelected,
             mLayout == Layout::loops || mLayout == Layout::ordered ? Loops::joins : Loops::criteria);
-        Columns columns(*mQuery, mSelected);
+        Columns columns(*mQuery, mSelected, mLayout == Layout::ordered);
         columns.addItems();
         columns.sort();
         addCriteria(columns, simplifiedTerms(rest),
@@ -97,6 +97,8 @@ public:
         model::QueryOptions options;
         options.distinct = mSelected.statement.distinct;
         options.first = static_cast<std::int32_t>(mSelected.statement.limit.value_or(0));
+        for (const sql::Remark& remark : mSelected.statement.remarks)
+            options.comments.push_back(commentOf(remark, columns));
         mQuery->options(std::move(options));
         columns.dropOwnNames();
         return mQuery;
@@ -157,7 +159,47 @@ private:
                 model::criteria::written(sql::allOf(cells[n].second), column.subject, names);
             if (!text || column.definition->HasCriterium(key)) refuseCondition();
             column.definition->AddCriterium(*text, key);
+            for (const Node& term : cells[n].second)
+                mCells.push_back({term, column.definition->Key(), row});
         }
+    }
+
+    model::Comment commentOf(const sql::Remark& remark, const Columns& columns) const {
+        model::Comment comment{.beside = remark.beside, .text = remark.text};
+        if (const auto* place = std::get_if<model::CommentPlace>(&remark.by)) {
+            comment.place = *place;
+        } else if (const auto* item = std::get_if<std::size_t>(&remark.by)) {
+            comment.place = model::CommentPlace::column;
+            comment.key = columns.definitionOf(*item)->Key();
+        } else if (const auto* alias = std::get_if<String>(&remark.by)) {
+            comment.place = model::CommentPlace::table;
+            comment.key = mQuery->tableNamed(*alias)->Key();
+        } else {
+            standBy(std::get<Node>(remark.by), comment);
+        }
+        return comment;
+    }
+
+    /// A condition stands in a cell, maybe with others, or has become a join.
+    void standBy(const Node& condition, model::Comment& comment) const {
+        const auto cell = [&](const auto& isMeant) {
+            const auto found = std::find_if(mCells.begin(), mCells.end(), isMeant);
+            if (found == mCells.end()) return false;
+            comment.place = model::CommentPlace::criterion;
+            comment.key = found->definition;
+            comment.row = found->row;
+            return true;
+        };
+        const Node subject = subjectOf(condition);
+        if (cell([&](const Cell& each) { return sql::same(each.term, condition); }) ||
+            cell([&](const Cell& each) { return sql::same(subjectOf(each.term), subject); }))
+            return;
+        comment.place = model::CommentPlace::end;
+        const auto parts = sql::partsOf(*condition);
+        const auto* column = parts.empty() ? nullptr : std::get_if<ColumnRef>(&parts.back()->node);
+        if (!column) return;
+        comment.place = model::CommentPlace::table;
+        comment.key = mQuery->tableNamed(column->table)->Key();
     }
 
     /// Columns for the cells from left to right, as a value that comes out twice allows it; none
@@ -196,8 +238,16 @@ private:
         return made;
     }
 
+    /// Where a condition stands.
+    struct Cell {
+        Node term;
+        String definition; ///< key
+        std::int16_t row;
+    };
+
     const Selected& mSelected;
     const Layout mLayout;
+    std::vector<Cell> mCells;
     const Ref<Query> mQuery = platform::makeRef<Query>();
 };
 
@@ -212,14 +262,20 @@ sql::Statement saidBy(Query& query, const Selected& selected) {
     return std::move(*built.statement);
 }
 
-/// Whether conditions stand in the same words and order, as a statement's writer leaves them.
+/// Whether conditions stand in the same words and order, as a statement's writer leaves them, and
+/// all has the names and sorts that were given.
 bool hasSameWords(const sql::Statement& one, const sql::Statement& other) {
     const auto same = [](const Node& left, const Node& right) {
         const Node first = sql::simplified(left);
         const Node second = sql::simplified(right);
         return first && second ? sql::same(first, second) : !first && !second;
     };
-    return same(one.where, other.where) && same(one.having, other.having);
+    const bool names = std::equal(one.items.begin(), one.items.end(), other.items.begin(),
+                                  other.items.end(), [](const auto& item, const auto& its) {
+                                      return item.name == its.name;
+                                  });
+    return names && one.order.size() == other.order.size() && same(one.where, other.where) &&
+           same(one.having, other.having);
 }
 
 } // namespace

@@ -49,6 +49,23 @@ bool isSyntax(const String& folded) {
            model::sql::isReserved(folded, Dialect::PostgreSQL);
 }
 
+/// The lines of a comment without what only decorates it.
+String withoutMargins(StringView inner) {
+    String text;
+    while (!inner.empty()) {
+        const std::size_t end = std::min(inner.find(u'\n'), inner.size());
+        StringView line = inner.substr(0, end);
+        inner.remove_prefix(std::min(end + 1, inner.size()));
+        constexpr StringView margin = u" \t\r*";
+        line.remove_prefix(std::min(line.find_first_not_of(margin), line.size()));
+        while (!line.empty() && margin.find(line.back()) != StringView::npos) line.remove_suffix(1);
+        if (!text.empty()) text += u'\n';
+        text += line;
+    }
+    while (text.ends_with(u'\n')) text.pop_back();
+    return text;
+}
+
 class Lexer {
 public:
     Lexer(StringView text, Dialect dialect) : mText(text), mDialect(dialect) {}
@@ -111,13 +128,16 @@ private:
     }
 
     bool comment() {
-        if (at() == u'-' && at(1) == u'-') return lineComment();
-        if (at() == u'#' && is(Dialect::MySQL)) return lineComment();
+        if (at() == u'-' && at(1) == u'-' && !areSigns()) return lineComment(2);
+        if (at() == u'#' && is(Dialect::MySQL)) return lineComment(1);
         if (at() != u'/' || at(1) != u'*') return false;
         const std::size_t begin = mAt;
+        const bool runs = at(2) == u'!' || (at(2) == u'M' && at(3) == u'!');
+        if (is(Dialect::MySQL) && runs) refusePart<MessageCode::aCommentThatRuns>(begin);
+        const bool nests = is(Dialect::PostgreSQL) || is(Dialect::SqlServer);
         int depth = 0;
         do {
-            if (at() == u'/' && at(1) == u'*' && (depth == 0 || is(Dialect::PostgreSQL))) {
+            if (at() == u'/' && at(1) == u'*' && (depth == 0 || nests)) {
                 ++depth;
                 mAt += 2;
             } else if (at() == u'*' && at(1) == u'/') {
@@ -129,14 +149,31 @@ private:
                 ++mAt;
             }
         } while (depth > 0);
-        mOut.text += ' ';
+        keep(begin, mText.substr(begin + 2, mAt - begin - 4));
         return true;
     }
 
-    bool lineComment() {
-        while (mAt < mText.size() && at() != u'\n') ++mAt;
-        mOut.text += ' ';
+    /// Two signs are no comment in MySQL without a blank behind them.
+    bool areSigns() const {
+        return is(Dialect::MySQL) && mAt + 2 < mText.size() && at(2) > u' ';
+    }
+
+    bool lineComment(std::size_t mark) {
+        const std::size_t begin = mAt;
+        const auto ends = [&](char16_t c) {
+            return c == u'\n' || (c == u'\r' && is(Dialect::PostgreSQL));
+        };
+        while (mAt < mText.size() && !ends(at())) ++mAt;
+        keep(begin, mText.substr(begin + mark, mAt - begin - mark));
         return true;
+    }
+
+    void keep(std::size_t begin, StringView inner) {
+        const std::size_t line = begin == 0 ? StringView::npos : mText.rfind(u'\n', begin - 1);
+        const bool beside = mLast.second > (line == StringView::npos ? 0 : line + 1);
+        const String text = withoutMargins(inner);
+        if (!text.empty()) mOut.comments.push_back({mOut.text.size(), beside, text});
+        mOut.text += ' ';
     }
 
     /// What stands between quotes, doubled ones halved.
@@ -325,7 +362,7 @@ private:
                !model::sql::isReserved(folded, mDialect);
     }
 
-    bool inCast() const { return !mParentheses.empty() && mParentheses.back(); }
+    bool inCast() const { return !mParentheses.empty() && mParentheses.back().ofCast; }
     StringView lastToken() const { return mText.substr(mLast.first, mLast.second - mLast.first); }
 
     std::size_t skipBlanks(std::size_t from) const {
@@ -399,13 +436,17 @@ private:
             return;
         }
         if (at() == u'(') {
-            mParentheses.push_back(mCasts);
+            mParentheses.push_back({mCasts, mOut.parentheses.size()});
+            mOut.parentheses.push_back({mOut.text.size(), std::string::npos});
             ++mDepth;
         }
         if (at() == u')' && !mParentheses.empty()) {
+            mOut.parentheses[mParentheses.back().number].end = mOut.text.size();
             mParentheses.pop_back();
             --mDepth;
         }
+        // The parser would take two signs for a comment.
+        if (at() == u'-' && mOut.text.ends_with('-')) mOut.text += ' ';
         mCasts = false;
         const bool pair = at() >= 0xD800 && at() < 0xDC00;
         mAt += pair ? 2 : 1;
@@ -420,7 +461,11 @@ private:
     int mDepth = 0;
     std::int64_t mQuestions = 0;
     bool mCasts = false;             ///< the word before was CAST
-    std::vector<bool> mParentheses;  ///< those open, and whether they are of a CAST
+    struct Open {
+        bool ofCast;
+        std::size_t number; ///< among all
+    };
+    std::vector<Open> mParentheses;  ///< those open
     std::vector<int> mIntervals;     ///< depths of those open
     ParserText mOut;
 };

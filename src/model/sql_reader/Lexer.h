@@ -13,7 +13,7 @@ using platform::StringView;
 
 /// A statement as the parser reads it, whatever dialect it was written in.
 struct ParserText {
-    std::string text; ///< UTF-8, without comments
+    std::string text; ///< UTF-8, a blank for each comment
 
     /// What its $1, $2, ... ask for.
     std::vector<String> parameters;
@@ -27,6 +27,21 @@ struct ParserText {
         std::size_t unit;
     };
     std::vector<Origin> origins;
+
+    /// What stood at a byte of it.
+    struct Comment {
+        std::size_t byte;
+        bool beside; ///< a token stands before it on its line
+        String text; ///< without marks and margins
+    };
+    std::vector<Comment> comments; ///< in order
+
+    /// Parentheses, in the order in which they begin.
+    struct Parentheses {
+        std::size_t begin;
+        std::size_t end;
+    };
+    std::vector<Parentheses> parentheses;
 };
 
 /// The function that stands for SQL Server's TOP, first among what is selected.
@@ -34,7 +49,7 @@ inline constexpr StringView topFunction = u"\uE000top";
 
 /// Rewrites what a dialect has of its own, token by token: quotes, parameters, TOP, LIMIT with a
 /// comma, numbers of bytes. What it does not know stays as it is, for the parser to judge. Throws
-/// Refused, with a place in code units, for a quote that has no end.
+/// Refused, with a place in code units, for a quote that has no end, and for a comment that is run.
 ParserText lexed(StringView text, Dialect dialect);
 
 } // namespace zandor::sql_reader

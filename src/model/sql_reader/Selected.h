@@ -1,5 +1,6 @@
 #pragma once
 
+#include "model/sql_reader/Comments.h"
 #include "model/sql_reader/Scope.h"
 
 #include <Zandor/model/Record.h>
@@ -19,10 +20,22 @@ struct Selected {
     std::map<String, model::SavedQuery> queries;        ///< those that it reads from, likewise
     std::size_t place = 0;                              ///< of its first token
     Places places;
+    Commented commented; ///< what comments can stand by
 
     std::size_t placeOf(const Node& node) const {
         const auto known = places.find(node);
         return known == places.end() ? place : known->second;
+    }
+
+    /// Of all that a node is made of; nothing where that is not known.
+    std::optional<std::size_t> firstPlaceOf(const Node& node) const {
+        std::optional<std::size_t> first;
+        const auto take = [&](std::optional<std::size_t> byte) {
+            if (byte && (!first || *byte < *first)) first = byte;
+        };
+        if (const auto known = places.find(node); known != places.end()) take(known->second);
+        for (const Node& part : model::sql::partsOf(*node)) take(firstPlaceOf(part));
+        return first;
     }
 };
 

@@ -68,6 +68,7 @@ StatementReader::Source StatementReader::table(const Tree& tree, Scope& scope, S
     const String called = alias.empty() ? found->name : alias;
     scope.add({called, found->columns}, tree.place());
     into.tables.emplace(called, *found);
+    into.commented.emplace(tree.place(), called);
     return made(sql::TableRef{found->schema, found->name, called});
 }
 
@@ -112,6 +113,7 @@ StatementReader::Source StatementReader::queryAs(const Named& query, const Strin
                                                  std::size_t place, Scope& scope, Selected& into) {
     scope.add({alias, query.columns}, place);
     into.queries.emplace(alias, query.query);
+    into.commented.emplace(place, alias);
     return made(sql::SubSelect{query.statement, alias});
 }
 

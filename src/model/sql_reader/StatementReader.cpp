@@ -82,6 +82,7 @@ Selected StatementReader::selectNamed(const Tree& tree) {
         selected.statement.distinct = true;
         order(tree, ValueReader(selected.scope, mText, mDialect, selected.places), selected);
         limits(tree, selected);
+        takeComments(tree, selected);
         return selected;
     }
 
@@ -103,6 +104,7 @@ Selected StatementReader::selectNamed(const Tree& tree) {
     for (const Tree& each : tree.list("groupClause")) {
         if (each.is("GroupingSet")) refusePart<MessageCode::groupingSets>(each.place());
         selected.statement.group.push_back(byNameOrPlace(each, values, selected, false));
+        selected.commented.emplace(each.place(), model::CommentPlace::groups);
     }
     if (tree.has("havingClause"))
         selected.statement.having = behindGroups(values.conditions(tree.node("havingClause")),
@@ -111,7 +113,28 @@ Selected StatementReader::selectNamed(const Tree& tree) {
     order(tree, values, selected);
     limits(tree, selected);
     checkGroups(selected);
+    noteConditions(selected.statement.where, selected);
+    noteConditions(selected.statement.having, selected);
+    takeComments(tree, selected);
     return selected;
+}
+
+void StatementReader::takeComments(const Tree& tree, Selected& into) const {
+    const std::size_t first = tree.list("targetList").front().place();
+    for (auto& remark : commentsAround(first, mText, into.commented))
+        into.statement.remarks.push_back(std::move(remark));
+}
+
+/// Conditions have comments each for itself, however they are put together.
+void StatementReader::noteConditions(const Node& condition, Selected& in) {
+    if (!condition) return;
+    const bool joint = std::holds_alternative<sql::And>(condition->node) ||
+                       std::holds_alternative<sql::Or>(condition->node);
+    if (joint) {
+        for (const Node& part : sql::partsOf(*condition)) noteConditions(part, in);
+    } else if (const auto begin = in.firstPlaceOf(condition)) {
+        in.commented.emplace(*begin, condition);
+    }
 }
 
 /// MySQL knows no expression again behind GROUP BY, so that the printer asks for the smallest of
@@ -184,6 +207,7 @@ void StatementReader::item(const Tree& target, const ValueReader& values, Select
     target.only({"name", "val"});
     const Tree value = target.node("val");
     auto& items = into.statement.items;
+    into.commented.emplace(target.place(), items.size());
     if (value.is("FuncCall") && value.names("funcname").back() == topFunction) {
         limit(value.list("args").front(), into);
         return;
@@ -215,7 +239,9 @@ void StatementReader::limits(const Tree& tree, Selected& into) {
                           offset.part("ival").number("ival") == 0;
         if (!none) refusePart<MessageCode::anOffset>(offset.place());
     }
-    if (tree.has("limitCount")) limit(tree.node("limitCount"), into);
+    if (!tree.has("limitCount")) return;
+    limit(tree.node("limitCount"), into);
+    into.commented.emplace(tree.node("limitCount").place(), model::CommentPlace::end);
 }
 
 void StatementReader::limit(const Tree& count, Selected& into) const {
@@ -268,6 +294,7 @@ void StatementReader::order(const Tree& tree, const ValueReader& values, Selecte
         each.only({"node", "sortby_dir", "sortby_nulls"});
         into.statement.order.push_back({byNameOrPlace(node, values, into, true),
                                         each.word("sortby_dir") == "SORTBY_DESC"});
+        into.commented.emplace(each.place(), model::CommentPlace::order);
     }
 }
 

@@ -28,6 +28,8 @@ private:
     using Source = model::sql::SourceNode;
 
     Selected selectNamed(const Tree& tree);
+    void takeComments(const Tree& tree, Selected& into) const;
+    static void noteConditions(const Node& condition, Selected& in);
 
     // Sources.cpp
     Source source(const Tree& tree, Scope& scope, Selected& into);

@@ -60,17 +60,23 @@ public:
     std::string tryOn(model::Query& query) {
         const auto written = model::sql::statementText(query, mDialect, ValueForm::literal);
         if (!written.runnable()) return {};
+        // Such a drawing says that its joins can be read in two ways; its text says one of them.
+        const bool open = std::any_of(
+            written.findings.begin(), written.findings.end(), [](const model::Finding& finding) {
+                return finding.kind == model::Finding::Kind::ambiguousOuterJoin;
+            });
         ++mTried;
         SCOPED_TRACE(corpus::nameOf(mDialect) + '\n' + toUtf8(written.text));
         const auto drawn = sql_reader::read(written.text, mDialect, mSchema);
         if (!drawn) {
-            ++mRefused;
             show(written.text, drawn.error());
+            if (open) return ++mOpen, std::string();
+            ++mRefused;
             return toUtf8(drawn.error());
         }
         const auto again = model::sql::statementText(**drawn, mDialect, ValueForm::literal);
         if (again.text != written.text) {
-            ++mOther;
+            ++(open ? mOpen : mOther);
             show(written.text, again.text);
             expectSameRows(written, again);
         }
@@ -80,7 +86,8 @@ public:
 
     void report() const {
         std::cout << corpus::nameOf(mDialect) << ": " << mTried << " tried, " << mOther
-                  << " written otherwise, " << mRefused << " refused\n";
+                  << " written otherwise, " << mRefused << " refused, " << mOpen
+                  << " of two ways to read their joins written in the other\n";
     }
     int tried() const { return mTried; }
     int refused() const { return mRefused; }
@@ -124,6 +131,7 @@ private:
     int mTried = 0;
     int mRefused = 0;
     int mOther = 0;
+    int mOpen = 0;
 };
 
 } // namespace
@@ -160,7 +168,6 @@ TEST(ReadBack, OfRandomQueriesIsTheSameText) {
         }
         reading.report();
         EXPECT_GT(reading.tried(), static_cast<int>(howMany));
-        // Without a column that comes out, or with outer joins that contradict each other.
-        EXPECT_LT(reading.writtenOtherwise(), reading.tried() / 40);
+        EXPECT_LE(reading.writtenOtherwise(), reading.tried() / 500);
     }
 }
