@@ -119,17 +119,29 @@ std::vector<Node> ValueReader::conditions(const Tree& tree) const {
             for (Node& node : conditions(term)) all.push_back(std::move(node));
         return all;
     }
-    Pass pass(mScope);
     Node node = columnsCompared(tree);
-    if (!node) node = read(tree, pass);
-    if (const auto* value = std::get_if<model::sql::Value>(&node->node))
-        if (value->type == ColumnType::Boolean && value->text == u"true") return all;
-    if (!model::sql::isCondition(*node) && model::sql::typeOf(*node) != ColumnType::Boolean)
-        refuse<MessageCode::criterionNotDrawn>(tree.place());
-    node = asCondition(node);
+    if (!node) node = condition(tree);
     mPlaces.emplace(node, tree.place());
     if (!holdsAlways(node)) all.push_back(std::move(node));
     return all;
+}
+
+/// Each part with its place, for what is said of it.
+Node ValueReader::condition(const Tree& tree) const {
+    const std::string_view joins = tree.is("BoolExpr") ? tree.word("boolop") : "";
+    if (joins == "AND_EXPR" || joins == "OR_EXPR") {
+        std::vector<Node> parts;
+        for (const Tree& part : tree.list("args")) parts.push_back(condition(part));
+        return joins == "AND_EXPR" ? model::sql::allOf(std::move(parts))
+                                   : model::sql::anyOf(std::move(parts));
+    }
+    Pass pass(mScope);
+    const Node node = read(tree, pass);
+    if (!model::sql::isCondition(*node) && model::sql::typeOf(*node) != ColumnType::Boolean)
+        refuse<MessageCode::criterionNotDrawn>(tree.place());
+    Node asked = asCondition(node);
+    mPlaces.emplace(asked, tree.place());
+    return asked;
 }
 
 /// Two columns by an operator, whatever they hold: joins may compare what criteria may not.

@@ -32,6 +32,7 @@ private:
     class Pass;
 
     Node read(const Tree& tree, Pass& pass) const;
+    Node condition(const Tree& tree) const;
     Node columnsCompared(const Tree& tree) const;
     Node total(const Tree& tree) const;
     std::size_t blame(const Tree& tree, Pass& pass) const;
