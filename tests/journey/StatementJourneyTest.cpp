@@ -18,6 +18,8 @@ const QString statement =
                    "WHERE o.customer_id = c.id AND l.order_id = o.id AND l.product_id = p.id "
                    "AND p.supplier_id = s.id AND l.quantity > 10");
 
+const QString commented = statement + " -- what sells";
+
 class AStatementOnAScreen : public testing::Test {
 protected:
     AStatementOnAScreen() {
@@ -50,6 +52,7 @@ TEST_F(AStatementOnAScreen, IsPastedChangedInTheDrawingAndCopied) {
     designer->picture("statement-1-refused");
     EXPECT_EQ(tables(), 0);
     for (int n = 0; n < 11; ++n) screen.key("BackSpace");
+    screen.type(" -- what sells");
     screen.key("ctrl+a");
     screen.key("ctrl+x");
     await("there is none any more", [this] { return text().isEmpty(); });
@@ -57,7 +60,7 @@ TEST_F(AStatementOnAScreen, IsPastedChangedInTheDrawingAndCopied) {
     screen.key("ctrl+shift+v");
     await("five tables are drawn", [this] { return tables() == 5; });
     EXPECT_EQ(designer->query().filter("join ").size(), 4);
-    EXPECT_EQ(text(), statement);
+    EXPECT_EQ(text(), commented);
     designer->picture("statement-2-drawn");
 
     const QPoint title = designer->place("title c");
@@ -68,13 +71,24 @@ TEST_F(AStatementOnAScreen, IsPastedChangedInTheDrawingAndCopied) {
     screen.release(1);
     await("the table has moved", [&] { return designer->place("title c") != title; });
     const QPoint moved = designer->place("title c");
-    EXPECT_EQ(text(), statement) << "a place is nothing that a statement says";
+    EXPECT_EQ(text(), commented) << "a place is nothing that a statement says";
 
     designer->click("cell 4 1");
     designer->type("txtValue", "Like 'A*'");
     screen.key("Return");
     await("the statement says it", [this] { return text().contains("LIKE 'A%'"); });
     designer->picture("statement-3-criterion");
+
+    // Copied with its comment: put in the place of all, it is there.
+    const QString said = text();
+    EXPECT_TRUE(said.contains("l.quantity > 10 -- what sells")) << said.toStdString();
+    goToStatement();
+    designer->click("control copy");
+    screen.key("ctrl+a");
+    screen.key("ctrl+v");
+    await("what was copied is there", [this] { return text().endsWith(';'); });
+    EXPECT_EQ(text().remove(';').trimmed(), said.trimmed());
+    EXPECT_EQ(tables(), 5);
 
     // Typed on, and the table stays where it was put.
     goToStatement();

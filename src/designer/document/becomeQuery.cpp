@@ -73,10 +73,23 @@ public:
         order();
         model::QueryOptions options = mOther.options();
         options.description = mQuery.options().description;
+        takeComments(options.comments);
         mQuery.options(std::move(options));
     }
 
 private:
+    /// Comments stand by the own tables and columns.
+    void takeComments(std::vector<model::Comment>& comments) const {
+        std::map<String, String> keys;
+        for (const auto& table : tablesIn(mOther))
+            keys.emplace(table->Key(), mOwn.at(table.get())->Key());
+        const auto definitions = definitionsIn(mOther);
+        for (std::size_t n = 0; n < definitions.size(); ++n)
+            keys.emplace(definitions[n]->Key(), mDefinitions[n]->Key());
+        for (auto& comment : comments)
+            if (const auto own = keys.find(comment.key); own != keys.end()) comment.key = own->second;
+    }
+
     /// Tables of one name over one source.
     void matchTables() {
         mGone = tablesIn(mQuery);

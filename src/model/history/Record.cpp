@@ -58,6 +58,8 @@ public:
         lastKey("definition", mRecord.lastKeys.definition);
         if (mRecord.options.first < 0 || mRecord.options.first > QueryOptions::greatestFirst)
             fault<MessageCode::notInRange>("first", 0, QueryOptions::greatestFirst);
+        if (!mRecord.options.isValid())
+            fault<MessageCode::notInRange>("comments", 0, static_cast<int>(CommentPlace::end));
         for (std::size_t n = 0; n < mRecord.tables.size() && !mFault; ++n)
             table(mRecord.tables[n], at("tables", n));
         for (std::size_t n = 0; n < mRecord.joins.size() && !mFault; ++n)

@@ -88,7 +88,7 @@ void Query::DeleteTable(const Ref<ZDTable>& table) {
 }
 
 void Query::options(QueryOptions value) {
-    if (value.first < 0 || value.first > QueryOptions::greatestFirst)
+    if (!value.isValid())
         throw platform::errors::invalidPropertyValue();
     mOptions = std::move(value);
 }

@@ -92,7 +92,7 @@ public:
         Columns columns(*mQuery, mSelected, mLayout == Layout::ordered);
         columns.addItems();
         columns.sort();
-        addCriteria(columns, simplifiedTerms(rest),
+        addCriteria(columns, groupsFirst(simplifiedTerms(rest)),
                     termsOf(sql::simplified(mSelected.statement.having)));
         model::QueryOptions options;
         options.distinct = mSelected.statement.distinct;
@@ -110,6 +110,17 @@ private:
         for (const Node& term : terms)
             for (const Node& each : termsOf(sql::simplified(term))) all.push_back(each);
         return all;
+    }
+
+    /// A drawing asks for what rows are put together by before all that only chooses rows.
+    std::vector<Node> groupsFirst(std::vector<Node> terms) const {
+        const auto& groups = mSelected.statement.group;
+        std::stable_partition(terms.begin(), terms.end(), [&](const Node& term) {
+            const Node subject = subjectOf(term);
+            return std::any_of(groups.begin(), groups.end(),
+                               [&](const Node& group) { return sql::same(group, subject); });
+        });
+        return terms;
     }
 
     /// The place of a condition, also of one that was made of it.

@@ -77,6 +77,20 @@ const ScopedTable* Scope::tableNamed(StringView alias) const {
     return at == mTables.end() ? nullptr : &*at;
 }
 
+const ScopedTable& Scope::source(const std::vector<String>& names, std::size_t place) const {
+    const ScopedTable* table = tableNamed(names.back());
+    const auto mayStand = [&](const String& schema) {
+        return !schema.empty() && isSame(schema, names.front());
+    };
+    const bool known = names.size() == 1 ||
+                       (names.size() == 2 && table &&
+                        std::any_of(table->schemas.begin(), table->schemas.end(), mayStand));
+    if (table && known) return *table;
+    String shown = names.front();
+    for (std::size_t n = 1; n < names.size(); ++n) shown += u'.' + names[n];
+    refuse<MessageCode::unknownSource>(place, shown);
+}
+
 bool Scope::isHidden(const ColumnRef& column) const {
     return std::any_of(mShared.begin(), mShared.end(),
                        [&](const Shared& shared) { return shared.other == column; });
@@ -104,10 +118,9 @@ ColumnRef Scope::column(StringView table, StringView name, std::size_t place) co
         if (auto found = find(name, place)) return *found;
         for (const ScopedTable& each : mTables) offer(each);
     } else {
-        const ScopedTable* from = tableNamed(table);
-        if (!from) refuse<MessageCode::unknownSource>(place, table);
-        if (const auto* column = columnOf(*from, name)) return refTo(*from, *column);
-        offer(*from);
+        const ScopedTable& from = source({String(table)}, place);
+        if (const auto* column = columnOf(from, name)) return refTo(from, *column);
+        offer(from);
     }
     if (const auto similar = nearest(name, near))
         refuse<MessageCode::unknownColumnNear>(place, name, *similar);

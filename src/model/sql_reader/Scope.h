@@ -15,6 +15,7 @@ using model::sql::Node;
 struct ScopedTable {
     String alias;                                  ///< what columns call it
     std::vector<model::ColumnDescription> columns; ///< in their order
+    std::vector<String> schemas{};                 ///< what may stand before it
 };
 
 /// The names that a place of a statement may use: those of the tables in its FROM.
@@ -44,6 +45,10 @@ public:
     std::vector<model::criteria::NamedColumn> columnsNamed(StringView table,
                                                            StringView column) const override;
     std::vector<model::criteria::NamedColumn> columnsNamed(StringView column) const override;
+
+    /// The same by all names that stand before a column or star. Throws Refused with the place where
+    /// no table has them.
+    const ScopedTable& source(const std::vector<String>& names, std::size_t place) const;
 
 private:
     struct Shared {

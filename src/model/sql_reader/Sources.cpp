@@ -66,7 +66,7 @@ StatementReader::Source StatementReader::table(const Tree& tree, Scope& scope, S
         refuse<MessageCode::unknownTable>(tree.place(), name);
     }
     const String called = alias.empty() ? found->name : alias;
-    scope.add({called, found->columns}, tree.place());
+    scope.add({called, found->columns, {schema, found->schema}}, tree.place());
     into.tables.emplace(called, *found);
     into.commented.emplace(tree.place(), called);
     return made(sql::TableRef{found->schema, found->name, called});

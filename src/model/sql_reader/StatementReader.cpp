@@ -218,10 +218,10 @@ void StatementReader::item(const Tree& target, const ValueReader& values, Select
     }
     const auto fields = value.list("fields");
     if (fields.size() > 1) {
-        const String name = fields[fields.size() - 2].text("sval");
-        const ScopedTable* table = into.scope.tableNamed(name);
-        if (!table) refuse<MessageCode::unknownSource>(value.place(), name);
-        items.push_back({sql::AllColumns{table->alias}, {}});
+        std::vector<String> names;
+        for (const Tree& field : fields)
+            if (field.is("String")) names.push_back(field.text("sval"));
+        items.push_back({sql::AllColumns{into.scope.source(names, value.place()).alias}, {}});
     } else if (const auto all = into.scope.everything()) {
         for (const ColumnRef& column : *all) items.push_back({sql::make(column), {}});
     } else {

@@ -287,9 +287,8 @@ String ValueReader::column(const Tree& tree, Pass& pass) const {
         if (!field.is("String")) refuse<MessageCode::notUnderstood>(tree.place(), u"*");
         names.push_back(field.text("sval"));
     }
-    if (names.size() > 3) refuse<MessageCode::unknownColumn>(tree.place(), names.back());
-    // A schema before the table says what the table says already.
-    const String table = names.size() > 1 ? names[names.size() - 2] : String();
+    String table;
+    if (names.size() > 1) table = mScope.source({names.begin(), names.end() - 1}, tree.place()).alias;
     const auto alias = mAliases.find(model::foldedName(names.back()));
     if (names.size() == 1 && alias != mAliases.end() && !mScope.find(names.back(), tree.place()))
         return text(alias->second, pass);

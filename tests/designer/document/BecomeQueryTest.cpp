@@ -43,6 +43,8 @@ const char* const statements[] = {
     "SELECT c.name, l.id FROM late l JOIN customers c ON l.customer_id = c.id",
     "SELECT customers.name FROM customers, orders WHERE customers.id = orders.customer_id "
     "AND customers.name LIKE 'A%' AND orders.id BETWEEN 3 AND 9",
+    "-- who\nSELECT c.name, -- by name\n o.id\nFROM orders o -- all\n"
+    "JOIN customers c ON o.customer_id = c.id WHERE o.id > 3 -- late ones\nORDER BY 1 -- sorted",
 };
 
 /// What a query is, whatever its keys and places.

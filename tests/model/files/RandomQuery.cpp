@@ -122,8 +122,16 @@ private:
         }
     }
 
+    std::vector<model::Comment> comments() {
+        std::vector<model::Comment> all;
+        for (int n = upTo(3); n > 0; --n)
+            all.push_back({static_cast<model::CommentPlace>(upTo(6)), text(),
+                           static_cast<std::int16_t>(upTo(40)), chance(50), text()});
+        return all;
+    }
+
     void change() {
-        if (chance(30)) mQuery->options({chance(50), upTo(1000), text()});
+        if (chance(30)) mQuery->options({chance(50), upTo(1000), text(), comments()});
         const auto definition = any<model::ColumnDefinition>(mQuery->ColumnDefinitions());
         if (!definition) return;
         // The tables that are gone already are what makes an object read as nothing.

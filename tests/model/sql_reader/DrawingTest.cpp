@@ -71,14 +71,14 @@ TEST_F(Statement, HasTotalsAndGroupsAndConditionsBehindThem) {
     read(u"SELECT city, COUNT(*) AS n, SUM(total) FROM customers c JOIN orders o "
          u"ON o.customer_id = c.id WHERE active AND city <> 'Graz' GROUP BY city "
          u"HAVING COUNT(*) > 3 AND MAX(total) < 100 ORDER BY n DESC");
-    // What chooses stands where its condition stood.
-    EXPECT_EQ(columns(), (Texts{"(condition(c.active))", "c.city", "count(*) as n", "sum(o.total)",
-                                "(largest(o.total))"}));
-    EXPECT_EQ(criteria(1), (Texts{"4: True"}));
-    EXPECT_EQ(criteria(2), (Texts{"4: <> Graz"}));
-    EXPECT_EQ(criteria(3), (Texts{"4: > 3"}));
-    EXPECT_EQ(criteria(5), (Texts{"4: < 100"}));
-    EXPECT_EQ(record.definitions[2].sortOrder, 2);
+    // What chooses rows is asked behind what they are put together by.
+    EXPECT_EQ(columns(), (Texts{"c.city", "count(*) as n", "sum(o.total)", "(largest(o.total))",
+                                "(condition(c.active))"}));
+    EXPECT_EQ(criteria(1), (Texts{"4: <> Graz"}));
+    EXPECT_EQ(criteria(2), (Texts{"4: > 3"}));
+    EXPECT_EQ(criteria(4), (Texts{"4: < 100"}));
+    EXPECT_EQ(criteria(5), (Texts{"4: True"}));
+    EXPECT_EQ(record.definitions[1].sortOrder, 2);
 }
 
 TEST_F(Statement, SortsByPrioritiesOnlyWhereTheColumnsStandInAnotherOrder) {

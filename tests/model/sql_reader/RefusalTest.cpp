@@ -61,3 +61,12 @@ TEST_F(Refusals, ComeOfTooMuchAndTooDeepAndNothingElseDoes) {
     EXPECT_EQ(refusal(select + std::u16string(200'000, u' ')).substr(0, 24),
               "Line 1, column 100001: t");
 }
+
+TEST_F(Refusals, NameASchemaThatTheTableIsNotOf) {
+    EXPECT_EQ(refusal(u"SELECT other.customers.name FROM customers"),
+              refusal(u"SELECT other.customers.* FROM customers"));
+    EXPECT_NE(refusal(u"SELECT other.customers.name FROM customers").find("\"other.customers\""),
+              std::string::npos)
+        << refusal(u"SELECT other.customers.name FROM customers");
+    EXPECT_EQ(refusal(u"SELECT main.customers.name, main.customers.* FROM main.customers"), "drawn");
+}
