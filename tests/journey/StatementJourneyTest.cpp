@@ -82,8 +82,8 @@ TEST_F(AStatementOnAScreen, IsPastedChangedInTheDrawingAndCopied) {
     // Copied with its comment: put in the place of all, it is there.
     const QString said = text();
     EXPECT_TRUE(said.contains("l.quantity > 10 -- what sells")) << said.toStdString();
-    goToStatement();
     designer->click("control copy");
+    goToStatement();
     screen.key("ctrl+a");
     screen.key("ctrl+v");
     await("what was copied is there", [this] { return text().endsWith(';'); });
@@ -93,7 +93,8 @@ TEST_F(AStatementOnAScreen, IsPastedChangedInTheDrawingAndCopied) {
     // Typed on, and the table stays where it was put.
     goToStatement();
     screen.key("ctrl+End");
-    screen.type(" AND o.id > 5");
+    screen.key("BackSpace");
+    screen.type("AND o.id > 5");
     await("the drawing says it", [this] { return !designer->query().filter("> 5").isEmpty(); });
     EXPECT_EQ(designer->place("title c"), moved);
     screen.key("ctrl+a");
