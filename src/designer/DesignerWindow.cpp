@@ -389,7 +389,7 @@ void DesignerWindow::connectParts() {
     });
     connect(mFiles, &FileDialogs::saved, this,
             [this] { tell(tr("Saved as %1.").arg(platform::qt::asSigns(mFile.name()))); });
-    connect(mFiles, &FileDialogs::opened, mDatabases, &DatabaseCommands::followFile);
+    connect(mFiles, &FileDialogs::opened, this, &DesignerWindow::followFile);
     connect(mFiles, &FileDialogs::opened, mSavedQueries, &SavedQueryCommands::followFiles);
     connect(&mDocument, &Document::replaced, statusBar(), &QStatusBar::clearMessage);
     connect(mFiles, &FileDialogs::gone, this,
@@ -409,7 +409,7 @@ std::optional<QString> DesignerWindow::openAtFirst(const Arguments& arguments,
                                                    const QString& sample) {
     if (arguments.file.endsWith(QLatin1String(".json"), Qt::CaseInsensitive)) {
         if (auto error = mFile.open(arguments.file)) return error;
-        mDatabases->followFile();
+        followFile();
         mSavedQueries->followFiles();
         return {};
     }
@@ -437,7 +437,12 @@ void DesignerWindow::keepSafe(const QString& folder) {
     });
     connect(new EndingSignals(this), &EndingSignals::ending, this, &DesignerWindow::saveForTheEnd);
     connect(qGuiApp, &QGuiApplication::commitDataRequest, this, &DesignerWindow::saveForTheEnd);
-    if (offerRecovery(mFile, *mAutosave, folder, this)) mDatabases->followFile();
+    if (offerRecovery(mFile, *mAutosave, folder, this)) followFile();
+}
+
+void DesignerWindow::followFile() {
+    mDatabases->followFile();
+    mStatement->typing()->readReplaced();
 }
 
 void DesignerWindow::tell(const QString& message) {

@@ -73,6 +73,7 @@ private:
     void restoreLayout();
     void lookAround();
     void saveForTheEnd();
+    void followFile();
     void showTable(const QString& name);
     /// In the status bar, for a while.
     void tell(const QString& message);

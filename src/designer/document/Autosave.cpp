@@ -16,6 +16,7 @@ Autosave::Autosave(Document& document, QueryFile& file, const QString& folder,
     mTimer.setInterval(delay);
     connect(&mTimer, &QTimer::timeout, this, &Autosave::save);
     connect(&document, &Document::changed, this, &Autosave::documentChanged);
+    connect(&document, &Document::typedChanged, this, &Autosave::documentChanged);
     connect(&document, &Document::modifiedChanged, this, &Autosave::documentChanged);
     connect(&document, &Document::settled, this, [this] {
         if (mTyping && !mTimer.isActive()) mTimer.start();

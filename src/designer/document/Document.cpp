@@ -2,6 +2,7 @@
 
 #include "designer/document/Step.h"
 #include "designer/document/StepName.h"
+#include "designer/document/TypedStep.h"
 #include "frontends/qt/ZandorWindowMessage.h"
 
 #include <QAction>
@@ -10,6 +11,8 @@
 #include <QKeySequence>
 #include <QUndoStack>
 
+#include <algorithm>
+
 namespace zandor::designer {
 
 Document::Document(QObject* parent)
@@ -17,12 +20,14 @@ Document::Document(QObject* parent)
       mSteps(new QUndoStack(this)) {
     // Not from within the step, when the stack's own state is still the one before.
     connect(mSteps, &QUndoStack::indexChanged, this, [this] {
-        if (!std::exchange(mStepped, false)) return;
-        emit outdated();
-        emit changed();
+        if (std::exchange(mStepped, false)) {
+            emit outdated();
+            emit changed();
+        }
+        if (std::exchange(mTypedStepped, false)) emit typedChanged();
     });
-    connect(mSteps, &QUndoStack::cleanChanged, this,
-            [this](bool clean) { emit modifiedChanged(!clean); });
+    connect(mSteps, &QUndoStack::indexChanged, this, &Document::tellModified);
+    connect(mSteps, &QUndoStack::cleanChanged, this, &Document::tellModified);
     if (auto* application = QCoreApplication::instance()) application->installEventFilter(this);
 }
 
@@ -31,10 +36,29 @@ Document::~Document() {
     delete mSteps;
 }
 
-void Document::setQuery(const platform::Ref<model::Query>& query) {
+void Document::setTyped(Typed typed) {
+    if (mTyped == typed) return;
+    mTyped = std::move(typed);
+    emit typedChanged();
+    tellModified();
+}
+
+void Document::giveUpTyped(const QString& name) {
+    if (!mTyped) return;
+    settle();
+    mSteps->push(new TypedStep(name, [this](Typed typed) {
+        mTypedStepped = true;
+        return std::exchange(mTyped, std::move(typed));
+    }));
+}
+
+void Document::setQuery(const platform::Ref<model::Query>& query, Typed typed) {
     mQuery = query;
     mKnown = model::Snapshot(*mQuery);
+    mTyped = std::move(typed);
+    mSavedTyped = mTyped;
     mSteps->clear();
+    tellModified();
     emit replaced();
     emit outdated();
     emit changed();
@@ -65,14 +89,34 @@ QAction* Document::makeRedoAction(QObject* parent) {
     return action;
 }
 
-bool Document::isModified() { return !steps().isClean(); }
+bool Document::isModified() {
+    settle();
+    return isModifiedNow();
+}
+
+/// A text that was given up is no change where none was saved.
+bool Document::isModifiedNow() const {
+    if (mTyped != mSavedTyped || mSteps->cleanIndex() < 0) return true;
+    const auto [from, to] = std::minmax({mSteps->cleanIndex(), mSteps->index()});
+    for (int step = from; step < to; ++step)
+        if (!dynamic_cast<const TypedStep*>(mSteps->command(step))) return true;
+    return false;
+}
+
+void Document::tellModified() {
+    const bool modified = isModifiedNow();
+    if (std::exchange(mToldModified, modified) != modified) emit modifiedChanged(modified);
+}
 
 void Document::setModified(bool modified) {
     settle();
-    if (modified)
+    if (modified) {
         mSteps->resetClean();
-    else
+    } else {
+        mSavedTyped = mTyped;
         mSteps->setClean();
+    }
+    tellModified();
 }
 
 void Document::change(const QString& name, const std::function<void(model::Query&)>& how) {

@@ -90,6 +90,7 @@ files::QueryDocument QueryFile::content() const {
     mDocument.settle();
     files::QueryDocument content(mDocument.query());
     content.database = mDatabase.toStdU16String();
+    content.typed = mDocument.typed();
     content.unknown = mUnknown;
     return content;
 }
@@ -132,7 +133,7 @@ void QueryFile::take(const QString& path, const files::QueryDocument& content) {
     // Somebody may have written one into the file.
     mDatabase = partPassword(QString::fromStdU16String(content.database)).address;
     mUnknown = content.unknown;
-    mDocument.setQuery(content.query);
+    mDocument.setQuery(content.query, content.typed);
     emit changed();
 }
 

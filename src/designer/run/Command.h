@@ -15,6 +15,7 @@ struct Command {
     QString statement;
     QVariantList values;         ///< for the placeholders, in their order
     std::optional<qint64> limit; ///< so many rows are taken at most
+    bool isTyped = false;        ///< by somebody: the engine makes sure that it is one statement
 };
 
 /// A parameter of a query under its name, however often the query uses it.

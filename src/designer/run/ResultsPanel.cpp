@@ -9,6 +9,7 @@
 #include "designer/run/ParameterDialog.h"
 #include "designer/run/ResultTable.h"
 #include "designer/run/SummaryLine.h"
+#include "designer/run/typedCommand.h"
 #include "designer/statement/ModelWords.h"
 #include "frontends/qt/ShownText.h"
 
@@ -45,6 +46,7 @@ ResultsPanel::ResultsPanel(Document& document, Database& database, QWidget* pare
     connect(&mPatience, &QTimer::timeout, this, &ResultsPanel::giveUp);
     connect(&mDocument, &Document::replaced, this, &ResultsPanel::forget);
     connect(&mDocument, &Document::changed, this, &ResultsPanel::queryChanged);
+    connect(&mDocument, &Document::typedChanged, this, &ResultsPanel::queryChanged);
     connect(&mDatabase, &Database::opened, this, [this] {
         if (mDatabase.address() != mAddress) forget();
     });
@@ -64,9 +66,9 @@ void ResultsPanel::run() {
     const auto made = command(limit());
     if (!made) return;
     mSpool = std::make_shared<Spool>();
-    mAsked = asked();
+    takeAsked();
     showSpool();
-    mTable->rows().setFormats(ColumnFormats(*mDocument.query()));
+    mTable->rows().setFormats(mAskedTyped ? ColumnFormats() : ColumnFormats(*mDocument.query()));
     mFitted = false;
     start(*made, mSpool, {});
     showRows();
@@ -90,6 +92,10 @@ std::optional<Command> ResultsPanel::command(std::optional<qint64> limit) {
         return {};
     }
     mDocument.settle();
+    return mDocument.typed() ? typedCommand(limit) : drawnCommand(limit);
+}
+
+std::optional<Command> ResultsPanel::drawnCommand(std::optional<qint64> limit) {
     const auto dialect = mDatabase.dialect();
     const auto text = statementFor(*mDocument.query(), dialect, limit);
     if (!text.runnable()) {
@@ -104,6 +110,17 @@ std::optional<Command> ResultsPanel::command(std::optional<qint64> limit) {
     return makeCommand(text, dialect, mAnswers, limit);
 }
 
+std::optional<Command> ResultsPanel::typedCommand(std::optional<qint64> limit) {
+    const auto typed = typedRun(*mDocument.typed(), mDatabase.dialect());
+    if (!typed) {
+        showMessage(tr("The text that was typed cannot be run:\n%1").arg(typed.failure()));
+        return {};
+    }
+    if (!answerAll(questions(*typed))) return {};
+    mComparesTexts = false; // nobody knows
+    return makeCommand(*typed, mAnswers, limit);
+}
+
 /// The answers are kept for the next time.
 bool ResultsPanel::answerAll(const std::vector<Question>& questions) {
     if (questions.empty()) return true;
@@ -116,6 +133,7 @@ bool ResultsPanel::answerAll(const std::vector<Question>& questions) {
 void ResultsPanel::start(const Command& command, const std::shared_ptr<Sink>& sink,
                          const QString& file) {
     mStatement = command.statement;
+    mIsOfTyped = command.isTyped;
     mFile = file;
     if (file.isEmpty()) mAddress = mDatabase.address();
     mWorker.reset(new Worker(mDatabase.connector(), command, sink));
@@ -253,23 +271,34 @@ void ResultsPanel::forget() {
     showMessage(tr("Run the query to see its rows here."));
 }
 
-/// What the query asks for at the moment, of which places and widths are no part.
-platform::String ResultsPanel::asked() {
+void ResultsPanel::takeAsked() {
+    const auto& typed = mDocument.typed();
+    mAskedTyped = typed.has_value();
+    mAsked = typed ? typed->text : drawn();
+}
+
+/// What the drawing asks for at the moment, of which places and widths are no part.
+platform::String ResultsPanel::drawn() {
     return model::sql::statementText(*mDocument.query(), mDatabase.dialect(),
                                      model::sql::ValueForm::literal)
         .text;
 }
 
+bool ResultsPanel::isOutdated() {
+    if (!mAskedTyped) return drawn() != mAsked;
+    return !mDocument.typed() || mDocument.typed()->text != mAsked;
+}
+
 void ResultsPanel::queryChanged() {
     if (isRunning() || !mSpool || !areRowsShown()) return;
-    const bool isOutdated = asked() != mAsked;
+    const bool outdated = isOutdated();
     // How values are shown is no part of what is asked for, and seen at once.
-    if (!isOutdated && mTable->rows().setFormats(ColumnFormats(*mDocument.query()))) {
+    if (!outdated && !mAskedTyped && mTable->rows().setFormats(ColumnFormats(*mDocument.query()))) {
         mTable->widenColumns();
         drawChart();
     }
-    if (mOutdated == isOutdated) return;
-    mOutdated = isOutdated;
+    if (mOutdated == outdated) return;
+    mOutdated = outdated;
     showStatus();
 }
 
@@ -371,8 +400,12 @@ void ResultsPanel::setStatus(const QString& text) {
 
 void ResultsPanel::showStatus() {
     QStringList parts{mState};
+    if (mIsOfTyped && !mState.isEmpty())
+        parts << tr("of the text that was typed, not of the drawing");
     if (!mSorting.isEmpty()) parts << mSorting;
-    if (mOutdated) parts << tr("the drawing has changed since");
+    if (mOutdated)
+        parts << (mAskedTyped ? tr("the text is another by now")
+                              : tr("the drawing has changed since"));
     const QString text = parts.join(QStringLiteral(" \u00b7 "));
     mStatus->setText(platform::qt::asSigns(text));
     mStatus->setToolTip(platform::qt::asToolTip(text));

@@ -51,7 +51,8 @@ public:
     void proposeFile(const QString& path) { mProposed = path; }
     ChartPanel& chart() { return *mChart; }
 
-    /// Runs the query as it is drawn now and shows its rows, up to the limit. Asks for parameters.
+    /// Runs the query as it is drawn now, or the text that was typed in its place and is not drawn,
+    /// and shows its rows, up to the limit. Asks for parameters.
     void run();
     /// Ends what is running, on the engine too.
     void cancel();
@@ -71,6 +72,8 @@ private:
     void makeLayout();
     QWidget* makeMessagePage();
     std::optional<Command> command(std::optional<qint64> limit);
+    std::optional<Command> drawnCommand(std::optional<qint64> limit);
+    std::optional<Command> typedCommand(std::optional<qint64> limit);
     bool answerAll(const std::vector<Question>& questions);
     void start(const Command& command, const std::shared_ptr<Sink>& sink, const QString& file);
     void progress();
@@ -81,7 +84,9 @@ private:
     void runAll();
     void forget();
     QString whyEmpty() const;
-    platform::String asked();
+    void takeAsked();
+    platform::String drawn();
+    bool isOutdated();
     void queryChanged();
     void showSpool();
     bool areRowsShown() const;
@@ -100,6 +105,7 @@ private:
     QString mStatement;          ///< that ran last
     bool mComparesTexts = false; ///< the query that ran last
     platform::String mAsked;     ///< by the query whose rows are shown
+    bool mAskedTyped = false;    ///< as a text that was typed, and not by the drawing
     QString mProposed;           ///< for the file of an export
     QString mFile;               ///< that is being exported to; empty otherwise
     std::shared_ptr<Spool> mSpool;
@@ -111,6 +117,7 @@ private:
     QString mSorting; ///< how the rows are sorted here; empty: as they came
     bool mFitted = false;
     bool mOutdated = false;
+    bool mIsOfTyped = false; ///< what the status tells of
 
     QAction* mRun;
     QAction* mCancel;

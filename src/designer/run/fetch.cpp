@@ -2,6 +2,7 @@
 
 #include "designer/run/EngineStop.h"
 #include "designer/run/MysqlResult.h"
+#include "designer/run/keepToOne.h"
 #include "designer/run/writtenOut.h"
 #include "designer/statement/ModelWords.h"
 
@@ -57,6 +58,9 @@ public:
     }
 
     Outcome run(const Command& command, Sink& sink) {
+        if (command.isTyped)
+            if (const auto wrong = keepToOne(mConnection.database(), command.statement))
+                return broken(*wrong);
         if (!send(mQuery, mConnection.database(), command)) return broken();
         CellReader cells(mQuery, mConnection.database());
         if (const auto error = sink.begin(cells.columns()))
@@ -64,6 +68,8 @@ public:
         while (mQuery.next()) {
             if (mStop) return leave(Outcome::End::cancelled);
             if (command.limit && mRows == *command.limit) {
+                // A drawing's statement has said how many rows to give.
+                if (command.isTyped) mEngineStop.stop();
                 mQuery.finish();
                 return finished(sink, {Outcome::End::limited, {}, mRows});
             }
@@ -89,8 +95,9 @@ private:
         return outcome;
     }
 
-    Outcome broken() {
-        const QString said = words(mQuery.lastError());
+    Outcome broken() { return broken(words(mQuery.lastError())); }
+
+    Outcome broken(const QString& said) {
         mQuery.finish();
         if (mStop) return {Outcome::End::cancelled, {}, mRows};
         return {answers(mConnection) ? Outcome::End::failed : Outcome::End::lost, said, mRows};

@@ -5,12 +5,32 @@
 
 #include <QFontDatabase>
 #include <QKeyEvent>
+#include <QMimeData>
 #include <QScrollBar>
 #include <QSignalBlocker>
 
 #include <algorithm>
 
 namespace zandor::designer {
+
+namespace {
+
+/// What no engine and no file takes, a NUL or half a character, is seen as the sign for that.
+QString withoutHalves(QString text) {
+    const qsizetype size = text.size();
+    for (qsizetype at = 0; at < size; ++at) {
+        const QChar c = text.at(at);
+        const bool whole =
+            c.isHighSurrogate() && at + 1 < size && text.at(at + 1).isLowSurrogate();
+        if (whole)
+            ++at;
+        else if (c.isNull() || c.isSurrogate())
+            text[at] = QChar::ReplacementCharacter;
+    }
+    return text;
+}
+
+} // namespace
 
 SqlView::SqlView(QWidget* parent)
     : QPlainTextEdit(parent), mHighlighter(new SqlHighlighter(document(), palette())) {
@@ -49,11 +69,19 @@ QString SqlView::text() const {
 void SqlView::type(const QString& text) {
     QTextCursor cursor(document());
     cursor.select(QTextCursor::Document);
-    cursor.insertText(text);
+    cursor.insertText(withoutHalves(text));
     setTextCursor(cursor);
 }
 
 void SqlView::forgetTyping() { document()->clearUndoRedoStacks(); }
+
+/// By whatever way, with the keyboard or the mouse.
+void SqlView::insertFromMimeData(const QMimeData* source) {
+    if (!source->hasText()) return;
+    QMimeData plain;
+    plain.setText(withoutHalves(source->text()));
+    QPlainTextEdit::insertFromMimeData(&plain);
+}
 
 /// The highlighter changes the document too, but not its text.
 void SqlView::hear() {

@@ -51,6 +51,7 @@ signals:
     void turnedAway();
 
 protected:
+    void insertFromMimeData(const QMimeData* source) override;
     void changeEvent(QEvent* event) override;
     bool event(QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;

@@ -127,19 +127,35 @@ void StatementPanel::takeTyping(Database& database, StatementTyping::Draw draw) 
     connect(mFormat, &QPushButton::clicked, mTyping, &StatementTyping::discard);
     connect(mTyping, &StatementTyping::changed, this, &StatementPanel::showTyping);
     connect(&database, &Database::opened, this, &StatementPanel::queue);
+    connect(&mDocument, &Document::replaced, this, &StatementPanel::followTyped);
+    connect(&mDocument, &Document::typedChanged, this, &StatementPanel::followTyped);
     showNow();
+}
+
+/// A text stays in the dialect that it was typed in.
+void StatementPanel::followTyped() {
+    const auto& typed = mDocument.typed();
+    if (!typed || typed->dialect == dialect()) return;
+    const auto* const found = std::ranges::find(model::sql::allDialects, typed->dialect);
+    mDialects->setCurrentIndex(static_cast<int>(found - std::begin(model::sql::allDialects)) + 1);
 }
 
 QString StatementPanel::text() const { return mView->text(); }
 
-/// What is typed is in one of three states: it is drawn, it is not read yet, or it cannot be.
+/// What is typed is in one of four states: it is drawn, it is not read yet, it cannot be, or it
+/// came with its query and there is no database to read it by.
 void StatementPanel::showTyping() {
     mFormat->setEnabled(mTyping->isOwnText() && !mTyping->sleeps());
     mCopy->setEnabled(!mView->text().isEmpty());
     const auto& why = mTyping->refusal();
     mView->setAccessibleDescription(why ? why->withPlace() : mView->placeholderText());
     if (why)
-        mAsleep->say(tr("%1 The drawing sleeps until this can be read.").arg(why->withPlace()));
+        mAsleep->say(
+            tr("%1 The drawing sleeps until this can be read; Run takes the text as it is.")
+                .arg(why->withPlace()));
+    else if (mTyping->sleeps() && mView->isReadOnly())
+        mAsleep->say(tr("This text is not drawn, and the drawing sleeps: open a database, and it "
+                        "is read."));
     else
         mAsleep->hide();
 }
@@ -147,6 +163,7 @@ void StatementPanel::showTyping() {
 void StatementPanel::setDatabaseDialect(Dialect dialect) {
     mDatabaseDialect = dialect;
     mDialects->setItemText(0, tr("%1 (as the database)").arg(shownName(dialect)));
+    followTyped();
     queue();
 }
 

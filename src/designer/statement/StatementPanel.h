@@ -69,6 +69,7 @@ private:
     void showFindings(const model::Findings& findings);
     void divide();
     void showTyping();
+    void followTyped();
     void choose(int row);
 
     Document& mDocument;

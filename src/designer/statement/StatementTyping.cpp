@@ -15,6 +15,9 @@
 
 namespace zandor::designer {
 
+using platform::qt::fromQt;
+using platform::qt::toQt;
+
 namespace {
 
 constexpr int pause = 500; // milliseconds
@@ -33,14 +36,21 @@ StatementTyping::StatementTyping(Document& document, Database& database, SqlView
     });
     connect(&view, &SqlView::turnedAway, this, &StatementTyping::readNow);
     qApp->installEventFilter(this);
-    // What was typed for another query says nothing of this one.
-    connect(&document, &Document::replaced, this, &StatementTyping::discard);
-    const auto follow = [this] { mView.setReadOnly(!mDatabase.isOpen()); };
-    connect(&database, &Database::opened, this, follow);
-    follow();
+    connect(&document, &Document::replaced, this, &StatementTyping::replaced);
+    connect(&document, &Document::typedChanged, this, &StatementTyping::follow);
+    const auto lock = [this] { mView.setReadOnly(!mDatabase.isOpen()); };
+    connect(&database, &Database::opened, this, lock);
+    connect(&database, &Database::opened, this, &StatementTyping::readReplaced);
+    lock();
 }
 
 bool StatementTyping::isOwnText() const { return mView.text() != mStatement; }
+
+void StatementTyping::setDialect(model::sql::Dialect dialect) {
+    if (std::exchange(mDialect, dialect) == dialect || !mWaits) return;
+    keep();
+    mPause.start();
+}
 
 void StatementTyping::show(const QString& statement) {
     mStatement = statement;
@@ -51,6 +61,8 @@ void StatementTyping::show(const QString& statement) {
 }
 
 void StatementTyping::type(const QString& text) {
+    // What stands there and is not drawn would be gone with the step that draws this one.
+    if (mWaits && mView.text() != text) discard();
     mView.type(text);
     readNow();
 }
@@ -68,6 +80,11 @@ bool StatementTyping::eventFilter(QObject* watched, QEvent* event) {
 }
 
 void StatementTyping::discard() {
+    wake();
+    mDocument.giveUpTyped(tr("Back to the drawing"));
+}
+
+void StatementTyping::wake() {
     mPause.stop();
     mWaits = false;
     mRefusal.reset();
@@ -76,19 +93,55 @@ void StatementTyping::discard() {
     emit changed();
 }
 
+/// Of another document, or of a step of this one.
+void StatementTyping::follow() {
+    const auto& typed = mDocument.typed();
+    const QString text = typed ? toQt(typed->text) : QString();
+    if (typed && mWaits && mView.text() == text) return;
+    if (!typed && !mWaits) return;
+    if (!typed) return wake();
+    mView.setStatement(text);
+    mWaits = true;
+    mRefusal.reset();
+    if (!mComesFirst) mPause.start();
+    emit changed();
+}
+
+void StatementTyping::replaced() {
+    wake();
+    mComesFirst = mDocument.typed().has_value();
+    follow();
+}
+
+void StatementTyping::readReplaced() {
+    if (!mDatabase.isOpen()) return;
+    mComesFirst = false;
+    if (mWaits) mPause.start();
+}
+
+void StatementTyping::keep() {
+    if (mWaits)
+        mDocument.setTyped(files::TypedStatement{fromQt(mView.text()), mDialect});
+    else
+        mDocument.setTyped({});
+}
+
 void StatementTyping::heard() {
     mRefusal.reset();
     mView.mark(-1);
+    mComesFirst = false;
     mWaits = mView.text() != mStatement;
     if (mWaits)
         mPause.start();
     else
         mPause.stop();
+    keep();
     emit changed();
 }
 
 void StatementTyping::read() {
     mPause.stop();
+    if (mComesFirst || !mDatabase.isOpen()) return;
     const QString text = mView.text();
     const auto named = tablesNamedIn(text, mDatabase.tables());
     // A file is read as quickly as memory.
@@ -128,10 +181,11 @@ void StatementTyping::refuse(const Undrawn& why) {
 void StatementTyping::take(model::Query& query) {
     mWaits = false;
     mDraw(query);
-    mStatement = platform::qt::toQt(
-        statementText(*mDocument.query(), mDialect, model::sql::ValueForm::literal).text);
+    mStatement =
+        toQt(statementText(*mDocument.query(), mDialect, model::sql::ValueForm::literal).text);
     mDrawnAs = mStatement;
     mView.forgetTyping();
+    keep();
     emit changed();
 }
 

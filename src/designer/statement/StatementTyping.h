@@ -14,7 +14,7 @@ class SqlView;
 
 /// What is typed into the view of the statement becomes the drawing, as one step, when the typing
 /// pauses and the text can be read. Until then, and when it cannot, the drawing sleeps: it stays as
-/// it is, and the text too.
+/// it is, and the text too, which the document has then.
 class StatementTyping final : public QObject {
     Q_OBJECT
 
@@ -25,8 +25,8 @@ public:
     /// All outlive it. Typing needs an open database.
     StatementTyping(Document& document, Database& database, SqlView& view, Draw draw);
 
-    /// The dialect that is typed.
-    void setDialect(model::sql::Dialect dialect) { mDialect = dialect; }
+    /// The dialect that is typed. What sleeps is read anew in another one.
+    void setDialect(model::sql::Dialect dialect);
     /// The statement that the drawing says now. It is shown, unless what was typed still says it,
     /// or waits to be read.
     void show(const QString& statement);
@@ -35,7 +35,9 @@ public:
     void type(const QString& text);
     /// Reads what waits, at once: nothing goes on without what was typed.
     void readNow();
-    /// The drawing's statement takes the place of whatever was typed.
+    /// A document that was replaced has its database now: what came with it is read.
+    void readReplaced();
+    /// The drawing's statement takes the place of whatever was typed; a step that can be undone.
     void discard();
 
     /// Whether the text is another than the drawing's.
@@ -53,6 +55,10 @@ signals:
 
 private:
     void heard();
+    void keep();
+    void follow();
+    void replaced();
+    void wake();
     void read();
     void readTablesFirst(const std::vector<reader::TableId>& tables);
     void refuse(const Undrawn& why);
@@ -67,6 +73,7 @@ private:
     QString mStatement;              ///< the drawing's
     std::optional<QString> mDrawnAs; ///< the drawing's, when the text in the view was drawn
     bool mWaits = false;
+    bool mComesFirst = false; ///< the database that the text is to be read by
     std::optional<Undrawn> mRefusal;
 };
 

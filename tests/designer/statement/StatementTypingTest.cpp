@@ -108,7 +108,7 @@ TEST_F(TypingAStatement, SaysWhereItCannotBeReadAndTouchesNothing) {
     EXPECT_EQ(
         asleep().text().toStdString(),
         "Line 2, column 3: no table has a column \"stadus\"; is \"status\" meant? The drawing "
-        "sleeps until this can be read.");
+        "sleeps until this can be read; Run takes the text as it is.");
     ASSERT_TRUE(view().isMarked());
     EXPECT_EQ(view().marked().selectedText(), "stadus");
     EXPECT_EQ(query().ColumnDefinitions().Count(), 1);
@@ -148,7 +148,8 @@ TEST_F(TypingAStatement, GoesBackToTheDrawingsTextByEscapeOrByTheButton) {
         EXPECT_FALSE(typing().sleeps());
         EXPECT_FALSE(asleep().isVisible());
         EXPECT_FALSE(view().isMarked());
-        EXPECT_EQ(steps(), 1);
+        EXPECT_EQ(document.steps().undoText(), "Back to the drawing");
+        EXPECT_EQ(query().ColumnDefinitions().Count(), 1);
     }
 }
 
