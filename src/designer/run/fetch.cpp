@@ -60,8 +60,8 @@ public:
     Outcome run(const Command& command, Sink& sink) {
         if (command.isTyped)
             if (const auto wrong = keepToOne(mConnection.database(), command.statement))
-                return broken(*wrong);
-        if (!send(mQuery, mConnection.database(), command)) return broken();
+                return broken(wrong->isEmpty() ? words({}) : *wrong);
+        if (!send(mQuery, mConnection.database(), command)) return broken(said(command));
         CellReader cells(mQuery, mConnection.database());
         if (const auto error = sink.begin(cells.columns()))
             return leave(Outcome::End::refused, *error);
@@ -78,7 +78,7 @@ public:
             ++mRows;
         }
         // A failure between two rows ends the loop like the last row does.
-        if (mQuery.lastError().isValid()) return broken();
+        if (mQuery.lastError().isValid()) return broken(said(command));
         return finished(sink, {Outcome::End::complete, {}, mRows});
     }
 
@@ -95,7 +95,13 @@ private:
         return outcome;
     }
 
-    Outcome broken() { return broken(words(mQuery.lastError())); }
+    /// What PostgreSQL shows of a text below its words is seen where the text was typed.
+    QString said(const Command& command) const {
+        const QString all = words(mQuery.lastError());
+        if (!command.isTyped) return all;
+        const bool shows = mConnection.database().driverName() == QLatin1String("QPSQL");
+        return (shows ? all.section(u'\n', 0, 0) : all).simplified();
+    }
 
     Outcome broken(const QString& said) {
         mQuery.finish();

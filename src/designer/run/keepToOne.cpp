@@ -19,21 +19,22 @@ void* connectionOf(const QSqlDatabase& database) {
 std::optional<QString> preparedByPostgres(const QSqlDatabase& database, const QString& statement) {
     void* (*prepare)(void*, const char*, const char*, int, const unsigned*) = nullptr;
     int (*status)(const void*) = nullptr;
-    char* (*words)(const void*) = nullptr;
+    const char* (*field)(const void*, int) = nullptr;
     void (*clear)(void*) = nullptr;
     void* const connection = connectionOf(database);
     const bool found = connection && findInDriver(database, "PQprepare", prepare) &&
                        findInDriver(database, "PQresultStatus", status) &&
-                       findInDriver(database, "PQresultErrorMessage", words) &&
+                       findInDriver(database, "PQresultErrorField", field) &&
                        findInDriver(database, "PQclear", clear);
     if (!found) return QStringLiteral("PQprepare");
     constexpr int commandOk = 1;
     void* const result = prepare(connection, "", statement.toUtf8().constData(), 0, nullptr);
     const bool well = status(result) == commandOk;
-    const QString said = QString::fromUtf8(words(result)).trimmed();
+    const QString said = QString::fromUtf8(field(result, 'M'));
+    const QString hint = QString::fromUtf8(field(result, 'H'));
     clear(result);
     if (well) return {};
-    return said;
+    return hint.isEmpty() ? said : QStringLiteral("%1 (%2)").arg(said, hint);
 }
 
 std::optional<QString> toldToMysql(const QSqlDatabase& database) {
