@@ -443,6 +443,9 @@ void DesignerWindow::keepSafe(const QString& folder) {
 void DesignerWindow::followFile() {
     mDatabases->followFile();
     mStatement->typing()->readReplaced();
+    if (!mDocument.typed()) return;
+    mStatement->parentWidget()->show(); // where one sees that the drawing sleeps
+    mStatement->parentWidget()->raise();
 }
 
 void DesignerWindow::tell(const QString& message) {

@@ -103,6 +103,52 @@ TEST_F(AStatementOnAScreen, IsPastedChangedInTheDrawingAndCopied) {
     EXPECT_EQ(designer->place("title c"), moved);
 }
 
+TEST_F(AStatementOnAScreen, ThatHasNoDrawingIsRunSavedOpenedAndGivenUp) {
+    const QString ranked = "SELECT name, rank() OVER (ORDER BY name DESC) AS place FROM customers "
+                           "WHERE id < 8";
+    goToStatement();
+    screen.type("SELECT name FROM customers");
+    await("it is drawn", [this] { return tables() == 1; });
+    screen.key("ctrl+a");
+    screen.type(ranked);
+    await("it is refused", [this] { return designer->isShown("control asleep"); });
+    designer->picture("statement-4-asleep");
+
+    screen.key("F5");
+    await("its rows have come", [this] {
+        return designer->ask("text runStatus").join(' ').contains("of the text that was typed");
+    });
+    EXPECT_TRUE(designer->ask("text runStatus").join(' ').startsWith("Rows: 7"));
+    designer->picture("statement-5-rows");
+
+    screen.key("ctrl+s");
+    const QString file = home.filePath("ranked.json");
+    designer->place("control fileNameEdit");
+    screen.key("ctrl+a");
+    screen.type(file);
+    screen.key("Return");
+    await("it is saved", [&] { return QFile::exists(file); });
+    EXPECT_TRUE(designer->quit()) << "nothing is left to be asked for";
+
+    designer = std::make_unique<Designer>(screen, QStringLiteral(ZANDOR_APPLICATION_HOST),
+                                          QStringList{home.filePath("autosave"), file},
+                                          home.environment() + QStringList{"ZANDOR_MAXIMISED=1"});
+    await("it sleeps", [this] { return designer->isShown("control asleep"); });
+    EXPECT_EQ(text(), ranked);
+    EXPECT_EQ(tables(), 1);
+    screen.key("F5");
+    await("its rows have come again", [this] {
+        return designer->ask("text runStatus").join(' ').contains("of the text that was typed");
+    });
+    screen.key("ctrl+3");
+    designer->click("control backToDrawing");
+    designer->awaitGone("control asleep");
+    await("the drawing is awake", [this] { return text().startsWith("SELECT\n"); });
+    screen.key("ctrl+z");
+    await("the text is back", [&] { return text() == ranked; });
+    await("and sleeps", [this] { return designer->isShown("control asleep"); });
+}
+
 int main(int argc, char** argv) {
     // Whatever happens, nothing is left behind: the children die with this program.
     alarm(120);

@@ -84,9 +84,12 @@ void SqlHighlighter::highlightBlock(const QString& text) {
         at = close(text, open, 0);
         paint(0, at, opens[open].part);
     }
+    // The text is looked through once for halves of characters, and not with each match.
+    auto options = QRegularExpression::NoMatchOption;
     while (true) {
-        const auto match = mParts.match(text, at);
+        const auto match = mParts.match(text, at, QRegularExpression::NormalMatch, options);
         if (!match.hasMatch()) return;
+        options = QRegularExpression::DontCheckSubjectStringMatchOption;
         const qsizetype begin = match.capturedStart();
         at = match.capturedEnd();
         if (match.hasCaptured(u"open")) {

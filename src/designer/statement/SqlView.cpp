@@ -20,14 +20,24 @@ QString withoutHalves(QString text) {
     const qsizetype size = text.size();
     for (qsizetype at = 0; at < size; ++at) {
         const QChar c = text.at(at);
-        const bool whole =
-            c.isHighSurrogate() && at + 1 < size && text.at(at + 1).isLowSurrogate();
+        const bool whole = c.isHighSurrogate() && at + 1 < size && text.at(at + 1).isLowSurrogate();
         if (whole)
             ++at;
         else if (c.isNull() || c.isSurrogate())
             text[at] = QChar::ReplacementCharacter;
     }
     return text;
+}
+
+/// To look for the ends of words in such a line takes minutes.
+bool hasEndlessLine(QStringView text) {
+    constexpr qsizetype most = 10'000;
+    qsizetype begin = 0;
+    for (qsizetype end = 0; end >= 0; begin = end + 1) {
+        end = text.indexOf(u'\n', begin);
+        if ((end < 0 ? text.size() : end) - begin > most) return true;
+    }
+    return false;
 }
 
 } // namespace
@@ -49,10 +59,12 @@ void SqlView::setStatement(const QString& text) {
     const int down = verticalScrollBar()->value();
     mark(-1);
     mStatement = text;
+    wrapFor(lines);
     {
         const QSignalBlocker quiet(this);
         replace(text);
     }
+    if (!hasEndlessLine(lines)) setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
     mHeard = this->text();
     emit textChanged();
     forgetTyping();
@@ -67,6 +79,7 @@ QString SqlView::text() const {
 }
 
 void SqlView::type(const QString& text) {
+    wrapFor(text);
     QTextCursor cursor(document());
     cursor.select(QTextCursor::Document);
     cursor.insertText(withoutHalves(text));
@@ -75,9 +88,14 @@ void SqlView::type(const QString& text) {
 
 void SqlView::forgetTyping() { document()->clearUndoRedoStacks(); }
 
+void SqlView::wrapFor(const QString& text) {
+    if (hasEndlessLine(text)) setWordWrapMode(QTextOption::WrapAnywhere);
+}
+
 /// By whatever way, with the keyboard or the mouse.
 void SqlView::insertFromMimeData(const QMimeData* source) {
     if (!source->hasText()) return;
+    wrapFor(source->text());
     QMimeData plain;
     plain.setText(withoutHalves(source->text()));
     QPlainTextEdit::insertFromMimeData(&plain);
@@ -124,7 +142,9 @@ void SqlView::showMark() {
     while (begin > 0 && mMarked >= now.size() && now[begin].isSpace()) --begin;
     int end = begin;
     const auto isWord = [&](int at) { return now[at].isLetterOrNumber() || now[at] == u'_'; };
-    while (end < now.size() && isWord(end)) ++end;
+    // With what it is of: "o.id".
+    while (end < now.size() && (isWord(end) || (now[end] == u'.' && end > begin))) ++end;
+    while (end > begin && now[end - 1] == u'.') --end;
     end = std::max(end, begin + 1);
     wave.cursor = QTextCursor(document());
     wave.cursor.setPosition(begin);

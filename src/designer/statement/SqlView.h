@@ -59,6 +59,7 @@ protected:
 
 private:
     void replace(const QString& text);
+    void wrapFor(const QString& text);
     void hear();
     void showMark();
 

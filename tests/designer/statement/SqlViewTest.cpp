@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <QApplication>
+#include <QElapsedTimer>
 #include <QScrollBar>
 
 #include <random>
@@ -97,4 +98,31 @@ TEST(TheSqlView, PutsAWaveUnderTheWordAtAPlace) {
     EXPECT_EQ(view.marked().selectedText(), "o") << "something is missing behind it";
     view.mark(-1);
     EXPECT_FALSE(view.isMarked());
+}
+
+TEST(TheSqlView, TakesALineOfAMillionSignsInSeconds) {
+    designer::SqlView view;
+    view.setReadOnly(false);
+    view.resize(600, 200);
+    view.show();
+    QElapsedTimer clock;
+    clock.start();
+    for (const QString& line : {QStringLiteral("name, ").repeated(170'000),
+                                u'\'' + QString(1'000'000, u'7') + u'\''}) {
+        view.type(line);
+        view.insertPlainText("x");
+        QCoreApplication::processEvents();
+    }
+    view.setStatement("SELECT 1");
+    EXPECT_LT(clock.elapsed(), 20'000) << "milliseconds";
+    EXPECT_EQ(view.wordWrapMode(), QTextOption::WrapAtWordBoundaryOrAnywhere);
+}
+
+TEST(TheSqlView, MarksANameWithWhatItIsOf) {
+    designer::SqlView view;
+    view.setStatement("SELECT o.nam, 1. FROM orders o");
+    view.mark(7);
+    EXPECT_EQ(view.marked().selectedText(), "o.nam");
+    view.mark(14);
+    EXPECT_EQ(view.marked().selectedText(), "1");
 }
