@@ -404,7 +404,7 @@ void ResultsPanel::showStatus() {
         parts << tr("of the text that was typed, not of the drawing");
     if (!mSorting.isEmpty()) parts << mSorting;
     if (mOutdated)
-        parts << (mAskedTyped ? tr("the text is another by now")
+        parts << (mAskedTyped ? tr("the text has changed since")
                               : tr("the drawing has changed since"));
     const QString text = parts.join(QStringLiteral(" \u00b7 "));
     mStatus->setText(platform::qt::asSigns(text));

@@ -1512,6 +1512,14 @@
         <source>&quot;%1&quot; is no text in UTF-8; save it as such.</source>
         <translation>„%1“ ist kein Text in UTF-8; speichern Sie die Datei so.</translation>
     </message>
+    <message>
+        <source>A text that is not drawn is not run on this database, which nothing would keep from writing: go back to the drawing.</source>
+        <translation>Ein Text, der nicht gezeichnet ist, läuft auf dieser Datenbank nicht, denn nichts hielte sie vom Schreiben ab: gehen Sie zurück zur Zeichnung.</translation>
+    </message>
+    <message>
+        <source>The text is in %1, and the database speaks %2: choose that above the text.</source>
+        <translation>Der Text ist in %1, und die Datenbank spricht %2: wählen Sie das über dem Text.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -2383,6 +2391,33 @@ Ziehen Sie dann ihre Spalten in das Raster darunter.</translation>
     </message>
 </context>
 <context>
+    <name>zandor::designer::OneQuery</name>
+    <message>
+        <source>There is no statement: write one, or go back to the drawing.</source>
+        <translation>Es gibt keine Anweisung: schreiben Sie eine, oder gehen Sie zurück zur Zeichnung.</translation>
+    </message>
+    <message>
+        <source>what begins here has no end: close it.</source>
+        <translation>was hier beginnt, hat kein Ende: schließen Sie es.</translation>
+    </message>
+    <message>
+        <source>a NUL stands here: delete it.</source>
+        <translation>hier steht ein NUL: löschen Sie es.</translation>
+    </message>
+    <message>
+        <source>a second statement begins here: one is run at a time.</source>
+        <translation>hier beginnt eine zweite Anweisung: ausgeführt wird eine auf einmal.</translation>
+    </message>
+    <message>
+        <source>only a query is run: it begins with SELECT, WITH, VALUES or TABLE.</source>
+        <translation>ausgeführt wird nur eine Abfrage: sie beginnt mit SELECT, WITH, VALUES oder TABLE.</translation>
+    </message>
+    <message>
+        <source>INTO writes, and the database is only read: leave it out.</source>
+        <translation>INTO schreibt, und die Datenbank wird nur gelesen: lassen Sie es weg.</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::Opening</name>
     <message>
         <source>Connecting to %1…</source>
@@ -2822,6 +2857,20 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
         <source>Show the rows as a chart (Ctrl+5), and as a table again (Ctrl+4)</source>
         <translation>Die Zeilen als Diagramm zeigen (Strg+5) und wieder als Tabelle (Strg+4)</translation>
     </message>
+    <message>
+        <source>The text that was typed cannot be run:
+%1</source>
+        <translation>Der geschriebene Text kann nicht ausgeführt werden:
+%1</translation>
+    </message>
+    <message>
+        <source>of the text that was typed, not of the drawing</source>
+        <translation>vom geschriebenen Text, nicht von der Zeichnung</translation>
+    </message>
+    <message>
+        <source>the text has changed since</source>
+        <translation>der Text hat sich seitdem geändert</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::SavedQueryCommands</name>
@@ -3010,12 +3059,16 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
         <translation>Die Anweisung der Zeichnung tritt an die Stelle des Textes (Esc)</translation>
     </message>
     <message>
-        <source>%1 The drawing sleeps until this can be read.</source>
-        <translation>%1 Die Zeichnung ruht, bis sich das lesen lässt.</translation>
-    </message>
-    <message>
         <source>Add a table to begin, or write a SELECT here: it becomes the drawing.</source>
         <translation>Fügen Sie zuerst eine Tabelle hinzu, oder schreiben Sie hier ein SELECT: Es wird zur Zeichnung.</translation>
+    </message>
+    <message>
+        <source>%1 The drawing sleeps until this can be read; Run takes the text as it is.</source>
+        <translation>%1 Die Zeichnung ruht, bis sich das lesen lässt; „Ausführen“ nimmt den Text, wie er ist.</translation>
+    </message>
+    <message>
+        <source>This text is not drawn, and the drawing sleeps: open a database, and it is read.</source>
+        <translation>Dieser Text ist nicht gezeichnet, und die Zeichnung ruht: öffnen Sie eine Datenbank, dann wird er gelesen.</translation>
     </message>
 </context>
 <context>
@@ -3023,6 +3076,10 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>Change the SQL</source>
         <translation>SQL ändern</translation>
+    </message>
+    <message>
+        <source>Back to the drawing</source>
+        <translation>Zurück zur Zeichnung</translation>
     </message>
 </context>
 <context>
@@ -3478,6 +3535,10 @@ Klicken Sie, um die gezeigten Zeilen zu sortieren; die Abfrage bleibt, wie sie i
     <message>
         <source>--database goes with --run and --draw only.</source>
         <translation>--database geht nur mit --run und --draw.</translation>
+    </message>
+    <message>
+        <source>The text that was typed beside the drawing is left out.</source>
+        <translation>Der Text, der neben der Zeichnung geschrieben wurde, wird ausgelassen.</translation>
     </message>
 </context>
 </TS>

@@ -1512,6 +1512,14 @@
         <source>&quot;%1&quot; is no text in UTF-8; save it as such.</source>
         <translation>«%1» no es un texto en UTF-8; guárdelo así.</translation>
     </message>
+    <message>
+        <source>A text that is not drawn is not run on this database, which nothing would keep from writing: go back to the drawing.</source>
+        <translation>Un texto que no está dibujado no se ejecuta en esta base de datos, a la que nada impediría escribir: vuelva al dibujo.</translation>
+    </message>
+    <message>
+        <source>The text is in %1, and the database speaks %2: choose that above the text.</source>
+        <translation>El texto está en %1, y la base de datos habla %2: elíjalo encima del texto.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -2383,6 +2391,33 @@ Después arrastre sus columnas a la cuadrícula de abajo.</translation>
     </message>
 </context>
 <context>
+    <name>zandor::designer::OneQuery</name>
+    <message>
+        <source>There is no statement: write one, or go back to the drawing.</source>
+        <translation>No hay ninguna instrucción: escriba una, o vuelva al dibujo.</translation>
+    </message>
+    <message>
+        <source>what begins here has no end: close it.</source>
+        <translation>lo que empieza aquí no tiene fin: ciérrelo.</translation>
+    </message>
+    <message>
+        <source>a NUL stands here: delete it.</source>
+        <translation>aquí hay un NUL: bórrelo.</translation>
+    </message>
+    <message>
+        <source>a second statement begins here: one is run at a time.</source>
+        <translation>aquí empieza una segunda instrucción: se ejecuta una cada vez.</translation>
+    </message>
+    <message>
+        <source>only a query is run: it begins with SELECT, WITH, VALUES or TABLE.</source>
+        <translation>solo se ejecuta una consulta: empieza con SELECT, WITH, VALUES o TABLE.</translation>
+    </message>
+    <message>
+        <source>INTO writes, and the database is only read: leave it out.</source>
+        <translation>INTO escribe, y la base de datos solo se lee: omítalo.</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::Opening</name>
     <message>
         <source>Connecting to %1…</source>
@@ -2822,6 +2857,20 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
         <source>Show the rows as a chart (Ctrl+5), and as a table again (Ctrl+4)</source>
         <translation>Mostrar las filas como gráfico (Ctrl+5) y de nuevo como tabla (Ctrl+4)</translation>
     </message>
+    <message>
+        <source>The text that was typed cannot be run:
+%1</source>
+        <translation>El texto escrito no se puede ejecutar:
+%1</translation>
+    </message>
+    <message>
+        <source>of the text that was typed, not of the drawing</source>
+        <translation>del texto escrito, no del dibujo</translation>
+    </message>
+    <message>
+        <source>the text has changed since</source>
+        <translation>el texto ha cambiado desde entonces</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::SavedQueryCommands</name>
@@ -3010,12 +3059,16 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
         <translation>La instrucción del dibujo ocupa el lugar del texto (Esc)</translation>
     </message>
     <message>
-        <source>%1 The drawing sleeps until this can be read.</source>
-        <translation>%1 El dibujo queda en reposo hasta que esto se pueda leer.</translation>
-    </message>
-    <message>
         <source>Add a table to begin, or write a SELECT here: it becomes the drawing.</source>
         <translation>Añada una tabla para empezar, o escriba aquí un SELECT: se convierte en el dibujo.</translation>
+    </message>
+    <message>
+        <source>%1 The drawing sleeps until this can be read; Run takes the text as it is.</source>
+        <translation>%1 El dibujo queda en reposo hasta que esto se pueda leer; «Ejecutar» toma el texto tal como está.</translation>
+    </message>
+    <message>
+        <source>This text is not drawn, and the drawing sleeps: open a database, and it is read.</source>
+        <translation>Este texto no está dibujado, y el dibujo queda en reposo: abra una base de datos, y se leerá.</translation>
     </message>
 </context>
 <context>
@@ -3023,6 +3076,10 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>Change the SQL</source>
         <translation>Cambiar el SQL</translation>
+    </message>
+    <message>
+        <source>Back to the drawing</source>
+        <translation>Volver al dibujo</translation>
     </message>
 </context>
 <context>
@@ -3478,6 +3535,10 @@ Haga clic para ordenar las filas que se muestran; la consulta queda como está.<
     <message>
         <source>--database goes with --run and --draw only.</source>
         <translation>--database va solo con --run y --draw.</translation>
+    </message>
+    <message>
+        <source>The text that was typed beside the drawing is left out.</source>
+        <translation>El texto escrito junto al dibujo queda fuera.</translation>
     </message>
 </context>
 </TS>

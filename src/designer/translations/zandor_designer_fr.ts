@@ -1512,6 +1512,14 @@
         <source>&quot;%1&quot; is no text in UTF-8; save it as such.</source>
         <translation>«&#xa0;%1&#xa0;» n’est pas un texte en UTF-8&#xa0;; enregistrez-le ainsi.</translation>
     </message>
+    <message>
+        <source>A text that is not drawn is not run on this database, which nothing would keep from writing: go back to the drawing.</source>
+        <translation>Un texte qui n’est pas dessiné n’est pas exécuté sur cette base, que rien n’empêcherait d’écrire&#xa0;: revenez au dessin.</translation>
+    </message>
+    <message>
+        <source>The text is in %1, and the database speaks %2: choose that above the text.</source>
+        <translation>Le texte est en %1, et la base parle %2&#xa0;: choisissez-le au-dessus du texte.</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::Autosave</name>
@@ -2383,6 +2391,33 @@ Faites ensuite glisser ses colonnes dans la grille ci-dessous.</translation>
     </message>
 </context>
 <context>
+    <name>zandor::designer::OneQuery</name>
+    <message>
+        <source>There is no statement: write one, or go back to the drawing.</source>
+        <translation>Il n’y a pas d’instruction&#xa0;: écrivez-en une, ou revenez au dessin.</translation>
+    </message>
+    <message>
+        <source>what begins here has no end: close it.</source>
+        <translation>ce qui commence ici n’a pas de fin&#xa0;: fermez-le.</translation>
+    </message>
+    <message>
+        <source>a NUL stands here: delete it.</source>
+        <translation>il y a un NUL ici&#xa0;: supprimez-le.</translation>
+    </message>
+    <message>
+        <source>a second statement begins here: one is run at a time.</source>
+        <translation>une deuxième instruction commence ici&#xa0;: une seule est exécutée à la fois.</translation>
+    </message>
+    <message>
+        <source>only a query is run: it begins with SELECT, WITH, VALUES or TABLE.</source>
+        <translation>seule une requête est exécutée&#xa0;: elle commence par SELECT, WITH, VALUES ou TABLE.</translation>
+    </message>
+    <message>
+        <source>INTO writes, and the database is only read: leave it out.</source>
+        <translation>INTO écrit, et la base n’est que lue&#xa0;: omettez-le.</translation>
+    </message>
+</context>
+<context>
     <name>zandor::designer::Opening</name>
     <message>
         <source>Connecting to %1…</source>
@@ -2822,6 +2857,20 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
         <source>Show the rows as a chart (Ctrl+5), and as a table again (Ctrl+4)</source>
         <translation>Afficher les lignes en graphique (Ctrl+5), puis de nouveau en tableau (Ctrl+4)</translation>
     </message>
+    <message>
+        <source>The text that was typed cannot be run:
+%1</source>
+        <translation>Le texte saisi ne peut pas être exécuté&#xa0;:
+%1</translation>
+    </message>
+    <message>
+        <source>of the text that was typed, not of the drawing</source>
+        <translation>du texte saisi, et non du dessin</translation>
+    </message>
+    <message>
+        <source>the text has changed since</source>
+        <translation>le texte a changé depuis</translation>
+    </message>
 </context>
 <context>
     <name>zandor::designer::SavedQueryCommands</name>
@@ -3010,12 +3059,16 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
         <translation>L’instruction du dessin prend la place du texte (Échap)</translation>
     </message>
     <message>
-        <source>%1 The drawing sleeps until this can be read.</source>
-        <translation>%1 Le dessin est en sommeil jusqu’à ce que ceci puisse être lu.</translation>
-    </message>
-    <message>
         <source>Add a table to begin, or write a SELECT here: it becomes the drawing.</source>
         <translation>Ajoutez une table pour commencer, ou écrivez un SELECT ici&#xa0;: il devient le dessin.</translation>
+    </message>
+    <message>
+        <source>%1 The drawing sleeps until this can be read; Run takes the text as it is.</source>
+        <translation>%1 Le dessin est en sommeil jusqu’à ce que ceci puisse être lu&#xa0;; «&#xa0;Exécuter&#xa0;» prend le texte tel quel.</translation>
+    </message>
+    <message>
+        <source>This text is not drawn, and the drawing sleeps: open a database, and it is read.</source>
+        <translation>Ce texte n’est pas dessiné, et le dessin est en sommeil&#xa0;: ouvrez une base, et il sera lu.</translation>
     </message>
 </context>
 <context>
@@ -3023,6 +3076,10 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>Change the SQL</source>
         <translation>Modifier le SQL</translation>
+    </message>
+    <message>
+        <source>Back to the drawing</source>
+        <translation>Revenir au dessin</translation>
     </message>
 </context>
 <context>
@@ -3478,6 +3535,10 @@ Cliquez pour trier les lignes affichées&#xa0;; la requête reste telle quelle.<
     <message>
         <source>--database goes with --run and --draw only.</source>
         <translation>--database ne va qu’avec --run et --draw.</translation>
+    </message>
+    <message>
+        <source>The text that was typed beside the drawing is left out.</source>
+        <translation>Le texte saisi à côté du dessin est laissé de côté.</translation>
     </message>
 </context>
 </TS>

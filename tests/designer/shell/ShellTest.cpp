@@ -55,6 +55,21 @@ TEST_F(InAShell, PrintsTheStatement) {
     EXPECT_THAT(ended.out, EndsWith(";\n"));
 }
 
+TEST_F(InAShell, TakesTheDrawingAndSaysThatThereIsATextBesideIt) {
+    files::QueryDocument document(draw(database, {"numbers"}, {{"numbers.n", {"< 2"}}}));
+    document.database = database.toStdU16String();
+    document.typed = files::TypedStatement{u"SELECT rank() OVER () FROM numbers"};
+    const QString path = folder.path("typed.json");
+    ASSERT_FALSE(files::saveQuery(path.toStdString(), document));
+    for (const char* task : {"--sql", "--run"}) {
+        const Ended ended = runProgram({task, path});
+        EXPECT_EQ(ended.code, 0);
+        EXPECT_EQ(ended.err,
+                  "zandor-designer: The text that was typed beside the drawing is left out.\n");
+        EXPECT_THAT(ended.out, testing::Not(HasSubstr("rank")));
+    }
+}
+
 TEST_F(InAShell, PrintsTheStatementInADialect) {
     const QString query = savedNumbers({{"numbers.word", {"Like 'a*'"}}}, "postgresql://host/db");
     const Ended postgres = runProgram({"--sql", query});
