@@ -58,7 +58,7 @@ public:
         lastKey("definition", mRecord.lastKeys.definition);
         if (mRecord.options.first < 0 || mRecord.options.first > QueryOptions::greatestFirst)
             fault<MessageCode::notInRange>("first", 0, QueryOptions::greatestFirst);
-        if (!mRecord.options.isValid())
+        if (!mRecord.options.hasPlacedComments())
             fault<MessageCode::notInRange>("comments", 0, static_cast<int>(CommentPlace::end));
         for (std::size_t n = 0; n < mRecord.tables.size() && !mFault; ++n)
             table(mRecord.tables[n], at("tables", n));

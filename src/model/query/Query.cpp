@@ -88,7 +88,9 @@ void Query::DeleteTable(const Ref<ZDTable>& table) {
 }
 
 void Query::options(QueryOptions value) {
-    if (!value.isValid())
+    if (value.first < 0 || value.first > QueryOptions::greatestFirst)
+        throw platform::errors::invalidPropertyValue();
+    if (!value.hasPlacedComments())
         throw platform::errors::invalidPropertyValue();
     mOptions = std::move(value);
 }

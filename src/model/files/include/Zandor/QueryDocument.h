@@ -18,7 +18,7 @@ struct Unknown;
 
 /// A statement that somebody has typed for a query, and that the query does not say (yet).
 struct TypedStatement {
-    platform::String text = {};
+    platform::String text = {};                                ///< as it was typed
     model::sql::Dialect dialect = model::sql::Dialect::SQLite; ///< that it is typed in
 
     bool operator==(const TypedStatement&) const = default;

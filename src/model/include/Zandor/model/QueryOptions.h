@@ -16,12 +16,12 @@ struct QueryOptions {
     platform::String description = {}; ///< for people
     std::vector<Comment> comments = {}; ///< of its statement, in the order in which they stand there
 
-    /// Whether nothing is beyond what it may be.
-    bool isValid() const {
-        const auto last = CommentPlace::end;
+    /// Whether all comments stand by something.
+    bool hasPlacedComments() const {
         for (const Comment& comment : comments)
-            if (comment.place < CommentPlace::start || comment.place > last) return false;
-        return first >= 0 && first <= greatestFirst;
+            if (comment.place < CommentPlace::start || comment.place > CommentPlace::end)
+                return false;
+        return true;
     }
 
     friend bool operator==(const QueryOptions&, const QueryOptions&) = default;
