@@ -82,6 +82,35 @@ WHERE q.name <> 'x')");
     EXPECT_EQ(comments(), (Texts{"table t1 beside: outside"}));
 }
 
+TEST_F(Comments, OfSavedColumnsStayWithEachOfThem) {
+    expectKept(uR"(SELECT
+    q.id,
+    q.name
+FROM (
+    SELECT
+        orders.id,
+        orders.customer_id,
+        orders.placed,
+        orders.total,
+        customers.name -- the last
+    FROM orders
+        INNER JOIN customers ON orders.customer_id = customers.id
+) AS q)");
+}
+
+TEST_F(Comments, OfHiddenColumnsStandByWhatElseTheyDo) {
+    read(u"SELECT name FROM customers WHERE id > 5 ORDER BY city");
+    ASSERT_EQ(columns(), (Texts{"customers.name", "(customers.city)", "(customers.id)"}));
+    auto options = query->options();
+    const auto by = [](const model::DefinitionRecord& definition, const char16_t* said) {
+        return model::Comment{model::CommentPlace::column, definition.key, 0, true, said};
+    };
+    options.comments = {by(record.definitions[1], u"sorts"), by(record.definitions[2], u"asks")};
+    query->options(options);
+    EXPECT_EQ(text(), "SELECT\n    customers.name\nFROM customers\n"
+                      "WHERE customers.id > 5 -- asks\nORDER BY customers.city -- sorts");
+}
+
 TEST_F(Comments, BeforeWithStandBeforeItAgain) {
     expectKept(uR"(-- both
 WITH w AS (
