@@ -279,6 +279,7 @@ private:
     }
     void gesture(HWND box, POINT grip, POINT way);
     void drag(std::int16_t from, std::int32_t entry, const Spot& across, const Spot& to);
+    void carry(toolkit::Drags& drags);
     void held() const {
         if (onHeld) onHeld();
     }
@@ -300,7 +301,8 @@ private:
     StageEvents mEvents;
     HWND mHost = nullptr;
     HWND mHostField = nullptr;
-    HWND mDialog = nullptr; ///< the join dialog while it stands open
+    HWND mDialog = nullptr;  ///< the join dialog while it stands open
+    std::vector<POINT> mWay; ///< of a drag that begins now, on the screen; empty: it is given up
     bool mMenuSeen = false;
     HHOOK mActivated = nullptr;
     WindowsStage* const mBefore = sStage; ///< a test may have two
@@ -319,6 +321,8 @@ WindowsStage::WindowsStage(TalvikZandorLib::Library& library) : mEvents(*this) {
     // Not by a hook, of which each message of each window would have to be asked.
     sControls = reinterpret_cast<WNDPROC>(SetWindowLongPtrW(
         mControl->window(), GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(&overheard)));
+    // The mouse is the stage's.
+    surroundings().drags.setCarrier([this](toolkit::Drags& drags) { carry(drags); });
     mControl->setBounds({0, 0, 800, 600});
     mControl->show(true);
     ShowWindow(mHost, SW_SHOWNORMAL);
@@ -476,25 +480,32 @@ void WindowsStage::gesture(HWND box, POINT grip, POINT way) {
 
 void WindowsStage::drag(std::int16_t from, std::int32_t entry, const Spot& across, const Spot& to) {
     const Spot start = entrySpot(from, entry);
-    // The window that was pressed has the mouse wherever that goes.
-    const auto seenFrom = [&](const Spot& spot) {
+    for (const Spot& spot : {across, to}) {
+        if (!spot.window) continue;
         POINT at = spot.at;
-        MapWindowPoints(spot.window, start.window, &at, 1);
-        return at;
-    };
-    const POINT passed = across.window ? seenFrom(across) : POINT{};
-    const POINT end = seenFrom(to);
+        ClientToScreen(spot.window, &at);
+        mWay.push_back(at);
+    }
+    POINT end = mWay.back();
     press(start, 1);
     move({start.window, {start.at.x + 1, start.at.y}}, 1);
-    if (across.window && IsWindow(start.window)) {
-        hands::mouse(start.window, WM_MOUSEMOVE, passed, MK_LBUTTON);
+    // Where no drag has begun the button is still down.
+    const bool carried = mWay.empty();
+    mWay.clear();
+    if (!carried && ScreenToClient(start.window, &end))
+        hands::mouse(start.window, WM_LBUTTONUP, end, 0);
+    settle();
+}
+
+void WindowsStage::carry(toolkit::Drags& drags) {
+    const auto way = std::exchange(mWay, {});
+    for (const POINT& at : way) {
+        drags.moved(at);
         settle();
     }
-    if (IsWindow(start.window)) hands::mouse(start.window, WM_MOUSEMOVE, end, MK_LBUTTON);
-    settle();
+    if (way.empty()) return;
     held();
-    if (IsWindow(start.window)) hands::mouse(start.window, WM_LBUTTONUP, end, 0);
-    settle();
+    drags.letGo(way.back());
 }
 
 LRESULT CALLBACK WindowsStage::activated(int code, WPARAM w, LPARAM l) {

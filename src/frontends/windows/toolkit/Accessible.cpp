@@ -1,11 +1,11 @@
 #include "frontends/windows/toolkit/Accessible.h"
 
+#include "frontends/windows/toolkit/Counted.h"
 #include "frontends/windows/toolkit/Spoken.h"
 #include "frontends/windows/toolkit/Surroundings.h"
 #include "frontends/windows/toolkit/Text.h"
 
 #include <algorithm>
-#include <atomic>
 #include <utility>
 
 #include <oleacc.h>
@@ -28,38 +28,12 @@ VARIANT numbered(LONG number) {
 
 VARIANT self() { return numbered(CHILDID_SELF); }
 
-template <class Interface>
-class Counted : public Interface {
-public:
-    Counted() = default;
-    Counted(const Counted&) = delete;
-    Counted& operator=(const Counted&) = delete;
-    virtual ~Counted() = default;
-
-    STDMETHODIMP_(ULONG) AddRef() override { return ++mReferences; }
-    STDMETHODIMP_(ULONG) Release() override {
-        const ULONG left = --mReferences;
-        if (left == 0) delete this;
-        return left;
-    }
-
-private:
-    std::atomic<ULONG> mReferences = 0;
-};
-
 /// Walks the numbers of several parts.
 class Numbers final : public Counted<IEnumVARIANT> {
 public:
     Numbers(std::vector<int> numbers, std::size_t place, std::shared_ptr<void> keeper)
         : mKeeper(std::move(keeper)), mNumbers(std::move(numbers)), mPlace(place) {}
 
-    STDMETHODIMP QueryInterface(REFIID iid, void** object) override {
-        if (!object) return E_POINTER;
-        *object = iid == IID_IUnknown || iid == IID_IEnumVARIANT ? this : nullptr;
-        if (!*object) return E_NOINTERFACE;
-        AddRef();
-        return S_OK;
-    }
     STDMETHODIMP Next(ULONG count, VARIANT* items, ULONG* fetched) override {
         if (!items) return E_POINTER;
         ULONG n = 0;
@@ -97,16 +71,6 @@ public:
         : mKeeper(window.surroundings().keeper), mWindow(window.weak_from_this()),
           mSpoken(std::move(spoken)) {
         CreateStdAccessibleObject(window.hwnd(), OBJID_CLIENT, IID_PPV_ARGS(&mSystems));
-    }
-
-    STDMETHODIMP QueryInterface(REFIID iid, void** object) override {
-        if (!object) return E_POINTER;
-        *object = iid == IID_IUnknown || iid == IID_IDispatch || iid == __uuidof(IAccessible)
-                      ? this
-                      : nullptr;
-        if (!*object) return E_NOINTERFACE;
-        AddRef();
-        return S_OK;
     }
 
     // Nobody asks for its members by name.
@@ -319,6 +283,9 @@ public:
 
     STDMETHODIMP put_accName(VARIANT, BSTR) override { return DISP_E_MEMBERNOTFOUND; }
     STDMETHODIMP put_accValue(VARIANT, BSTR) override { return DISP_E_MEMBERNOTFOUND; }
+
+protected:
+    bool inherits(REFIID iid) const override { return iid == IID_IDispatch; }
 
 private:
     /// What a number stands for: the window itself, a part of it, or the object of a window in it.

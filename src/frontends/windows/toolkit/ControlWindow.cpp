@@ -72,6 +72,10 @@ LRESULT ControlWindow::handle(const Message& message) {
         fill(painting.dc(), painting.place(), surroundings().ground());
         return 0;
     }
+    case WM_DESTROY:
+        // With its host's; nothing is dropped on it any more.
+        surroundings().drags.cancel();
+        break;
     case WM_SETFOCUS:
         // From outside, by Tab. The focus of a part that is hidden comes here, too, and stays.
         if (GetKeyState(VK_TAB) < 0 && !surroundings().holds(reinterpret_cast<HWND>(message.w)))

@@ -1,5 +1,6 @@
 #include "frontends/windows/toolkit/Drags.h"
 
+#include "frontends/windows/toolkit/OleDrag.h"
 #include "frontends/windows/toolkit/Surroundings.h"
 
 #include <utility>
@@ -17,18 +18,32 @@ DropTarget& targetOf(Window& window) { return dynamic_cast<DropTarget&>(window);
 
 } // namespace
 
-void Drags::request(Control* source) {
+Drags::Drags(Surroundings& surroundings) : mSurroundings(surroundings), mCarrier(&carryByOle) {}
+
+void Drags::request(Control* source, std::vector<String> names) {
     if (mRunning) return;
     mSource = source;
+    mNames = std::move(names);
     mRequested = true;
 }
 
 bool Drags::runRequested(Window& from) {
     if (mRunning || !std::exchange(mRequested, false) || !mSource || !from.isAlive()) return false;
+    const auto held = from.shared_from_this(); // and with it all this
     mRunning = true;
-    mFrom = from.weak_from_this();
+    mFrom = held;
     mOver.reset();
+    mLetGo.reset();
+    mCounts = false;
+    // The carrier has the mouse from now on.
+    if (GetCapture() == from.hwnd()) ReleaseCapture();
     SetTimer(from.hwnd(), timer, pace, nullptr);
+    const Carrier carry = mCarrier;
+    carry(*this);
+    if (const auto at = std::exchange(mLetGo, {}); at && isRunning())
+        drop(*at);
+    else
+        cancel();
     return true;
 }
 
@@ -47,31 +62,40 @@ Window* Drags::targetAt(POINT at) const {
     return nullptr;
 }
 
-void Drags::moved(POINT at) {
-    if (!mRunning) return;
+bool Drags::moved(POINT at) {
+    if (!isRunning()) return false;
+    // What the mouse only passes, on its way to the grid say, does not scroll.
+    if (const auto from = mFrom.lock(); from && (at.x != mAt.x || at.y != mAt.y))
+        SetTimer(from->hwnd(), timer, pace, nullptr);
     mAt = at;
     Window* const found = targetAt(at);
     const auto over = found ? found->shared_from_this() : nullptr;
     const bool entering = over != mOver.lock();
-    if (entering) leave();
-    if (!mRunning) return;
+    if (entering) left();
+    if (!isRunning()) return false;
     mOver = over;
     const bool counts = over && over->isAlive() &&
                         targetOf(*over).draggedOver(inside(*over, at), entering ? DragState::enters
                                                                                 : DragState::moves);
-    showCursor(counts);
+    mCounts = counts;
+    return over != nullptr && isRunning();
 }
 
-void Drags::dropped(POINT at) {
+void Drags::left() {
+    mCounts = false;
+    const auto over = std::exchange(mOver, {}).lock();
+    if (over && over->isAlive()) targetOf(*over).draggedOver(inside(*over, mAt), DragState::leaves);
+}
+
+void Drags::letGo(POINT at) {
+    if (isRunning()) mLetGo = at;
+}
+
+void Drags::drop(POINT at) {
     moved(at);
-    if (!mRunning) return;
     const auto over = mOver.lock();
-    const auto source = mSource;
-    if (!source || !over || !over->isAlive()) {
-        leave();
-        stop();
-        return;
-    }
+    if (!isRunning() || !over || !over->isAlive()) return cancel();
+    Control* const source = mSource;
     stop();
     // The source is told of with the drop, and gone after it.
     mSource = source;
@@ -81,27 +105,22 @@ void Drags::dropped(POINT at) {
 
 void Drags::tick() {
     const auto over = mOver.lock();
-    if (!mRunning || !over || !over->isAlive()) return;
+    if (!isRunning() || !over || !over->isAlive()) return;
     if (targetOf(*over).scrollUnderDrag(inside(*over, mAt))) moved(mAt);
 }
 
-void Drags::leave() {
-    const auto over = std::exchange(mOver, {}).lock();
-    if (over && over->isAlive()) targetOf(*over).draggedOver(inside(*over, mAt), DragState::leaves);
-}
-
 void Drags::stop() {
-    mRunning = mRequested = false;
+    mRunning = mRequested = mCounts = false;
     mSource = nullptr;
     mOver.reset();
+    mLetGo.reset();
+    if (const auto ended = std::exchange(onEnd, {})) ended();
     const auto from = std::exchange(mFrom, {}).lock();
-    if (!from || !from->hwnd()) return;
-    KillTimer(from->hwnd(), timer);
-    if (GetCapture() == from->hwnd()) ReleaseCapture();
+    if (from && from->hwnd()) KillTimer(from->hwnd(), timer);
 }
 
 void Drags::cancel() {
-    if (mRunning) leave();
+    if (mRunning) left();
     stop();
 }
 
@@ -113,8 +132,8 @@ void Drags::forget(const Control* source) {
     if (mSource == source) mSource = nullptr;
 }
 
-void Drags::showCursor(bool counts) const {
-    const auto* const shape = reinterpret_cast<const wchar_t*>(counts ? IDC_HAND : IDC_NO);
+void Drags::showCursor() const {
+    const auto* const shape = reinterpret_cast<const wchar_t*>(mCounts ? IDC_HAND : IDC_NO);
     SetCursor(LoadCursorW(nullptr, shape));
 }
 

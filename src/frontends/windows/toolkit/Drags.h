@@ -4,7 +4,10 @@
 
 #include <Zandor/platform/Control.h>
 
+#include <functional>
 #include <memory>
+#include <optional>
+#include <vector>
 
 namespace zandor::platform::windows {
 
@@ -25,23 +28,42 @@ public:
     virtual bool scrollUnderDrag(POINT at) = 0;
 };
 
-/// The drag of one control. It lives between the window that it began in, which has captured the
-/// mouse, and the other windows of the same control: nothing comes from outside or goes there.
+/// The drags of one control. One lives between the control's own windows: it carries nothing that
+/// others could take, and nothing that others carry is taken.
 class Drags {
 public:
-    explicit Drags(Surroundings& surroundings) : mSurroundings(surroundings) {}
+    /// Carries a drag from its start to its end: tells of it by `moved`, `left` and `letGo`.
+    using Carrier = std::function<void(Drags&)>;
 
-    /// Asks for a drag with `source` as its source; it begins with `runRequested`. While one runs,
-    /// requests are ignored.
-    void request(Control* source);
-    /// From now on the moves of the mouse are the drag's. False without a request.
+    explicit Drags(Surroundings& surroundings);
+
+    /// For a mouse that is not the system's. The default is the system's own drag and drop.
+    void setCarrier(Carrier carrier) { mCarrier = std::move(carrier); }
+
+    /// Asks for a drag with `source` as its source, of what bears these names; it begins with
+    /// `runRequested`. While one runs, requests are ignored.
+    void request(Control* source, std::vector<String> names);
+    /// Runs a requested drag to its end, the drop included, from a window that the mouse was
+    /// pressed in. False without a request.
     bool runRequested(Window& from);
-    bool isRunning() const { return mRunning; }
+    /// Whether one runs that has not been given up.
+    bool isRunning() const { return mRunning && mSource; }
     Control* source() const { return mSource; }
+    const std::vector<String>& names() const { return mNames; }
+    Surroundings& surroundings() const { return mSurroundings; }
 
-    // What the window that has the mouse gets. Places are on the screen.
-    void moved(POINT at);
-    void dropped(POINT at);
+    // What the carrier tells. Places are on the screen.
+
+    /// Whether a drop there comes to a window of the control's.
+    bool moved(POINT at);
+    /// The drag is elsewhere than over the control.
+    void left();
+    /// The button has come up over the control. The drop follows when the carrier has come to its
+    /// end: it may open message boxes, which must not stand inside the drag.
+    void letGo(POINT at);
+    /// Shows by the cursor whether a drop would count.
+    void showCursor() const;
+
     /// A while has passed with the mouse at rest.
     void tick();
 
@@ -51,23 +73,28 @@ public:
     void giveUp(const Control* source);
     /// The source has gone: its drag, if any, drops nothing.
     void forget(const Control* source);
+    /// Called when the drag ends, however it does.
+    std::function<void()> onEnd;
 
-    static constexpr UINT_PTR timer = 7; ///< of the window that has the mouse
+    static constexpr UINT_PTR timer = 7; ///< of the window that it began in
     static constexpr UINT pace = 60;     ///< of that, in milliseconds
 
 private:
     Window* targetAt(POINT at) const;
-    void leave();
+    void drop(POINT at);
     void stop();
-    void showCursor(bool counts) const;
 
     Surroundings& mSurroundings;
+    Carrier mCarrier;
     Control* mSource = nullptr;
+    std::vector<String> mNames;
     bool mRequested = false;
     bool mRunning = false;
-    std::weak_ptr<Window> mFrom; ///< has the mouse
+    bool mCounts = false;
+    std::weak_ptr<Window> mFrom;
     std::weak_ptr<Window> mOver;
     POINT mAt{};
+    std::optional<POINT> mLetGo;
 };
 
 } // namespace zandor::platform::windows

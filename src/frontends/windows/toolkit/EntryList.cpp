@@ -139,7 +139,6 @@ LRESULT EntryList::dealWith(const Message& message) {
     case WM_MOUSEMOVE: move(message); return 0;
     case WM_CAPTURECHANGED:
         // A box that comes up for a press takes the mouse away, and the press counts all the same.
-        if (reinterpret_cast<HWND>(message.l) != hwnd()) surroundings().drags.cancel();
         return 0;
     case WM_TIMER:
         if (message.w != Drags::timer) break;
@@ -280,7 +279,6 @@ void EntryList::press(const Message& message) {
 void EntryList::move(const Message& message) {
     Drags& drags = surroundings().drags;
     const POINT at = message.at();
-    if (drags.isRunning()) return drags.moved(onScreen(hwnd(), at));
     const std::int16_t buttons = buttonsOf(message.w);
     if (buttons == 0) {
         mPressed = mClickPending = mDoubleClicked = -1;
@@ -292,18 +290,12 @@ void EntryList::move(const Message& message) {
     mDoubleClicked = -1; // a drag that follows a click closely
     if (GetCapture() != hwnd()) SetCapture(hwnd());
     mListener->entryMoved(mPressed, buttons, shiftState(message.w));
-    if (drags.runRequested(*this)) drags.moved(onScreen(hwnd(), at));
+    if (drags.runRequested(*this)) mPressed = mClickPending = -1;
 }
 
 void EntryList::release(const Message& message) {
     const POINT at = message.at();
     const bool isLeft = buttonOf(message.id) == left;
-    Drags& drags = surroundings().drags;
-    if (drags.isRunning()) {
-        if (isLeft) drags.dropped(onScreen(hwnd(), at));
-        mPressed = mClickPending = mDoubleClicked = -1;
-        return;
-    }
     const int row = rowAt(at);
     const bool again = isLeft && row >= 0 && mClickPending == row;
     const bool doubleClicked = isLeft && row >= 0 && mDoubleClicked == row;
@@ -322,8 +314,6 @@ bool EntryList::isTables(const Message& message) {
 }
 
 bool EntryList::keyPressed(const Message& message) {
-    if (message.w == VK_ESCAPE && surroundings().drags.isRunning())
-        return surroundings().drags.cancel(), true;
     if (message.id == WM_SYSKEYDOWN || !mListener) return false;
     const bool control = shiftState() & 2;
     const int row = caret();

@@ -22,7 +22,7 @@ class TableWindow;
 
 /// What the windows of one control share. It is there as long as one of them is, and so longer than
 /// the toolkit where the host ends the control from within a message.
-class Surroundings {
+class Surroundings : public std::enable_shared_from_this<Surroundings> {
 public:
     Surroundings(Toolkit& toolkit, int dpi, std::shared_ptr<void> keeper)
         : keeper(std::move(keeper)), scale(dpi), fonts(dpi), drags(*this), navigation(*this),

@@ -142,7 +142,11 @@ Ref<TalvikTabulet::ColumnItem> Tabulet::ColumnAt(float X, float Y) const {
 
 void Tabulet::Drag(std::int16_t action) {
     if (action == 0) surroundings().drags.giveUp(this);
-    if (action == 1 && mWindow->isAlive()) surroundings().drags.request(this);
+    if (action != 1 || !mWindow->isAlive()) return;
+    const EntryList& list = mWindow->list();
+    std::vector<String> names;
+    for (const int row : list.selected()) names.push_back(list.textOf(row));
+    surroundings().drags.request(this, std::move(names));
 }
 
 void Tabulet::Complete() { mWindow->list().repaint(); }

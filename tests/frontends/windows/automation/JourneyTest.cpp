@@ -5,7 +5,11 @@
 #include "Sink.h"
 #include "User.h"
 
+#include "frontends/windows/toolkit/Counted.h"
+
 #include <gtest/gtest.h>
+
+#include <thread>
 
 using namespace zandor;
 using namespace zandor::automation;
@@ -266,16 +270,153 @@ TEST_F(AJourney, OnAFormWithMouseAndKeyboardLeavesTheQueryThatWasMade) {
     user.live([this] { deleteTheJoin(); });
     Late(form.control().get()).set(L"Zandor", nullptr);
 
-    EXPECT_EQ(basic.said(),
-              std::vector<std::string>(
-                  {"TableMoved", "TableMoved", "JoinCreated 0", "Activate", "Activate",
-                   "JoinModified 1", "ColumnCreated orders.id", "ColumnCreated orders.ordered_at",
-                   "ColumnCreated orders.status", "Activate", "ColumnModified orders.status",
-                   "ColumnModified orders.ordered_at", "Activate", "Activate",
-                   "ColumnCreated customers.name", "Activate", "ColumnRemoved orders.ordered_at",
-                   "TableDeleted orders", "Activate", "JoinRemoved 1",
-                   "Error New Zanodr is nothing! -1"}));
+    EXPECT_EQ(basic.said(), std::vector<std::string>({"TableMoved",
+                                                      "TableMoved",
+                                                      "JoinCreated 0",
+                                                      "Activate",
+                                                      "Activate",
+                                                      "JoinModified 1",
+                                                      "ColumnCreated orders.id",
+                                                      "ColumnCreated orders.ordered_at",
+                                                      "ColumnCreated orders.status",
+                                                      "Activate",
+                                                      "ColumnModified orders.status",
+                                                      "ColumnModified orders.ordered_at",
+                                                      "Activate",
+                                                      "Activate",
+                                                      "ColumnCreated customers.name",
+                                                      "Activate",
+                                                      "ColumnRemoved orders.ordered_at",
+                                                      "TableDeleted orders",
+                                                      "Activate",
+                                                      "JoinRemoved 1",
+                                                      "Error New Zanodr is nothing! -1"}));
     EXPECT_EQ(java.said(), basic.said());
+}
+
+namespace {
+
+/// A window beside the form that takes whatever is dropped on it.
+class Taker final : public platform::windows::Counted<IDropTarget> {
+public:
+    Taker()
+        : window(CreateWindowExW(0, L"STATIC", L"Beside", WS_POPUP | WS_VISIBLE | SS_NOTIFY, 800,
+                                 60, 200, 200, nullptr, nullptr, nullptr, nullptr)) {
+        RegisterDragDrop(window, this);
+    }
+    ~Taker() override { DestroyWindow(window); }
+
+    STDMETHODIMP DragEnter(IDataObject* data, DWORD, POINTL, DWORD* effect) override {
+        ++entered;
+        for (const CLIPFORMAT known : {CF_TEXT, CF_UNICODETEXT, CF_HDROP}) {
+            FORMATETC wanted{known, nullptr, DVASPECT_CONTENT, -1, TYMED_HGLOBAL};
+            if (data->QueryGetData(&wanted) == S_OK) ++readable;
+        }
+        *effect = DROPEFFECT_COPY;
+        return S_OK;
+    }
+    STDMETHODIMP DragOver(DWORD, POINTL, DWORD* effect) override {
+        *effect = DROPEFFECT_COPY;
+        return S_OK;
+    }
+    STDMETHODIMP DragLeave() override { return S_OK; }
+    STDMETHODIMP Drop(IDataObject*, DWORD, POINTL, DWORD* effect) override {
+        ++dropped;
+        *effect = DROPEFFECT_COPY;
+        return S_OK;
+    }
+
+    const HWND window;
+    int entered = 0;
+    int readable = 0;
+    int dropped = 0;
+};
+
+/// Words that are dragged from elsewhere, until the button comes up.
+class Words final : public platform::windows::Counted<IDataObject> {
+public:
+    STDMETHODIMP GetData(FORMATETC*, STGMEDIUM*) override { return DV_E_FORMATETC; }
+    STDMETHODIMP GetDataHere(FORMATETC*, STGMEDIUM*) override { return DV_E_FORMATETC; }
+    STDMETHODIMP QueryGetData(FORMATETC* format) override {
+        return format->cfFormat == CF_UNICODETEXT ? S_OK : DV_E_FORMATETC;
+    }
+    STDMETHODIMP GetCanonicalFormatEtc(FORMATETC*, FORMATETC*) override { return E_NOTIMPL; }
+    STDMETHODIMP SetData(FORMATETC*, STGMEDIUM*, BOOL) override { return E_NOTIMPL; }
+    STDMETHODIMP EnumFormatEtc(DWORD, IEnumFORMATETC**) override { return E_NOTIMPL; }
+    STDMETHODIMP DAdvise(FORMATETC*, DWORD, IAdviseSink*, DWORD*) override { return E_NOTIMPL; }
+    STDMETHODIMP DUnadvise(DWORD) override { return E_NOTIMPL; }
+    STDMETHODIMP EnumDAdvise(IEnumSTATDATA**) override { return E_NOTIMPL; }
+};
+
+class UntilLetGo final : public platform::windows::Counted<IDropSource> {
+public:
+    STDMETHODIMP QueryContinueDrag(BOOL escape, DWORD keys) override {
+        if (escape) return DRAGDROP_S_CANCEL;
+        return keys & MK_LBUTTON ? S_OK : DRAGDROP_S_DROP;
+    }
+    STDMETHODIMP GiveFeedback(DWORD) override { return DRAGDROP_S_USEDEFAULTCURSORS; }
+};
+
+} // namespace
+
+TEST_F(AJourney, CarriesNothingOutOfTheForm) {
+    const Held<Taker> beside(new Taker);
+    user.live([&] {
+        user.settle();
+        user.click(entry(L"customers", 2));
+        user.settle();
+        user.drag(entry(L"customers", 2), middleOf(beside->window));
+        user.await("the drop", [&] { return beside->dropped == 1; });
+        // And by Escape a drag ends where it is.
+        user.moveTo(entry(L"customers", 2));
+        user.press();
+        user.settle();
+        for (const int step : {8, 4, 0}) {
+            user.moveTo({cell(4, 1).x, cell(4, 1).y + step});
+            user.settle();
+        }
+        user.key(VK_ESCAPE);
+        user.settle();
+        user.letGo();
+        user.settle();
+    });
+    EXPECT_EQ(beside->entered, 1);
+    EXPECT_EQ(beside->readable, 0);
+    EXPECT_EQ(sink.heard(), std::vector<std::string>());
+    RevokeDragDrop(beside->window);
+}
+
+TEST_F(AJourney, IsNotDisturbedByWhatIsDraggedFromElsewhere) {
+    const HWND list = windowOf(form.window(), L"customers", L"LISTBOX");
+    const Held<Taker> beside(new Taker);
+    DWORD effect = DROPEFFECT_COPY;
+    HRESULT ended = E_FAIL;
+    user.live([&] {
+        user.settle();
+        for (const POINT to : {entry(L"customers", 2), cell(4, 1)}) {
+            user.moveTo(middleOf(beside->window));
+            user.press();
+            user.settle();
+            std::thread carrying([&] {
+                user.ask([&] {
+                    const Held<IDataObject> words(new Words);
+                    const Held<IDropSource> source(new UntilLetGo);
+                    ended = DoDragDrop(words.get(), source.get(), DROPEFFECT_COPY, &effect);
+                });
+            });
+            for (const int step : {6, 3, 0}) {
+                user.moveTo({to.x, to.y + step});
+                user.settle();
+            }
+            user.letGo();
+            carrying.join();
+            EXPECT_TRUE(SUCCEEDED(ended));
+            EXPECT_EQ(effect, DWORD{DROPEFFECT_NONE});
+            EXPECT_EQ(SendMessageW(list, LB_GETSELCOUNT, 0, 0), 0);
+        }
+    });
+    EXPECT_EQ(sink.heard(), std::vector<std::string>());
+    RevokeDragDrop(beside->window);
 }
 
 int main(int argc, char** argv) {

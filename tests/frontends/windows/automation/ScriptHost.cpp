@@ -1,6 +1,7 @@
 #include "ScriptHost.h"
 
 #include "frontends/windows/automation/com/Failure.h"
+#include "frontends/windows/toolkit/Counted.h"
 
 #include <algorithm>
 #include <map>
@@ -63,23 +64,10 @@ std::wstring wideOf(const VARIANT& value) {
 } // namespace
 
 /// What an engine asks of who runs it.
-class ScriptHost::Site final : public IActiveScriptSite {
+class ScriptHost::Site final : public platform::windows::Counted<IActiveScriptSite> {
 public:
     std::map<std::wstring, Held<IDispatch>> lent;
     std::string failure;
-
-    STDMETHODIMP QueryInterface(REFIID iid, void** object) override {
-        *object = iid == IID_IUnknown || iid == IID_IActiveScriptSite ? this : nullptr;
-        if (!*object) return E_NOINTERFACE;
-        AddRef();
-        return S_OK;
-    }
-    STDMETHODIMP_(ULONG) AddRef() override { return ++mReferences; }
-    STDMETHODIMP_(ULONG) Release() override {
-        const ULONG left = --mReferences;
-        if (left == 0) delete this;
-        return left;
-    }
 
     STDMETHODIMP GetLCID(LCID* locale) override {
         *locale = LOCALE_USER_DEFAULT;
@@ -112,9 +100,6 @@ public:
     }
     STDMETHODIMP OnEnterScript() override { return S_OK; }
     STDMETHODIMP OnLeaveScript() override { return S_OK; }
-
-private:
-    ULONG mReferences = 0;
 };
 
 struct ScriptHost::Link {

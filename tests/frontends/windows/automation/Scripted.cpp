@@ -82,19 +82,6 @@ double Scripted::numberAt(const std::wstring& name) const {
 
 IDispatch* Scripted::objectAt(const std::wstring& name) const { return mValues.at(name)->pdispVal; }
 
-STDMETHODIMP Scripted::QueryInterface(REFIID iid, void** object) {
-    *object = iid == IID_IUnknown || iid == IID_IDispatch ? this : nullptr;
-    if (!*object) return E_NOINTERFACE;
-    AddRef();
-    return S_OK;
-}
-
-STDMETHODIMP_(ULONG) Scripted::Release() {
-    const ULONG left = --mReferences;
-    if (left == 0) delete this;
-    return left;
-}
-
 STDMETHODIMP Scripted::GetTypeInfoCount(UINT* count) {
     *count = 0;
     return S_OK;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "frontends/windows/automation/com/Value.h"
+#include "frontends/windows/toolkit/Counted.h"
 
 #include <functional>
 #include <map>
@@ -9,7 +10,7 @@
 #include <vector>
 
 /// An object of a host's own, with nothing but IDispatch: its members are what a test says.
-class Scripted final : public IDispatch {
+class Scripted final : public zandor::platform::windows::Counted<IDispatch> {
 public:
     /// Arguments in their order. The way is one of DISPATCH_.
     using Arguments = std::vector<const VARIANT*>;
@@ -40,9 +41,6 @@ public:
     /// Which members were called: "Count", and "Left=R4" with the kind of what was written.
     std::vector<std::string> calls;
 
-    STDMETHODIMP QueryInterface(REFIID iid, void** object) override;
-    STDMETHODIMP_(ULONG) AddRef() override { return ++mReferences; }
-    STDMETHODIMP_(ULONG) Release() override;
     STDMETHODIMP GetTypeInfoCount(UINT* count) override;
     STDMETHODIMP GetTypeInfo(UINT, LCID, ITypeInfo**) override { return E_NOTIMPL; }
     STDMETHODIMP GetIDsOfNames(REFIID, LPOLESTR* names, UINT count, LCID, DISPID* ids) override;
@@ -59,7 +57,6 @@ private:
         Member member;
     };
 
-    ULONG mReferences = 0;
     std::vector<Row> mRows;
     std::map<std::wstring, std::shared_ptr<zandor::automation::Value>> mValues;
 };

@@ -1,8 +1,7 @@
 #include "Dll.h"
+#include "Functions.h"
 
 #include "frontends/windows/automation/com/Text.h"
-
-#include <Zandor/Interface.h>
 
 #include <gtest/gtest.h>
 
@@ -12,16 +11,8 @@
 
 using namespace zandor;
 using namespace zandor::automation;
-using TalvikDBxZandor::automation::Carries;
-using TalvikDBxZandor::automation::Kind;
-using TalvikDBxZandor::automation::Member;
-using TalvikDBxZandor::automation::Setter;
-using TalvikDBxZandor::automation::Type;
 
 namespace {
-
-/// A function as a type library has it: "get LNGJoinForm(out BSTR*)".
-using Functions = std::multimap<DISPID, std::string>;
 
 Held<ITypeLib> library(int number) {
     Held<ITypeLib> found;
@@ -112,45 +103,6 @@ Functions declared(REFGUID id) {
     return functionsOf(*dispatch.get());
 }
 
-const char* rawTypeOf(Type type) {
-    switch (type) {
-    case Type::String: return "BSTR";
-    case Type::Boolean: return "VARIANT_BOOL";
-    case Type::Integer: return "short";
-    case Type::Zandor: return "_ZDQuery*";
-    case Type::ZDJoin: return "_ZDJoin*";
-    case Type::ZDTable: return "_ZDTable*";
-    case Type::ZDColumn: return "_ZDColumn*";
-    case Type::none: break;
-    }
-    return "";
-}
-
-void add(Functions& functions, const Member& member) {
-    const auto id = static_cast<DISPID>(member.dispatchId);
-    const std::string name = platform::toUtf8(member.name);
-    const std::string type = rawTypeOf(member.type);
-    if (member.kind == Kind::method) {
-        std::string parameters;
-        for (const auto& parameter : member.parameters) {
-            if (!parameters.empty()) parameters += ", ";
-            parameters += parameter.byReference ? "in out BSTR* " : "in BSTR ";
-            parameters += platform::toUtf8(parameter.name);
-        }
-        functions.emplace(id, name + "(" + parameters + ")");
-        return;
-    }
-    functions.emplace(id, "get " + name + "(out " + type + "*)");
-    switch (member.setter) {
-    case Setter::none: break;
-    case Setter::byValue: functions.emplace(id, "put " + name + "(in " + type + ")"); break;
-    case Setter::byReference:
-        functions.emplace(id, "put " + name + "(in out " + type + "*)");
-        break;
-    case Setter::object: functions.emplace(id, "set " + name + "(in " + type + ")"); break;
-    }
-}
-
 /// Registered, for one library finds the other by that.
 class TheTypeLibrary : public testing::Test {
 protected:
@@ -166,8 +118,7 @@ private:
 } // namespace
 
 TEST_F(TheTypeLibrary, DeclaresTheInterfaceAsTheControlsTableHasIt) {
-    Functions expected;
-    for (const Member& member : TalvikDBxZandor::automation::members()) add(expected, member);
+    const Functions expected = functionsOfTheTable();
     EXPECT_EQ(expected.size(), 124U);
     EXPECT_EQ(declared(__uuidof(_Zandor)), expected);
 }
@@ -191,18 +142,7 @@ TEST_F(TheTypeLibrary, SaysWhereAMethodStandsInTheTable) {
 }
 
 TEST_F(TheTypeLibrary, DeclaresTheEventsUnderTheirNumbers) {
-    Functions expected;
-    for (const auto& event : TalvikDBxZandor::automation::events()) {
-        const char* parameters = "";
-        switch (event.arguments) {
-        case Carries::nothing: break;
-        case Carries::definition: parameters = "in IDispatch* Definition"; break;
-        case Carries::join: parameters = "in IDispatch* Join"; break;
-        case Carries::textAndNumber: parameters = "in BSTR Text, in long Number"; break;
-        }
-        expected.emplace(static_cast<DISPID>(event.number),
-                         platform::toUtf8(event.name) + "(" + parameters + ")");
-    }
+    const Functions expected = eventsOfTheTable();
     EXPECT_EQ(expected.size(), 10U);
     EXPECT_EQ(declared(ids::controlEvents), expected);
 }

@@ -55,13 +55,21 @@ HWND openMenu() {
 User::User(HWND form)
     : mForm(form), mEar(CreateWindowExW(0, L"STATIC", L"", 0, 0, 0, 0, 0, HWND_MESSAGE, nullptr,
                                         nullptr, nullptr)) {
+    SetWindowLongPtrW(mEar, GWLP_USERDATA, reinterpret_cast<LONG_PTR>(this));
     SetWindowLongPtrW(mEar, GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(&hear));
+    // Told when there is nothing else to do, also by the loop of a menu, a dialog or a drag.
+    SetTimer(mEar, 1, USER_TIMER_MINIMUM, nullptr);
     SetForegroundWindow(form);
 }
 
 User::~User() { DestroyWindow(mEar); }
 
 LRESULT CALLBACK User::hear(HWND window, UINT message, WPARAM w, LPARAM l) {
+    if (message == WM_TIMER) {
+        auto* const user = reinterpret_cast<User*>(GetWindowLongPtrW(window, GWLP_USERDATA));
+        ++user->mIdle;
+        return 0;
+    }
     if (message != question) return DefWindowProcW(window, message, w, l);
     (*reinterpret_cast<const std::function<void()>*>(l))();
     return 0;
@@ -79,7 +87,6 @@ void User::live(const std::function<void()>& life) {
             TranslateMessage(&message);
             DispatchMessageW(&message);
         }
-        ++mIdle;
         MsgWaitForMultipleObjects(0, nullptr, FALSE, 5, QS_ALLINPUT);
     }
     user.join();

@@ -1,42 +1,15 @@
 #pragma once
 
 #include "frontends/windows/automation/com/Module.h"
-
-#include <atomic>
+#include "frontends/windows/toolkit/Counted.h"
 
 namespace zandor::automation {
 
-/// An object behind one interface, which goes with its last reference. It is made with none.
+/// An object behind one interface, which goes with its last reference and keeps the library loaded
+/// until then.
 template <class Interface>
-class Counted : public Interface {
-public:
-    Counted() = default;
-    Counted(const Counted&) = delete;
-    Counted& operator=(const Counted&) = delete;
-
-    STDMETHODIMP QueryInterface(REFIID iid, void** object) override {
-        if (!object) return E_POINTER;
-        *object =
-            iid == IID_IUnknown || iid == __uuidof(Interface) || inherits(iid) ? this : nullptr;
-        if (!*object) return E_NOINTERFACE;
-        AddRef();
-        return S_OK;
-    }
-    STDMETHODIMP_(ULONG) AddRef() override { return ++mReferences; }
-    STDMETHODIMP_(ULONG) Release() override {
-        const ULONG left = --mReferences;
-        if (left == 0) delete this;
-        return left;
-    }
-
-protected:
-    virtual ~Counted() = default;
-    /// Whether the interface begins with another one of this id, other than IUnknown.
-    virtual bool inherits(REFIID) const { return false; }
-
-private:
+class Counted : public platform::windows::Counted<Interface> {
     const Keeping mKeeping;
-    std::atomic<ULONG> mReferences = 0;
 };
 
 } // namespace zandor::automation

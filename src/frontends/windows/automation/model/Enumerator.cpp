@@ -11,22 +11,6 @@ Held<IUnknown> Enumerator::over(_ZDCollection* items, LONG position) {
     return Held<IUnknown>(new Enumerator(items, position));
 }
 
-STDMETHODIMP Enumerator::QueryInterface(REFIID iid, void** object) {
-    if (!object) return E_POINTER;
-    *object = iid == IID_IUnknown || iid == IID_IEnumVARIANT ? this : nullptr;
-    if (!*object) return E_NOINTERFACE;
-    AddRef();
-    return S_OK;
-}
-
-STDMETHODIMP_(ULONG) Enumerator::AddRef() { return ++mReferences; }
-
-STDMETHODIMP_(ULONG) Enumerator::Release() {
-    const ULONG left = --mReferences;
-    if (left == 0) delete this;
-    return left;
-}
-
 STDMETHODIMP Enumerator::Next(ULONG count, VARIANT* values, ULONG* fetched) {
     if (fetched) *fetched = 0;
     if (!values || (!fetched && count != 1)) return E_POINTER;
