@@ -4,6 +4,7 @@
 #include "frontends/qt/ShownText.h"
 #include "frontends/qt/mixed.h"
 
+#include <Zandor/comforts/slantingPieces.h>
 #include <Zandor/qt/Text.h>
 #include <Zandor/qt/Twips.h>
 
@@ -131,21 +132,14 @@ void CanvasLine::BorderWidth(std::int16_t value) {
 
 QRegion CanvasLine::area() const {
     const QPointF from = pixelPoint(mX1, mY1);
-    const QPointF way = pixelPoint(mX2, mY2) - from;
+    const QPointF to = pixelPoint(mX2, mY2);
     const qreal margin = (focused() ? haloWidth : mBorderWidth) / 2.0 + 1;
-    // A slanting line in pieces: its bounding box is far larger than what it changes. More pieces
-    // cost more in regions than they spare in pixels.
-    const qreal thin = std::min(std::abs(way.x()), std::abs(way.y()));
-    const int pieces = std::clamp(static_cast<int>(thin / 128), 1, 3);
     QRegion region;
-    for (int i = 0; i < pieces; ++i) {
-        const QPointF start = from + way * i / pieces;
-        const QPointF end = from + way * (i + 1) / pieces;
-        region += QRectF(start, end)
+    for (const auto& piece : comforts::slantingPieces({from.x(), from.y(), to.x(), to.y()}))
+        region += QRectF(QPointF(piece.fromX, piece.fromY), QPointF(piece.toX, piece.toY))
                       .normalized()
                       .adjusted(-margin, -margin, margin, margin)
                       .toAlignedRect();
-    }
     for (const Plate& plate : plates())
         region += plate.place.adjusted(-1, -1, 1, 1).toAlignedRect();
     return region;

@@ -303,62 +303,32 @@ void TabuletAdapter::closeClicked() {
     if (mEvents.CloseClick) mEvents.CloseClick(mIndex);
 }
 
-void TabuletAdapter::gestureBegan() { mGestureStart = bounds(); }
+// The edges are numbered alike.
+static_assert(comforts::Edges(Qt::TopEdge) == comforts::topEdge &&
+              comforts::Edges(Qt::LeftEdge) == comforts::leftEdge &&
+              comforts::Edges(Qt::RightEdge) == comforts::rightEdge &&
+              comforts::Edges(Qt::BottomEdge) == comforts::bottomEdge);
+
+void TabuletAdapter::gestureBegan() { mGesture.begin(bounds()); }
 
 void TabuletAdapter::gestureMoved(Qt::Edges edges, QPointF way) {
     if (!mWidget) return;
-    Bounds box = mGestureStart;
-    const float right = toTwips(way.x());
-    const float down = toTwips(way.y());
-    if (!edges) {
-        box.Left += right;
-        box.Top += down;
-    }
-    // A box may be smaller than the smallest by its model; the user then cannot shrink it more.
     const QSize smallest = mWidget->smallest();
-    const float width = std::min(toTwips(smallest.width()), box.Width);
-    const float height = std::min(toTwips(smallest.height()), box.Height);
-    if (edges & Qt::RightEdge) box.Width = std::max(box.Width + right, width);
-    if (edges & Qt::BottomEdge) box.Height = std::max(box.Height + down, height);
-    if (edges & Qt::LeftEdge) {
-        const float by = std::min(right, box.Width - width);
-        box.Left += by;
-        box.Width -= by;
-    }
-    if (edges & Qt::TopEdge) {
-        const float by = std::min(down, box.Height - height);
-        box.Top += by;
-        box.Height -= by;
-    }
+    const Bounds box = mGesture.at(edges.toInt(), toTwips(way.x()), toTwips(way.y()),
+                                   toTwips(smallest.width()), toTwips(smallest.height()));
     if (box == bounds()) return;
     setBounds(box);
     if (mEvents.Moving) mEvents.Moving(mIndex);
 }
 
 void TabuletAdapter::gestureEnded(Qt::Edges edges) {
-    const TalvikTabulet::TabuletEvents& events = mEvents;
-    const std::int16_t index = mIndex;
-    const QPointer<TabuletWidget> alive = mWidget;
-    const Bounds left = bounds();
-    // Near a corner an edge takes its neighbour along, which may have stayed where it was.
-    const bool cornerMoved = left.Left != mGestureStart.Left || left.Top != mGestureStart.Top;
-    if ((!edges || cornerMoved) && events.Moved) events.Moved(index);
-    if (!edges || !alive || !alive->property(controlProperty).isValid()) return;
-    if (cornerMoved) keepOppositeEdges(left);
-    if (events.Resized) events.Resized(index);
+    mGesture.end(edges.toInt(), *this, mEvents, mIndex,
+                 [alive = mWidget] { return alive && alive->property(controlProperty).isValid(); });
 }
 
 void TabuletAdapter::gestureTakenBack() {
-    setBounds(mGestureStart);
+    setBounds(mGesture.start());
     if (mEvents.Moving) mEvents.Moving(mIndex);
-}
-
-/// The control brings a corner that was pulled out of sight back; the other edges are to stay.
-void TabuletAdapter::keepOppositeEdges(const Bounds& left) {
-    Bounds box = bounds();
-    if (box.Left != left.Left) box.Width = std::max(left.Left + left.Width - box.Left, 0.0F);
-    if (box.Top != left.Top) box.Height = std::max(left.Top + left.Height - box.Top, 0.0F);
-    if (box != bounds()) setBounds(box);
 }
 
 bool TabuletAdapter::draggedOver(const QMimeData* data, QPointF at, std::int16_t state) {

@@ -5,6 +5,7 @@
 #include "frontends/qt/LineEnds.h"
 #include "frontends/qt/TabuletWidget.h"
 
+#include <Zandor/comforts/BoxGesture.h>
 #include <Zandor/comforts/Comforts.h>
 #include <Zandor/platform/Tabulet.h>
 
@@ -95,7 +96,6 @@ private:
     void gestureMoved(Qt::Edges edges, QPointF way) override;
     void gestureEnded(Qt::Edges edges) override;
     void gestureTakenBack() override;
-    void keepOppositeEdges(const Bounds& left);
     bool draggedOver(const QMimeData* data, QPointF at, std::int16_t state) override;
     bool dropped(const QMimeData* data, QPointF at) override;
     void leave();
@@ -113,7 +113,7 @@ private:
     Ref<ImageList> mImages;
     bool mVisible = false;
     bool mEntryTaken = false; ///< the control has selected an entry
-    Bounds mGestureStart;
+    comforts::BoxGesture mGesture;
 };
 
 } // namespace zandor::platform::qt

@@ -3,6 +3,8 @@
 #include "frontends/windows/toolkit/Drawing.h"
 #include "frontends/windows/toolkit/Surroundings.h"
 
+#include <Zandor/comforts/slantingPieces.h>
+
 #include <algorithm>
 #include <cmath>
 #include <utility>
@@ -106,20 +108,15 @@ std::vector<RECT> CanvasLine::places() const {
     const POINT from = pixelPoint(mX1, mY1);
     const POINT to = pixelPoint(mX2, mY2);
     const int margin = scale().pixels(haloWidth) / 2 + 2;
-    // A slanting line in pieces: its bounding box is far larger than what it changes.
-    const int thin = std::min(std::abs(to.x - from.x), std::abs(to.y - from.y));
-    const int pieces = std::clamp(thin / 64, 1, 8);
     std::vector<RECT> all;
-    for (int i = 0; i < pieces; ++i) {
-        const auto between = [&](LONG a, LONG b, int piece) {
-            return a + (b - a) * piece / pieces;
-        };
-        const LONG left = between(from.x, to.x, i);
-        const LONG right = between(from.x, to.x, i + 1);
-        const LONG top = between(from.y, to.y, i);
-        const LONG bottom = between(from.y, to.y, i + 1);
-        all.push_back({std::min(left, right) - margin, std::min(top, bottom) - margin,
-                       std::max(left, right) + margin, std::max(top, bottom) + margin});
+    for (const auto& piece :
+         comforts::slantingPieces({static_cast<double>(from.x), static_cast<double>(from.y),
+                                   static_cast<double>(to.x), static_cast<double>(to.y)})) {
+        const auto [left, right] = std::minmax(piece.fromX, piece.toX);
+        const auto [top, bottom] = std::minmax(piece.fromY, piece.toY);
+        all.push_back(
+            {std::lround(std::floor(left)) - margin, std::lround(std::floor(top)) - margin,
+             std::lround(std::ceil(right)) + margin, std::lround(std::ceil(bottom)) + margin});
     }
     for (const Plate& plate : plates()) all.push_back(within(plate.place, -1, -1, -1, -1));
     return all;

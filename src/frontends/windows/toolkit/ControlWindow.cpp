@@ -39,8 +39,7 @@ void ControlWindow::paintLater() {
     PostMessageW(hwnd(), paintMessage, 0, 0);
 }
 
-void ControlWindow::dpiChanged() {
-    const int dpi = dpiOf(hwnd());
+void ControlWindow::setDpi(int dpi) {
     if (dpi == surroundings().scale.dpi()) return;
     surroundings().scale = Scale(dpi);
     surroundings().fonts.setDpi(dpi);
@@ -82,7 +81,7 @@ LRESULT ControlWindow::handle(const Message& message) {
             surroundings().navigation.enter(GetKeyState(VK_SHIFT) >= 0);
         return 0;
     case WM_LBUTTONDOWN: SetFocus(hwnd()); return 0;
-    case WM_DPICHANGED_AFTERPARENT: dpiChanged(); return 0;
+    case WM_DPICHANGED_AFTERPARENT: setDpi(dpiOf(hwnd())); return 0;
     default: break;
     }
     return Window::handle(message);

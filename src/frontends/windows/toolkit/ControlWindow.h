@@ -24,14 +24,14 @@ public:
 
     /// onPaint follows when the messages at hand have been dealt with.
     void paintLater();
+    /// The monitor is another, of so many dots to an inch.
+    void setDpi(int dpi);
 
 protected:
     LRESULT handle(const Message& message) override;
     void forget() override;
 
 private:
-    void dpiChanged();
-
     bool mPaintQueued = false;
 };
 

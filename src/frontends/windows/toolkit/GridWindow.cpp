@@ -223,6 +223,14 @@ String GridWindow::shownText(std::int32_t row, const String& text, int room) con
     return ascending ? u"\u25B2" : u"\u25BC";
 }
 
+/// A text that is a little too wide takes of its margins: on another monitor letters are not as
+/// wide to the pixel as on the one where the column was made to fit them.
+int GridWindow::marginIn(const RECT& place, const String& text) const {
+    const Scale& scale = surroundings().scale;
+    const int spare = widthOf(place) - surroundings().fonts.widthOf(fontHandle(), text);
+    return std::clamp(spare / 2, scale.pixels(1), scale.pixels(cellMargin));
+}
+
 void GridWindow::paintCell(HDC dc, std::int32_t row, std::int32_t col) const {
     const RECT place = cellPlace(row, col);
     RECT seen{};
@@ -237,7 +245,7 @@ void GridWindow::paintCell(HDC dc, std::int32_t row, std::int32_t col) const {
     const COLORREF rule = mixed(ground, text, fixed ? 0.3 : 0.18);
     fill(dc, {place.right - 1, place.top, place.right, place.bottom}, rule);
     fill(dc, {place.left, place.bottom - 1, place.right, place.bottom}, rule);
-    const int margin = surroundings().scale.pixels(cellMargin);
+    const int margin = marginIn(place, cell.text);
     const RECT inside = within(place, margin, 0, margin, 1);
     // 0 to 2 are on the left, 3 to 5 in the middle, 6 to 8 on the right; 9 goes by the text.
     const int third = cell.alignment / 3;
@@ -460,7 +468,7 @@ void GridWindow::hint(POINT at) const {
     const GridCells::Cell& cell = mCells.cell(row, col);
     const RECT place = cellPlace(row, col);
     const bool cut = surroundings().fonts.widthOf(fontHandle(), cell.text) >
-                     widthOf(place) - 2 * surroundings().scale.pixels(cellMargin);
+                     widthOf(place) - 2 * marginIn(place, cell.text);
     surroundings().hints.over(*this, place,
                               !cell.note.empty() ? cell.note
                               : cut              ? cell.text

@@ -70,6 +70,7 @@ protected:
 private:
     void paint(const Message& message);
     void paintCell(HDC dc, std::int32_t row, std::int32_t col) const;
+    int marginIn(const RECT& place, const String& text) const;
     String shownText(std::int32_t row, const String& text, int room) const;
     void showRanges();
     void scrolledByBar(const Message& message);

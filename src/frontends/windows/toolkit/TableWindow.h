@@ -2,10 +2,11 @@
 
 #include "frontends/windows/toolkit/EntryList.h"
 
+#include <Zandor/comforts/BoxGesture.h>
+
 namespace zandor::platform::windows {
 
-/// The edges of a box, added up.
-enum Edges : unsigned { noEdge = 0, leftEdge = 1, topEdge = 2, rightEdge = 4, bottomEdge = 8 };
+using enum comforts::Edges;
 
 class TableListener : public EntryListener {
 public:

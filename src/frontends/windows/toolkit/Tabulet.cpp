@@ -226,58 +226,21 @@ void Tabulet::titleClicked() { surroundings().comforts.titleClicked(mIndex); }
 
 void Tabulet::gestureMoved(unsigned edges, POINT way) {
     const Scale& scale = surroundings().scale;
-    Bounds box = mGestureStart;
-    const float right = scale.toTwips(way.x);
-    const float down = scale.toTwips(way.y);
-    if (!edges) {
-        box.Left += right;
-        box.Top += down;
-    }
-    // A box may be smaller than the smallest by its model; the user then cannot shrink it more.
     const SIZE smallest = mWindow->smallest();
-    const float width = std::min(scale.toTwips(smallest.cx), box.Width);
-    const float height = std::min(scale.toTwips(smallest.cy), box.Height);
-    if (edges & rightEdge) box.Width = std::max(box.Width + right, width);
-    if (edges & bottomEdge) box.Height = std::max(box.Height + down, height);
-    if (edges & leftEdge) {
-        const float by = std::min(right, box.Width - width);
-        box.Left += by;
-        box.Width -= by;
-    }
-    if (edges & topEdge) {
-        const float by = std::min(down, box.Height - height);
-        box.Top += by;
-        box.Height -= by;
-    }
+    const Bounds box = mGesture.at(edges, scale.toTwips(way.x), scale.toTwips(way.y),
+                                   scale.toTwips(smallest.cx), scale.toTwips(smallest.cy));
     if (box == bounds()) return;
     setBounds(box);
     if (mEvents.Moving) mEvents.Moving(mIndex);
 }
 
 void Tabulet::gestureEnded(unsigned edges) {
-    const TalvikTabulet::TabuletEvents& events = mEvents;
-    const std::int16_t index = mIndex;
-    const std::shared_ptr<TableWindow> window = mWindow;
-    const Bounds left = bounds();
-    // Near a corner an edge takes its neighbour along, which may have stayed where it was.
-    const bool cornerMoved = left.Left != mGestureStart.Left || left.Top != mGestureStart.Top;
-    if ((!edges || cornerMoved) && events.Moved) events.Moved(index);
-    if (!edges || !window->isAlive()) return;
-    if (cornerMoved) keepOppositeEdges(left);
-    if (events.Resized) events.Resized(index);
+    mGesture.end(edges, *this, mEvents, mIndex, [window = mWindow] { return window->isAlive(); });
 }
 
 void Tabulet::gestureTakenBack() {
-    setBounds(mGestureStart);
+    setBounds(mGesture.start());
     if (mEvents.Moving) mEvents.Moving(mIndex);
-}
-
-/// The control brings a corner that was pulled out of sight back; the other edges are to stay.
-void Tabulet::keepOppositeEdges(const Bounds& left) {
-    Bounds box = bounds();
-    if (box.Left != left.Left) box.Width = std::max(left.Left + left.Width - box.Left, 0.0F);
-    if (box.Top != left.Top) box.Height = std::max(left.Top + left.Height - box.Top, 0.0F);
-    if (box != bounds()) setBounds(box);
 }
 
 bool Tabulet::draggedOver(POINT at, DragState state) {

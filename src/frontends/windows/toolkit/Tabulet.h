@@ -60,14 +60,13 @@ private:
     EntryLook lookOf(int row) const override;
     void closeClicked() override;
     void titleClicked() override;
-    void gestureBegan() override { mGestureStart = bounds(); }
+    void gestureBegan() override { mGesture.begin(bounds()); }
     void gestureMoved(unsigned edges, POINT way) override;
     void gestureEnded(unsigned edges) override;
     void gestureTakenBack() override;
     bool draggedOver(POINT at, DragState state) override;
     void dropped(POINT at) override;
 
-    void keepOppositeEdges(const Bounds& left);
     void report(const TalvikTabulet::TabuletEvents::Mouse& handler, int row, std::int16_t button,
                 std::int16_t shift);
     void dropEntries();
@@ -81,7 +80,7 @@ private:
     Ref<platform::ImageList> mImages;
     bool mVisible = false;
     bool mEntryTaken = false; ///< the control has selected an entry
-    Bounds mGestureStart;
+    comforts::BoxGesture mGesture;
 };
 
 } // namespace zandor::platform::windows

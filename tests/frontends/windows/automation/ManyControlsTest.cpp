@@ -9,6 +9,8 @@
 
 #include <thread>
 
+#include <oleacc.h>
+
 using namespace zandor::automation;
 
 namespace {
@@ -59,6 +61,60 @@ TEST(TwoControls, StandInTwoThreads) {
     std::thread other(live);
     one.join();
     other.join();
+    EXPECT_TRUE(Dll::get().canUnload());
+}
+
+TEST(ControlsMadeAndReleased, LeaveNothingBehindWithoutAForm) {
+    expectNothingLeftBehind([] {
+        const auto control = newControl();
+        bindQuery(*control.get());
+        control->Terminate();
+    });
+    EXPECT_TRUE(Dll::get().canUnload());
+}
+
+TEST(WhatAScreenReaderKeeps, KeepsTheLibraryAndSaysThatThereIsNothingAnyMore) {
+    Held<IAccessible> kept;
+    Held<IAccessible> keptOfATable;
+    {
+        Container form;
+        form.control()->put_OnlyJoin(VARIANT_FALSE);
+        bindQuery(*form.control().get());
+        form.tell(OLEIVERB_UIACTIVATE);
+        form.pump();
+        const HWND canvas =
+            FindWindowExW(form.controlWindow(), nullptr, nullptr, L"Tables and joins");
+        const HWND table = FindWindowExW(canvas, nullptr, L"ZandorPart", L"orders");
+        ASSERT_TRUE(table);
+        const auto client = static_cast<DWORD>(OBJID_CLIENT);
+        ASSERT_EQ(
+            AccessibleObjectFromWindow(canvas, client, __uuidof(IAccessible), kept.slotOfAny()),
+            S_OK);
+        ASSERT_EQ(AccessibleObjectFromWindow(table, client, __uuidof(IAccessible),
+                                             keptOfATable.slotOfAny()),
+                  S_OK);
+        LONG count = 0;
+        EXPECT_EQ(kept->get_accChildCount(&count), S_OK);
+        EXPECT_GT(count, 0);
+    }
+    EXPECT_FALSE(Dll::get().canUnload());
+    for (const auto* const object : {&kept, &keptOfATable}) {
+        VARIANT self{};
+        self.vt = VT_I4;
+        LONG count = -1;
+        EXPECT_TRUE(FAILED((*object)->get_accChildCount(&count)));
+        BSTR name = nullptr;
+        EXPECT_TRUE(FAILED((*object)->get_accName(self, &name)));
+        EXPECT_EQ(name, nullptr);
+        VARIANT found{};
+        EXPECT_TRUE(FAILED((*object)->accHitTest(10, 10, &found)));
+        EXPECT_TRUE(FAILED((*object)->accDoDefaultAction(self)));
+        IDispatch* parent = nullptr;
+        EXPECT_TRUE(FAILED((*object)->get_accParent(&parent)));
+    }
+    kept = {};
+    EXPECT_FALSE(Dll::get().canUnload());
+    keptOfATable = {};
     EXPECT_TRUE(Dll::get().canUnload());
 }
 

@@ -98,6 +98,27 @@ void openReport(Form& form, const std::function<void()>& inside) {
     control->put_HorizontalScrollbarPos(-7);
 }
 
+void trace(Form& form) {
+    SHORT on = 1;
+    form.form.control()->put_DebugSwitch(&on);
+}
+
+void openTraceOfAPress(Form& form, const std::function<void()>& inside) {
+    trace(form);
+    meetBox(inside);
+    const HWND list = form.part(L"orders", L"LISTBOX");
+    hands::mouse(list, WM_LBUTTONDOWN, {30, 20}, MK_LBUTTON);
+    hands::mouse(list, WM_LBUTTONUP, {30, 20}, 0);
+    form.form.pump();
+}
+
+void openTraceOfABinding(Form& form, const std::function<void()>& inside) {
+    trace(form);
+    meetBox(inside);
+    const auto control = form.form.control();
+    bindQuery(*control.get());
+}
+
 void openMenuOverATable(Form& form, const std::function<void()>& inside) {
     onceOpen([inside] {
         inside();
@@ -124,6 +145,8 @@ void openDefinition(Form& form, const std::function<void()>& inside) {
 }
 
 constexpr Place places[] = {{"a report", &openReport},
+                            {"a trace of a press", &openTraceOfAPress},
+                            {"a trace while a query is bound", &openTraceOfABinding},
                             {"the menu", &openMenuOverATable},
                             {"the definition", &openDefinition}};
 

@@ -17,7 +17,15 @@ public:
     void Raise(TalvikDBxZandor::Event, const TalvikDBxZandor::EventArguments&) override {}
 };
 
-/// A host's window with a control over two tables, at a place of its own.
+BOOL CALLBACK findList(HWND child, LPARAM found) {
+    wchar_t kind[16] = {};
+    GetClassNameW(child, kind, 16);
+    if (lstrcmpiW(kind, L"LISTBOX") != 0 || !IsWindowVisible(child)) return TRUE;
+    *reinterpret_cast<HWND*>(found) = child;
+    return FALSE;
+}
+
+/// A host's window with a control over a table, at a place of its own.
 class Form {
 public:
     explicit Form(int left)
@@ -52,16 +60,7 @@ public:
     void drag(Drags::Carrier carrier) const {
         drags().setCarrier(std::move(carrier));
         HWND list = nullptr;
-        EnumChildWindows(
-            control.window(),
-            [](HWND child, LPARAM found) {
-                wchar_t kind[16] = {};
-                GetClassNameW(child, kind, 16);
-                if (lstrcmpiW(kind, L"LISTBOX") != 0 || !IsWindowVisible(child)) return TRUE;
-                *reinterpret_cast<HWND*>(found) = child;
-                return FALSE;
-            },
-            reinterpret_cast<LPARAM>(&list));
+        EnumChildWindows(control.window(), &findList, reinterpret_cast<LPARAM>(&list));
         ASSERT_TRUE(list);
         hands::mouse(list, WM_LBUTTONDOWN, {40, 24}, MK_LBUTTON);
         hands::mouse(list, WM_MOUSEMOVE, {42, 24}, MK_LBUTTON);
