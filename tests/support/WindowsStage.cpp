@@ -321,8 +321,7 @@ WindowsStage::WindowsStage(TalvikZandorLib::Library& library) : mEvents(*this) {
     // Not by a hook, of which each message of each window would have to be asked.
     sControls = reinterpret_cast<WNDPROC>(SetWindowLongPtrW(
         mControl->window(), GWLP_WNDPROC, reinterpret_cast<LONG_PTR>(&overheard)));
-    // The mouse is the stage's.
-    surroundings().drags.setCarrier([this](toolkit::Drags& drags) { carry(drags); });
+    surroundings().drags.setCarrier([this](toolkit::Drags& drags) { carry(drags); }); // its mouse
     mControl->setBounds({0, 0, 800, 600});
     mControl->show(true);
     ShowWindow(mHost, SW_SHOWNORMAL);
@@ -598,11 +597,4 @@ void WindowsStage::dialogOpened(HWND dialog) {
 
 std::unique_ptr<Stage> Stage::open(TalvikZandorLib::Library& library) {
     return std::make_unique<WindowsStage>(library);
-}
-
-int main(int argc, char** argv) {
-    const INITCOMMONCONTROLSEX classes{sizeof classes, ICC_WIN95_CLASSES | ICC_STANDARD_CLASSES};
-    InitCommonControlsEx(&classes);
-    testing::InitGoogleTest(&argc, argv);
-    return RUN_ALL_TESTS();
 }

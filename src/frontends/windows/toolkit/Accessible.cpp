@@ -1,9 +1,10 @@
 #include "frontends/windows/toolkit/Accessible.h"
 
-#include "frontends/windows/toolkit/Counted.h"
 #include "frontends/windows/toolkit/Spoken.h"
 #include "frontends/windows/toolkit/Surroundings.h"
 #include "frontends/windows/toolkit/Text.h"
+
+#include <Zandor/windows/Counted.h>
 
 #include <algorithm>
 #include <utility>

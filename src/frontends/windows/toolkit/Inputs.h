@@ -13,6 +13,9 @@ class Input : public Window {
 public:
     /// Escape, from wherever in the editor it was pressed.
     void escape() { report(VK_ESCAPE, 0); }
+    bool hasUseFor(WPARAM key, std::int16_t shift) const override {
+        return hasUseAsEditor(key, shift) || Window::hasUseFor(key, shift);
+    }
 
 protected:
     Input(std::shared_ptr<Surroundings> surroundings, KeyEvent KeyDown)

@@ -1,8 +1,9 @@
 #include "frontends/windows/toolkit/OleDrag.h"
 
-#include "frontends/windows/toolkit/Counted.h"
 #include "frontends/windows/toolkit/DragPicture.h"
 #include "frontends/windows/toolkit/Surroundings.h"
+
+#include <Zandor/windows/Counted.h>
 
 #include <cstring>
 

@@ -41,6 +41,9 @@ public:
         : Window(std::move(around)), mPick(pick) {
         createNative(L"EDIT", pick.hwnd(), WS_CHILD | WS_VISIBLE | ES_AUTOHSCROLL);
     }
+    bool hasUseFor(WPARAM key, std::int16_t shift) const override {
+        return hasUseAsEditor(key, shift) || Window::hasUseFor(key, shift);
+    }
 
     std::optional<LRESULT> told(const Message& message) override {
         if (message.id != WM_COMMAND || HIWORD(message.w) != EN_CHANGE) return {};

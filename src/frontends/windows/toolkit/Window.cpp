@@ -205,6 +205,49 @@ LRESULT Window::handle(const Message& message) {
     return passOn(message);
 }
 
+bool Window::hasUseFor(WPARAM key, std::int16_t shift) const {
+    constexpr std::int16_t control = 2;
+    constexpr std::int16_t alt = 4;
+    // The current column goes to the left and to the right, and lists drop down.
+    if (shift & alt) return key >= VK_LEFT && key <= VK_DOWN && !(shift & control);
+    switch (key) {
+    case VK_TAB: return !(shift & control);
+    case VK_ESCAPE: return GetCapture() != nullptr; // what is in hand ends by it
+    case VK_F2:
+    case VK_F6:
+    // All that walks, by words and to the ends too.
+    case VK_LEFT:
+    case VK_RIGHT:
+    case VK_UP:
+    case VK_DOWN:
+    case VK_HOME:
+    case VK_END:
+    case VK_PRIOR:
+    case VK_NEXT:
+    case VK_SPACE:
+    case VK_RETURN:
+    case VK_DELETE:
+    case VK_INSERT:
+    case VK_BACK: return true;
+    default: return !(shift & control) && !(key >= VK_F1 && key <= VK_F24);
+    }
+}
+
+bool hasUseAsEditor(WPARAM key, std::int16_t shift) {
+    constexpr std::int16_t control = 2;
+    constexpr std::int16_t alt = 4;
+    switch (key) {
+    case VK_ESCAPE:
+    case VK_F4: return !(shift & alt);
+    case 'A':
+    case 'C':
+    case 'V':
+    case 'X':
+    case 'Z': return (shift & ~1) == control;
+    default: return false;
+    }
+}
+
 void Window::setFont(const std::optional<Font>& font) {
     mFont = font;
     applyFont();

@@ -77,6 +77,9 @@ public:
     virtual std::optional<LRESULT> told(const Message&) { return {}; }
     /// The size that it needs, in pixels, where it is laid out by what it stands in.
     virtual SIZE wanted() const { return {}; }
+    /// Whether a key that goes down with this Shift means something here, be it that it is typed;
+    /// who has keys of its own asks before.
+    virtual bool hasUseFor(WPARAM key, std::int16_t shift) const;
     /// The keyboard's focus has come to it from another part of the control.
     virtual void gotFocus() {}
 
@@ -126,6 +129,9 @@ std::int16_t shiftState();
 /// The same, of a message of the mouse.
 std::int16_t shiftState(WPARAM keys);
 bool isPress(UINT message);
+/// Of the keys that others have no use for, those of what is typed in: it is left, a list drops
+/// down, and its text is edited.
+bool hasUseAsEditor(WPARAM key, std::int16_t shift);
 bool isRelease(UINT message);
 
 } // namespace zandor::platform::windows

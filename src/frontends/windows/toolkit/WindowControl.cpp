@@ -78,6 +78,18 @@ void WindowControl::print(HDC dc) const {
     if (const HWND own = window()) windows::print(own, dc);
 }
 
+bool WindowControl::hasUseFor(const MSG& message) const {
+    if (!mHouse->toolkit.surroundings().holds(message.hwnd)) return false;
+    const Window* const part = Window::around(message.hwnd);
+    switch (message.message) {
+    case WM_KEYDOWN:
+    case WM_SYSKEYDOWN:
+        return part && part->isAlive() && part->hasUseFor(message.wParam, shiftState());
+    case WM_CHAR: return true;
+    default: return false;
+    }
+}
+
 void WindowControl::close() const { mHouse->toolkit.close(); }
 
 void WindowControl::setWords(const Words& words) const {

@@ -5,7 +5,7 @@
 #include "Sink.h"
 #include "User.h"
 
-#include "frontends/windows/toolkit/Counted.h"
+#include <Zandor/windows/Counted.h>
 
 #include <gtest/gtest.h>
 

@@ -84,6 +84,44 @@ TEST_F(TheKeys, OpenAnEditorAndAreItsOwn) {
     EXPECT_NE(GetFocus(), editor);
 }
 
+TEST_F(TheKeys, AreTheSystemsWithAltEvenInAnEditor) {
+    const HWND grid = FindWindowExW(form.controlWindow(), nullptr, nullptr, L"Output columns");
+    SetFocus(grid);
+    form.press(VK_F2);
+    ASSERT_NE(GetFocus(), grid);
+    form.calls();
+    form.own = {VK_F4};
+    form.press(VK_F4, 4); // closes a form
+    EXPECT_EQ(form.calls(), Calls{"key 115 with 4"});
+    form.press(VK_F4); // drops a list down
+    EXPECT_EQ(form.calls(), Calls{});
+}
+
+TEST_F(TheKeys, OfAnInputMethodComeWholeIntoAnEditor) {
+    const HWND grid = FindWindowExW(form.controlWindow(), nullptr, nullptr, L"Output columns");
+    SetFocus(grid);
+    form.press(VK_F2);
+    const HWND editor = GetFocus();
+    wchar_t kind[16] = {};
+    GetClassNameW(editor, kind, 16);
+    ASSERT_EQ(lstrcmpiW(kind, L"EDIT"), 0);
+    SetWindowTextW(editor, L"");
+    const HIMC method = ImmGetContext(editor);
+    ASSERT_TRUE(method);
+    wchar_t composed[] = L"\u65E5\u672C";
+    EXPECT_TRUE(
+        ImmSetCompositionStringW(method, SCS_SETSTR, composed, sizeof composed - 2, nullptr, 0));
+    form.pump();
+    EXPECT_EQ(GetFocus(), editor) << "the editor stays open meanwhile";
+    ImmNotifyIME(method, NI_COMPOSITIONSTR, CPS_COMPLETE, 0);
+    form.pump();
+    ImmReleaseContext(editor, method);
+    wchar_t text[40] = {};
+    GetWindowTextW(editor, text, 40);
+    EXPECT_STREQ(text, composed);
+    EXPECT_EQ(GetFocus(), editor);
+}
+
 TEST_F(TheKeys, OfAFormsOwnButtonsAreNotTaken) {
     CONTROLINFO info{};
     EXPECT_EQ(form.as<IOleControl>()->GetControlInfo(&info), S_OK);

@@ -1,7 +1,8 @@
 #include "ScriptHost.h"
 
 #include "frontends/windows/automation/com/Failure.h"
-#include "frontends/windows/toolkit/Counted.h"
+
+#include <Zandor/windows/Counted.h>
 
 #include <algorithm>
 #include <map>

@@ -1,7 +1,8 @@
 #pragma once
 
 #include "frontends/windows/automation/com/Value.h"
-#include "frontends/windows/toolkit/Counted.h"
+
+#include <Zandor/windows/Counted.h>
 
 #include <functional>
 #include <map>

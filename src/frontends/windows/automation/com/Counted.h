@@ -1,7 +1,8 @@
 #pragma once
 
 #include "frontends/windows/automation/com/Module.h"
-#include "frontends/windows/toolkit/Counted.h"
+
+#include <Zandor/windows/Counted.h>
 
 namespace zandor::automation {
 

@@ -1,8 +1,16 @@
 #include "frontends/windows/automation/container/InPlaceObject.h"
 
-#include "frontends/windows/automation/container/keys.h"
-
 namespace zandor::automation {
+
+namespace {
+
+/// A key that goes down, or a letter with Alt.
+bool isPressed(const MSG& message) {
+    return message.message == WM_KEYDOWN || message.message == WM_SYSKEYDOWN ||
+           message.message == WM_SYSCHAR;
+}
+
+} // namespace
 
 void* InPlaceObject::find(REFIID iid) {
     if (iid == IID_IOleWindow) return static_cast<IOleInPlaceObject*>(this);
@@ -39,7 +47,7 @@ STDMETHODIMP InPlaceObject::TranslateAccelerator(LPMSG message) {
     if (!message) return E_POINTER;
     const Held<IUnknown> meanwhile(&whole());
     if (!mPlacement.isActive()) return S_FALSE;
-    if (isForControl(*message, mPlacement.window())) {
+    if (mPlacement.hasUseFor(*message)) {
         TranslateMessage(message);
         DispatchMessageW(message);
         return S_OK;

@@ -28,6 +28,8 @@ public:
     void setSite(IOleClientSite* site);
     /// The control's own window; nullptr once it has gone with its container's.
     HWND window() const { return mHouse.shown().window(); }
+    /// Whether a key means something in the control.
+    bool hasUseFor(const MSG& message) const { return mHouse.shown().hasUseFor(message); }
 
     bool isActive() const { return bool(mInPlace); }
     /// Shows the control in the container's window, and with `ui` gives it the keyboard.

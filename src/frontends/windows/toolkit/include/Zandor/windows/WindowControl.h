@@ -66,6 +66,10 @@ public:
     /// A box, a dialog or a menu of the control is about to open; what comes back is called when it
     /// has closed, even if the control has ended meanwhile.
     void onModal(std::function<std::function<void()>()> open) const;
+    /// Whether a message is a key that means something where it goes in the control: what is typed
+    /// and what walks, Enter and Delete, Escape where there is something to leave, and the editing
+    /// keys while an editor is open. A host with keys of its own in its message loop asks before.
+    bool hasUseFor(const MSG& message) const;
     /// The host's window is about to go: boxes shown from now on stand on their own.
     void close() const;
 

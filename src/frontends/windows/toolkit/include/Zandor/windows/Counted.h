@@ -1,10 +1,15 @@
 #pragma once
 
-#include "frontends/windows/toolkit/system.h"
+#include <atomic>
+
+#include <windows.h>
 
 #include <unknwn.h>
 
-#include <atomic>
+// Names of ours, which the system takes for two forms of its own.
+#undef MessageBox
+#undef RegisterWindowMessage
+#undef SendMessage
 
 namespace zandor::platform::windows {
 
