@@ -105,10 +105,14 @@ public:
     }
 
 private:
+    /// Nothing twice.
     static std::vector<Node> simplifiedTerms(const std::vector<Node>& terms) {
         std::vector<Node> all;
         for (const Node& term : terms)
-            for (const Node& each : termsOf(sql::simplified(term))) all.push_back(each);
+            for (const Node& each : termsOf(sql::simplified(term)))
+                if (std::none_of(all.begin(), all.end(),
+                                 [&](const Node& other) { return sql::same(other, each); }))
+                    all.push_back(each);
         return all;
     }
 

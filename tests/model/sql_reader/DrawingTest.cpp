@@ -178,6 +178,12 @@ TEST_F(Statement, JoinsATableWithItselfWhereThatLeavesItsConditionsAsTheyAre) {
     EXPECT_TRUE(record.joins.empty()) << "a cell says it as well";
 }
 
+TEST_F(Statement, AsksForNothingTwice) {
+    read(u"SELECT city, COUNT(*) AS n FROM customers WHERE city = 'a' OR city > 'c' GROUP BY city "
+         u"HAVING (city = 'a' OR city > 'c') AND COUNT(*) > 1");
+    EXPECT_EQ(criteria(1), (Texts{"4: a Or > c"}));
+}
+
 TEST_F(Statement, KnowsANameOfWithOnlyWhereItStands) {
     EXPECT_EQ(refusal(u"SELECT a.city FROM w, (WITH w AS (SELECT city FROM customers) "
                       u"SELECT DISTINCT * FROM (SELECT city FROM w) AS q) AS a, w",
