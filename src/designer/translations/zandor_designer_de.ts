@@ -1308,6 +1308,10 @@
         <source>there is no output column %1.</source>
         <translation>es gibt keine Ausgabespalte %1.</translation>
     </message>
+    <message>
+        <source>a comment that is run</source>
+        <translation>einen Kommentar, der ausgeführt wird</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

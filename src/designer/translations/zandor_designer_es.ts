@@ -1308,6 +1308,10 @@
         <source>there is no output column %1.</source>
         <translation>no hay columna de salida %1.</translation>
     </message>
+    <message>
+        <source>a comment that is run</source>
+        <translation>un comentario que se ejecuta</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

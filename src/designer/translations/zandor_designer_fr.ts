@@ -1308,6 +1308,10 @@
         <source>there is no output column %1.</source>
         <translation>il n&apos;y a pas de colonne de sortie %1.</translation>
     </message>
+    <message>
+        <source>a comment that is run</source>
+        <translation>un commentaire qui est exécuté</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

@@ -13,7 +13,8 @@
 using namespace zandor;
 
 // What the printer writes is read into a drawing that is written the same. ZANDOR_SEED makes other
-// random ones, ZANDOR_READINGS more or fewer, ZANDOR_DIALECT those of one ("mysql"); ZANDOR_SHOW shows what is written otherwise.
+// random ones, ZANDOR_READINGS more or fewer, ZANDOR_DIALECT those of one ("mysql"); ZANDOR_SHOW
+// shows what is written otherwise.
 
 namespace {
 
