@@ -6,14 +6,13 @@ namespace zandor::model::sql {
 
 namespace {
 
-/// No character in a comment may end it before its line does.
 std::vector<String> linesOf(StringView text) {
     std::vector<String> lines{{}};
     for (const char16_t c : text) {
         if (c == u'\n')
             lines.emplace_back();
         else if (c != u'\r')
-            lines.back() += c < u' ' || c == 0x7F || c == 0x85 || c == 0x2028 || c == 0x2029 ? u' ' : c;
+            lines.back() += isBlankInComment(c) ? u' ' : c;
     }
     for (String& line : lines) line.erase(line.find_last_not_of(u' ') + 1);
     return lines;

@@ -6,6 +6,11 @@
 
 namespace zandor::model::sql {
 
+/// Whether a character would end a comment for somebody, or cannot be seen in it.
+inline bool isBlankInComment(char16_t c) {
+    return c <= u' ' || c == 0x7F || c == 0x85 || c == 0x2028 || c == 0x2029;
+}
+
 /// The comments of a statement, handed out once each.
 class Remarks {
 public:

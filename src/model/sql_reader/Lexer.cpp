@@ -1,5 +1,6 @@
 #include "model/sql_reader/Lexer.h"
 
+#include "model/sql/Remarks.h"
 #include "model/sql/ReservedWords.h"
 #include "model/sql_reader/Refused.h"
 
@@ -56,11 +57,11 @@ String withoutMargins(StringView inner) {
         const std::size_t end = std::min(inner.find(u'\n'), inner.size());
         StringView line = inner.substr(0, end);
         inner.remove_prefix(std::min(end + 1, inner.size()));
-        constexpr StringView margin = u" \t\r*";
-        line.remove_prefix(std::min(line.find_first_not_of(margin), line.size()));
-        while (!line.empty() && margin.find(line.back()) != StringView::npos) line.remove_suffix(1);
+        const auto isMargin = [](char16_t c) { return c == u'*' || model::sql::isBlankInComment(c); };
+        while (!line.empty() && isMargin(line.front())) line.remove_prefix(1);
+        while (!line.empty() && isMargin(line.back())) line.remove_suffix(1);
         if (!text.empty()) text += u'\n';
-        text += line;
+        for (const char16_t c : line) text += model::sql::isBlankInComment(c) ? u' ' : c;
     }
     while (text.ends_with(u'\n')) text.pop_back();
     return text;
@@ -149,7 +150,7 @@ private:
                 ++mAt;
             }
         } while (depth > 0);
-        keep(begin, mText.substr(begin + 2, mAt - begin - 4));
+        keep(begin, mText.substr(begin + 2, mAt - begin - 4), false);
         return true;
     }
 
@@ -164,15 +165,16 @@ private:
             return c == u'\n' || (c == u'\r' && is(Dialect::PostgreSQL));
         };
         while (mAt < mText.size() && !ends(at())) ++mAt;
-        keep(begin, mText.substr(begin + mark, mAt - begin - mark));
+        keep(begin, mText.substr(begin + mark, mAt - begin - mark), true);
         return true;
     }
 
-    void keep(std::size_t begin, StringView inner) {
-        const std::size_t line = begin == 0 ? StringView::npos : mText.rfind(u'\n', begin - 1);
-        const bool beside = mLast.second > (line == StringView::npos ? 0 : line + 1);
+    /// An empty line parts others.
+    void keep(std::size_t begin, StringView inner, bool line) {
+        const std::size_t before = begin == 0 ? StringView::npos : mText.rfind(u'\n', begin - 1);
+        const bool beside = mLast.second > (before == StringView::npos ? 0 : before + 1);
         const String text = withoutMargins(inner);
-        if (!text.empty()) mOut.comments.push_back({mOut.text.size(), beside, text});
+        if (!text.empty() || (line && !beside)) mOut.comments.push_back({mOut.text.size(), beside, text});
         mOut.text += ' ';
     }
 

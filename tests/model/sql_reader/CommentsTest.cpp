@@ -132,6 +132,18 @@ TEST_F(Comments, OfBlocksBecomeLines) {
                       "FROM customers");
 }
 
+TEST_F(Comments, AreWrittenTheSameWhateverWasInThem) {
+    for (const String& inner : {u"\x7F  * a\u2028 * b"s, u"\x01-- c"s, u"**\x02"s, u" \u0085 d \t"s}) {
+        read(u"SELECT name -- " + inner + u"\n FROM customers /*" + inner + u"*/");
+        const std::string once = text();
+        read(platform::fromUtf8(std::string_view(once)));
+        EXPECT_EQ(text(), once);
+    }
+    expectKept(u"-- a\n--\n-- b\nSELECT\n    customers.name\nFROM customers");
+    read(u"/*\n\n a\n\n b\n\n*/ SELECT name FROM customers --");
+    EXPECT_EQ(text(), "-- a\n--\n-- b\nSELECT\n    customers.name\nFROM customers");
+}
+
 TEST_F(Comments, WithinACalculationStandByTheWhole) {
     read(u"SELECT id,\n  COALESCE(\n    -- where known\n    city, name) AS c\nFROM customers");
     EXPECT_EQ(comments(), (Texts{"column x2: where known"}));
