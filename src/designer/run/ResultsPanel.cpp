@@ -277,11 +277,17 @@ void ResultsPanel::takeAsked() {
     mAsked = typed ? typed->text : drawn();
 }
 
-/// What the drawing asks for at the moment, of which places and widths are no part.
+/// What the drawing asks for at the moment, of which places, widths and comments are no part.
 platform::String ResultsPanel::drawn() {
-    return model::sql::statementText(*mDocument.query(), mDatabase.dialect(),
-                                     model::sql::ValueForm::literal)
-        .text;
+    const auto dialect = mDatabase.dialect();
+    auto run = statementText(*mDocument.query(), dialect, model::sql::ValueForm::bound);
+    for (const auto& binding : run.bindings) {
+        const auto* value = std::get_if<model::sql::Value>(&binding);
+        run.text += u'\n';
+        run.text += value ? model::sql::literal(*value, dialect)
+                          : u':' + std::get<model::sql::Parameter>(binding).name;
+    }
+    return std::move(run.text);
 }
 
 bool ResultsPanel::isOutdated() {

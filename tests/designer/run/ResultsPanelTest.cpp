@@ -277,6 +277,27 @@ TEST_F(TheResultsPanel, ShowsAFormatAtOnceAndExportsTheValuesThemselves) {
     EXPECT_EQ(at(0, 1), "2026-07-22");
 }
 
+TEST_F(TheResultsPanel, TakesACommentForNoChange) {
+    open(numbersTable(10));
+    show({"numbers"});
+    pressRun();
+    ASSERT_TRUE(ended());
+    document.change("Comment", [](model::Query& query) {
+        auto options = query.options();
+        options.comments.push_back({.text = u"of all numbers"});
+        query.options(options);
+    });
+    QCoreApplication::processEvents();
+    EXPECT_EQ(status().find("changed"), std::string::npos);
+    document.change("Fewer", [](model::Query& query) {
+        auto options = query.options();
+        options.first = 3;
+        query.options(options);
+    });
+    QCoreApplication::processEvents();
+    EXPECT_THAT(status(), HasSubstr("the drawing has changed since"));
+}
+
 TEST_F(TheResultsPanel, SaysThatTheDrawingHasChangedWhileItRan) {
     open(numbersTable(10));
     show({"numbers"});
