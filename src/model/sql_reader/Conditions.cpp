@@ -37,6 +37,21 @@ Node asCondition(const Node& node) {
                                   sql::make(sql::Value{ColumnType::Boolean, u"true"})});
 }
 
+bool asksForTruth(const Node& node) {
+    namespace sql = model::sql;
+    const auto isTruth = [](const Node& part) {
+        return sql::isCondition(*part) || sql::typeOf(*part) == ColumnType::Boolean;
+    };
+    const auto parts = sql::partsOf(*node);
+    const bool joint = std::holds_alternative<sql::And>(node->node) ||
+                       std::holds_alternative<sql::Or>(node->node) ||
+                       std::holds_alternative<sql::Not>(node->node);
+    if (joint && !std::all_of(parts.begin(), parts.end(), isTruth)) return false;
+    const auto* choice = std::get_if<sql::Choice>(&node->node);
+    if (choice && !isTruth(choice->condition)) return false;
+    return std::all_of(parts.begin(), parts.end(), asksForTruth);
+}
+
 void checkMoments(const Node& node, const std::vector<String>& texts, std::size_t place) {
     if (const auto* value = std::get_if<model::sql::Value>(&node->node)) {
         const bool moment = value->type == ColumnType::Date || value->type == ColumnType::Time ||

@@ -10,6 +10,9 @@ using model::sql::Node;
 /// A condition with what it speaks about on the left, and for a value alone that it is true.
 Node asCondition(const Node& node);
 
+/// Whether what is joined by And, Or and Not, or chooses, is true or false, however deep it stands.
+bool asksForTruth(const Node& node);
+
 /// Whether it holds in every row, as people write it to have an AND before each of the others.
 bool holdsAlways(const Node& node);
 

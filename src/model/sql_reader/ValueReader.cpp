@@ -173,6 +173,7 @@ Node ValueReader::read(const Tree& tree, Pass& pass) const {
     auto reading = model::criteria::readExpression(typed, pass);
     if (reading.error)
         refuse<MessageCode::notUnderstood>(blame(tree, pass), std::move(reading.error->message));
+    if (!asksForTruth(reading.value)) refuse<MessageCode::criterionNotDrawn>(tree.place());
     if (mDialect == Dialect::SQLite) checkMoments(reading.value, pass.texts, tree.place());
     return pass.filled(reading.value);
 }

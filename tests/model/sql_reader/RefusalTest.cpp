@@ -62,6 +62,17 @@ TEST_F(Refusals, ComeOfTooMuchAndTooDeepAndNothingElseDoes) {
               "Line 1, column 100001: t");
 }
 
+TEST_F(Refusals, AskWhatIsNeitherTrueNorFalseForNoTruth) {
+    for (const auto* text :
+         {u"SELECT name + name OR name FROM customers", u"SELECT NOT name FROM customers",
+          u"SELECT CASE WHEN name THEN 1 END FROM customers",
+          u"SELECT name FROM customers WHERE active AND (NOT name OR active)"})
+        EXPECT_NE(refusal(text, Dialect::SqlServer).find("condition"), std::string::npos)
+            << refusal(text, Dialect::SqlServer);
+    EXPECT_EQ(refusal(u"SELECT CASE WHEN active THEN 1 END AS n FROM customers WHERE NOT active"),
+              "drawn");
+}
+
 TEST_F(Refusals, NameASchemaThatTheTableIsNotOf) {
     EXPECT_EQ(refusal(u"SELECT other.customers.name FROM customers"),
               refusal(u"SELECT other.customers.* FROM customers"));
