@@ -146,7 +146,10 @@ void ExpressionPrinter::write(const ColumnRef& reference, Tightness) { mOut.colu
 
 void ExpressionPrinter::write(const Value& value, Tightness) {
     if (mOut.form != ValueForm::bound || mWritesOut || mInItem) {
-        mOut.text += literal(value, mOut.dialect);
+        const bool counted = mOut.countsTruth && value.type == ColumnType::Boolean;
+        mOut.text += !counted                ? literal(value, mOut.dialect)
+                     : value.text == u"true" ? String(u"1")
+                                             : String(u"0");
         return;
     }
     mOut.text += placeholder(value.type, mOut.dialect);

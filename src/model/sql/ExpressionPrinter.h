@@ -18,6 +18,7 @@ struct Output {
     String text{};
     std::vector<Binding> bindings{};
     std::size_t commentEnd = 0; ///< of the newest comment; 0: none
+    bool countsTruth = false;   ///< writes 1 and 0 for true and false
 
     /// A name in the dialect's quotes. Throws a Refusal where it cannot carry it.
     void name(StringView name);

@@ -499,7 +499,27 @@ private:
     std::set<String> mTaken;
 };
 
+bool namesTruth(const Statement& statement);
+
+bool namesTruth(const Source& source) {
+    if (const auto* join = std::get_if<JoinSource>(&source.node))
+        return namesTruth(*join->left) || namesTruth(*join->right);
+    const auto* query = std::get_if<SubSelect>(&source.node);
+    return query && namesTruth(*query->statement);
+}
+
+/// Whether a column comes out under a name that SQLite then takes TRUE or FALSE for.
+bool namesTruth(const Statement& statement) {
+    return std::any_of(statement.items.begin(), statement.items.end(),
+                       [](const SelectItem& item) {
+                           return sameName(item.name, u"true") || sameName(item.name, u"false");
+                       }) ||
+           std::any_of(statement.from.begin(), statement.from.end(),
+                       [](const SourceNode& source) { return namesTruth(*source); });
+}
+
 Printed whole(const Statement& statement, Output out) {
+    out.countsTruth = out.dialect == Dialect::SQLite && namesTruth(statement);
     Sharing sharing(statement);
     SharedQueries shared;
     Printer all(out, statement, shared, {}, 0);

@@ -255,6 +255,18 @@ TEST(ThePrinter, MatchesAColumnOfUnknownTypeAsTextOnPostgres) {
               "WHERE t.x NOT LIKE '4\\\\%%'");
 }
 
+TEST(ThePrinter, CountsTruthWhereSqliteWouldTakeItForAColumn) {
+    Statement statement = where(make(Compare{Comparison::equal, column(u"a", ColumnType::Boolean),
+                                             value(u"true", ColumnType::Boolean)}));
+    EXPECT_NE(text(statement, Dialect::SQLite, ValueForm::literal).find("a = TRUE"),
+              std::string::npos);
+    statement.items = {{column(u"b"), u"True"}};
+    EXPECT_NE(text(statement, Dialect::SQLite, ValueForm::literal).find("a = 1"),
+              std::string::npos);
+    EXPECT_NE(text(statement, Dialect::PostgreSQL, ValueForm::literal).find("a = TRUE"),
+              std::string::npos);
+}
+
 TEST(ThePrinter, IsStable) {
     const Statement statement = where(make(Or{{equals(u"1"), equals(u"2")}}));
     for (const Dialect dialect : allDialects)

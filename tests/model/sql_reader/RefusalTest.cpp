@@ -73,6 +73,13 @@ TEST_F(Refusals, AskWhatIsNeitherTrueNorFalseForNoTruth) {
               "drawn");
 }
 
+TEST_F(Refusals, TakeNoWordForTruthAsANameInSqlite) {
+    const auto text = u"SELECT name AS \"True\" FROM customers WHERE active = TRUE";
+    EXPECT_EQ(refusal(text), "Line 1, column 8: a drawing has no place for this (AS true); it can "
+                             "be run as it is.");
+    EXPECT_EQ(refusal(text, Dialect::PostgreSQL), "drawn");
+}
+
 TEST_F(Refusals, NameASchemaThatTheTableIsNotOf) {
     EXPECT_EQ(refusal(u"SELECT other.customers.name FROM customers"),
               refusal(u"SELECT other.customers.* FROM customers"));
