@@ -343,6 +343,7 @@ private:
         const bool behindAs = model::sameName(last, u"as") && !inCast();
         if (is(Dialect::PostgreSQL) || (!qualified && !behindAs && isSyntax(folded) &&
                                         !isNameHere(folded, called))) {
+            mOut.saysTruth = mOut.saysTruth || folded == u"true" || folded == u"false";
             put(typed, begin);
             return;
         }

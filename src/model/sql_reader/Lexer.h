@@ -28,6 +28,8 @@ struct ParserText {
     };
     std::vector<Origin> origins;
 
+    bool saysTruth = false; ///< TRUE or FALSE, other than behind AS or a point
+
     /// What stood at a byte of it.
     struct Comment {
         std::size_t byte;

@@ -210,7 +210,8 @@ void StatementReader::item(const Tree& target, const ValueReader& values, Select
     into.commented.emplace(target.place(), items.size());
     const String name = model::foldedName(target.text("name"));
     // SQLite then takes the word for the column wherever it stands.
-    if (mDialect == Dialect::SQLite && (name == u"true" || name == u"false"))
+    const bool taken = mDialect == Dialect::SQLite && mText.saysTruth;
+    if (taken && (name == u"true" || name == u"false"))
         refuse<MessageCode::noPlaceFor>(target.place(), model::say<MessageCode::thisPart>(u"AS " + name));
     if (value.is("FuncCall") && value.names("funcname").back() == topFunction) {
         limit(value.list("args").front(), into);

@@ -74,10 +74,15 @@ TEST_F(Refusals, AskWhatIsNeitherTrueNorFalseForNoTruth) {
 }
 
 TEST_F(Refusals, TakeNoWordForTruthAsANameInSqlite) {
-    const auto text = u"SELECT name AS \"True\" FROM customers WHERE active = TRUE";
-    EXPECT_EQ(refusal(text), "Line 1, column 8: a drawing has no place for this (AS true); it can "
+    const auto named = u"SELECT name AS \"True\" FROM customers WHERE active = TRUE";
+    EXPECT_EQ(refusal(named), "Line 1, column 8: a drawing has no place for this (AS true); it can "
                              "be run as it is.");
-    EXPECT_EQ(refusal(text, Dialect::PostgreSQL), "drawn");
+    EXPECT_EQ(refusal(named, Dialect::PostgreSQL), "drawn");
+    EXPECT_NE(refusal(u"SELECT name TRUE, city FROM customers WHERE active"), "drawn");
+    read(u"SELECT TRUE FROM customers WHERE active");
+    EXPECT_EQ(text(), "SELECT\n    1 AS True\nFROM customers\nWHERE customers.active = 1");
+    read(zandor::platform::fromUtf8(std::string_view(text())));
+    EXPECT_EQ(text(), "SELECT\n    1 AS True\nFROM customers\nWHERE customers.active = 1");
 }
 
 TEST_F(Refusals, NameASchemaThatTheTableIsNotOf) {
