@@ -48,7 +48,7 @@ struct Tokens {
 Tokens tokens(StringView text, Mode mode, std::size_t from = 0);
 
 /// A character that text cannot carry to any engine, or too many of them.
-std::optional<Error> unusable(StringView text);
+ZANDOR_MODEL_EXPORT std::optional<Error> unusable(StringView text);
 
 /// Whether there is nothing but blanks: no criterion.
 bool isBlank(StringView text);

@@ -1,6 +1,9 @@
 #include <Zandor/sql/Expression.h>
 
 #include <algorithm>
+#include <array>
+#include <cstddef>
+#include <memory_resource>
 #include <type_traits>
 
 namespace zandor::model::sql {
@@ -143,9 +146,20 @@ bool same(const Node& left, const Node& right) {
         },
         left->node);
     if (!own) return false;
-    const auto a = partsOf(*left);
-    const auto b = partsOf(*right);
-    return std::equal(a.begin(), a.end(), b.begin(), b.end(), same);
+    // Without memory of its own: conditions are compared each with each.
+    std::array<std::byte, 512> room;
+    std::pmr::monotonic_buffer_resource memory(room.data(), room.size());
+    std::pmr::vector<const Node*> parts(&memory);
+    const auto collect = [&](const auto& part) {
+        eachPart(part, [&](const Node& node) { parts.push_back(&node); });
+    };
+    std::visit(collect, left->node);
+    const std::size_t count = parts.size();
+    std::visit(collect, right->node);
+    if (parts.size() != 2 * count) return false;
+    return std::equal(parts.begin(), parts.begin() + static_cast<std::ptrdiff_t>(count),
+                      parts.begin() + static_cast<std::ptrdiff_t>(count),
+                      [](const Node* a, const Node* b) { return same(*a, *b); });
 }
 
 Node allOf(std::vector<Node> terms) { return joined<And>(std::move(terms)); }

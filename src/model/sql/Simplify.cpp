@@ -1,5 +1,7 @@
 #include "model/sql/Simplify.h"
 
+#include "model/sql/NodeSet.h"
+
 #include <algorithm>
 #include <optional>
 
@@ -46,38 +48,47 @@ std::optional<Choices> choicesOf(const Node& term) {
     return {};
 }
 
-bool contains(const std::vector<Node>& nodes, const Node& sought) {
-    return std::any_of(nodes.begin(), nodes.end(),
-                       [&](const Node& node) { return same(node, sought); });
-}
-
 std::vector<Node> withoutRepeats(std::vector<Node> terms) {
     std::vector<Node> kept;
+    NodeSet known;
     for (Node& term : terms)
-        if (!contains(kept, term)) kept.push_back(std::move(term));
+        if (known.insert(term).second) kept.push_back(std::move(term));
     return kept;
 }
 
 /// Terms one of which must hold: those that give one value constants become one list, where the
 /// first of them stands.
 std::vector<Node> withLists(std::vector<Node> terms) {
+    struct Given {
+        std::size_t place; ///< of the first
+        ColumnType type;
+        std::vector<Node> list;
+        bool again = false; ///< there were more
+    };
     std::vector<Node> kept;
+    NodeMap<std::vector<Given>> given; // by what they are given to
     for (Node& term : terms) {
-        const auto more = choicesOf(term);
-        const auto same = std::find_if(kept.begin(), kept.end(), [&](const Node& before) {
-            const auto choices = more ? choicesOf(before) : std::nullopt;
-            return choices && sql::same(choices->operand, more->operand) &&
-                   typeOf(*choices->list.front()) == typeOf(*more->list.front());
-        });
-        if (same == kept.end()) {
-            kept.push_back(std::move(term));
+        const auto choices = choicesOf(term);
+        kept.push_back(std::move(term));
+        if (!choices) continue;
+        const ColumnType type = typeOf(*choices->list.front());
+        auto& all = given[choices->operand];
+        const auto same = std::find_if(all.begin(), all.end(),
+                                       [&](const Given& each) { return each.type == type; });
+        if (same == all.end()) {
+            all.push_back({.place = kept.size() - 1, .type = type, .list = choices->list});
             continue;
         }
-        Choices all = *choicesOf(*same);
-        for (const Node& item : more->list)
-            if (!contains(all.list, item)) all.list.push_back(item);
-        if (all.list.size() > 1) *same = make(In{false, all.operand, all.list});
+        same->list.insert(same->list.end(), choices->list.begin(), choices->list.end());
+        same->again = true;
+        kept.pop_back();
     }
+    for (auto& [operand, all] : given)
+        for (Given& each : all) {
+            if (!each.again) continue;
+            auto list = withoutRepeats(std::move(each.list));
+            if (list.size() > 1) kept[each.place] = make(In{false, operand, std::move(list)});
+        }
     return kept;
 }
 

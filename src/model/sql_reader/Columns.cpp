@@ -47,19 +47,36 @@ void Columns::addItems() {
     addGroups();
 }
 
-/// Rows are put together in the order of the grid: a group that does not come out stands before the
-/// next one that does.
+/// Rows are put together in the order of the grid.
 void Columns::addGroups() {
-    const auto& groups = mSelected.statement.group;
-    for (auto group = groups.begin(); group != groups.end(); ++group) {
-        if (!find(*group, false).empty()) continue;
-        add(*group, false);
-        for (auto behind = group + 1; behind != groups.end(); ++behind)
-            if (const auto known = find(*behind, false); !known.empty()) {
-                moveNewestBefore(*known.front());
-                break;
-            }
+    addInOrder(
+        mSelected.statement.group, [this](const Node& group) { return find(group, false); },
+        [this](const Node& group) -> Column& { return add(group, false); });
+}
+
+std::vector<Columns::Column*> Columns::addInOrder(
+    const std::vector<Node>& subjects,
+    const std::function<std::vector<Column*>(const Node&)>& known,
+    const std::function<Column&(const Node&)>& make) {
+    std::vector<Column*> columns;
+    for (const Node& subject : subjects) {
+        const auto all = known(subject);
+        columns.push_back(all.empty() ? nullptr : all.front());
     }
+    std::vector<const Column*> next(subjects.size()); // known, behind each
+    for (std::size_t n = subjects.size(); n > 1; --n)
+        next[n - 2] = columns[n - 1] ? columns[n - 1] : next[n - 1];
+    for (std::size_t n = 0; n < subjects.size(); ++n) {
+        if (columns[n]) continue;
+        // It may be one that was just made.
+        if (const auto all = known(subjects[n]); !all.empty()) {
+            columns[n] = all.front();
+            continue;
+        }
+        columns[n] = &make(subjects[n]);
+        if (next[n]) moveNewestBefore(*next[n]);
+    }
+    return columns;
 }
 
 void Columns::addAllOf(const String& table) {
@@ -126,9 +143,10 @@ std::vector<Columns::Column*> Columns::knownFor(const Node& subject, bool apart)
     return known;
 }
 
-Columns::Column& Columns::forCondition(const Node& subject, bool apart) {
-    if (const auto known = knownFor(subject, apart); !known.empty()) return *known.front();
-    return addForCondition(subject);
+std::vector<Columns::Column*> Columns::forConditions(const std::vector<Node>& subjects, bool apart) {
+    return addInOrder(
+        subjects, [&](const Node& subject) { return knownFor(subject, apart); },
+        [this](const Node& subject) -> Column& { return addForCondition(subject); });
 }
 
 Columns::Column& Columns::addForCondition(const Node& subject) {
@@ -195,11 +213,9 @@ void Columns::sort() {
         column.definition->SortOrder(item.descending ? 2 : 1);
         sorted.push_back(&column);
     }
-    const bool inOrder =
-        std::is_sorted(sorted.begin(), sorted.end(), [&](const Column* one, const Column* other) {
-            return placeOf(*one) < placeOf(*other);
-        });
-    if (inOrder) return;
+    std::vector<std::size_t> places;
+    for (const Column* column : sorted) places.push_back(placeOf(*column));
+    if (std::is_sorted(places.begin(), places.end())) return;
     std::int16_t priority = 0;
     for (const Column* column : sorted) {
         if (priority == model::ColumnDefinition::greatestSortPriority) return;

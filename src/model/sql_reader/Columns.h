@@ -5,6 +5,7 @@
 #include "model/criteria/Parser.h"
 
 #include <deque>
+#include <functional>
 
 namespace zandor::sql_reader {
 
@@ -32,15 +33,13 @@ public:
         model::criteria::Subject subject;
         Ref<model::ColumnDefinition> definition;
     };
-    /// The column that a condition on rows as they are stands under, made where there is none; one
-    /// that only chooses (`apart`) where rows are put together and it means those before.
-    Column& forCondition(const Node& subject, bool apart);
+    /// The columns that conditions on rows as they are stand under, made where there are none; those
+    /// that only choose (`apart`) where rows are put together and they mean those before.
+    std::vector<Column*> forConditions(const std::vector<Node>& subjects, bool apart);
     /// One of its own, behind another one or before all.
     Column& ownForCondition(const Node& subject, const Column* behind);
     /// All that it could stand under, as they follow each other in the grid.
     std::vector<Column*> knownFor(const Node& subject, bool apart);
-    /// Brings the newest column before another, so that conditions keep their order.
-    void moveNewestBefore(const Column& other);
     /// Counted from 0, with all columns of the grid.
     std::size_t placeOf(const Column& column) const;
 
@@ -54,6 +53,12 @@ private:
     void fillValue(model::ColumnDefinition& definition, const Node& value);
     std::vector<Column*> find(const Node& subject, bool apart);
     void addGroups();
+    /// The columns of these subjects in their order: one that is not known is made, before the next
+    /// of those behind it that is.
+    std::vector<Column*> addInOrder(const std::vector<Node>& subjects,
+                                    const std::function<std::vector<Column*>(const Node&)>& known,
+                                    const std::function<Column&(const Node&)>& make);
+    void moveNewestBefore(const Column& other);
     bool isNameless() const;
     Column& addForCondition(const Node& subject);
 

@@ -2,6 +2,7 @@
 
 #include "model/criteria/QueryColumns.h"
 #include "model/criteria/Writer.h"
+#include "model/sql/NodeSet.h"
 #include "model/sql/Simplify.h"
 #include "model/sql_reader/Columns.h"
 #include "model/sql_reader/Refused.h"
@@ -68,15 +69,12 @@ Cells runsOf(const std::vector<Node>& terms) {
 /// All conditions on one value share a cell.
 Cells cellsOf(const std::vector<Node>& terms) {
     Cells cells;
+    sql::NodeMap<std::size_t> known;
     for (const Node& term : terms) {
         const Node subject = subjectOf(term);
-        const auto known = std::find_if(cells.begin(), cells.end(), [&](const auto& cell) {
-            return sql::same(cell.first, subject);
-        });
-        if (known == cells.end())
-            cells.push_back({subject, {term}});
-        else
-            known->second.push_back(term);
+        const auto [at, added] = known.emplace(subject, cells.size());
+        if (added) cells.push_back({subject, {}});
+        cells[at->second].second.push_back(term);
     }
     return cells;
 }
@@ -108,21 +106,19 @@ private:
     /// Nothing twice.
     static std::vector<Node> simplifiedTerms(const std::vector<Node>& terms) {
         std::vector<Node> all;
+        sql::NodeSet known;
         for (const Node& term : terms)
             for (const Node& each : termsOf(sql::simplified(term)))
-                if (std::none_of(all.begin(), all.end(),
-                                 [&](const Node& other) { return sql::same(other, each); }))
-                    all.push_back(each);
+                if (known.insert(each).second) all.push_back(each);
         return all;
     }
 
     /// A drawing asks for what rows are put together by before all that only chooses rows.
     std::vector<Node> groupsFirst(std::vector<Node> terms) const {
-        const auto& groups = mSelected.statement.group;
+        const auto& all = mSelected.statement.group;
+        const sql::NodeSet groups(all.begin(), all.end());
         std::stable_partition(terms.begin(), terms.end(), [&](const Node& term) {
-            const Node subject = subjectOf(term);
-            return std::any_of(groups.begin(), groups.end(),
-                               [&](const Node& group) { return sql::same(group, subject); });
+            return groups.contains(subjectOf(term));
         });
         return terms;
     }
@@ -163,8 +159,9 @@ private:
         auto places = placesInOrder(columns, cells, apart);
         if (places.empty()) {
             cells = cellsOf(terms);
-            for (std::size_t n = 0; n < cells.size(); ++n)
-                places.push_back(&columnFor(columns, cells, n, apart));
+            std::vector<Node> subjects;
+            for (const auto& cell : cells) subjects.push_back(cell.first);
+            places = columns.forConditions(subjects, apart);
         }
         const model::criteria::QueryColumns names(mQuery->Tables());
         const String key = platform::decimal(row);
@@ -239,20 +236,6 @@ private:
         return places;
     }
 
-    /// Made where there is none, before those of the conditions behind it.
-    static Columns::Column& columnFor(Columns& columns, const Cells& cells, std::size_t n,
-                                      bool apart) {
-        if (const auto known = columns.knownFor(cells[n].first, apart); !known.empty())
-            return *known.front();
-        Columns::Column& made = columns.forCondition(cells[n].first, apart);
-        for (std::size_t behind = n + 1; behind < cells.size(); ++behind)
-            if (const auto other = columns.knownFor(cells[behind].first, apart); !other.empty()) {
-                columns.moveNewestBefore(*other.front());
-                break;
-            }
-        return made;
-    }
-
     /// Where a condition stands.
     struct Cell {
         Node term;
@@ -311,11 +294,10 @@ Ref<Query> drawn(const Selected& selected, const std::function<bool(Query&)>& is
             return false;
         }
     };
-    for (const Layout layout : {Layout::cells, Layout::rows, Layout::loops})
-        if (isDone(layout)) return sound;
+    const bool exact = isDone(Layout::cells) || isDone(Layout::rows) || isDone(Layout::loops);
     if (!sound) isDone(Layout::mixed);
     if (!sound) throw Refused(*first);
-    if (isWhole) isDone(Layout::ordered);
+    if (!exact && isWhole) isDone(Layout::ordered);
     return sound;
 }
 

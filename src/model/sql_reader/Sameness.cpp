@@ -6,7 +6,7 @@
 #include <Zandor/model/Names.h>
 
 #include <algorithm>
-#include <map>
+#include <cstdint>
 
 namespace zandor::sql_reader {
 
@@ -24,7 +24,6 @@ String own(const sql::ColumnRef& x) {
 }
 String own(const sql::Value& x) { return number(static_cast<std::size_t>(x.type)) + measured(x.text); }
 String own(const sql::Parameter& x) { return measured(x.name) + (x.pattern ? u"p" : u""); }
-String own(const sql::Compare& x) { return number(static_cast<std::size_t>(x.comparison)); }
 String own(const sql::Operation& x) { return number(static_cast<std::size_t>(x.symbol)); }
 String own(const sql::Call& x) { return number(static_cast<std::size_t>(x.function)); }
 String own(const sql::Aggregate& x) { return number(static_cast<std::size_t>(x.total)); }
@@ -102,26 +101,42 @@ private:
     const IsWhole mIsWhole;
 };
 
+using Keys = std::set<String>;
+
+/// Keys with a sign that tells most of them apart at a glance: what is a part of another has no bit
+/// that the other has not.
+struct SignedKeys {
+    explicit SignedKeys(Keys all) : keys(std::move(all)) {
+        for (const String& key : keys) sign |= 1ULL << (std::hash<String>()(key) % 64);
+    }
+
+    bool isPartOf(const SignedKeys& other) const {
+        return (sign & ~other.sign) == 0 && keys.size() < other.keys.size() &&
+               std::includes(other.keys.begin(), other.keys.end(), keys.begin(), keys.end());
+    }
+
+    Keys keys;
+    std::uint64_t sign = 0;
+};
+
 /// The ways that no other one is a part of; two conditions have the same exactly when they are the
 /// same for all that And and Or know of what stands in them.
-using Keys = std::set<String>;
 std::optional<std::set<Keys>> keysOf(const std::vector<Node>& terms) {
     constexpr std::size_t most = 4096;
     const auto ways = Normal(most).product(terms);
     if (!ways) return {};
-    std::set<Keys> all;
+    std::vector<SignedKeys> all;
     for (const auto& way : *ways) {
         Keys keys;
         for (const Node& node : way) keys.insert(keyOf(node));
-        all.insert(std::move(keys));
+        all.emplace_back(std::move(keys));
     }
     std::set<Keys> least;
-    for (const Keys& keys : all) {
-        const bool more = std::any_of(all.begin(), all.end(), [&](const Keys& other) {
-            return &other != &keys && other != keys &&
-                   std::includes(keys.begin(), keys.end(), other.begin(), other.end());
+    for (const SignedKeys& each : all) {
+        const bool more = std::any_of(all.begin(), all.end(), [&](const SignedKeys& other) {
+            return other.isPartOf(each);
         });
-        if (!more) least.insert(keys);
+        if (!more) least.insert(each.keys);
     }
     return least;
 }
@@ -325,26 +340,28 @@ Keys keysOfEach(const std::vector<Node>& nodes) {
 
 std::vector<String> keysOfOrder(const Statement& statement) {
     std::vector<String> keys;
+    Keys sorted;
     for (const auto& item : statement.order) {
-        String key = keyOf(item.value) + (item.descending ? u'-' : u'+');
+        const String key = keyOf(item.value);
         // What has sorted already sorts no more.
-        const auto again = [&](const String& other) {
-            return other.substr(0, other.size() - 1) == key.substr(0, key.size() - 1);
-        };
-        if (std::none_of(keys.begin(), keys.end(), again)) keys.push_back(std::move(key));
+        if (sorted.insert(key).second) keys.push_back(key + (item.descending ? u'-' : u'+'));
     }
     return keys;
 }
 
 } // namespace
 
-String keyOf(const Node& given) {
-    Node node = given;
-    if (const auto* x = std::get_if<sql::Compare>(&node->node))
-        if (keyOf(x->right) < keyOf(x->left))
-            node = compare(sql::mirrored(x->comparison), x->right, x->left);
-    String key = u"(" + number(node->node.index()) +
-                 std::visit([](const auto& part) { return own(part); }, node->node);
+String keyOf(const Node& node) {
+    const String kind = u"(" + number(node->node.index());
+    if (const auto* x = std::get_if<sql::Compare>(&node->node)) {
+        const String left = keyOf(x->left);
+        const String right = keyOf(x->right);
+        const bool turned = right < left;
+        const auto comparison = turned ? sql::mirrored(x->comparison) : x->comparison;
+        return kind + number(static_cast<std::size_t>(comparison)) +
+               (turned ? right + left : left + right) + u')';
+    }
+    String key = kind + std::visit([](const auto& part) { return own(part); }, node->node);
     for (const Node& part : sql::partsOf(*node)) key += keyOf(part);
     return key + u')';
 }

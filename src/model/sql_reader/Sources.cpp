@@ -78,6 +78,8 @@ StatementReader::Named StatementReader::named(const Tree& select, String name) {
     Selected inner = this->select(select);
     --mDepth;
     const auto query = drawn(inner);
+    const model::SavedQuery saved{{}, query->record()};
+    if (depthOf(saved.record) >= deepest) refuse<MessageCode::tooDeep>(select.place());
     std::vector<model::ColumnDescription> columns = sql::outputColumns(*query);
     for (std::size_t n = 0; n < inner.statement.items.size(); ++n) {
         const auto& item = inner.statement.items[n];
@@ -93,7 +95,7 @@ StatementReader::Named StatementReader::named(const Tree& select, String name) {
         }
     }
     return {std::move(name), std::make_shared<const sql::Statement>(std::move(inner.statement)),
-            model::SavedQuery{{}, query->record()}, std::move(columns)};
+            saved, std::move(columns)};
 }
 
 StatementReader::Source StatementReader::subSelect(const Tree& tree, Scope& scope,

@@ -37,7 +37,9 @@ private:
     Node total(const Tree& tree) const;
     std::size_t blame(const Tree& tree, Pass& pass) const;
 
+    /// As it is typed into the grid, with all in parentheses that is no single word.
     String text(const Tree& tree, Pass& pass) const;
+    String newText(const Tree& tree, Pass& pass) const;
     String constant(const Tree& tree) const;
     String column(const Tree& tree, Pass& pass) const;
     String parameter(const Tree& tree) const;

@@ -1,3 +1,4 @@
+#include "model/files/limits.h"
 #include "model/sql_reader/Drawing.h"
 #include "model/sql_reader/Refused.h"
 #include "model/sql_reader/StatementReader.h"
@@ -50,6 +51,9 @@ StringView trimmed(StringView text) {
 
 Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect dialect,
                              const Schema& schema) {
+    if (text.comments.size() > files::limits::comments)
+        refuse<MessageCode::tooManyComments>(text.comments[files::limits::comments].byte,
+                                             files::limits::comments);
     const nlohmann::json parsed = parse(text.text);
     const Tree tree = Tree::ofParts(parsed);
     const auto statements = tree.list("stmts");
