@@ -22,9 +22,11 @@ namespace {
 
 /// How conditions stand in the grid: each in one cell where they speak of one column alone; a row
 /// for each way in which they hold, maybe beside joins of tables with themselves, or in hidden
-/// columns where nothing else keeps their order; all in the first row, in cells that name other
-/// columns too.
-enum class Layout { cells, rows, loops, ordered, mixed };
+/// columns where nothing else keeps their order; the first of such rows twice, so that what rows are put together
+/// by is asked behind that; all in the first row, in cells that name other columns too.
+enum class Layout { cells, rows, loops, ordered, doubled, mixed };
+
+bool keepsOrder(Layout layout) { return layout == Layout::ordered || layout == Layout::doubled; }
 
 /// What a condition speaks about: the first value in it that is no constant.
 Node subjectOf(const Node& condition) {
@@ -86,8 +88,8 @@ public:
     Ref<Query> draw() {
         const std::vector<Node> rest = drawSources(
             *mQuery, mSelected,
-            mLayout == Layout::loops || mLayout == Layout::ordered ? Loops::joins : Loops::criteria);
-        Columns columns(*mQuery, mSelected, mLayout == Layout::ordered);
+            mLayout == Layout::loops || keepsOrder(mLayout) ? Loops::joins : Loops::criteria);
+        Columns columns(*mQuery, mSelected, keepsOrder(mLayout));
         columns.addItems();
         columns.sort();
         addCriteria(columns, groupsFirst(simplifiedTerms(rest)),
@@ -142,6 +144,7 @@ private:
             });
             if (!all || all->size() > mostRows) refuseCondition();
             rows = std::move(*all);
+            if (mLayout == Layout::doubled) rows.push_back(rows.front());
         }
         if (mLayout == Layout::cells)
             for (const Node& term : ways)
@@ -229,7 +232,7 @@ private:
                 places.push_back(*next);
                 continue;
             }
-            if (mLayout != Layout::ordered) return {};
+            if (!keepsOrder(mLayout)) return {};
             const auto* behind = places.empty() ? nullptr : places.back();
             places.push_back(&columns.ownForCondition(cell.first, behind));
         }
@@ -276,6 +279,20 @@ bool hasSameWords(const sql::Statement& one, const sql::Statement& other) {
            same(one.having, other.having);
 }
 
+/// With the conditions behind GROUP BY left there; nothing where that cannot be drawn.
+Ref<Query> doubled(const Selected& selected) {
+    Selected asked = selected;
+    asked.statement.where = selected.asked.where;
+    asked.statement.having = selected.asked.having;
+    try {
+        const auto query = Drawing(asked, Layout::doubled).draw();
+        saidBy(*query, selected);
+        return query;
+    } catch (const Refused&) {
+        return {};
+    }
+}
+
 } // namespace
 
 Ref<Query> drawn(const Selected& selected, const std::function<bool(Query&)>& isWhole) {
@@ -294,10 +311,14 @@ Ref<Query> drawn(const Selected& selected, const std::function<bool(Query&)>& is
             return false;
         }
     };
-    const bool exact = isDone(Layout::cells) || isDone(Layout::rows) || isDone(Layout::loops);
+    const bool movesConditions = selected.asked.having != selected.statement.having;
+    if (isWhole && movesConditions)
+        if (const auto query = doubled(selected); query && isWhole(*query)) return query;
+    for (const Layout layout : {Layout::cells, Layout::rows, Layout::loops})
+        if (isDone(layout)) return sound;
     if (!sound) isDone(Layout::mixed);
     if (!sound) throw Refused(*first);
-    if (!exact && isWhole) isDone(Layout::ordered);
+    if (isWhole) isDone(Layout::ordered);
     return sound;
 }
 

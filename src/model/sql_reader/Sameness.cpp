@@ -141,6 +141,19 @@ std::optional<std::set<Keys>> keysOf(const std::vector<Node>& terms) {
     return least;
 }
 
+/// Whether all columns in a node stand in one of these; and no total.
+bool isMadeOf(const Node& node, const std::vector<Node>& groups) {
+    const bool group = std::any_of(groups.begin(), groups.end(),
+                                   [&](const Node& each) { return sql::same(each, node); });
+    if (group) return true;
+    if (std::holds_alternative<sql::ColumnRef>(node->node) ||
+        std::holds_alternative<sql::Aggregate>(node->node))
+        return false;
+    const auto parts = sql::partsOf(*node);
+    return std::all_of(parts.begin(), parts.end(),
+                       [&](const Node& part) { return isMadeOf(part, groups); });
+}
+
 /// What cannot be compared by what is known here.
 struct Incomparable {};
 
@@ -366,13 +379,27 @@ String keyOf(const Node& node) {
     return key + u')';
 }
 
+void askBefore(Statement& statement) {
+    const auto isOfGroups = [&](const Node& term) { return isMadeOf(term, statement.group); };
+    std::vector<Node> behind = termsOf(statement.having);
+    const auto moved = std::stable_partition(behind.begin(), behind.end(), std::not_fn(isOfGroups));
+    if (statement.group.empty() || moved == behind.end()) return;
+    std::vector<Node> before = termsOf(statement.where);
+    before.insert(before.end(), moved, behind.end());
+    behind.erase(moved, behind.end());
+    statement.where = sql::allOf(std::move(before));
+    statement.having = sql::allOf(std::move(behind));
+}
+
 std::optional<Ways> waysOf(const std::vector<Node>& terms, std::size_t most,
                            const std::function<bool(const Node&)>& isWhole) {
     return Normal(most, isWhole).product(terms);
 }
 
-std::optional<model::Message> difference(const Statement& read, const Statement& drawn) {
+std::optional<model::Message> difference(const Statement& read, const Statement& written) {
     using model::say;
+    Statement drawn = written;
+    askBefore(drawn);
     const bool items = std::equal(read.items.begin(), read.items.end(), drawn.items.begin(),
                                   drawn.items.end(), sameItem);
     if (!items || read.distinct != drawn.distinct) return say<MessageCode::theColumns>();

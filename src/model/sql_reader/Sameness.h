@@ -16,9 +16,13 @@ using model::sql::Node;
 using model::sql::Statement;
 using platform::String;
 
-/// What they differ in, in words; nothing where they say the same. The columns of what comes out
-/// may have other names where the first gives them none.
+/// What they differ in, in words; nothing where they say the same. The first asks of the rows what
+/// can be asked of them; the columns of what comes out may have other names where it gives them
+/// none.
 std::optional<model::Message> difference(const Statement& read, const Statement& drawn);
+
+/// Asks of the rows what is asked behind GROUP BY of nothing but what they are put together by.
+void askBefore(Statement& statement);
 
 /// A condition as the ways in which it holds: one of these rows, in which all stands. Nothing where
 /// there are too many. What `isWhole` says so of is not taken apart.

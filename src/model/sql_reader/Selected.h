@@ -14,7 +14,14 @@ using Places = std::map<Node, std::size_t>;
 
 /// A statement with what its names mean.
 struct Selected {
-    model::sql::Statement statement;
+    /// What is asked of rows, and behind GROUP BY.
+    struct Asked {
+        Node where;
+        Node having;
+    };
+
+    model::sql::Statement statement; ///< all that can be is asked of rows
+    Asked asked;                     ///< as it was written
     Scope scope;                                        ///< of its FROM
     std::map<String, model::TableDescription> tables;   ///< of the database, by what they are called
     std::map<String, model::SavedQuery> queries;        ///< those that it reads from, likewise

@@ -2,6 +2,7 @@
 
 #include "model/sql_reader/Drawing.h"
 #include "model/sql_reader/Refused.h"
+#include "model/sql_reader/Terms.h"
 
 #include <Zandor/model/Names.h>
 #include <Zandor/sql/Builder.h>
@@ -37,7 +38,52 @@ sql::JoinKind kindOf(const Tree& join) {
     return sql::JoinKind::inner;
 }
 
+sql::SourceNode beside(sql::SourceNode left, sql::SourceNode right) {
+    return made(sql::JoinSource{sql::JoinKind::inner, std::move(left), std::move(right), always(), {}});
+}
+
+/// Sources that nothing joins stand beside each other.
+void addSources(const sql::SourceNode& source, std::vector<sql::SourceNode>& all) {
+    const auto* join = std::get_if<sql::JoinSource>(&source->node);
+    if (!join || join->kind != sql::JoinKind::inner || !termsOf(join->on).empty()) {
+        all.push_back(source);
+        return;
+    }
+    addSources(join->left, all);
+    addSources(join->right, all);
+}
+
 } // namespace
+
+/// In SQLite a comma joins like any other word, from left to right; elsewhere after all joins.
+void StatementReader::from(const Tree& tree, Selected& into) {
+    std::vector<Source> all;
+    std::size_t outside = 0; // of the item before
+    for (const Tree& each : tree.list("fromClause")) {
+        const bool takesAll = mDialect == Dialect::SQLite && !all.empty() && each.is("JoinExpr") &&
+                              !hasParentheses(each, outside);
+        if (takesAll) {
+            Before before{all.front(), std::move(into.scope)};
+            for (std::size_t n = 1; n < all.size(); ++n) before.source = beside(before.source, all[n]);
+            into.scope = Scope(mDialect);
+            all = {join(each, into.scope, into, &before)};
+        } else {
+            all.push_back(source(each, into.scope, into));
+        }
+        outside = each.place();
+    }
+    for (const Source& each : all) addSources(each, into.statement.from);
+}
+
+/// Whether parentheses stand around a join that leave a place out.
+bool StatementReader::hasParentheses(const Tree& join, std::size_t outside) const {
+    const std::size_t left = join.node("larg").place();
+    const std::size_t right = join.node("rarg").place();
+    return std::any_of(mText.parentheses.begin(), mText.parentheses.end(), [&](const auto& each) {
+        const auto holds = [&](std::size_t byte) { return each.begin < byte && byte < each.end; };
+        return holds(left) && holds(right) && !holds(outside);
+    });
+}
 
 StatementReader::Source StatementReader::source(const Tree& tree, Scope& scope, Selected& into) {
     if (tree.is("RangeVar")) return table(tree, scope, into);
@@ -142,11 +188,23 @@ std::vector<Node> StatementReader::shared(const Tree& tree, const Scope& left, c
     return terms;
 }
 
-StatementReader::Source StatementReader::join(const Tree& tree, Scope& scope, Selected& into) {
+/// The left side of a join; what stands before it belongs to its first table.
+StatementReader::Source StatementReader::leftOf(const Tree& join, Scope& scope, Selected& into,
+                                                const Before* before) {
+    const Tree left = join.node("larg");
+    if (!before) return source(left, scope, into);
+    if (left.is("JoinExpr") && !hasParentheses(left, join.node("rarg").place()))
+        return this->join(left, scope, into, before);
+    scope.add(before->scope, left.place());
+    return beside(before->source, source(left, scope, into));
+}
+
+StatementReader::Source StatementReader::join(const Tree& tree, Scope& scope, Selected& into,
+                                              const Before* before) {
     tree.only({"jointype", "isNatural", "larg", "rarg", "usingClause", "quals", "rtindex"});
     Scope leftScope(mDialect);
     Scope rightScope(mDialect);
-    Source left = source(tree.node("larg"), leftScope, into);
+    Source left = leftOf(tree, leftScope, into, before);
     Source right = source(tree.node("rarg"), rightScope, into);
     Scope both = leftScope;
     both.add(rightScope, tree.place());

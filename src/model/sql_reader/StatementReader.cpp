@@ -1,6 +1,7 @@
 #include "model/sql_reader/StatementReader.h"
 
 #include "model/sql_reader/Refused.h"
+#include "model/sql_reader/Sameness.h"
 #include "model/sql_reader/Terms.h"
 
 #include <Zandor/model/Names.h>
@@ -32,30 +33,6 @@ bool isGrouped(const Node& node, const std::vector<Node>& groups) {
     return std::holds_alternative<sql::Aggregate>(node->node) ||
            std::any_of(groups.begin(), groups.end(),
                        [&](const Node& each) { return sql::same(each, node); });
-}
-
-/// Whether all columns in a node stand in one of these; and no total.
-bool isMadeOf(const Node& node, const std::vector<Node>& groups) {
-    const bool group = std::any_of(groups.begin(), groups.end(),
-                                   [&](const Node& each) { return sql::same(each, node); });
-    if (group) return true;
-    if (std::holds_alternative<ColumnRef>(node->node) ||
-        std::holds_alternative<sql::Aggregate>(node->node))
-        return false;
-    const auto parts = sql::partsOf(*node);
-    return std::all_of(parts.begin(), parts.end(),
-                       [&](const Node& part) { return isMadeOf(part, groups); });
-}
-
-/// Sources that nothing joins stand beside each other.
-void addSources(const sql::SourceNode& source, std::vector<sql::SourceNode>& all) {
-    const auto* join = std::get_if<sql::JoinSource>(&source->node);
-    if (!join || join->kind != sql::JoinKind::inner || !termsOf(join->on).empty()) {
-        all.push_back(source);
-        return;
-    }
-    addSources(join->left, all);
-    addSources(join->right, all);
 }
 
 } // namespace
@@ -90,8 +67,7 @@ Selected StatementReader::selectNamed(const Tree& tree) {
     selected.scope = Scope(mDialect);
     selected.place = tree.place();
     if (!tree.has("fromClause")) refusePart<MessageCode::noTable>(tree.place());
-    for (const Tree& each : tree.list("fromClause"))
-        addSources(source(each, selected.scope, selected), selected.statement.from);
+    from(tree, selected);
 
     ValueReader values(selected.scope, mText, mDialect, selected.places);
     items(tree, values, selected);
@@ -107,9 +83,10 @@ Selected StatementReader::selectNamed(const Tree& tree) {
         selected.commented.emplace(each.place(), model::CommentPlace::groups);
     }
     if (tree.has("havingClause"))
-        selected.statement.having = behindGroups(values.conditions(tree.node("havingClause")),
-                                                 selected.statement.group);
-    askBefore(selected);
+        selected.statement.having =
+            behindGroups(values.conditions(tree.node("havingClause")), selected.statement);
+    selected.asked = {selected.statement.where, selected.statement.having};
+    askBefore(selected.statement);
     order(tree, values, selected);
     limits(tree, selected);
     checkGroups(selected);
@@ -138,11 +115,18 @@ void StatementReader::noteConditions(const Node& condition, Selected& in) {
 }
 
 /// MySQL knows no expression again behind GROUP BY, so that the printer asks for the smallest of
-/// what is the same in a whole group.
-Node StatementReader::behindGroups(std::vector<Node> terms, const std::vector<Node>& groups) const {
+/// what is the same in a whole group. Where that comes out, it is meant.
+Node StatementReader::behindGroups(std::vector<Node> terms, const sql::Statement& statement) const {
+    const auto comesOut = [&](const Node& total) {
+        return std::any_of(statement.items.begin(), statement.items.end(), [&](const auto& item) {
+            const auto* value = std::get_if<Node>(&item.what);
+            return value && sql::same(*value, total);
+        });
+    };
     const std::function<Node(const Node&)> plain = [&](const Node& node) {
         const auto* total = std::get_if<sql::Aggregate>(&node->node);
-        if (total && total->total == model::Total::Smallest && isGrouped(total->operand, groups))
+        if (total && total->total == model::Total::Smallest &&
+            isGrouped(total->operand, statement.group) && !comesOut(node))
             return total->operand;
         auto parts = sql::partsOf(*node);
         if (parts.empty()) return node;
@@ -152,18 +136,6 @@ Node StatementReader::behindGroups(std::vector<Node> terms, const std::vector<No
     if (mDialect == Dialect::MySQL)
         for (Node& term : terms) term = plain(term);
     return sql::allOf(std::move(terms));
-}
-
-/// A condition on nothing but what rows are put together by can be asked of the rows before.
-void StatementReader::askBefore(Selected& selected) {
-    sql::Statement& statement = selected.statement;
-    if (statement.group.empty()) return;
-    std::vector<Node> before = termsOf(statement.where);
-    std::vector<Node> behind;
-    for (const Node& term : termsOf(statement.having))
-        (isMadeOf(term, statement.group) ? before : behind).push_back(term);
-    statement.where = sql::allOf(std::move(before));
-    statement.having = sql::allOf(std::move(behind));
 }
 
 /// The select within another that does nothing but leave equal rows out, as the printer has it for

@@ -32,10 +32,18 @@ private:
     static void noteConditions(const Node& condition, Selected& in);
 
     // Sources.cpp
+    /// What a comma has set before a join.
+    struct Before {
+        Source source;
+        Scope scope;
+    };
+    void from(const Tree& tree, Selected& into);
+    bool hasParentheses(const Tree& join, std::size_t outside) const;
     Source source(const Tree& tree, Scope& scope, Selected& into);
     Source table(const Tree& tree, Scope& scope, Selected& into);
     Source subSelect(const Tree& tree, Scope& scope, Selected& into);
-    Source join(const Tree& tree, Scope& scope, Selected& into);
+    Source join(const Tree& tree, Scope& scope, Selected& into, const Before* before = nullptr);
+    Source leftOf(const Tree& join, Scope& scope, Selected& into, const Before* before);
     Source queryAs(const Named& query, const String& alias, std::size_t place, Scope& scope,
                    Selected& into);
     std::vector<Node> shared(const Tree& tree, const Scope& left, const Scope& right, Scope& both);
@@ -43,7 +51,7 @@ private:
 
     void with(const Tree& tree);
     std::optional<Tree> differsAround(const Tree& tree) const;
-    Node behindGroups(std::vector<Node> terms, const std::vector<Node>& groups) const;
+    Node behindGroups(std::vector<Node> terms, const model::sql::Statement& statement) const;
     void items(const Tree& tree, const ValueReader& values, Selected& into);
     void item(const Tree& target, const ValueReader& values, Selected& into);
     void limits(const Tree& tree, Selected& into);
@@ -51,7 +59,6 @@ private:
     Node byNameOrPlace(const Tree& tree, const ValueReader& values, const Selected& in,
                        bool outputFirst) const;
     void order(const Tree& tree, const ValueReader& values, Selected& into) const;
-    static void askBefore(Selected& selected);
     static void checkGroups(const Selected& selected);
 
     const Schema& mSchema;

@@ -5,6 +5,7 @@
 #include "model/criteria/Writer.h"
 #include "model/sql_reader/Conditions.h"
 #include "model/sql_reader/Forms.h"
+#include "model/sql_reader/Precedence.h"
 #include "model/sql_reader/Refused.h"
 #include "model/sql_reader/TreeChecks.h"
 #include "model/sql_reader/ValuePass.h"
@@ -195,6 +196,7 @@ String ValueReader::text(const Tree& tree, Pass& pass) const {
 }
 
 String ValueReader::newText(const Tree& tree, Pass& pass) const {
+    if (mDialect == Dialect::SQLite) checkPrecedence(tree, mText);
     if (tree.is("A_Const")) {
         if (tree.has("sval")) pass.texts.push_back(tree.part("sval").text("sval"));
         return constant(tree);
@@ -340,7 +342,9 @@ String ValueReader::call(const Tree& tree, Pass& pass) const {
     if (totalOf(tree)) return pass.nameFor(total(tree));
     const String name = tree.names("funcname").back();
     const auto arguments = tree.list("args");
-    if (mDialect == Dialect::MySQL && sameName(name, u"concat") && arguments.size() > 1) {
+    const auto isTruth = [&](const Tree& each) { return typeOf(each, pass) == ColumnType::Boolean; };
+    if (mDialect == Dialect::MySQL && sameName(name, u"concat") && arguments.size() > 1 &&
+        std::none_of(arguments.begin(), arguments.end(), isTruth)) {
         tree.only({"funcname", "args", "funcformat"});
         String out = u"(";
         for (const Tree& each : arguments) {
@@ -352,6 +356,18 @@ String ValueReader::call(const Tree& tree, Pass& pass) const {
     refuse<MessageCode::unknownFunction>(tree.place(), name);
 }
 
+/// Whether true or false stands where a function takes something else: its words are texts in a
+/// drawing, and numbers in most engines.
+bool ValueReader::takesTruth(const Form& form, const std::map<int, Tree>& arguments,
+                             Pass& pass) const {
+    using model::sql::Function;
+    const bool worded = mDialect == Dialect::PostgreSQL && form.function == Function::text;
+    if (!form.function || worded) return false;
+    return std::any_of(arguments.begin(), arguments.end(), [&](const auto& argument) {
+        return typeOf(argument.second, pass) == ColumnType::Boolean;
+    });
+}
+
 /// What has one of the forms that stand for a function; the first that comes to it.
 std::optional<String> ValueReader::byForm(const Tree& tree, Pass& pass) const {
     if (!tree.is("FuncCall") && !tree.is("TypeCast") && !tree.is("A_Expr") &&
@@ -359,7 +375,7 @@ std::optional<String> ValueReader::byForm(const Tree& tree, Pass& pass) const {
         return {};
     for (const Form& form : formsOf(mDialect)) {
         const auto arguments = form.match(tree);
-        if (!arguments) continue;
+        if (!arguments || takesTruth(form, *arguments, pass)) continue;
         const bool addsDays = form.function == model::sql::Function::addDays ||
                               form.function == model::sql::Function::addDaysLater;
         String out;

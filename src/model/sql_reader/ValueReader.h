@@ -1,5 +1,6 @@
 #pragma once
 
+#include "model/sql_reader/Forms.h"
 #include "model/sql_reader/Lexer.h"
 #include "model/sql_reader/Selected.h"
 #include "model/sql_reader/Tree.h"
@@ -55,6 +56,7 @@ private:
     String choice(const Tree& tree, Pass& pass) const;
     String call(const Tree& tree, Pass& pass) const;
     std::optional<String> byForm(const Tree& tree, Pass& pass) const;
+    bool takesTruth(const Form& form, const std::map<int, Tree>& arguments, Pass& pass) const;
     String list(const Tree& tree, const char* name, Pass& pass) const;
     model::ColumnType typeOf(const Tree& tree, Pass& pass) const;
 

@@ -194,3 +194,41 @@ TEST_F(Statement, KnowsANameOfWithOnlyWhereItStands) {
                       Dialect::MySQL),
               "Line 1, column 116: the database has no table \"w\".");
 }
+
+TEST_F(Statement, AsksBehindGroupByWhatIsAskedThere) {
+    const std::u16string asked = u"SELECT\n    orders.customer_id,\n    COUNT(orders.id) AS n\n"
+                                 u"FROM orders\n";
+    // In one row, what rows are put together by is asked of the rows before.
+    const std::u16string behind = asked + u"GROUP BY orders.customer_id\n"
+                                          u"HAVING orders.customer_id > 3\n"
+                                          u"    AND COUNT(orders.id) > 2";
+    read(behind);
+    EXPECT_EQ(text(), zandor::platform::toUtf8(behind));
+    EXPECT_EQ(criteria(1), (Texts{"4: > 3", "5: > 3"}));
+    EXPECT_EQ(criteria(2), (Texts{"4: > 2", "5: > 2"}));
+    const std::u16string before = asked + u"WHERE orders.customer_id > 3\n"
+                                          u"GROUP BY orders.customer_id\n"
+                                          u"HAVING COUNT(orders.id) > 2";
+    read(before);
+    EXPECT_EQ(text(), zandor::platform::toUtf8(before));
+    EXPECT_EQ(criteria(1), Texts{"4: > 3"});
+}
+
+TEST_F(Statement, JoinsWhatStandsBeforeACommaAsItsDialectDoes) {
+    const std::u16string behind = u"SELECT o.id FROM customers c, \"Order Lines\" l JOIN orders o ";
+    const std::u16string own = behind + u"ON o.id = l.order_id AND o.customer_id = c.id";
+    read(own);
+    EXPECT_EQ(record.joins.size(), 2U);
+    EXPECT_NE(refusal(own, Dialect::PostgreSQL), "drawn");
+    // The rows of another kind of join are others.
+    const std::u16string right = u"SELECT o.id FROM customers c, \"Order Lines\" l RIGHT JOIN orders "
+                                 u"o ON o.id = l.order_id";
+    EXPECT_NE(refusal(right), "drawn");
+    EXPECT_EQ(refusal(right, Dialect::PostgreSQL), "drawn");
+    EXPECT_EQ(refusal(u"SELECT o.id FROM customers c, (\"Order Lines\" l RIGHT JOIN orders o ON "
+                      u"o.id = l.order_id)"),
+              "drawn");
+    EXPECT_EQ(refusal(u"SELECT o.id FROM customers c, (\"Order Lines\" l RIGHT JOIN orders o ON "
+                      u"o.id = l.order_id) LEFT JOIN customers d ON d.id = o.customer_id"),
+              "drawn");
+}

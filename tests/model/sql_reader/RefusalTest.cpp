@@ -73,6 +73,49 @@ TEST_F(Refusals, AskWhatIsNeitherTrueNorFalseForNoTruth) {
               "drawn");
 }
 
+TEST_F(Refusals, HaveNoTextForWhatIsTrueOrFalseWhereItIsANumber) {
+    for (const char16_t* text :
+         {u"length(active)", u"length(city = 'Wien' AND 1 > 1)", u"CAST(active AS TEXT)",
+          u"upper(NOT active)", u"replace(name, active, 'x')"})
+        EXPECT_NE(refusal(u"SELECT id FROM customers WHERE " + std::u16string(text) + u" <> 'x'"),
+                  "drawn")
+            << zandor::platform::toUtf8(text);
+    EXPECT_EQ(refusal(u"SELECT CAST(active AS TEXT) AS x FROM customers"),
+              "Line 1, column 8: a drawing does not know this cast; the statement can be run as it "
+              "is.");
+    EXPECT_EQ(refusal(u"SELECT length(active) AS x FROM customers"),
+              "Line 1, column 8: a drawing does not know the function length as it stands here; the "
+              "statement can be run as it is.");
+    EXPECT_NE(refusal(u"SELECT concat(name, active) AS x FROM customers", Dialect::MySQL), "drawn");
+    EXPECT_EQ(refusal(u"SELECT CAST(active AS text) AS x FROM customers", Dialect::PostgreSQL),
+              "drawn");
+}
+
+TEST_F(Refusals, AskForParenthesesWhereSqliteTakesOperatorsTogetherInAnotherOrder) {
+    const std::string line = "the database takes these operators together in another order than they "
+                             "are read; write parentheses.";
+    const auto said = [&](const char16_t* value, Dialect dialect = Dialect::SQLite) {
+        const std::string all =
+            refusal(u"SELECT id FROM customers WHERE " + std::u16string(value), dialect);
+        return all.ends_with(line) ? "parentheses" : all;
+    };
+    for (const char16_t* value :
+         {u"id * 2 || name = 'x'", u"name || id + 1 = 'x'", u"active = id IN (1)",
+          u"active = id BETWEEN 1 AND 3", u"active = name LIKE 'A%'", u"city IS NULL < NOT active",
+          u"active IN (1) < active"})
+        EXPECT_EQ(said(value), "parentheses") << zandor::platform::toUtf8(value);
+    for (const char16_t* value :
+         {u"(id * 2) || name = 'x'", u"name || (id + 1) = 'x'", u"active = (id IN (1))",
+          u"active = (id BETWEEN 1 AND 3)", u"(city IS NULL) < (NOT active)",
+          u"name || ' ' || city LIKE 'A%'", u"id IN (1) = active", u"name IS NULL = active",
+          u"-id * 2 + 1 - 3 > 4 - -id", u"NOT id + 1 > 3 OR id BETWEEN 1 + 1 AND 2 * 3",
+          u"active = NOT active", u"abs(id + 1) || abs(id * 2) = '22'",
+          u"CASE WHEN id = 1 THEN id + 1 ELSE 2 END || name = '2'"})
+        EXPECT_EQ(said(value), "drawn") << zandor::platform::toUtf8(value);
+    // Others read as the parser does.
+    EXPECT_EQ(said(u"name || id + 1 = 'x'", Dialect::PostgreSQL), "drawn");
+}
+
 TEST_F(Refusals, TakeNoWordForTruthAsANameInSqlite) {
     const auto named = u"SELECT name AS \"True\" FROM customers WHERE active = TRUE";
     EXPECT_EQ(refusal(named), "Line 1, column 8: a drawing has no place for this (AS true); it can "
