@@ -1312,6 +1312,14 @@
         <source>a comment that is run</source>
         <translation>einen Kommentar, der ausgeführt wird</translation>
     </message>
+    <message>
+        <source>no more than %1 comments can be kept; leave some out.</source>
+        <translation>mehr als %1 Kommentare lassen sich nicht aufbewahren; lassen Sie einige weg.</translation>
+    </message>
+    <message>
+        <source>the database takes these operators together in another order than they are read; write parentheses.</source>
+        <translation>die Datenbank fasst diese Operatoren in einer anderen Reihenfolge zusammen, als sie gelesen werden; setzen Sie Klammern.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

@@ -1312,6 +1312,14 @@
         <source>a comment that is run</source>
         <translation>un comentario que se ejecuta</translation>
     </message>
+    <message>
+        <source>no more than %1 comments can be kept; leave some out.</source>
+        <translation>no se pueden conservar más de %1 comentarios; quite algunos.</translation>
+    </message>
+    <message>
+        <source>the database takes these operators together in another order than they are read; write parentheses.</source>
+        <translation>la base de datos agrupa estos operadores en otro orden que el de la lectura; ponga paréntesis.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

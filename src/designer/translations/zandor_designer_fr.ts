@@ -1312,6 +1312,14 @@
         <source>a comment that is run</source>
         <translation>un commentaire qui est exécuté</translation>
     </message>
+    <message>
+        <source>no more than %1 comments can be kept; leave some out.</source>
+        <translation>pas plus de %1 commentaires ne peuvent être conservés ; enlevez-en.</translation>
+    </message>
+    <message>
+        <source>the database takes these operators together in another order than they are read; write parentheses.</source>
+        <translation>la base de données regroupe ces opérateurs dans un autre ordre que celui de la lecture ; mettez des parenthèses.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

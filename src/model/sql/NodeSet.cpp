@@ -13,7 +13,8 @@ std::size_t own(const auto& /*x*/) { return 0; }
 
 std::size_t NodeHash::operator()(const Node& node) const {
     constexpr std::size_t mixing = 0x9e3779b1;
-    std::size_t hash = node->node.index() + std::visit([](const auto& x) { return own(x); }, node->node);
+    std::size_t hash =
+        node->node.index() + std::visit([](const auto& x) { return own(x); }, node->node);
     for (const Node& part : partsOf(*node)) hash = hash * mixing + (*this)(part);
     return hash;
 }

@@ -54,10 +54,10 @@ void Columns::addGroups() {
         [this](const Node& group) -> Column& { return add(group, false); });
 }
 
-std::vector<Columns::Column*> Columns::addInOrder(
-    const std::vector<Node>& subjects,
-    const std::function<std::vector<Column*>(const Node&)>& known,
-    const std::function<Column&(const Node&)>& make) {
+std::vector<Columns::Column*>
+Columns::addInOrder(const std::vector<Node>& subjects,
+                    const std::function<std::vector<Column*>(const Node&)>& known,
+                    const std::function<Column&(const Node&)>& make) {
     std::vector<Column*> columns;
     for (const Node& subject : subjects) {
         const auto all = known(subject);
@@ -143,7 +143,8 @@ std::vector<Columns::Column*> Columns::knownFor(const Node& subject, bool apart)
     return known;
 }
 
-std::vector<Columns::Column*> Columns::forConditions(const std::vector<Node>& subjects, bool apart) {
+std::vector<Columns::Column*> Columns::forConditions(const std::vector<Node>& subjects,
+                                                     bool apart) {
     return addInOrder(
         subjects, [&](const Node& subject) { return knownFor(subject, apart); },
         [this](const Node& subject) -> Column& { return addForCondition(subject); });

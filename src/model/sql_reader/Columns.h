@@ -33,8 +33,8 @@ public:
         model::criteria::Subject subject;
         Ref<model::ColumnDefinition> definition;
     };
-    /// The columns that conditions on rows as they are stand under, made where there are none; those
-    /// that only choose (`apart`) where rows are put together and they mean those before.
+    /// The columns that conditions on rows as they are stand under, made where there are none;
+    /// those that only choose (`apart`) where rows are put together and they mean those before.
     std::vector<Column*> forConditions(const std::vector<Node>& subjects, bool apart);
     /// One of its own, behind another one or before all.
     Column& ownForCondition(const Node& subject, const Column* behind);

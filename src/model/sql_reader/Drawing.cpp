@@ -6,8 +6,8 @@
 #include "model/sql/Simplify.h"
 #include "model/sql_reader/Columns.h"
 #include "model/sql_reader/Refused.h"
-#include "model/sql_reader/Terms.h"
 #include "model/sql_reader/Sameness.h"
+#include "model/sql_reader/Terms.h"
 
 #include <Zandor/sql/Builder.h>
 
@@ -22,8 +22,9 @@ namespace {
 
 /// How conditions stand in the grid: each in one cell where they speak of one column alone; a row
 /// for each way in which they hold, maybe beside joins of tables with themselves, or in hidden
-/// columns where nothing else keeps their order; the first of such rows twice, so that what rows are put together
-/// by is asked behind that; all in the first row, in cells that name other columns too.
+/// columns where nothing else keeps their order; the first of such rows twice, so that what rows
+/// are put together by is asked behind that; all in the first row, in cells that name other columns
+/// too.
 enum class Layout { cells, rows, loops, ordered, doubled, mixed };
 
 bool keepsOrder(Layout layout) { return layout == Layout::ordered || layout == Layout::doubled; }
@@ -62,7 +63,8 @@ Cells runsOf(const std::vector<Node>& terms) {
     Cells cells;
     for (const Node& term : terms) {
         const Node subject = subjectOf(term);
-        if (cells.empty() || !sql::same(cells.back().first, subject)) cells.push_back({subject, {}});
+        if (cells.empty() || !sql::same(cells.back().first, subject))
+            cells.push_back({subject, {}});
         cells.back().second.push_back(term);
     }
     return cells;
@@ -119,9 +121,8 @@ private:
     std::vector<Node> groupsFirst(std::vector<Node> terms) const {
         const auto& all = mSelected.statement.group;
         const sql::NodeSet groups(all.begin(), all.end());
-        std::stable_partition(terms.begin(), terms.end(), [&](const Node& term) {
-            return groups.contains(subjectOf(term));
-        });
+        std::stable_partition(terms.begin(), terms.end(),
+                              [&](const Node& term) { return groups.contains(subjectOf(term)); });
         return terms;
     }
 
@@ -129,8 +130,8 @@ private:
     [[noreturn]] void refuseCondition() const {
         const Node& where = mSelected.statement.where;
         const auto terms = termsOf(where ? where : mSelected.statement.having);
-        refuse<MessageCode::criterionNotDrawn>(
-            terms.empty() ? mSelected.place : mSelected.placeOf(terms.front()));
+        refuse<MessageCode::criterionNotDrawn>(terms.empty() ? mSelected.place
+                                                             : mSelected.placeOf(terms.front()));
     }
 
     void addCriteria(Columns& columns, const std::vector<Node>& before,
@@ -225,8 +226,7 @@ private:
         for (const auto& cell : cells) {
             const auto known = columns.knownFor(cell.first, apart);
             const auto next = std::find_if(known.begin(), known.end(), [&](const auto* column) {
-                return places.empty() ||
-                       columns.placeOf(*places.back()) < columns.placeOf(*column);
+                return places.empty() || columns.placeOf(*places.back()) < columns.placeOf(*column);
             });
             if (next != known.end()) {
                 places.push_back(*next);
@@ -256,8 +256,7 @@ private:
 sql::Statement saidBy(Query& query, const Selected& selected) {
     sql::Built built = sql::build(query);
     for (const model::Finding& finding : built.findings)
-        if (finding.isError())
-            refuse<MessageCode::notUnderstood>(selected.place, finding.message);
+        if (finding.isError()) refuse<MessageCode::notUnderstood>(selected.place, finding.message);
     if (const auto other = difference(selected.statement, *built.statement))
         refuse<MessageCode::otherMeaning>(selected.place, *other);
     return std::move(*built.statement);
@@ -271,10 +270,9 @@ bool hasSameWords(const sql::Statement& one, const sql::Statement& other) {
         const Node second = sql::simplified(right);
         return first && second ? sql::same(first, second) : !first && !second;
     };
-    const bool names = std::equal(one.items.begin(), one.items.end(), other.items.begin(),
-                                  other.items.end(), [](const auto& item, const auto& its) {
-                                      return item.name == its.name;
-                                  });
+    const bool names =
+        std::equal(one.items.begin(), one.items.end(), other.items.begin(), other.items.end(),
+                   [](const auto& item, const auto& its) { return item.name == its.name; });
     return names && one.order.size() == other.order.size() && same(one.where, other.where) &&
            same(one.having, other.having);
 }

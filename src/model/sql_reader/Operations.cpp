@@ -35,8 +35,8 @@ String ValueReader::operation(const Tree& tree, Pass& pass) const {
             for (const char* side : {"lexpr", "rexpr"})
                 if (typeOf(tree.node(side), pass) == ColumnType::Boolean)
                     refuse<MessageCode::unknownOperator>(tree.place(), symbol);
-            return u'(' + text(tree.node("lexpr"), pass) + u" & " +
-                   text(tree.node("rexpr"), pass) + u')';
+            return u'(' + text(tree.node("lexpr"), pass) + u" & " + text(tree.node("rexpr"), pass) +
+                   u')';
         }
     }
     if (kind == "AEXPR_LIKE" || kind == "AEXPR_ILIKE") return like(tree, pass);
@@ -53,8 +53,7 @@ String ValueReader::operation(const Tree& tree, Pass& pass) const {
     if (kind == "AEXPR_BETWEEN" || kind == "AEXPR_NOT_BETWEEN") {
         const Tree of = tree.node("lexpr");
         const auto bounds = tree.node("rexpr").list("items");
-        return u'(' + text(of, pass) +
-               (kind == "AEXPR_BETWEEN" ? u" Between " : u" Not Between ") +
+        return u'(' + text(of, pass) + (kind == "AEXPR_BETWEEN" ? u" Between " : u" Not Between ") +
                side(bounds[0], of, pass) + u" And " + side(bounds[1], of, pass) + u')';
     }
     if (kind == "AEXPR_OP_ANY" || kind == "AEXPR_OP_ALL")
@@ -68,8 +67,8 @@ String ValueReader::operation(const Tree& tree, Pass& pass) const {
 String ValueReader::comparison(const Tree& tree, StringView symbol, Pass& pass) const {
     const Tree left = tree.node("lexpr");
     const Tree right = tree.node("rexpr");
-    return u'(' + side(left, right, pass) + u' ' + String(symbol) + u' ' +
-           side(right, left, pass) + u')';
+    return u'(' + side(left, right, pass) + u' ' + String(symbol) + u' ' + side(right, left, pass) +
+           u')';
 }
 
 /// What is compared with another.
@@ -105,7 +104,8 @@ String ValueReader::arithmetic(const Tree& tree, StringView symbol, Pass& pass) 
         (one == ColumnType::Text || two == ColumnType::Text))
         word = u"&";
     const auto isMoment = [](ColumnType type) {
-        return type == ColumnType::Date || type == ColumnType::Timestamp || type == ColumnType::Time;
+        return type == ColumnType::Date || type == ColumnType::Timestamp ||
+               type == ColumnType::Time;
     };
     // Days are added to dates by an operator nowhere else.
     const bool dates = isMoment(one) || isMoment(two);
@@ -133,8 +133,7 @@ String ValueReader::division(const Tree& tree, Pass& pass) const {
         refuse<MessageCode::otherDivision>(tree.place(), u"CAST(x AS REAL) / y");
     }
     const bool guarded = right.is("A_Expr") && right.word("kind") == "AEXPR_NULLIF" &&
-                         isConstant(right.node("rexpr"), "ival") &&
-                         !isNotZero(right.node("rexpr"));
+                         isConstant(right.node("rexpr"), "ival") && !isNotZero(right.node("rexpr"));
     if (cast && !isCastTo(left, {u"float4"}) && (guarded || isNotZero(right)))
         return divided(left.node("arg"), guarded ? right.node("lexpr") : right);
     refuse<MessageCode::otherDivision>(tree.place(), mDialect == Dialect::SqlServer
@@ -156,14 +155,13 @@ String ValueReader::like(const Tree& tree, Pass& pass) const {
         escape = sign.front();
         pattern = arguments[0];
     }
-    const bool tellsCase =
-        mDialect == Dialect::PostgreSQL && tree.word("kind") == "AEXPR_LIKE";
+    const bool tellsCase = mDialect == Dialect::PostgreSQL && tree.word("kind") == "AEXPR_LIKE";
     String right;
     if (isConstant(pattern, "sval")) {
         const String content = pattern.part("sval").text("sval");
         if (tellsCase && hasCase(content)) refuse<MessageCode::caseOfLike>(tree.place());
-        right = quoted(model::criteria::typedPattern(
-            likePattern(content, escape, mDialect, pattern.place())));
+        right = quoted(
+            model::criteria::typedPattern(likePattern(content, escape, mDialect, pattern.place())));
     } else if (pattern.is("ParamRef") && !tellsCase) {
         right = parameter(pattern);
     } else {

@@ -22,7 +22,9 @@ String measured(const String& text) { return number(text.size()) + u':' + text; 
 String own(const sql::ColumnRef& x) {
     return measured(model::foldedName(x.table)) + measured(x.column);
 }
-String own(const sql::Value& x) { return number(static_cast<std::size_t>(x.type)) + measured(x.text); }
+String own(const sql::Value& x) {
+    return number(static_cast<std::size_t>(x.type)) + measured(x.text);
+}
 String own(const sql::Parameter& x) { return measured(x.name) + (x.pattern ? u"p" : u""); }
 String own(const sql::Operation& x) { return number(static_cast<std::size_t>(x.symbol)); }
 String own(const sql::Call& x) { return number(static_cast<std::size_t>(x.function)); }
@@ -133,9 +135,8 @@ std::optional<std::set<Keys>> keysOf(const std::vector<Node>& terms) {
     }
     std::set<Keys> least;
     for (const SignedKeys& each : all) {
-        const bool more = std::any_of(all.begin(), all.end(), [&](const SignedKeys& other) {
-            return other.isPartOf(each);
-        });
+        const bool more = std::any_of(
+            all.begin(), all.end(), [&](const SignedKeys& other) { return other.isPartOf(each); });
         if (!more) least.insert(each.keys);
     }
     return least;
@@ -211,12 +212,12 @@ void addStep(Joined& into, Joined right, const std::vector<Node>& on, bool full)
     if (!full && !hasFull(step.right)) {
         std::vector<Joined::Step> kept;
         for (auto& inner : step.right.steps) {
-            const bool onRight = std::any_of(
-                inner.needs.begin(), inner.needs.end(),
-                [&](const String& name) { return step.right.names.contains(name); });
-            const bool unused = std::none_of(
-                inner.right.names.begin(), inner.right.names.end(),
-                [&](const String& name) { return step.needs.contains(name); });
+            const bool onRight =
+                std::any_of(inner.needs.begin(), inner.needs.end(),
+                            [&](const String& name) { return step.right.names.contains(name); });
+            const bool unused =
+                std::none_of(inner.right.names.begin(), inner.right.names.end(),
+                             [&](const String& name) { return step.needs.contains(name); });
             (onRight && unused ? behind : kept).push_back(std::move(inner));
         }
         step.right.steps = std::move(kept);
@@ -314,9 +315,8 @@ struct Rows {
 
 Rows rowsOf(const Statement& statement) {
     std::vector<Node> where = termsOf(sql::simplified(statement.where));
-    const bool full =
-        std::any_of(statement.from.begin(), statement.from.end(),
-                    [](const auto& source) { return hasFull(joined(*source)); });
+    const bool full = std::any_of(statement.from.begin(), statement.from.end(),
+                                  [](const auto& source) { return hasFull(joined(*source)); });
     if (full) {
         Keys trees;
         for (const auto& source : statement.from) trees.insert(joinedKey(joined(*source), true));

@@ -20,12 +20,12 @@ struct Selected {
         Node having;
     };
 
-    model::sql::Statement statement; ///< all that can be is asked of rows
-    Asked asked;                     ///< as it was written
-    Scope scope;                                        ///< of its FROM
-    std::map<String, model::TableDescription> tables;   ///< of the database, by what they are called
-    std::map<String, model::SavedQuery> queries;        ///< those that it reads from, likewise
-    std::size_t place = 0;                              ///< of its first token
+    model::sql::Statement statement;                  ///< all that can be is asked of rows
+    Asked asked;                                      ///< as it was written
+    Scope scope;                                      ///< of its FROM
+    std::map<String, model::TableDescription> tables; ///< of the database, by what they are called
+    std::map<String, model::SavedQuery> queries;      ///< those that it reads from, likewise
+    std::size_t place = 0;                            ///< of its first token
     Places places;
     Commented commented; ///< what comments can stand by
 

@@ -39,7 +39,8 @@ sql::JoinKind kindOf(const Tree& join) {
 }
 
 sql::SourceNode beside(sql::SourceNode left, sql::SourceNode right) {
-    return made(sql::JoinSource{sql::JoinKind::inner, std::move(left), std::move(right), always(), {}});
+    return made(
+        sql::JoinSource{sql::JoinKind::inner, std::move(left), std::move(right), always(), {}});
 }
 
 /// Sources that nothing joins stand beside each other.
@@ -64,7 +65,8 @@ void StatementReader::from(const Tree& tree, Selected& into) {
                               !hasParentheses(each, outside);
         if (takesAll) {
             Before before{all.front(), std::move(into.scope)};
-            for (std::size_t n = 1; n < all.size(); ++n) before.source = beside(before.source, all[n]);
+            for (std::size_t n = 1; n < all.size(); ++n)
+                before.source = beside(before.source, all[n]);
             into.scope = Scope(mDialect);
             all = {join(each, into.scope, into, &before)};
         } else {
@@ -90,7 +92,8 @@ StatementReader::Source StatementReader::source(const Tree& tree, Scope& scope, 
     if (tree.is("RangeSubselect")) return subSelect(tree, scope, into);
     if (tree.is("JoinExpr")) return join(tree, scope, into);
     if (tree.is("RangeFunction")) refusePart<MessageCode::aTableFunction>(tree.place());
-    refuse<MessageCode::noPlaceFor>(tree.place(), model::say<MessageCode::thisPart>(tree.sqlName()));
+    refuse<MessageCode::noPlaceFor>(tree.place(),
+                                    model::say<MessageCode::thisPart>(tree.sqlName()));
 }
 
 StatementReader::Source StatementReader::table(const Tree& tree, Scope& scope, Selected& into) {
@@ -144,8 +147,7 @@ StatementReader::Named StatementReader::named(const Tree& select, String name) {
             saved, std::move(columns)};
 }
 
-StatementReader::Source StatementReader::subSelect(const Tree& tree, Scope& scope,
-                                                   Selected& into) {
+StatementReader::Source StatementReader::subSelect(const Tree& tree, Scope& scope, Selected& into) {
     if (tree.flag("lateral")) refusePart<MessageCode::aLateral>(tree.place());
     tree.only({"subquery", "alias"});
     String alias = aliasOf(tree);
@@ -213,8 +215,8 @@ StatementReader::Source StatementReader::join(const Tree& tree, Scope& scope, Se
         terms = ValueReader(both, mText, mDialect, into.places).conditions(tree.node("quals"));
     scope.add(both, tree.place());
     Node on = sql::allOf(std::move(terms));
-    return made(sql::JoinSource{kindOf(tree), std::move(left), std::move(right),
-                                on ? std::move(on) : always(), {}});
+    return made(sql::JoinSource{
+        kindOf(tree), std::move(left), std::move(right), on ? std::move(on) : always(), {}});
 }
 
 } // namespace zandor::sql_reader

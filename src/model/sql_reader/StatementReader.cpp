@@ -184,7 +184,8 @@ void StatementReader::item(const Tree& target, const ValueReader& values, Select
     // SQLite then takes the word for the column wherever it stands.
     const bool taken = mDialect == Dialect::SQLite && mText.saysTruth;
     if (taken && (name == u"true" || name == u"false"))
-        refuse<MessageCode::noPlaceFor>(target.place(), model::say<MessageCode::thisPart>(u"AS " + name));
+        refuse<MessageCode::noPlaceFor>(target.place(),
+                                        model::say<MessageCode::thisPart>(u"AS " + name));
     if (value.is("FuncCall") && value.names("funcname").back() == topFunction) {
         limit(value.list("args").front(), into);
         return;
@@ -212,8 +213,8 @@ void StatementReader::limits(const Tree& tree, Selected& into) {
         refusePart<MessageCode::ties>(tree.node("limitCount").place());
     if (tree.has("limitOffset")) {
         const Tree offset = tree.node("limitOffset");
-        const bool none = offset.is("A_Const") && offset.has("ival") &&
-                          offset.part("ival").number("ival") == 0;
+        const bool none =
+            offset.is("A_Const") && offset.has("ival") && offset.part("ival").number("ival") == 0;
         if (!none) refusePart<MessageCode::anOffset>(offset.place());
     }
     if (!tree.has("limitCount")) return;
@@ -242,9 +243,10 @@ Node StatementReader::byNameOrPlace(const Tree& tree, const ValueReader& values,
         const std::int64_t place = tree.part("ival").number("ival");
         const auto beyond = static_cast<std::int64_t>(items.size()) + 1;
         if (place < 1 || place >= beyond) refuse<MessageCode::noSuchPosition>(tree.place(), place);
-        const bool counts = std::none_of(items.begin(), items.begin() + place, [](const auto& item) {
-            return std::holds_alternative<sql::AllColumns>(item.what);
-        });
+        const bool counts =
+            std::none_of(items.begin(), items.begin() + place, [](const auto& item) {
+                return std::holds_alternative<sql::AllColumns>(item.what);
+            });
         if (!counts) refuse<MessageCode::noSuchPosition>(tree.place(), place);
         return std::get<Node>(items[static_cast<std::size_t>(place - 1)].what);
     }
@@ -255,7 +257,8 @@ Node StatementReader::byNameOrPlace(const Tree& tree, const ValueReader& values,
     for (const auto& item : items) {
         const auto* value = std::get_if<Node>(&item.what);
         if (!value || !model::sameName(item.name, name)) continue;
-        if (found && !sql::same(*found, *value)) refuse<MessageCode::sameOutput>(tree.place(), name);
+        if (found && !sql::same(*found, *value))
+            refuse<MessageCode::sameOutput>(tree.place(), name);
         found = value;
     }
     return found ? *found : values.value(tree);
@@ -269,8 +272,8 @@ void StatementReader::order(const Tree& tree, const ValueReader& values, Selecte
         if (each.word("sortby_nulls") != "SORTBY_NULLS_DEFAULT")
             refusePart<MessageCode::nullsPlaced>(each.place());
         each.only({"node", "sortby_dir", "sortby_nulls"});
-        into.statement.order.push_back({byNameOrPlace(node, values, into, true),
-                                        each.word("sortby_dir") == "SORTBY_DESC"});
+        into.statement.order.push_back(
+            {byNameOrPlace(node, values, into, true), each.word("sortby_dir") == "SORTBY_DESC"});
         into.commented.emplace(each.place(), model::CommentPlace::order);
     }
 }
@@ -278,9 +281,7 @@ void StatementReader::order(const Tree& tree, const ValueReader& values, Selecte
 /// Where rows are put together, what comes out is a total or what they are put together by.
 void StatementReader::checkGroups(const Selected& selected) {
     const sql::Statement& statement = selected.statement;
-    const auto isTotal = [](const Node& node) {
-        return node && sql::holds<sql::Aggregate>(*node);
-    };
+    const auto isTotal = [](const Node& node) { return node && sql::holds<sql::Aggregate>(*node); };
     bool grouped = !statement.group.empty() || isTotal(statement.having);
     for (const auto& item : statement.items)
         if (const auto* node = std::get_if<Node>(&item.what)) grouped = grouped || isTotal(*node);

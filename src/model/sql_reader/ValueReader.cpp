@@ -19,8 +19,8 @@
 namespace zandor::sql_reader {
 
 using model::ColumnType;
-using model::Total;
 using model::sameName;
+using model::Total;
 using model::criteria::inBrackets;
 
 namespace {
@@ -110,7 +110,8 @@ Node ValueReader::columnsCompared(const Tree& tree) const {
         return plain ? reading : nullptr;
     };
     const String symbol = operatorOf(tree);
-    constexpr std::array symbols = std::to_array<StringView>({u"=", u"<>", u"<", u">", u"<=", u">="});
+    constexpr std::array symbols =
+        std::to_array<StringView>({u"=", u"<>", u"<", u">", u"<=", u">="});
     const auto at = std::find(symbols.begin(), symbols.end(), symbol);
     if (at == symbols.end()) return {};
     Node left = column("lexpr");
@@ -225,7 +226,8 @@ String ValueReader::newText(const Tree& tree, Pass& pass) const {
         return u"Coalesce(" + list(tree, "args", pass) + u')';
     }
     if (tree.is("FuncCall")) return call(tree, pass);
-    refuse<MessageCode::noPlaceFor>(tree.place(), model::say<MessageCode::thisPart>(tree.sqlName()));
+    refuse<MessageCode::noPlaceFor>(tree.place(),
+                                    model::say<MessageCode::thisPart>(tree.sqlName()));
 }
 
 String ValueReader::constant(const Tree& tree) const {
@@ -252,7 +254,8 @@ String ValueReader::column(const Tree& tree, Pass& pass) const {
         names.push_back(field.text("sval"));
     }
     String table;
-    if (names.size() > 1) table = mScope.source({names.begin(), names.end() - 1}, tree.place()).alias;
+    if (names.size() > 1)
+        table = mScope.source({names.begin(), names.end() - 1}, tree.place()).alias;
     const auto alias = mAliases.find(model::foldedName(names.back()));
     if (names.size() == 1 && alias != mAliases.end() && !mScope.find(names.back(), tree.place()))
         return text(alias->second, pass);
@@ -293,8 +296,7 @@ ColumnType ValueReader::typeOf(const Tree& tree, Pass& pass) const {
     const auto known = pass.types.find(&tree.json());
     if (known != pass.types.end()) return known->second;
     const auto reading = model::criteria::readExpression(text(tree, pass), pass);
-    const auto type =
-        reading.value ? model::sql::typeOf(*reading.value) : ColumnType::Unknown;
+    const auto type = reading.value ? model::sql::typeOf(*reading.value) : ColumnType::Unknown;
     return pass.types.emplace(&tree.json(), type).first->second;
 }
 
@@ -316,8 +318,7 @@ String ValueReader::choice(const Tree& tree, Pass& pass) const {
         if (!out.empty()) out += u", ";
         out += u"If(";
         if (tree.has("arg"))
-            out += text(tree.node("arg"), pass) + u" = " +
-                   side(condition, tree.node("arg"), pass);
+            out += text(tree.node("arg"), pass) + u" = " + side(condition, tree.node("arg"), pass);
         else
             out += text(condition, pass);
         out += u", " + text(when.node("result"), pass);
@@ -342,7 +343,9 @@ String ValueReader::call(const Tree& tree, Pass& pass) const {
     if (totalOf(tree)) return pass.nameFor(total(tree));
     const String name = tree.names("funcname").back();
     const auto arguments = tree.list("args");
-    const auto isTruth = [&](const Tree& each) { return typeOf(each, pass) == ColumnType::Boolean; };
+    const auto isTruth = [&](const Tree& each) {
+        return typeOf(each, pass) == ColumnType::Boolean;
+    };
     if (mDialect == Dialect::MySQL && sameName(name, u"concat") && arguments.size() > 1 &&
         std::none_of(arguments.begin(), arguments.end(), isTruth)) {
         tree.only({"funcname", "args", "funcformat"});

@@ -29,9 +29,10 @@ Refusal refusalAt(StringView text, Message message, std::size_t position) {
 /// The first word, where it is one that other statements begin with.
 bool isOtherStatement(StringView text) {
     constexpr auto words = std::to_array<StringView>(
-        {u"alter", u"begin", u"call", u"commit", u"create", u"delete", u"describe", u"drop",
-         u"exec", u"execute", u"explain", u"grant", u"insert", u"merge", u"pragma", u"replace",
-         u"revoke", u"rollback", u"set", u"show", u"truncate", u"update", u"use"});
+        {u"alter",    u"begin", u"call",     u"commit",  u"create",  u"delete",
+         u"describe", u"drop",  u"exec",     u"execute", u"explain", u"grant",
+         u"insert",   u"merge", u"pragma",   u"replace", u"revoke",  u"rollback",
+         u"set",      u"show",  u"truncate", u"update",  u"use"});
     const auto isLetter = [](char16_t c) {
         return (c >= u'a' && c <= u'z') || (c >= u'A' && c <= u'Z');
     };

@@ -81,10 +81,12 @@ TEST_F(LargeStatements, OfThousandsOfWaysToHoldAreCompared) {
 
 TEST_F(LargeStatements, OfQueriesWithinQueriesAreRefusedWhereTheyStandTooDeep) {
     const auto within = [](int depth) {
-        return u"WITH " + list(depth, u", ", [](int n) {
-                   return u'w' + number(n) + u" AS (SELECT id FROM " +
-                          (n == 0 ? std::u16string(u"orders") : u'w' + number(n - 1)) + u')';
-               }) +
+        return u"WITH " +
+               list(depth, u", ",
+                    [](int n) {
+                        return u'w' + number(n) + u" AS (SELECT id FROM " +
+                               (n == 0 ? std::u16string(u"orders") : u'w' + number(n - 1)) + u')';
+                    }) +
                u" SELECT id FROM w" + number(depth - 1);
     };
     constexpr int deepest = zandor::model::deepestSavedQuery;
