@@ -88,9 +88,10 @@ public:
     Drawing(const Selected& selected, Layout layout) : mSelected(selected), mLayout(layout) {}
 
     Ref<Query> draw() {
-        const std::vector<Node> rest = drawSources(
-            *mQuery, mSelected,
-            mLayout == Layout::loops || keepsOrder(mLayout) ? Loops::joins : Loops::criteria);
+        const auto joins = keepsOrder(mLayout)        ? JoinsOfRows::loops
+                           : mLayout == Layout::loops ? JoinsOfRows::loopsToo
+                                                      : JoinsOfRows::islands;
+        const std::vector<Node> rest = drawSources(*mQuery, mSelected, joins);
         Columns columns(*mQuery, mSelected, keepsOrder(mLayout));
         columns.addItems();
         columns.sort();

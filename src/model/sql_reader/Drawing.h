@@ -13,12 +13,12 @@ using model::Query;
 /// conditions: a drawing that was written has that order from its columns.
 Ref<Query> drawn(const Selected& selected, const std::function<bool(Query&)>& isWhole = {});
 
-/// What is drawn of a condition that compares two columns of one table: a criterion, or a join of
-/// the table with itself.
-enum class Loops { criteria, joins };
+/// Which conditions on rows become joins: those that connect tables which nothing else does, those
+/// between columns of one table too, or these alone, as a drawing that was written had them.
+enum class JoinsOfRows { islands, loopsToo, loops };
 
 /// Puts a statement's tables and joins into an empty query. Returns what its conditions ask for
 /// beyond the joins.
-std::vector<Node> drawSources(Query& query, const Selected& selected, Loops loops);
+std::vector<Node> drawSources(Query& query, const Selected& selected, JoinsOfRows joins);
 
 } // namespace zandor::sql_reader

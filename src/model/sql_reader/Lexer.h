@@ -28,6 +28,8 @@ struct ParserText {
     };
     std::vector<Origin> origins;
 
+    /// A CAST of a constant is one, and no date or moment written out.
+    bool keepsCasts = false;
     bool saysTruth = false; ///< TRUE or FALSE, other than behind AS or a point
 
     /// What stood at a byte of it.

@@ -3,6 +3,7 @@
 #include "model/sql_reader/Refused.h"
 #include "model/sql_reader/Sameness.h"
 #include "model/sql_reader/Terms.h"
+#include "model/sql_reader/TreeChecks.h"
 
 #include <Zandor/model/Names.h>
 #include <Zandor/model/QueryOptions.h>
@@ -27,6 +28,14 @@ String bareName(const Tree& tree) {
     const auto fields = tree.list("fields");
     return fields.size() == 1 && fields.front().is("String") ? fields.front().text("sval")
                                                              : String();
+}
+
+/// What the printer groups by where that is a constant, which engines take for a place.
+std::optional<Tree> constantGroup(const Tree& group) {
+    if (!group.is("CoalesceExpr")) return {};
+    const auto arguments = group.list("args");
+    if (arguments.size() != 2 || !isConstant(arguments[1], "isnull")) return {};
+    return arguments[0];
 }
 
 bool isGrouped(const Node& node, const std::vector<Node>& groups) {
@@ -79,7 +88,9 @@ Selected StatementReader::selectNamed(const Tree& tree) {
                            .conditions(tree.node("whereClause")));
     for (const Tree& each : tree.list("groupClause")) {
         if (each.is("GroupingSet")) refusePart<MessageCode::groupingSets>(each.place());
-        selected.statement.group.push_back(byNameOrPlace(each, values, selected, false));
+        const auto constant = constantGroup(each);
+        selected.statement.group.push_back(constant ? values.value(*constant)
+                                                    : byNameOrPlace(each, values, selected, false));
         selected.commented.emplace(each.place(), model::CommentPlace::groups);
     }
     if (tree.has("havingClause"))

@@ -274,6 +274,7 @@ String ValueReader::parameter(const Tree& tree) const {
 /// A date, time or moment, or bytes, written out: a text by its type.
 std::optional<String> ValueReader::momentWritten(const Tree& tree, Pass& pass) const {
     if (!tree.is("TypeCast") || !isConstant(tree.node("arg"), "sval")) return {};
+    if (mText.keepsCasts && mText.text.compare(tree.place(), 4, "CAST") == 0) return {};
     const Tree type = tree.part("typeName");
     const String content = tree.node("arg").part("sval").text("sval");
     if (isNamed(type, {u"date", u"time", u"timestamp", u"datetime", u"datetime2"})) {

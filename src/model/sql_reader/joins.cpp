@@ -23,8 +23,8 @@ constexpr std::int16_t keepsBoth = 3;
 
 class Sources {
 public:
-    Sources(Query& query, const Selected& selected, Loops loops)
-        : mQuery(query), mSelected(selected), mLoops(loops) {}
+    Sources(Query& query, const Selected& selected, JoinsOfRows joins)
+        : mQuery(query), mSelected(selected), mJoins(joins) {}
 
     std::vector<Node> draw() {
         for (const auto& source : mSelected.statement.from) addTables(*source);
@@ -43,10 +43,9 @@ private:
         }
         const String& alias = sql::aliasOf(source);
         const auto table = mSelected.tables.find(alias);
-        const auto added =
-            table != mSelected.tables.end()
-                ? mQuery.addTable(table->second)
-                : mQuery.addQuery(alias, mSelected.queries.find(alias)->second);
+        const auto added = table != mSelected.tables.end()
+                               ? mQuery.addTable(table->second)
+                               : mQuery.addQuery(alias, mSelected.queries.find(alias)->second);
         if (added->Name() != alias) mQuery.renameTable(added, alias);
         mIslands[alias] = alias;
     }
@@ -129,9 +128,11 @@ private:
         return alias;
     }
 
-    /// Whether a condition on rows joins tables that nothing has joined before it; it is drawn then.
+    /// Whether a condition on rows joins tables that nothing has joined before it; it is drawn
+    /// then.
     bool joinsIslands(const Node& term) {
         const auto columns = columnsOf(term);
+        if (mJoins == JoinsOfRows::loops) return false;
         if (!columns || std::get<sql::Compare>(term->node).comparison != sql::Comparison::equal)
             return false;
         const auto& [left, right] = *columns;
@@ -146,7 +147,8 @@ private:
 
     bool joinsItself(const Node& term) {
         const auto columns = columnsOf(term);
-        if (mLoops != Loops::joins || !columns || columns->first.table != columns->second.table)
+        if (mJoins == JoinsOfRows::islands || !columns ||
+            columns->first.table != columns->second.table)
             return false;
         add(columns->first, columns->second, 0, std::get<sql::Compare>(term->node).comparison);
         return true;
@@ -154,8 +156,8 @@ private:
 
     Query& mQuery;
     const Selected& mSelected;
-    const Loops mLoops;
-    std::map<String, String> mIslands; ///< tables that are joined lead to one of them
+    const JoinsOfRows mJoins;
+    std::map<String, String> mIslands;          ///< tables that are joined lead to one of them
     std::set<std::pair<String, String>> mPairs; ///< of tables that conditions on rows join
     Aliases mWhole;                             ///< of which no row is filled with nothing
     std::vector<Node> mRest;
@@ -163,8 +165,8 @@ private:
 
 } // namespace
 
-std::vector<Node> drawSources(Query& query, const Selected& selected, Loops loops) {
-    return Sources(query, selected, loops).draw();
+std::vector<Node> drawSources(Query& query, const Selected& selected, JoinsOfRows joins) {
+    return Sources(query, selected, joins).draw();
 }
 
 } // namespace zandor::sql_reader

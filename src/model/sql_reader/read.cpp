@@ -67,7 +67,20 @@ Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect d
         using model::sql::ValueForm;
         return model::sql::statementText(query, dialect, ValueForm::literal).text == trimmed(typed);
     };
-    return drawn(StatementReader(schema, text, dialect).select(statement), isWhole);
+    const auto readAs = [&](const ParserText& meant) {
+        return drawn(StatementReader(schema, meant, dialect).select(statement), isWhole);
+    };
+    auto query = readAs(text);
+    if (text.text.find("CAST('") == std::string::npos || isWhole(*query)) return query;
+    // PostgreSQL's parser has one tree for CAST('2024-05-01' AS date) and DATE '2024-05-01'.
+    ParserText asWritten = text;
+    asWritten.keepsCasts = true;
+    try {
+        if (auto other = readAs(asWritten); isWhole(*other)) query = std::move(other);
+    } catch (const Refused&) {
+        return query;
+    }
+    return query;
 }
 
 } // namespace
@@ -75,6 +88,9 @@ Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect d
 Drawn read(StringView text, Dialect dialect, const Schema& schema) {
     if (text.size() > longest)
         return refusalAt(text, model::say<MessageCode::tooLong>(longest), longest);
+    // The parser would take it for the end.
+    if (const auto zero = text.find(u'\0'); zero != StringView::npos)
+        return refusalAt(text, model::say<MessageCode::notParsed>(u"U+0000"), zero);
     ParserText lexedText;
     try {
         lexedText = lexed(text, dialect);

@@ -91,7 +91,6 @@ public:
                   << " of two ways to read their joins written in the other\n";
     }
     int tried() const { return mTried; }
-    int refused() const { return mRefused; }
     int writtenOtherwise() const { return mOther; }
 
 private:
@@ -143,15 +142,14 @@ TEST(ReadBack, OfTheCorpusIsTheSameText) {
         ReadingBack reading(sampleEngines(), dialect);
         for (const auto& drawn : cases) {
             const auto why = reading.tryOn(*corpus::draw(drawn, sampleEngines().reader()));
-            // Rows that are put together by a constant alone.
-            const bool expected = why.find("NULL as a value") != std::string::npos ||
+            // SQL Server groups by no constant, so that its text does not say it.
+            const bool expected = dialect == Dialect::SqlServer &&
                                   why.find("neither grouped") != std::string::npos;
             EXPECT_TRUE(why.empty() || expected) << drawn.name << ": " << why;
         }
         reading.report();
         EXPECT_GT(reading.tried(), 420);
-        EXPECT_LE(reading.refused(), 2);
-        EXPECT_LE(reading.writtenOtherwise(), 4);
+        EXPECT_EQ(reading.writtenOtherwise(), 0);
     }
 }
 
@@ -171,6 +169,6 @@ TEST(ReadBack, OfRandomQueriesIsTheSameText) {
         }
         reading.report();
         EXPECT_GT(reading.tried(), static_cast<int>(howMany));
-        EXPECT_LE(reading.writtenOtherwise(), reading.tried() / 500);
+        EXPECT_LE(reading.writtenOtherwise(), reading.tried() / 1000);
     }
 }

@@ -232,3 +232,26 @@ TEST_F(Statement, JoinsWhatStandsBeforeACommaAsItsDialectDoes) {
                       u"o.id = l.order_id) LEFT JOIN customers d ON d.id = o.customer_id"),
               "drawn");
 }
+
+TEST_F(Statement, ThatADrawingHasWrittenComesBackWithItsCastsAndItsConditionsOnRows) {
+    for (const std::u16string written :
+         {u"SELECT\n    orders.id\nFROM orders\nWHERE orders.placed >= CAST(CAST('2023-01-01' AS "
+          u"date) AS timestamp)",
+          u"SELECT\n    orders.id\nFROM orders\nWHERE orders.placed >= TIMESTAMP '2023-01-01 "
+          u"00:00:00'",
+          u"SELECT\n    orders.id\nFROM orders\n    CROSS JOIN customers\nWHERE "
+          u"orders.customer_id = customers.id",
+          u"SELECT\n    'x' AS letter,\n    orders.id,\n    COUNT(*) AS n\nFROM orders\nGROUP BY "
+          u"COALESCE('x', NULL), orders.id",
+          u"SELECT\n    orders.id\nFROM orders\n    INNER JOIN customers ON orders.customer_id = "
+          u"customers.id"}) {
+        read(written, Dialect::PostgreSQL);
+        EXPECT_EQ(text(Dialect::PostgreSQL), zandor::platform::toUtf8(written));
+    }
+    // People mean a date by it.
+    read(u"SELECT id FROM orders WHERE placed >= CAST('2023-01-01' AS timestamp)",
+         Dialect::PostgreSQL);
+    EXPECT_EQ(criteria(2), Texts{"4: >= 2023-01-01 00:00:00"});
+    read(u"SELECT o.id FROM orders o, customers c WHERE o.customer_id = c.id");
+    EXPECT_EQ(record.joins.size(), 1U);
+}

@@ -73,6 +73,14 @@ TEST_F(Refusals, AskWhatIsNeitherTrueNorFalseForNoTruth) {
               "drawn");
 }
 
+TEST_F(Refusals, PointAtTheCharacterZeroWhichWouldEndTheText) {
+    using namespace std::string_view_literals;
+    EXPECT_EQ(refusal(u"SELECT id FROM orders \0 WHERE"sv),
+              "Line 1, column 23: this cannot be read as SQL (U+0000); mend it here or before.");
+    EXPECT_EQ(refusal(u"SELECT id FROM customers WHERE name = 'a\0b'"sv),
+              "Line 1, column 41: this cannot be read as SQL (U+0000); mend it here or before.");
+}
+
 TEST_F(Refusals, HaveNoTextForWhatIsTrueOrFalseWhereItIsANumber) {
     for (const char16_t* text :
          {u"length(active)", u"length(city = 'Wien' AND 1 > 1)", u"CAST(active AS TEXT)",
