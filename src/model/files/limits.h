@@ -1,5 +1,7 @@
 #pragma once
 
+#include <Zandor/model/CommentLimit.h>
+
 #include <cstddef>
 
 /// What a query file may have. The counts are far above what a person draws, and low enough that
@@ -15,6 +17,6 @@ inline constexpr std::size_t columnsOfTable = 5'000;
 inline constexpr std::size_t columns = 100'000; ///< of all tables
 inline constexpr std::size_t joins = 10'000;
 inline constexpr std::size_t definitions = 10'000;
-inline constexpr std::size_t comments = 10'000;
+inline constexpr std::size_t comments = model::mostComments;
 
 } // namespace zandor::files::limits

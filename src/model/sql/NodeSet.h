@@ -1,5 +1,6 @@
 #pragma once
 
+#include <Zandor/model/export.h>
 #include <Zandor/sql/Expression.h>
 
 #include <unordered_map>
@@ -9,7 +10,7 @@ namespace zandor::model::sql {
 
 /// Nodes that are the same count as one.
 struct NodeHash {
-    std::size_t operator()(const Node& node) const;
+    ZANDOR_MODEL_EXPORT std::size_t operator()(const Node& node) const;
 };
 struct NodeEqual {
     bool operator()(const Node& one, const Node& other) const { return same(one, other); }

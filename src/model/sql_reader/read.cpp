@@ -1,9 +1,9 @@
-#include "model/files/limits.h"
 #include "model/sql_reader/Drawing.h"
 #include "model/sql_reader/Refused.h"
 #include "model/sql_reader/StatementReader.h"
 #include "model/sql_reader/parse.h"
 
+#include <Zandor/model/CommentLimit.h>
 #include <Zandor/model/Names.h>
 #include <Zandor/sql/Builder.h>
 
@@ -52,9 +52,9 @@ StringView trimmed(StringView text) {
 
 Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect dialect,
                              const Schema& schema) {
-    if (text.comments.size() > files::limits::comments)
-        refuse<MessageCode::tooManyComments>(text.comments[files::limits::comments].byte,
-                                             files::limits::comments);
+    if (text.comments.size() > model::mostComments)
+        refuse<MessageCode::tooManyComments>(text.comments[model::mostComments].byte,
+                                             model::mostComments);
     const nlohmann::json parsed = parse(text.text);
     const Tree tree = Tree::ofParts(parsed);
     const auto statements = tree.list("stmts");
