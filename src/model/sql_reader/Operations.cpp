@@ -80,12 +80,8 @@ String ValueReader::side(const Tree& tree, const Tree& other, Pass& pass) const 
             typeOf(other, pass) == ColumnType::Timestamp)
             return text(date, pass);
     }
-    // Elsewhere than in PostgreSQL truth is a number.
-    const bool truth = isConstant(tree, "ival") && mDialect != Dialect::PostgreSQL;
-    if (truth && typeOf(other, pass) == ColumnType::Boolean) {
-        const std::int64_t number = tree.part("ival").number("ival");
-        if (number == 0 || number == 1) return number == 1 ? u"True" : u"False";
-    }
+    if (const auto number = numberOfTruth(tree))
+        if (typeOf(other, pass) == ColumnType::Boolean) return *number ? u"True" : u"False";
     return text(tree, pass);
 }
 

@@ -213,7 +213,7 @@ String ValueReader::newText(const Tree& tree, Pass& pass) const {
         tree.only({"boolop", "args"});
         if (tree.word("boolop") == "AND_EXPR") return joined(tree, u" And ", pass);
         if (tree.word("boolop") == "OR_EXPR") return joined(tree, u" Or ", pass);
-        return u"(Not (" + text(tree.list("args").front(), pass) + u"))";
+        return u"(Not (" + truth(tree.list("args").front(), pass) + u"))";
     }
     if (tree.is("NullTest")) {
         tree.only({"arg", "nulltesttype", "argisrow"});
@@ -305,9 +305,23 @@ String ValueReader::joined(const Tree& tree, StringView word, Pass& pass) const 
     String out = u"(";
     for (const Tree& term : tree.list("args")) {
         if (out.size() > 1) out += word;
-        out += text(term, pass);
+        out += truth(term, pass);
     }
     return out + u')';
+}
+
+/// What is asked whether it holds.
+String ValueReader::truth(const Tree& tree, Pass& pass) const {
+    if (const auto number = numberOfTruth(tree)) return *number ? u"True" : u"False";
+    return text(tree, pass);
+}
+
+/// Elsewhere than in PostgreSQL truth is a number.
+std::optional<bool> ValueReader::numberOfTruth(const Tree& tree) const {
+    if (mDialect == Dialect::PostgreSQL || !isConstant(tree, "ival")) return {};
+    const std::int64_t number = tree.part("ival").number("ival");
+    if (number != 0 && number != 1) return {};
+    return number == 1;
 }
 
 String ValueReader::choice(const Tree& tree, Pass& pass) const {
@@ -321,7 +335,7 @@ String ValueReader::choice(const Tree& tree, Pass& pass) const {
         if (tree.has("arg"))
             out += text(tree.node("arg"), pass) + u" = " + side(condition, tree.node("arg"), pass);
         else
-            out += text(condition, pass);
+            out += truth(condition, pass);
         out += u", " + text(when.node("result"), pass);
         close += u')';
     }

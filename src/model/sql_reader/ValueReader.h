@@ -53,6 +53,8 @@ private:
     String division(const Tree& tree, Pass& pass) const;
     String like(const Tree& tree, Pass& pass) const;
     String joined(const Tree& tree, StringView word, Pass& pass) const;
+    String truth(const Tree& tree, Pass& pass) const;
+    std::optional<bool> numberOfTruth(const Tree& tree) const;
     String choice(const Tree& tree, Pass& pass) const;
     String call(const Tree& tree, Pass& pass) const;
     std::optional<String> byForm(const Tree& tree, Pass& pass) const;

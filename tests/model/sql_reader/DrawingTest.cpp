@@ -255,3 +255,13 @@ TEST_F(Statement, ThatADrawingHasWrittenComesBackWithItsCastsAndItsConditionsOnR
     read(u"SELECT o.id FROM orders o, customers c WHERE o.customer_id = c.id");
     EXPECT_EQ(record.joins.size(), 1U);
 }
+
+TEST_F(Statement, TakesANumberForTruthWhereThatIsAsked) {
+    // Where a column is called True, the word would mean it.
+    const std::u16string written = u"SELECT\n    1 AS True,\n    NOT (1) AS no,\n    CASE WHEN 0 THEN "
+                                   u"customers.id END AS none\nFROM customers";
+    read(written);
+    EXPECT_EQ(text(), zandor::platform::toUtf8(written));
+    EXPECT_NE(refusal(u"SELECT NOT 2 AS x FROM customers"), "drawn");
+    EXPECT_NE(refusal(u"SELECT NOT 1 AS x FROM customers", Dialect::PostgreSQL), "drawn");
+}
