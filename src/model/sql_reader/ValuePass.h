@@ -9,6 +9,16 @@
 
 namespace zandor::sql_reader {
 
+/// A text as people type it.
+inline String quoted(const String& text) {
+    String out = u"'";
+    for (const char16_t c : text) {
+        out += c;
+        if (c == u'\'') out += c;
+    }
+    return out + u'\'';
+}
+
 /// One expression being read: the totals in it have names for as long.
 class ValueReader::Pass final : public model::criteria::Resolver {
 public:

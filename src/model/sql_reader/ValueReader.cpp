@@ -23,19 +23,6 @@ using model::sameName;
 using model::Total;
 using model::criteria::inBrackets;
 
-namespace {
-
-String quoted(const String& text) {
-    String out = u"'";
-    for (const char16_t c : text) {
-        out += c;
-        if (c == u'\'') out += c;
-    }
-    return out + u'\'';
-}
-
-} // namespace
-
 std::optional<Total> totalOf(const Tree& call) {
     if (!call.is("FuncCall")) return {};
     const String name = call.names("funcname").back();
