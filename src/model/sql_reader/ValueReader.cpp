@@ -260,6 +260,8 @@ String ValueReader::parameter(const Tree& tree) const {
 
 /// A date, time or moment, or bytes, written out: a text by its type.
 std::optional<String> ValueReader::momentWritten(const Tree& tree, Pass& pass) const {
+    // SQLite has none, and makes a number by such a cast.
+    if (mDialect == Dialect::SQLite) return {};
     if (!tree.is("TypeCast") || !isConstant(tree.node("arg"), "sval")) return {};
     if (mText.keepsCasts && mText.text.compare(tree.place(), 4, "CAST") == 0) return {};
     const Tree type = tree.part("typeName");

@@ -265,3 +265,17 @@ TEST_F(Statement, TakesANumberForTruthWhereThatIsAsked) {
     EXPECT_NE(refusal(u"SELECT NOT 2 AS x FROM customers"), "drawn");
     EXPECT_NE(refusal(u"SELECT NOT 1 AS x FROM customers", Dialect::PostgreSQL), "drawn");
 }
+
+TEST_F(Statement, AsksForASmallestThatComesOutAndElseForTheGroupInMySql) {
+    const std::u16string begin = u"SELECT orders.customer_id, MIN(orders.customer_id) AS least FROM "
+                                 u"orders GROUP BY orders.customer_id HAVING ";
+    read(begin + u"MIN(orders.customer_id) > 3", Dialect::MySQL);
+    EXPECT_EQ(criteria(1), Texts{});
+    EXPECT_EQ(criteria(2), Texts{"4: > 3"});
+    read(u"SELECT orders.customer_id, COUNT(*) AS n FROM orders GROUP BY orders.customer_id HAVING "
+         u"MIN(orders.customer_id) > 3 OR COUNT(*) > 2",
+         Dialect::MySQL);
+    ASSERT_EQ(record.definitions.size(), 2U);
+    EXPECT_EQ(criteria(1), Texts{"4: > 3"});
+    EXPECT_EQ(criteria(2), Texts{"5: > 2"});
+}

@@ -10,9 +10,10 @@ TEST_F(Refusals, SayTheLineAndColumnOfTheTextAsItWasTyped) {
 }
 
 TEST_F(Refusals, PointBehindATextThatEndsTooEarly) {
-    EXPECT_EQ(refusal(u"SELECT name\nFROM customers\nWHERE"),
-              "Line 3, column 6: this cannot be read as SQL (syntax error at end of input); mend it "
-              "here or before.");
+    EXPECT_EQ(
+        refusal(u"SELECT name\nFROM customers\nWHERE"),
+        "Line 3, column 6: this cannot be read as SQL (syntax error at end of input); mend it "
+        "here or before.");
     EXPECT_EQ(refusal(u""), "Line 1, column 1: there is no statement; write a SELECT.");
     EXPECT_EQ(refusal(u" ;; "), "Line 1, column 1: there is no statement; write a SELECT.");
 }
@@ -46,9 +47,9 @@ TEST_F(Refusals, KeepWhatOnlyLooksTheSame) {
 
 TEST_F(Refusals, ComeOfTooMuchAndTooDeepAndNothingElseDoes) {
     const std::u16string select = u"SELECT name FROM customers WHERE ";
-    EXPECT_NE(refusal(select + std::u16string(20'000, u'(') + u"id = 1" +
-                      std::u16string(20'000, u')')),
-              "drawn");
+    EXPECT_NE(
+        refusal(select + std::u16string(20'000, u'(') + u"id = 1" + std::u16string(20'000, u')')),
+        "drawn");
     std::u16string nots;
     for (int n = 0; n < 5'000; ++n) nots += u"NOT ";
     EXPECT_NE(refusal(select + nots + u"id = 1"), "drawn");
@@ -81,6 +82,20 @@ TEST_F(Refusals, PointAtTheCharacterZeroWhichWouldEndTheText) {
               "Line 1, column 41: this cannot be read as SQL (U+0000); mend it here or before.");
 }
 
+TEST_F(Refusals, TakeNoCastForADateInSqliteWhichMakesANumberOfIt) {
+    const std::string line =
+        "a drawing does not know this cast; the statement can be run as it is.";
+    EXPECT_EQ(refusal(u"SELECT CAST('2020-01-01' AS date) AS day FROM orders"),
+              "Line 1, column 8: " + line);
+    EXPECT_EQ(refusal(u"SELECT id FROM orders WHERE placed >= CAST('2023-01-01 10:00:00' AS "
+                      u"timestamp)"),
+              "Line 1, column 39: " + line);
+    EXPECT_EQ(refusal(u"SELECT id FROM orders WHERE placed >= CAST('2023-01-01 10:00:00' AS "
+                      u"datetime)",
+                      Dialect::MySQL),
+              "drawn");
+}
+
 TEST_F(Refusals, HaveNoTextForWhatIsTrueOrFalseWhereItIsANumber) {
     for (const char16_t* text :
          {u"length(active)", u"length(city = 'Wien' AND 1 > 1)", u"CAST(active AS TEXT)",
@@ -91,17 +106,19 @@ TEST_F(Refusals, HaveNoTextForWhatIsTrueOrFalseWhereItIsANumber) {
     EXPECT_EQ(refusal(u"SELECT CAST(active AS TEXT) AS x FROM customers"),
               "Line 1, column 8: a drawing does not know this cast; the statement can be run as it "
               "is.");
-    EXPECT_EQ(refusal(u"SELECT length(active) AS x FROM customers"),
-              "Line 1, column 8: a drawing does not know the function length as it stands here; the "
-              "statement can be run as it is.");
+    EXPECT_EQ(
+        refusal(u"SELECT length(active) AS x FROM customers"),
+        "Line 1, column 8: a drawing does not know the function length as it stands here; the "
+        "statement can be run as it is.");
     EXPECT_NE(refusal(u"SELECT concat(name, active) AS x FROM customers", Dialect::MySQL), "drawn");
     EXPECT_EQ(refusal(u"SELECT CAST(active AS text) AS x FROM customers", Dialect::PostgreSQL),
               "drawn");
 }
 
 TEST_F(Refusals, AskForParenthesesWhereSqliteTakesOperatorsTogetherInAnotherOrder) {
-    const std::string line = "the database takes these operators together in another order than they "
-                             "are read; write parentheses.";
+    const std::string line =
+        "the database takes these operators together in another order than they "
+        "are read; write parentheses.";
     const auto said = [&](const char16_t* value, Dialect dialect = Dialect::SQLite) {
         const std::string all =
             refusal(u"SELECT id FROM customers WHERE " + std::u16string(value), dialect);
@@ -127,7 +144,7 @@ TEST_F(Refusals, AskForParenthesesWhereSqliteTakesOperatorsTogetherInAnotherOrde
 TEST_F(Refusals, TakeNoWordForTruthAsANameInSqlite) {
     const auto named = u"SELECT name AS \"True\" FROM customers WHERE active = TRUE";
     EXPECT_EQ(refusal(named), "Line 1, column 8: a drawing has no place for this (AS true); it can "
-                             "be run as it is.");
+                              "be run as it is.");
     EXPECT_EQ(refusal(named, Dialect::PostgreSQL), "drawn");
     EXPECT_NE(refusal(u"SELECT name TRUE, city FROM customers WHERE active"), "drawn");
     read(u"SELECT TRUE FROM customers WHERE active");
@@ -142,5 +159,6 @@ TEST_F(Refusals, NameASchemaThatTheTableIsNotOf) {
     EXPECT_NE(refusal(u"SELECT other.customers.name FROM customers").find("\"other.customers\""),
               std::string::npos)
         << refusal(u"SELECT other.customers.name FROM customers");
-    EXPECT_EQ(refusal(u"SELECT main.customers.name, main.customers.* FROM main.customers"), "drawn");
+    EXPECT_EQ(refusal(u"SELECT main.customers.name, main.customers.* FROM main.customers"),
+              "drawn");
 }
