@@ -1320,6 +1320,14 @@
         <source>the database takes these operators together in another order than they are read; write parentheses.</source>
         <translation>die Datenbank fasst diese Operatoren in einer anderen Reihenfolge zusammen, als sie gelesen werden; setzen Sie Klammern.</translation>
     </message>
+    <message>
+        <source>a drawing takes a date for a moment beside one, which the database does not; the statement can be run as it is.</source>
+        <translation>eine Zeichnung macht aus einem Datum neben einem Zeitpunkt auch einen, die Datenbank nicht; die Anweisung kann ausgeführt werden, wie sie ist.</translation>
+    </message>
+    <message>
+        <source>a drawing takes &apos;%1&apos; for no text here, which the database does; write it without quotes.</source>
+        <translation>eine Zeichnung nimmt &apos;%1&apos; hier nicht als Text, die Datenbank schon; schreiben Sie es ohne Anführungszeichen.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

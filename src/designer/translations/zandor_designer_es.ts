@@ -1320,6 +1320,14 @@
         <source>the database takes these operators together in another order than they are read; write parentheses.</source>
         <translation>la base de datos agrupa estos operadores en otro orden que el de la lectura; ponga paréntesis.</translation>
     </message>
+    <message>
+        <source>a drawing takes a date for a moment beside one, which the database does not; the statement can be run as it is.</source>
+        <translation>junto a una marca de tiempo, un dibujo toma una fecha por otra, lo que la base de datos no hace; la sentencia puede ejecutarse tal cual.</translation>
+    </message>
+    <message>
+        <source>a drawing takes &apos;%1&apos; for no text here, which the database does; write it without quotes.</source>
+        <translation>un dibujo no toma aquí &apos;%1&apos; por un texto, lo que la base de datos sí hace; escríbalo sin comillas.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

@@ -1320,6 +1320,14 @@
         <source>the database takes these operators together in another order than they are read; write parentheses.</source>
         <translation>la base de données regroupe ces opérateurs dans un autre ordre que celui de la lecture ; mettez des parenthèses.</translation>
     </message>
+    <message>
+        <source>a drawing takes a date for a moment beside one, which the database does not; the statement can be run as it is.</source>
+        <translation>à côté d’un horodatage, un dessin prend une date pour un horodatage, ce que la base de données ne fait pas ; l’instruction peut être exécutée telle quelle.</translation>
+    </message>
+    <message>
+        <source>a drawing takes &apos;%1&apos; for no text here, which the database does; write it without quotes.</source>
+        <translation>un dessin ne prend pas &apos;%1&apos; pour un texte ici, ce que la base de données fait ; écrivez-le sans guillemets.</translation>
+    </message>
 </context>
 <context>
     <name>ZandorWidget</name>

@@ -1,5 +1,6 @@
 #include "model/sql_reader/Conditions.h"
 
+#include "model/criteria/Literals.h"
 #include "model/sql_reader/Refused.h"
 
 #include <algorithm>
@@ -8,6 +9,7 @@ namespace zandor::sql_reader {
 
 using model::ColumnType;
 using platform::String;
+using platform::StringView;
 
 namespace {
 
@@ -30,11 +32,19 @@ Node asCondition(const Node& node) {
     }
     if (const auto* compare = std::get_if<sql::Compare>(&node->node))
         if (isGiven(compare->left) && !isGiven(compare->right))
-            return sql::make(sql::Compare{sql::mirrored(compare->comparison), compare->right,
-                                          compare->left});
+            return sql::make(
+                sql::Compare{sql::mirrored(compare->comparison), compare->right, compare->left});
     if (sql::isCondition(*node)) return node;
     return sql::make(sql::Compare{sql::Comparison::equal, node,
                                   sql::make(sql::Value{ColumnType::Boolean, u"true"})});
+}
+
+/// How often a value that is no text is there.
+std::ptrdiff_t countOf(const model::sql::Expression& node, StringView text) {
+    const auto* value = std::get_if<model::sql::Value>(&node.node);
+    std::ptrdiff_t count = value && value->type != ColumnType::Text && value->text == text ? 1 : 0;
+    for (const Node& part : model::sql::partsOf(node)) count += countOf(*part, text);
+    return count;
 }
 
 bool asksForTruth(const Node& node) {
@@ -52,14 +62,41 @@ bool asksForTruth(const Node& node) {
     return std::all_of(parts.begin(), parts.end(), asksForTruth);
 }
 
-void checkMoments(const Node& node, const std::vector<String>& texts, std::size_t place) {
+void checkMoments(const Node& node, const std::vector<String>& texts,
+                  const std::vector<Node>& dates, std::size_t place) {
     if (const auto* value = std::get_if<model::sql::Value>(&node->node)) {
         const bool moment = value->type == ColumnType::Date || value->type == ColumnType::Time ||
                             value->type == ColumnType::Timestamp;
         if (moment && std::find(texts.begin(), texts.end(), value->text) == texts.end())
             refuse<MessageCode::momentWritten>(place, value->text);
     }
-    for (const Node& part : model::sql::partsOf(*node)) checkMoments(part, texts, place);
+    const auto* call = std::get_if<model::sql::Call>(&node->node);
+    if (call && call->function == model::sql::Function::moment) {
+        const Node& date = call->arguments.front();
+        if (std::none_of(dates.begin(), dates.end(),
+                         [&](const Node& each) { return model::sql::same(each, date); }))
+            refuse<MessageCode::momentOfDate>(place);
+    }
+    for (const Node& part : model::sql::partsOf(*node)) checkMoments(part, texts, dates, place);
+}
+
+void checkTexts(const Node& node, const std::vector<String>& texts,
+                const std::vector<String>& others, std::size_t place) {
+    const auto bare = [](StringView text) {
+        while (text.starts_with(u'(')) text = text.substr(1, text.size() - 2);
+        return text;
+    };
+    for (const String& text : texts)
+        for (const ColumnType type : {ColumnType::Decimal, ColumnType::Boolean}) {
+            const auto value = model::criteria::literal(text, type);
+            if (!value) continue;
+            const auto same = [&](const String& other) {
+                const auto its = model::criteria::literal(bare(other), type);
+                return its && its->text == value->text;
+            };
+            if (countOf(*node, value->text) > std::count_if(others.begin(), others.end(), same))
+                refuse<MessageCode::textConverted>(place, text);
+        }
 }
 
 bool holdsAlways(const Node& node) {

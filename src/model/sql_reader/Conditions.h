@@ -17,7 +17,14 @@ bool asksForTruth(const Node& node);
 bool holdsAlways(const Node& node);
 
 /// SQLite compares moments as texts, so that one written otherwise than it was typed is another.
-/// Throws Refused for one that is not among the texts of the statement.
-void checkMoments(const Node& node, const std::vector<platform::String>& texts, std::size_t place);
+/// Throws Refused for one that is not among the texts of the statement, and for a date that becomes
+/// one and is not among those for which the statement says so.
+void checkMoments(const Node& node, const std::vector<platform::String>& texts,
+                  const std::vector<Node>& dates, std::size_t place);
+
+/// SQLite makes no number or truth of a text. Throws Refused where more of these are in a node than
+/// among the `others` of the statement, and one of its texts would come to the same.
+void checkTexts(const Node& node, const std::vector<platform::String>& texts,
+                const std::vector<platform::String>& others, std::size_t place);
 
 } // namespace zandor::sql_reader

@@ -86,8 +86,8 @@ private:
     static bool sameWord(const Json& pattern, const Json& given) {
         if (!given.contains("String")) return false;
         const auto word = [](const Json& node) {
-            return platform::fromUtf8(std::string_view(
-                node["String"].value("sval", std::string())));
+            return platform::fromUtf8(
+                std::string_view(node["String"].value("sval", std::string())));
         };
         return model::sameName(word(pattern), word(given));
     }
@@ -232,14 +232,20 @@ std::vector<Form> made(Dialect dialect) {
         const auto* signature = model::criteria::signatureOf(name.name);
         if (!signature) continue;
         constexpr std::size_t mostOfTemplates = 3;
-        for (std::size_t n = signature->fewest; n <= std::min(signature->most, mostOfTemplates); ++n)
+        for (std::size_t n = signature->fewest; n <= std::min(signature->most, mostOfTemplates);
+             ++n)
             addTemplate(forms, signature->function, n, called(name.name, n), dialect);
     }
     for (const Function function : {Function::addDays, Function::addDaysLater})
         addTemplate(forms, function, 2, u"({1} + {2})", dialect);
-    for (const Custom& custom : customs)
-        if (custom.dialect == dialect)
-            forms.push_back({parsed(custom.form, dialect), String(custom.expression), {}, dialect});
+    for (const Custom& custom : customs) {
+        if (custom.dialect != dialect) continue;
+        const StringView word = custom.expression.substr(0, custom.expression.find(u'('));
+        const auto* signature = model::criteria::signatureOf(word);
+        const auto function = signature ? std::optional(signature->function) : std::nullopt;
+        forms.push_back(
+            {parsed(custom.form, dialect), String(custom.expression), function, dialect});
+    }
     return forms;
 }
 

@@ -29,21 +29,40 @@ bool isWordPart(char16_t c) { return startsWord(c) || isDigit(c) || c == u'$' ||
 
 /// Words of the parser's grammar that it takes for names too; in order.
 constexpr std::array syntaxWords = std::to_array<StringView>({
-    u"at",        u"between",  u"bigint",    u"bit",       u"boolean",  u"by",
-    u"char",      u"character", u"coalesce", u"cube",      u"current",  u"day",
-    u"dec",       u"decimal",  u"double",    u"escape",    u"exclude",  u"exists",
-    u"extract",   u"filter",   u"first",     u"float",     u"following", u"greatest",
-    u"group",     u"grouping", u"groups",    u"hour",      u"inout",    u"int",
-    u"integer",   u"interval", u"last",      u"least",     u"locked",   u"materialized",
-    u"minute",    u"month",    u"national",  u"nchar",     u"next",     u"no",
-    u"none",      u"nowait",   u"nullif",    u"nulls",     u"numeric",  u"of",
-    u"others",    u"out",      u"over",      u"overlay",   u"partition", u"position",
-    u"preceding", u"precision", u"range",    u"real",      u"recursive", u"rollup",
-    u"row",       u"rows",     u"second",    u"sets",      u"share",    u"skip",
-    u"smallint",  u"substring", u"ties",     u"time",      u"timestamp", u"treat",
-    u"trim",      u"unbounded", u"uescape",  u"update",    u"values",   u"varchar",
-    u"varying",   u"with",     u"within",    u"without",   u"year",     u"zone",
+    u"at",        u"between",   u"bigint",   u"bit",     u"boolean",   u"by",
+    u"char",      u"character", u"coalesce", u"cube",    u"current",   u"day",
+    u"dec",       u"decimal",   u"double",   u"escape",  u"exclude",   u"exists",
+    u"extract",   u"filter",    u"first",    u"float",   u"following", u"greatest",
+    u"group",     u"grouping",  u"groups",   u"hour",    u"inout",     u"int",
+    u"integer",   u"interval",  u"last",     u"least",   u"locked",    u"materialized",
+    u"minute",    u"month",     u"national", u"nchar",   u"next",      u"no",
+    u"none",      u"nowait",    u"nullif",   u"nulls",   u"numeric",   u"of",
+    u"others",    u"out",       u"over",     u"overlay", u"partition", u"position",
+    u"preceding", u"precision", u"range",    u"real",    u"recursive", u"rollup",
+    u"row",       u"rows",      u"second",   u"sets",    u"share",     u"skip",
+    u"smallint",  u"substring", u"ties",     u"time",    u"timestamp", u"treat",
+    u"trim",      u"unbounded", u"uescape",  u"update",  u"values",    u"varchar",
+    u"varying",   u"with",      u"within",   u"without", u"year",      u"zone",
 });
+
+/// Words that begin or end a part of a statement in every dialect; in order.
+constexpr std::array clauseWords = std::to_array<StringView>({
+    u"asc",       u"both",           u"case",         u"cast",              u"collate",
+    u"cross",     u"current_date",   u"current_time", u"current_timestamp", u"desc",
+    u"distinct",  u"else",           u"end",          u"except",            u"false",
+    u"fetch",     u"for",            u"from",         u"full",              u"group",
+    u"having",    u"ilike",          u"inner",        u"intersect",         u"join",
+    u"lateral",   u"leading",        u"left",         u"like",              u"limit",
+    u"localtime", u"localtimestamp", u"natural",      u"not",               u"null",
+    u"offset",    u"on",             u"only",         u"order",             u"outer",
+    u"right",     u"select",         u"similar",      u"then",              u"trailing",
+    u"true",      u"union",          u"using",        u"when",              u"where",
+    u"window",    u"with",
+});
+
+bool isClause(const String& folded) {
+    return std::binary_search(clauseWords.begin(), clauseWords.end(), folded);
+}
 
 bool isSyntax(const String& folded) {
     return std::find(syntaxWords.begin(), syntaxWords.end(), folded) != syntaxWords.end() ||
@@ -57,7 +76,9 @@ String withoutMargins(StringView inner) {
         const std::size_t end = std::min(inner.find(u'\n'), inner.size());
         StringView line = inner.substr(0, end);
         inner.remove_prefix(std::min(end + 1, inner.size()));
-        const auto isMargin = [](char16_t c) { return c == u'*' || model::sql::isBlankInComment(c); };
+        const auto isMargin = [](char16_t c) {
+            return c == u'*' || model::sql::isBlankInComment(c);
+        };
         while (!line.empty() && isMargin(line.front())) line.remove_prefix(1);
         while (!line.empty() && isMargin(line.back())) line.remove_suffix(1);
         if (!text.empty()) text += u'\n';
@@ -91,7 +112,9 @@ private:
     void token() {
         const char16_t c = at();
         if (isBlank(c)) {
-            mOut.text += c == u'\n' ? '\n' : ' ';
+            // The parser joins texts on two lines; here the second one is a name.
+            const bool names = is(Dialect::SQLite) || is(Dialect::SqlServer);
+            mOut.text += c == u'\n' && !names ? '\n' : ' ';
             ++mAt;
             return;
         }
@@ -111,7 +134,10 @@ private:
             const String digits = delimited(u'\'', false);
             put(u"X'" + digits + u'\'', begin);
         } else if (c == u'\'' || (c == u'"' && is(Dialect::MySQL))) {
-            text(c, is(Dialect::MySQL));
+            if (namesText())
+                name(delimited(c, is(Dialect::MySQL)), begin);
+            else
+                text(c, is(Dialect::MySQL));
         } else if (c == u'"' || (c == u'`' && !is(Dialect::PostgreSQL))) {
             name(delimited(c, false), begin);
         } else if (c == u'[' && (is(Dialect::SqlServer) || is(Dialect::SQLite))) {
@@ -155,9 +181,7 @@ private:
     }
 
     /// Two signs are no comment in MySQL without a blank behind them.
-    bool areSigns() const {
-        return is(Dialect::MySQL) && mAt + 2 < mText.size() && at(2) > u' ';
-    }
+    bool areSigns() const { return is(Dialect::MySQL) && mAt + 2 < mText.size() && at(2) > u' '; }
 
     bool lineComment(std::size_t mark) {
         const std::size_t begin = mAt;
@@ -174,7 +198,8 @@ private:
         const std::size_t before = begin == 0 ? StringView::npos : mText.rfind(u'\n', begin - 1);
         const bool beside = mLast.second > (before == StringView::npos ? 0 : before + 1);
         const String text = withoutMargins(inner);
-        if (!text.empty() || (line && !beside)) mOut.comments.push_back({mOut.text.size(), beside, text});
+        if (!text.empty() || (line && !beside))
+            mOut.comments.push_back({mOut.text.size(), beside, text});
         mOut.text += ' ';
     }
 
@@ -183,8 +208,7 @@ private:
         const std::size_t begin = mAt++;
         String inner;
         while (true) {
-            if (mAt >= mText.size())
-                refuse<MessageCode::notClosed>(begin, StringView(&close, 1));
+            if (mAt >= mText.size()) refuse<MessageCode::notClosed>(begin, StringView(&close, 1));
             const char16_t c = mText[mAt++];
             if (c == close) {
                 if (at() != close) return inner;
@@ -222,6 +246,11 @@ private:
             if (c == u'\'') out += c;
         }
         put(out + u'\'', begin);
+    }
+
+    /// Whether a text stands where only a name can.
+    bool namesText() const {
+        return !is(Dialect::PostgreSQL) && model::sameName(lastToken(), u"as") && !inCast();
     }
 
     /// PostgreSQL's own, for its own parser.
@@ -280,8 +309,7 @@ private:
         const std::size_t digits = mAt;
         while (isDigit(at())) ++mAt;
         const StringView number = mText.substr(digits, mAt - digits);
-        ask(number.empty() ? platform::decimal(static_cast<std::int64_t>(
-                                 ++mQuestions))
+        ask(number.empty() ? platform::decimal(static_cast<std::int64_t>(++mQuestions))
                            : String(number),
             begin);
         return true;
@@ -318,6 +346,9 @@ private:
             mAt += sign;
             while (isDigit(at())) ++mAt;
         }
+        // The parser would take letters that follow at once for a name.
+        if (!wordAhead().empty())
+            refuse<MessageCode::notParsed>(begin, mText.substr(begin, mAt - begin));
         put(mText.substr(begin, mAt - begin), begin);
     }
 
@@ -341,9 +372,9 @@ private:
         const bool qualified = last == u"." || behindBlanks(mAt) == u'.';
         const bool called = behindBlanks(mAt) == u'(';
         const bool behindAs = model::sameName(last, u"as") && !inCast();
-        if (is(Dialect::PostgreSQL) || (!qualified && !behindAs && isSyntax(folded) &&
-                                        !isNameHere(folded, called))) {
-            mOut.saysTruth = mOut.saysTruth || folded == u"true" || folded == u"false";
+        if (is(Dialect::PostgreSQL) ||
+            (!qualified && !behindAs && isSyntax(folded) && !isNameHere(folded, called))) {
+            if (folded == u"true" || folded == u"false") ++mOut.truths;
             put(typed, begin);
             return;
         }
@@ -352,15 +383,7 @@ private:
 
     /// Whether the parser would take a word for its own that the dialect takes for a name.
     bool isNameHere(const String& folded, bool called) const {
-        constexpr std::array clauses = std::to_array<StringView>(
-            {u"asc", u"both", u"case", u"cast", u"collate", u"cross", u"current_date",
-             u"current_time", u"current_timestamp", u"desc", u"distinct", u"else", u"end",
-             u"except", u"false", u"fetch", u"for", u"from", u"full", u"group", u"having", u"ilike",
-             u"inner", u"intersect", u"join", u"lateral", u"leading", u"left", u"like", u"limit",
-             u"localtime", u"localtimestamp", u"natural", u"not", u"null", u"offset", u"on", u"only",
-             u"order", u"outer", u"right", u"select", u"similar", u"then", u"trailing", u"true",
-             u"union", u"using", u"when", u"where", u"window", u"with"});
-        return !called && std::find(clauses.begin(), clauses.end(), folded) == clauses.end() &&
+        return !called && !isClause(folded) &&
                model::sql::isReserved(folded, Dialect::PostgreSQL) &&
                !model::sql::isReserved(folded, mDialect);
     }
@@ -448,13 +471,22 @@ private:
             mParentheses.pop_back();
             --mDepth;
         }
-        // The parser would take two signs for a comment.
-        if (at() == u'-' && mOut.text.ends_with('-')) mOut.text += ' ';
+        partSigns();
         mCasts = false;
         const bool pair = at() >= 0xD800 && at() < 0xDC00;
         mAt += pair ? 2 : 1;
         mAt = std::min(mAt, mText.size());
         put(mText.substr(begin, mAt - begin), begin);
+    }
+
+    /// The parser would take two signs for a comment, and others together for one operator.
+    void partSigns() {
+        if (mOut.text.empty()) return;
+        const bool isSign = at() == u'-' || at() == u'+' || at() == u'~';
+        const bool joins =
+            StringView(u"+-*/%<>=!&|^~#@").find(static_cast<char16_t>(mOut.text.back())) !=
+            StringView::npos;
+        if (isSign && joins && !is(Dialect::PostgreSQL)) mOut.text += ' ';
     }
 
     const StringView mText;
@@ -463,13 +495,13 @@ private:
     std::pair<std::size_t, std::size_t> mLast; ///< the token before
     int mDepth = 0;
     std::int64_t mQuestions = 0;
-    bool mCasts = false;             ///< the word before was CAST
+    bool mCasts = false; ///< the word before was CAST
     struct Open {
         bool ofCast;
         std::size_t number; ///< among all
     };
-    std::vector<Open> mParentheses;  ///< those open
-    std::vector<int> mIntervals;     ///< depths of those open
+    std::vector<Open> mParentheses; ///< those open
+    std::vector<int> mIntervals;    ///< depths of those open
     ParserText mOut;
 };
 

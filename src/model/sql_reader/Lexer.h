@@ -30,7 +30,7 @@ struct ParserText {
 
     /// A CAST of a constant is one, and no date or moment written out.
     bool keepsCasts = false;
-    bool saysTruth = false; ///< TRUE or FALSE, other than behind AS or a point
+    int truths = 0; ///< how often TRUE or FALSE stands there, other than behind AS or a point
 
     /// What stood at a byte of it.
     struct Comment {

@@ -73,16 +73,27 @@ String ValueReader::comparison(const Tree& tree, StringView symbol, Pass& pass) 
 
 /// What is compared with another.
 String ValueReader::side(const Tree& tree, const Tree& other, Pass& pass) const {
+    noteConverted(tree, other, pass);
     // A date beside a moment is made one by itself.
     if (const auto moment = momentOf(mDialect).match(tree)) {
         const Tree& date = moment->at(1);
         if (!isConstant(date, "sval") && typeOf(date, pass) == ColumnType::Date &&
-            typeOf(other, pass) == ColumnType::Timestamp)
+            typeOf(other, pass) == ColumnType::Timestamp) {
+            pass.dates.push_back(model::criteria::readExpression(text(date, pass), pass).value);
             return text(date, pass);
+        }
     }
     if (const auto number = numberOfTruth(tree))
         if (typeOf(other, pass) == ColumnType::Boolean) return *number ? u"True" : u"False";
     return text(tree, pass);
+}
+
+/// SQLite makes a number of a text only where a table's column is compared with it.
+void ValueReader::noteConverted(const Tree& tree, const Tree& other, Pass& pass) const {
+    if (!isConstant(tree, "sval") || !other.is("ColumnRef")) return;
+    const auto column = columnMeant(other);
+    const auto* from = column ? mScope.tableNamed(column->table) : nullptr;
+    if (from && from->isStored) pass.others.push_back(tree.part("sval").text("sval"));
 }
 
 String ValueReader::arithmetic(const Tree& tree, StringView symbol, Pass& pass) const {

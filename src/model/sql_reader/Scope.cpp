@@ -82,9 +82,9 @@ const ScopedTable& Scope::source(const std::vector<String>& names, std::size_t p
     const auto mayStand = [&](const String& schema) {
         return !schema.empty() && isSame(schema, names.front());
     };
-    const bool known = names.size() == 1 ||
-                       (names.size() == 2 && table &&
-                        std::any_of(table->schemas.begin(), table->schemas.end(), mayStand));
+    const bool known =
+        names.size() == 1 || (names.size() == 2 && table &&
+                              std::any_of(table->schemas.begin(), table->schemas.end(), mayStand));
     if (table && known) return *table;
     String shown = names.front();
     for (std::size_t n = 1; n < names.size(); ++n) shown += u'.' + names[n];
@@ -94,6 +94,13 @@ const ScopedTable& Scope::source(const std::vector<String>& names, std::size_t p
 bool Scope::isHidden(const ColumnRef& column) const {
     return std::any_of(mShared.begin(), mShared.end(),
                        [&](const Shared& shared) { return shared.other == column; });
+}
+
+/// What comes out for a column that may be shared.
+ColumnRef Scope::kept(ColumnRef column) const {
+    for (const Shared& shared : mShared)
+        if (shared.other == column) return kept(shared.kept);
+    return column;
 }
 
 std::optional<ColumnRef> Scope::find(StringView name, std::size_t place) const {
@@ -130,16 +137,14 @@ ColumnRef Scope::column(StringView table, StringView name, std::size_t place) co
 std::optional<std::vector<ColumnRef>> Scope::everything() const {
     if (mShared.empty()) return {};
     std::vector<ColumnRef> all;
+    const auto add = [&](const ColumnRef& column) {
+        if (std::find(all.begin(), all.end(), column) == all.end()) all.push_back(column);
+    };
     // SQLite leaves them where they stand in their tables.
-    for (const Shared& shared : mShared)
-        if (mDialect != Dialect::SQLite && !isHidden(shared.kept) && std::find(all.begin(), all.end(), shared.kept) == all.end())
-            all.push_back(shared.kept);
+    if (mDialect != Dialect::SQLite)
+        for (const Shared& shared : mShared) add(kept(shared.kept));
     for (const ScopedTable& table : mTables)
-        for (const auto& column : table.columns) {
-            const ColumnRef ref = refTo(table, column);
-            if (!isHidden(ref) && std::find(all.begin(), all.end(), ref) == all.end())
-                all.push_back(ref);
-        }
+        for (const auto& column : table.columns) add(kept(refTo(table, column)));
     return all;
 }
 

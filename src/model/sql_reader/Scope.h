@@ -16,6 +16,7 @@ struct ScopedTable {
     String alias;                                  ///< what columns call it
     std::vector<model::ColumnDescription> columns; ///< in their order
     std::vector<String> schemas{};                 ///< what may stand before it
+    bool isStored = false;                         ///< no query within the statement
 };
 
 /// The names that a place of a statement may use: those of the tables in its FROM.
@@ -56,6 +57,7 @@ private:
         ColumnRef other;
     };
     bool isHidden(const ColumnRef& column) const;
+    ColumnRef kept(ColumnRef column) const;
     bool isSame(StringView left, StringView right) const;
     const model::ColumnDescription* columnOf(const ScopedTable& table, StringView name) const;
 

@@ -115,7 +115,7 @@ StatementReader::Source StatementReader::table(const Tree& tree, Scope& scope, S
         refuse<MessageCode::unknownTable>(tree.place(), name);
     }
     const String called = alias.empty() ? found->name : alias;
-    scope.add({called, found->columns, {schema, found->schema}}, tree.place());
+    scope.add({called, found->columns, {schema, found->schema}, true}, tree.place());
     into.tables.emplace(called, *found);
     into.commented.emplace(tree.place(), called);
     return made(sql::TableRef{found->schema, found->name, called});
@@ -126,7 +126,7 @@ StatementReader::Named StatementReader::named(const Tree& select, String name) {
     if (++mDepth > deepest) refuse<MessageCode::tooDeep>(select.place());
     Selected inner = this->select(select);
     --mDepth;
-    const auto query = drawn(inner);
+    const auto query = drawn(inner, mIsWritten);
     const model::SavedQuery saved{{}, query->record()};
     if (depthOf(saved.record) >= deepest) refuse<MessageCode::tooDeep>(select.place());
     std::vector<model::ColumnDescription> columns = sql::outputColumns(*query);

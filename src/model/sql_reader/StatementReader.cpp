@@ -186,17 +186,26 @@ void StatementReader::items(const Tree& tree, const ValueReader& values, Selecte
     for (const Tree& target : tree.list("targetList")) item(target, values, into);
 }
 
+/// SQLite takes the word for the column wherever else it stands; a nameless one comes out under its
+/// own word.
+void StatementReader::checkTruthAsName(const Tree& target) const {
+    const bool nameless = !target.has("name") && isConstant(target.node("val"), "boolval");
+    if (mDialect != Dialect::SQLite || mText.truths <= (nameless && mDepth == 0 ? 1 : 0)) return;
+    const bool truth =
+        target.node("val").has("boolval") && target.node("val").part("boolval").flag("boolval");
+    const String name =
+        nameless ? (truth ? u"true" : u"false") : model::foldedName(target.text("name"));
+    if (name == u"true" || name == u"false")
+        refuse<MessageCode::noPlaceFor>(target.place(),
+                                        model::say<MessageCode::thisPart>(u"AS " + name));
+}
+
 void StatementReader::item(const Tree& target, const ValueReader& values, Selected& into) {
     target.only({"name", "val"});
     const Tree value = target.node("val");
     auto& items = into.statement.items;
     into.commented.emplace(target.place(), items.size());
-    const String name = model::foldedName(target.text("name"));
-    // SQLite then takes the word for the column wherever it stands.
-    const bool taken = mDialect == Dialect::SQLite && mText.saysTruth;
-    if (taken && (name == u"true" || name == u"false"))
-        refuse<MessageCode::noPlaceFor>(target.place(),
-                                        model::say<MessageCode::thisPart>(u"AS " + name));
+    checkTruthAsName(target);
     if (value.is("FuncCall") && value.names("funcname").back() == topFunction) {
         limit(value.list("args").front(), into);
         return;

@@ -5,14 +5,20 @@
 #include "model/sql_reader/Tree.h"
 #include "model/sql_reader/ValueReader.h"
 
+#include <functional>
+
 namespace zandor::sql_reader {
 
 /// Reads the parser's tree into a statement whose names are looked up. Throws Refused.
 class StatementReader {
 public:
-    /// What is given must outlive it.
-    StatementReader(const Schema& schema, const ParserText& text, Dialect dialect)
-        : mSchema(schema), mText(text), mDialect(dialect) {}
+    using IsWritten = std::function<bool(model::Query&)>;
+
+    /// What is given must outlive it. A query within the statement that `isWritten` there as it
+    /// comes out again is drawn as one that is whole.
+    StatementReader(const Schema& schema, const ParserText& text, Dialect dialect,
+                    const IsWritten& isWritten)
+        : mSchema(schema), mText(text), mDialect(dialect), mIsWritten(isWritten) {}
 
     /// Of a SelectStmt.
     Selected select(const Tree& tree);
@@ -53,6 +59,7 @@ private:
     std::optional<Tree> differsAround(const Tree& tree) const;
     Node behindGroups(std::vector<Node> terms, const model::sql::Statement& statement) const;
     void items(const Tree& tree, const ValueReader& values, Selected& into);
+    void checkTruthAsName(const Tree& target) const;
     void item(const Tree& target, const ValueReader& values, Selected& into);
     void limits(const Tree& tree, Selected& into);
     void limit(const Tree& count, Selected& into) const;
@@ -64,6 +71,7 @@ private:
     const Schema& mSchema;
     const ParserText& mText;
     const Dialect mDialect;
+    const IsWritten& mIsWritten;
     std::vector<Named> mNamed;
     int mDepth = 0;
 };

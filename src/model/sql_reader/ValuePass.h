@@ -57,6 +57,10 @@ public:
     int depth = 0;
     /// Texts of the statement, as they stand.
     std::vector<String> texts;
+    /// Numbers and truths, and texts that become such.
+    std::vector<String> others;
+    /// What the statement makes a moment of.
+    std::vector<Node> dates;
 
 private:
     /// The table whose columns stand for totals.

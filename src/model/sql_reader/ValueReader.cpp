@@ -3,10 +3,12 @@
 #include "model/criteria/Parser.h"
 #include "model/criteria/Tokens.h"
 #include "model/criteria/Writer.h"
+#include "model/sql/Simplify.h"
 #include "model/sql_reader/Conditions.h"
 #include "model/sql_reader/Forms.h"
 #include "model/sql_reader/Precedence.h"
 #include "model/sql_reader/Refused.h"
+#include "model/sql_reader/Terms.h"
 #include "model/sql_reader/TreeChecks.h"
 #include "model/sql_reader/ValuePass.h"
 
@@ -61,8 +63,10 @@ std::vector<Node> ValueReader::conditions(const Tree& tree) const {
     Node node = columnsCompared(tree);
     if (!node) node = condition(tree);
     mPlaces.emplace(node, tree.place());
-    if (!holdsAlways(node)) all.push_back(std::move(node));
-    return all;
+    // One that joins others may come apart.
+    auto terms = termsOf(model::sql::simplified(node));
+    if (std::erase_if(terms, holdsAlways) == 0) return {std::move(node)};
+    return terms;
 }
 
 /// Each part with its place, for what is said of it.
@@ -114,7 +118,10 @@ Node ValueReader::read(const Tree& tree, Pass& pass) const {
     if (reading.error)
         refuse<MessageCode::notUnderstood>(blame(tree, pass), std::move(reading.error->message));
     if (!asksForTruth(reading.value)) refuse<MessageCode::criterionNotDrawn>(tree.place());
-    if (mDialect == Dialect::SQLite) checkMoments(reading.value, pass.texts, tree.place());
+    if (mDialect == Dialect::SQLite) {
+        checkMoments(reading.value, pass.texts, pass.dates, tree.place());
+        checkTexts(reading.value, pass.texts, pass.others, tree.place());
+    }
     return pass.filled(reading.value);
 }
 
@@ -186,8 +193,12 @@ String ValueReader::text(const Tree& tree, Pass& pass) const {
 String ValueReader::newText(const Tree& tree, Pass& pass) const {
     if (mDialect == Dialect::SQLite) checkPrecedence(tree, mText);
     if (tree.is("A_Const")) {
-        if (tree.has("sval")) pass.texts.push_back(tree.part("sval").text("sval"));
-        return constant(tree);
+        String written = constant(tree);
+        if (tree.has("sval"))
+            pass.texts.push_back(tree.part("sval").text("sval"));
+        else
+            pass.others.push_back(written);
+        return written;
     }
     if (tree.is("ColumnRef")) return column(tree, pass);
     if (tree.is("ParamRef")) return parameter(tree);
@@ -234,7 +245,8 @@ String ValueReader::constant(const Tree& tree) const {
     return quoted(tree.part("sval").text("sval"));
 }
 
-String ValueReader::column(const Tree& tree, Pass& pass) const {
+/// Nothing where what comes out under that name is meant.
+std::optional<ColumnRef> ValueReader::columnMeant(const Tree& tree) const {
     std::vector<String> names;
     for (const Tree& field : tree.list("fields")) {
         if (!field.is("String")) refuse<MessageCode::notUnderstood>(tree.place(), u"*");
@@ -243,11 +255,16 @@ String ValueReader::column(const Tree& tree, Pass& pass) const {
     String table;
     if (names.size() > 1)
         table = mScope.source({names.begin(), names.end() - 1}, tree.place()).alias;
-    const auto alias = mAliases.find(model::foldedName(names.back()));
-    if (names.size() == 1 && alias != mAliases.end() && !mScope.find(names.back(), tree.place()))
-        return text(alias->second, pass);
-    const ColumnRef found = mScope.column(table, names.back(), tree.place());
-    return inBrackets(found.table) + u'.' + inBrackets(found.column);
+    else if (mAliases.contains(model::foldedName(names.back())) &&
+             !mScope.find(names.back(), tree.place()))
+        return {};
+    return mScope.column(table, names.back(), tree.place());
+}
+
+String ValueReader::column(const Tree& tree, Pass& pass) const {
+    if (const auto found = columnMeant(tree))
+        return inBrackets(found->table) + u'.' + inBrackets(found->column);
+    return text(mAliases.at(model::foldedName(tree.list("fields").back().text("sval"))), pass);
 }
 
 String ValueReader::parameter(const Tree& tree) const {
@@ -369,7 +386,7 @@ bool ValueReader::takesTruth(const Form& form, const std::map<int, Tree>& argume
                              Pass& pass) const {
     using model::sql::Function;
     const bool worded = mDialect == Dialect::PostgreSQL && form.function == Function::text;
-    if (!form.function || worded) return false;
+    if (!form.function || form.function == Function::coalesce || worded) return false;
     return std::any_of(arguments.begin(), arguments.end(), [&](const auto& argument) {
         return typeOf(argument.second, pass) == ColumnType::Boolean;
     });

@@ -42,6 +42,7 @@ private:
     String text(const Tree& tree, Pass& pass) const;
     String newText(const Tree& tree, Pass& pass) const;
     String constant(const Tree& tree) const;
+    std::optional<ColumnRef> columnMeant(const Tree& tree) const;
     String column(const Tree& tree, Pass& pass) const;
     String parameter(const Tree& tree) const;
     std::optional<String> momentWritten(const Tree& tree, Pass& pass) const;
@@ -49,6 +50,7 @@ private:
     String operation(const Tree& tree, Pass& pass) const;
     String comparison(const Tree& tree, StringView symbol, Pass& pass) const;
     String side(const Tree& tree, const Tree& other, Pass& pass) const;
+    void noteConverted(const Tree& tree, const Tree& other, Pass& pass) const;
     String arithmetic(const Tree& tree, StringView symbol, Pass& pass) const;
     String division(const Tree& tree, Pass& pass) const;
     String like(const Tree& tree, Pass& pass) const;

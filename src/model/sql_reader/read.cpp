@@ -50,6 +50,19 @@ StringView trimmed(StringView text) {
     return text.substr(begin, text.find_last_not_of(around) + 1 - begin);
 }
 
+/// With one blank for each place of them.
+String withSingleBlanks(StringView text) {
+    String out;
+    for (const char16_t c : text) {
+        const bool blank = c == u' ' || c == u'\n' || c == u'\t' || c == u'\r';
+        if (!blank)
+            out += c;
+        else if (!out.empty() && out.back() != u' ')
+            out += u' ';
+    }
+    return out;
+}
+
 Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect dialect,
                              const Schema& schema) {
     if (text.comments.size() > model::mostComments)
@@ -63,12 +76,16 @@ Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect d
         refuse<MessageCode::oneStatement>(
             static_cast<std::size_t>(parsed["stmts"][1].value("stmt_location", 0)));
     const Tree statement = Tree(parsed["stmts"][0]["stmt"]);
-    const auto isWhole = [&](model::Query& query) {
-        using model::sql::ValueForm;
-        return model::sql::statementText(query, dialect, ValueForm::literal).text == trimmed(typed);
+    const auto written = [&](model::Query& query) {
+        return model::sql::statementText(query, dialect, model::sql::ValueForm::literal).text;
+    };
+    const auto isWhole = [&](model::Query& query) { return written(query) == trimmed(typed); };
+    const String inOneLine = withSingleBlanks(typed);
+    const StatementReader::IsWritten isPart = [&](model::Query& query) {
+        return inOneLine.find(withSingleBlanks(written(query))) != String::npos;
     };
     const auto readAs = [&](const ParserText& meant) {
-        return drawn(StatementReader(schema, meant, dialect).select(statement), isWhole);
+        return drawn(StatementReader(schema, meant, dialect, isPart).select(statement), isWhole);
     };
     auto query = readAs(text);
     if (text.text.find("CAST('") == std::string::npos || isWhole(*query)) return query;

@@ -18,7 +18,7 @@ protected:
 
     /// "column x1 beside: its text", as the record has it.
     std::vector<std::string> comments() const {
-        static constexpr std::array places = {"start", "table",  "column", "criterion",
+        static constexpr std::array places = {"start",  "table", "column", "criterion",
                                               "groups", "order", "end"};
         std::vector<std::string> all;
         for (const auto& comment : record.options.comments) {
@@ -133,7 +133,8 @@ TEST_F(Comments, OfBlocksBecomeLines) {
 }
 
 TEST_F(Comments, AreWrittenTheSameWhateverWasInThem) {
-    for (const String& inner : {u"\x7F  * a\u2028 * b"s, u"\x01-- c"s, u"**\x02"s, u" \u0085 d \t"s}) {
+    for (const String& inner :
+         {u"\x7F  * a\u2028 * b"s, u"\x01-- c"s, u"**\x02"s, u" \u0085 d \t"s}) {
         read(u"SELECT name -- " + inner + u"\n FROM customers /*" + inner + u"*/");
         const std::string once = text();
         read(platform::fromUtf8(std::string_view(once)));
@@ -162,7 +163,8 @@ TEST_F(Comments, OfConditionsThatAreWrittenInFewerWordsAreKept) {
     read(u"SELECT name FROM customers WHERE id = 1 -- one\n OR id = 2 -- two\n");
     EXPECT_EQ(text(), "SELECT\n    customers.name\nFROM customers\n"
                       "WHERE customers.id IN (1, 2) -- one two");
-    read(u"SELECT name FROM customers WHERE city = 'a' -- one\n AND (id = 1 OR name = 'b') -- two\n");
+    read(u"SELECT name FROM customers WHERE city = 'a' -- one\n AND (id = 1 OR name = 'b') -- "
+         u"two\n");
     EXPECT_EQ(text(), "SELECT\n    customers.name\nFROM customers\n"
                       "WHERE (customers.city = 'a' AND customers.id = 1) -- one\n"
                       "    OR (customers.name = 'b' AND customers.city = 'a') -- two");
@@ -205,9 +207,11 @@ TEST_F(Comments, EndWithTheirLineWhateverIsInThem) {
 
 TEST_F(Comments, ThatAnEngineRunsAreRefused) {
     EXPECT_EQ(refusal(u"SELECT name /*! , city */ FROM customers", Dialect::MySQL),
-              "Line 1, column 13: a drawing has no place for a comment that is run; it can be run as it is.");
+              "Line 1, column 13: a drawing has no place for a comment that is run; it can be run "
+              "as it is.");
     EXPECT_EQ(refusal(u"SELECT name /*M!100100 , city */ FROM customers", Dialect::MySQL),
-              "Line 1, column 13: a drawing has no place for a comment that is run; it can be run as it is.");
+              "Line 1, column 13: a drawing has no place for a comment that is run; it can be run "
+              "as it is.");
     read(u"SELECT name /*! , city */ FROM customers");
     EXPECT_EQ(columns().size(), 1u);
 }

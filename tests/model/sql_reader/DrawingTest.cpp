@@ -3,7 +3,8 @@
 using Statement = Reading;
 
 TEST_F(Statement, BecomesTablesUnderItsOwnNamesAndColumnsInItsOrder) {
-    read(u"SELECT c.name, o.total AS sum FROM customers AS c JOIN orders o ON o.customer_id = c.id");
+    read(
+        u"SELECT c.name, o.total AS sum FROM customers AS c JOIN orders o ON o.customer_id = c.id");
     ASSERT_EQ(record.tables.size(), 2u);
     EXPECT_EQ(record.tables[0].name, u"c");
     EXPECT_EQ(record.tables[0].sourceName, u"customers");
@@ -25,8 +26,8 @@ TEST_F(Statement, PutsWhatSpeaksOfOneColumnIntoItsCell) {
 
 TEST_F(Statement, HasARowForEachWayInWhichItsConditionsHold) {
     read(u"SELECT name FROM customers WHERE active AND (city = 'Wien' OR id < 5)");
-    EXPECT_EQ(columns(),
-              (Texts{"customers.name", "(customers.active)", "(customers.city)", "(customers.id)"}));
+    EXPECT_EQ(columns(), (Texts{"customers.name", "(customers.active)", "(customers.city)",
+                                "(customers.id)"}));
     EXPECT_EQ(criteria(2), (Texts{"4: True", "5: True"}));
     EXPECT_EQ(criteria(3), (Texts{"4: Wien"}));
     EXPECT_EQ(criteria(4), (Texts{"5: < 5"}));
@@ -35,8 +36,8 @@ TEST_F(Statement, HasARowForEachWayInWhichItsConditionsHold) {
 TEST_F(Statement, PutsWhatNeedsMoreThanTwelveRowsIntoOneCell) {
     std::u16string where;
     for (int n = 0; n < 13; ++n)
-        where += (n ? u" OR " : u"") + std::u16string(u"(id = ") +
-                 zandor::platform::decimal(n) + u" AND city = 'x')";
+        where += (n ? u" OR " : u"") + std::u16string(u"(id = ") + zandor::platform::decimal(n) +
+                 u" AND city = 'x')";
     read(u"SELECT name FROM customers WHERE " + where);
     ASSERT_EQ(columns(), (Texts{"customers.name", "(customers.id)"}));
     EXPECT_EQ(criteria(2).size(), 1u);
@@ -124,9 +125,8 @@ TEST_F(Statement, NamesSharedColumnsAsItsEngineDoes) {
 
 TEST_F(Statement, ReadsNumbersBelowZero) {
     read(u"SELECT id * -5, id - - 3, -(7) + id FROM customers WHERE id > -12 AND id < - -4");
-    EXPECT_EQ(columns(),
-              (Texts{"customers.id * -5", "customers.id - -3", "-7 + customers.id",
-                     "(customers.id)"}));
+    EXPECT_EQ(columns(), (Texts{"customers.id * -5", "customers.id - -3", "-7 + customers.id",
+                                "(customers.id)"}));
     EXPECT_EQ(criteria(4), (Texts{"4: > -12 And < 4"}));
 }
 
@@ -221,8 +221,9 @@ TEST_F(Statement, JoinsWhatStandsBeforeACommaAsItsDialectDoes) {
     EXPECT_EQ(record.joins.size(), 2U);
     EXPECT_NE(refusal(own, Dialect::PostgreSQL), "drawn");
     // The rows of another kind of join are others.
-    const std::u16string right = u"SELECT o.id FROM customers c, \"Order Lines\" l RIGHT JOIN orders "
-                                 u"o ON o.id = l.order_id";
+    const std::u16string right =
+        u"SELECT o.id FROM customers c, \"Order Lines\" l RIGHT JOIN orders "
+        u"o ON o.id = l.order_id";
     EXPECT_NE(refusal(right), "drawn");
     EXPECT_EQ(refusal(right, Dialect::PostgreSQL), "drawn");
     EXPECT_EQ(refusal(u"SELECT o.id FROM customers c, (\"Order Lines\" l RIGHT JOIN orders o ON "
@@ -258,8 +259,9 @@ TEST_F(Statement, ThatADrawingHasWrittenComesBackWithItsCastsAndItsConditionsOnR
 
 TEST_F(Statement, TakesANumberForTruthWhereThatIsAsked) {
     // Where a column is called True, the word would mean it.
-    const std::u16string written = u"SELECT\n    1 AS True,\n    NOT (1) AS no,\n    CASE WHEN 0 THEN "
-                                   u"customers.id END AS none\nFROM customers";
+    const std::u16string written =
+        u"SELECT\n    1 AS True,\n    NOT (1) AS no,\n    CASE WHEN 0 THEN "
+        u"customers.id END AS none\nFROM customers";
     read(written);
     EXPECT_EQ(text(), zandor::platform::toUtf8(written));
     EXPECT_NE(refusal(u"SELECT NOT 2 AS x FROM customers"), "drawn");
@@ -267,8 +269,9 @@ TEST_F(Statement, TakesANumberForTruthWhereThatIsAsked) {
 }
 
 TEST_F(Statement, AsksForASmallestThatComesOutAndElseForTheGroupInMySql) {
-    const std::u16string begin = u"SELECT orders.customer_id, MIN(orders.customer_id) AS least FROM "
-                                 u"orders GROUP BY orders.customer_id HAVING ";
+    const std::u16string begin =
+        u"SELECT orders.customer_id, MIN(orders.customer_id) AS least FROM "
+        u"orders GROUP BY orders.customer_id HAVING ";
     read(begin + u"MIN(orders.customer_id) > 3", Dialect::MySQL);
     EXPECT_EQ(criteria(1), Texts{});
     EXPECT_EQ(criteria(2), Texts{"4: > 3"});
@@ -278,4 +281,56 @@ TEST_F(Statement, AsksForASmallestThatComesOutAndElseForTheGroupInMySql) {
     ASSERT_EQ(record.definitions.size(), 2U);
     EXPECT_EQ(criteria(1), Texts{"4: > 3"});
     EXPECT_EQ(criteria(2), Texts{"5: > 2"});
+}
+
+TEST_F(Statement, AsksForNoTruthThatHoldsAlways) {
+    for (const std::u16string condition :
+         {u"TRUE", u"TRUE AND TRUE", u"TRUE OR TRUE", u"TRUE OR TRUE AND TRUE AND TRUE",
+          u"TRUE = TRUE OR TRUE"}) {
+        read(u"SELECT name FROM customers WHERE " + condition, Dialect::PostgreSQL);
+        EXPECT_EQ(text(Dialect::PostgreSQL), "SELECT\n    customers.name\nFROM customers")
+            << zandor::platform::toUtf8(condition);
+    }
+    read(u"SELECT name FROM customers WHERE NOT (active OR 0 <> FALSE)");
+    EXPECT_EQ(text(), "SELECT\n    customers.name\nFROM customers\nWHERE customers.active <> TRUE");
+}
+
+TEST_F(Statement, TakesATextBehindAsForANameWhereTheDatabaseDoes) {
+    for (const Dialect dialect : {Dialect::SQLite, Dialect::MySQL, Dialect::SqlServer}) {
+        read(u"SELECT name AS 'the name' FROM customers", dialect);
+        EXPECT_EQ(columns(), Texts{"customers.name as the name"});
+    }
+    EXPECT_NE(refusal(u"SELECT name AS 'n' FROM customers", Dialect::PostgreSQL), "drawn");
+    read(u"SELECT id FROM orders WHERE placed > CAST('2023-01-01 00:00:00' AS datetime)",
+         Dialect::MySQL);
+    EXPECT_EQ(criteria(2), Texts{"4: > 2023-01-01 00:00:00"});
+}
+
+TEST_F(Statement, TellsAnOperatorFromTheSignBehindIt) {
+    for (const Dialect dialect : {Dialect::SQLite, Dialect::MySQL, Dialect::SqlServer}) {
+        read(u"SELECT name FROM customers WHERE id!=-1 AND id*-2<-3 AND id>=+4 AND id<>- -5",
+             dialect);
+        EXPECT_EQ(criteria(2), Texts{"4: <> -1 And >= 4 And <> 5"});
+        EXPECT_EQ(criteria(3), Texts{"4: < -3"});
+    }
+    EXPECT_NE(refusal(u"SELECT name FROM customers WHERE id!=-1", Dialect::PostgreSQL), "drawn")
+        << "one operator of its own there";
+}
+
+TEST_F(Statement, BringsWhatARightJoinSharesFromTheRightWhereTheLeftOneStands) {
+    read(u"SELECT * FROM customers c RIGHT JOIN orders o USING (id)");
+    EXPECT_EQ(columns(), (Texts{"o.id", "c.name", "c.city", "c.active", "c.since", "o.customer_id",
+                                "o.placed", "o.total"}));
+    read(u"SELECT * FROM customers c JOIN orders o USING (id) RIGHT JOIN orders p USING (id)",
+         Dialect::MySQL);
+    EXPECT_EQ(columns().front(), "p.id");
+    EXPECT_EQ(columns().size(), 11U);
+}
+
+TEST_F(Statement, KeepsTheOrderOfConditionsWithinAQueryThatItReadsFrom) {
+    const std::u16string inner = u"\n        SELECT\n            c.id,\n            c.name\n        FROM "
+                                 u"customers AS c\n        WHERE c.city = 'Wien'\n            OR "
+                                 u"(c.id > 5 AND c.name > c.city AND c.id < 9)\n    ";
+    const std::u16string from = u"SELECT\n    s.name\nFROM (" + inner + u") AS s";
+    EXPECT_EQ(refusal(from), "drawn");
 }

@@ -99,7 +99,7 @@ TEST_F(Refusals, TakeNoCastForADateInSqliteWhichMakesANumberOfIt) {
 TEST_F(Refusals, HaveNoTextForWhatIsTrueOrFalseWhereItIsANumber) {
     for (const char16_t* text :
          {u"length(active)", u"length(city = 'Wien' AND 1 > 1)", u"CAST(active AS TEXT)",
-          u"upper(NOT active)", u"replace(name, active, 'x')"})
+          u"upper(NOT active)", u"substring(TRUE, 2)", u"replace(name, active, 'x')"})
         EXPECT_NE(refusal(u"SELECT id FROM customers WHERE " + std::u16string(text) + u" <> 'x'"),
                   "drawn")
             << zandor::platform::toUtf8(text);
@@ -161,4 +161,67 @@ TEST_F(Refusals, NameASchemaThatTheTableIsNotOf) {
         << refusal(u"SELECT other.customers.name FROM customers");
     EXPECT_EQ(refusal(u"SELECT main.customers.name, main.customers.* FROM main.customers"),
               "drawn");
+}
+
+TEST_F(Refusals, TakeNoLettersBehindANumberForAName) {
+    for (const char16_t* item : {u"0x2", u"1e", u"123abc", u"1_000", u"2.5x"})
+        EXPECT_EQ(refusal(u"SELECT id, " + std::u16string(item) + u" FROM orders").substr(0, 49),
+                  "Line 1, column 12: this cannot be read as SQL (" +
+                      zandor::platform::toUtf8(item).substr(0, 2))
+            << zandor::platform::toUtf8(item);
+    EXPECT_EQ(refusal(u"SELECT id, 1e3 x, 2 y FROM orders"), "drawn");
+}
+
+TEST_F(Refusals, JoinNoTextsOnTwoLinesWhereTheSecondIsAName) {
+    const std::u16string two = u"SELECT id, 'a'\n'b' FROM orders";
+    for (const Dialect dialect : {Dialect::SQLite, Dialect::SqlServer})
+        EXPECT_NE(refusal(two, dialect), "drawn");
+    for (const Dialect dialect : {Dialect::PostgreSQL, Dialect::Standard})
+        EXPECT_EQ(refusal(two, dialect), "drawn");
+}
+
+TEST_F(Refusals, MakeNoNumberOfATextInSqliteWhereItStandsBesideNoColumnOfATable) {
+    for (const char16_t* condition :
+         {u"id + 1 = '2'", u"'1' = 1", u"'1' IN (1)", u"1 IN ('1')", u"'1' BETWEEN 1 AND 2",
+          u"abs(id) < '1'", u"'1' = TRUE", u"+id = '1'", u"CASE id + 1 WHEN '2' THEN 1 END = 1",
+          u"coalesce('1', 1) > 0", u"coalesce('01', id, 1) = id", u"iif(active, '1', 1) = id",
+          u"abs('1') = id", u"coalesce('true', active)"}) {
+        const std::u16string text =
+            u"SELECT name FROM customers WHERE " + std::u16string(condition);
+        EXPECT_NE(refusal(text).find("write it without quotes"), std::string::npos)
+            << zandor::platform::toUtf8(condition) << ": " << refusal(text);
+    }
+    EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE id + 1 = '2'", Dialect::MySQL), "drawn");
+    EXPECT_NE(refusal(u"SELECT s.n FROM (SELECT count(*) AS n FROM orders) s WHERE s.n = '5'"),
+              "drawn");
+    EXPECT_NE(refusal(u"SELECT city FROM customers GROUP BY city HAVING count(*) = '1'"), "drawn");
+    EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE name = '1' OR id = 1"), "drawn");
+    read(u"SELECT id AS n FROM customers WHERE '1' = id AND customers.id IN ('1', '2')");
+    EXPECT_EQ(criteria(1), Texts{"4: 1 And In (1, 2)"});
+}
+
+TEST_F(Refusals, MakeNoMomentOfADateInSqliteWhereTheStatementDoesNot) {
+    for (const char16_t* item :
+         {u"CASE WHEN active THEN since ELSE placed END", u"coalesce(since, placed)",
+          u"CASE WHEN placed BETWEEN since AND since THEN 1 END"}) {
+        const std::u16string text =
+            u"SELECT " + std::u16string(item) + u" AS x FROM customers, orders";
+        EXPECT_EQ(refusal(text),
+                  "Line 1, column 8: a drawing takes a date for a moment beside one, "
+                  "which the database does not; the statement can be run as it is.");
+        EXPECT_EQ(refusal(text, Dialect::PostgreSQL), "drawn");
+    }
+    EXPECT_EQ(refusal(u"SELECT CASE WHEN placed > datetime(since) THEN 1 END AS x FROM customers, "
+                      u"orders"),
+              "drawn");
+}
+
+TEST_F(Refusals, LeaveNoColumnUnderTheNameOfTruthBesideAnother) {
+    EXPECT_EQ(
+        refusal(u"SELECT true FROM customers WHERE coalesce(true, active)"),
+        "Line 1, column 8: a drawing has no place for this (AS true); it can be run as it is.");
+    EXPECT_NE(refusal(u"SELECT c.id FROM customers c JOIN (SELECT TRUE, id FROM orders) s ON s.id = "
+                      u"c.id"),
+              "drawn");
+    EXPECT_EQ(refusal(u"SELECT true AS yes FROM customers WHERE coalesce(true, active)"), "drawn");
 }
