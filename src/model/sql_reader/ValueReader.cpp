@@ -95,7 +95,8 @@ Node ValueReader::columnsCompared(const Tree& tree) const {
         if (!of.is("ColumnRef")) return {};
         const auto reading = [&]() -> Node {
             Pass pass(mScope);
-            return model::criteria::readExpression(text(of, pass), pass).value;
+            const Node value = model::criteria::readExpression(text(of, pass), pass).value;
+            return value ? pass.filled(value) : value;
         }();
         const bool plain = reading && std::holds_alternative<ColumnRef>(reading->node);
         return plain ? reading : nullptr;

@@ -145,10 +145,12 @@ private:
         return true;
     }
 
+    /// Joins stand before all that is asked in cells, so that only what begins the conditions can
+    /// come back as one.
     bool joinsItself(const Node& term) {
         const auto columns = columnsOf(term);
-        if (mJoins == JoinsOfRows::islands || !columns ||
-            columns->first.table != columns->second.table)
+        if (mJoins == JoinsOfRows::islands || !mRest.empty() || !columns ||
+            columns->first.table != columns->second.table || !mWhole.contains(columns->first.table))
             return false;
         add(columns->first, columns->second, 0, std::get<sql::Compare>(term->node).comparison);
         return true;

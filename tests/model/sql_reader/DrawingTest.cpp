@@ -334,3 +334,16 @@ TEST_F(Statement, KeepsTheOrderOfConditionsWithinAQueryThatItReadsFrom) {
     const std::u16string from = u"SELECT\n    s.name\nFROM (" + inner + u") AS s";
     EXPECT_EQ(refusal(from), "drawn");
 }
+
+TEST_F(Statement, JoinsATableWithItselfOnlyByWhatBeginsItsConditions) {
+    for (const std::u16string& where :
+         {u"FROM orders AS o\n    CROSS JOIN customers AS c\nWHERE c.city = c.id\n    AND "
+          u"o.customer_id <> 10.5\n    AND c.active = c.active\nORDER BY c.active DESC"s,
+          u"FROM customers AS p\n    LEFT JOIN customers AS c ON p.name = c.active\n    CROSS JOIN "
+          u"customers AS x\nWHERE x.active = x.name\n    AND c.active = c.active\n    AND 'a' NOT "
+          u"IN ('b', 'c')"s}) {
+        const std::u16string written = u"SELECT\n    c.since\n" + where;
+        read(written);
+        EXPECT_EQ(text(), zandor::platform::toUtf8(written));
+    }
+}

@@ -225,3 +225,14 @@ TEST_F(Refusals, LeaveNoColumnUnderTheNameOfTruthBesideAnother) {
               "drawn");
     EXPECT_EQ(refusal(u"SELECT true AS yes FROM customers WHERE coalesce(true, active)"), "drawn");
 }
+
+TEST_F(Refusals, CompareNoTotalUnderItsNameWithWhatIsInNoGroup) {
+    for (const char16_t* total : {u"count(*)", u"sum(id)", u"max(active)", u"min(name)"})
+        for (const char16_t* condition : {u"n = id", u"id = n", u"n < id", u"id >= n"}) {
+            const std::u16string text = u"SELECT city, " + std::u16string(total) +
+                                        u" AS n FROM customers GROUP BY city HAVING " + condition;
+            EXPECT_NE(refusal(text), "drawn") << zandor::platform::toUtf8(text);
+        }
+    EXPECT_EQ(refusal(u"SELECT id, count(*) AS n FROM customers GROUP BY id HAVING n = id"),
+              "drawn");
+}
