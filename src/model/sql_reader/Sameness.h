@@ -19,7 +19,7 @@ using platform::String;
 /// What they differ in, in words; nothing where they say the same. The first asks of the rows what
 /// can be asked of them; the columns of what comes out may have other names where it gives them
 /// none.
-std::optional<model::Message> difference(const Statement& read, const Statement& drawn);
+std::optional<model::Message> difference(const Statement& read, const Statement& written);
 
 /// Asks of the rows what is asked behind GROUP BY of nothing but what they are put together by.
 void askBefore(Statement& statement);
