@@ -169,9 +169,12 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     // What a dialect cannot say was not said in it; but it may be too long, or too deep.
     if (!written.runnable()) return 0;
     const auto again = sql_reader::read(written.text, dialect, known);
-    if (!again)
-        must(false, "what is written is read: " + platform::toUtf8(again.error()) + "\n" +
-                        platform::toUtf8(written.text));
+    if (!again) {
+        must(written.text.size() > sql_reader::longestText,
+             "what is written is read: " + platform::toUtf8(again.error()) + "\n" +
+                 platform::toUtf8(written.text));
+        return 0;
+    }
     must(model::sql::statementText(**again, dialect, ValueForm::literal).text == written.text,
          "what is read is written the same: " + platform::toUtf8(written.text));
     if (dialect == Dialect::SQLite && written.bindings.empty())

@@ -4,6 +4,7 @@
 #include "model/sql_reader/Refused.h"
 
 #include <algorithm>
+#include <map>
 
 namespace zandor::sql_reader {
 
@@ -16,6 +17,53 @@ namespace {
 bool isGiven(const Node& node) {
     return std::holds_alternative<model::sql::Value>(node->node) ||
            std::holds_alternative<model::sql::Parameter>(node->node);
+}
+
+/// How often each text is there.
+using Counts = std::map<String, std::ptrdiff_t>;
+
+std::ptrdiff_t countIn(const Counts& counts, const String& text) {
+    const auto found = counts.find(text);
+    return found == counts.end() ? 0 : found->second;
+}
+
+Counts countsOf(const std::vector<String>& texts) {
+    Counts counts;
+    for (const String& text : texts) ++counts[text];
+    return counts;
+}
+
+/// Of the values in a node whose type is `counted`.
+template <typename Counted>
+void addValues(Counts& counts, const model::sql::Expression& node, const Counted& counted) {
+    const auto* value = std::get_if<model::sql::Value>(&node.node);
+    if (value && counted(value->type)) ++counts[value->text];
+    for (const Node& part : model::sql::partsOf(node)) addValues(counts, *part, counted);
+}
+
+/// Of what texts come to as values of a type.
+Counts valuesOf(const std::vector<String>& texts, ColumnType type) {
+    Counts counts;
+    for (StringView text : texts) {
+        while (text.starts_with(u'(')) text = text.substr(1, text.size() - 2);
+        if (const auto value = model::criteria::literal(text, type)) ++counts[value->text];
+    }
+    return counts;
+}
+
+bool isMoment(ColumnType type) {
+    return type == ColumnType::Date || type == ColumnType::Time || type == ColumnType::Timestamp;
+}
+
+void checkDates(const Node& node, const std::vector<Node>& dates, std::size_t place) {
+    const auto* call = std::get_if<model::sql::Call>(&node->node);
+    if (call && call->function == model::sql::Function::moment) {
+        const Node& date = call->arguments.front();
+        if (std::none_of(dates.begin(), dates.end(),
+                         [&](const Node& each) { return model::sql::same(each, date); }))
+            refuse<MessageCode::momentOfDate>(place);
+    }
+    for (const Node& part : model::sql::partsOf(*node)) checkDates(part, dates, place);
 }
 
 } // namespace
@@ -39,14 +87,6 @@ Node asCondition(const Node& node) {
                                   sql::make(sql::Value{ColumnType::Boolean, u"true"})});
 }
 
-/// How often a value that is no text is there.
-std::ptrdiff_t countOf(const model::sql::Expression& node, StringView text) {
-    const auto* value = std::get_if<model::sql::Value>(&node.node);
-    std::ptrdiff_t count = value && value->type != ColumnType::Text && value->text == text ? 1 : 0;
-    for (const Node& part : model::sql::partsOf(node)) count += countOf(*part, text);
-    return count;
-}
-
 bool asksForTruth(const Node& node) {
     namespace sql = model::sql;
     const auto isTruth = [](const Node& part) {
@@ -64,39 +104,36 @@ bool asksForTruth(const Node& node) {
 
 void checkMoments(const Node& node, const std::vector<String>& texts,
                   const std::vector<Node>& dates, std::size_t place) {
-    if (const auto* value = std::get_if<model::sql::Value>(&node->node)) {
-        const bool moment = value->type == ColumnType::Date || value->type == ColumnType::Time ||
-                            value->type == ColumnType::Timestamp;
-        if (moment && std::find(texts.begin(), texts.end(), value->text) == texts.end())
-            refuse<MessageCode::momentWritten>(place, value->text);
-    }
-    const auto* call = std::get_if<model::sql::Call>(&node->node);
-    if (call && call->function == model::sql::Function::moment) {
-        const Node& date = call->arguments.front();
-        if (std::none_of(dates.begin(), dates.end(),
-                         [&](const Node& each) { return model::sql::same(each, date); }))
-            refuse<MessageCode::momentOfDate>(place);
-    }
-    for (const Node& part : model::sql::partsOf(*node)) checkMoments(part, texts, dates, place);
+    checkDates(node, dates, place);
+    const Counts typed = countsOf(texts);
+    Counts moments;
+    addValues(moments, *node, isMoment);
+    for (const auto& [text, count] : moments)
+        if (countIn(typed, text) == 0) refuse<MessageCode::momentWritten>(place, text);
+    // One that is typed so may be a text there, and another the moment.
+    Counts all;
+    addValues(all, *node, [](ColumnType) { return true; });
+    for (const String& text : texts)
+        for (const ColumnType type : {ColumnType::Date, ColumnType::Time, ColumnType::Timestamp}) {
+            const auto value = model::criteria::literal(text, type);
+            if (value && value->text != text && moments.contains(value->text) &&
+                countIn(all, value->text) > countIn(typed, value->text))
+                refuse<MessageCode::momentWritten>(place, value->text);
+        }
 }
 
 void checkTexts(const Node& node, const std::vector<String>& texts,
                 const std::vector<String>& others, std::size_t place) {
-    const auto bare = [](StringView text) {
-        while (text.starts_with(u'(')) text = text.substr(1, text.size() - 2);
-        return text;
-    };
-    for (const String& text : texts)
-        for (const ColumnType type : {ColumnType::Decimal, ColumnType::Boolean}) {
+    Counts values;
+    addValues(values, *node, [](ColumnType type) { return type != ColumnType::Text; });
+    for (const ColumnType type : {ColumnType::Decimal, ColumnType::Boolean}) {
+        const Counts typed = valuesOf(others, type);
+        for (const String& text : texts) {
             const auto value = model::criteria::literal(text, type);
-            if (!value) continue;
-            const auto same = [&](const String& other) {
-                const auto its = model::criteria::literal(bare(other), type);
-                return its && its->text == value->text;
-            };
-            if (countOf(*node, value->text) > std::count_if(others.begin(), others.end(), same))
+            if (value && countIn(values, value->text) > countIn(typed, value->text))
                 refuse<MessageCode::textConverted>(place, text);
         }
+    }
 }
 
 bool holdsAlways(const Node& node) {

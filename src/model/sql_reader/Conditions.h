@@ -17,8 +17,8 @@ bool asksForTruth(const Node& node);
 bool holdsAlways(const Node& node);
 
 /// SQLite compares moments as texts, so that one written otherwise than it was typed is another.
-/// Throws Refused for one that is not among the texts of the statement, and for a date that becomes
-/// one and is not among those for which the statement says so.
+/// Throws Refused where more of one are in a node than among the texts of the statement, and for a
+/// date that becomes one and is not among those for which the statement says so.
 void checkMoments(const Node& node, const std::vector<platform::String>& texts,
                   const std::vector<Node>& dates, std::size_t place);
 

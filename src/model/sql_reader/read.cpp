@@ -14,8 +14,6 @@ namespace zandor::sql_reader {
 
 namespace {
 
-constexpr std::size_t longest = 100'000;
-
 Refusal refusalAt(StringView text, Message message, std::size_t position) {
     position = std::min(position, text.size());
     const StringView before = text.substr(0, position);
@@ -103,8 +101,8 @@ Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect d
 } // namespace
 
 Drawn read(StringView text, Dialect dialect, const Schema& schema) {
-    if (text.size() > longest)
-        return refusalAt(text, model::say<MessageCode::tooLong>(longest), longest);
+    if (text.size() > longestText)
+        return refusalAt(text, model::say<MessageCode::tooLong>(longestText), longestText);
     // The parser would take it for the end.
     if (const auto zero = text.find(u'\0'); zero != StringView::npos)
         return refusalAt(text, model::say<MessageCode::notParsed>(u"U+0000"), zero);

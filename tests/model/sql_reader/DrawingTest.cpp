@@ -336,6 +336,7 @@ TEST_F(Statement, KeepsTheOrderOfConditionsWithinAQueryThatItReadsFrom) {
 }
 
 TEST_F(Statement, JoinsATableWithItselfOnlyByWhatBeginsItsConditions) {
+    using namespace std::string_literals;
     for (const std::u16string& where :
          {u"FROM orders AS o\n    CROSS JOIN customers AS c\nWHERE c.city = c.id\n    AND "
           u"o.customer_id <> 10.5\n    AND c.active = c.active\nORDER BY c.active DESC"s,

@@ -216,6 +216,20 @@ TEST_F(Refusals, MakeNoMomentOfADateInSqliteWhereTheStatementDoesNot) {
               "drawn");
 }
 
+TEST_F(Refusals, WriteNoMomentOtherwiseInSqliteWhereAnotherIsTypedAsItWouldBeWritten) {
+    for (const char16_t* condition :
+         {u"'2023-02-03 00:00:00' NOT BETWEEN placed AND '2023-02-03 00:00'",
+          u"placed IN ('2023-02-03', '2023-02-03 00:00:00')",
+          u"NOT (name = '2023-02-03 00:00:00' AND placed > '2023-02-03 00:00')"}) {
+        const std::u16string text =
+            u"SELECT name FROM customers, orders WHERE " + std::u16string(condition);
+        EXPECT_NE(refusal(text).find("2023-02-03 00:00:00"), std::string::npos) << refusal(text);
+    }
+    EXPECT_EQ(refusal(u"SELECT id FROM orders WHERE placed NOT BETWEEN '2023-02-03 00:00:00' AND "
+                      u"'2023-02-03 00:00:00'"),
+              "drawn");
+}
+
 TEST_F(Refusals, LeaveNoColumnUnderTheNameOfTruthBesideAnother) {
     EXPECT_EQ(
         refusal(u"SELECT true FROM customers WHERE coalesce(true, active)"),

@@ -6,6 +6,7 @@
 #include <Zandor/sql_reader/Messages.h>
 #include <Zandor/sql_reader/export.h>
 
+#include <cstddef>
 #include <functional>
 #include <optional>
 
@@ -41,6 +42,9 @@ struct ZANDOR_SQLREADER_EXPORT Refusal {
 
 /// What a text is read as.
 using Drawn = model::Result<Ref<model::Query>, Refusal>;
+
+/// The longest text that is read, in UTF-16 code units. A drawing may come to a longer one.
+inline constexpr std::size_t longestText = 100'000;
 
 /// The query that draws a SELECT statement of a dialect. Its tables have no places. Building it
 /// again gives a statement that says the same: where it would not, the statement is refused. Nothing
