@@ -10,7 +10,11 @@ String likePattern(StringView pattern, char16_t escape, Dialect dialect, std::si
     String out;
     for (std::size_t i = 0; i < pattern.size(); ++i) {
         char16_t c = pattern[i];
-        const bool itself = escape != 0 && c == escape && i + 1 < pattern.size();
+        const bool escapes = escape != 0 && c == escape;
+        const bool itself = escapes && i + 1 < pattern.size();
+        // At the end it is an ordinary sign in MySQL, and elsewhere finds nothing or is an error.
+        if (escapes && !itself && dialect != Dialect::MySQL)
+            refuse<MessageCode::unknownOperator>(place, u"LIKE");
         if (itself) c = pattern[++i];
         // One of several signs, in SQL Server.
         if (!itself && c == u'[' && dialect == Dialect::SqlServer)

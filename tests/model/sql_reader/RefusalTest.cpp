@@ -230,6 +230,19 @@ TEST_F(Refusals, WriteNoMomentOtherwiseInSqliteWhereAnotherIsTypedAsItWouldBeWri
               "drawn");
 }
 
+TEST_F(Refusals, FindNothingByAPatternThatEndsWithTheSignThatEscapes) {
+    for (const Dialect dialect : {Dialect::SQLite, Dialect::PostgreSQL, Dialect::SqlServer})
+        for (const char16_t* pattern : {u"'%!'", u"'!'", u"'5!%!'"}) {
+            const std::u16string text = u"SELECT name FROM customers WHERE name LIKE " +
+                                        std::u16string(pattern) + u" ESCAPE '!'";
+            EXPECT_NE(refusal(text, dialect), "drawn") << zandor::platform::toUtf8(text);
+        }
+    EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE name LIKE '5!%!!' ESCAPE '!'"), "drawn");
+    EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE name LIKE '%!' ESCAPE '!'",
+                      Dialect::MySQL),
+              "drawn");
+}
+
 TEST_F(Refusals, LeaveNoColumnUnderTheNameOfTruthBesideAnother) {
     EXPECT_EQ(
         refusal(u"SELECT true FROM customers WHERE coalesce(true, active)"),
