@@ -48,6 +48,7 @@ private:
                                : mQuery.addQuery(alias, mSelected.queries.find(alias)->second);
         if (added->Name() != alias) mQuery.renameTable(added, alias);
         mIslands[alias] = alias;
+        mPlaces.emplace(alias, mPlaces.size());
     }
 
     /// Whether a source's rows are all there, whatever it is joined with.
@@ -146,12 +147,15 @@ private:
     }
 
     /// Joins stand before all that is asked in cells, so that only what begins the conditions can
-    /// come back as one.
+    /// come back as one; and in the order of their tables, which counts where they alone are drawn.
     bool joinsItself(const Node& term) {
         const auto columns = columnsOf(term);
         if (mJoins == JoinsOfRows::islands || !mRest.empty() || !columns ||
             columns->first.table != columns->second.table || !mWhole.contains(columns->first.table))
             return false;
+        const std::size_t place = mPlaces.at(columns->first.table);
+        if (mJoins == JoinsOfRows::loops && place < mLastLoop) return false;
+        mLastLoop = place;
         add(columns->first, columns->second, 0, std::get<sql::Compare>(term->node).comparison);
         return true;
     }
@@ -159,6 +163,8 @@ private:
     Query& mQuery;
     const Selected& mSelected;
     const JoinsOfRows mJoins;
+    std::map<String, std::size_t> mPlaces;      ///< of the tables, in their order
+    std::size_t mLastLoop = 0;                  ///< of the table that was last joined with itself
     std::map<String, String> mIslands;          ///< tables that are joined lead to one of them
     std::set<std::pair<String, String>> mPairs; ///< of tables that conditions on rows join
     Aliases mWhole;                             ///< of which no row is filled with nothing

@@ -48,8 +48,9 @@ StringView trimmed(StringView text) {
     return text.substr(begin, text.find_last_not_of(around) + 1 - begin);
 }
 
-/// With one blank for each place of them.
-String withSingleBlanks(StringView text) {
+/// With one blank for each place of them, and truth as the number that stands for it beside a
+/// column of that name.
+String comparable(StringView text) {
     String out;
     for (const char16_t c : text) {
         const bool blank = c == u' ' || c == u'\n' || c == u'\t' || c == u'\r';
@@ -58,6 +59,9 @@ String withSingleBlanks(StringView text) {
         else if (!out.empty() && out.back() != u' ')
             out += u' ';
     }
+    for (const auto& [word, number] : {std::pair(u"TRUE", u'1'), std::pair(u"FALSE", u'0')})
+        for (auto at = out.find(word); at != String::npos; at = out.find(word, at))
+            out.replace(at, StringView(word).size(), 1, number);
     return out;
 }
 
@@ -78,9 +82,9 @@ Ref<model::Query> readParsed(StringView typed, const ParserText& text, Dialect d
         return model::sql::statementText(query, dialect, model::sql::ValueForm::literal).text;
     };
     const auto isWhole = [&](model::Query& query) { return written(query) == trimmed(typed); };
-    const String inOneLine = withSingleBlanks(typed);
+    const String whole = comparable(typed);
     const StatementReader::IsWritten isPart = [&](model::Query& query) {
-        return inOneLine.find(withSingleBlanks(written(query))) != String::npos;
+        return whole.find(comparable(written(query))) != String::npos;
     };
     const auto readAs = [&](const ParserText& meant) {
         return drawn(StatementReader(schema, meant, dialect, isPart).select(statement), isWhole);

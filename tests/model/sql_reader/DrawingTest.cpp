@@ -328,9 +328,10 @@ TEST_F(Statement, BringsWhatARightJoinSharesFromTheRightWhereTheLeftOneStands) {
 }
 
 TEST_F(Statement, KeepsTheOrderOfConditionsWithinAQueryThatItReadsFrom) {
-    const std::u16string inner = u"\n        SELECT\n            c.id,\n            c.name\n        FROM "
-                                 u"customers AS c\n        WHERE c.city = 'Wien'\n            OR "
-                                 u"(c.id > 5 AND c.name > c.city AND c.id < 9)\n    ";
+    const std::u16string inner =
+        u"\n        SELECT\n            c.id,\n            c.name\n        FROM "
+        u"customers AS c\n        WHERE c.city = 'Wien'\n            OR "
+        u"(c.id > 5 AND c.name > c.city AND c.id < 9)\n    ";
     const std::u16string from = u"SELECT\n    s.name\nFROM (" + inner + u") AS s";
     EXPECT_EQ(refusal(from), "drawn");
 }
@@ -342,9 +343,23 @@ TEST_F(Statement, JoinsATableWithItselfOnlyByWhatBeginsItsConditions) {
           u"o.customer_id <> 10.5\n    AND c.active = c.active\nORDER BY c.active DESC"s,
           u"FROM customers AS p\n    LEFT JOIN customers AS c ON p.name = c.active\n    CROSS JOIN "
           u"customers AS x\nWHERE x.active = x.name\n    AND c.active = c.active\n    AND 'a' NOT "
-          u"IN ('b', 'c')"s}) {
+          u"IN ('b', 'c')"s,
+          u"FROM orders AS o\n    CROSS JOIN customers AS c\nWHERE c.id = c.name\n    AND "
+          u"o.placed <= "
+          u"o.placed"s,
+          u"FROM orders AS o\n    CROSS JOIN customers AS x\n    CROSS JOIN customers AS c\nWHERE "
+          u"x.id = x.name\n    AND c.active < c.id\n    AND x.id <> x.name"s}) {
         const std::u16string written = u"SELECT\n    c.since\n" + where;
         read(written);
         EXPECT_EQ(text(), zandor::platform::toUtf8(written));
     }
+}
+
+TEST_F(Statement, KeepsTheOrderOfConditionsWithinWhereTruthIsANumber) {
+    const std::u16string written =
+        u"SELECT\n    1 AS True\nFROM (\n    SELECT\n        c.id,\n        c.city,\n        "
+        u"c.active\n    FROM customers AS c\n    WHERE c.active = 0\n        AND c.city LIKE "
+        u"'W%'\n) AS s";
+    read(written);
+    EXPECT_EQ(text(), zandor::platform::toUtf8(written));
 }
