@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <map>
+#include <optional>
 
 namespace zandor::sql_reader {
 
@@ -33,22 +34,21 @@ Counts countsOf(const std::vector<String>& texts) {
     return counts;
 }
 
-/// Of the values in a node whose type is `counted`.
-template <typename Counted>
-void addValues(Counts& counts, const model::sql::Expression& node, const Counted& counted) {
-    const auto* value = std::get_if<model::sql::Value>(&node.node);
-    if (value && counted(value->type)) ++counts[value->text];
-    for (const Node& part : model::sql::partsOf(node)) addValues(counts, *part, counted);
+/// Of what `key` has for the values in a node.
+template <typename Key>
+void addValues(Counts& counts, const model::sql::Expression& node, const Key& key) {
+    if (const auto* value = std::get_if<model::sql::Value>(&node.node))
+        if (const std::optional<String> counted = key(*value)) ++counts[*counted];
+    for (const Node& part : model::sql::partsOf(node)) addValues(counts, *part, key);
 }
 
-/// Of what texts come to as values of a type.
-Counts valuesOf(const std::vector<String>& texts, ColumnType type) {
-    Counts counts;
-    for (StringView text : texts) {
-        while (text.starts_with(u'(')) text = text.substr(1, text.size() - 2);
-        if (const auto value = model::criteria::literal(text, type)) ++counts[value->text];
-    }
-    return counts;
+/// What a text comes to as a number, or as truth, for which a number stands too.
+std::optional<String> numberIn(StringView text) {
+    while (text.starts_with(u'(')) text = text.substr(1, text.size() - 2);
+    if (const auto truth = model::criteria::literal(text, ColumnType::Boolean))
+        return truth->text == u"true" ? u"1" : u"0";
+    const auto number = model::criteria::literal(text, ColumnType::Decimal);
+    return number ? std::optional(number->text) : std::nullopt;
 }
 
 bool isMoment(ColumnType type) {
@@ -107,12 +107,14 @@ void checkMoments(const Node& node, const std::vector<String>& texts,
     checkDates(node, dates, place);
     const Counts typed = countsOf(texts);
     Counts moments;
-    addValues(moments, *node, isMoment);
+    addValues(moments, *node, [](const model::sql::Value& value) {
+        return isMoment(value.type) ? std::optional(value.text) : std::nullopt;
+    });
     for (const auto& [text, count] : moments)
         if (countIn(typed, text) == 0) refuse<MessageCode::momentWritten>(place, text);
     // One that is typed so may be a text there, and another the moment.
     Counts all;
-    addValues(all, *node, [](ColumnType) { return true; });
+    addValues(all, *node, [](const model::sql::Value& value) { return std::optional(value.text); });
     for (const String& text : texts)
         for (const ColumnType type : {ColumnType::Date, ColumnType::Time, ColumnType::Timestamp}) {
             const auto value = model::criteria::literal(text, type);
@@ -125,15 +127,16 @@ void checkMoments(const Node& node, const std::vector<String>& texts,
 void checkTexts(const Node& node, const std::vector<String>& texts,
                 const std::vector<String>& others, std::size_t place) {
     Counts values;
-    addValues(values, *node, [](ColumnType type) { return type != ColumnType::Text; });
-    for (const ColumnType type : {ColumnType::Decimal, ColumnType::Boolean}) {
-        const Counts typed = valuesOf(others, type);
-        for (const String& text : texts) {
-            const auto value = model::criteria::literal(text, type);
-            if (value && countIn(values, value->text) > countIn(typed, value->text))
-                refuse<MessageCode::textConverted>(place, text);
-        }
-    }
+    addValues(values, *node, [](const model::sql::Value& value) {
+        return value.type == ColumnType::Text ? std::nullopt : numberIn(value.text);
+    });
+    Counts typed;
+    for (const String& other : others)
+        if (const auto number = numberIn(other)) ++typed[*number];
+    for (const String& text : texts)
+        if (const auto number = numberIn(text);
+            number && countIn(values, *number) > countIn(typed, *number))
+            refuse<MessageCode::textConverted>(place, text);
 }
 
 bool holdsAlways(const Node& node) {

@@ -24,10 +24,16 @@ namespace {
 /// for each way in which they hold, maybe beside joins of tables with themselves, or in hidden
 /// columns where nothing else keeps their order; the first of such rows twice, so that what rows
 /// are put together by is asked behind that; all in the first row, in cells that name other columns
-/// too.
-enum class Layout { cells, rows, loops, ordered, doubled, mixed };
+/// too, or so in hidden columns.
+enum class Layout { cells, rows, loops, ordered, doubled, mixed, orderedMixed };
 
-bool keepsOrder(Layout layout) { return layout == Layout::ordered || layout == Layout::doubled; }
+bool keepsOrder(Layout layout) {
+    return layout == Layout::ordered || layout == Layout::doubled || layout == Layout::orderedMixed;
+}
+
+bool isInOneRow(Layout layout) {
+    return layout == Layout::cells || layout == Layout::mixed || layout == Layout::orderedMixed;
+}
 
 /// What a condition speaks about: the first value in it that is no constant.
 Node subjectOf(const Node& condition) {
@@ -140,7 +146,7 @@ private:
         const std::vector<Node>& ways = behind.empty() ? before : behind;
         constexpr std::size_t mostRows = 12; // of the grid
         std::vector<std::vector<Node>> rows{ways};
-        if (mLayout != Layout::cells && mLayout != Layout::mixed) {
+        if (!isInOneRow(mLayout)) {
             auto all = waysOf(ways, mostRows, [](const Node& condition) {
                 return isAbout(condition, subjectOf(condition));
             });
@@ -302,7 +308,7 @@ Ref<Query> drawn(const Selected& selected, const std::function<bool(Query&)>& is
         try {
             query = Drawing(selected, layout).draw();
             const bool exact = hasSameWords(saidBy(*query, selected), selected.statement);
-            if (!sound || (exact && (layout != Layout::ordered || isWhole(*query)))) sound = query;
+            if (!sound || (exact && (!keepsOrder(layout) || isWhole(*query)))) sound = query;
             return exact;
         } catch (const Refused& refused) {
             // What was drawn and says something else tells more than what was not.
@@ -317,7 +323,7 @@ Ref<Query> drawn(const Selected& selected, const std::function<bool(Query&)>& is
         if (isDone(layout)) return sound;
     if (!sound) isDone(Layout::mixed);
     if (!sound) throw Refused(*first);
-    if (isWhole) isDone(Layout::ordered);
+    if (isWhole && !isDone(Layout::ordered)) isDone(Layout::orderedMixed);
     return sound;
 }
 

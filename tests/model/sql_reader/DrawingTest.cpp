@@ -348,7 +348,7 @@ TEST_F(Statement, JoinsATableWithItselfOnlyByWhatBeginsItsConditions) {
           u"o.placed <= "
           u"o.placed"s,
           u"FROM orders AS o\n    CROSS JOIN customers AS x\n    CROSS JOIN customers AS c\nWHERE "
-          u"x.id = x.name\n    AND c.active < c.id\n    AND x.id <> x.name"s}) {
+          u"x.id = x.name\n    AND c.active < c.id\n    AND x.name <> x.city"s}) {
         const std::u16string written = u"SELECT\n    c.since\n" + where;
         read(written);
         EXPECT_EQ(text(), zandor::platform::toUtf8(written));
@@ -360,6 +360,17 @@ TEST_F(Statement, KeepsTheOrderOfConditionsWithinWhereTruthIsANumber) {
         u"SELECT\n    1 AS True\nFROM (\n    SELECT\n        c.id,\n        c.city,\n        "
         u"c.active\n    FROM customers AS c\n    WHERE c.active = 0\n        AND c.city LIKE "
         u"'W%'\n) AS s";
+    read(written);
+    EXPECT_EQ(text(), zandor::platform::toUtf8(written));
+}
+
+TEST_F(Statement, KeepsTheOrderOfConditionsThatNeedMoreRowsThanThereAre) {
+    const std::u16string ways = u" NOT BETWEEN 'b' AND 'e' OR c.name BETWEEN 'a' AND 'b' OR c.name "
+                                u"> 'c' OR c.name > c.city)";
+    const std::u16string written =
+        u"SELECT\n    c.active,\n    c.since\nFROM customers AS c\nWHERE c.since <> c.since\n    "
+        u"AND c.active = TRUE\n    AND ('c'" +
+        ways + u"\n    AND ('d'" + ways;
     read(written);
     EXPECT_EQ(text(), zandor::platform::toUtf8(written));
 }

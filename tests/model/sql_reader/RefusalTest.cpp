@@ -200,6 +200,16 @@ TEST_F(Refusals, MakeNoNumberOfATextInSqliteWhereItStandsBesideNoColumnOfATable)
     EXPECT_EQ(criteria(1), Texts{"4: 1 And In (1, 2)"});
 }
 
+TEST_F(Refusals, MakeNoTruthOfATextInSqliteBesideANumberThatIsNone) {
+    for (const char16_t* value :
+         {u"IIF(name > 'a', '1', 1 IS NULL)", u"IIF(id > 1, 'yes', 1 IS NULL)",
+          u"IIF(id > 5, '0', 0 IS NULL)"}) {
+        const std::u16string text = u"SELECT " + std::u16string(value) + u" FROM customers";
+        EXPECT_NE(refusal(text), "drawn") << zandor::platform::toUtf8(text);
+    }
+    EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE active = 1 AND name = '1'"), "drawn");
+}
+
 TEST_F(Refusals, MakeNoMomentOfADateInSqliteWhereTheStatementDoesNot) {
     for (const char16_t* item :
          {u"CASE WHEN active THEN since ELSE placed END", u"coalesce(since, placed)",
@@ -238,18 +248,19 @@ TEST_F(Refusals, FindNothingByAPatternThatEndsWithTheSignThatEscapes) {
             EXPECT_NE(refusal(text, dialect), "drawn") << zandor::platform::toUtf8(text);
         }
     EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE name LIKE '5!%!!' ESCAPE '!'"), "drawn");
-    EXPECT_EQ(refusal(u"SELECT name FROM customers WHERE name LIKE '%!' ESCAPE '!'",
-                      Dialect::MySQL),
-              "drawn");
+    EXPECT_EQ(
+        refusal(u"SELECT name FROM customers WHERE name LIKE '%!' ESCAPE '!'", Dialect::MySQL),
+        "drawn");
 }
 
 TEST_F(Refusals, LeaveNoColumnUnderTheNameOfTruthBesideAnother) {
     EXPECT_EQ(
         refusal(u"SELECT true FROM customers WHERE coalesce(true, active)"),
         "Line 1, column 8: a drawing has no place for this (AS true); it can be run as it is.");
-    EXPECT_NE(refusal(u"SELECT c.id FROM customers c JOIN (SELECT TRUE, id FROM orders) s ON s.id = "
-                      u"c.id"),
-              "drawn");
+    EXPECT_NE(
+        refusal(u"SELECT c.id FROM customers c JOIN (SELECT TRUE, id FROM orders) s ON s.id = "
+                u"c.id"),
+        "drawn");
     EXPECT_EQ(refusal(u"SELECT true AS yes FROM customers WHERE coalesce(true, active)"), "drawn");
 }
 
