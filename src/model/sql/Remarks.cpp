@@ -59,7 +59,12 @@ Remarks::Lines Remarks::of(const decltype(Remark::by)& by) {
 Remarks::Lines Remarks::within(const Node& condition) {
     return taken([&](const Remark& remark) {
         const auto* node = std::get_if<Node>(&remark.by);
-        return node && contains(condition, *node);
+        if (!node) return false;
+        // What one cell asks for may stand as several conditions.
+        const auto* all = std::get_if<And>(&(*node)->node);
+        return contains(condition, *node) ||
+               (all && std::any_of(all->terms.begin(), all->terms.end(),
+                                   [&](const Node& term) { return same(condition, term); }));
     });
 }
 

@@ -232,3 +232,15 @@ TEST_F(Comments, StandInEachOtherWhereTheEngineHasItSo) {
     EXPECT_EQ(record.options.comments.size(), 1u);
     EXPECT_NE(refusal(nested), "drawn");
 }
+
+TEST_F(Comments, StandByTheFirstConditionOfTheirCell) {
+    read(
+        u"SELECT c.id FROM customers c, orders o WHERE c.id > c.city AND (o.total > 2) IS NULL AND "
+        u"(o.total > 2) AND (o.total IS NULL) -- never\n");
+    const std::string written = text();
+    EXPECT_NE(written.find("IS NULL\n    AND o.total > 2 -- never\n    AND o.total IS NULL"),
+              std::string::npos)
+        << written;
+    read(zandor::platform::fromUtf8(written));
+    EXPECT_EQ(text(), written);
+}
